@@ -1,0 +1,53 @@
+# What every target of the project shares: warnings, include root, sanitizers come from the preset.
+
+find_program(KVR_CCACHE ccache)
+if(KVR_CCACHE)
+  set(CMAKE_CXX_COMPILER_LAUNCHER ${KVR_CCACHE})
+endif()
+
+function(kvr_defaults target)
+  target_include_directories(${target} PUBLIC ${PROJECT_SOURCE_DIR}/src)
+  target_compile_options(${target} PRIVATE -Wall -Wextra -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual)
+  if(KVR_WERROR)
+    target_compile_options(${target} PRIVATE -Werror)
+  endif()
+endfunction()
+
+# A static library without Qt.
+function(kvr_library name)
+  add_library(${name} STATIC ${ARGN})
+  kvr_defaults(${name})
+endfunction()
+
+# A library on Qt Widgets: meta-object code, dialog files and a precompiled header.
+function(kvr_qt_library name kind)
+  add_library(${name} ${kind} ${ARGN})
+  kvr_qt(${name})
+endfunction()
+
+function(kvr_qt name)
+  kvr_defaults(${name})
+  set_target_properties(${name} PROPERTIES AUTOMOC ON AUTOUIC ON AUTORCC ON)
+  target_link_libraries(${name} PUBLIC Qt6::Widgets)
+  target_precompile_headers(${name} PRIVATE <QtWidgets> <memory> <string> <vector>)
+endfunction()
+
+# One test program per room, its cases found by CTest. LABEL separates the rooms for ctest -L.
+include(GoogleTest)
+function(kvr_test name)
+  cmake_parse_arguments(T "QT" "LABEL" "SOURCES;LIBS" ${ARGN})
+  add_executable(${name} ${T_SOURCES})
+  if(T_QT)
+    find_package(Qt6 REQUIRED COMPONENTS Test)
+    kvr_qt(${name})
+    target_sources(${name} PRIVATE ${PROJECT_SOURCE_DIR}/tests/qt_main.cpp)
+    target_link_libraries(${name} PRIVATE ${T_LIBS} GTest::gtest GTest::gmock Qt6::Test)
+  else()
+    kvr_defaults(${name})
+    target_link_libraries(${name} PRIVATE ${T_LIBS} GTest::gtest GTest::gmock GTest::gtest_main)
+  endif()
+  target_include_directories(${name} PRIVATE ${PROJECT_SOURCE_DIR}/tests)
+  target_compile_definitions(${name} PRIVATE KVR_SOURCE_DIR="${PROJECT_SOURCE_DIR}" KVR_BUILD_DIR="${CMAKE_BINARY_DIR}")
+  gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60
+                       PROPERTIES LABELS "${T_LABEL}" ENVIRONMENT "QT_QPA_PLATFORM=offscreen")
+endfunction()

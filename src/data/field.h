@@ -1,0 +1,155 @@
+// One parameter of a keyword, declared once: its name, where it lives in its object, its kind and quantity.
+// Reading, writing, comparison, export and grid columns all walk arrays of these.
+#pragma once
+
+#include "ks/units/unit_group.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+/// A calendar date and time as a file stores it. The six integers are kept even when they are no date.
+struct HDDateTime
+{
+    std::int32_t Year = 0, Month = 0, Day = 0, Hour = 0, Minute = 0, Second = 0;
+
+    /// Local time now, to the second.
+    static HDDateTime Now();
+    /// Whether the six integers are a date and time of the Gregorian calendar (years 100 to 9999).
+    bool IsValid() const;
+    friend bool operator==(const HDDateTime&, const HDDateTime&) = default;
+};
+
+enum class FieldKind {
+    Number,   // double, in the base unit of its group
+    Integer,  // std::int32_t
+    Choice,   // std::int32_t, an index into a list of texts
+    Boolean,  // bool
+    Text,     // std::string
+    FileName, // std::string
+    DateTime, // HDDateTime: six integers in the file
+    Group     // a count, then that many elements
+};
+
+struct Field;
+
+/// How the elements of a repeated group are reached. `container` is the address that Field::address gives.
+struct GroupAccess
+{
+    std::span<const Field> elements; // fields of one element, in file order
+    bool padWhenEmpty = false;       // an empty group is followed by one element with default values
+    std::size_t (*size)(const void* container) = nullptr;
+    void (*resize)(void* container, std::size_t count) = nullptr;
+    void* (*at)(void* container, std::size_t index) = nullptr;
+};
+
+struct Field
+{
+    std::string_view name;
+    FieldKind kind = FieldKind::Number;
+    UnitGroup unit = UnitGroup::None;
+    bool optionalTail = false; // read only when the keyword has parameters left; always written
+    void* (*address)(void* object) = nullptr;
+    const GroupAccess* group = nullptr; // Group only
+
+    /// The value inside `object`, of the type that the kind says.
+    template <typename T>
+    T& In(void* object) const { return *static_cast<T*>(address(object)); }
+    template <typename T>
+    const T& In(const void* object) const { return *static_cast<const T*>(address(const_cast<void*>(object))); }
+    /// Number of file parameters: 1, 6 for a date-time, 0 for a group (depends on its count).
+    std::size_t FixedParams() const { return kind == FieldKind::DateTime ? 6 : kind == FieldKind::Group ? 0 : 1; }
+};
+
+using FieldList = std::span<const Field>;
+
+namespace field_detail {
+
+template <typename>
+struct MemberOf;
+template <typename C, typename M>
+struct MemberOf<M C::*>
+{
+    using Class = C;
+    using Type = M;
+};
+
+template <auto Member>
+void* Address(void* object)
+{
+    return &(static_cast<typename MemberOf<decltype(Member)>::Class*>(object)->*Member);
+}
+template <auto Member, std::size_t Index>
+void* ElementAddress(void* object)
+{
+    return &(static_cast<typename MemberOf<decltype(Member)>::Class*>(object)->*Member)[Index];
+}
+inline void* Identity(void* object) { return object; }
+
+template <typename Container>
+std::size_t Size(const void* container) { return static_cast<const Container*>(container)->size(); }
+template <typename Container>
+void Resize(void* container, std::size_t count) { static_cast<Container*>(container)->resize(count); }
+template <typename Container>
+void* At(void* container, std::size_t index) { return &(*static_cast<Container*>(container))[index]; }
+
+} // namespace field_detail
+
+// Declaring fields: Number<&HD_Initial::InitialH>("InitialH", UnitGroup::WaterLevel).
+template <auto Member>
+constexpr Field Number(std::string_view name, UnitGroup unit = UnitGroup::None)
+{
+    return {name, FieldKind::Number, unit, false, &field_detail::Address<Member>};
+}
+/// Element `Index` of an array member.
+template <auto Member, std::size_t Index>
+constexpr Field NumberAt(std::string_view name, UnitGroup unit = UnitGroup::None)
+{
+    return {name, FieldKind::Number, unit, false, &field_detail::ElementAddress<Member, Index>};
+}
+template <auto Member, std::size_t Index>
+constexpr Field BooleanAt(std::string_view name)
+{
+    return {name, FieldKind::Boolean, UnitGroup::None, false, &field_detail::ElementAddress<Member, Index>};
+}
+template <auto Member>
+constexpr Field Scalar(FieldKind kind, std::string_view name)
+{
+    return {name, kind, UnitGroup::None, false, &field_detail::Address<Member>};
+}
+template <auto Member>
+constexpr Field Integer(std::string_view name) { return Scalar<Member>(FieldKind::Integer, name); }
+template <auto Member>
+constexpr Field Choice(std::string_view name) { return Scalar<Member>(FieldKind::Choice, name); }
+template <auto Member>
+constexpr Field Boolean(std::string_view name) { return Scalar<Member>(FieldKind::Boolean, name); }
+template <auto Member>
+constexpr Field Text(std::string_view name) { return Scalar<Member>(FieldKind::Text, name); }
+template <auto Member>
+constexpr Field FileName(std::string_view name) { return Scalar<Member>(FieldKind::FileName, name); }
+template <auto Member>
+constexpr Field DateTime(std::string_view name) { return Scalar<Member>(FieldKind::DateTime, name); }
+/// The element of a group of plain values (a list of strings, of numbers).
+constexpr Field Plain(FieldKind kind, std::string_view name, UnitGroup unit = UnitGroup::None)
+{
+    return {name, kind, unit, false, &field_detail::Identity};
+}
+constexpr Field Optional(Field field)
+{
+    field.optionalTail = true;
+    return field;
+}
+template <typename Container>
+constexpr GroupAccess GroupOf(FieldList elements, bool padWhenEmpty = false)
+{
+    return {elements, padWhenEmpty, &field_detail::Size<Container>, &field_detail::Resize<Container>,
+            &field_detail::At<Container>};
+}
+template <auto Member>
+constexpr Field Group(std::string_view name, const GroupAccess& access)
+{
+    return {name, FieldKind::Group, UnitGroup::None, false, &field_detail::Address<Member>, &access};
+}

@@ -1,0 +1,130 @@
+// Owning lists of location records: in order, with records that stay where they are in memory, and access by position
+// in constant time.
+#pragma once
+
+#include "data/river_pos.h"
+
+#include <cstddef>
+#include <functional>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+class CGenList
+{
+public:
+    /// A position past the last record.
+    static constexpr std::size_t End = static_cast<std::size_t>(-1);
+
+    CGenList() = default;
+    CGenList(const CGenList&) = delete;
+    CGenList& operator=(const CGenList&) = delete;
+    virtual ~CGenList() = default;
+
+    /// Deletes every record.
+    virtual void RemoveAll();
+    /// A new record of the list's family with its defaults, not in the list. Null for the bare base list.
+    virtual std::unique_ptr<HD_RiverPos> NewRecord() const { return nullptr; }
+    /// The fields of the list's family after name and chainage.
+    virtual FieldList Fields() const { return {}; }
+
+    std::size_t GetCount() const { return m_records.size(); }
+    bool IsEmpty() const { return m_records.empty(); }
+    HD_RiverPos& GetAt(std::size_t index) { return *m_records[index]; }
+    const HD_RiverPos& GetAt(std::size_t index) const { return *m_records[index]; }
+    HD_RiverPos& AddTail(std::unique_ptr<HD_RiverPos> record);
+    /// `index` up to GetCount(); the records must be of the list's family.
+    void InsertAt(std::size_t index, std::unique_ptr<HD_RiverPos> record);
+    void InsertAt(std::size_t index, std::vector<std::unique_ptr<HD_RiverPos>> records);
+    std::unique_ptr<HD_RiverPos> RemoveAt(std::size_t index);
+    std::vector<std::unique_ptr<HD_RiverPos>> RemoveAt(std::size_t index, std::size_t count);
+    void Reserve(std::size_t count) { m_records.reserve(count); }
+
+    /// Counts every change of the list's length or order, so that a view knows when its rows are stale.
+    std::uint64_t GetRevision() const { return m_revision; }
+
+    /// Removes and deletes every blank record, head to tail. Unless `asked` is set, `ask` is called at the first one;
+    /// its answer false stops with false (nothing more is removed), true sets `asked`.
+    bool RemoveIncompleteLines(bool& asked, const std::function<bool()>& ask = {});
+
+    /// First record at or after `position` whose chainage equals the value exactly; `position` is left after it (End
+    /// when there is none). Null when there is none.
+    HD_RiverPos* FindByChainage(double chainage, std::size_t& position);
+    /// Likewise the first record whose name begins with the text.
+    HD_RiverPos* FindByName(std::string_view text, std::size_t& position);
+
+private:
+    std::vector<std::unique_ptr<HD_RiverPos>> m_records;
+    std::uint64_t m_revision = 0;
+};
+
+/// A list that is stored as one section of keywords "DATA".
+class CGenParamListBase : public CGenList
+{
+public:
+    explicit CGenParamListBase(std::string sectionName) : m_sectionName(std::move(sectionName)) {}
+    const std::string& SectionName() const { return m_sectionName; }
+
+    /// Writes the section with every record, blank ones too.
+    virtual void Save(tqlHandle structure) const;
+    /// Appends the records of occurrence `number` of the section; a missing section leaves the list as it is.
+    virtual void Load(tqlHandle parent, int number);
+
+private:
+    std::string m_sectionName;
+};
+
+template <typename T>
+class CGenParamList final : public CGenParamListBase
+{
+public:
+    using Record = T;
+    using CGenParamListBase::CGenParamListBase;
+
+    std::unique_ptr<HD_RiverPos> NewRecord() const override { return std::make_unique<T>(); }
+    FieldList Fields() const override { return T::DeclaredFields(); }
+    T& GetAt(std::size_t index) { return static_cast<T&>(CGenList::GetAt(index)); }
+    const T& GetAt(std::size_t index) const { return static_cast<const T&>(CGenList::GetAt(index)); }
+    T& Add(T record = {}) { return static_cast<T&>(AddTail(std::make_unique<T>(std::move(record)))); }
+};
+
+/// An owning list of lists, stored as one section of sub-sections.
+template <typename T>
+class CGenMetaList
+{
+public:
+    CGenMetaList(std::string outerSection, std::string innerSection)
+        : m_outerSection(std::move(outerSection)), m_innerSection(std::move(innerSection)) {}
+
+    const std::string& OuterSectionName() const { return m_outerSection; }
+    const std::string& InnerSectionName() const { return m_innerSection; }
+    std::size_t GetCount() const { return m_lists.size(); }
+    bool IsEmpty() const { return m_lists.empty(); }
+    CGenParamList<T>& GetAt(std::size_t index) { return *m_lists[index]; }
+    const CGenParamList<T>& GetAt(std::size_t index) const { return *m_lists[index]; }
+    /// A new empty list at the end.
+    CGenParamList<T>& Add()
+    {
+        return *m_lists.emplace_back(std::make_unique<CGenParamList<T>>(m_innerSection));
+    }
+    std::unique_ptr<CGenParamList<T>> RemoveAt(std::size_t index)
+    {
+        auto list = std::move(m_lists[index]);
+        m_lists.erase(m_lists.begin() + static_cast<std::ptrdiff_t>(index));
+        return list;
+    }
+    void InsertAt(std::size_t index, std::unique_ptr<CGenParamList<T>> list)
+    {
+        m_lists.insert(m_lists.begin() + static_cast<std::ptrdiff_t>(index), std::move(list));
+    }
+    void RemoveAllRecords() { m_lists.clear(); }
+
+    /// A sub-list is written only when one of its records from the second on is filled.
+    void Save(tqlHandle structure) const;
+    void Load(tqlHandle parent, int number = 1);
+
+private:
+    std::string m_outerSection, m_innerSection;
+    std::vector<std::unique_ptr<CGenParamList<T>>> m_lists;
+};

@@ -1,0 +1,33 @@
+// The base of every record that is tied to a location in the river network.
+#pragma once
+
+#include "data/field.h"
+#include "tql/tql.h"
+
+#include <memory>
+#include <string>
+
+/// Marks a chainage (or another number of a table) that has not been given; compared exactly.
+inline constexpr double NotGiven = 1.0e10;
+
+class HD_RiverPos
+{
+public:
+    std::string RiverName;        // branch name
+    double Chainage = NotGiven;   // position along the branch, metres
+
+    HD_RiverPos() = default;
+    HD_RiverPos(const HD_RiverPos&) = default;
+    HD_RiverPos& operator=(const HD_RiverPos&) = default;
+    virtual ~HD_RiverPos() = default;
+
+    /// Appends this record to the file being written, as one keyword "DATA" in the current section.
+    virtual void Save(tqlHandle /*structure*/) const {}
+    /// Reads this record from one keyword "DATA" by parameter number; what is not there keeps its value.
+    virtual void Load(tqlHandle /*keyword*/) {}
+    /// The fields after RiverName and Chainage, in file order.
+    virtual FieldList Fields() const { return {}; }
+
+    /// No branch name, or no chainage: the line is incomplete.
+    bool IsBlank() const { return RiverName.empty() || Chainage == NotGiven; }
+};

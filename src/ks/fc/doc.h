@@ -1,0 +1,97 @@
+// Documents and views of the shell.
+#pragma once
+
+#include "ks/fc/messages.h"
+#include "ks/fc/types.h"
+
+#include <QObject>
+#include <QWidget>
+#include <vector>
+
+class CKsDoc;
+class CMultiDocTemplate;
+class QUndoStack;
+
+/// Something handed along with an update; owned by the sender.
+class KS_API CHint
+{
+public:
+    virtual ~CHint();
+};
+
+/// A window on a document. Owned by its frame.
+class KS_API CView : public QWidget, public CKsWindow
+{
+    Q_OBJECT
+public:
+    explicit CView(QWidget* parent = nullptr);
+    ~CView() override; // leaves its document
+
+    CKsDoc* GetDocument() const { return m_document; }
+
+    /// Called once, when the document has been opened or created.
+    virtual void OnInitialUpdate();
+    /// The document changed: see CKsDoc::UpdateAllViews. `sender` is null when no view caused it.
+    virtual void OnUpdate(CView* sender, int hint, CHint* object);
+    /// A view's window became active or stopped being active. Either view may be null.
+    virtual void OnActivateView(bool activate, CView* activated, CView* deactivated);
+
+private:
+    friend class CKsDoc;
+    CKsDoc* m_document = nullptr;
+};
+
+/// A document: one file, its views, its modified flag and its undo stack. Owned by its template.
+class KS_API CKsDoc : public QObject
+{
+    Q_OBJECT
+public:
+    CKsDoc();
+    ~CKsDoc() override;
+
+    // What the shell calls; an editor's document overrides them. Paths are absolute.
+    virtual BOOL OnNewDocument();
+    /// The base checks that the file is there and can be read (a message names path and reason), then empties the
+    /// document.
+    virtual BOOL OnOpenDocument(const CString& path);
+    virtual BOOL OnSaveDocument(const CString& path) = 0;
+    /// Empties the document; before new and open, and at close.
+    virtual void DeleteContents();
+    /// Called last, when the document's windows are gone.
+    virtual void OnCloseDocument();
+
+    /// Saves to `path` and takes that name when it worked; an empty path asks for one, as Save As.
+    BOOL DoSave(const CString& path);
+    /// Asks whether to save when the document is modified; false when the user cancelled or the save failed.
+    BOOL SaveModified();
+    bool IsExecuting() const { return m_executing; } // in the middle of an open or a save
+
+    const CString& GetPathName() const { return m_path; } // empty until first saved
+    void SetPathName(const CString& path);
+    CString GetTitle() const; // file name, or the template's document name with a number
+    void SetTitle(const CString& title);
+
+    bool IsModified() const { return m_modified; }
+    void SetModifiedFlag(bool modified = true);
+
+    /// Calls OnUpdate of every view but the sender.
+    void UpdateAllViews(CView* sender, int hint = 0, CHint* object = nullptr);
+    const std::vector<CView*>& Views() const { return m_views; }
+    void AddView(CView* view);
+    void RemoveView(CView* view);
+
+    QUndoStack& UndoStack() const { return *m_undo; }
+    CMultiDocTemplate* GetDocTemplate() const { return m_template; }
+
+signals:
+    void TitleChanged();    // path, title or modified flag
+    void PathNameChanged(const CString& oldPath, const CString& newPath);
+
+private:
+    friend class CMultiDocTemplate;
+    CString m_path, m_title;
+    std::vector<CView*> m_views;
+    QUndoStack* m_undo = nullptr; // child object
+    CMultiDocTemplate* m_template = nullptr;
+    bool m_modified = false, m_executing = false;
+};

@@ -1,0 +1,59 @@
+// What an editor offers the shell: how to make a document with its frame and view.
+#pragma once
+
+#include "ks/fc/doc.h"
+
+#include <QPointer>
+#include <functional>
+#include <memory>
+#include <vector>
+
+class CKsMDIChildWnd;
+class CKsMDIFrameWnd;
+
+/// A document template. The shell owns it; it owns its open documents. A document is deleted when its last window has
+/// closed.
+class KS_API CMultiDocTemplate : public QObject
+{
+    Q_OBJECT
+public:
+    /// The seven lines of a template string.
+    enum DocStringIndex { windowTitle, docName, fileNewName, filterName, filterExt, regFileTypeId, regFileTypeName };
+
+    struct Classes
+    {
+        std::function<CKsDoc*()> document;
+        std::function<CKsMDIChildWnd*()> frame;
+        std::function<CView*()> view;
+    };
+
+    /// `strings`: the seven fields, separated by line breaks.
+    CMultiDocTemplate(int resourceId, CString strings, Classes classes);
+    ~CMultiDocTemplate() override;
+
+    int ResourceId() const { return m_resourceId; }
+    CString GetDocString(DocStringIndex index) const;
+    /// Whether the template's extension fits, whatever its case.
+    bool MatchesExtension(const CString& path) const;
+
+    /// Opens `path` (a new untitled document when empty) in a new window of the frame. Null when it failed; the
+    /// document has told the user why. A file that is open already is brought to the front instead.
+    CKsDoc* OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path);
+
+    const std::vector<CKsDoc*>& Documents() const { return m_documents; }
+    CKsDoc* FindDocument(const CString& path) const;
+
+signals:
+    void DocumentOpened(CKsDoc* document);
+    void DocumentClosing(CKsDoc* document);
+
+private:
+    friend class CKsMDIChildWnd;
+    void CloseDocument(CKsDoc* document);
+
+    int m_resourceId;
+    QStringList m_strings;
+    Classes m_classes;
+    std::vector<CKsDoc*> m_documents;
+    int m_untitled = 0;
+};

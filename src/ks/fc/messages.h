@@ -1,0 +1,42 @@
+// Registered messages: a name is registered once and gets a number; a message is sent synchronously to a window.
+#pragma once
+
+#include "ks/fc/types.h"
+#include "ks/ks_export.h"
+
+class QWidget;
+
+/// Anything that can be sent a message: the main frame, a view.
+class KS_API CKsWindow
+{
+public:
+    virtual ~CKsWindow() = default;
+    /// Handles one message; the base answers 0, as the default window procedure.
+    virtual LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam);
+};
+
+/// Number of a registered message name; the same name always gets the same number. Never 0.
+KS_API unsigned KsRegisterMessage(const char* name);
+/// Calls the window's procedure and returns its answer; 0 for a null window. Addresses in lParam are valid only
+/// during the call.
+KS_API LRESULT KsSendMessage(CKsWindow* window, unsigned message, WPARAM wParam, LPARAM lParam);
+/// The shell's main window, null while there is none (a test, a command line).
+KS_API CKsWindow* KsMainWindow();
+KS_API void KsSetMainWindow(CKsWindow* window);
+
+namespace KsMessage {
+// The names are the shell's, the misspelling in the first included.
+KS_API unsigned SwitchBoard();     // "KavoShellSwitchBoardSevice"
+KS_API unsigned BetweenEditors();  // "KavoShellCommunicationBetweenEditors"
+KS_API unsigned ProjectManagement();
+KS_API unsigned ShowToolbar();
+KS_API unsigned HideToolbar();
+KS_API unsigned ProjectMapChanged(); // "KSM_VISUAL_PROJECT_MAP_CHANGED"
+} // namespace KsMessage
+
+/// Request codes (wParam) of the switchboard and of the messages between editors.
+namespace KsRequest {
+inline constexpr WPARAM LeaveProject = 24;
+inline constexpr WPARAM JoinProject = 25;
+inline constexpr WPARAM DataChanged = 522;
+} // namespace KsRequest

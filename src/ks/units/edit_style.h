@@ -1,0 +1,67 @@
+// How a number of one quantity is shown: unit group, unit of the user's unit system, format.
+#pragma once
+
+#include "ks/fc/types.h"
+#include "ks/ks_export.h"
+#include "ks/units/unit_group.h"
+
+#include <QObject>
+
+enum class KsUnitSystem { Metric, UsCustomary };
+
+/// The user's unit system, for the whole program; emits Changed when it is switched.
+class KS_API KsUnits : public QObject
+{
+    Q_OBJECT
+public:
+    static KsUnits& Instance();
+    KsUnitSystem System() const { return m_system; }
+    void SetSystem(KsUnitSystem system);
+signals:
+    void Changed();
+
+private:
+    KsUnits() = default;
+    KsUnitSystem m_system = KsUnitSystem::Metric;
+};
+
+/// Factor and offset between a group's base unit and a display unit: display = base * factor + offset.
+struct KsConversion
+{
+    double factor = 1, offset = 0;
+    bool IsIdentity() const { return factor == 1 && offset == 0; }
+};
+
+class KS_API CKsEditStyle
+{
+public:
+    CKsEditStyle() = default;
+    explicit CKsEditStyle(UnitGroup group, const char* format = "%-lf") : m_group(group), m_format(format) {}
+
+    /// `unit` -1 takes the display unit of the user's unit system, 0 the base unit itself.
+    void SetEumUnitBaseGroup(UnitGroup group, int unit = -1);
+    UnitGroup GetEumUnitBaseGroup() const { return m_group; }
+    /// A printf format for one double ("%-lf", "%.6lg", "%-.3E"). The C locale plays no part.
+    void SetFormat(const CString& format) { m_format = format; }
+    const CString& GetFormat() const { return m_format; }
+
+    /// flag 1: base to display; flag 0: display to base. Values not given (1e10) and non-numbers pass unchanged.
+    double UnitConvertFromBase(double value, int flag) const;
+    /// The converted value as text in the style's format.
+    CString UnitConvertFromBase_T(double value, int flag) const;
+    /// "Unit: m", or empty for a quantity without unit.
+    CString GetEumToolTipText() const;
+    /// Symbol of the display unit ("ft³/s"), empty without one.
+    CString UnitSymbol() const;
+
+private:
+    KsConversion Conversion() const;
+    UnitGroup m_group = UnitGroup::None;
+    int m_unit = -1;
+    CString m_format = QStringLiteral("%-lf");
+};
+
+/// Prints one double in a printf floating format, independent of the locale.
+KS_API CString KsFormatNumber(const CString& format, double value);
+/// The shortest text that reads back to the same number.
+KS_API CString KsShortestNumber(double value);

@@ -1,0 +1,33 @@
+#include "res/strings.h"
+
+#include <QCoreApplication>
+#include <algorithm>
+#include <iterator>
+
+namespace {
+
+struct Row
+{
+    int number;
+    const char* text;
+};
+
+// Sorted by number at compile time is not asked of the table: it is short and looked up a few times a window.
+constexpr Row Rows[] = {
+#define KVR_STRING(number, name, text) {number, text},
+#include "res/string_table.inc"
+#undef KVR_STRING
+};
+
+} // namespace
+
+QString LoadString(int number)
+{
+    const auto* row = std::find_if(std::begin(Rows), std::end(Rows), [&](const Row& r) { return r.number == number; });
+    return row == std::end(Rows) ? QString() : QCoreApplication::translate("Kavo0_hd", row->text);
+}
+
+QString LoadString(Str id)
+{
+    return LoadString(static_cast<int>(id));
+}

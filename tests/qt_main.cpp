@@ -1,0 +1,17 @@
+// The main of every test program that needs Qt: an application on the offscreen platform, the C
+// locale kept for numbers as in the shell, and settings kept away from the user's own.
+#include <QApplication>
+#include <QStandardPaths>
+#include <gtest/gtest.h>
+
+int main(int argc, char** argv)
+{
+    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    QStandardPaths::setTestModeEnabled(true);
+    QCoreApplication::setOrganizationName("KVR-test");
+    QCoreApplication::setApplicationName("kvr-tests");
+    testing::InitGoogleTest(&argc, argv);
+    QApplication app(argc, argv);
+    return RUN_ALL_TESTS();
+}
