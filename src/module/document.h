@@ -5,6 +5,9 @@
 #include "ks/fc/doc.h"
 
 #include <cstdint>
+#include <unordered_set>
+
+class CPurgedLines;
 
 class CKavo0_hdDoc : public CKsDoc
 {
@@ -20,6 +23,7 @@ public:
     BOOL OnOpenDocument(const CString& path) override;
     /// Saves to the path with the extension ".HDKV"; see docs/architecture.md, "Saving".
     BOOL OnSaveDocument(const CString& path) override;
+    CString SavePathFor(const CString& path) const override;
     void DeleteContents() override;
 
     /// Joins the shell's project; true when the document belongs to one.
@@ -30,6 +34,12 @@ public:
     /// Marks the document modified, updates all views but the sender, and gives the sender the focus back.
     void UpdateAll(CView* sender, int hint, CHint* object);
 
+    /// Gives an empty list the one line that its page shows. The line is no change of the document: neither the modified
+    /// flag nor undo sees it, and a save removes it again while it is untouched.
+    void AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record);
+    /// Whatever edits or removes a record says so: a placeholder becomes an ordinary line.
+    void PlaceholderTouched(const HD_RiverPos& record) { m_placeholders.erase(&record); }
+
     std::intptr_t ProjectHandle() const { return m_hProject; }
     const CString& FilePath() const { return m_strFilePath; }
 
@@ -39,12 +49,20 @@ signals:
 
 private:
     void ReadData(const CString& path);
+    /// Writes the whole content; on failure the user has been told and the file is what it was.
     bool WriteData(const CString& path);
+    bool KeepUnreadableOriginal();
+    /// Whether `target`, an existing file that this document was not read from, may be replaced.
+    bool MayReplace(const CString& target, const CString& path);
+    void RemoveOldSpelling(const CString& target);
+    void RemovePlaceholders();
+    LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name);
 
     HD_Parameters m_parameters;
     CString m_strFilePath;      // of the file last opened
     std::intptr_t m_hProject = 0;
     bool m_unreadable = false;  // the file at m_strFilePath could not be parsed
+    std::unordered_set<const HD_RiverPos*> m_placeholders;
 };
 
 /// Update hints of the document.

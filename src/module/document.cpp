@@ -1,0 +1,219 @@
+#include "module/document.h"
+
+#include "data/hd_file.h"
+#include "data/safe_file.h"
+#include "ks/fc/message_box.h"
+#include "ks/fc/package.h"
+#include "module/purged_lines.h"
+#include "res/strings.h"
+
+#include <QApplication>
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QPointer>
+#include <QUndoStack>
+
+namespace {
+
+constexpr int HDPackageKind = 8; // what this editor's packages call themselves
+
+bool HasHDExtension(const CString& path)
+{
+    // Mixed spellings are refused: the shell's file tables know these two.
+    const CString extension = QFileInfo(path).suffix();
+    return extension == QLatin1String("HDKV") || extension == QLatin1String("hdkv");
+}
+
+/// Takes the focus from the field or cell being edited, so that it commits its text, and gives it back afterwards.
+class FocusPause
+{
+public:
+    FocusPause() : m_widget(QApplication::focusWidget())
+    {
+        if (m_widget)
+            m_widget->clearFocus();
+    }
+    ~FocusPause()
+    {
+        if (m_widget && !QApplication::focusWidget())
+            m_widget->setFocus(Qt::OtherFocusReason);
+    }
+
+private:
+    QPointer<QWidget> m_widget;
+};
+
+} // namespace
+
+CKavo0_hdDoc::CKavo0_hdDoc() = default;
+
+BOOL CKavo0_hdDoc::OnNewDocument()
+{
+    return CKsDoc::OnNewDocument();
+}
+
+BOOL CKavo0_hdDoc::OnOpenDocument(const CString& path)
+{
+    if (!CKsDoc::OnOpenDocument(path))
+        return false;
+    m_strFilePath = path;
+    if (!HasHDExtension(path)) {
+        KsMessageBox(LoadString(Str::UnsupportedFormat));
+        return false;
+    }
+    ReadData(path);
+    return true;
+}
+
+void CKavo0_hdDoc::ReadData(const CString& path)
+{
+    tqlHandle handle = tqlLoadFile(path.toStdString(), 1);
+    m_unreadable = tqlPeekErrorGlb() != 0;
+    if (m_unreadable) {
+        tqlGetErrorGlb();
+        TqlSyntaxError error;
+        tqlGetSyntaxErr(handle, &error);
+        KsMessageBox(QString::fromStdString(error.message));
+    } else {
+        m_parameters.Load(handle);
+    }
+    tqlClose(&handle);
+}
+
+CString CKavo0_hdDoc::SavePathFor(const CString& path) const
+{
+    const QFileInfo info(path);
+    return info.dir().filePath(info.completeBaseName() + QStringLiteral(".HDKV"));
+}
+
+BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
+{
+    const FocusPause pause;
+    const CString target = SavePathFor(path);
+    UpdateAllViews(nullptr, Hint::Store);
+    if (!MayReplace(target, path))
+        return false;
+
+    RemovePlaceholders();
+    auto purged = std::make_unique<CPurgedLines>(*this);
+    purged->Apply();
+    if (!WriteData(target)) {
+        purged->Revert(); // what is in memory stays as the user left it
+        UpdateAllViews(nullptr, Hint::Reload);
+        return false;
+    }
+    if (!purged->IsEmpty())
+        UndoStack().push(purged.release());
+    UndoStack().setClean();
+
+    RemoveOldSpelling(target);
+    m_strFilePath = target;
+    m_unreadable = false;
+    SetPathName(target);
+    UpdateAllViews(nullptr, Hint::Reload);
+    SetModifiedFlag(false);
+    return true;
+}
+
+bool CKavo0_hdDoc::MayReplace(const CString& target, const CString& path)
+{
+    // Only a plain save whose name changes case can meet a file nobody was asked about: Save As has asked already.
+    if (path != GetPathName() || path == target || !QFileInfo::exists(target) || SameFile(path.toStdString(), target.toStdString()))
+        return true;
+    const CString question = LoadString(Str::ReplaceOtherSpelling)
+                                 .arg(QFileInfo(target).fileName(), QFileInfo(path).fileName());
+    return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
+}
+
+bool CKavo0_hdDoc::WriteData(const CString& path)
+{
+    if (m_unreadable && SavePathFor(m_strFilePath) == path && !KeepUnreadableOriginal())
+        return false;
+    const auto saved = SaveHDFile(m_parameters, path.toStdString());
+    if (!saved)
+        KsMessageBox(QString::fromStdString(saved.error().message));
+    return bool(saved);
+}
+
+bool CKavo0_hdDoc::KeepUnreadableOriginal()
+{
+    if (!QFileInfo::exists(m_strFilePath))
+        return true;
+    const auto kept = KeepUnreadable(m_strFilePath.toStdString());
+    if (!kept)
+        KsMessageBox(QString::fromStdString(kept.error().message));
+    return bool(kept);
+}
+
+void CKavo0_hdDoc::RemoveOldSpelling(const CString& target)
+{
+    const CString& old = m_strFilePath;
+    if (old.isEmpty() || old == target || SavePathFor(old) != target || !QFileInfo::exists(old))
+        return;
+    // Where the file system ignores case both names are the file that was just written.
+    if (!SameFile(old.toStdString(), target.toStdString()))
+        QFile::remove(old);
+}
+
+void CKavo0_hdDoc::AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record)
+{
+    m_placeholders.insert(record.get());
+    list.InsertAt(0, std::move(record));
+}
+
+void CKavo0_hdDoc::RemovePlaceholders()
+{
+    for (const ListEntry& entry : HDLists()) {
+        if (!entry.purgedAtSave)
+            continue;
+        CGenList& list = *entry.list(m_parameters);
+        if (list.GetCount() == 1 && list.GetAt(0).IsBlank() && m_placeholders.erase(&list.GetAt(0)))
+            list.RemoveAt(0);
+    }
+}
+
+void CKavo0_hdDoc::DeleteContents()
+{
+    UndoStack().clear();
+    m_placeholders.clear();
+    m_parameters.RemoveAllRecords();
+    CKsDoc::DeleteContents();
+}
+
+LRESULT CKavo0_hdDoc::SendToShell(unsigned message, WPARAM request, CView* view, const CString& name)
+{
+    CKSComm_Package package;
+    package.view = view;
+    package.text = name;
+    package.kind = HDPackageKind;
+    package.project = m_hProject;
+    return KsSendMessage(KsMainWindow(), message, request, reinterpret_cast<LPARAM>(&package));
+}
+
+BOOL CKavo0_hdDoc::GetProjectInfo(CView* view, const CString& name)
+{
+    m_hProject = 0;
+    m_hProject = SendToShell(KsMessage::SwitchBoard(), KsRequest::JoinProject, view, name);
+    return m_hProject != 0;
+}
+
+void CKavo0_hdDoc::LeaveProject(CView* view, const CString& name)
+{
+    if (m_hProject)
+        SendToShell(KsMessage::SwitchBoard(), KsRequest::LeaveProject, view, name);
+}
+
+void CKavo0_hdDoc::DataChange(const CString& name)
+{
+    if (m_hProject)
+        SendToShell(KsMessage::BetweenEditors(), KsRequest::DataChanged, nullptr, name);
+}
+
+void CKavo0_hdDoc::UpdateAll(CView* sender, int hint, CHint* object)
+{
+    SetModifiedFlag(true);
+    UpdateAllViews(sender, hint, object);
+    if (sender && !sender->isAncestorOf(QApplication::focusWidget()))
+        sender->setFocus();
+}

@@ -1,0 +1,11 @@
+// The window of an HD parameter document.
+#pragma once
+
+#include "ks/fc/frames.h"
+
+class CDlgFrame : public CKsMDIChildWnd
+{
+    Q_OBJECT
+public:
+    using CKsMDIChildWnd::CKsMDIChildWnd;
+};

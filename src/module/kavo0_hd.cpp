@@ -1,0 +1,65 @@
+#include "module/kavo0_hd.h"
+
+#include "ks/language/language.h"
+#include "module/document.h"
+#include "module/frame.h"
+#include "module/view.h"
+#include "res/strings.h"
+
+#include <QDir>
+
+namespace {
+
+KsResourceHandle g_languageModule = nullptr;
+
+constexpr int ToolBarCommands[] = {Command::Search, Command::SearchAgain};
+
+CKsToolBarButton Button(int command)
+{
+    return {command, command == Command::Search ? ":/kavo0_hd/search.svg" : ":/kavo0_hd/search_again.svg",
+            LoadString(command)};
+}
+
+} // namespace
+
+static void InitResources()
+{
+    Q_INIT_RESOURCE(kavo0_hd);
+}
+
+void LoadModuleResources()
+{
+    InitResources();
+    KsLangLoadResDll("Kavo0_hd", &g_languageModule, 0);
+    KsMessage::ProjectMapChanged(); // registered from the start, so that its number is known to everybody
+}
+
+void FreeModuleResources()
+{
+    KsLangFreeResDll(g_languageModule);
+    g_languageModule = nullptr;
+}
+
+CMultiDocTemplate* CKavo0_hd::CreateMainDlg()
+{
+    return new CMultiDocTemplate(Resource::Document, LoadString(Str::DocumentTemplate),
+                                 {[]() -> CKsDoc* { return new CKavo0_hdDoc; },
+                                  []() -> CKsMDIChildWnd* { return new CDlgFrame; },
+                                  []() -> CView* { return new CKavo0_hdView; }});
+}
+
+BOOL CKavo0_hd::InitToolBar(CKsToolBarEx* bar, CKsMDIFrameWnd* frame, unsigned style, unsigned controlId)
+{
+    if (!bar || !bar->Create(frame, style, controlId))
+        return false;
+    std::vector<CKsToolBarButton> buttons;
+    for (const int command : ToolBarCommands)
+        buttons.push_back(Button(command));
+    if (!bar->LoadToolBar(buttons))
+        return false;
+    bar->setObjectName("kavo0_hdToolBar");
+    bar->setWindowTitle(LoadString(Str::ToolBarName).trimmed());
+    bar->SetBarStyle(bar->GetBarStyle() | CBRS_TOOLTIPS | CBRS_FLYBY | CBRS_SIZE_DYNAMIC);
+    bar->EnableDocking(CBRS_ALIGN_ANY);
+    return true;
+}

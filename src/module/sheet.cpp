@@ -1,0 +1,130 @@
+#include "module/sheet.h"
+
+#include "module/view.h"
+#include "pages/framework/page.h"
+
+#include <QKeyEvent>
+#include <QSignalBlocker>
+#include <QStyleOptionTab>
+#include <QStylePainter>
+#include <QTabBar>
+
+namespace {
+
+/// A tab column whose captions read from left to right.
+class SideTabBar : public QTabBar
+{
+public:
+    using QTabBar::QTabBar;
+
+    QSize tabSizeHint(int index) const override
+    {
+        const QSize text = fontMetrics().size(Qt::TextShowMnemonic, tabText(index));
+        return {text.width() + 3 * fontMetrics().height(), text.height() + fontMetrics().height() * 2 / 3};
+    }
+    QSize minimumTabSizeHint(int index) const override { return tabSizeHint(index); }
+
+protected:
+    void paintEvent(QPaintEvent*) override
+    {
+        QStylePainter painter(this);
+        for (int i = 0; i < count(); ++i) {
+            QStyleOptionTab option;
+            initStyleOption(&option, i);
+            painter.drawControl(QStyle::CE_TabBarTabShape, option);
+            const QRect text = option.rect.adjusted(fontMetrics().height() * 2 / 3, 0, -4, 0);
+            const auto role = option.state & QStyle::State_Enabled ? QPalette::Normal : QPalette::Disabled;
+            style()->drawItemText(&painter, text, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextShowMnemonic,
+                                  palette(), role == QPalette::Normal, tabText(i), QPalette::WindowText);
+            if (hasFocus() && i == currentIndex()) {
+                QStyleOptionFocusRect focus;
+                focus.initFrom(this);
+                focus.rect = option.rect.adjusted(3, 3, -3, -3);
+                painter.drawPrimitive(QStyle::PE_FrameFocusRect, focus);
+            }
+        }
+    }
+};
+
+} // namespace
+
+CDlgPropertySheet::CDlgPropertySheet(CKavo0_hdView* view) : QTabWidget(view), m_view(view)
+{
+    setObjectName("sheet");
+    setTabBar(new SideTabBar(this));
+    setTabPosition(QTabWidget::West);
+    setUsesScrollButtons(true);
+    connect(this, &QTabWidget::currentChanged, this, &CDlgPropertySheet::TabChanged);
+}
+
+void CDlgPropertySheet::AddPage(CGenPropertyPage* page)
+{
+    page->installEventFilter(this);
+    const QSignalBlocker quiet(this);
+    addTab(page, page->Caption());
+    if (m_active < 0)
+        m_active = 0;
+}
+
+CGenPropertyPage* CDlgPropertySheet::PageAt(int tab) const
+{
+    return qobject_cast<CGenPropertyPage*>(widget(tab));
+}
+
+CGenPropertyPage* CDlgPropertySheet::ActivePage() const
+{
+    return PageAt(m_active);
+}
+
+void CDlgPropertySheet::TabChanged(int tab)
+{
+    if (tab == m_active)
+        return;
+    // The tab bar has switched already; a page that may not be left comes back before anything was painted.
+    if (auto* left = ActivePage(); left && !left->OnKillActive()) {
+        const QSignalBlocker quiet(this);
+        setCurrentIndex(m_active);
+        return;
+    }
+    m_active = tab;
+    if (auto* entered = ActivePage())
+        entered->OnSetActive();
+}
+
+bool CDlgPropertySheet::SetActivePage(int tab)
+{
+    if (tab >= 0 && tab < count())
+        setCurrentIndex(tab);
+    return m_active == tab;
+}
+
+bool CDlgPropertySheet::SetActivePage(CGenPropertyPage* page)
+{
+    return SetActivePage(indexOf(page));
+}
+
+bool CDlgPropertySheet::eventFilter(QObject* watched, QEvent* event)
+{
+    // Ctrl+F4 belongs to the document window even while the focus is in a page.
+    if (event->type() == QEvent::KeyPress) {
+        const auto* key = static_cast<QKeyEvent*>(event);
+        if (key->key() == Qt::Key_F4 && key->modifiers() & Qt::ControlModifier) {
+            m_view->CloseWindow();
+            return true;
+        }
+    }
+    return QTabWidget::eventFilter(watched, event);
+}
+
+void CDlgPropertySheet::changeEvent(QEvent* event)
+{
+    QTabWidget::changeEvent(event);
+    if (event->type() == QEvent::LanguageChange)
+        UpdateCaptions();
+}
+
+void CDlgPropertySheet::UpdateCaptions()
+{
+    for (int i = 0; i < count(); ++i)
+        setTabText(i, PageAt(i)->Caption());
+}

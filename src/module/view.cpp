@@ -1,0 +1,278 @@
+#include "module/view.h"
+
+#include "ks/fc/message_box.h"
+#include "ks/fc/package.h"
+#include "module/page_table.h"
+#include "module/sheet.h"
+#include "pages/framework/gen_grid.h"
+#include "pages/framework/goto_dlg.h"
+#include "pages/framework/page.h"
+#include "pages/framework/search_dlg.h"
+#include "res/strings.h"
+
+#include <QStatusTipEvent>
+#include <QTimer>
+#include <QVBoxLayout>
+#include <algorithm>
+
+namespace {
+
+constexpr int LinesMenuPosition = 2; // the third menu of the main frame
+
+} // namespace
+
+CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CView(parent)
+{
+    setObjectName("hdView");
+    setWindowTitle(LoadString(Str::SheetCaption));
+}
+
+CKavo0_hdView::~CKavo0_hdView()
+{
+    if (auto* document = GetDocument()) {
+        document->LeaveProject(this, document->GetPathName());
+        document->DataChange(document->GetPathName());
+    }
+    delete m_sheet; // while this is still a host
+}
+
+CKavo0_hdDoc* CKavo0_hdView::GetDocument() const
+{
+    return static_cast<CKavo0_hdDoc*>(CView::GetDocument());
+}
+
+CGenPropertyPage* CKavo0_hdView::ActivePage() const
+{
+    return m_sheet ? m_sheet->ActivePage() : nullptr;
+}
+
+CKsMDIFrameWnd* CKavo0_hdView::MainFrame() const
+{
+    return qobject_cast<CKsMDIFrameWnd*>(window());
+}
+
+void CKavo0_hdView::CloseWindow()
+{
+    QTimer::singleShot(0, this, [this] {
+        if (auto* frame = qobject_cast<QMdiSubWindow*>(parentWidget()))
+            frame->close();
+    });
+}
+
+void CKavo0_hdView::OnInitialUpdate()
+{
+    CView::OnInitialUpdate();
+    m_sheet = new CDlgPropertySheet(this);
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(m_sheet);
+    setFocusProxy(m_sheet);
+
+    MakePages();
+    JoinProject();
+    connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
+    if (auto* page = ActivePage())
+        page->OnSetActive();
+}
+
+void CKavo0_hdView::MakePages()
+{
+    std::vector<std::pair<int, CGenPropertyPage*>> tabs;
+    for (const PageEntry& entry : PageTable()) {
+        auto page = entry.make(GetDocument());
+        page->SetHost(this);
+        if (entry.tab == NotOnSheet)
+            m_offSheet.push_back(std::move(page));
+        else
+            tabs.emplace_back(entry.tab, page.release());
+    }
+    std::sort(tabs.begin(), tabs.end());
+    for (const auto& [place, page] : tabs)
+        m_sheet->AddPage(page);
+}
+
+void CKavo0_hdView::JoinProject()
+{
+    if (!GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName()))
+        return;
+    std::vector<CGenPropertyPage*> pages;
+    for (int tab = 0; tab < m_sheet->PageCount(); ++tab) {
+        if (auto* grid = m_sheet->PageAt(tab)->GetGrid())
+            grid->SetBranchNameColumn(1);
+    }
+}
+
+void CKavo0_hdView::OnUpdate(CView*, int hint, CHint*)
+{
+    auto* page = ActivePage();
+    if (!page)
+        return;
+    if (hint == Hint::Store)
+        page->StoreToDocument();
+    else if (hint == Hint::Reload)
+        page->LoadFromDocument(GetDocument());
+}
+
+void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deactivated)
+{
+    if (activate) {
+        SendToolbarMessage(KsMessage::ShowToolbar());
+        EnableLinesMenu(m_linesEnabled);
+    } else if (activated) {
+        if (activated == deactivated)
+            SendToolbarMessage(KsMessage::HideToolbar());
+        if (!qobject_cast<CKavo0_hdView*>(activated))
+            SendToolbarMessage(KsMessage::HideToolbar());
+    }
+    CView::OnActivateView(activate, activated, deactivated);
+}
+
+void CKavo0_hdView::SendToolbarMessage(unsigned message)
+{
+    CKSComm_Package package;
+    package.view = this;
+    KsSendMessage(KsMainWindow(), message, 0, reinterpret_cast<LPARAM>(&package));
+}
+
+LRESULT CKavo0_hdView::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
+{
+    if (message == KsMessage::BetweenEditors())
+        return 0;
+    if (message == KsMessage::ProjectManagement() && wParam != 2)
+        return 0;
+    return CView::WindowProc(message, wParam, lParam);
+}
+
+// ---- what a page tells -------------------------------------------------------------------------
+
+void CKavo0_hdView::EditedLineChanged(int column)
+{
+    if (auto* page = ActivePage())
+        page->StoreToDocument();
+    const bool location = column == 1 || column == 2;
+    if (location)
+        GetDocument()->DataChange(GetDocument()->GetPathName());
+    GetDocument()->UpdateAllViews(nullptr, Hint::Reload);
+}
+
+void CKavo0_hdView::CurrentLocationChanged(int row)
+{
+    const auto* page = ActivePage();
+    if (!page || !page->GetList() || !MainFrame())
+        return;
+    QStatusTipEvent tip(LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()));
+    QCoreApplication::sendEvent(MainFrame(), &tip);
+}
+
+QStringList CKavo0_hdView::BranchNames()
+{
+    return {};
+}
+
+void CKavo0_hdView::EnableLinesMenu(bool enable)
+{
+    m_linesEnabled = enable;
+    if (auto* frame = MainFrame(); frame && frame->GetActiveView() == this)
+        frame->EnableMenuItem(LinesMenuPosition, enable);
+}
+
+void CKavo0_hdView::RevealChange(CGenList* list, int row, int /*column*/)
+{
+    for (int tab = 0; list && tab < m_sheet->PageCount(); ++tab) {
+        auto* page = m_sheet->PageAt(tab);
+        if (page->GetList() != list)
+            continue;
+        if (m_sheet->SetActivePage(tab) && row > 0)
+            page->GotoLine(row);
+        return;
+    }
+}
+
+// ---- commands ----------------------------------------------------------------------------------
+
+std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
+{
+    return {
+        {Command::InsertLine, LoadString(Str::MenuInsertLine), QKeySequence()},
+        {Command::DeleteLine, LoadString(Str::MenuDeleteLine), QKeySequence()},
+        {},
+        {Command::GotoLine, LoadString(Str::MenuGotoLine), QKeySequence(Qt::CTRL | Qt::Key_G)},
+        {},
+        {Command::Search, LoadString(Str::MenuSearch), QKeySequence(Qt::Key_F7)},
+        {Command::SearchAgain, LoadString(Str::MenuSearchAgain), QKeySequence(Qt::Key_F3)},
+    };
+}
+
+bool CKavo0_hdView::IsCommandEnabled(int id) const
+{
+    const auto* page = ActivePage();
+    const bool lines = m_linesEnabled && page && page->GetGrid();
+    switch (id) {
+    case Command::InsertLine:
+    case Command::DeleteLine:
+    case Command::GotoLine:
+    case Command::Search:
+        return lines;
+    case Command::SearchAgain:
+        return lines && m_search.asked;
+    default:
+        return false;
+    }
+}
+
+bool CKavo0_hdView::OnCommand(int id)
+{
+    auto* page = ActivePage();
+    if (!page || !IsCommandEnabled(id))
+        return false;
+    switch (id) {
+    case Command::InsertLine:
+        page->AppendLine();
+        return true;
+    case Command::DeleteLine:
+        page->DeleteLines();
+        return true;
+    case Command::GotoLine:
+        GotoLine();
+        return true;
+    case Command::Search:
+        Search();
+        return true;
+    case Command::SearchAgain:
+        SearchAgain();
+        return true;
+    default:
+        return false;
+    }
+}
+
+void CKavo0_hdView::GotoLine()
+{
+    CGotoDlg dialog(this);
+    if (dialog.exec() == QDialog::Accepted)
+        ActivePage()->GotoLine(dialog.Line());
+}
+
+void CKavo0_hdView::Search()
+{
+    CSearchDlg dialog(m_search.name, m_search.chainage, m_search.chainageCriterion, m_search.nameCriterion, this);
+    if (dialog.exec() != QDialog::Accepted)
+        return;
+    m_search = {dialog.RiverName(), dialog.Chainage(), dialog.ChainageCriterion(), dialog.NameCriterion()};
+    m_search.asked = true;
+    SearchAgain();
+}
+
+void CKavo0_hdView::SearchAgain()
+{
+    auto* grid = ActivePage() ? ActivePage()->GetGrid() : nullptr;
+    if (!grid)
+        return;
+    if (grid->SearchRows(m_search.row, m_search.name, m_search.chainage, m_search.chainageCriterion,
+                         m_search.nameCriterion)) {
+        m_search.found = true;
+        return;
+    }
+    const bool hadFound = std::exchange(m_search.found, false);
+    KsMessageBox(LoadString(hadFound ? Str::LastOccurrence : Str::NotFound), QMessageBox::Ok, this);
+}

@@ -1,0 +1,70 @@
+// The view of an HD parameter document: hosts the sheet of pages and relays between them, the document and the shell.
+#pragma once
+
+#include "ks/fc/frames.h"
+#include "module/document.h"
+#include "pages/framework/page_host.h"
+
+#include <QString>
+
+class CDlgPropertySheet;
+class CGenPropertyPage;
+
+class CKavo0_hdView : public CView, public CCommandTarget, public IPageHost
+{
+    Q_OBJECT
+public:
+    explicit CKavo0_hdView(QWidget* parent = nullptr);
+    ~CKavo0_hdView() override;
+
+    CKavo0_hdDoc* GetDocument() const;
+    /// The sheet; null before the first update.
+    CDlgPropertySheet* Sheet() const { return m_sheet; }
+    CGenPropertyPage* ActivePage() const;
+    /// Closes the document window, after this event.
+    void CloseWindow();
+
+    // CView
+    void OnInitialUpdate() override;
+    void OnUpdate(CView* sender, int hint, CHint* object) override;
+    void OnActivateView(bool activate, CView* activated, CView* deactivated) override;
+    LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam) override;
+
+    // CCommandTarget
+    bool OnCommand(int id) override;
+    bool IsCommandEnabled(int id) const override;
+    std::vector<CKsMenuCommand> LinesMenu() const override;
+
+    // IPageHost
+    CView* HostView() override { return this; }
+    void EditedLineChanged(int column) override;
+    void CurrentLocationChanged(int row) override;
+    void Execute(int command) override { OnCommand(command); }
+    QStringList BranchNames() override;
+    void EnableLinesMenu(bool enable) override;
+
+private:
+    /// What F7 asked for and F3 goes on with.
+    struct SearchState
+    {
+        QString name;
+        double chainage = 0; // metres
+        int chainageCriterion = 3, nameCriterion = 0;
+        int row = 0;         // the next search starts here; 0 is the first row
+        bool asked = false, found = false;
+    };
+
+    void MakePages();
+    void JoinProject();
+    void Search();
+    void SearchAgain();
+    void GotoLine();
+    void RevealChange(CGenList* list, int row, int column);
+    void SendToolbarMessage(unsigned message);
+    CKsMDIFrameWnd* MainFrame() const;
+
+    CDlgPropertySheet* m_sheet = nullptr;              // child
+    std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
+    SearchState m_search;
+    bool m_linesEnabled = true;
+};
