@@ -1,0 +1,162 @@
+#include "module_fixture.h"
+
+#include <QDir>
+#include <QUndoStack>
+
+namespace {
+
+class DocumentTest : public ModuleTest
+{
+protected:
+    CKavo0_hdDoc document;
+};
+
+TEST_F(DocumentTest, OpensTheTwoSpellingsOfTheExtensionOnly)
+{
+    const std::pair<const char*, bool> cases[] = {
+        {"a.hdkv", true}, {"b.HDKV", true}, {"c.Hdkv", false}, {"d.txt", false}, {"hdkv", false}};
+    for (const auto& [name, opens] : cases) {
+        Write(Path(name), SmallFile);
+        boxes.clear();
+        EXPECT_EQ(bool(document.OnOpenDocument(Path(name))), opens) << name;
+        EXPECT_EQ(boxes, opens ? QStringList() : QStringList("Unsupported file format")) << name;
+        document.DeleteContents();
+    }
+    EXPECT_FALSE(document.OnOpenDocument(Path("missing.hdkv")));
+}
+
+TEST_F(DocumentTest, SavePurgesWritesUpperCaseAndUndoBringsTheLinesBack)
+{
+    Write(Path("river.hdkv"), SmallFile);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.hdkv")));
+    document.SetPathName(Path("river.hdkv"));
+    document.Parameters().LeakageList.Add(); // lists that are not cleaned keep incomplete lines
+    document.UpdateAll(nullptr, Hint::Reload, nullptr);
+    ASSERT_TRUE(document.IsModified());
+
+    ASSERT_TRUE(document.OnSaveDocument(Path("river.hdkv")));
+    EXPECT_TRUE(boxes.isEmpty());
+    EXPECT_FALSE(document.IsModified());
+    EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files), QStringList("river.HDKV"));
+    EXPECT_EQ(document.GetPathName(), Path("river.HDKV"));
+    EXPECT_EQ(document.Parameters().InitList.GetCount(), 1u);
+    EXPECT_EQ(document.Parameters().LeakageList.GetCount(), 1u);
+
+    CKavo0_hdDoc again;
+    ASSERT_TRUE(again.OnOpenDocument(Path("river.HDKV")));
+    EXPECT_EQ(again.Parameters().InitList.GetCount(), 1u);
+    EXPECT_EQ(again.Parameters().LeakageList.GetCount(), 1u);
+    EXPECT_EQ(again.Parameters().Global.G_waterlevel, 1.5);
+    EXPECT_TRUE(Read(Path("river.HDKV")).contains("DATA = \"MAIN\", 7, \"kept\""));
+
+    document.UndoStack().undo();
+    ASSERT_EQ(document.Parameters().InitList.GetCount(), 3u);
+    EXPECT_EQ(document.Parameters().InitList.GetAt(1).Chainage, 200);
+    EXPECT_TRUE(document.IsModified());
+    document.UndoStack().redo();
+    EXPECT_EQ(document.Parameters().InitList.GetCount(), 1u);
+}
+
+TEST_F(DocumentTest, SavingUnderAnotherExtensionWritesHDKVAndKeepsTheOldFile)
+{
+    Write(Path("river.hdkv"), SmallFile);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.hdkv")));
+    ASSERT_TRUE(document.OnSaveDocument(Path("copy.txt")));
+    EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files), (QStringList{"copy.HDKV", "river.hdkv"}));
+    EXPECT_EQ(Read(Path("river.hdkv")), SmallFile);
+}
+
+TEST_F(DocumentTest, AFileThatCannotBeParsedOpensEmptyAndIsKeptWhenSavedOver)
+{
+    const QByteArray broken = "[KAVO0_HD]\n  [InitList]\n    DATA = \"A\", 1, 2, 3\n  [/WindList]\n";
+    Write(Path("river.HDKV"), broken);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_EQ(boxes[0], "river.HDKV, line 4, column 3: expected [/InitList], found [/WindList]");
+    EXPECT_TRUE(document.Parameters().InitList.IsEmpty());
+
+    ASSERT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(Read(Path("river.HDKV.unreadable-1")), broken);
+    CKavo0_hdDoc again;
+    EXPECT_TRUE(again.OnOpenDocument(Path("river.HDKV")));
+    EXPECT_EQ(boxes.size(), 1);
+}
+
+TEST_F(DocumentTest, AFailedSaveLeavesFileAndMemoryAsTheyWere)
+{
+    Write(Path("river.HDKV"), SmallFile);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+    document.UpdateAll(nullptr, Hint::Reload, nullptr);
+    const CString target = Path("missing folder/river.HDKV");
+    EXPECT_FALSE(document.OnSaveDocument(target));
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(boxes[0].contains("missing folder")) << qPrintable(boxes[0]);
+    EXPECT_TRUE(document.IsModified());
+    EXPECT_EQ(document.Parameters().InitList.GetCount(), 3u);
+    EXPECT_EQ(Read(Path("river.HDKV")), SmallFile);
+}
+
+TEST_F(DocumentTest, AsksBeforeReplacingAnotherFileThatDiffersInCaseOnly)
+{
+    Write(Path("river.hdkv"), SmallFile);
+    Write(Path("river.HDKV"), "[Other]\n[/Other]\n");
+    if (QDir(folder.path()).entryList(QDir::Files).size() == 1)
+        GTEST_SKIP() << "the file system ignores case";
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.hdkv")));
+    document.SetPathName(Path("river.hdkv"));
+    answer = QMessageBox::No;
+    EXPECT_FALSE(document.OnSaveDocument(Path("river.hdkv")));
+    EXPECT_EQ(boxes.size(), 1);
+    EXPECT_EQ(Read(Path("river.HDKV")), "[Other]\n[/Other]\n");
+    answer = QMessageBox::Yes;
+    EXPECT_TRUE(document.OnSaveDocument(Path("river.hdkv")));
+    EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files), QStringList("river.HDKV"));
+}
+
+TEST_F(DocumentTest, DeleteContentsKeepsTheGlobalValues)
+{
+    Write(Path("river.hdkv"), SmallFile);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.hdkv")));
+    document.DeleteContents();
+    EXPECT_TRUE(document.Parameters().InitList.IsEmpty());
+    EXPECT_EQ(document.Parameters().Global.G_waterlevel, 1.5);
+}
+
+TEST_F(DocumentTest, APlaceholderIsNeverSavedAndNoChange)
+{
+    document.AddPlaceholder(document.Parameters().InitList, std::make_unique<HD_Initial>());
+    EXPECT_FALSE(document.IsModified());
+    ASSERT_TRUE(document.OnSaveDocument(Path("new.HDKV")));
+    EXPECT_TRUE(document.Parameters().InitList.IsEmpty());
+    EXPECT_EQ(document.UndoStack().count(), 0);
+}
+
+TEST_F(DocumentTest, TalksToTheShellOnlyInsideAProject)
+{
+    CView view;
+    EXPECT_FALSE(document.GetProjectInfo(&view, "p"));
+    document.LeaveProject(&view, "p");
+    document.DataChange("p");
+    ASSERT_EQ(messages.size(), 1u);
+    EXPECT_EQ(messages[0].request, 25u);
+
+    projectHandle = 77;
+    messages.clear();
+    EXPECT_TRUE(document.GetProjectInfo(&view, "p"));
+    document.DataChange("p");
+    document.LeaveProject(&view, "p");
+    ASSERT_EQ(messages.size(), 3u);
+    const std::pair<unsigned, WPARAM> expected[] = {
+        {KsMessage::SwitchBoard(), 25}, {KsMessage::BetweenEditors(), 522}, {KsMessage::SwitchBoard(), 24}};
+    for (std::size_t i = 0; i < 3; ++i) {
+        EXPECT_EQ(messages[i].message, expected[i].first);
+        EXPECT_EQ(messages[i].request, expected[i].second);
+        EXPECT_EQ(messages[i].text, "p");
+        EXPECT_EQ(messages[i].kind, 8);
+        EXPECT_EQ(messages[i].project, i == 0 ? 0 : 77);
+    }
+    EXPECT_EQ(messages[1].view, nullptr);
+    EXPECT_EQ(messages[2].view, &view);
+}
+
+} // namespace
