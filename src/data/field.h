@@ -9,7 +9,11 @@
 #include <span>
 #include <string>
 #include <string_view>
+#include <type_traits>
 #include <vector>
+
+class ExtraParams;
+class HD_RiverPos;
 
 /// A calendar date and time as a file stores it. The six integers are kept even when they are no date.
 struct HDDateTime
@@ -23,7 +27,8 @@ struct HDDateTime
     friend bool operator==(const HDDateTime&, const HDDateTime&) = default;
 };
 
-enum class FieldKind {
+enum class FieldKind
+{
     Number,   // double, in the base unit of its group
     Integer,  // std::int32_t
     Choice,   // std::int32_t, an index into a list of texts
@@ -44,6 +49,7 @@ struct GroupAccess
     std::size_t (*size)(const void* container) = nullptr;
     void (*resize)(void* container, std::size_t count) = nullptr;
     void* (*at)(void* container, std::size_t index) = nullptr;
+    ExtraParams* (*extra)(void* element) = nullptr; // what a file holds behind the element's fields; may be null
 };
 
 struct Field
@@ -51,15 +57,21 @@ struct Field
     std::string_view name;
     FieldKind kind = FieldKind::Number;
     UnitGroup unit = UnitGroup::None;
-    bool optionalTail = false; // read only when the keyword has parameters left; always written
-    void* (*address)(void* object) = nullptr;
-    const GroupAccess* group = nullptr; // Group only
+    bool optionalTail = false;                // read only when the keyword has parameters left; always written
+    void* (*address)(void* object) = nullptr; // a location record is passed as its HD_RiverPos
+    const GroupAccess* group = nullptr;       // Group only
 
     /// The value inside `object`, of the type that the kind says.
     template <typename T>
-    T& In(void* object) const { return *static_cast<T*>(address(object)); }
+    T& In(void* object) const
+    {
+        return *static_cast<T*>(address(object));
+    }
     template <typename T>
-    const T& In(const void* object) const { return *static_cast<const T*>(address(const_cast<void*>(object))); }
+    const T& In(const void* object) const
+    {
+        return *static_cast<const T*>(address(const_cast<void*>(object)));
+    }
     /// Number of file parameters: 1, 6 for a date-time, 0 for a group (depends on its count).
     std::size_t FixedParams() const { return kind == FieldKind::DateTime ? 6 : kind == FieldKind::Group ? 0 : 1; }
 };
@@ -77,61 +89,115 @@ struct MemberOf<M C::*>
     using Type = M;
 };
 
-template <auto Member>
+/// The object as the class that declares the member. Records travel as their base class.
+template <typename Class>
+Class* Object(void* object)
+{
+    if constexpr (std::is_base_of_v<HD_RiverPos, Class>)
+        return static_cast<Class*>(static_cast<HD_RiverPos*>(object));
+    else
+        return static_cast<Class*>(object);
+}
+/// A member, or a member of a member.
+template <auto Member, auto... Inner>
 void* Address(void* object)
 {
-    return &(static_cast<typename MemberOf<decltype(Member)>::Class*>(object)->*Member);
+    return &((Object<typename MemberOf<decltype(Member)>::Class>(object)->*Member).*....*Inner);
 }
-template <auto Member, std::size_t Index>
+template <std::size_t Index, auto Member, auto... Inner>
 void* ElementAddress(void* object)
 {
-    return &(static_cast<typename MemberOf<decltype(Member)>::Class*>(object)->*Member)[Index];
+    return &((Object<typename MemberOf<decltype(Member)>::Class>(object)->*Member).*....*Inner)[Index];
 }
-inline void* Identity(void* object) { return object; }
+inline void* Identity(void* object)
+{
+    return object;
+}
 
 template <typename Container>
-std::size_t Size(const void* container) { return static_cast<const Container*>(container)->size(); }
+std::size_t Size(const void* container)
+{
+    return static_cast<const Container*>(container)->size();
+}
 template <typename Container>
-void Resize(void* container, std::size_t count) { static_cast<Container*>(container)->resize(count); }
+void Resize(void* container, std::size_t count)
+{
+    static_cast<Container*>(container)->resize(count);
+}
 template <typename Container>
-void* At(void* container, std::size_t index) { return &(*static_cast<Container*>(container))[index]; }
+void* At(void* container, std::size_t index)
+{
+    return &(*static_cast<Container*>(container))[index];
+}
+template <typename Element>
+ExtraParams* Extra(void* element)
+{
+    return &static_cast<Element*>(element)->Extra;
+}
+template <typename Container>
+constexpr auto ExtraAccess() -> ExtraParams* (*)(void*)
+{
+    if constexpr (requires(typename Container::value_type element) { element.Extra; })
+        return &Extra<typename Container::value_type>;
+    else
+        return nullptr;
+}
 
 } // namespace field_detail
 
-// Declaring fields: Number<&HD_Initial::InitialH>("InitialH", UnitGroup::WaterLevel).
-template <auto Member>
+// Declaring fields: Number<&HD_Initial::InitialH>("InitialH", UnitGroup::WaterLevel), or, for a member of a member,
+// Number<&HD_Global_Var::HeatBalance, &HDHeatBalance::Latitude>("Latitude", UnitGroup::GeoAngle).
+template <auto... Path>
 constexpr Field Number(std::string_view name, UnitGroup unit = UnitGroup::None)
 {
-    return {name, FieldKind::Number, unit, false, &field_detail::Address<Member>};
+    return {name, FieldKind::Number, unit, false, &field_detail::Address<Path...>};
 }
 /// Element `Index` of an array member.
-template <auto Member, std::size_t Index>
+template <std::size_t Index, auto... Path>
 constexpr Field NumberAt(std::string_view name, UnitGroup unit = UnitGroup::None)
 {
-    return {name, FieldKind::Number, unit, false, &field_detail::ElementAddress<Member, Index>};
+    return {name, FieldKind::Number, unit, false, &field_detail::ElementAddress<Index, Path...>};
 }
-template <auto Member, std::size_t Index>
+template <std::size_t Index, auto... Path>
 constexpr Field BooleanAt(std::string_view name)
 {
-    return {name, FieldKind::Boolean, UnitGroup::None, false, &field_detail::ElementAddress<Member, Index>};
+    return {name, FieldKind::Boolean, UnitGroup::None, false, &field_detail::ElementAddress<Index, Path...>};
 }
-template <auto Member>
+template <auto... Path>
 constexpr Field Scalar(FieldKind kind, std::string_view name)
 {
-    return {name, kind, UnitGroup::None, false, &field_detail::Address<Member>};
+    return {name, kind, UnitGroup::None, false, &field_detail::Address<Path...>};
 }
-template <auto Member>
-constexpr Field Integer(std::string_view name) { return Scalar<Member>(FieldKind::Integer, name); }
-template <auto Member>
-constexpr Field Choice(std::string_view name) { return Scalar<Member>(FieldKind::Choice, name); }
-template <auto Member>
-constexpr Field Boolean(std::string_view name) { return Scalar<Member>(FieldKind::Boolean, name); }
-template <auto Member>
-constexpr Field Text(std::string_view name) { return Scalar<Member>(FieldKind::Text, name); }
-template <auto Member>
-constexpr Field FileName(std::string_view name) { return Scalar<Member>(FieldKind::FileName, name); }
-template <auto Member>
-constexpr Field DateTime(std::string_view name) { return Scalar<Member>(FieldKind::DateTime, name); }
+template <auto... Path>
+constexpr Field Integer(std::string_view name)
+{
+    return Scalar<Path...>(FieldKind::Integer, name);
+}
+template <auto... Path>
+constexpr Field Choice(std::string_view name)
+{
+    return Scalar<Path...>(FieldKind::Choice, name);
+}
+template <auto... Path>
+constexpr Field Boolean(std::string_view name)
+{
+    return Scalar<Path...>(FieldKind::Boolean, name);
+}
+template <auto... Path>
+constexpr Field Text(std::string_view name)
+{
+    return Scalar<Path...>(FieldKind::Text, name);
+}
+template <auto... Path>
+constexpr Field FileName(std::string_view name)
+{
+    return Scalar<Path...>(FieldKind::FileName, name);
+}
+template <auto... Path>
+constexpr Field DateTime(std::string_view name)
+{
+    return Scalar<Path...>(FieldKind::DateTime, name);
+}
 /// The element of a group of plain values (a list of strings, of numbers).
 constexpr Field Plain(FieldKind kind, std::string_view name, UnitGroup unit = UnitGroup::None)
 {
@@ -145,11 +211,15 @@ constexpr Field Optional(Field field)
 template <typename Container>
 constexpr GroupAccess GroupOf(FieldList elements, bool padWhenEmpty = false)
 {
-    return {elements, padWhenEmpty, &field_detail::Size<Container>, &field_detail::Resize<Container>,
-            &field_detail::At<Container>};
+    return {elements,
+            padWhenEmpty,
+            &field_detail::Size<Container>,
+            &field_detail::Resize<Container>,
+            &field_detail::At<Container>,
+            field_detail::ExtraAccess<Container>()};
 }
-template <auto Member>
+template <auto... Path>
 constexpr Field Group(std::string_view name, const GroupAccess& access)
 {
-    return {name, FieldKind::Group, UnitGroup::None, false, &field_detail::Address<Member>, &access};
+    return {name, FieldKind::Group, UnitGroup::None, false, &field_detail::Address<Path...>, &access};
 }

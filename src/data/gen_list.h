@@ -3,6 +3,7 @@
 #pragma once
 
 #include "data/river_pos.h"
+#include "data/unknown_content.h"
 
 #include <cstddef>
 #include <functional>
@@ -20,6 +21,8 @@ public:
     CGenList() = default;
     CGenList(const CGenList&) = delete;
     CGenList& operator=(const CGenList&) = delete;
+    CGenList(CGenList&&) = default;
+    CGenList& operator=(CGenList&&) = default;
     virtual ~CGenList() = default;
 
     /// Deletes every record.
@@ -45,7 +48,8 @@ public:
     std::uint64_t GetRevision() const { return m_revision; }
 
     /// Removes and deletes every blank record, head to tail. Unless `asked` is set, `ask` is called at the first one;
-    /// its answer false stops with false (nothing more is removed), true sets `asked`.
+    /// its answer false stops with false (nothing more is removed), true sets `asked`. Without `ask` nobody can agree,
+    /// which counts as false.
     bool RemoveIncompleteLines(bool& asked, const std::function<bool()>& ask = {});
 
     /// First record at or after `position` whose chainage equals the value exactly; `position` is left after it (End
@@ -71,8 +75,15 @@ public:
     /// Appends the records of occurrence `number` of the section; a missing section leaves the list as it is.
     virtual void Load(tqlHandle parent, int number);
 
+    /// What the section held beside its records. It stays when the records are removed.
+    const UnknownNodes& Unknown() const { return m_unknown; }
+    void ClearUnknown() { m_unknown.clear(); }
+    /// Which children of such a section are records.
+    static Known KnownName(std::string_view name, bool isSection);
+
 private:
     std::string m_sectionName;
+    UnknownNodes m_unknown;
 };
 
 template <typename T>
@@ -95,7 +106,9 @@ class CGenMetaList
 {
 public:
     CGenMetaList(std::string outerSection, std::string innerSection)
-        : m_outerSection(std::move(outerSection)), m_innerSection(std::move(innerSection)) {}
+        : m_outerSection(std::move(outerSection)), m_innerSection(std::move(innerSection))
+    {
+    }
 
     const std::string& OuterSectionName() const { return m_outerSection; }
     const std::string& InnerSectionName() const { return m_innerSection; }
@@ -104,10 +117,7 @@ public:
     CGenParamList<T>& GetAt(std::size_t index) { return *m_lists[index]; }
     const CGenParamList<T>& GetAt(std::size_t index) const { return *m_lists[index]; }
     /// A new empty list at the end.
-    CGenParamList<T>& Add()
-    {
-        return *m_lists.emplace_back(std::make_unique<CGenParamList<T>>(m_innerSection));
-    }
+    CGenParamList<T>& Add() { return *m_lists.emplace_back(std::make_unique<CGenParamList<T>>(m_innerSection)); }
     std::unique_ptr<CGenParamList<T>> RemoveAt(std::size_t index)
     {
         auto list = std::move(m_lists[index]);
@@ -119,12 +129,45 @@ public:
         m_lists.insert(m_lists.begin() + static_cast<std::ptrdiff_t>(index), std::move(list));
     }
     void RemoveAllRecords() { m_lists.clear(); }
+    void ClearUnknown() { m_unknown.clear(); }
 
-    /// A sub-list is written only when one of its records from the second on is filled.
-    void Save(tqlHandle structure) const;
-    void Load(tqlHandle parent, int number = 1);
+    /// A sub-list is written only when one of its records from the second on is filled (or it holds unknown content),
+    /// unless `everySet` asks for all of them.
+    void Save(tqlHandle structure, bool everySet = false) const
+    {
+        tqlAddSection(structure, m_outerSection);
+        for (const auto& list : m_lists)
+            if (everySet || IsWorthKeeping(*list))
+                list->Save(structure);
+        WriteUnknown(structure, m_unknown);
+        tqlEndSection(structure);
+    }
+    /// Appends one sub-list for each sub-section of their name.
+    void Load(tqlHandle parent, int number = 1)
+    {
+        const tqlHandle outer = tqlSectionByNameNum(parent, m_outerSection, number);
+        if (!outer)
+            return;
+        for (int inner = 1; tqlSectionByNameNum(outer, m_innerSection, inner); ++inner)
+            Add().Load(outer, inner);
+        CollectUnknown(
+            outer, [this](std::string_view name, bool isSection) { return KnownName(name, isSection); }, m_unknown);
+    }
+    Known KnownName(std::string_view name, bool isSection) const
+    {
+        return isSection && name == m_innerSection ? Known::Every : Known::No;
+    }
 
 private:
+    static bool IsWorthKeeping(const CGenParamList<T>& list)
+    {
+        for (std::size_t index = 1; index < list.GetCount(); ++index)
+            if (!list.GetAt(index).IsBlank())
+                return true;
+        return !list.Unknown().empty();
+    }
+
     std::string m_outerSection, m_innerSection;
     std::vector<std::unique_ptr<CGenParamList<T>>> m_lists;
+    UnknownNodes m_unknown;
 };

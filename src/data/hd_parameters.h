@@ -35,8 +35,9 @@ struct HD_Parameters
     /// Reads the target "KAVO0_HD" of a loaded structure; what is missing keeps its value. Lists are appended to, so
     /// a reader of a second file calls RemoveAllRecords first.
     void Load(tqlHandle structure);
-    /// Writes the target with everything in file order, then unknown targets.
-    void Save(tqlHandle structure) const;
+    /// Writes the target with everything in file order, then unknown targets. Encroachment sets without a filled line
+    /// from the second on are left out unless `everySet`.
+    void Save(tqlHandle structure, bool everySet = false) const;
     /// Empties all lists and the unknown content; the global values stay.
     void RemoveAllRecords();
     /// Removes blank records from the thirteen lists that are cleaned at save; false when `ask` refused.
@@ -47,7 +48,11 @@ struct HD_Parameters
 struct ListEntry
 {
     const char* section;
-    bool purgedAtSave; // incomplete lines are removed when the document is saved
+    bool purgedAtSave;                          // incomplete lines are removed when the document is saved
     CGenParamListBase* (*list)(HD_Parameters&); // null for the encroachment set-ups, a list of lists
 };
 std::span<const ListEntry> HDLists();
+/// The target's sections that are known, each once.
+Known HDKnownSection(std::string_view name, bool isSection);
+/// The structure's targets that are known: the first "KAVO0_HD".
+Known HDKnownTarget(std::string_view name, bool isSection);

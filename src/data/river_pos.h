@@ -1,6 +1,7 @@
 // The base of every record that is tied to a location in the river network.
 #pragma once
 
+#include "data/extra_params.h"
 #include "data/field.h"
 #include "tql/tql.h"
 
@@ -13,8 +14,9 @@ inline constexpr double NotGiven = 1.0e10;
 class HD_RiverPos
 {
 public:
-    std::string RiverName;        // branch name
-    double Chainage = NotGiven;   // position along the branch, metres
+    std::string RiverName;      // branch name
+    double Chainage = NotGiven; // position along the branch, metres
+    ExtraParams Extra;          // what the file holds behind the family's parameters
 
     HD_RiverPos() = default;
     HD_RiverPos(const HD_RiverPos&) = default;

@@ -1,0 +1,24 @@
+// Declared fields as text: for reading by people, by other programs, and back from a command line.
+#pragma once
+
+#include "data/field.h"
+#include "data/result.h"
+
+#include <string>
+#include <vector>
+
+/// The shortest text that reads back to the same number, whatever the locale.
+std::string NumberText(double value);
+
+/// The field's value as one cell; the elements of a group are parted by "; ", their values by blanks.
+std::string CellText(const Field& field, const void* object);
+/// The field's value in JSON; a number that JSON cannot express is null.
+std::string JsonText(const Field& field, const void* object);
+std::string JsonString(std::string_view text);
+
+/// One text a parameter, in file order: a group gives its count first, a date-time its six integers.
+std::vector<std::string> ParamTexts(FieldList fields, const void* object);
+
+/// Stores texts in the same order into the object. On failure the error says what was expected, and the object holds
+/// part of them.
+Result<void> ParseParams(FieldList fields, const std::vector<std::string>& texts, void* object);

@@ -1,0 +1,113 @@
+// hdkv: HD parameter files on the command line.
+#include "cli/commands.h"
+#include "cli/open_file.h"
+
+#include <CLI/CLI.hpp>
+
+#include <charconv>
+#include <iostream>
+#include <map>
+
+namespace {
+
+bool IsNumber(const std::string& text)
+{
+    double value = 0;
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+    return error == std::errc() && end == text.data() + text.size();
+}
+
+/// What follows the keyword of "set". A value may be negative, so the parser hands over whatever it does not know; a
+/// word behind "--" is a value in any case.
+bool TakeValues(const std::vector<std::string>& words, std::vector<std::string>& values)
+{
+    bool options = true;
+    for (const std::string& word : words) {
+        if (options && word == "--") {
+            options = false;
+        } else if (options && word.size() > 1 && word[0] == '-' && !IsNumber(word)) {
+            Complain("There is no option " + word + ". Put -- before values that begin with a dash.", Exit::Usage);
+            return false;
+        } else {
+            values.push_back(word);
+        }
+    }
+    if (values.empty())
+        Complain("set needs at least one value.", Exit::Usage);
+    return !values.empty();
+}
+
+struct Arguments
+{
+    std::vector<std::string> files;
+    std::string file, list, keyword, out;
+    Format format = Format::Table;
+    bool checkOnly = false;
+};
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    CLI::App app("Checks, shows and changes HD parameter files (.hdkv) of river network models.", "hdkv");
+    app.set_version_flag("--version", "hdkv " KVR_VERSION);
+    app.require_subcommand(1);
+    app.footer("Exit codes: 0 fine, 1 findings, 2 usage, 3 a file could not be read, 4 a file could not be written.");
+    Arguments a;
+
+    CLI::App* const check = app.add_subcommand("check", "Report what is not in order in files, with line and column");
+    check->add_option("FILE", a.files, "HD parameter files")->required();
+
+    CLI::App* const show = app.add_subcommand("show", "Print an overview of a file, or the records of one list");
+    show->add_option("FILE", a.file, "HD parameter file")->required();
+    show->add_option("LIST", a.list, "Name of a list section, such as InitList");
+    const std::map<std::string, Format> formats{{"table", Format::Table}, {"csv", Format::Csv}, {"json", Format::Json}};
+    show->add_option("--format", a.format, "table, csv or json")->transform(CLI::CheckedTransformer(formats));
+
+    CLI::App* const get = app.add_subcommand("get", "Print a global value, one line a parameter");
+    get->add_option("FILE", a.file, "HD parameter file")->required();
+    get->add_option("KEYWORD", a.keyword, "Keyword, or Section/Keyword")->required();
+
+    CLI::App* const set = app.add_subcommand("set", "Change a global value: FILE KEYWORD VALUE...");
+    set->add_option("FILE", a.file, "HD parameter file")->required();
+    set->add_option("KEYWORD", a.keyword, "Keyword, or Section/Keyword")->required();
+    set->add_option("-o,--output", a.out, "Write here instead of over FILE");
+    set->allow_extras();
+    set->footer("VALUE... follow the keyword, one a parameter: numbers, true or false, texts; lists begin with their\n"
+                "count. Comments of the file are not kept.");
+
+    CLI::App* const fmt = app.add_subcommand("fmt", "Rewrite a file in canonical form, every record included");
+    fmt->add_option("FILE", a.file, "HD parameter file")->required();
+    fmt->add_option("-o,--output", a.out, "Write here instead of over FILE");
+    fmt->add_flag("--check", a.checkOnly, "Write nothing; exit with 1 if the file would change");
+    fmt->footer("Comments of the file are not kept.");
+
+    CLI::App* const create = app.add_subcommand("new", "Write a new file with default values");
+    create->add_option("FILE", a.file, "HD parameter file, which must not exist")->required();
+
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::ParseError& error) {
+        return app.exit(error) == 0 ? Exit::Fine : Exit::Usage;
+    }
+
+    std::vector<std::string> values;
+    int code = Exit::Usage;
+    if (check->parsed())
+        code = Check(a.files);
+    else if (show->parsed())
+        code = Show(a.file, a.list, a.format);
+    else if (get->parsed())
+        code = Get(a.file, a.keyword);
+    else if (set->parsed() && TakeValues(set->remaining(), values))
+        code = Set(a.file, a.keyword, values, a.out);
+    else if (fmt->parsed())
+        code = Fmt(a.file, a.out, a.checkOnly);
+    else if (create->parsed())
+        code = New(a.file);
+
+    std::cout.flush();
+    if (!std::cout)
+        return Complain("Standard output could not be written.", Exit::NotWritten);
+    return code;
+}

@@ -1,0 +1,10 @@
+#include "cli/open_file.h"
+#include "data/utf8_path.h"
+
+int New(const std::string& file)
+{
+    std::error_code error;
+    if (std::filesystem::exists(std::filesystem::symlink_status(PathFromUtf8(file), error)))
+        return Complain("\"" + file + "\" exists already; it was left as it is.", Exit::NotWritten);
+    return Rewrite(HD_Parameters{}, file);
+}

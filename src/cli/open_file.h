@@ -1,0 +1,28 @@
+// Opening and rewriting a file for a command, with messages on standard error.
+#pragma once
+
+#include "cli/commands.h"
+#include "data/hd_check.h"
+#include "data/hd_file.h"
+
+#include <ostream>
+#include <string_view>
+
+/// Prints "hdkv: ..." on standard error and returns the code.
+int Complain(std::string_view message, int code);
+
+enum class Purpose
+{
+    Read,
+    Rewrite
+};
+
+/// Reads an HD parameter file; Exit::Fine, or a code after a message. For a rewrite a file with content that reading
+/// does not keep is refused with its findings.
+int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters);
+
+/// Saves with everything in it, incomplete lines and encroachment sets included.
+int Rewrite(const HD_Parameters& parameters, const std::string& path);
+
+/// Prints "file:line:column: text".
+void PrintFinding(std::ostream& stream, const std::string& path, const Finding& finding);

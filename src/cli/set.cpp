@@ -1,0 +1,17 @@
+#include "cli/field_text.h"
+#include "cli/keyword.h"
+#include "cli/open_file.h"
+
+int Set(const std::string& file, const std::string& keyword, const std::vector<std::string>& values,
+        const std::string& out)
+{
+    const Result<NamedValue> value = FindKeyword(keyword);
+    if (!value)
+        return Complain(value.error().message, Exit::Usage);
+    HD_Parameters parameters;
+    if (const int failed = OpenFile(file, Purpose::Rewrite, parameters))
+        return failed;
+    if (const Result<void> stored = ParseParams(value.value().fields, values, &parameters.Global); !stored)
+        return Complain(value.value().name + ": " + stored.error().message + ".", Exit::Usage);
+    return Rewrite(parameters, out.empty() ? file : out);
+}

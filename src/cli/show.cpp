@@ -1,0 +1,90 @@
+#include "cli/match.h"
+#include "cli/open_file.h"
+#include "cli/record_table.h"
+
+#include <iostream>
+
+namespace {
+
+std::string KnownLists()
+{
+    std::string names;
+    for (const ListEntry& entry : HDLists())
+        names += std::string(names.empty() ? "" : ", ") + entry.section;
+    for (const GlobalSection& section : HDGlobalSections())
+        for (const Field& items : section.items)
+            names += ", " + std::string(items.name);
+    return names;
+}
+
+/// The records or items of the list; false when there is no such list.
+bool MakeTable(HD_Parameters& parameters, const std::string& name, RecordTable& table)
+{
+    for (const ListEntry& entry : HDLists()) {
+        if (!SameIgnoringCase(entry.section, name))
+            continue;
+        if (entry.list)
+            table.AddList(*entry.list(parameters));
+        else
+            table.AddSets(parameters.EncroachList);
+        return true;
+    }
+    for (const GlobalSection& section : HDGlobalSections()) {
+        for (const Field& items : section.items) {
+            if (!SameIgnoringCase(items.name, name))
+                continue;
+            table.AddItems(items, parameters.Global);
+            return true;
+        }
+    }
+    return false;
+}
+
+struct OverviewRow
+{
+    std::string section, contents;
+    std::int32_t count = 0;
+};
+constexpr Field overviewFields[] = {Text<&OverviewRow::section>("section"), Text<&OverviewRow::contents>("contents"),
+                                    Integer<&OverviewRow::count>("count")};
+
+std::vector<OverviewRow> Overview(HD_Parameters& parameters)
+{
+    std::vector<OverviewRow> rows;
+    const auto add = [&rows](std::string_view section, const char* contents, std::size_t count) {
+        rows.push_back({std::string(section), contents, static_cast<std::int32_t>(count)});
+    };
+    for (const GlobalSection& section : HDGlobalSections()) {
+        add(section.name, "keywords", section.keywords.size());
+        for (const Field& items : section.items)
+            add(items.name, "items", items.group->size(items.address(&parameters.Global)));
+    }
+    for (const ListEntry& entry : HDLists()) {
+        if (entry.list)
+            add(entry.section, "records", entry.list(parameters)->GetCount());
+        else
+            add(entry.section, "sets", parameters.EncroachList.GetCount());
+    }
+    return rows;
+}
+
+} // namespace
+
+int Show(const std::string& file, const std::string& list, Format format)
+{
+    HD_Parameters parameters;
+    if (const int failed = OpenFile(file, Purpose::Read, parameters))
+        return failed;
+    RecordTable table;
+    std::vector<OverviewRow> overview;
+    if (list.empty()) {
+        overview = Overview(parameters);
+        table.SetFields({{overviewFields}});
+        for (const OverviewRow& row : overview)
+            table.AddRow(&row);
+    } else if (!MakeTable(parameters, list, table)) {
+        return Complain("There is no list \"" + list + "\"; the lists are " + KnownLists() + ".", Exit::Usage);
+    }
+    table.Print(std::cout, format);
+    return Exit::Fine;
+}

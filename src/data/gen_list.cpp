@@ -1,0 +1,114 @@
+#include "data/gen_list.h"
+
+#include <iterator>
+
+void CGenList::RemoveAll()
+{
+    m_records.clear();
+    ++m_revision;
+}
+
+HD_RiverPos& CGenList::AddTail(std::unique_ptr<HD_RiverPos> record)
+{
+    ++m_revision;
+    return *m_records.emplace_back(std::move(record));
+}
+
+void CGenList::InsertAt(std::size_t index, std::unique_ptr<HD_RiverPos> record)
+{
+    m_records.insert(m_records.begin() + static_cast<std::ptrdiff_t>(index), std::move(record));
+    ++m_revision;
+}
+
+void CGenList::InsertAt(std::size_t index, std::vector<std::unique_ptr<HD_RiverPos>> records)
+{
+    m_records.insert(m_records.begin() + static_cast<std::ptrdiff_t>(index), std::move_iterator(records.begin()),
+                     std::move_iterator(records.end()));
+    ++m_revision;
+}
+
+std::unique_ptr<HD_RiverPos> CGenList::RemoveAt(std::size_t index)
+{
+    auto record = std::move(m_records[index]);
+    m_records.erase(m_records.begin() + static_cast<std::ptrdiff_t>(index));
+    ++m_revision;
+    return record;
+}
+
+std::vector<std::unique_ptr<HD_RiverPos>> CGenList::RemoveAt(std::size_t index, std::size_t count)
+{
+    const auto first = m_records.begin() + static_cast<std::ptrdiff_t>(index);
+    const auto last = first + static_cast<std::ptrdiff_t>(count);
+    std::vector<std::unique_ptr<HD_RiverPos>> removed{std::make_move_iterator(first), std::make_move_iterator(last)};
+    m_records.erase(first, last);
+    ++m_revision;
+    return removed;
+}
+
+bool CGenList::RemoveIncompleteLines(bool& asked, const std::function<bool()>& ask)
+{
+    std::size_t first = 0;
+    while (first < m_records.size() && !m_records[first]->IsBlank())
+        ++first;
+    if (first == m_records.size())
+        return true;
+    if (!asked && !(ask && ask()))
+        return false;
+    asked = true;
+    // One pass over the rest: each kept record moves once, however many go.
+    std::erase_if(m_records, [](const std::unique_ptr<HD_RiverPos>& record) { return record->IsBlank(); });
+    ++m_revision;
+    return true;
+}
+
+HD_RiverPos* CGenList::FindByChainage(double chainage, std::size_t& position)
+{
+    while (position < m_records.size()) {
+        HD_RiverPos& record = *m_records[position++];
+        if (record.Chainage == chainage)
+            return &record;
+    }
+    position = End;
+    return nullptr;
+}
+
+HD_RiverPos* CGenList::FindByName(std::string_view text, std::size_t& position)
+{
+    while (position < m_records.size()) {
+        HD_RiverPos& record = *m_records[position++];
+        if (std::string_view(record.RiverName).starts_with(text))
+            return &record;
+    }
+    position = End;
+    return nullptr;
+}
+
+void CGenParamListBase::Save(tqlHandle structure) const
+{
+    tqlAddSection(structure, m_sectionName);
+    for (std::size_t index = 0; index < GetCount(); ++index)
+        GetAt(index).Save(structure);
+    WriteUnknown(structure, m_unknown);
+    tqlEndSection(structure);
+}
+
+void CGenParamListBase::Load(tqlHandle parent, int number)
+{
+    const tqlHandle section = tqlSectionByNameNum(parent, m_sectionName, number);
+    if (!section)
+        return;
+    const int records = tqlGetNoKeywords(section, "DATA");
+    Reserve(GetCount() + static_cast<std::size_t>(records));
+    for (int occurrence = 1; occurrence <= records; ++occurrence) {
+        auto record = NewRecord();
+        record->Load(tqlKeywordByNameNum(section, "DATA", occurrence));
+        AddTail(std::move(record));
+    }
+    if (tqlGetNoKeywords(section) != records || tqlGetNoSections(section) != 0)
+        CollectUnknown(section, &KnownName, m_unknown);
+}
+
+Known CGenParamListBase::KnownName(std::string_view name, bool isSection)
+{
+    return !isSection && name == "DATA" ? Known::Every : Known::No;
+}

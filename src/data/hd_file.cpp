@@ -1,0 +1,43 @@
+#include "data/hd_file.h"
+
+Result<TqlStructure> ParseFile(const std::string& path)
+{
+    TqlStructure structure(tqlLoadFile(path, 1));
+    TqlSyntaxError report;
+    if (!tqlGetSyntaxErr(structure.Get(), &report))
+        return structure;
+    tqlGetErrorGlb(); // taken: the report says it all
+    return Error{report.message};
+}
+
+Result<HD_Parameters> LoadHDFile(const std::string& path)
+{
+    const Result<TqlStructure> structure = ParseFile(path);
+    if (!structure)
+        return structure.error();
+    HD_Parameters parameters;
+    parameters.Load(structure.value().Get());
+    return parameters;
+}
+
+namespace {
+
+TqlStructure Build(const HD_Parameters& parameters, bool everySet)
+{
+    TqlStructure structure(tqlCreate());
+    parameters.Save(structure.Get(), everySet);
+    return structure;
+}
+
+} // namespace
+
+std::string HDFileText(const HD_Parameters& parameters, bool everySet)
+{
+    return std::string(tqlGetText(Build(parameters, everySet).Get()));
+}
+
+Result<void> SaveHDFile(const HD_Parameters& parameters, const std::string& path, const SaveOptions& options)
+{
+    const TqlStructure structure = Build(parameters, options.everySet);
+    return WriteFileSafely(path, tqlGetText(structure.Get()), {.sync = options.sync});
+}
