@@ -20,7 +20,8 @@ using tqlHandle = TqlNode*;
 
 // ---- errors ------------------------------------------------------------------------------------
 
-enum class TqlError : int {
+enum class TqlError : int
+{
     None = 0,
     Unreadable, // missing, a folder, no permission, read failure
     Encoding,   // not UTF-8, or a NUL
@@ -42,7 +43,7 @@ struct TqlSyntaxError
     std::string message;
 };
 
-/// Code of the last failed load or append, 0 for none. Peek leaves it, Get clears it.
+/// Outcome of this thread's last load or append: 0, or the code of its error. Peek leaves it, Get clears it.
 int tqlPeekErrorGlb();
 int tqlGetErrorGlb();
 /// Report of the structure's load error; false (and untouched) when it loaded well.
@@ -64,6 +65,8 @@ tqlHandle tqlTargetByNameNum(tqlHandle structure, std::string_view name, int num
 tqlHandle tqlSectionByNameNum(tqlHandle parent, std::string_view name, int number);
 tqlHandle tqlKeywordByNameNum(tqlHandle section, std::string_view name, int number);
 tqlHandle tqlParamByNum(tqlHandle keyword, int number);
+/// The parameter after this one in its keyword; null after the last. The quick way through all parameters.
+tqlHandle tqlNextParam(tqlHandle param);
 
 /// Counts of direct children. For a structure, tqlGetNoSections counts its targets.
 int tqlGetNoSections(tqlHandle parent);
@@ -82,12 +85,22 @@ struct TqlPosition
 {
     std::size_t line = 0, column = 0; // from 1; 0 for what was not loaded from a text
 };
-/// Where a section opens, a keyword's name or a parameter stands. Counted on demand: for messages, not for loops.
+/// Where a section opens, a keyword's name or a parameter stands. Counted on demand, from the front of the text.
 TqlPosition tqlGetPosition(tqlHandle node);
+/// The same for many nodes of one structure: the first call counts the lines, the others only look up.
+TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node);
 
 // ---- values ------------------------------------------------------------------------------------
 
-enum class TqlType : std::uint8_t { None, Int, Double, Bool, String, FileName };
+enum class TqlType : std::uint8_t
+{
+    None,
+    Int,
+    Double,
+    Bool,
+    String,
+    FileName
+};
 TqlType tqlGetType(tqlHandle param);
 
 /// Each stores the parameter's value and returns true, or leaves `value` untouched and returns false when the
@@ -127,6 +140,7 @@ void tqlAddKeyword(tqlHandle structure, std::string_view name);
 void tqlAddInt(tqlHandle structure, std::int32_t value);
 void tqlAddDouble(tqlHandle structure, double value);
 void tqlAddBool(tqlHandle structure, bool value);
+/// UTF-8; bytes that are no UTF-8 are written as U+FFFD.
 void tqlAddString(tqlHandle structure, std::string_view value);
 void tqlAddFilename(tqlHandle structure, std::string_view value);
 
@@ -146,7 +160,9 @@ bool tqlPutListParam(tqlHandle structure, std::string_view name, std::string_vie
 /// A keyword with parameters already in file notation (as tqlGetRawParams gave them).
 void tqlAddRawKeyword(tqlHandle structure, std::string_view name, std::string_view params);
 
-/// The text built so far; all sections must have been ended. Valid until the next operation on the structure.
+/// The text built so far. Valid until the next operation on the structure. Empty while a section is still open, and
+/// when something was asked that no file can hold: a name with other characters than names have (docs/format.md), a
+/// parameter without a keyword, a keyword outside a section, raw parameters that are none, nesting deeper than 128.
 std::string_view tqlGetText(tqlHandle structure);
 /// Appends that text to a file; false, with the global error set, when any write, flush or close fails.
 bool tqlAppend(tqlHandle structure, const std::string& path);

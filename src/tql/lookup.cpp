@@ -1,0 +1,213 @@
+// Finding, counting, naming and placing what a loaded structure holds.
+#include "tql/char_class.h"
+#include "tql/node.h"
+#include "tql/scan.h"
+#include "tql/utf8.h"
+
+#include <algorithm>
+#include <cstring>
+
+using namespace tql;
+
+namespace {
+
+constexpr auto NotFound = NameIndex::NotFound;
+
+template <typename Children, typename NameOf>
+const NameIndex& IndexOf(std::unique_ptr<NameIndex>& index, const Children& children, NameOf nameOf)
+{
+    if (!index) {
+        std::vector<std::string_view> names(children.size());
+        std::transform(children.begin(), children.end(), names.begin(), nameOf);
+        index = std::make_unique<NameIndex>(names);
+    }
+    return *index;
+}
+
+const NameIndex& SectionIndex(Section& parent)
+{
+    return IndexOf(parent.sectionIndex, parent.sections, [](const Section* section) { return section->name; });
+}
+
+const NameIndex& KeywordIndex(Section& section)
+{
+    return IndexOf(section.keywordIndex, section.keywords, [](const Keyword& keyword) { return keyword.Name(); });
+}
+
+// Position from 0 of a number from 1.
+std::size_t PositionOf(int number, std::size_t count)
+{
+    return number >= 1 && static_cast<std::size_t>(number) <= count ? static_cast<std::size_t>(number) - 1 : NotFound;
+}
+
+bool HasOneName(const Section& section)
+{
+    return section.sameKeywordNames && !section.keywords.empty();
+}
+
+// Where a handle's text stands; null for a structure and for what was not loaded.
+const char* TextOf(tqlHandle node)
+{
+    if (const Keyword* const keyword = AsKeyword(node))
+        return keyword->Name().data();
+    if (const char* const param = AsParam(node))
+        return param;
+    const Section* const section = AsParent(node);
+    return section && !section->name.empty() ? section->name.data() - 1 : nullptr; // at its bracket
+}
+
+std::size_t ColumnOf(const char* lineStart, const char* at)
+{
+    return CountCharacters({lineStart, static_cast<std::size_t>(at - lineStart)}) + 1;
+}
+
+const std::vector<std::size_t>& LineStarts(Structure& structure)
+{
+    auto& starts = structure.lineStarts;
+    const char* const begin = structure.text.begin();
+    const char* const end = structure.text.end();
+    if (starts.empty())
+        for (const char* p = begin; p && p <= end;) {
+            starts.push_back(static_cast<std::size_t>(p - begin));
+            p = static_cast<const char*>(std::memchr(p, '\n', static_cast<std::size_t>(end - p)));
+            p += p != nullptr;
+        }
+    return starts;
+}
+
+} // namespace
+
+tqlHandle tqlTargetByNameNum(tqlHandle structure, std::string_view name, int number)
+{
+    return AsStructure(structure) ? tqlSectionByNameNum(structure, name, number) : nullptr;
+}
+
+tqlHandle tqlSectionByNameNum(tqlHandle handle, std::string_view name, int number)
+{
+    Section* const parent = AsParent(handle);
+    if (!parent || parent->sections.empty())
+        return nullptr;
+    const std::size_t position = SectionIndex(*parent).Find(name, number);
+    return position == NotFound ? nullptr : HandleOf(parent->sections[position]);
+}
+
+tqlHandle tqlKeywordByNameNum(tqlHandle handle, std::string_view name, int number)
+{
+    Section* const section = AsParent(handle);
+    if (!section)
+        return nullptr;
+    if (HasOneName(*section))
+        return section->keywords.front().Name() == name ? tqlKeywordByNum(handle, number) : nullptr;
+    const std::size_t position = KeywordIndex(*section).Find(name, number);
+    return position == NotFound ? nullptr : HandleOf(&section->keywords[position]);
+}
+
+tqlHandle tqlParamByNum(tqlHandle handle, int number)
+{
+    const Keyword* const keyword = AsKeyword(handle);
+    if (!keyword)
+        return nullptr;
+    const std::size_t position = PositionOf(number, keyword->ParamCount());
+    if (position == NotFound)
+        return nullptr;
+    const char* param = keyword->Params();
+    if (keyword->IsLong())
+        return HandleOf(param + keyword->more->starts[position]);
+    for (std::size_t i = 0; i < position; ++i)
+        param = NextParam(param);
+    return HandleOf(param);
+}
+
+tqlHandle tqlNextParam(tqlHandle param)
+{
+    const char* const p = AsParam(param);
+    return p ? HandleOf(NextParam(p)) : nullptr;
+}
+
+int tqlGetNoSections(tqlHandle parent)
+{
+    const Section* const section = AsParent(parent);
+    return section ? static_cast<int>(section->sections.size()) : 0;
+}
+
+int tqlGetNoKeywords(tqlHandle section)
+{
+    const Section* const node = AsParent(section);
+    return node ? static_cast<int>(node->keywords.size()) : 0;
+}
+
+int tqlGetNoKeywords(tqlHandle handle, std::string_view name)
+{
+    Section* const section = AsParent(handle);
+    if (!section)
+        return 0;
+    if (HasOneName(*section))
+        return section->keywords.front().Name() == name ? tqlGetNoKeywords(handle) : 0;
+    return KeywordIndex(*section).Count(name);
+}
+
+int tqlGetNoParams(tqlHandle keyword)
+{
+    const Keyword* const node = AsKeyword(keyword);
+    return node ? static_cast<int>(node->ParamCount()) : 0;
+}
+
+tqlHandle tqlSectionByNum(tqlHandle parent, int number)
+{
+    const Section* const section = AsParent(parent);
+    const std::size_t position = section ? PositionOf(number, section->sections.size()) : NotFound;
+    return position == NotFound ? nullptr : HandleOf(section->sections[position]);
+}
+
+tqlHandle tqlKeywordByNum(tqlHandle handle, int number)
+{
+    const Section* const section = AsParent(handle);
+    const std::size_t position = section ? PositionOf(number, section->keywords.size()) : NotFound;
+    return position == NotFound ? nullptr : HandleOf(&section->keywords[position]);
+}
+
+std::string_view tqlName(tqlHandle node)
+{
+    if (const Keyword* const keyword = AsKeyword(node))
+        return keyword->Name();
+    const Section* const section = AsParent(node);
+    return section ? section->name : std::string_view();
+}
+
+TqlPosition tqlGetPosition(tqlHandle node)
+{
+    const char* const at = TextOf(node);
+    if (!at)
+        return {};
+    const char* lineStart = at;
+    while (lineStart[-1] != '\n' && lineStart[-1] != '\0')
+        --lineStart;
+    std::size_t line = 1;
+    for (const char* p = lineStart; p[-1] != '\0'; --p)
+        line += p[-1] == '\n';
+    return {line, ColumnOf(lineStart, at)};
+}
+
+TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node)
+{
+    Structure* const whole = AsStructure(structure);
+    const char* const at = TextOf(node);
+    if (!whole || !at)
+        return {};
+    const auto& starts = LineStarts(*whole);
+    const auto offset = static_cast<std::size_t>(at - whole->text.begin());
+    const auto next = std::upper_bound(starts.begin(), starts.end(), offset);
+    return {static_cast<std::size_t>(next - starts.begin()), ColumnOf(whole->text.begin() + next[-1], at)};
+}
+
+std::string_view tqlGetRawParams(tqlHandle handle)
+{
+    const Keyword* const keyword = AsKeyword(handle);
+    if (!keyword || keyword->ParamCount() == 0)
+        return {};
+    const char* const begin = keyword->Params();
+    const char* last = begin;
+    while (const char* const next = NextParam(last))
+        last = next;
+    return {begin, static_cast<std::size_t>(SkipParam(last) - begin)};
+}

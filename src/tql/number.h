@@ -1,0 +1,29 @@
+// Numbers as the text has them; locale plays no part.
+#pragma once
+
+#include "tql/tql.h"
+
+#include <cstdint>
+#include <string>
+
+namespace tql {
+
+struct NumberScan
+{
+    const char* end = nullptr;      // past the number, or past what looked like one
+    TqlType type = TqlType::None;   // Int, Double, or None when it is no number or is out of range
+    const char* expected = nullptr; // what would have been right, when type is None
+};
+
+/// Looks at the number, `nan` or `inf` at `p`, in a text that ends in a line feed.
+NumberScan ScanNumber(const char* p);
+
+// The value of a number that was scanned well.
+std::int32_t IntValue(const char* p);
+double DoubleValue(const char* p);
+
+void AppendInt(std::string& out, std::int32_t value);
+/// The shortest text from which DoubleValue gives the same bits (of NaNs, the sign only).
+void AppendDouble(std::string& out, double value);
+
+} // namespace tql

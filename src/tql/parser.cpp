@@ -1,0 +1,283 @@
+#include "tql/parser.h"
+
+#include "tql/char_class.h"
+#include "tql/scan.h"
+#include "tql/utf8.h"
+
+#include <cstring>
+#include <limits>
+
+namespace tql {
+
+namespace {
+
+constexpr const char* EndOfLine = "the end of the line";
+
+std::string Closing(std::string_view name)
+{
+    return "[/" + std::string(name) + "]";
+}
+
+// "U+0007" or "0xFF"
+std::string HexOf(const char* prefix, unsigned value, int digits)
+{
+    std::string text = prefix;
+    for (int shift = (digits - 1) * 4; shift >= 0; shift -= 4)
+        text += "0123456789ABCDEF"[(value >> shift) & 15];
+    return text;
+}
+
+class Parser
+{
+public:
+    Parser(Structure& structure, const std::string& file) : m_structure(structure), m_file(file) {}
+
+    bool Run();
+
+private:
+    bool CheckLine();
+    bool ParseLine();
+    bool ParseBracket(const char* p);
+    bool Open(std::string_view name, const char* at);
+    bool Close(std::string_view name, const char* at);
+    bool ParseKeyword(const char* p);
+    /// Counts the parameters from `p` to the end of the line.
+    bool ParseParams(const char* p, std::size_t& count);
+    void AddKeyword(std::string_view name, const char* params, std::size_t count);
+    /// Nothing but blanks and a comment is left.
+    bool AtEnd(const char* p) const { return p == m_lineEnd || (*p == '/' && p[1] == '/'); }
+    bool ExpectEnd(const char* p, const char* expected = EndOfLine);
+
+    bool Fail(TqlError code, const char* at, std::string expected, std::string found);
+    bool Fail(const char* at, std::string expected)
+    {
+        return Fail(TqlError::Syntax, at, std::move(expected), Found(at));
+    }
+    std::string Found(const char* at) const;
+    bool FailEncoding(const char* at);
+
+    Structure& m_structure;
+    const std::string& m_file;
+    std::vector<Section*> m_open; // from the target inwards
+    const char* m_line = nullptr;
+    const char* m_lineEnd = nullptr; // without the line end
+    std::size_t m_lineNumber = 0;
+    bool m_anything = false; // a comment counts
+};
+
+bool Parser::Run()
+{
+    const char* const end = m_structure.text.end();
+    for (const char* p = m_structure.text.begin(); p < end;) {
+        const char* const feed = static_cast<const char*>(std::memchr(p, '\n', static_cast<std::size_t>(end - p) + 1));
+        m_line = p;
+        m_lineEnd = feed > p && feed[-1] == '\r' ? feed - 1 : feed;
+        ++m_lineNumber;
+        if (!CheckLine() || !ParseLine())
+            return false;
+        p = feed + 1;
+    }
+    if (m_lineNumber == 0)
+        m_lineNumber = 1, m_line = m_lineEnd = end;
+    if (!m_open.empty())
+        return Fail(TqlError::Syntax, m_lineEnd, Closing(m_open.back()->name), "the end of the file");
+    if (!m_anything)
+        return Fail(TqlError::Syntax, m_lineEnd, "a parameter file", "an empty file");
+    return true;
+}
+
+bool Parser::CheckLine()
+{
+    if (static_cast<std::size_t>(m_lineEnd - m_line) > MaxLineLength)
+        return Fail(TqlError::TooLarge, m_line, "a line of at most 16 MiB", "a longer one");
+    const char* const bad = FindBadByte(m_line, m_lineEnd);
+    return bad == m_lineEnd || FailEncoding(bad);
+}
+
+bool Parser::FailEncoding(const char* at)
+{
+    const auto byte = static_cast<unsigned char>(*at);
+    std::string found = byte == 0 ? "a NUL character" : HexOf("the byte 0x", byte, 2);
+    const std::string_view start(m_structure.text.begin(), m_structure.text.Size());
+    if (start.starts_with("\xFF\xFE") || start.starts_with("\xFE\xFF"))
+        found = "UTF-16";
+    return Fail(TqlError::Encoding, at, "text in UTF-8", std::move(found));
+}
+
+bool Parser::ParseLine()
+{
+    const char* const p = SkipBlanks(m_line);
+    if (p == m_lineEnd)
+        return true;
+    m_anything = true;
+    if (*p == '[')
+        return ParseBracket(p);
+    if (Is(*p, NameChar))
+        return ParseKeyword(p);
+    return ExpectEnd(p, "a section in brackets, a keyword or a comment");
+}
+
+bool Parser::ExpectEnd(const char* p, const char* expected)
+{
+    p = SkipBlanks(p);
+    if (!AtEnd(p))
+        return Fail(p, expected);
+    const auto* const cr = static_cast<const char*>(std::memchr(p, '\r', static_cast<std::size_t>(m_lineEnd - p)));
+    return !cr || Fail(cr, "a line feed after the carriage return");
+}
+
+bool Parser::ParseBracket(const char* p)
+{
+    const char* const bracket = p++;
+    const bool closes = *p == '/';
+    p += closes;
+    const char* const begin = p;
+    while (Is(*p, NameChar))
+        ++p;
+    if (p == begin)
+        return Fail(p, "a name of letters, digits, '_', '-' and '.'");
+    if (*p != ']')
+        return Fail(p, "] behind the name (names have letters, digits, '_', '-' and '.' only)");
+    const std::string_view name(begin, static_cast<std::size_t>(p - begin));
+    return ExpectEnd(p + 1) && (closes ? Close(name, bracket) : Open(name, bracket));
+}
+
+bool Parser::Open(std::string_view name, const char* at)
+{
+    if (m_open.size() == MaxDepth)
+        return Fail(TqlError::TooLarge, at, "at most 128 sections inside one another", "one more");
+    Section* const section = &m_structure.nodes.emplace_back(Kind::Section, name);
+    Section* const parent = m_open.empty() ? &m_structure : m_open.back();
+    parent->sections.push_back(section);
+    m_open.push_back(section);
+    return true;
+}
+
+bool Parser::Close(std::string_view name, const char* at)
+{
+    if (m_open.empty())
+        return Fail(TqlError::Syntax, at, "a target in brackets, such as [Name]", Closing(name));
+    if (m_open.back()->name != name)
+        return Fail(TqlError::Syntax, at, Closing(m_open.back()->name), Closing(name));
+    m_open.pop_back();
+    return true;
+}
+
+bool Parser::ParseKeyword(const char* p)
+{
+    const char* const begin = p;
+    while (Is(*p, NameChar))
+        ++p;
+    const std::string_view name(begin, static_cast<std::size_t>(p - begin));
+    if (m_open.empty())
+        return Fail(TqlError::Syntax, begin, "a target in brackets, such as [Name], before any keyword", Found(begin));
+    p = SkipBlanks(p);
+    if (*p != '=')
+        return Fail(p, "= behind the keyword's name");
+    p = SkipBlanks(p + 1);
+    std::size_t count = 0;
+    if (!ParseParams(p, count))
+        return false;
+    AddKeyword(name, p, count);
+    return true;
+}
+
+bool Parser::ParseParams(const char* p, std::size_t& count)
+{
+    if (AtEnd(p))
+        return ExpectEnd(p);
+    for (;;) {
+        const ParamScan param = ScanParam(p);
+        if (param.expected)
+            return Fail(param.end, param.expected);
+        ++count;
+        p = SkipBlanks(param.end);
+        if (*p != ',')
+            return p == m_lineEnd || ExpectEnd(p, "a comma or the end of the line");
+        p = SkipBlanks(p + 1);
+    }
+}
+
+void Parser::AddKeyword(std::string_view name, const char* params, std::size_t count)
+{
+    Section& section = *m_open.back();
+    if (!section.keywords.empty() && section.sameKeywordNames)
+        section.sameKeywordNames = section.keywords.front().Name() == name;
+    Keyword& keyword = section.keywords.emplace_back();
+    if (count <= Keyword::MaxParams && name.size() <= std::numeric_limits<std::uint16_t>::max()) {
+        keyword.paramCount = static_cast<std::uint8_t>(count);
+        keyword.nameLength = static_cast<std::uint16_t>(name.size());
+        keyword.paramsOffset = static_cast<std::uint32_t>(params - name.data());
+        keyword.name = name.data();
+        return;
+    }
+    LongKeyword& more = m_structure.longKeywords.emplace_back(LongKeyword{name, params, {}});
+    more.starts.reserve(count);
+    for (const char* p = params; more.starts.size() < count; p = NextParam(p))
+        more.starts.push_back(static_cast<std::uint32_t>(p - params));
+    keyword.kind = Kind::LongKeyword;
+    keyword.more = &more;
+}
+
+// What stands at `at`, as far as a blank or a comma, for a message.
+std::string Parser::Found(const char* at) const
+{
+    if (at >= m_lineEnd)
+        return EndOfLine;
+    if (*at == ' ')
+        return "a blank";
+    if (const auto code = static_cast<unsigned char>(*at); code < 0x20 || code == 0x7F)
+        return code == '\t' ? "a tab" : code == '\r' ? "a carriage return" : HexOf("the control character U+", code, 4);
+    constexpr std::size_t longest = 40;
+    const char* p = at;
+    for (std::size_t characters = 0; p < m_lineEnd && characters < longest; ++characters) {
+        if (p != at && (Is(*p, Blank) || *p == ',' || *p == '='))
+            break;
+        p += SequenceLength({p, static_cast<std::size_t>(m_lineEnd - p)});
+    }
+    return std::string(at, p);
+}
+
+bool Parser::Fail(TqlError code, const char* at, std::string expected, std::string found)
+{
+    TqlSyntaxError& error = m_structure.error;
+    error.code = code;
+    error.file = m_file;
+    error.line = m_lineNumber;
+    error.column = CountCharacters({m_line, static_cast<std::size_t>(at - m_line)}) + 1;
+    error.message = m_file + ", line " + std::to_string(error.line) + ", column " + std::to_string(error.column) +
+                    ": expected " + expected + ", found " + found;
+    error.expected = std::move(expected);
+    error.found = std::move(found);
+    return false;
+}
+
+} // namespace
+
+bool Parse(Structure& structure, const std::string& file)
+{
+    return Parser(structure, file).Run();
+}
+
+bool IsParamList(std::string_view params)
+{
+    const std::string line = std::string(params) + '\n';
+    const char* p = line.c_str();
+    const char* const end = p + params.size();
+    if (FindBadByte(p, end) != end)
+        return false;
+    while (p < end) {
+        const ParamScan param = ScanParam(p);
+        if (param.expected)
+            return false;
+        if (param.end == end)
+            return true;
+        p = SkipBlanks(param.end);
+        if (*p != ',')
+            return false;
+        p = SkipBlanks(p + 1);
+    }
+    return params.empty();
+}
+
+} // namespace tql

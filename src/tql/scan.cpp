@@ -1,0 +1,266 @@
+#include "tql/scan.h"
+
+#include "tql/char_class.h"
+#include "tql/number.h"
+#include "tql/utf8.h"
+
+#include <cstring>
+
+namespace tql {
+
+namespace {
+
+// Letter after the backslash and what it stands for.
+struct Escape
+{
+    char letter, value;
+};
+constexpr Escape Escapes[] = {{'n', '\n'}, {'r', '\r'}, {'t', '\t'}};
+
+bool IsHex(char c)
+{
+    return Is(c, Digit) || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F');
+}
+
+std::uint32_t HexValue(char c)
+{
+    return static_cast<std::uint32_t>(Is(c, Digit) ? c - '0' : (c | 0x20) - 'a' + 10);
+}
+
+// `p` behind "\u"; on success the end, and the character. Null when it is no \u{...} of a character.
+const char* ScanCodePoint(const char* p, std::uint32_t& value)
+{
+    value = 0;
+    if (*p != '{' || !IsHex(p[1]))
+        return nullptr;
+    for (++p; IsHex(*p); ++p) {
+        value = value * 16 + HexValue(*p);
+        if (value > 0x10FFFF)
+            return nullptr;
+    }
+    return *p == '}' && IsScalarValue(value) ? p + 1 : nullptr;
+}
+
+struct Quoting
+{
+    char close;
+    CharClass stop;
+    const char* unclosed;
+    const char* control;
+    const char* badEscape;
+};
+constexpr const char* ControlsEscaped = "no control character (they are written \\u{...})";
+constexpr Quoting StringQuoting{'"', StringStop, "\" closing the string", ControlsEscaped,
+                                "one of the escapes \\\" \\\\ \\n \\r \\t \\u{...}"};
+constexpr Quoting FileQuoting{'>', FileStop, "> closing the file name", ControlsEscaped,
+                              "one of the escapes \\> \\\\ \\u{...}"};
+
+const Quoting& QuotingOf(char open)
+{
+    return open == '"' ? StringQuoting : FileQuoting;
+}
+
+const Escape* FindEscape(const Quoting& quoting, char letter)
+{
+    if (&quoting == &StringQuoting)
+        for (const Escape& escape : Escapes)
+            if (escape.letter == letter)
+                return &escape;
+    return nullptr;
+}
+
+ParamScan ScanQuoted(const char* p)
+{
+    const Quoting& quoting = QuotingOf(*p);
+    for (++p;;) {
+        while (!Is(*p, quoting.stop))
+            ++p;
+        if (*p == quoting.close)
+            return {p + 1, nullptr};
+        if (*p == '\t') {
+            ++p;
+            continue;
+        }
+        if (*p != '\\')
+            return {p, *p == '\n' || *p == '\r' ? quoting.unclosed : quoting.control};
+        const char letter = p[1];
+        if (letter == quoting.close || letter == '\\' || FindEscape(quoting, letter)) {
+            p += 2;
+            continue;
+        }
+        std::uint32_t value;
+        if (letter != 'u')
+            return {p, quoting.badEscape};
+        const char* const end = ScanCodePoint(p + 2, value);
+        if (!end)
+            return {p, "\\u{...} with the hexadecimal number of a character"};
+        p = end;
+    }
+}
+
+ParamScan ScanWord(const char* p)
+{
+    for (const std::string_view word : {std::string_view("true"), std::string_view("false")})
+        if (std::strncmp(p, word.data(), word.size()) == 0 && Is(p[word.size()], WordEnd))
+            return {p + word.size(), nullptr};
+    return {p, "true or false"};
+}
+
+// Length of the run that a string or file name copies unchanged.
+std::size_t PlainRun(std::string_view text, CharClass stop)
+{
+    std::size_t i = 0;
+    while (i < text.size() && !Is(text[i], stop) && static_cast<unsigned char>(text[i]) < 0x80)
+        ++i;
+    return i;
+}
+
+void AppendCodeEscape(std::string& out, char control)
+{
+    constexpr const char* digits = "0123456789abcdef";
+    const auto code = static_cast<unsigned char>(control);
+    out += "\\u{";
+    if (code >= 16)
+        out += digits[code >> 4];
+    out += digits[code & 15];
+    out += '}';
+}
+
+// One character that is not plain; returns its length in bytes.
+std::size_t AppendSpecial(std::string& out, std::string_view text, const Quoting& quoting)
+{
+    const char c = text[0];
+    if (c == quoting.close || c == '\\') {
+        out += '\\';
+        out += c;
+        return 1;
+    }
+    if (static_cast<unsigned char>(c) >= 0x80) {
+        const std::size_t length = SequenceLength(text);
+        if (length == 0) {
+            out += "\xEF\xBF\xBD"; // U+FFFD stands for what is no character; a raw byte would make the file unreadable
+            return 1;
+        }
+        out += text.substr(0, length);
+        return length;
+    }
+    if (&quoting == &StringQuoting)
+        for (const Escape& escape : Escapes)
+            if (escape.value == c) {
+                out += '\\';
+                out += escape.letter;
+                return 1;
+            }
+    AppendCodeEscape(out, c);
+    return 1;
+}
+
+void AppendQuoted(std::string& out, std::string_view value, const Quoting& quoting)
+{
+    for (;;) {
+        const std::size_t plain = PlainRun(value, quoting.stop);
+        out += value.substr(0, plain);
+        value.remove_prefix(plain);
+        if (value.empty())
+            break;
+        value.remove_prefix(AppendSpecial(out, value, quoting));
+    }
+    out += quoting.close;
+}
+
+} // namespace
+
+ParamScan ScanParam(const char* p)
+{
+    switch (*p) {
+    case '"':
+    case '<':
+        return ScanQuoted(p);
+    case 't':
+    case 'f':
+        return ScanWord(p);
+    default:
+        break;
+    }
+    if (!Is(*p, Digit) && *p != '-' && *p != '.' && *p != 'n' && *p != 'i')
+        return {p, "a parameter (a number, true, false, \"text\" or <file name>)"};
+    const NumberScan number = ScanNumber(p);
+    return number.expected ? ParamScan{p, number.expected} : ParamScan{number.end, nullptr};
+}
+
+const char* SkipParam(const char* p)
+{
+    if (*p == '"' || *p == '<') {
+        const char close = QuotingOf(*p).close;
+        for (++p; *p != close; ++p)
+            p += *p == '\\'; // the letter after it is not looked at
+        return p + 1;
+    }
+    while (!Is(*p, WordEnd))
+        ++p;
+    return p;
+}
+
+const char* NextParam(const char* p)
+{
+    p = SkipBlanks(SkipParam(p));
+    return *p == ',' ? SkipBlanks(p + 1) : nullptr;
+}
+
+TqlType ParamType(const char* p)
+{
+    switch (*p) {
+    case '"':
+        return TqlType::String;
+    case '<':
+        return TqlType::FileName;
+    case 't':
+    case 'f':
+        return TqlType::Bool;
+    default:
+        break;
+    }
+    p += *p == '-';
+    while (Is(*p, Digit))
+        ++p;
+    return Is(*p, WordEnd) ? TqlType::Int : TqlType::Double;
+}
+
+void UnescapeParam(const char* p, std::string& out)
+{
+    const Quoting& quoting = QuotingOf(*p);
+    out.clear();
+    for (++p;;) {
+        const char* const run = p;
+        while (*p != quoting.close && *p != '\\')
+            ++p;
+        out.append(run, static_cast<std::size_t>(p - run));
+        if (*p == quoting.close)
+            return;
+        ++p;
+        if (*p == quoting.close || *p == '\\') {
+            out += *p++;
+        } else if (const Escape* escape = FindEscape(quoting, *p)) {
+            out += escape->value;
+            ++p;
+        } else {
+            std::uint32_t value = 0;
+            p = ScanCodePoint(p + 1, value);
+            AppendCodePoint(out, value);
+        }
+    }
+}
+
+void AppendString(std::string& out, std::string_view value)
+{
+    out += '"';
+    AppendQuoted(out, value, StringQuoting);
+}
+
+void AppendFilename(std::string& out, std::string_view value)
+{
+    out += '<';
+    AppendQuoted(out, value, FileQuoting);
+}
+
+} // namespace tql

@@ -1,0 +1,89 @@
+#include "tql/utf8.h"
+
+#include <cstring>
+
+namespace tql {
+
+namespace {
+
+bool IsContinuation(unsigned char byte)
+{
+    return (byte & 0xC0) == 0x80;
+}
+
+// Eight bytes that are all ASCII and none of them NUL.
+bool IsPlainBlock(const char* p)
+{
+    constexpr std::uint64_t low = 0x0101010101010101, high = 0x8080808080808080;
+    std::uint64_t block;
+    std::memcpy(&block, p, sizeof block);
+    return ((block | ((block - low) & ~block)) & high) == 0;
+}
+
+} // namespace
+
+std::size_t SequenceLength(std::string_view text)
+{
+    if (text.empty())
+        return 0;
+    const auto byte = [&](std::size_t i) { return static_cast<unsigned char>(text[i]); };
+    const unsigned char first = byte(0);
+    if (first < 0x80)
+        return 1;
+    const std::size_t length = first >= 0xF0 ? 4 : first >= 0xE0 ? 3 : 2;
+    if (first < 0xC2 || first > 0xF4 || text.size() < length)
+        return 0;
+    for (std::size_t i = 1; i < length; ++i)
+        if (!IsContinuation(byte(i)))
+            return 0;
+    const unsigned char second = byte(1);
+    const bool overlong = (first == 0xE0 && second < 0xA0) || (first == 0xF0 && second < 0x90);
+    const bool surrogate = first == 0xED && second >= 0xA0;
+    const bool tooBig = first == 0xF4 && second >= 0x90;
+    return overlong || surrogate || tooBig ? 0 : length;
+}
+
+const char* FindBadByte(const char* p, const char* end)
+{
+    while (p < end) {
+        if (end - p >= 8 && IsPlainBlock(p)) {
+            p += 8;
+            continue;
+        }
+        const std::size_t length = SequenceLength({p, static_cast<std::size_t>(end - p)});
+        if (length == 0 || *p == '\0')
+            return p;
+        p += length;
+    }
+    return end;
+}
+
+std::size_t CountCharacters(std::string_view text)
+{
+    std::size_t count = 0;
+    for (const char c : text)
+        count += !IsContinuation(static_cast<unsigned char>(c));
+    return count;
+}
+
+void AppendCodePoint(std::string& out, std::uint32_t c)
+{
+    const auto put = [&](std::uint32_t byte) { out.push_back(static_cast<char>(byte)); };
+    if (c < 0x80) {
+        put(c);
+    } else if (c < 0x800) {
+        put(0xC0 | (c >> 6));
+        put(0x80 | (c & 0x3F));
+    } else if (c < 0x10000) {
+        put(0xE0 | (c >> 12));
+        put(0x80 | ((c >> 6) & 0x3F));
+        put(0x80 | (c & 0x3F));
+    } else {
+        put(0xF0 | (c >> 18));
+        put(0x80 | ((c >> 12) & 0x3F));
+        put(0x80 | ((c >> 6) & 0x3F));
+        put(0x80 | (c & 0x3F));
+    }
+}
+
+} // namespace tql
