@@ -60,9 +60,15 @@ public:
     /// Called last, when the document's windows are gone.
     virtual void OnCloseDocument();
 
-    /// Saves to `path` and takes that name when it worked; an empty path asks for one, as Save As.
+    /// The file that OnSaveDocument really writes when it is given `path`. A document that chooses the extension itself
+    /// says so here, so that the question before overwriting is asked about that file.
+    virtual CString SavePathFor(const CString& path) const;
+
+    /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
+    /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As.
     BOOL DoSave(const CString& path);
-    /// Asks whether to save when the document is modified; false when the user cancelled or the save failed.
+    /// Has the views take over what is being typed, then asks whether to save when the document is modified; false when
+    /// the user cancelled or the save failed.
     BOOL SaveModified();
     bool IsExecuting() const { return m_executing; } // in the middle of an open or a save
 
@@ -74,6 +80,8 @@ public:
     bool IsModified() const { return m_modified; }
     void SetModifiedFlag(bool modified = true);
 
+    /// Hint by which every editor's views move the values being edited into the document.
+    static constexpr int StoreHint = 1;
     /// Calls OnUpdate of every view but the sender.
     void UpdateAllViews(CView* sender, int hint = 0, CHint* object = nullptr);
     const std::vector<CView*>& Views() const { return m_views; }
@@ -84,14 +92,17 @@ public:
     CMultiDocTemplate* GetDocTemplate() const { return m_template; }
 
 signals:
-    void TitleChanged();    // path, title or modified flag
+    void TitleChanged(); // path, title or modified flag
     void PathNameChanged(const CString& oldPath, const CString& newPath);
 
 private:
     friend class CMultiDocTemplate;
+    CString AskSavePath();
+
     CString m_path, m_title;
     std::vector<CView*> m_views;
     QUndoStack* m_undo = nullptr; // child object
     CMultiDocTemplate* m_template = nullptr;
     bool m_modified = false, m_executing = false;
+    bool m_named = false; // SetPathName was called during a save
 };

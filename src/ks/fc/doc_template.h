@@ -18,7 +18,16 @@ class KS_API CMultiDocTemplate : public QObject
     Q_OBJECT
 public:
     /// The seven lines of a template string.
-    enum DocStringIndex { windowTitle, docName, fileNewName, filterName, filterExt, regFileTypeId, regFileTypeName };
+    enum DocStringIndex
+    {
+        windowTitle,
+        docName,
+        fileNewName,
+        filterName,
+        filterExt,
+        regFileTypeId,
+        regFileTypeName
+    };
 
     struct Classes
     {
@@ -35,12 +44,16 @@ public:
     CString GetDocString(DocStringIndex index) const;
     /// Whether the template's extension fits, whatever its case.
     bool MatchesExtension(const CString& path) const;
+    /// The template's entry for a file dialog, with the extension in lower and upper case.
+    CString FileDialogFilter() const;
 
     /// Opens `path` (a new untitled document when empty) in a new window of the frame. Null when it failed; the
-    /// document has told the user why. A file that is open already is brought to the front instead.
+    /// document has told the user why. A file that is open already is brought to the front instead. `frame` is not
+    /// null.
     CKsDoc* OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path);
 
     const std::vector<CKsDoc*>& Documents() const { return m_documents; }
+    /// The open document of a file; null when there is none.
     CKsDoc* FindDocument(const CString& path) const;
 
 signals:
@@ -49,6 +62,8 @@ signals:
 
 private:
     friend class CKsMDIChildWnd;
+    std::unique_ptr<CKsDoc> LoadDocument(const CString& path);
+    bool ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame);
     void CloseDocument(CKsDoc* document);
 
     int m_resourceId;

@@ -3,30 +3,26 @@
 
 #include "ks/fc/doc.h"
 
+#include <QKeySequence>
 #include <QMainWindow>
 #include <QMdiArea>
 #include <QMdiSubWindow>
+#include <QPointer>
 #include <QToolBar>
-#include <functional>
+#include <vector>
 
-/// A document window: holds one view. Closing it asks to save when it is the document's last.
-class KS_API CKsMDIChildWnd : public QMdiSubWindow
+/// Numbers of the commands that the main frame's Edit menu hands to whatever has the focus (CCommandTarget).
+namespace KsCommand {
+inline constexpr int Copy = 57634, Cut = 57635, Paste = 57637;
+} // namespace KsCommand
+
+/// A command of a view in the frame's "Lines" menu. Without a text it is a separator.
+struct CKsMenuCommand
 {
-    Q_OBJECT
-public:
-    explicit CKsMDIChildWnd(QWidget* parent = nullptr);
-    ~CKsMDIChildWnd() override;
-
-    /// Puts the view into the window; an editor's frame may prepare something first. False gives the window up.
-    virtual bool OnCreateClient(CView* view);
-    CView* GetActiveView() const { return m_view; }
-
-protected:
-    void closeEvent(QCloseEvent* event) override;
-
-private:
-    void UpdateTitle();
-    CView* m_view = nullptr;
+    int id = 0;
+    CString text{}; // with mnemonic
+    QKeySequence shortcut{};
+    CString statusTip{};
 };
 
 /// Commands that a main frame offers and an active view carries out. Numbers are those of the tool bar resources;
@@ -39,6 +35,50 @@ public:
     virtual bool OnCommand(int id);
     /// Whether the command can be carried out now.
     virtual bool IsCommandEnabled(int id) const;
+    /// What the third menu of the frame shows while this view is active; nothing greys the menu.
+    virtual std::vector<CKsMenuCommand> LinesMenu() const;
+};
+
+/// A document window: holds one view. Closing it asks to save when it is the document's last.
+class KS_API CKsMDIChildWnd : public QMdiSubWindow
+{
+    Q_OBJECT
+public:
+    explicit CKsMDIChildWnd(QWidget* parent = nullptr);
+    /// Destroys the view, and closes the document when that was its last.
+    ~CKsMDIChildWnd() override;
+
+    /// Puts the view into the window; an editor's frame may prepare something first. False gives the window up.
+    virtual bool OnCreateClient(CView* view);
+    CView* GetActiveView() const { return m_view; }
+    /// Closed by the user; the window lives until control returns to the event loop.
+    bool IsClosing() const { return m_closing; }
+
+protected:
+    void closeEvent(QCloseEvent* event) override;
+
+private:
+    friend class CKsMDIFrameWnd;
+    bool IsLastOfDocument() const;
+    void UpdateTitle();
+    QPointer<CView> m_view;
+    bool m_asked = false, m_closing = false;
+};
+
+/// The area of the document windows. While there are none it shows a hint.
+class KS_API CKsMDIArea : public QMdiArea
+{
+    Q_OBJECT
+public:
+    using QMdiArea::QMdiArea;
+    void SetHint(const CString& hint);
+
+protected:
+    void changeEvent(QEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+
+private:
+    CString m_hint;
 };
 
 /// The main frame: document windows, menus by position, tool bars by editor. The shell derives from it.
@@ -47,28 +87,46 @@ class KS_API CKsMDIFrameWnd : public QMainWindow, public CKsWindow
     Q_OBJECT
 public:
     explicit CKsMDIFrameWnd(QWidget* parent = nullptr);
+    /// Destroys the document windows; a derived frame that answers messages calls DestroyWindows in its own destructor.
+    ~CKsMDIFrameWnd() override;
 
-    QMdiArea& MdiArea() const { return *m_area; }
+    CKsMDIArea& MdiArea() const { return *m_area; }
     /// The view of the active window; null when there is none.
-    CView* GetActiveView() const;
+    CView* GetActiveView() const { return m_activeView; }
     /// Enables or greys the menu at a position of the menu bar, counted from 0.
     void EnableMenuItem(int position, bool enable);
+    /// Puts a document window into the frame and shows it.
+    void AddWindow(CKsMDIChildWnd* window);
+    /// Asks for every modified document first, then closes all windows; false, and nothing closed, when one was kept.
+    bool CloseAllWindows();
+    /// Sends a command to the active view; false when there is none or it cannot do it now.
+    bool SendCommand(int id);
+
+signals:
+    /// Which commands can be carried out may have changed: another view or another focus.
+    void CommandStateChanged();
+
+protected:
+    /// Another view, or none, became active. Called before the views hear of it.
+    virtual void ActiveViewChanged(CView* view);
+    void DestroyWindows();
 
 private:
-    void SubWindowActivated(QMdiSubWindow* window);
-    QMdiArea* m_area;
+    void SubWindowActivated();
+    CKsMDIArea* m_area;
     QPointer<CView> m_activeView;
 };
 
-/// A button of a tool bar resource.
+/// A button of a tool bar resource; command 0 is a separator.
 struct CKsToolBarButton
 {
-    int command;         // also the string number of its "status text\ntool tip"
-    const char* icon;    // resource path
-    CString text;        // "status text\ntool tip"
+    int command;      // also the string number of its text
+    const char* icon; // resource path
+    CString text;     // "status text\ntool tip"
 };
 
-/// A tool bar of an editor. Buttons send their command to the frame's active view (CCommandTarget).
+/// A tool bar of an editor. Buttons send their command to the frame's active view (CCommandTarget) and are greyed while
+/// it cannot carry them out.
 class KS_API CKsToolBarEx : public QToolBar
 {
     Q_OBJECT
@@ -85,8 +143,11 @@ public:
     unsigned ControlId() const { return m_controlId; }
 
 private:
-    CKsMDIFrameWnd* m_frame = nullptr;
+    void UpdateButtons();
+    QPointer<CKsMDIFrameWnd> m_frame;
     unsigned m_style = 0, m_controlId = 0;
 };
 
-inline constexpr unsigned CBRS_TOOLTIPS = 0x10, CBRS_FLYBY = 0x20, CBRS_SIZE_DYNAMIC = 0x4, CBRS_ALIGN_ANY = 0xF000;
+inline constexpr unsigned CBRS_TOOLTIPS = 0x10, CBRS_FLYBY = 0x20, CBRS_SIZE_DYNAMIC = 0x4;
+inline constexpr unsigned CBRS_ALIGN_LEFT = 0x1000, CBRS_ALIGN_TOP = 0x2000, CBRS_ALIGN_RIGHT = 0x4000,
+                          CBRS_ALIGN_BOTTOM = 0x8000, CBRS_ALIGN_ANY = 0xF000;

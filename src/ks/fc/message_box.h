@@ -10,9 +10,8 @@
 class QWidget;
 
 /// Shows a modal message with the given buttons and returns the one pressed. The title is the application's name.
-KS_API QMessageBox::StandardButton KsMessageBox(const CString& text,
-                                                QMessageBox::StandardButtons buttons = QMessageBox::Ok,
-                                                QWidget* parent = nullptr);
+KS_API QMessageBox::StandardButton
+KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons = QMessageBox::Ok, QWidget* parent = nullptr);
 
 using KsMessageBoxHandler =
     std::function<QMessageBox::StandardButton(const CString& text, QMessageBox::StandardButtons buttons)>;

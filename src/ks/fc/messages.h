@@ -26,8 +26,8 @@ KS_API void KsSetMainWindow(CKsWindow* window);
 
 namespace KsMessage {
 // The names are the shell's, the misspelling in the first included.
-KS_API unsigned SwitchBoard();     // "KavoShellSwitchBoardSevice"
-KS_API unsigned BetweenEditors();  // "KavoShellCommunicationBetweenEditors"
+KS_API unsigned SwitchBoard();    // "KavoShellSwitchBoardSevice"
+KS_API unsigned BetweenEditors(); // "KavoShellCommunicationBetweenEditors"
 KS_API unsigned ProjectManagement();
 KS_API unsigned ShowToolbar();
 KS_API unsigned HideToolbar();
@@ -39,4 +39,8 @@ namespace KsRequest {
 inline constexpr WPARAM LeaveProject = 24;
 inline constexpr WPARAM JoinProject = 25;
 inline constexpr WPARAM DataChanged = 522;
+// With ProjectManagement, from the shell to every view: a project (the package's handle, its file's path as text) has
+// been opened, or is about to close.
+inline constexpr WPARAM ProjectOpened = 1;
+inline constexpr WPARAM ProjectClosing = 3;
 } // namespace KsRequest

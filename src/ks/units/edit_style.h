@@ -7,7 +7,11 @@
 
 #include <QObject>
 
-enum class KsUnitSystem { Metric, UsCustomary };
+enum class KsUnitSystem
+{
+    Metric,
+    UsCustomary
+};
 
 /// The user's unit system, for the whole program; emits Changed when it is switched.
 class KS_API KsUnits : public QObject
@@ -25,11 +29,11 @@ private:
     KsUnitSystem m_system = KsUnitSystem::Metric;
 };
 
-/// Factor and offset between a group's base unit and a display unit: display = base * factor + offset.
+/// Between a group's base unit and a display unit: base = display * toBase. No quantity of a group has an offset.
 struct KsConversion
 {
-    double factor = 1, offset = 0;
-    bool IsIdentity() const { return factor == 1 && offset == 0; }
+    double toBase = 1;
+    bool IsIdentity() const { return toBase == 1; }
 };
 
 class KS_API CKsEditStyle
@@ -61,7 +65,7 @@ private:
     CString m_format = QStringLiteral("%-lf");
 };
 
-/// Prints one double in a printf floating format, independent of the locale.
+/// Prints one double in a printf floating format, independent of the locale; in the shortest form when it is none.
 KS_API CString KsFormatNumber(const CString& format, double value);
-/// The shortest text that reads back to the same number.
+/// The fewest digits that read back to the same number, without exponent from 1e-5 up to 1e15.
 KS_API CString KsShortestNumber(double value);

@@ -1,0 +1,108 @@
+#include "ks/fc/doc.h"
+
+#include "ks/fc/doc_template.h"
+#include "ks/fc/message_box.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QUndoStack>
+#include <algorithm>
+#include <utility>
+
+CKsDoc::CKsDoc() : m_undo(new QUndoStack(this)) {}
+
+CKsDoc::~CKsDoc()
+{
+    for (CView* view : m_views)
+        view->m_document = nullptr;
+}
+
+BOOL CKsDoc::OnNewDocument()
+{
+    DeleteContents();
+    SetPathName({});
+    SetModifiedFlag(false);
+    return true;
+}
+
+BOOL CKsDoc::OnOpenDocument(const CString& path)
+{
+    QFile file(path);
+    const QFileInfo info(path);
+    const CString reason = !info.exists()                    ? tr("The file does not exist.")
+                           : !info.isFile()                  ? tr("This is not a file.")
+                           : !file.open(QIODevice::ReadOnly) ? file.errorString()
+                                                             : CString();
+    if (!reason.isEmpty()) {
+        KsMessageBox(tr("%1 could not be opened.\n%2").arg(QDir::toNativeSeparators(path), reason));
+        return false;
+    }
+    DeleteContents();
+    SetModifiedFlag(false);
+    return true;
+}
+
+void CKsDoc::DeleteContents()
+{
+    m_undo->clear();
+}
+
+void CKsDoc::OnCloseDocument()
+{
+    DeleteContents();
+}
+
+void CKsDoc::SetPathName(const CString& path)
+{
+    m_named = true;
+    if (path == m_path)
+        return;
+    const CString old = std::exchange(m_path, path);
+    if (!path.isEmpty())
+        m_title.clear(); // from now on the file's name
+    emit PathNameChanged(old, path);
+    emit TitleChanged();
+}
+
+CString CKsDoc::GetTitle() const
+{
+    return m_title.isEmpty() && !m_path.isEmpty() ? QFileInfo(m_path).fileName() : m_title;
+}
+
+void CKsDoc::SetTitle(const CString& title)
+{
+    if (std::exchange(m_title, title) != title)
+        emit TitleChanged();
+}
+
+void CKsDoc::SetModifiedFlag(bool modified)
+{
+    if (std::exchange(m_modified, modified) != modified)
+        emit TitleChanged();
+}
+
+void CKsDoc::UpdateAllViews(CView* sender, int hint, CHint* object)
+{
+    const auto views = m_views; // a view may come or go meanwhile
+    for (CView* view : views) {
+        if (view != sender && std::find(m_views.begin(), m_views.end(), view) != m_views.end())
+            view->OnUpdate(sender, hint, object);
+    }
+}
+
+void CKsDoc::AddView(CView* view)
+{
+    if (view->m_document == this)
+        return;
+    if (view->m_document)
+        view->m_document->RemoveView(view);
+    view->m_document = this;
+    m_views.push_back(view);
+}
+
+void CKsDoc::RemoveView(CView* view)
+{
+    if (std::erase(m_views, view))
+        view->m_document = nullptr;
+}

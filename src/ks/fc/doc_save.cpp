@@ -1,0 +1,102 @@
+// How a document is saved: by name, under a new name, and before it is closed.
+#include "ks/fc/doc.h"
+#include "ks/fc/doc_template.h"
+#include "ks/fc/file_dialog.h"
+#include "ks/fc/message_box.h"
+
+#include <QApplication>
+#include <QDir>
+#include <QFileInfo>
+#include <QPointer>
+#include <utility>
+
+namespace {
+
+bool SameFile(const CString& a, const CString& b)
+{
+    if (a.isEmpty() || b.isEmpty())
+        return false;
+    const CString first = QFileInfo(a).canonicalFilePath(), second = QFileInfo(b).canonicalFilePath();
+    return first.isEmpty() || second.isEmpty() ? QDir::cleanPath(a) == QDir::cleanPath(b) : first == second;
+}
+
+/// Takes the focus from the field being edited, so that it commits its text, and gives it back.
+void CommitFocus(const std::vector<CView*>& views)
+{
+    const QPointer<QWidget> focus = QApplication::focusWidget();
+    const bool inside =
+        focus && std::any_of(views.begin(), views.end(), [&](const CView* view) { return view->isAncestorOf(focus); });
+    if (!inside)
+        return;
+    focus->clearFocus();
+    if (focus && !QApplication::focusWidget())
+        focus->setFocus(Qt::OtherFocusReason);
+}
+
+} // namespace
+
+CString CKsDoc::SavePathFor(const CString& path) const
+{
+    return path;
+}
+
+BOOL CKsDoc::DoSave(const CString& path)
+{
+    const CString target = path.isEmpty() ? AskSavePath() : path;
+    if (target.isEmpty())
+        return false;
+    m_named = false;
+    m_executing = true;
+    const bool saved = OnSaveDocument(target);
+    m_executing = false;
+    if (saved && !m_named)
+        SetPathName(SavePathFor(target));
+    return saved;
+}
+
+BOOL CKsDoc::SaveModified()
+{
+    CommitFocus(m_views);
+    UpdateAllViews(nullptr, StoreHint);
+    if (!m_modified)
+        return true;
+    switch (KsMessageBox(tr("Save the changes to %1?").arg(GetTitle()),
+                         QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel)) {
+    case QMessageBox::Save:
+        return DoSave(m_path);
+    case QMessageBox::Discard:
+        return true;
+    default:
+        return false;
+    }
+}
+
+/// Asks for a name until it is one that may be written; empty when the user gives up.
+CString CKsDoc::AskSavePath()
+{
+    KsFileQuestion question;
+    question.save = true;
+    question.title = tr("Save As");
+    question.proposal = m_path.isEmpty() ? GetTitle() : m_path;
+    if (m_template) {
+        question.filters = m_template->FileDialogFilter();
+        question.extension = m_template->GetDocString(CMultiDocTemplate::filterExt);
+    }
+    while (true) {
+        const CString path = KsAskFileName(question);
+        if (path.isEmpty())
+            return {};
+        const CString written = SavePathFor(path);
+        question.proposal = path;
+        const CKsDoc* other = m_template ? m_template->FindDocument(written) : nullptr;
+        if (other && other != this) {
+            KsMessageBox(
+                tr("%1 is open in another window. Choose another name.").arg(QDir::toNativeSeparators(written)));
+            continue;
+        }
+        if (!QFileInfo::exists(written) || SameFile(written, m_path) ||
+            KsMessageBox(tr("%1 exists already. Replace it?").arg(QDir::toNativeSeparators(written)),
+                         QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
+            return path;
+    }
+}

@@ -1,0 +1,140 @@
+#include "ks/fc/doc_template.h"
+
+#include "ks/fc/frames.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <QUndoStack>
+#include <algorithm>
+
+namespace {
+
+/// Two spellings of one existing file are one file.
+CString FileKey(const CString& path)
+{
+    const CString canonical = QFileInfo(path).canonicalFilePath();
+    return canonical.isEmpty() ? QDir::cleanPath(QFileInfo(path).absoluteFilePath()) : canonical;
+}
+
+CKsMDIChildWnd* WindowOf(const CView* view)
+{
+    for (QWidget* widget = view->parentWidget(); widget; widget = widget->parentWidget()) {
+        if (auto* window = qobject_cast<CKsMDIChildWnd*>(widget))
+            return window;
+    }
+    return nullptr;
+}
+
+bool IsClosing(const CKsDoc* document)
+{
+    const auto& views = document->Views();
+    return !views.empty() && std::all_of(views.begin(), views.end(), [](const CView* view) {
+        const auto* window = WindowOf(view);
+        return window && window->IsClosing();
+    });
+}
+
+} // namespace
+
+CMultiDocTemplate::CMultiDocTemplate(int resourceId, CString strings, Classes classes)
+    : m_resourceId(resourceId), m_strings(strings.split(u'\n')), m_classes(std::move(classes))
+{
+}
+
+CMultiDocTemplate::~CMultiDocTemplate()
+{
+    while (!m_documents.empty())
+        CloseDocument(m_documents.back());
+}
+
+CString CMultiDocTemplate::GetDocString(DocStringIndex index) const
+{
+    return m_strings.value(index);
+}
+
+bool CMultiDocTemplate::MatchesExtension(const CString& path) const
+{
+    const CString extension = GetDocString(filterExt);
+    return !extension.isEmpty() && path.endsWith(extension, Qt::CaseInsensitive);
+}
+
+CString CMultiDocTemplate::FileDialogFilter() const
+{
+    const CString extension = GetDocString(filterExt);
+    const CString name = GetDocString(filterName).section(QStringLiteral(" ("), 0, 0);
+    return QStringLiteral("%1 (*%2 *%3)").arg(name, extension.toLower(), extension.toUpper());
+}
+
+CKsDoc* CMultiDocTemplate::FindDocument(const CString& path) const
+{
+    const CString key = FileKey(path);
+    const auto found = std::find_if(m_documents.begin(), m_documents.end(), [&](const CKsDoc* document) {
+        return !document->GetPathName().isEmpty() && FileKey(document->GetPathName()) == key && !IsClosing(document);
+    });
+    return found == m_documents.end() ? nullptr : *found;
+}
+
+std::unique_ptr<CKsDoc> CMultiDocTemplate::LoadDocument(const CString& path)
+{
+    std::unique_ptr<CKsDoc> document(m_classes.document());
+    if (!document)
+        return nullptr;
+    document->m_template = this;
+    document->m_executing = true;
+    const bool loaded = path.isEmpty() ? document->OnNewDocument() : document->OnOpenDocument(path);
+    document->m_executing = false;
+    if (!loaded)
+        return nullptr;
+    if (path.isEmpty())
+        document->SetTitle(GetDocString(docName) + CString::number(++m_untitled));
+    else
+        document->SetPathName(path);
+    return document;
+}
+
+bool CMultiDocTemplate::ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame)
+{
+    std::unique_ptr<CKsMDIChildWnd> window(m_classes.frame());
+    std::unique_ptr<CView> view(m_classes.view());
+    if (!window || !view)
+        return false;
+    document->AddView(view.get());
+    if (!window->OnCreateClient(view.get()))
+        return false;
+    CView* shown = view.release(); // the window's from here on
+    auto* child = window.release();
+    frame->AddWindow(child);
+    shown->OnInitialUpdate();
+    frame->MdiArea().setActiveSubWindow(child);
+    shown->setFocus();
+    return true;
+}
+
+CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)
+{
+    const CString absolute = path.isEmpty() ? path : QFileInfo(path).absoluteFilePath();
+    if (CKsDoc* open = absolute.isEmpty() ? nullptr : FindDocument(absolute)) {
+        if (auto* window = open->Views().empty() ? nullptr : WindowOf(open->Views().front()))
+            frame->MdiArea().setActiveSubWindow(window);
+        return open;
+    }
+    auto loaded = LoadDocument(absolute);
+    if (!loaded)
+        return nullptr;
+    CKsDoc* document = loaded.release();
+    m_documents.push_back(document);
+    emit DocumentOpened(document);
+    if (ShowDocument(document, frame))
+        return document;
+    CloseDocument(document);
+    return nullptr;
+}
+
+void CMultiDocTemplate::CloseDocument(CKsDoc* document)
+{
+    if (!std::erase(m_documents, document))
+        return;
+    emit DocumentClosing(document);
+    document->OnCloseDocument();
+    delete document;
+}

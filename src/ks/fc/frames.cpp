@@ -1,0 +1,186 @@
+#include "ks/fc/frames.h"
+
+#include "ks/fc/doc_template.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QCloseEvent>
+#include <QMenuBar>
+#include <QPainter>
+#include <set>
+#include <utility>
+
+// ---- commands ----------------------------------------------------------------------------------
+
+CCommandTarget::~CCommandTarget() = default;
+
+bool CCommandTarget::OnCommand(int)
+{
+    return false;
+}
+
+bool CCommandTarget::IsCommandEnabled(int) const
+{
+    return false;
+}
+
+std::vector<CKsMenuCommand> CCommandTarget::LinesMenu() const
+{
+    return {};
+}
+
+// ---- document window ---------------------------------------------------------------------------
+
+CKsMDIChildWnd::CKsMDIChildWnd(QWidget* parent) : QMdiSubWindow(parent)
+{
+    setAttribute(Qt::WA_DeleteOnClose);
+}
+
+CKsMDIChildWnd::~CKsMDIChildWnd()
+{
+    CKsDoc* document = m_view ? m_view->GetDocument() : nullptr;
+    delete m_view; // it still talks to its document
+    if (document && document->Views().empty() && document->GetDocTemplate())
+        document->GetDocTemplate()->CloseDocument(document);
+}
+
+bool CKsMDIChildWnd::OnCreateClient(CView* view)
+{
+    m_view = view;
+    setWidget(view);
+    if (CKsDoc* document = view->GetDocument()) {
+        connect(document, &CKsDoc::TitleChanged, this, &CKsMDIChildWnd::UpdateTitle);
+        UpdateTitle();
+    }
+    return true;
+}
+
+void CKsMDIChildWnd::UpdateTitle()
+{
+    if (!m_view || !m_view->GetDocument())
+        return;
+    setWindowTitle(m_view->GetDocument()->GetTitle() + QStringLiteral("[*]"));
+    setWindowModified(m_view->GetDocument()->IsModified());
+    setToolTip({});
+}
+
+bool CKsMDIChildWnd::IsLastOfDocument() const
+{
+    return m_view && m_view->GetDocument() && m_view->GetDocument()->Views().size() == 1;
+}
+
+void CKsMDIChildWnd::closeEvent(QCloseEvent* event)
+{
+    if (!m_asked && IsLastOfDocument() && !m_view->GetDocument()->SaveModified()) {
+        event->ignore();
+        return;
+    }
+    m_closing = true;
+    QMdiSubWindow::closeEvent(event);
+}
+
+// ---- area of the document windows --------------------------------------------------------------
+
+void CKsMDIArea::SetHint(const CString& hint)
+{
+    m_hint = hint;
+    viewport()->update();
+}
+
+void CKsMDIArea::changeEvent(QEvent* event)
+{
+    if (event->type() == QEvent::PaletteChange)
+        setBackground(palette().window());
+    QMdiArea::changeEvent(event);
+}
+
+void CKsMDIArea::paintEvent(QPaintEvent* event)
+{
+    QMdiArea::paintEvent(event);
+    if (m_hint.isEmpty() || !subWindowList().isEmpty())
+        return;
+    QPainter painter(viewport());
+    painter.setPen(palette().color(QPalette::PlaceholderText));
+    painter.drawText(viewport()->rect().adjusted(20, 20, -20, -20), Qt::AlignCenter | Qt::TextWordWrap, m_hint);
+}
+
+// ---- main frame --------------------------------------------------------------------------------
+
+CKsMDIFrameWnd::CKsMDIFrameWnd(QWidget* parent) : QMainWindow(parent), m_area(new CKsMDIArea(this))
+{
+    m_area->setBackground(palette().window());
+    setCentralWidget(m_area);
+    connect(m_area, &QMdiArea::subWindowActivated, this, &CKsMDIFrameWnd::SubWindowActivated);
+    connect(qApp, &QApplication::focusChanged, this, &CKsMDIFrameWnd::CommandStateChanged);
+}
+
+CKsMDIFrameWnd::~CKsMDIFrameWnd()
+{
+    DestroyWindows();
+    if (KsMainWindow() == this)
+        KsSetMainWindow(nullptr);
+}
+
+void CKsMDIFrameWnd::DestroyWindows()
+{
+    disconnect(m_area, nullptr, this, nullptr);
+    disconnect(qApp, nullptr, this, nullptr);
+    const auto windows = m_area->subWindowList();
+    for (QMdiSubWindow* window : windows)
+        delete window;
+    m_activeView = nullptr;
+}
+
+void CKsMDIFrameWnd::EnableMenuItem(int position, bool enable)
+{
+    if (QAction* menu = menuBar()->actions().value(position))
+        menu->setEnabled(enable);
+}
+
+void CKsMDIFrameWnd::AddWindow(CKsMDIChildWnd* window)
+{
+    m_area->addSubWindow(window);
+    window->show();
+}
+
+bool CKsMDIFrameWnd::CloseAllWindows()
+{
+    const auto windows = m_area->subWindowList();
+    std::set<CKsDoc*> asked;
+    for (QMdiSubWindow* window : windows) {
+        const auto* child = qobject_cast<CKsMDIChildWnd*>(window);
+        CKsDoc* document = child && child->GetActiveView() ? child->GetActiveView()->GetDocument() : nullptr;
+        if (document && asked.insert(document).second && !document->SaveModified())
+            return false;
+    }
+    for (QMdiSubWindow* window : windows) {
+        if (auto* child = qobject_cast<CKsMDIChildWnd*>(window))
+            child->m_asked = true;
+        window->close();
+    }
+    return true;
+}
+
+bool CKsMDIFrameWnd::SendCommand(int id)
+{
+    auto* target = dynamic_cast<CCommandTarget*>(m_activeView.data());
+    return target && target->IsCommandEnabled(id) && target->OnCommand(id);
+}
+
+void CKsMDIFrameWnd::ActiveViewChanged(CView*) {}
+
+void CKsMDIFrameWnd::SubWindowActivated()
+{
+    // The area also reports that the whole program lost the focus; its current window is active still.
+    const auto* window = qobject_cast<CKsMDIChildWnd*>(m_area->currentSubWindow());
+    CView* view = window && !window->IsClosing() ? window->GetActiveView() : nullptr;
+    if (view == m_activeView)
+        return;
+    const QPointer<CView> deactivated = std::exchange(m_activeView, view);
+    ActiveViewChanged(view);
+    if (deactivated)
+        deactivated->OnActivateView(false, view, deactivated);
+    if (view)
+        view->OnActivateView(true, view, deactivated);
+    emit CommandStateChanged();
+}

@@ -1,0 +1,32 @@
+#include "ks/fc/message_box.h"
+
+#include <QApplication>
+#include <utility>
+
+namespace {
+KsMessageBoxHandler& Handler()
+{
+    static KsMessageBoxHandler handler;
+    return handler;
+}
+
+QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
+{
+    return buttons == QMessageBox::Ok ? QMessageBox::Warning : QMessageBox::Question;
+}
+} // namespace
+
+QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent)
+{
+    if (const auto handler = Handler())
+        return handler(text, buttons);
+    QMessageBox box(IconFor(buttons), QCoreApplication::applicationName(), text, buttons,
+                    parent ? parent : QApplication::activeWindow());
+    box.setTextFormat(Qt::PlainText); // file names may hold anything
+    return QMessageBox::StandardButton(box.exec());
+}
+
+KsMessageBoxHandler KsSetMessageBoxHandler(KsMessageBoxHandler handler)
+{
+    return std::exchange(Handler(), std::move(handler));
+}

@@ -1,0 +1,3 @@
+#include "ks/fc/package.h"
+
+CKsCBEItem::~CKsCBEItem() = default;

@@ -1,0 +1,109 @@
+#include "ks/language/language.h"
+
+#include <QApplication>
+#include <QLibraryInfo>
+#include <QTranslator>
+#include <map>
+#include <memory>
+
+struct KsResourceModule
+{
+    QString name;
+    std::unique_ptr<QTranslator> translator; // null: the texts in the sources
+};
+
+namespace {
+
+// By name, so that a module that had nothing for one language is found again for the next. Never destroyed: editors may
+// free their modules while the program ends.
+std::map<QString, KsResourceModule>& Modules()
+{
+    static auto* modules = new std::map<QString, KsResourceModule>;
+    return *modules;
+}
+
+std::unique_ptr<QTranslator> LoadTranslator(const QString& name, const QStringList& folders)
+{
+    auto translator = std::make_unique<QTranslator>();
+    for (const QString& folder : folders) {
+        if (translator->load(name, folder))
+            return translator;
+    }
+    return nullptr;
+}
+
+void Uninstall(KsResourceModule& module)
+{
+    if (module.translator && QCoreApplication::instance())
+        QCoreApplication::removeTranslator(module.translator.get());
+    module.translator.reset();
+}
+
+bool Install(KsResourceModule& module, const QString& code, const QStringList& folders)
+{
+    Uninstall(module);
+    module.translator = LoadTranslator(module.name + u'_' + code, folders);
+    if (module.translator)
+        QCoreApplication::installTranslator(module.translator.get());
+    return module.translator != nullptr;
+}
+
+KsResourceModule& QtModule()
+{
+    static auto* module = new KsResourceModule{QStringLiteral("qtbase"), nullptr};
+    return *module;
+}
+
+} // namespace
+
+KsResourceHandle KsLangLoadResDll(const char* name, KsResourceHandle* handle, int)
+{
+    auto& language = KsLanguage::Instance();
+    const QString key = QString::fromUtf8(name);
+    KsResourceModule& module = Modules().try_emplace(key, KsResourceModule{key, nullptr}).first->second;
+    KsResourceHandle result = Install(module, language.Current(), {language.TranslationFolder()}) ? &module : nullptr;
+    if (handle)
+        *handle = result;
+    return result;
+}
+
+void KsLangFreeResDll(KsResourceHandle handle)
+{
+    if (!handle)
+        return;
+    Uninstall(*handle);
+    Modules().erase(QString(handle->name));
+}
+
+QFont KsLangGetUserFont()
+{
+    return QApplication::font();
+}
+
+KsLanguage::KsLanguage()
+    : m_current(QStringLiteral("en_US")),
+      m_folder(QCoreApplication::applicationDirPath() + QStringLiteral("/translations"))
+{
+}
+
+KsLanguage& KsLanguage::Instance()
+{
+    static auto* language = new KsLanguage;
+    return *language;
+}
+
+QStringList KsLanguage::Available()
+{
+    return {QStringLiteral("en_US"), QStringLiteral("en_GB"), QStringLiteral("ja")};
+}
+
+void KsLanguage::SetCurrent(const QString& code)
+{
+    if (code == m_current || !Available().contains(code))
+        return;
+    m_current = code;
+    Install(QtModule(), code, {QLibraryInfo::path(QLibraryInfo::TranslationsPath), m_folder});
+    for (auto& [name, module] : Modules())
+        Install(module, code, {m_folder});
+    emit Changed();
+}

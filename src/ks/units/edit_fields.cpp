@@ -1,0 +1,65 @@
+#include "ks/units/edit_fields.h"
+
+#include "ks/fc/message_box.h"
+
+#include <QLocale>
+#include <cmath>
+
+namespace {
+
+void Refuse(QLineEdit& edit, const CString& message)
+{
+    KsMessageBox(message, QMessageBox::Ok, &edit);
+    edit.setFocus();
+    edit.selectAll();
+}
+
+} // namespace
+
+CKsEditLong::CKsEditLong(QWidget* parent) : QLineEdit(parent)
+{
+    setMaxLength(20); // room for a number that is too large, so that the message can say so
+}
+
+void CKsEditLong::SetValue(std::int32_t value)
+{
+    setText(CString::number(value));
+}
+
+std::optional<std::int32_t> CKsEditLong::Value() const
+{
+    bool isInteger = false;
+    const int value = text().trimmed().toInt(&isInteger);
+    return isInteger && m_range.Contains(value) ? std::optional<std::int32_t>(value) : std::nullopt;
+}
+
+std::optional<std::int32_t> CKsEditLong::CheckedValue()
+{
+    if (const auto value = Value())
+        return value;
+    bool isInteger = false;
+    text().trimmed().toInt(&isInteger);
+    Refuse(*this, isInteger ? tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high)
+                            : tr("Enter an integer."));
+    return std::nullopt;
+}
+
+bool DDX_KSedit(bool save, QLineEdit& edit, double& value, const CKsEditStyle& style)
+{
+    if (!save) {
+        edit.setText(KsFormatNumber(style.GetFormat(), value));
+        edit.setToolTip(style.GetEumToolTipText());
+        return true;
+    }
+    const CString text = edit.text().trimmed();
+    if (text.isEmpty())
+        return true;
+    bool isNumber = false;
+    const double number = QLocale::c().toDouble(text, &isNumber);
+    if (!isNumber || !std::isfinite(number) || text.contains(u',')) {
+        Refuse(edit, CKsEditLong::tr("Enter a number."));
+        return false;
+    }
+    value = number;
+    return true;
+}

@@ -1,0 +1,64 @@
+#include "ks/units/edit_style.h"
+
+#include "ks/units/unit_groups.h"
+
+#include <QCoreApplication>
+#include <cmath>
+
+namespace {
+constexpr double NotGiven = 1e10; // a value that has not been entered, in whatever unit
+} // namespace
+
+KsUnits& KsUnits::Instance()
+{
+    static KsUnits units;
+    return units;
+}
+
+void KsUnits::SetSystem(KsUnitSystem system)
+{
+    if (system == m_system)
+        return;
+    m_system = system;
+    emit Changed();
+}
+
+void CKsEditStyle::SetEumUnitBaseGroup(UnitGroup group, int unit)
+{
+    m_group = group;
+    m_unit = unit;
+}
+
+KsConversion CKsEditStyle::Conversion() const
+{
+    return m_unit == 0 ? KsConversion{} : KsUnitConversion(m_group, KsUnits::Instance().System());
+}
+
+double CKsEditStyle::UnitConvertFromBase(double value, int flag) const
+{
+    const KsConversion conversion = Conversion();
+    if (conversion.IsIdentity() || value == NotGiven || !std::isfinite(value))
+        return value;
+    return flag ? value / conversion.toBase : value * conversion.toBase;
+}
+
+CString CKsEditStyle::UnitConvertFromBase_T(double value, int flag) const
+{
+    return KsFormatNumber(m_format, UnitConvertFromBase(value, flag));
+}
+
+CString CKsEditStyle::UnitSymbol() const
+{
+    const KsUnitGroupRow* row = KsFindUnitGroup(m_group);
+    if (!row)
+        return {};
+    // Without a conversion the base unit is what is shown.
+    const bool base = m_unit == 0 || Conversion().IsIdentity();
+    return CString::fromUtf8((base ? row->base : row->Display(KsUnits::Instance().System())).symbol);
+}
+
+CString CKsEditStyle::GetEumToolTipText() const
+{
+    const CString symbol = UnitSymbol();
+    return symbol.isEmpty() ? CString() : QCoreApplication::translate("CKsEditStyle", "Unit: %1").arg(symbol);
+}
