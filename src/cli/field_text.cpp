@@ -16,7 +16,7 @@ std::string Shortest(T value)
 std::string TwoDigits(std::int32_t value)
 {
     const std::string text = Shortest(value);
-    return text.size() == 1 ? '0' + text : text;
+    return (text.size() == 1 ? "0" : "") + text;
 }
 
 std::string DateText(const HDDateTime& d)
@@ -196,8 +196,11 @@ std::string CellText(const Field& field, const void* object)
     ForEachElement(field, object, [&](const void* element) {
         if (!text.empty())
             text += "; ";
-        for (const Field& part : field.group->elements)
-            text += (&part == field.group->elements.data() ? "" : " ") + ScalarText(part, element);
+        for (const Field& part : field.group->elements) {
+            if (&part != field.group->elements.data())
+                text += ' ';
+            text += ScalarText(part, element);
+        }
     });
     return text;
 }

@@ -4,9 +4,11 @@
 
 #include <CLI/CLI.hpp>
 
+#include <algorithm>
 #include <charconv>
 #include <iostream>
 #include <map>
+#include <memory>
 
 namespace {
 
@@ -17,25 +19,43 @@ bool IsNumber(const std::string& text)
     return error == std::errc() && end == text.data() + text.size();
 }
 
-/// What follows the keyword of "set". A value may be negative, so the parser hands over whatever it does not know; a
-/// word behind "--" is a value in any case.
-bool TakeValues(const std::vector<std::string>& words, std::vector<std::string>& values)
+/// The words behind "--" of the command "set", which are values whatever they look like; they leave argv.
+std::vector<std::string> SplitLiterals(int& argc, char** argv)
 {
-    bool options = true;
+    if (argc < 2 || std::string_view(argv[1]) != "set")
+        return {};
+    char** const end = argv + argc;
+    char** const mark = std::find_if(argv, end, [](const char* word) { return std::string_view(word) == "--"; });
+    argc = static_cast<int>(mark - argv);
+    return mark == end ? std::vector<std::string>() : std::vector<std::string>(mark + 1, end);
+}
+
+/// What follows the keyword of "set". A value may be negative, so the parser hands over whatever it does not know.
+bool TakeValues(const std::vector<std::string>& words, const std::vector<std::string>& literals,
+                std::vector<std::string>& values)
+{
     for (const std::string& word : words) {
-        if (options && word == "--") {
-            options = false;
-        } else if (options && word.size() > 1 && word[0] == '-' && !IsNumber(word)) {
+        if (word.size() > 1 && word[0] == '-' && !IsNumber(word)) {
             Complain("There is no option " + word + ". Put -- before values that begin with a dash.", Exit::Usage);
             return false;
-        } else {
-            values.push_back(word);
         }
+        values.push_back(word);
     }
+    values.insert(values.end(), literals.begin(), literals.end());
     if (values.empty())
         Complain("set needs at least one value.", Exit::Usage);
     return !values.empty();
 }
+
+/// The values of "set" are no positionals of the parser's, see TakeValues.
+class SetFormatter : public CLI::Formatter
+{
+public:
+    std::string make_usage(const CLI::App*, std::string) const override
+    {
+        return "Usage: hdkv set [OPTIONS] FILE KEYWORD VALUE...\n";
+    }
+};
 
 struct Arguments
 {
@@ -68,13 +88,14 @@ int main(int argc, char** argv)
     get->add_option("FILE", a.file, "HD parameter file")->required();
     get->add_option("KEYWORD", a.keyword, "Keyword, or Section/Keyword")->required();
 
-    CLI::App* const set = app.add_subcommand("set", "Change a global value: FILE KEYWORD VALUE...");
+    CLI::App* const set = app.add_subcommand("set", "Change a global value");
     set->add_option("FILE", a.file, "HD parameter file")->required();
     set->add_option("KEYWORD", a.keyword, "Keyword, or Section/Keyword")->required();
     set->add_option("-o,--output", a.out, "Write here instead of over FILE");
     set->allow_extras();
-    set->footer("VALUE... follow the keyword, one a parameter: numbers, true or false, texts; lists begin with their\n"
-                "count. Comments of the file are not kept.");
+    set->formatter(std::make_shared<SetFormatter>());
+    set->footer("One value a parameter: numbers, true or false, texts; lists begin with their\n"
+                "count; words behind -- are values even with a leading dash. Comments of the file are not kept.");
 
     CLI::App* const fmt = app.add_subcommand("fmt", "Rewrite a file in canonical form, every record included");
     fmt->add_option("FILE", a.file, "HD parameter file")->required();
@@ -85,6 +106,7 @@ int main(int argc, char** argv)
     CLI::App* const create = app.add_subcommand("new", "Write a new file with default values");
     create->add_option("FILE", a.file, "HD parameter file, which must not exist")->required();
 
+    const std::vector<std::string> literals = SplitLiterals(argc, argv);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
@@ -99,7 +121,7 @@ int main(int argc, char** argv)
         code = Show(a.file, a.list, a.format);
     else if (get->parsed())
         code = Get(a.file, a.keyword);
-    else if (set->parsed() && TakeValues(set->remaining(), values))
+    else if (set->parsed() && TakeValues(set->remaining(), literals, values))
         code = Set(a.file, a.keyword, values, a.out);
     else if (fmt->parsed())
         code = Fmt(a.file, a.out, a.checkOnly);

@@ -1,13 +1,12 @@
 #include "data/extra_params.h"
 
-void ExtraParams::ReadBehind(tqlHandle keyword, int first, int count)
+void ExtraParams::ReadFrom(tqlHandle first)
 {
     Clear();
-    if (first > count)
+    if (!first)
         return;
     m_values = std::make_unique<Values>();
-    for (int number = first; number <= count; ++number) {
-        const tqlHandle param = tqlParamByNum(keyword, number);
+    for (tqlHandle param = first; param; param = tqlNextParam(param)) {
         Value& value = m_values->emplace_back(Value{tqlGetType(param), {}});
         switch (value.type) {
         case TqlType::Int:

@@ -23,11 +23,11 @@ public:
 
     bool IsEmpty() const { return !m_values; }
     void Clear() { m_values.reset(); }
-    /// Takes parameters `first` to `count` of the keyword; none when `first` is past `count`.
-    void Read(tqlHandle keyword, int first, int count)
+    /// Takes the parameter and all behind it in its keyword; null for none.
+    void Read(tqlHandle first)
     {
-        if (first <= count || m_values)
-            ReadBehind(keyword, first, count);
+        if (first || m_values)
+            ReadFrom(first);
     }
     /// Appends them to the keyword being written.
     void Write(tqlHandle structure) const
@@ -45,7 +45,7 @@ private:
     using Values = std::vector<Value>;
 
     std::unique_ptr<Values> Copy() const { return m_values ? std::make_unique<Values>(*m_values) : nullptr; }
-    void ReadBehind(tqlHandle keyword, int first, int count);
+    void ReadFrom(tqlHandle first);
     void WriteAll(tqlHandle structure) const;
 
     std::unique_ptr<Values> m_values; // null when there are none

@@ -6,14 +6,16 @@
 
 namespace {
 
-void ReadDateTime(tqlHandle keyword, int first, HDDateTime& value)
+void ReadDateTime(ParamCursor& params, HDDateTime& value)
 {
     HDDateTime read;
-    std::int32_t* const parts[] = {&read.Year, &read.Month, &read.Day, &read.Hour, &read.Minute, &read.Second};
-    for (int i = 0; i < 6; ++i)
-        if (!tqlGetInt(tqlParamByNum(keyword, first + i), parts[i]))
-            return; // a date made of halves would be neither the old nor the new one
-    value = read;
+    bool whole = true; // a date made of halves would be neither the old nor the new one
+    for (std::int32_t* const part : {&read.Year, &read.Month, &read.Day, &read.Hour, &read.Minute, &read.Second}) {
+        whole &= tqlGetInt(params.param, part);
+        params.Next();
+    }
+    if (whole)
+        value = read;
 }
 
 void WriteDateTime(tqlHandle structure, const HDDateTime& value)
@@ -22,21 +24,21 @@ void WriteDateTime(tqlHandle structure, const HDDateTime& value)
         tqlAddInt(structure, part);
 }
 
-/// Number of the parameter behind the group, past the end when the count does not fit.
-int ReadGroup(tqlHandle keyword, int number, int count, const GroupAccess& group, void* container)
+void ReadGroup(ParamCursor& params, const GroupAccess& group, void* container)
 {
     std::int32_t elements = 0;
-    if (!tqlGetInt(tqlParamByNum(keyword, number), &elements) || !CountFits(group, elements, count - number))
-        return count + 1;
-    ++number;
-    const int size = static_cast<int>(ParamsOf(group.elements));
+    if (!tqlGetInt(params.param, &elements) || !CountFits(group, elements, params.Left() - 1)) {
+        params.ToEnd();
+        return;
+    }
+    params.Next();
     group.resize(container, 0); // new elements start with their defaults
     group.resize(container, static_cast<std::size_t>(elements));
-    for (std::int32_t i = 0; i < elements; ++i, number += size)
-        ReadFields(keyword, number, count, group.elements, group.at(container, static_cast<std::size_t>(i)));
-    if (elements == 0 && group.padWhenEmpty && count - number + 1 >= size)
-        number += size;
-    return number;
+    for (std::int32_t i = 0; i < elements; ++i)
+        ReadFields(params, group.elements, group.at(container, static_cast<std::size_t>(i)));
+    const int size = static_cast<int>(ParamsOf(group.elements));
+    if (elements == 0 && group.padWhenEmpty && params.Left() >= size)
+        params.Skip(size);
 }
 
 /// The element that stands for "none" where a keyword may not end with its count.
@@ -115,39 +117,36 @@ bool CountFits(const GroupAccess& group, std::int32_t count, int paramsLeft)
     return count >= 0 && count <= paramsLeft / static_cast<int>(ParamsOf(group.elements));
 }
 
-int ReadFields(tqlHandle keyword, int first, int count, FieldList fields, void* object)
+void ReadFields(ParamCursor& params, FieldList fields, void* object)
 {
-    int number = first;
     for (const Field& field : fields) {
-        if (number > count)
+        if (!params.param)
             break; // an optional tail, or an older file
         void* const value = field.address(object);
-        const tqlHandle param = tqlParamByNum(keyword, number);
         switch (field.kind) {
         case FieldKind::Number:
-            tqlGetDouble(param, static_cast<double*>(value));
+            tqlGetDouble(params.param, static_cast<double*>(value));
             break;
         case FieldKind::Integer:
         case FieldKind::Choice:
-            tqlGetInt(param, static_cast<std::int32_t*>(value));
+            tqlGetInt(params.param, static_cast<std::int32_t*>(value));
             break;
         case FieldKind::Boolean:
-            tqlGetBool(param, static_cast<bool*>(value));
+            tqlGetBool(params.param, static_cast<bool*>(value));
             break;
         case FieldKind::Text:
         case FieldKind::FileName:
-            tqlGetString(param, static_cast<std::string*>(value));
+            tqlGetString(params.param, static_cast<std::string*>(value));
             break;
         case FieldKind::DateTime:
-            ReadDateTime(keyword, number, *static_cast<HDDateTime*>(value));
-            break;
+            ReadDateTime(params, *static_cast<HDDateTime*>(value));
+            continue;
         case FieldKind::Group:
-            number = ReadGroup(keyword, number, count, *field.group, value);
-            break;
+            ReadGroup(params, *field.group, value);
+            continue;
         }
-        number += static_cast<int>(field.FixedParams());
+        params.Next();
     }
-    return number;
 }
 
 void WriteFields(tqlHandle structure, FieldList fields, const void* object)

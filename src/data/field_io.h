@@ -10,11 +10,36 @@ std::size_t ParamsOf(FieldList fields);
 /// Whether `count` elements of the group fit into the parameters that are left in its keyword.
 bool CountFits(const GroupAccess& group, std::int32_t count, int paramsLeft);
 
-/// Reads parameters from number `first` on into the object, by number. What is missing or of another type keeps its
+/// Walks the parameters of one keyword.
+struct ParamCursor
+{
+    tqlHandle param; // null behind the last
+    int number = 1;
+    int count;
+
+    explicit ParamCursor(tqlHandle keyword) : param(tqlParamByNum(keyword, 1)), count(tqlGetNoParams(keyword)) {}
+    int Left() const { return count - number + 1; }
+    void Next()
+    {
+        param = tqlNextParam(param);
+        ++number;
+    }
+    void Skip(int params)
+    {
+        for (; params > 0 && param; --params)
+            Next();
+    }
+    void ToEnd()
+    {
+        param = nullptr;
+        number = count + 1;
+    }
+};
+
+/// Reads parameters into the object and leaves the cursor behind them. What is missing or of another type keeps its
 /// value. A group whose count does not fit the parameters that are there keeps its elements, and nothing behind it can
-/// be told apart, so reading ends. `count` is the number of the keyword's parameters. Returns the number of the first
-/// parameter that no field stands for.
-int ReadFields(tqlHandle keyword, int first, int count, FieldList fields, void* object);
+/// be told apart, so reading ends.
+void ReadFields(ParamCursor& params, FieldList fields, void* object);
 
 /// Appends the object's parameters to the keyword being written.
 void WriteFields(tqlHandle structure, FieldList fields, const void* object);

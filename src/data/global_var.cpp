@@ -12,11 +12,10 @@ void LoadItems(tqlHandle section, const GroupAccess& group, void* container)
     group.resize(container, 0); // new elements start with their defaults
     group.resize(container, static_cast<std::size_t>(count));
     for (int number = 1; number <= count; ++number) {
-        const tqlHandle keyword = tqlKeywordByNameNum(section, HDItemKeyword, number);
         void* const element = group.at(container, static_cast<std::size_t>(number - 1));
-        const int params = tqlGetNoParams(keyword);
-        const int next = ReadFields(keyword, 1, params, group.elements, element);
-        group.extra(element)->Read(keyword, next, params);
+        ParamCursor params(tqlKeywordByNameNum(section, HDItemKeyword, number));
+        ReadFields(params, group.elements, element);
+        group.extra(element)->Read(params.param);
     }
 }
 
@@ -48,10 +47,10 @@ void HD_Global_Var::LoadSection(tqlHandle section, const GlobalSection& table)
         const tqlHandle keyword = tqlKeywordByNameNum(section, row.name, 1);
         if (!keyword || (!row.onlyWith.empty() && !tqlKeywordByNameNum(section, row.onlyWith, 1)))
             continue;
-        const int params = tqlGetNoParams(keyword);
-        const int next = ReadFields(keyword, 1, params, row.Fields(), this);
+        ParamCursor params(keyword);
+        ReadFields(params, row.Fields(), this);
         ExtraParams extra;
-        extra.Read(keyword, next, params);
+        extra.Read(params.param);
         if (extra.IsEmpty())
             m_extra.erase(&row);
         else

@@ -82,14 +82,14 @@ Match MatchType(FieldKind kind, TqlType type)
 class Checker
 {
 public:
-    explicit Checker(std::vector<Finding>& findings) : m_findings(findings) {}
+    Checker(tqlHandle structure, std::vector<Finding>& findings) : m_structure(structure), m_findings(findings) {}
 
-    void CheckStructure(tqlHandle structure);
+    void CheckStructure();
 
 private:
     void Add(tqlHandle node, std::string text, bool loses = false)
     {
-        const TqlPosition position = tqlGetPosition(node);
+        const TqlPosition position = tqlGetPosition(m_structure, node);
         m_findings.push_back({position.line, position.column, std::move(text), loses});
     }
     void CheckUnknown(tqlHandle section, const KnownNames& known);
@@ -102,22 +102,21 @@ private:
 
     /// Checks the parameters of a keyword that belongs to `owner` (a keyword's or a section's name).
     void CheckKeyword(tqlHandle keyword, std::string_view owner, FieldList location, FieldList fields);
-    /// From parameter `number` on; the number behind the last one that a field stands for, 0 when that cannot be told.
-    int CheckFields(FieldList fields, int number);
-    int CheckGroup(const Field& field, int number);
-    void CheckDate(const Field& field, int number);
-    bool CheckType(const Field& field, int number);
+    /// These leave the cursor behind what they checked; false when the rest of the keyword cannot be told apart.
+    bool CheckFields(FieldList fields, ParamCursor& params);
+    bool CheckGroup(const Field& field, ParamCursor& params);
+    void CheckDate(const Field& field, ParamCursor& params);
+    bool CheckType(const Field& field, const ParamCursor& params);
 
+    tqlHandle m_structure;
     std::vector<Finding>& m_findings;
-    // The keyword at hand.
-    tqlHandle m_keyword = nullptr;
+    tqlHandle m_keyword = nullptr; // the one at hand, and whose it is
     std::string_view m_owner;
-    int m_count = 0;
 };
 
-void Checker::CheckStructure(tqlHandle structure)
+void Checker::CheckStructure()
 {
-    const tqlHandle target = tqlTargetByNameNum(structure, HDTargetName, 1);
+    const tqlHandle target = tqlTargetByNameNum(m_structure, HDTargetName, 1);
     if (!target) {
         m_findings.push_back({1, 1, std::string("there is no target [") + HDTargetName + "]", true});
         return;
@@ -133,7 +132,7 @@ void Checker::CheckStructure(tqlHandle structure)
             CheckEncroachment(section);
     }
     CheckUnknown(target, &HDKnownSection);
-    CheckUnknown(structure, &HDKnownTarget);
+    CheckUnknown(m_structure, &HDKnownTarget);
 }
 
 void Checker::CheckUnknown(tqlHandle section, const KnownNames& known)
@@ -219,95 +218,85 @@ void Checker::CheckKeyword(tqlHandle keyword, std::string_view owner, FieldList 
 {
     m_keyword = keyword;
     m_owner = owner;
-    m_count = tqlGetNoParams(keyword);
-    int next = CheckFields(location, 1);
-    if (next)
-        next = CheckFields(fields, next);
-    if (next && next <= m_count)
-        Add(tqlParamByNum(keyword, next),
-            std::string(owner) + ": unknown parameters from number " + std::to_string(next) + " on");
+    ParamCursor params(keyword);
+    if (CheckFields(location, params) && CheckFields(fields, params) && params.param)
+        Add(params.param,
+            std::string(owner) + ": unknown parameters from number " + std::to_string(params.number) + " on");
 }
 
-int Checker::CheckFields(FieldList fields, int number)
+bool Checker::CheckFields(FieldList fields, ParamCursor& params)
 {
     bool inTail = false; // an optional tail is there whole or not at all
     for (const Field& field : fields) {
-        if (number > m_count) {
+        if (!params.param) {
             if (field.optionalTail && !inTail)
-                return number;
+                return true;
             const bool last = &field == &fields.back();
-            Add(m_keyword, std::string(m_owner) + ": parameter " + std::to_string(number) + " (" +
-                               std::string(field.name) + ") " +
-                               (last ? "is missing" : "and those behind it are missing"));
-            return 0;
+            Add(m_keyword, std::string(m_owner) + ": parameter " + std::to_string(params.number) + " (" +
+                               std::string(field.name) + (last ? ") is missing" : ") and those behind it are missing"));
+            return false;
         }
         inTail = field.optionalTail;
         if (field.kind == FieldKind::Group) {
-            number = CheckGroup(field, number);
-            if (!number)
-                return 0;
+            if (!CheckGroup(field, params))
+                return false;
         } else if (field.kind == FieldKind::DateTime) {
-            CheckDate(field, number);
-            number += 6;
+            CheckDate(field, params);
         } else {
-            CheckType(field, number++);
+            CheckType(field, params);
+            params.Next();
         }
     }
-    return number;
+    return true;
 }
 
-int Checker::CheckGroup(const Field& field, int number)
+bool Checker::CheckGroup(const Field& field, ParamCursor& params)
 {
-    if (!CheckType(field, number))
-        return 0;
-    const tqlHandle param = tqlParamByNum(m_keyword, number);
     std::int32_t count = 0;
-    tqlGetInt(param, &count);
-    if (!CountFits(*field.group, count, m_count - number)) {
-        Add(param,
+    if (!CheckType(field, params) || !tqlGetInt(params.param, &count))
+        return false;
+    const int left = params.Left() - 1;
+    if (!CountFits(*field.group, count, left)) {
+        Add(params.param,
             std::string(m_owner) + ": the count " + std::to_string(count) + " of " + std::string(field.name) +
-                " does not fit the " + std::to_string(m_count - number) + " parameters behind it",
+                " does not fit the " + std::to_string(left) + " parameters behind it",
             true);
-        return 0;
+        return false;
     }
-    ++number;
+    params.Next();
     const int size = static_cast<int>(ParamsOf(field.group->elements));
-    if (count == 0 && field.group->padWhenEmpty && m_count - number + 1 >= size)
-        return number + size;
-    for (std::int32_t i = 0; i < count; ++i, number += size)
-        CheckFields(field.group->elements, number);
-    return number;
+    if (count == 0 && field.group->padWhenEmpty && left >= size)
+        params.Skip(size);
+    for (std::int32_t i = 0; i < count; ++i)
+        CheckFields(field.group->elements, params);
+    return true;
 }
 
-void Checker::CheckDate(const Field& field, int number)
+void Checker::CheckDate(const Field& field, ParamCursor& params)
 {
-    HDDateTime date;
-    std::int32_t* const parts[] = {&date.Year, &date.Month, &date.Day, &date.Hour, &date.Minute, &date.Second};
-    for (int i = 0; i < 6; ++i) {
-        if (number + i > m_count) {
-            Add(m_keyword,
-                std::string(m_owner) + ": " + std::string(field.name) + " needs six integers from parameter " +
-                    std::to_string(number) + " on",
-                true);
-            return;
-        }
-        if (!CheckType(field, number + i))
-            return;
-        tqlGetInt(tqlParamByNum(m_keyword, number + i), parts[i]);
+    const tqlHandle first = params.param;
+    if (params.Left() < 6) {
+        Add(first, std::string(m_owner) + ": " + std::string(field.name) + " needs six integers", true);
+        params.ToEnd();
+        return;
     }
-    if (!date.IsValid())
-        Add(tqlParamByNum(m_keyword, number),
-            std::string(m_owner) + ": the six integers of " + std::string(field.name) + " are no date and time");
+    HDDateTime date;
+    bool whole = true;
+    for (std::int32_t* const part : {&date.Year, &date.Month, &date.Day, &date.Hour, &date.Minute, &date.Second}) {
+        whole = CheckType(field, params) && tqlGetInt(params.param, part) && whole;
+        params.Next();
+    }
+    if (whole && !date.IsValid())
+        Add(first, std::string(m_owner) + ": the six integers of " + std::string(field.name) + " are no date and time");
 }
 
-bool Checker::CheckType(const Field& field, int number)
+bool Checker::CheckType(const Field& field, const ParamCursor& params)
 {
-    const tqlHandle param = tqlParamByNum(m_keyword, number);
-    const TqlType type = tqlGetType(param);
+    const TqlType type = tqlGetType(params.param);
     const Match match = MatchType(field.kind, type);
     if (match != Match::Fits)
-        Add(param,
-            std::string(m_owner) + ": parameter " + std::to_string(number) + " (" + std::string(field.name) +
+        Add(params.param,
+            std::string(m_owner) + ": parameter " + std::to_string(params.number) + " (" + std::string(field.name) +
                 ") should be " + KindText(field.kind) + ", found " + TypeText(type),
             match == Match::No);
     return match != Match::No;
@@ -318,7 +307,7 @@ bool Checker::CheckType(const Field& field, int number)
 std::vector<Finding> CheckHDStructure(tqlHandle structure)
 {
     std::vector<Finding> findings;
-    Checker(findings).CheckStructure(structure);
+    Checker(structure, findings).CheckStructure();
     std::ranges::stable_sort(findings, {}, [](const Finding& f) { return std::pair(f.line, f.column); });
     return findings;
 }

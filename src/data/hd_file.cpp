@@ -39,5 +39,8 @@ std::string HDFileText(const HD_Parameters& parameters, bool everySet)
 Result<void> SaveHDFile(const HD_Parameters& parameters, const std::string& path, const SaveOptions& options)
 {
     const TqlStructure structure = Build(parameters, options.everySet);
-    return WriteFileSafely(path, tqlGetText(structure.Get()), {.sync = options.sync});
+    const std::string_view text = tqlGetText(structure.Get());
+    if (text.empty()) // the library refuses what no reader could take back
+        return Error{"Could not write \"" + path + "\": the content cannot be expressed in a parameter file."};
+    return WriteFileSafely(path, text, {.sync = options.sync});
 }

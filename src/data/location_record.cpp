@@ -13,11 +13,13 @@ void WriteRecord(tqlHandle structure, const HD_RiverPos& record, FieldList field
 
 void ReadRecord(tqlHandle keyword, HD_RiverPos& record, FieldList fields)
 {
-    tqlGetString(tqlParamByNum(keyword, 1), &record.RiverName);
-    tqlGetDouble(tqlParamByNum(keyword, 2), &record.Chainage);
-    const int count = tqlGetNoParams(keyword);
-    const int next = ReadFields(keyword, 3, count, fields, &record);
-    record.Extra.Read(keyword, next, count);
+    ParamCursor params(keyword);
+    tqlGetString(params.param, &record.RiverName);
+    params.Next();
+    tqlGetDouble(params.param, &record.Chainage);
+    params.Next();
+    ReadFields(params, fields, &record);
+    record.Extra.Read(params.param);
 }
 
 FieldList LocationFields()
