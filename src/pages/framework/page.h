@@ -1,6 +1,9 @@
 // Base of every page of the sheet.
 #pragma once
 
+#include "data/global_var.h"
+#include "ks/units/edit_style.h"
+#include "pages/framework/binding.h"
 #include "pages/framework/page_host.h"
 
 #include <QString>
@@ -43,13 +46,45 @@ public:
     virtual void OnGridCellModified(int row, int column);
     virtual void OnGridButtonClicked(int row, int column);
 
+    /// Takes what is being typed, then undoes or redoes one step of the document.
+    void UndoRedo(bool undo);
+
     /// The page comes to the front: menus, then LoadFromDocument.
     virtual void OnSetActive();
     /// The page is about to be left; false keeps it (a field holds something wrong).
     virtual bool OnKillActive();
 
+protected:
+    /// Texts again, in the user's language; the dialog's own texts are the concrete page's.
+    virtual void Retranslate() {}
+
+    // Binding controls to values of the document: a line a control. The member is one of HD_Global_Var; a value inside
+    // a nested struct is bound by reference.
+    template <typename Widget, typename T, typename... Options>
+    void Bind(Widget* control, T HD_Global_Var::*member, Options&&... options)
+    {
+        m_bindings.Add(control, Globals().*member, std::forward<Options>(options)...);
+    }
+    void Bind(CCtrlEdit* field, double HD_Global_Var::*member, const FieldOptions& options)
+    {
+        m_bindings.Add(field, Globals().*member, options);
+    }
+    void Bind(std::initializer_list<QRadioButton*> buttons, std::int32_t HD_Global_Var::*member)
+    {
+        m_bindings.Add(buttons, Globals().*member);
+    }
+    CBindings& Bindings() { return m_bindings; }
+    HD_Global_Var& Globals() const;
+
+    void changeEvent(QEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+
 private:
+    void UnitsChanged();
+
     CKavo0_hdDoc* m_document;
     IPageHost* m_host = nullptr;
     CGenGrid* m_grid = nullptr;
+    CBindings m_bindings;
+    KsUnitSystem m_shownUnits; // what the texts on the page are in
 };

@@ -1,0 +1,72 @@
+#include "module/list_commands.h"
+
+#include "module/document.h"
+#include "res/strings.h"
+
+#include <algorithm>
+
+CDocumentCommand::CDocumentCommand(CKavo0_hdDoc& document, const QString& text) : m_document(document)
+{
+    setText(text);
+}
+
+void CDocumentCommand::Run(bool forward)
+{
+    const ChangePlace place = forward ? Apply() : Revert();
+    m_document.UpdateAll(nullptr, Hint::Reload, nullptr);
+    // The first time the change comes from what the user is looking at.
+    if (m_repeated)
+        emit m_document.Reveal(place.list, place.row, place.column);
+    m_repeated = true;
+}
+
+CInsertLines::CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row,
+                           std::unique_ptr<IRowBlock> lines)
+    : CDocumentCommand(document, LoadString(Str::UndoInsert)),
+      m_rows(std::move(rows)),
+      m_row(row),
+      m_count(lines->Count()),
+      m_lines(std::move(lines))
+{
+}
+
+ChangePlace CInsertLines::Apply()
+{
+    m_row = m_rows->Put(m_row, std::move(m_lines));
+    return {m_rows->List(), int(m_row) + 1, 1};
+}
+
+ChangePlace CInsertLines::Revert()
+{
+    m_lines = m_rows->Take(m_row, m_count);
+    return {m_rows->List(), int(std::min(m_row + 1, m_rows->Count())), 1};
+}
+
+CDeleteLines::CDeleteLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count,
+                           std::unique_ptr<IRowBlock> replacement)
+    : CDocumentCommand(document, LoadString(Str::UndoDelete)),
+      m_rows(std::move(rows)),
+      m_row(row),
+      m_count(count),
+      m_replacement(std::move(replacement))
+{
+}
+
+ChangePlace CDeleteLines::Apply()
+{
+    for (std::size_t i = 0; i < m_count; ++i)
+        m_rows->Touch(m_rows->KeyAt(m_row + i));
+    m_lines = m_rows->Take(m_row, m_count);
+    m_replaced = m_rows->Count() == 0 && m_replacement;
+    if (m_replaced)
+        m_rows->Put(0, std::move(m_replacement));
+    return {m_rows->List(), int(std::min(m_row + 1, m_rows->Count())), 1};
+}
+
+ChangePlace CDeleteLines::Revert()
+{
+    if (m_replaced)
+        m_replacement = m_rows->Take(0, 1);
+    m_row = m_rows->Put(m_row, std::move(m_lines));
+    return {m_rows->List(), int(m_row) + 1, 1};
+}

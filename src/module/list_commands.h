@@ -1,0 +1,72 @@
+// Undo commands that change a document: their common base, and the insertion and removal of lines.
+#pragma once
+
+#include "module/row_source.h"
+
+#include <QString>
+#include <QUndoCommand>
+
+class CKavo0_hdDoc;
+
+/// Where a change shows: row and column count from 1; no list for a global value.
+struct ChangePlace
+{
+    CGenList* list = nullptr;
+    int row = 0, column = 0;
+};
+
+/// Every change marks the document modified and reloads the views. A change that undo or redo brings back is also
+/// shown to the user, wherever it is.
+class CDocumentCommand : public QUndoCommand
+{
+public:
+    CDocumentCommand(CKavo0_hdDoc& document, const QString& text);
+    void undo() final { Run(false); }
+    void redo() final { Run(true); }
+
+protected:
+    virtual ChangePlace Apply() = 0;
+    virtual ChangePlace Revert() = 0;
+
+private:
+    void Run(bool forward);
+
+    CKavo0_hdDoc& m_document;
+    bool m_repeated = false;
+};
+
+/// Puts new lines into a list.
+class CInsertLines : public CDocumentCommand
+{
+public:
+    CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row,
+                 std::unique_ptr<IRowBlock> lines);
+
+protected:
+    ChangePlace Apply() override;
+    ChangePlace Revert() override;
+
+private:
+    std::shared_ptr<IRowSource> m_rows;
+    std::size_t m_row, m_count;
+    std::unique_ptr<IRowBlock> m_lines; // while they are not in the list
+};
+
+/// Removes lines from a list. A list that would be left empty gets `replacement`, when there is one.
+class CDeleteLines : public CDocumentCommand
+{
+public:
+    CDeleteLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count,
+                 std::unique_ptr<IRowBlock> replacement = nullptr);
+
+protected:
+    ChangePlace Apply() override;
+    ChangePlace Revert() override;
+
+private:
+    std::shared_ptr<IRowSource> m_rows;
+    std::size_t m_row, m_count;
+    std::unique_ptr<IRowBlock> m_lines;       // while they are out of the list
+    std::unique_ptr<IRowBlock> m_replacement; // while it is not in the list
+    bool m_replaced = false;
+};

@@ -1,0 +1,9 @@
+// A record list as the rows of a grid.
+#pragma once
+
+#include "module/row_source.h"
+
+class CKavo0_hdDoc;
+
+/// `list` is one of the document's lists.
+std::shared_ptr<IRowSource> MakeListRows(CKavo0_hdDoc& document, CGenList& list);

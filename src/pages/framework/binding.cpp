@@ -1,0 +1,143 @@
+#include "pages/framework/binding.h"
+
+#include "ks/units/edit_fields.h"
+#include "module/document.h"
+#include "pages/framework/commands.h"
+#include "pages/framework/ctrl_edit.h"
+#include "res/strings.h"
+
+#include <QButtonGroup>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QLabel>
+#include <QRadioButton>
+
+template <typename T>
+void CBindings::Store(T& target, T value)
+{
+    StoreValue(*m_document, target, value);
+    ApplyRules();
+}
+
+void CBindings::ApplyRules()
+{
+    for (const auto& rule : m_rules)
+        rule();
+}
+
+void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
+{
+    field->Setup(&value, options.textLimit, options.decimals, options.generalNotation, options.unit);
+    field->SetRange(options.minimum.has_value(), options.minimum.value_or(0), options.maximum.has_value(),
+                    options.maximum.value_or(0));
+    field->SetStore([this](double& target, double number) { Store(target, number); });
+    m_show.push_back([field, label = options.unitLabel] {
+        field->Show();
+        if (label)
+            label->setText(field->Style().UnitSymbol());
+    });
+    m_take.push_back([field] { return field->Commit(); });
+}
+
+void CBindings::Add(CKsEditLong* field, std::int32_t& value)
+{
+    m_show.push_back([field, &value] {
+        if (!field->isModified()) // a text that has not been taken yet stays
+            field->SetValue(value);
+    });
+    const auto take = [this, field, &value](std::optional<std::int32_t> typed) {
+        if (!typed)
+            return false;
+        field->setModified(false);
+        Store(value, *typed);
+        return true;
+    };
+    connect(field, &QLineEdit::editingFinished, this, [field, take] {
+        if (field->isModified())
+            take(field->Value()); // what is no integer waits until the page is stored
+    });
+    m_take.push_back([field, take] { return !field->isModified() || take(field->CheckedValue()); });
+}
+
+template <typename T>
+void CBindings::AddFlag(QCheckBox* box, T& value)
+{
+    m_show.push_back([box, &value] { box->setChecked(value != T(0)); });
+    connect(box, &QCheckBox::clicked, this, [this, &value](bool checked) { Store(value, T(checked)); });
+}
+
+void CBindings::Add(QCheckBox* box, bool& value)
+{
+    AddFlag(box, value);
+}
+
+void CBindings::Add(QCheckBox* box, std::int32_t& flag)
+{
+    AddFlag(box, flag);
+}
+
+void CBindings::Add(QComboBox* box, std::int32_t& index)
+{
+    const int entries = box->count();
+    m_show.push_back([box, entries, &index] {
+        while (box->count() > entries)
+            box->removeItem(entries);
+        if (index < 0 || index >= entries)
+            box->addItem(QString::number(index));
+        box->setCurrentIndex(index >= 0 && index < entries ? index : entries);
+    });
+    connect(box, &QComboBox::activated, this, [this, entries, &index](int chosen) {
+        if (chosen < entries)
+            Store(index, std::int32_t(chosen));
+    });
+}
+
+void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& value)
+{
+    auto* group = new QButtonGroup(this);
+    int id = 0;
+    for (QRadioButton* button : buttons)
+        group->addButton(button, id++);
+    m_show.push_back([group, &value] {
+        group->setExclusive(false); // else a pressed button could not be released
+        for (QAbstractButton* button : group->buttons())
+            button->setChecked(group->id(button) == value);
+        group->setExclusive(true);
+    });
+    connect(group, &QButtonGroup::idClicked, this, [this, &value](int chosen) { Store(value, std::int32_t(chosen)); });
+}
+
+void CBindings::AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets,
+                        void (QWidget::*apply)(bool))
+{
+    m_rules.push_back([rule = std::move(rule), widgets = std::vector(widgets), apply] {
+        const bool holds = rule();
+        for (QWidget* widget : widgets)
+            (widget->*apply)(holds);
+    });
+}
+
+void CBindings::EnableWhen(std::function<bool()> rule, std::initializer_list<QWidget*> widgets)
+{
+    AddRule(std::move(rule), widgets, &QWidget::setEnabled);
+}
+
+void CBindings::ShowWhen(std::function<bool()> rule, std::initializer_list<QWidget*> widgets)
+{
+    AddRule(std::move(rule), widgets, &QWidget::setVisible);
+}
+
+void CBindings::Show()
+{
+    for (const auto& show : m_show)
+        show();
+    ApplyRules();
+}
+
+bool CBindings::Take()
+{
+    for (const auto& take : m_take)
+        if (!take())
+            return false;
+    return true;
+}

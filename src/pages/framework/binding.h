@@ -1,0 +1,71 @@
+// Controls bound to values of the document, and rules that enable and show them. The document is written as soon as the
+// user has changed a control, each change being an undo step; nothing is written that nobody changed.
+#pragma once
+
+#include "ks/units/unit_group.h"
+
+#include <QObject>
+#include <cstdint>
+#include <functional>
+#include <initializer_list>
+#include <optional>
+#include <vector>
+
+class CCtrlEdit;
+class CKavo0_hdDoc;
+class CKsEditLong;
+class QCheckBox;
+class QComboBox;
+class QLabel;
+class QRadioButton;
+class QWidget;
+
+/// How a number is edited in a single field.
+struct FieldOptions
+{
+    UnitGroup unit = UnitGroup::None;
+    int decimals = 6;
+    bool generalNotation = true; // false: scientific
+    int textLimit = 20;
+    std::optional<double> minimum = {}, maximum = {}; // base units
+    QLabel* unitLabel = nullptr;                      // shows the unit beside the field
+};
+
+class CBindings : public QObject
+{
+public:
+    explicit CBindings(CKavo0_hdDoc* document) : m_document(document) {}
+
+    // Each value lives in the document, which outlives the page.
+    void Add(CCtrlEdit* field, double& value, const FieldOptions& options);
+    void Add(CKsEditLong* field, std::int32_t& value);
+    void Add(QCheckBox* box, bool& value);
+    void Add(QCheckBox* box, std::int32_t& flag);
+    /// By index of the entry. An index without an entry is kept, and shown as its number.
+    void Add(QComboBox* box, std::int32_t& index);
+    /// Button n stands for the value n. Another value is kept, with no button pressed.
+    void Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& value);
+
+    /// The widgets are enabled, or visible, exactly while the rule holds; it is asked whenever the page is shown
+    /// afresh.
+    void EnableWhen(std::function<bool()> rule, std::initializer_list<QWidget*> widgets);
+    void ShowWhen(std::function<bool()> rule, std::initializer_list<QWidget*> widgets);
+
+    /// Controls show the document's values, and the rules apply.
+    void Show();
+    /// Takes what is being typed; false when a field refuses it (the user has been told).
+    bool Take();
+
+private:
+    template <typename T>
+    void Store(T& target, T value);
+    void ApplyRules();
+    template <typename T>
+    void AddFlag(QCheckBox* box, T& value);
+    void AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets, void (QWidget::*apply)(bool));
+
+    CKavo0_hdDoc* m_document;
+    std::vector<std::function<void()>> m_show;
+    std::vector<std::function<bool()>> m_take;
+    std::vector<std::function<void()>> m_rules;
+};

@@ -1,0 +1,58 @@
+#include "pages/framework/cell_text.h"
+
+#include "data/river_pos.h"
+#include "pages/framework/number_syntax.h"
+#include "res/strings.h"
+
+namespace {
+
+bool IsEmpty(const ColumnSpec& column, const CellValue& value)
+{
+    if (std::holds_alternative<std::monostate>(value))
+        return true;
+    const auto* number = std::get_if<double>(&value);
+    return number && column.emptyIsNotGiven && *number == NotGiven;
+}
+
+} // namespace
+
+QString ShownText(const ColumnSpec& column, const CellValue& value)
+{
+    const auto* number = std::get_if<double>(&value);
+    if (!number || IsEmpty(column, value))
+        return EditText(column, value);
+    // Two steps: the style's format says how much of the number the page shows at all, the editor how it looks.
+    const QString styled = column.style.UnitConvertFromBase_T(*number, 1);
+    const auto read = ReadNumber(styled.toStdString());
+    if (!read)
+        return styled; // no finite number
+    return KsFormatNumber(QStringLiteral("%-.%1lf").arg(FindControl(column.control).decimals), *read);
+}
+
+QString EditText(const ColumnSpec& column, const CellValue& value)
+{
+    if (IsEmpty(column, value))
+        return {};
+    if (const auto* number = std::get_if<double>(&value))
+        return KsShortestNumber(column.style.UnitConvertFromBase(*number, 1));
+    if (const auto* integer = std::get_if<std::int32_t>(&value))
+        return QString::number(*integer);
+    return QString::fromStdString(std::get<std::string>(value));
+}
+
+CellReading ReadCell(const ColumnSpec& column, const QString& text)
+{
+    if (column.Kind() == CellKind::Text)
+        return {text.toUpper().toStdString(), {}};
+    if (text.isEmpty())
+        return {};
+    if (column.Kind() == CellKind::Integer) {
+        bool isInteger = false;
+        const std::int32_t value = text.toInt(&isInteger);
+        return isInteger ? CellReading{value, {}} : CellReading{{}, LoadString(Str::IntegerRequired)};
+    }
+    const auto number = ReadNumber(text.toStdString());
+    if (!number)
+        return {{}, LoadString(Str::GridNumberRequired)};
+    return {column.style.UnitConvertFromBase(*number, 0), {}};
+}

@@ -1,0 +1,54 @@
+// The single-value field: a number of the document, shown in the user's unit.
+#pragma once
+
+#include "ks/units/edit_style.h"
+
+#include <QLineEdit>
+#include <functional>
+
+class CCtrlEdit : public QLineEdit
+{
+    Q_OBJECT
+public:
+    explicit CCtrlEdit(QWidget* parent = nullptr);
+
+    /// Binds the field to a number of the document, in base units, and shows it. `decimals` are significant digits in
+    /// general notation and digits behind the point in scientific notation. `unit` below 0 is the user's unit.
+    void Setup(double* value, int textLimit, int decimals, bool generalNotation, UnitGroup group, int unit = -1);
+    /// Bounds of what may be typed, in base units.
+    void SetRange(bool hasMinimum, double minimum, bool hasMaximum, double maximum);
+    /// How an accepted number gets into the document; without it the bound value is simply set.
+    void SetStore(std::function<void(double& target, double value)> store) { m_store = std::move(store); }
+
+    /// Stores into the bound value and shows it.
+    void SetValue(double value);
+    /// Shows the bound value and unit as they are now. A text being typed stays.
+    void Show();
+    const CKsEditStyle& Style() const { return m_style; }
+
+    /// Leaving the field: takes the text. False when it is no number or out of range; the user has been told, the field
+    /// has the focus and the value is what it was. A text that nobody changed changes nothing.
+    bool Commit();
+
+protected:
+    bool event(QEvent* event) override;
+    void focusOutEvent(QFocusEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+
+private:
+    bool IsTyped() const { return isModified() && text() != m_shown; }
+    void ShowValue();
+    bool Refuse(const QString& message);
+
+    CKsEditStyle m_style;
+    UnitGroup m_group = UnitGroup(999);
+    int m_unit = -1;
+    int m_textLimit = 0, m_decimals = 0;
+    bool m_generalNotation = true;
+    double* m_value = nullptr;
+    bool m_hasMinimum = false, m_hasMaximum = false;
+    double m_minimum = 0, m_maximum = 0;
+    std::function<void(double&, double)> m_store;
+    QString m_shown;       // the text as last shown
+    bool m_warned = false; // during the present event
+};

@@ -1,0 +1,338 @@
+#include "pages/framework/gen_grid.h"
+
+#include "ks/language/language.h"
+#include "module/document.h"
+#include "pages/framework/grid_editors.h"
+#include "pages/framework/grid_keys.h"
+#include "pages/framework/page.h"
+
+#include <QContextMenuEvent>
+#include <QHeaderView>
+#include <QMenu>
+#include <QScrollBar>
+#include <QUndoStack>
+#include <algorithm>
+
+namespace {
+
+constexpr int NumberColumnWidth = 40;
+constexpr double OriginalFontHeight = 13; // pixels; the columns' widths are meant for it
+
+double FontScale(const QWidget& widget)
+{
+    return std::max(1.0, widget.fontMetrics().height() / OriginalFontHeight);
+}
+
+} // namespace
+
+CGenGrid::CGenGrid(QWidget* parent)
+    : QTableView(parent), m_model(new CGridModel(this)), m_delegate(new CGridDelegate(this))
+{
+    setFont(KsLangGetUserFont());
+    setModel(m_model);
+    setItemDelegate(m_delegate);
+    setTabKeyNavigation(false); // the key table moves
+    setEditTriggers(DoubleClicked | EditKeyPressed | AnyKeyPressed);
+    setSelectionMode(ContiguousSelection);
+    setHorizontalScrollMode(ScrollPerPixel);
+    setWordWrap(false);
+    verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    verticalHeader()->setHighlightSections(false);
+    UpdateRowHeader();
+    horizontalHeader()->setHighlightSections(false);
+    // A click on a header moves the current cell as one on a cell does.
+    for (QWidget* part : {verticalHeader()->viewport(), horizontalHeader()->viewport()})
+        part->installEventFilter(this);
+    connect(m_model, &CGridModel::CellModified, this, &CGenGrid::CellModified);
+}
+
+CGenGrid::~CGenGrid() = default;
+
+void CGenGrid::SetOwnerPage(CGenPropertyPage* page)
+{
+    m_page = page;
+    page->SetGrid(this);
+}
+
+IPageHost* CGenGrid::Host() const
+{
+    return m_page ? m_page->GetHost() : nullptr;
+}
+
+QStringList CGenGrid::BranchNames() const
+{
+    return Host() ? Host()->BranchNames() : QStringList();
+}
+
+QString CGenGrid::TextAt(int row, int column) const
+{
+    return m_model->index(row - 1, column - 1).data().toString();
+}
+
+void CGenGrid::UpdateRowHeader()
+{
+    const int height = fontMetrics().height() + 8;
+    if (verticalHeader()->defaultSectionSize() != height) // setting it visits every row
+        verticalHeader()->setDefaultSectionSize(height);
+    const int numbers = fontMetrics().horizontalAdvance(QString::number(std::max(RowCount(), 100))) + 12;
+    const int width = std::max(int(NumberColumnWidth * FontScale(*this)), numbers);
+    if (verticalHeader()->width() != width)
+        verticalHeader()->setFixedWidth(width);
+}
+
+void CGenGrid::SetColumnWidths()
+{
+    m_widthsSet = true;
+    for (int column = 0; column < ColumnCount(); ++column) {
+        const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
+        const int header = fontMetrics().horizontalAdvance(spec.header()) + 16;
+        setColumnWidth(column, std::max(int(spec.width * FontScale(*this)), header));
+    }
+}
+
+void CGenGrid::Reload()
+{
+    m_model->Sync();
+    UpdateRowHeader();
+    if (!m_widthsSet) // afterwards they are the user's
+        SetColumnWidths();
+    if (!currentIndex().isValid() && RowCount() > 0)
+        setCurrentIndex(m_model->index(0, 0));
+}
+
+void CGenGrid::SetCurrentCell(int row, int column)
+{
+    const QModelIndex index = m_model->index(std::clamp(row, 1, std::max(1, RowCount())) - 1, std::max(1, column) - 1);
+    setCurrentIndex(index);
+    scrollTo(index);
+}
+
+// ---- editing -----------------------------------------------------------------------------------
+
+bool CGenGrid::CommitEditor()
+{
+    return m_delegate->Commit();
+}
+
+void CGenGrid::CellModified(int row, int column)
+{
+    m_modifiedColumn = m_modified ? std::min(m_modifiedColumn, column) : column;
+    m_modified = true;
+    if (m_page)
+        m_page->OnGridCellModified(row, column);
+}
+
+void CGenGrid::StoreEditedLine()
+{
+    if (!m_modified)
+        return;
+    m_modified = false;
+    if (auto* host = Host()) {
+        host->EditedLineChanged(m_locationOnAnyColumn ? 1 : m_modifiedColumn);
+    } else if (m_page) {
+        m_page->StoreToDocument();
+        m_page->LoadFromDocument(m_page->GetDocument());
+    }
+}
+
+void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& previous)
+{
+    QTableView::currentChanged(current, previous); // closes an editor, whose text the cell takes
+    StoreEditedLine();
+    m_lastColumn = current.column() + 1;
+    const int row = current.row() + 1;
+    if (row == m_lastRow)
+        return;
+    m_lastRow = row;
+    if (row != 0 && Host())
+        Host()->CurrentLocationChanged(row);
+}
+
+void CGenGrid::focusOutEvent(QFocusEvent* event)
+{
+    QTableView::focusOutEvent(event);
+    // Whatever is edited next reloads the rows, so the line is stored first.
+    if (event->reason() != Qt::PopupFocusReason && event->reason() != Qt::ActiveWindowFocusReason &&
+        !isAncestorOf(QApplication::focusWidget()))
+        StoreEditedLine();
+}
+
+void CGenGrid::mousePressEvent(QMouseEvent* event)
+{
+    if (CommitEditor())
+        QTableView::mousePressEvent(event);
+}
+
+bool CGenGrid::eventFilter(QObject* object, QEvent* event)
+{
+    if (event->type() == QEvent::MouseButtonPress && object != viewport() && !CommitEditor())
+        return true;
+    return QTableView::eventFilter(object, event);
+}
+
+void CGenGrid::changeEvent(QEvent* event)
+{
+    QTableView::changeEvent(event);
+    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) {
+        UpdateRowHeader();
+        SetColumnWidths();
+    }
+}
+
+// ---- keys --------------------------------------------------------------------------------------
+
+bool CGenGrid::event(QEvent* event)
+{
+    // The grid's own keys come before menu shortcuts of the same name.
+    if (event->type() == QEvent::ShortcutOverride && FindGridKey(*static_cast<QKeyEvent*>(event))) {
+        event->accept();
+        return true;
+    }
+    // Tab is a cell move here, which QWidget would take for a change of focus.
+    if (event->type() == QEvent::KeyPress) {
+        if (const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event))) {
+            Run(key->action);
+            event->accept();
+            return true;
+        }
+    }
+    return QTableView::event(event);
+}
+
+void CGenGrid::Run(GridAction action)
+{
+    switch (action) {
+    case GridAction::NextCell:
+        return NextCell();
+    case GridAction::PreviousCell:
+        return PreviousCell();
+    case GridAction::AppendLine:
+        return AppendLine();
+    case GridAction::CopyAndAppend:
+        Copy();
+        return AppendLine();
+    case GridAction::PasteAndAppend:
+        if (!CanPaste() || Paste())
+            AppendLine();
+        return;
+    case GridAction::DeleteLine:
+        return Execute(Command::DeleteLine);
+    case GridAction::Copy:
+        return Copy();
+    case GridAction::Paste:
+        Paste();
+        return;
+    case GridAction::SearchAgain:
+        return Execute(Command::SearchAgain);
+    case GridAction::Search:
+        return Execute(Command::Search);
+    case GridAction::Undo:
+    case GridAction::Redo:
+        if (m_page)
+            m_page->UndoRedo(action == GridAction::Undo);
+        return;
+    }
+}
+
+void CGenGrid::Execute(int command)
+{
+    StoreEditedLine();
+    if (auto* host = Host())
+        host->Execute(command);
+    else if (m_page && command == Command::DeleteLine)
+        m_page->DeleteLines();
+    else if (m_page && command == Command::InsertLine)
+        m_page->AppendLine();
+}
+
+void CGenGrid::NextCell()
+{
+    if (CurrentColumn() < ColumnCount())
+        return SetCurrentCell(CurrentRow(), CurrentColumn() + 1);
+    if (CurrentRow() < RowCount())
+        return SetCurrentCell(CurrentRow() + 1, 1);
+    AppendLine();
+}
+
+void CGenGrid::PreviousCell()
+{
+    if (CurrentColumn() > 1)
+        SetCurrentCell(CurrentRow(), CurrentColumn() - 1);
+    else if (CurrentRow() > 1)
+        SetCurrentCell(CurrentRow() - 1, ColumnCount());
+    else
+        focusPreviousChild(); // the way out of the grid by keyboard
+}
+
+void CGenGrid::AppendLine()
+{
+    StoreEditedLine();
+    if (m_appendThroughPage && m_page)
+        m_page->AppendLine();
+    else
+        Execute(Command::InsertLine);
+}
+
+void CGenGrid::contextMenuEvent(QContextMenuEvent* event)
+{
+    if (!CommitEditor())
+        return;
+    QMenu menu(this);
+    const auto add = [&](GridAction action, bool enabled) {
+        const auto keys = GridKeys();
+        const auto key = std::find_if(keys.begin(), keys.end(), [&](const GridKey& k) { return k.action == action; });
+        menu.addAction(LoadString(key->description), QKeySequence(QKeyCombination(key->held, key->key)), this,
+                       [this, action] { Run(action); })
+            ->setEnabled(enabled);
+    };
+    add(GridAction::AppendLine, true);
+    add(GridAction::DeleteLine, SelectedBlock() && SelectedBlock()->width() == ColumnCount());
+    menu.addSeparator();
+    add(GridAction::Copy, CanCopy());
+    add(GridAction::Paste, CanPaste());
+    menu.addSeparator();
+    add(GridAction::Search, true);
+    menu.exec(event->globalPos());
+}
+
+// ---- lines -------------------------------------------------------------------------------------
+
+std::optional<QItemSelectionRange> CGenGrid::SelectedBlock() const
+{
+    const QItemSelection selection = selectionModel()->selection();
+    if (selection.size() != 1)
+        return std::nullopt;
+    const QItemSelectionRange range = selection.front();
+    // The current cell is always selected; alone it is no selection.
+    if (range.width() == 1 && range.height() == 1)
+        return std::nullopt;
+    return range;
+}
+
+int CGenGrid::InsertLine()
+{
+    const auto selected = SelectedBlock();
+    const int row = selected ? selected->top() : RowCount();
+    m_model->InsertRows(row);
+    UpdateRowHeader();
+    clearSelection();
+    SetCurrentCell(row + 1, 1);
+    return row + 1;
+}
+
+bool CGenGrid::DeleteSelectedLines()
+{
+    const auto selected = SelectedBlock();
+    if (!selected || selected->width() != ColumnCount())
+        return false;
+    const int row = selected->top(), column = CurrentColumn();
+    m_model->RemoveRows(row, selected->height());
+    clearSelection();
+    SetCurrentCell(row + 1, column);
+    return true;
+}
+
+void CGenGrid::GotoLine(int row)
+{
+    SetCurrentCell(row, columnAt(0) + 1);
+}

@@ -1,0 +1,162 @@
+#include "pages/framework/grid_editors.h"
+
+#include "ks/fc/message_box.h"
+#include "pages/framework/gen_grid.h"
+#include "pages/framework/grid_keys.h"
+#include "pages/framework/grid_model.h"
+
+#include <QApplication>
+#include <QComboBox>
+#include <QKeyEvent>
+#include <QTimer>
+
+namespace {
+
+constexpr int DropDownHeight = 500; // pixels
+
+QString TextOf(const QWidget* editor)
+{
+    const auto* list = qobject_cast<const QComboBox*>(editor);
+    return list ? list->currentText() : static_cast<const QLineEdit*>(editor)->text();
+}
+
+/// The branch names of the network, to choose from; another name can still be typed.
+QWidget* MakeBranchList(const QStringList& names, QWidget* parent)
+{
+    auto* list = new QComboBox(parent);
+    list->setEditable(true);
+    list->setLineEdit(new CGridStringEdit(list));
+    list->setInsertPolicy(QComboBox::NoInsert);
+    list->addItems(names);
+    list->setMaxVisibleItems(DropDownHeight / list->fontMetrics().lineSpacing());
+    return list;
+}
+
+QWidget* MakeEditor(const ColumnSpec& column, QWidget* parent)
+{
+    if (column.Kind() == CellKind::Text)
+        return new CGridStringEdit(parent);
+    return new CGridDoubleEdit(parent);
+}
+
+} // namespace
+
+CGridDoubleEdit::CGridDoubleEdit(QWidget* parent) : QLineEdit(parent)
+{
+    setFrame(false);
+    setAlignment(Qt::AlignRight);
+}
+
+CGridStringEdit::CGridStringEdit(QWidget* parent) : QLineEdit(parent)
+{
+    setFrame(false);
+    connect(this, &QLineEdit::textEdited, this, [this](const QString& text) {
+        const QString upper = text.toUpper();
+        if (upper == text)
+            return;
+        const int cursor = cursorPosition() + int(upper.size() - text.size());
+        setText(upper);
+        setCursorPosition(cursor);
+    });
+}
+
+CGridDelegate::CGridDelegate(CGenGrid* grid) : QStyledItemDelegate(grid), m_grid(grid) {}
+
+QWidget* CGridDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&, const QModelIndex& index) const
+{
+    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
+    const QStringList names = index.column() + 1 == m_grid->BranchNameColumn() ? m_grid->BranchNames() : QStringList();
+    QWidget* editor = names.isEmpty() ? MakeEditor(column, parent) : MakeBranchList(names, parent);
+    editor->setObjectName(FindControl(column.control).editorName);
+    editor->setAccessibleName(column.header());
+    editor->setAutoFillBackground(true);
+    m_editor = editor;
+    m_index = index;
+    return editor;
+}
+
+void CGridDelegate::setEditorData(QWidget* editor, const QModelIndex& index) const
+{
+    // Once, when the editor opens: what is being typed outlives a reload of the rows.
+    if (editor->property("opened").toBool())
+        return;
+    editor->setProperty("opened", true);
+    const QString text = index.data(Qt::EditRole).toString();
+    if (auto* list = qobject_cast<QComboBox*>(editor)) {
+        list->setCurrentText(text);
+        list->lineEdit()->selectAll();
+    } else {
+        static_cast<QLineEdit*>(editor)->setText(text);
+    }
+}
+
+void CGridDelegate::setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const
+{
+    model->setData(index, TextOf(editor), Qt::EditRole);
+}
+
+void CGridDelegate::destroyEditor(QWidget* editor, const QModelIndex& index) const
+{
+    if (editor == m_editor)
+        m_editor = nullptr;
+    QStyledItemDelegate::destroyEditor(editor, index);
+}
+
+bool CGridDelegate::Commit()
+{
+    if (!m_editor || !m_index.isValid())
+        return true;
+    QWidget* editor = m_editor;
+    const QString refusal = m_grid->Model()->Refusal(m_index.row(), m_index.column(), TextOf(editor));
+    if (refusal.isEmpty()) {
+        m_editor = nullptr; // closing takes the focus, which would commit again
+        emit commitData(editor);
+        emit closeEditor(editor);
+        return true;
+    }
+    if (!m_warned) {
+        m_warned = true; // one click may ask several times
+        QTimer::singleShot(0, this, [this] { m_warned = false; });
+        KsMessageBox(refusal, QMessageBox::Ok, m_grid);
+    }
+    if (m_editor)
+        m_editor->setFocus(Qt::OtherFocusReason);
+    return false;
+}
+
+void CGridDelegate::LostFocus(const QEvent* event)
+{
+    const auto reason = static_cast<const QFocusEvent*>(event)->reason();
+    const QWidget* focus = QApplication::focusWidget();
+    // The editor stays while another window or its own pop-up is in front, and a click into the grid is the grid's to
+    // judge: it commits before the current cell moves.
+    const bool inGrid = focus && (focus == m_grid || m_grid->isAncestorOf(focus));
+    if (reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || inGrid)
+        return;
+    if (Commit())
+        m_grid->StoreEditedLine();
+}
+
+bool CGridDelegate::eventFilter(QObject* object, QEvent* event)
+{
+    if (object != m_editor)
+        return QStyledItemDelegate::eventFilter(object, event);
+    switch (event->type()) {
+    case QEvent::FocusOut:
+        LostFocus(event);
+        return false;
+    case QEvent::ShortcutOverride:
+    case QEvent::KeyPress: {
+        const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
+        if (!key || !key->whileEditing)
+            break;
+        event->accept();
+        if (event->type() == QEvent::KeyPress && Commit())
+            m_grid->Run(key->action);
+        return true;
+    }
+    default:
+        break;
+    }
+    return QStyledItemDelegate::eventFilter(object, event);
+}

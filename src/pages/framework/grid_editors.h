@@ -1,0 +1,54 @@
+// The cell editors and the delegate that opens them.
+#pragma once
+
+#include <QLineEdit>
+#include <QPointer>
+#include <QStyledItemDelegate>
+
+class CGenGrid;
+
+/// Edits a number. The grid shows it with so many decimals when it is not being edited.
+class CGridDoubleEdit : public QLineEdit
+{
+    Q_OBJECT
+public:
+    explicit CGridDoubleEdit(QWidget* parent = nullptr);
+};
+
+/// Edits a text that is kept in upper case.
+class CGridStringEdit : public QLineEdit
+{
+    Q_OBJECT
+public:
+    explicit CGridStringEdit(QWidget* parent = nullptr);
+};
+
+/// Opens the editor that a column asks for, and keeps it open while its text is no value of the column.
+class CGridDelegate : public QStyledItemDelegate
+{
+    Q_OBJECT
+public:
+    explicit CGridDelegate(CGenGrid* grid);
+
+    /// The open editor, null when there is none.
+    QWidget* Editor() const { return m_editor; }
+    /// Takes the open editor's text and closes it. A text that the cell refuses is reported, and the editor stays; then
+    /// false.
+    bool Commit();
+
+    QWidget* createEditor(QWidget* parent, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+    void setEditorData(QWidget* editor, const QModelIndex& index) const override;
+    void setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const override;
+    void destroyEditor(QWidget* editor, const QModelIndex& index) const override;
+
+protected:
+    bool eventFilter(QObject* object, QEvent* event) override;
+
+private:
+    void LostFocus(const QEvent* event);
+
+    CGenGrid* m_grid;
+    mutable QPointer<QWidget> m_editor;
+    mutable QPersistentModelIndex m_index;
+    bool m_warned = false; // about this text, during the present event
+};

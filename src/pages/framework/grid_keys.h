@@ -1,0 +1,39 @@
+// The keys of the grid: one row a key.
+#pragma once
+
+#include "res/strings.h"
+
+#include <Qt>
+#include <span>
+
+class QKeyEvent;
+
+enum class GridAction
+{
+    NextCell,
+    PreviousCell,
+    AppendLine,
+    CopyAndAppend,
+    PasteAndAppend,
+    DeleteLine,
+    Copy,
+    Paste,
+    SearchAgain,
+    Search,
+    Undo,
+    Redo
+};
+
+struct GridKey
+{
+    Qt::Key key;
+    Qt::KeyboardModifiers held; // which of `looked at` must be held
+    Qt::KeyboardModifiers lookedAt;
+    GridAction action;
+    bool whileEditing; // also when a cell editor has the focus
+    Str description;
+};
+
+std::span<const GridKey> GridKeys();
+/// The row of the key; null when the grid leaves it to the table widget.
+const GridKey* FindGridKey(const QKeyEvent& event);

@@ -1,0 +1,92 @@
+// The model of a grid: a window on a row source. It holds no copy of the rows; texts are made for the cells that a view
+// asks for, and what the user typed since the last store lies over the rows as a small overlay.
+#pragma once
+
+#include "module/row_source.h"
+#include "pages/framework/column_spec.h"
+
+#include <QAbstractTableModel>
+#include <map>
+#include <vector>
+
+class CKavo0_hdDoc;
+
+/// What an emptied value cell is stored as.
+enum class BlankRule
+{
+    Zero, // as an empty cell converts
+    Fill  // as the column's fill value, where it has one
+};
+
+class CGridModel : public QAbstractTableModel
+{
+    Q_OBJECT
+public:
+    explicit CGridModel(QObject* parent = nullptr);
+
+    void AddColumn(ColumnSpec column);
+    const std::vector<ColumnSpec>& Columns() const { return m_columns; }
+    /// Where the rows are; the document keeps the undo steps. Both outlive the model.
+    void SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows);
+    const std::shared_ptr<IRowSource>& Rows() const { return m_rows; }
+
+    /// Shows the source as it is now. Costs the same for any number of rows as long as none came, went or moved.
+    void Sync();
+
+    // QAbstractItemModel
+    int rowCount(const QModelIndex& parent = {}) const override;
+    int columnCount(const QModelIndex& parent = {}) const override;
+    QVariant data(const QModelIndex& index, int role) const override;
+    QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
+    Qt::ItemFlags flags(const QModelIndex& index) const override;
+    /// Takes what was typed; false for a text that is no value of the column. A text that is the cell's own changes
+    /// nothing.
+    bool setData(const QModelIndex& index, const QVariant& value, int role) override;
+
+    /// What the cell holds, typed or stored.
+    CellValue Value(int row, int column) const;
+    /// Why the cell would not take the text; empty when it would.
+    QString Refusal(int row, int column, const QString& text) const;
+    bool IsLocked(int row, int column) const;
+
+    /// Writes what the row's cells hold into an object of the source's kind.
+    void CopyRow(int row, void* target) const;
+
+    bool HasPending() const { return !m_pending.empty(); }
+    /// Moves what was typed into the rows, as one undo step; no other cell is touched. False when nothing changed.
+    bool Store(BlankRule rule = BlankRule::Zero);
+    /// Puts `texts` into the cells from (row, column) on, rows past the last one being added: one undo step.
+    /// Every text must have passed Refusal.
+    void Paste(int row, int column, const std::vector<QStringList>& texts);
+
+    /// New lines before `row`, with the columns' fill values: an undo step.
+    void InsertRows(int row, int count = 1);
+    /// An undo step; a table left without lines gets a new one.
+    void RemoveRows(int row, int count);
+    /// Gives a source without rows its one line, silently.
+    void EnsureFirstRow();
+
+signals:
+    /// The user changed a cell (rows and columns from 1).
+    void CellModified(int row, int column);
+
+private:
+    using CellKey = std::pair<RowKey, int>;
+    struct Typed
+    {
+        CellValue value;
+        std::size_t row; // where the row was
+    };
+
+    std::unique_ptr<IRowBlock> NewLines(int count) const;
+    CellValue Resolved(int column, const CellValue& value, BlankRule rule) const;
+    void PruneOverlay();
+    bool IsRow(int row) const { return m_rows && row >= 0 && std::size_t(row) < m_rows->Count(); }
+
+    std::vector<ColumnSpec> m_columns;
+    CKavo0_hdDoc* m_document = nullptr;
+    std::shared_ptr<IRowSource> m_rows;
+    int m_rowCount = 0; // as the views know it
+    std::uint64_t m_revision = 0;
+    std::map<CellKey, Typed> m_pending;
+};

@@ -1,0 +1,77 @@
+// Base of the pages that edit one list of locations in a grid.
+#pragma once
+
+#include "module/document.h"
+#include "pages/framework/gen_grid.h"
+#include "pages/framework/page.h"
+#include "res/strings.h"
+
+/// What a column says about itself beyond its field.
+struct ColumnOptions
+{
+    std::function<QString()> header = {}; // by default the text of `caption`
+    Str caption = Str::RiverName;
+    int width = 72;
+    const char* format = "%-lf";
+    const double* fill = nullptr; // see ColumnSpec
+    bool emptyIsNotGiven = false;
+    std::function<bool(const HD_RiverPos& record)> locked = {};
+};
+
+/// Declares the columns of a grid, from left to right.
+class GridColumns
+{
+public:
+    explicit GridColumns(CGenGrid& grid) : m_grid(grid) {}
+
+    GridColumns& BranchName(ColumnOptions options);
+    GridColumns& Chainage(ColumnOptions options);
+    /// A declared field of the records; its unit is that of the declaration.
+    GridColumns& Value(const Field& field, ColumnOptions options);
+    template <typename Record, typename T>
+    GridColumns& Value(T Record::*member, ColumnOptions options)
+    {
+        return Value(FieldOf(member), std::move(options));
+    }
+
+private:
+    template <typename Record, typename T>
+    static const Field& FieldOf(T Record::*member)
+    {
+        static Record record;
+        for (const Field& field : Record::DeclaredFields())
+            if (field.address(static_cast<HD_RiverPos*>(&record)) == &(record.*member))
+                return field;
+        Q_UNREACHABLE(); // a member that is no parameter of the file
+    }
+    GridColumns& Add(int control, const Field& field, ColumnOptions options);
+
+    CGenGrid& m_grid;
+};
+
+class CLocationPage : public CGenPropertyPage
+{
+    Q_OBJECT
+public:
+    template <typename Record>
+    CLocationPage(CKavo0_hdDoc* document, CGenParamList<Record> HD_Parameters::*list, QWidget* parent = nullptr)
+        : CLocationPage(document, document->Parameters().*list, parent)
+    {
+    }
+    CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent = nullptr);
+
+    CGenList* GetList() const override { return &m_list; }
+    void InsertLocation(const QString& riverName, const QString& chainageText) override;
+    void AppendLine() override;
+    void LoadFromDocument(CKavo0_hdDoc* document) override;
+    void StoreToDocument() override;
+    std::unique_ptr<HD_RiverPos> GetRecordAt(int row) const override;
+    bool OnKillActive() override;
+
+protected:
+    /// Makes `grid` the page's grid; its columns are declared on the result.
+    GridColumns Grid(CGenGrid* grid);
+
+private:
+    CGenList& m_list;
+};

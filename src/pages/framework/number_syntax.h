@@ -1,0 +1,11 @@
+// The number syntax of cells and fields. No blanks, no thousands separators, the point as decimal separator.
+#pragma once
+
+#include <optional>
+#include <string_view>
+
+/// [sign] digits [. digits] [e [sign] digits]; digits before the point may be missing, digits behind it may not.
+bool IsValidNumber(std::string_view text);
+
+/// The number of a valid text. Empty for an invalid text and for a number too large for a double; one too small is 0.
+std::optional<double> ReadNumber(std::string_view text);

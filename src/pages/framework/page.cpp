@@ -1,0 +1,113 @@
+#include "pages/framework/page.h"
+
+#include "module/document.h"
+#include "pages/framework/gen_grid.h"
+
+#include <QKeyEvent>
+#include <QUndoStack>
+
+CGenPropertyPage::CGenPropertyPage(CKavo0_hdDoc* document, QWidget* parent)
+    : QWidget(parent), m_document(document), m_bindings(document), m_shownUnits(KsUnits::Instance().System())
+{
+    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CGenPropertyPage::UnitsChanged);
+}
+
+CGenPropertyPage::~CGenPropertyPage() = default;
+
+HD_Global_Var& CGenPropertyPage::Globals() const
+{
+    return m_document->Parameters().Global;
+}
+
+void CGenPropertyPage::InsertLocation(const QString&, const QString&) {}
+
+void CGenPropertyPage::AppendLine() {}
+
+void CGenPropertyPage::DeleteLines()
+{
+    if (m_grid)
+        m_grid->DeleteSelectedLines();
+}
+
+void CGenPropertyPage::GotoLine(int row)
+{
+    if (m_grid)
+        m_grid->GotoLine(row);
+}
+
+void CGenPropertyPage::LoadFromDocument(CKavo0_hdDoc*)
+{
+    m_bindings.Show();
+}
+
+void CGenPropertyPage::StoreToDocument()
+{
+    m_bindings.Take();
+}
+
+std::unique_ptr<HD_RiverPos> CGenPropertyPage::GetRecordAt(int) const
+{
+    return nullptr;
+}
+
+void CGenPropertyPage::OnGridCellModified(int, int) {}
+
+void CGenPropertyPage::OnGridButtonClicked(int, int) {}
+
+void CGenPropertyPage::UndoRedo(bool undo)
+{
+    StoreToDocument();
+    if (undo)
+        m_document->UndoStack().undo();
+    else
+        m_document->UndoStack().redo();
+}
+
+void CGenPropertyPage::OnSetActive()
+{
+    if (m_host)
+        m_host->EnableLinesMenu(m_grid != nullptr);
+    LoadFromDocument(m_document);
+}
+
+bool CGenPropertyPage::OnKillActive()
+{
+    StoreToDocument();
+    return true;
+}
+
+void CGenPropertyPage::UnitsChanged()
+{
+    // What is being typed is meant in the unit that stood there, so it is taken in that unit.
+    auto& units = KsUnits::Instance();
+    const KsUnitSystem now = units.System();
+    {
+        const QSignalBlocker quiet(units);
+        units.SetSystem(m_shownUnits);
+        StoreToDocument();
+        units.SetSystem(now);
+    }
+    m_shownUnits = now;
+    if (isVisible())
+        LoadFromDocument(m_document);
+}
+
+void CGenPropertyPage::changeEvent(QEvent* event)
+{
+    QWidget::changeEvent(event);
+    if (event->type() != QEvent::LanguageChange)
+        return;
+    Retranslate();
+    if (isVisible())
+        LoadFromDocument(m_document);
+}
+
+void CGenPropertyPage::keyPressEvent(QKeyEvent* event)
+{
+    if (event->matches(QKeySequence::Undo))
+        UndoRedo(true);
+    else if (event->matches(QKeySequence::Redo))
+        UndoRedo(false);
+    else
+        QWidget::keyPressEvent(event);
+}
