@@ -44,5 +44,5 @@ KS_PLUGIN_FUNCTIONS(KS_PLUGIN_DECLARE)
 /// Where the picture of a number stands among the resources of all editors.
 inline CString KsBitmapPath(int id)
 {
-    return QStringLiteral(":/bitmaps/%1").arg(id);
+    return QStringLiteral(":/bitmaps/%1.svg").arg(id);
 }

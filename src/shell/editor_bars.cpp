@@ -1,0 +1,88 @@
+#include "shell/editor_bars.h"
+
+#include "ks/fc/frames.h"
+#include "shell/plugin_loader.h"
+#include "shell/settings_keys.h"
+
+#include <QFileInfo>
+#include <QSettings>
+
+namespace {
+constexpr unsigned FirstBarId = 0xE880; // control ids of the editors' bars, above those of the frame's own
+} // namespace
+
+CEditorBars::CEditorBars(CKsMDIFrameWnd* frame) : QObject(frame), m_frame(frame) {}
+
+void CEditorBars::Create(const std::vector<std::unique_ptr<CPlugin>>& plugins)
+{
+    for (Bar& bar : m_bars)
+        delete bar.bar;
+    m_bars.clear();
+    m_plugins = &plugins;
+    for (const auto& plugin : plugins) {
+        if (plugin->IsUsable())
+            CreateBars(*plugin);
+    }
+    Update();
+}
+
+void CEditorBars::CreateBars(const CPlugin& plugin)
+{
+    const QStringList hidden = QSettings().value(Settings::HiddenBars).toStringList();
+    for (int i = 0, count = plugin.KsGetNumToolbars(); i < count; ++i) {
+        CKsToolBarEx* bar = plugin.KsCreateToolbar(m_frame, 0, FirstBarId + unsigned(m_bars.size()), i);
+        if (!bar)
+            continue;
+        CString name;
+        plugin.KsGetToolbarString(&name, i);
+        bar->setObjectName(QStringLiteral("%1-%2").arg(QFileInfo(plugin.file).completeBaseName()).arg(i));
+        bar->setWindowTitle(name.trimmed());
+        auto toggle = std::make_unique<QAction>(name.trimmed());
+        toggle->setCheckable(true);
+        toggle->setChecked(!hidden.contains(bar->objectName()));
+        connect(toggle.get(), &QAction::toggled, this, [this] {
+            Update();
+            SaveHidden();
+        });
+        m_bars.push_back({&plugin, bar, std::move(toggle)});
+    }
+}
+
+void CEditorBars::Show(const CView* view, bool show)
+{
+    const CMultiDocTemplate* documents = view && view->GetDocument() ? view->GetDocument()->GetDocTemplate() : nullptr;
+    if (!documents || !m_plugins)
+        return;
+    for (const auto& plugin : *m_plugins) {
+        const auto& own = plugin->templates;
+        if (std::any_of(own.begin(), own.end(), [&](const auto& each) { return each.get() == documents; }))
+            m_shown[plugin.get()] = show;
+    }
+    Update();
+}
+
+std::vector<QAction*> CEditorBars::Toggles() const
+{
+    std::vector<QAction*> toggles;
+    for (const Bar& bar : m_bars)
+        toggles.push_back(bar.toggle.get());
+    return toggles;
+}
+
+void CEditorBars::Update()
+{
+    for (const Bar& bar : m_bars) {
+        if (bar.bar)
+            bar.bar->setVisible(bar.toggle->isChecked() && m_shown[bar.plugin]);
+    }
+}
+
+void CEditorBars::SaveHidden() const
+{
+    QStringList hidden;
+    for (const Bar& bar : m_bars) {
+        if (bar.bar && !bar.toggle->isChecked())
+            hidden << bar.bar->objectName();
+    }
+    QSettings().setValue(Settings::HiddenBars, hidden);
+}

@@ -1,0 +1,47 @@
+// The tool bars of the editors in the main frame.
+#pragma once
+
+#include <QAction>
+#include <QObject>
+#include <QPointer>
+#include <map>
+#include <memory>
+#include <vector>
+
+class CKsMDIFrameWnd;
+class CKsToolBarEx;
+class CView;
+struct CPlugin;
+
+/// Makes every editor's tool bars and shows those of the editor whose view asks for it. Which editor that is follows
+/// from the view's document template: the shell has it from one plug-in. A bar that the user has switched off stays
+/// hidden.
+class CEditorBars : public QObject
+{
+    Q_OBJECT
+public:
+    explicit CEditorBars(CKsMDIFrameWnd* frame);
+    /// Makes the bars of all usable plug-ins, hidden; those made before are removed.
+    void Create(const std::vector<std::unique_ptr<CPlugin>>& plugins);
+    /// Shows or hides the bars of the editor that the view belongs to.
+    void Show(const CView* view, bool show);
+    /// One checkable action a bar: whether the user wants to see it.
+    std::vector<QAction*> Toggles() const;
+
+private:
+    struct Bar
+    {
+        const CPlugin* plugin;
+        QPointer<CKsToolBarEx> bar;
+        std::unique_ptr<QAction> toggle;
+    };
+
+    void CreateBars(const CPlugin& plugin);
+    void Update();
+    void SaveHidden() const;
+
+    CKsMDIFrameWnd* m_frame;
+    std::vector<Bar> m_bars;
+    std::map<const CPlugin*, bool> m_shown; // asked for by a view
+    const std::vector<std::unique_ptr<CPlugin>>* m_plugins = nullptr;
+};

@@ -1,0 +1,6 @@
+#include "shell/shell_main.h"
+
+int main(int argc, char** argv)
+{
+    return ShellMain(argc, argv);
+}

@@ -1,0 +1,405 @@
+// The menus of the main frame: one table of actions, and the parts that are filled as they open.
+#include "ks/fc/message_box.h"
+#include "ks/language/language.h"
+#include "ks/units/edit_style.h"
+#include "shell/main_frame.h"
+#include "shell/plugins_dialog.h"
+
+#include <QActionGroup>
+#include <QCoreApplication>
+#include <QDesktopServices>
+#include <QDir>
+#include <QFileInfo>
+#include <QMenu>
+#include <QMenuBar>
+#include <QStatusBar>
+#include <QToolBar>
+#include <QUndoStack>
+#include <QUrl>
+#include <array>
+#include <span>
+
+namespace {
+
+enum MenuPosition
+{
+    FileMenu,
+    EditMenu,
+    LinesMenu,
+    ViewMenu,
+    WindowMenu,
+    HelpMenu,
+    MenuCount
+};
+
+constexpr std::array<const char*, MenuCount> MenuTitles{
+    QT_TRANSLATE_NOOP("CMainFrame", "&File"),   QT_TRANSLATE_NOOP("CMainFrame", "&Edit"),
+    QT_TRANSLATE_NOOP("CMainFrame", "&Lines"),  QT_TRANSLATE_NOOP("CMainFrame", "&View"),
+    QT_TRANSLATE_NOOP("CMainFrame", "&Window"), QT_TRANSLATE_NOOP("CMainFrame", "&Help"),
+};
+
+/// The key belongs to whatever has the focus; the menu only shows it.
+constexpr bool ShownOnly = true;
+
+} // namespace
+
+/// One entry of a menu. A row without a name is a separator.
+struct CFrameAction
+{
+    MenuPosition menu;
+    const char* name = nullptr; // object name
+    const char* text = nullptr;
+    const char* tip = nullptr; // shown in the status bar
+    void (CMainFrame::*run)() = nullptr;
+    QKeySequence::StandardKey key = QKeySequence::UnknownKey;
+    const char* icon = nullptr; // also puts it onto the standard tool bar
+    bool shownOnly = false;
+
+    static std::span<const CFrameAction> Table();
+};
+
+std::span<const CFrameAction> CFrameAction::Table()
+{
+#define TEXT(text) QT_TRANSLATE_NOOP("CMainFrame", text)
+    using F = CMainFrame;
+    using K = QKeySequence;
+    // clang-format off
+    static const CFrameAction table[] = {
+        {FileMenu, "actionNew", TEXT("&New"), TEXT("Starts a new document"), &F::OnFileNew, K::New, "new"},
+        {FileMenu, "actionOpen", TEXT("&Open..."), TEXT("Opens a document or a project"), &F::OnFileOpen, K::Open, "open"},
+        {FileMenu, "actionOpenProject", TEXT("Open &Project..."), TEXT("Opens a project with all its files"), &F::OnFileOpenProject},
+        {FileMenu, "actionOpenRecent", TEXT("Open &Recent"), TEXT("Opens one of the files used last")},
+        {FileMenu},
+        {FileMenu, "actionSave", TEXT("&Save"), TEXT("Saves the active document"), &F::OnFileSave, K::Save, "save"},
+        {FileMenu, "actionSaveAs", TEXT("Save &As..."), TEXT("Saves the active document under a new name"), &F::OnFileSaveAs, K::SaveAs},
+        {FileMenu, "actionClose", TEXT("&Close"), TEXT("Closes the active window"), &F::OnFileClose, K::Close},
+        {FileMenu, "actionCloseProject", TEXT("Close Projec&t"), TEXT("Closes the project with all its files"), &F::OnFileCloseProject},
+        {FileMenu},
+        {FileMenu, "actionExit", TEXT("E&xit"), TEXT("Closes all documents and ends the program"), &F::OnFileExit, K::Quit},
+        {EditMenu, "actionUndo", TEXT("&Undo"), TEXT("Takes the last change back"), &F::OnUndo, K::Undo, "undo"},
+        {EditMenu, "actionRedo", TEXT("&Redo"), TEXT("Makes the change again that was taken back"), &F::OnRedo, K::Redo, "redo"},
+        {EditMenu},
+        {EditMenu, "actionCut", TEXT("Cu&t"), TEXT("Moves the selection to the clipboard"), &F::OnCut, K::Cut, nullptr, ShownOnly},
+        {EditMenu, "actionCopy", TEXT("&Copy"), TEXT("Copies the selection to the clipboard"), &F::OnCopy, K::Copy, nullptr, ShownOnly},
+        {EditMenu, "actionPaste", TEXT("&Paste"), TEXT("Puts in what is on the clipboard"), &F::OnPaste, K::Paste, nullptr, ShownOnly},
+        {ViewMenu, "actionUnits", TEXT("&Units"), TEXT("Units in which values are shown; files are not affected")},
+        {ViewMenu, "actionLanguage", TEXT("&Language"), TEXT("Language of the program")},
+        {ViewMenu, "actionToolBars", TEXT("&Tool Bars"), TEXT("Shows or hides tool bars")},
+        {WindowMenu, "actionCascade", TEXT("&Cascade"), TEXT("Arranges the windows one behind the other"), &F::OnCascade},
+        {WindowMenu, "actionTile", TEXT("&Tile"), TEXT("Arranges the windows side by side"), &F::OnTile},
+        {WindowMenu, "actionNextWindow", TEXT("Ne&xt"), TEXT("Goes to the next window"), &F::OnNextWindow, K::NextChild},
+        {WindowMenu, "actionPreviousWindow", TEXT("Pre&vious"), TEXT("Goes to the previous window"), &F::OnPreviousWindow, K::PreviousChild},
+        {WindowMenu, "actionTabs", TEXT("Ta&bs"), TEXT("Shows the windows as tabs"), &F::OnTabs},
+        {WindowMenu},
+        {WindowMenu, "actionCloseAll", TEXT("Close &All"), TEXT("Closes all windows"), &F::OnCloseAll},
+        {HelpMenu, "actionContents", TEXT("&Contents"), TEXT("Shows the help of the editor"), &F::OnContents, K::HelpContents},
+        {HelpMenu, "actionPlugins", TEXT("&Plug-ins..."), TEXT("Lists the editors that were loaded"), &F::OnPlugins},
+        {HelpMenu, "actionAbout", TEXT("&About"), TEXT("Name and version of the program"), &F::OnAbout},
+    };
+    // clang-format on
+#undef TEXT
+    return table;
+}
+
+QAction* CMainFrame::Action(const char* name) const
+{
+    return m_actions.at(QString::fromLatin1(name));
+}
+
+void CMainFrame::CreateActions()
+{
+    for (const CFrameAction& row : CFrameAction::Table()) {
+        if (!row.name)
+            continue;
+        auto* action = new QAction(this);
+        action->setObjectName(QString::fromLatin1(row.name));
+        if (row.icon)
+            action->setIcon(QIcon(QStringLiteral(":/shell/%1.svg").arg(QLatin1String(row.icon))));
+        if (row.key != QKeySequence::UnknownKey && !row.shownOnly)
+            action->setShortcuts(row.key);
+        if (row.run)
+            connect(action, &QAction::triggered, this, row.run);
+        m_actions.emplace(action->objectName(), action);
+    }
+    Action("actionTabs")->setCheckable(true);
+    Action("actionExit")->setMenuRole(QAction::QuitRole);
+    Action("actionAbout")->setMenuRole(QAction::AboutRole);
+}
+
+void CMainFrame::CreateMenus()
+{
+    m_standardBar = addToolBar(QString());
+    m_standardBar->setObjectName(QStringLiteral("standardBar"));
+    m_standardBar->setIconSize(QSize(16, 16));
+    for (int position = 0; position < MenuCount; ++position)
+        m_menus.push_back(menuBar()->addMenu(QString()));
+    for (const CFrameAction& row : CFrameAction::Table()) {
+        if (!row.name) {
+            m_menus[row.menu]->addSeparator();
+            continue;
+        }
+        m_menus[row.menu]->addAction(Action(row.name));
+        if (row.icon)
+            m_standardBar->addAction(Action(row.name));
+    }
+    m_standardBar->insertSeparator(Action("actionUndo"));
+
+    const auto addSubMenu = [this](const char* name) {
+        auto* menu = new QMenu(this);
+        Action(name)->setMenu(menu);
+        return menu;
+    };
+    m_recentMenu = addSubMenu("actionOpenRecent");
+    m_unitsMenu = addSubMenu("actionUnits");
+    m_languageMenu = addSubMenu("actionLanguage");
+    m_toolBarMenu = addSubMenu("actionToolBars");
+
+    auto* units = new QActionGroup(this);
+    for (const auto& [name, run] : {std::pair("actionMetric", &CMainFrame::OnMetric),
+                                    std::pair("actionUsCustomary", &CMainFrame::OnUsCustomary)}) {
+        auto* action = m_unitsMenu->addAction(QString());
+        action->setObjectName(QString::fromLatin1(name));
+        action->setCheckable(true);
+        units->addAction(action);
+        connect(action, &QAction::triggered, this, run);
+        m_actions.emplace(action->objectName(), action);
+    }
+    CreateLanguageMenu(m_languageMenu);
+
+    connect(m_menus[FileMenu], &QMenu::aboutToShow, this, &CMainFrame::UpdateActions);
+    connect(m_recentMenu, &QMenu::aboutToShow, this, &CMainFrame::FillRecentMenu);
+    connect(m_menus[EditMenu], &QMenu::aboutToShow, this, &CMainFrame::UpdateEditMenu);
+    connect(m_menus[LinesMenu], &QMenu::aboutToShow, this, [this] { UpdateLinesMenu(true); });
+    connect(m_menus[LinesMenu], &QMenu::aboutToHide, this, [this] { UpdateLinesMenu(false); });
+    connect(m_menus[ViewMenu], &QMenu::aboutToShow, this, &CMainFrame::UpdateActions);
+    connect(m_toolBarMenu, &QMenu::aboutToShow, this, [this] { FillToolBarMenu(m_toolBarMenu); });
+    connect(m_menus[WindowMenu], &QMenu::aboutToShow, this, &CMainFrame::FillWindowMenu);
+    EnableMenuItem(LinesMenu, false);
+}
+
+void CMainFrame::CreateLanguageMenu(QMenu* menu)
+{
+    // Every language by its own name, so that it is found whatever the present one is.
+    const std::map<QString, QString> names{{QStringLiteral("en_US"), QStringLiteral("English (United States)")},
+                                           {QStringLiteral("en_GB"), QStringLiteral("English (United Kingdom)")},
+                                           {QStringLiteral("ja"), QStringLiteral("日本語")}};
+    auto* group = new QActionGroup(this);
+    for (const QString& code : KsLanguage::Available()) {
+        QAction* action = menu->addAction(names.at(code));
+        action->setObjectName(QStringLiteral("actionLanguage_") + code);
+        action->setCheckable(true);
+        group->addAction(action);
+        connect(action, &QAction::triggered, this, [code] { KsLanguage::Instance().SetCurrent(code); });
+        m_actions.emplace(action->objectName(), action);
+    }
+}
+
+void CMainFrame::Retranslate()
+{
+    for (int position = 0; position < MenuCount; ++position)
+        m_menus[std::size_t(position)]->setTitle(tr(MenuTitles[std::size_t(position)]));
+    for (const CFrameAction& row : CFrameAction::Table()) {
+        if (!row.name)
+            continue;
+        QString text = tr(row.text);
+        if (row.shownOnly)
+            text += u'\t' + QKeySequence(row.key).toString(QKeySequence::NativeText);
+        Action(row.name)->setText(text);
+        Action(row.name)->setStatusTip(tr(row.tip));
+    }
+    Action("actionMetric")->setText(tr("&Metric"));
+    Action("actionUsCustomary")->setText(tr("&US Customary"));
+    m_standardBar->setWindowTitle(tr("Standard"));
+    MdiArea().SetHint(Templates().empty() ? tr("No editor was found. See Help, Plug-ins.")
+                                          : tr("Open a file with File, Open, or drop it here."));
+    UpdateUndoTexts();
+    UpdateTitle();
+    FillLinesMenu();
+}
+
+void CMainFrame::UpdateActions()
+{
+    const bool document = ActiveDocument() != nullptr;
+    for (const char* name : {"actionSave", "actionSaveAs", "actionClose"})
+        Action(name)->setEnabled(document);
+    Action("actionNew")->setEnabled(!Templates().empty());
+    Action("actionCloseProject")->setEnabled(!m_projects.All().empty());
+    Action("actionOpenRecent")->setEnabled(!m_recent.Files().isEmpty());
+    const bool usCustomary = KsUnits::Instance().System() == KsUnitSystem::UsCustomary;
+    Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);
+    m_actions.at(QStringLiteral("actionLanguage_") + KsLanguage::Instance().Current())->setChecked(true);
+    Action("actionContents")->setVisible(!HelpFile().isEmpty());
+}
+
+// ---- menus filled as they open -----------------------------------------------------------------
+
+void CMainFrame::FillRecentMenu()
+{
+    m_recentMenu->clear();
+    int number = 0;
+    for (const QString& file : m_recent.Files()) {
+        QString text = QDir::toNativeSeparators(file).replace(u'&', QStringLiteral("&&"));
+        if (++number < 10)
+            text.prepend(QStringLiteral("&%1  ").arg(number));
+        connect(m_recentMenu->addAction(text), &QAction::triggered, this, [this, file] { OpenFile(file); });
+    }
+    m_recentMenu->addSeparator();
+    connect(m_recentMenu->addAction(tr("&Clear List")), &QAction::triggered, this, [this] {
+        m_recent.Clear();
+        UpdateActions();
+    });
+}
+
+/// The third menu belongs to the editor of the active view.
+void CMainFrame::ActiveViewChanged(CView* view)
+{
+    CKsDoc* document = view ? view->GetDocument() : nullptr;
+    m_undo.setActiveStack(document ? &document->UndoStack() : nullptr);
+    FillLinesMenu();
+    EnableMenuItem(LinesMenu, !m_menus[LinesMenu]->isEmpty()); // the view may grey it again
+    UpdateActions();
+    UpdateTitle();
+}
+
+void CMainFrame::FillLinesMenu()
+{
+    QMenu* menu = m_menus[LinesMenu];
+    auto* target = dynamic_cast<CCommandTarget*>(GetActiveView());
+    menu->clear();
+    for (const CKsMenuCommand& command : target ? target->LinesMenu() : std::vector<CKsMenuCommand>()) {
+        if (command.text.isEmpty()) {
+            menu->addSeparator();
+            continue;
+        }
+        QAction* action = menu->addAction(command.text);
+        action->setObjectName(QStringLiteral("command%1").arg(command.id));
+        action->setShortcut(command.shortcut);
+        action->setStatusTip(command.statusTip);
+        connect(action, &QAction::triggered, this, [this, id = command.id] { SendCommand(id); });
+        action->setData(command.id);
+    }
+}
+
+/// Commands are greyed only while the menu is open: a shortcut must not depend on when it was last looked at.
+void CMainFrame::UpdateLinesMenu(bool open)
+{
+    const auto* target = dynamic_cast<CCommandTarget*>(GetActiveView());
+    const auto actions = m_menus[LinesMenu]->actions();
+    for (QAction* action : actions) {
+        if (!action->isSeparator())
+            action->setEnabled(!open || (target && target->IsCommandEnabled(action->data().toInt())));
+    }
+}
+
+void CMainFrame::FillToolBarMenu(QMenu* menu)
+{
+    menu->clear();
+    menu->addAction(m_standardBar->toggleViewAction());
+    for (QAction* toggle : m_bars.Toggles())
+        menu->addAction(toggle);
+}
+
+QMenu* CMainFrame::createPopupMenu()
+{
+    auto* menu = new QMenu(this);
+    FillToolBarMenu(menu);
+    return menu;
+}
+
+void CMainFrame::FillWindowMenu()
+{
+    QMenu* menu = m_menus[WindowMenu];
+    const auto actions = menu->actions();
+    for (QAction* action : actions.mid(actions.indexOf(Action("actionCloseAll")) + 1))
+        delete action;
+    const auto windows = MdiArea().subWindowList();
+    const bool tabs = MdiArea().viewMode() == QMdiArea::TabbedView;
+    Action("actionTabs")->setChecked(tabs);
+    for (const char* name : {"actionCascade", "actionTile"})
+        Action(name)->setEnabled(!tabs && !windows.isEmpty());
+    for (const char* name : {"actionNextWindow", "actionPreviousWindow", "actionCloseAll"})
+        Action(name)->setEnabled(!windows.isEmpty());
+    if (!windows.isEmpty())
+        menu->addSeparator();
+    for (QMdiSubWindow* window : windows) {
+        QString title = window->windowTitle().replace(u'&', QStringLiteral("&&"));
+        QAction* action = menu->addAction(title.replace(QStringLiteral("[*]"), window->isWindowModified() ? "*" : ""));
+        action->setCheckable(true);
+        action->setChecked(window == MdiArea().currentSubWindow());
+        connect(action, &QAction::triggered, window, [this, window] { MdiArea().setActiveSubWindow(window); });
+    }
+}
+
+// ---- commands ----------------------------------------------------------------------------------
+
+void CMainFrame::OnMetric()
+{
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+}
+
+void CMainFrame::OnUsCustomary()
+{
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+}
+
+void CMainFrame::OnCascade()
+{
+    MdiArea().cascadeSubWindows();
+}
+
+void CMainFrame::OnTile()
+{
+    MdiArea().tileSubWindows();
+}
+
+void CMainFrame::OnNextWindow()
+{
+    MdiArea().activateNextSubWindow();
+}
+
+void CMainFrame::OnPreviousWindow()
+{
+    MdiArea().activatePreviousSubWindow();
+}
+
+void CMainFrame::OnTabs()
+{
+    const bool tabs = Action("actionTabs")->isChecked();
+    MdiArea().setViewMode(tabs ? QMdiArea::TabbedView : QMdiArea::SubWindowView);
+}
+
+void CMainFrame::OnCloseAll()
+{
+    CloseAllWindows();
+}
+
+/// The help file of the active view's editor, or of the first one; empty when it is not installed.
+QString CMainFrame::HelpFile() const
+{
+    const auto templates = Templates();
+    const CMultiDocTemplate* documents = ActiveDocument()    ? ActiveDocument()->GetDocTemplate()
+                                         : templates.empty() ? nullptr
+                                                             : templates.front();
+    const QString name = documents ? documents->GetDocString(CMultiDocTemplate::windowTitle) : QString();
+    const QFileInfo file(QCoreApplication::applicationDirPath(), name);
+    return !name.isEmpty() && file.isFile() ? file.absoluteFilePath() : QString();
+}
+
+void CMainFrame::OnContents()
+{
+    QDesktopServices::openUrl(QUrl::fromLocalFile(HelpFile()));
+}
+
+void CMainFrame::OnPlugins()
+{
+    CPluginsDialog(m_plugins, this).exec();
+}
+
+void CMainFrame::OnAbout()
+{
+    QMessageBox about(QMessageBox::NoIcon, tr("About %1").arg(QCoreApplication::applicationName()),
+                      tr("%1, version %2\n\nShell of the river model editors.")
+                          .arg(QCoreApplication::applicationName(), QCoreApplication::applicationVersion()),
+                      QMessageBox::Ok, this);
+    about.exec();
+}

@@ -1,0 +1,112 @@
+// Projects in the main frame.
+#include "ks/fc/message_box.h"
+#include "shell/main_frame.h"
+
+#include <QDir>
+#include <QFileInfo>
+
+namespace {
+
+CKsMDIChildWnd* WindowOf(const QMdiArea& area, const CView* view)
+{
+    const auto windows = area.subWindowList();
+    for (QMdiSubWindow* window : windows) {
+        auto* child = qobject_cast<CKsMDIChildWnd*>(window);
+        if (child && view && child->GetActiveView() == view)
+            return child;
+    }
+    return nullptr;
+}
+
+} // namespace
+
+bool CMainFrame::OpenProject(const QString& path)
+{
+    QString error;
+    const CProject* opened = m_projects.Open(path, error);
+    if (!opened) {
+        KsMessageBox(tr("The project could not be opened.\n%1").arg(error));
+        return false;
+    }
+    const CProject project = *opened; // its views change while the members open
+    m_recent.Add(project.path);
+    Announce(KsRequest::ProjectOpened, project);
+    const QString missing = OpenMembers(project);
+    if (!missing.isEmpty())
+        KsMessageBox(tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing));
+    UpdateTitle();
+    UpdateActions();
+    return true;
+}
+
+/// Opens all members; what could not be opened, a line each.
+QString CMainFrame::OpenMembers(const CProject& project)
+{
+    QStringList missing;
+    for (const QString& member : project.members) {
+        const QString name = QDir::toNativeSeparators(member);
+        if (!QFileInfo::exists(member))
+            missing << tr("%1: the file does not exist").arg(name);
+        else if (!TemplateFor(member))
+            missing << tr("%1: no editor reads files of this kind").arg(name);
+        else if (!OpenMember(project, member))
+            missing << name;
+    }
+    return missing.join(u'\n');
+}
+
+bool CMainFrame::OpenMember(const CProject& project, const QString& member)
+{
+    CMultiDocTemplate& documents = *TemplateFor(member);
+    if (const CKsDoc* open = documents.FindDocument(member)) {
+        // A view joins when it first appears. One that is open already outside any project is opened anew.
+        const CView* view = open->Views().empty() ? nullptr : open->Views().front();
+        auto* window = WindowOf(MdiArea(), view);
+        if (m_projects.FindByView(view) || !window)
+            return true;
+        if (!window->close())
+            return m_projects.FindByView(view) == &project; // kept by the user: not in this project
+    }
+    return OpenDocument(documents, member) != nullptr;
+}
+
+bool CMainFrame::CloseProject(CProjectHandle handle)
+{
+    const CProject* found = m_projects.Find(handle);
+    if (!found)
+        return false;
+    const CProject project = *found;
+    for (const QPointer<CView>& view : project.views) {
+        if (auto* window = WindowOf(MdiArea(), view); window && !window->IsClosing() && !window->close())
+            return false;
+    }
+    Announce(KsRequest::ProjectClosing, project);
+    m_projects.Close(handle);
+    UpdateTitle();
+    UpdateActions();
+    return true;
+}
+
+/// Tells every view that a project opens or closes.
+void CMainFrame::Announce(WPARAM what, const CProject& project)
+{
+    CKSComm_Package package;
+    package.text = project.path;
+    package.project = project.handle;
+    const auto windows = MdiArea().subWindowList();
+    for (QMdiSubWindow* window : windows) {
+        if (const auto* child = qobject_cast<CKsMDIChildWnd*>(window))
+            KsSendMessage(child->GetActiveView(), KsMessage::ProjectManagement(), what,
+                          reinterpret_cast<LPARAM>(&package));
+    }
+}
+
+void CMainFrame::OnFileCloseProject()
+{
+    const auto& all = m_projects.All();
+    const CProject* active = m_projects.FindByView(GetActiveView());
+    if (!active && !all.empty())
+        active = all.back().get();
+    if (active)
+        CloseProject(active->handle);
+}

@@ -1,0 +1,80 @@
+#include "shell/plugin_loader.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QFileInfo>
+#include <QLibrary>
+#include <QStringList>
+
+namespace {
+
+QString Tr(const char* text)
+{
+    return QCoreApplication::translate("PluginLoader", text);
+}
+
+/// Finds every function of the boundary; names those that are missing.
+QStringList Resolve(QLibrary& library, CPlugin& plugin)
+{
+    QStringList missing;
+#define KS_PLUGIN_RESOLVE(result, function, arguments)                                                                 \
+    plugin.function = reinterpret_cast<decltype(plugin.function)>(library.resolve(#function));                         \
+    if (!plugin.function)                                                                                              \
+        missing << QStringLiteral(#function);
+    KS_PLUGIN_FUNCTIONS(KS_PLUGIN_RESOLVE)
+#undef KS_PLUGIN_RESOLVE
+    return missing;
+}
+
+QString TakeTemplates(CPlugin& plugin)
+{
+    const int count = plugin.KsGetNumDocTemplates();
+    for (int i = 0; i < count; ++i) {
+        std::unique_ptr<CMultiDocTemplate> documents(plugin.KsGetDocTemplatePtr(i));
+        if (!documents || documents->GetDocString(CMultiDocTemplate::filterExt).isEmpty())
+            return Tr("Its document template %1 is missing or names no file extension.").arg(i);
+        plugin.templates.push_back(std::move(documents));
+    }
+    return {};
+}
+
+} // namespace
+
+void CPlugin::UpdateName()
+{
+    if (!KsGetEditorString || !KsGetEditorString(&name) || name.isEmpty())
+        name = QFileInfo(file).completeBaseName();
+}
+
+std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
+{
+    auto plugin = std::make_unique<CPlugin>();
+    plugin->file = file;
+    plugin->name = QFileInfo(file).completeBaseName();
+    QLibrary library(file); // stays loaded when this object goes
+    // Whatever the library lacks itself is found missing now, not when the user works in it.
+    library.setLoadHints(QLibrary::ResolveAllSymbolsHint);
+    if (!library.load()) {
+        plugin->error = Tr("It could not be loaded: %1").arg(library.errorString());
+        return plugin;
+    }
+    const QStringList missing = Resolve(library, *plugin);
+    if (!missing.isEmpty()) {
+        plugin->error = Tr("It is no editor: it does not export %1.").arg(missing.join(QStringLiteral(", ")));
+        return plugin;
+    }
+    plugin->UpdateName();
+    plugin->error = TakeTemplates(*plugin);
+    return plugin;
+}
+
+std::vector<std::unique_ptr<CPlugin>> LoadPlugins(const QString& folder)
+{
+    std::vector<std::unique_ptr<CPlugin>> plugins;
+    const auto files = QDir(folder).entryInfoList(QDir::Files, QDir::Name);
+    for (const QFileInfo& file : files) {
+        if (QLibrary::isLibrary(file.fileName()))
+            plugins.push_back(LoadPlugin(file.absoluteFilePath()));
+    }
+    return plugins;
+}

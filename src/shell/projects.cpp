@@ -1,0 +1,159 @@
+#include "shell/projects.h"
+
+#include "tql/tql.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QFileInfo>
+#include <algorithm>
+
+namespace {
+
+/// Two spellings of one file are one member, whether it exists or not.
+QString FileKey(const QString& path)
+{
+    const QString canonical = QFileInfo(path).canonicalFilePath();
+    return canonical.isEmpty() ? QDir::cleanPath(path) : canonical;
+}
+
+/// A parameter file under reading; closes itself.
+class ParameterFile
+{
+public:
+    explicit ParameterFile(const QString& path) : m_handle(tqlLoadFile(path.toStdString())) {}
+    ~ParameterFile() { tqlClose(&m_handle); }
+    ParameterFile(const ParameterFile&) = delete;
+    ParameterFile& operator=(const ParameterFile&) = delete;
+    tqlHandle Get() const { return m_handle; }
+
+private:
+    tqlHandle m_handle;
+};
+
+QString Tr(const char* text)
+{
+    return QCoreApplication::translate("Projects", text);
+}
+
+bool ReadMembers(CProject& project, QString& error)
+{
+    const ParameterFile file(project.path);
+    if (TqlSyntaxError report; tqlGetSyntaxErr(file.Get(), &report)) {
+        tqlGetErrorGlb();
+        error = QString::fromStdString(report.message);
+        return false;
+    }
+    const tqlHandle target = tqlTargetByNameNum(file.Get(), "KVR_PROJECT", 1);
+    const tqlHandle section = tqlSectionByNameNum(target, "Members", 1);
+    if (!section) {
+        error = Tr("%1 is no project: it has no section [%2].")
+                    .arg(QFileInfo(project.path).fileName(), QString::fromLatin1(target ? "Members" : "KVR_PROJECT"));
+        return false;
+    }
+    const QDir folder = QFileInfo(project.path).absoluteDir();
+    for (int i = 1, count = tqlGetNoKeywords(section, "File"); i <= count; ++i) {
+        std::string member;
+        if (!tqlGetParam(section, "File", &member, i)) {
+            const TqlPosition place = tqlGetPosition(tqlKeywordByNameNum(section, "File", i));
+            error = Tr("%1, line %2: expected a file name after \"File =\".")
+                        .arg(QFileInfo(project.path).fileName())
+                        .arg(place.line);
+            return false;
+        }
+        // Written on either platform, read on either.
+        const QString name = QString::fromStdString(member).replace(u'\\', u'/');
+        project.members << QDir::cleanPath(folder.absoluteFilePath(name));
+    }
+    project.members.removeDuplicates();
+    return true;
+}
+
+} // namespace
+
+const CProject* CProjects::Open(const QString& path, QString& error)
+{
+    const QString key = FileKey(QFileInfo(path).absoluteFilePath());
+    for (const auto& project : m_projects) {
+        if (FileKey(project->path) == key)
+            return project.get();
+    }
+    auto project = std::make_unique<CProject>();
+    project->path = QFileInfo(path).absoluteFilePath();
+    project->name = QFileInfo(path).completeBaseName();
+    if (!ReadMembers(*project, error))
+        return nullptr;
+    project->handle = ++m_last;
+    m_projects.push_back(std::move(project));
+    return m_projects.back().get();
+}
+
+void CProjects::Close(CProjectHandle handle)
+{
+    std::erase_if(m_projects, [handle](const auto& project) { return project->handle == handle; });
+}
+
+CProject* CProjects::FindForChange(CProjectHandle handle)
+{
+    const auto found = std::find_if(m_projects.begin(), m_projects.end(),
+                                    [handle](const auto& project) { return project->handle == handle; });
+    return found == m_projects.end() ? nullptr : found->get();
+}
+
+const CProject* CProjects::Find(CProjectHandle handle) const
+{
+    return const_cast<CProjects*>(this)->FindForChange(handle);
+}
+
+const CProject* CProjects::FindByView(const CView* view) const
+{
+    for (const auto& project : m_projects) {
+        if (view && std::find(project->views.begin(), project->views.end(), view) != project->views.end())
+            return project.get();
+    }
+    return nullptr;
+}
+
+const CProject* CProjects::FindByMember(const QString& path) const
+{
+    const QString key = FileKey(path);
+    for (auto project = m_projects.rbegin(); project != m_projects.rend(); ++project) {
+        const QStringList& members = (*project)->members;
+        if (std::any_of(members.begin(), members.end(), [&](const QString& member) { return FileKey(member) == key; }))
+            return project->get();
+    }
+    return nullptr;
+}
+
+LRESULT CProjects::SwitchBoard(WPARAM request, const CKSComm_Package& package)
+{
+    if (request == KsRequest::JoinProject) {
+        const CProject* found = package.text.isEmpty() ? nullptr : FindByMember(package.text);
+        if (!found)
+            return 0;
+        CProject* project = FindForChange(found->handle);
+        if (package.view && FindByView(package.view) != project)
+            project->views.emplace_back(package.view);
+        return project->handle;
+    }
+    if (request == KsRequest::LeaveProject) {
+        if (CProject* project = FindForChange(package.project))
+            std::erase_if(project->views, [&](const QPointer<CView>& view) { return !view || view == package.view; });
+    }
+    return 0;
+}
+
+void CProjects::Forward(unsigned message, WPARAM request, const CKSComm_Package& package)
+{
+    const CProject* project = Find(package.project);
+    if (request != KsRequest::DataChanged || !project)
+        return;
+    const auto views = project->views; // a receiver may leave
+    const QString sender = FileKey(package.text);
+    for (const QPointer<CView>& view : views) {
+        // The sender's package may name no view, so its document is known by its path.
+        if (!view || view == package.view || !view->GetDocument() ||
+            FileKey(view->GetDocument()->GetPathName()) == sender)
+            continue;
+        KsSendMessage(view, message, request, reinterpret_cast<LPARAM>(&package));
+    }
+}

@@ -1,0 +1,50 @@
+// The projects that are open, and which views belong to which.
+//
+// A project file names member files. A document whose file is a member joins when its view asks the shell (switchboard
+// request 25) and then hears when another member's data change (request 522); other projects never do.
+#pragma once
+
+#include "ks/fc/doc.h"
+#include "ks/fc/package.h"
+
+#include <QPointer>
+#include <QStringList>
+#include <memory>
+#include <vector>
+
+using CProjectHandle = std::intptr_t; // never 0, never used twice
+
+struct CProject
+{
+    CProjectHandle handle = 0;
+    QString path;                       // absolute
+    QString name;                       // the file's base name
+    QStringList members;                // absolute paths, in file order
+    std::vector<QPointer<CView>> views; // those that joined
+};
+
+class CProjects
+{
+public:
+    /// Reads a project file. Null, with `error` for the user, when that fails. One that is open already is returned.
+    const CProject* Open(const QString& path, QString& error);
+    /// Its views stop being members.
+    void Close(CProjectHandle handle);
+    const CProject* Find(CProjectHandle handle) const;
+    /// The project that a view has joined; null for none.
+    const CProject* FindByView(const CView* view) const;
+    /// The project opened last that a file is a member of; null for none.
+    const CProject* FindByMember(const QString& path) const;
+    const std::vector<std::unique_ptr<CProject>>& All() const { return m_projects; }
+
+    /// Answers the switchboard: 25 with the handle of the project that the package's file is a member of or 0, 24 takes
+    /// the package's view out of its project. The package is not kept.
+    LRESULT SwitchBoard(WPARAM request, const CKSComm_Package& package);
+    /// Hands a change of data on to every other document's view of the package's project.
+    void Forward(unsigned message, WPARAM request, const CKSComm_Package& package);
+
+private:
+    CProject* FindForChange(CProjectHandle handle);
+    std::vector<std::unique_ptr<CProject>> m_projects; // in the order of opening
+    CProjectHandle m_last = 0;
+};

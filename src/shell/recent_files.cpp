@@ -1,0 +1,54 @@
+#include "shell/recent_files.h"
+
+#include "shell/settings_keys.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <QSettings>
+
+namespace {
+
+QStringList Read()
+{
+    return QSettings().value(Settings::RecentFiles).toStringList();
+}
+
+void Write(const QStringList& files)
+{
+    QSettings().setValue(Settings::RecentFiles, files);
+}
+
+} // namespace
+
+QStringList CRecentFiles::Files()
+{
+    QStringList files = Read();
+    if (files.removeIf([](const QString& file) { return !QFileInfo::exists(file); }))
+        Write(files);
+    return files;
+}
+
+void CRecentFiles::Add(const QString& path)
+{
+    QStringList files = Read();
+    const QString clean = QDir::cleanPath(path);
+    files.removeAll(clean);
+    files.prepend(clean);
+    Write(files.mid(0, Longest));
+}
+
+void CRecentFiles::Rename(const QString& oldPath, const QString& newPath)
+{
+    QStringList files = Read();
+    const auto index = files.indexOf(QDir::cleanPath(oldPath));
+    if (index < 0)
+        return;
+    files[index] = QDir::cleanPath(newPath);
+    files.removeDuplicates();
+    Write(files);
+}
+
+void CRecentFiles::Clear()
+{
+    Write({});
+}

@@ -1,0 +1,67 @@
+#include "shell/shell_main.h"
+
+#include "ks/language/language.h"
+#include "shell/main_frame.h"
+#include "shell/settings_keys.h"
+
+#include <QApplication>
+#include <QCommandLineParser>
+#include <QDir>
+#include <QLocale>
+#include <QSettings>
+#include <QTimer>
+
+namespace {
+
+/// The language chosen last; at the first start the one of the desktop, as far as there is a translation.
+QString StartLanguage()
+{
+    const QString chosen = QSettings().value(Settings::Language).toString();
+    if (KsLanguage::Available().contains(chosen))
+        return chosen;
+    const QLocale desktop = QLocale::system();
+    if (desktop.language() == QLocale::Japanese)
+        return QStringLiteral("ja");
+    const bool british = desktop.language() == QLocale::English && desktop.territory() == QLocale::UnitedKingdom;
+    return british ? QStringLiteral("en_GB") : QStringLiteral("en_US");
+}
+
+} // namespace
+
+int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
+{
+    QCoreApplication::setOrganizationName(QStringLiteral("KVR"));
+    QCoreApplication::setApplicationName(QStringLiteral("KVR Shell"));
+    QCoreApplication::setApplicationVersion(QStringLiteral(KVR_VERSION));
+    QApplication app(argc, argv);
+
+    KsLanguage::Instance().SetCurrent(StartLanguage());
+    KsLangLoadResDll("ks", nullptr, 0);
+    KsLangLoadResDll("kvrshell", nullptr, 0);
+
+    QCommandLineParser parser;
+    parser.setApplicationDescription(QCoreApplication::translate("ShellMain", "Shell of the river model editors"));
+    const QCommandLineOption plugins(QStringLiteral("plugins"),
+                                     QCoreApplication::translate("ShellMain", "Folder of the editors."),
+                                     QCoreApplication::translate("ShellMain", "folder"),
+                                     QCoreApplication::applicationDirPath() + QStringLiteral("/plugins"));
+    parser.addOption(plugins);
+    parser.addPositionalArgument(QStringLiteral("files"),
+                                 QCoreApplication::translate("ShellMain", "Files and projects to open."),
+                                 QStringLiteral("[files...]"));
+    parser.addHelpOption();
+    parser.addVersionOption();
+    parser.process(app);
+
+    CMainFrame frame;
+    frame.LoadPlugins(parser.value(plugins));
+    frame.show();
+    QTimer::singleShot(0, &frame, [&] {
+        const QStringList files = parser.positionalArguments();
+        for (const QString& file : files)
+            frame.OpenFile(QDir::current().absoluteFilePath(file));
+        if (onStarted)
+            onStarted(frame);
+    });
+    return QApplication::exec();
+}
