@@ -1,0 +1,168 @@
+// View and sheet with their pages, in a main frame as the shell has it.
+#include "module_fixture.h"
+
+#include "ks/fc/doc_template.h"
+#include "module/kavo0_hd.h"
+#include "module/sheet.h"
+#include "module/view.h"
+#include "pages/framework/gen_grid.h"
+#include "pages/framework/page.h"
+
+#include <QApplication>
+#include <QDialog>
+#include <QLineEdit>
+#include <QTest>
+#include <QTimer>
+#include <QUndoStack>
+
+namespace {
+
+class OtherView : public CView
+{
+};
+
+class ViewTest : public ModuleTest
+{
+protected:
+    ViewTest()
+    {
+        Write(Path("river.hdkv"), SmallFile);
+        frame.resize(900, 600);
+        frame.show();
+        frame.activateWindow();
+        EXPECT_TRUE(QTest::qWaitForWindowActive(&frame));
+    }
+
+    CKavo0_hdView* Open()
+    {
+        documents.reset(CKavo0_hd::CreateMainDlg());
+        CKsDoc* document = documents->OpenDocumentFile(&frame, Path("river.hdkv"));
+        return document && !document->Views().empty() ? static_cast<CKavo0_hdView*>(document->Views()[0]) : nullptr;
+    }
+    std::vector<unsigned> ToolbarMessages()
+    {
+        std::vector<unsigned> found;
+        for (const Message& message : std::exchange(messages, {})) {
+            if (message.message == KsMessage::ShowToolbar() || message.message == KsMessage::HideToolbar())
+                found.push_back(message.message);
+        }
+        return found;
+    }
+
+    CKsMDIFrameWnd frame;
+    std::unique_ptr<CMultiDocTemplate> documents;
+};
+
+TEST_F(ViewTest, ShowsThePagesInOrderAndJoinsTheProject)
+{
+    projectHandle = 5;
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    ASSERT_GT(view->Sheet()->PageCount(), 0);
+    EXPECT_EQ(view->Sheet()->tabText(0), "Initial");
+    EXPECT_EQ(view->ActivePage(), view->Sheet()->PageAt(0));
+    EXPECT_EQ(view->ActivePage()->GetGrid()->BranchNameColumn(), 1);
+    EXPECT_EQ(view->GetDocument()->ProjectHandle(), 5);
+    EXPECT_FALSE(view->GetDocument()->IsModified());
+}
+
+TEST_F(ViewTest, AChangedLocationIsToldToTheProjectAndLeavingIsToo)
+{
+    projectHandle = 5;
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    auto* grid = view->ActivePage()->GetGrid();
+    const auto changes = [&] {
+        return std::count_if(messages.begin(), messages.end(),
+                             [](const Message& m) { return m.request == KsRequest::DataChanged; });
+    };
+    const auto edit = [&](int column, const char* text) {
+        grid->SetCurrentCell(1, column);
+        for (const char* c = text; *c; ++c) // the first one opens the cell's editor
+            QTest::keyClick(QApplication::focusWidget(), *c);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+    };
+    grid->setFocus();
+    edit(3, "7.5");
+    EXPECT_EQ(changes(), 0);
+    EXPECT_EQ(view->GetDocument()->Parameters().InitList.GetAt(0).InitialH, 7.5);
+    edit(2, "150");
+    EXPECT_EQ(changes(), 1);
+    EXPECT_EQ(view->GetDocument()->Parameters().InitList.GetAt(0).Chainage, 150);
+
+    view->GetDocument()->SetModifiedFlag(false);
+    messages.clear();
+    view->CloseWindow();
+    QTest::qWait(50);
+    ASSERT_EQ(messages.size(), 2u);
+    EXPECT_EQ(messages[0].request, KsRequest::LeaveProject);
+    EXPECT_EQ(messages[1].request, KsRequest::DataChanged);
+    EXPECT_TRUE(documents->Documents().empty());
+}
+
+TEST_F(ViewTest, ToolBarFollowsActivation)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    OtherView other;
+    CKavo0_hdView sibling;
+    messages.clear();
+    view->OnActivateView(true, view, nullptr);
+    EXPECT_EQ(ToolbarMessages(), std::vector{KsMessage::ShowToolbar()});
+    view->OnActivateView(false, &sibling, view);
+    EXPECT_TRUE(ToolbarMessages().empty());
+    view->OnActivateView(false, nullptr, view);
+    EXPECT_TRUE(ToolbarMessages().empty());
+    view->OnActivateView(false, &other, view);
+    EXPECT_EQ(ToolbarMessages(), std::vector{KsMessage::HideToolbar()});
+}
+
+TEST_F(ViewTest, CtrlF4ClosesTheWindowFromInsideTheGrid)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    QTest::keyClick(view->ActivePage()->GetGrid(), Qt::Key_F4, Qt::ControlModifier);
+    QTest::qWait(50);
+    EXPECT_TRUE(documents->Documents().empty());
+}
+
+TEST_F(ViewTest, SearchGoesOnFromTheLastFindAndSaysWhenThereIsNoMore)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    auto* grid = view->ActivePage()->GetGrid();
+    EXPECT_FALSE(view->IsCommandEnabled(Command::SearchAgain));
+    const auto search = [&](const QString& name) {
+        QTimer::singleShot(20, view, [name] {
+            auto* dialog = QApplication::activeModalWidget();
+            ASSERT_NE(dialog, nullptr);
+            for (auto* edit : dialog->findChildren<QLineEdit*>()) {
+                if (edit->objectName().endsWith("_1058"))
+                    edit->setText(name);
+            }
+            QTest::keyClick(dialog, Qt::Key_Return);
+        });
+        view->Execute(Command::Search);
+    };
+    search("NOWHERE");
+    EXPECT_EQ(boxes, QStringList("Searched item not found"));
+    boxes.clear();
+    search("MA");
+    EXPECT_EQ(grid->CurrentRow(), 1);
+    view->Execute(Command::SearchAgain);
+    EXPECT_EQ(grid->CurrentRow(), 3);
+    EXPECT_TRUE(boxes.isEmpty());
+    view->Execute(Command::SearchAgain);
+    EXPECT_EQ(boxes, QStringList("The last occurence of searched item already found"));
+}
+
+TEST_F(ViewTest, AnswersNothingToMessagesItDoesNotKnow)
+{
+    CKavo0_hdView view;
+    for (const WPARAM request : {WPARAM(0), WPARAM(2), WPARAM(41), WPARAM(522)}) {
+        EXPECT_EQ(view.WindowProc(KsMessage::BetweenEditors(), request, 0), 0);
+        EXPECT_EQ(view.WindowProc(KsMessage::ProjectManagement(), request, 0), 0);
+    }
+}
+
+} // namespace
