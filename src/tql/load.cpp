@@ -1,4 +1,5 @@
 // Files and texts into structures, and the error state.
+#include "tql/bytes.h"
 #include "tql/parser.h"
 
 #include <algorithm>
@@ -20,7 +21,7 @@ void SetGlobalError(TqlError code)
     globalError = code;
 }
 
-Text::Text(std::size_t size) : m_bytes(std::make_unique_for_overwrite<char[]>(size + 3)), m_size(size) {}
+Text::Text(std::size_t size) : m_bytes(std::make_unique_for_overwrite<char[]>(size + 2 + ReadAhead)), m_size(size) {}
 
 void Text::Grow(std::size_t size)
 {
@@ -35,7 +36,7 @@ void Text::Finish(std::size_t size)
     m_begin = size >= 3 && std::memcmp(Data(), "\xEF\xBB\xBF", 3) == 0 ? 4 : 1;
     m_bytes[m_begin - 1] = '\0';
     Data()[size] = '\n';
-    Data()[size + 1] = '\0';
+    std::memset(Data() + size + 1, 0, ReadAhead);
 }
 
 void Structure::Clear()

@@ -69,7 +69,7 @@ struct Section
 };
 
 /// The text of a file, framed so that scanning needs no bounds: a NUL (which no text holds) before it, and after it a
-/// line feed and a NUL.
+/// line feed and zeros.
 class Text
 {
 public:

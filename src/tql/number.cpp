@@ -1,5 +1,6 @@
 #include "tql/number.h"
 
+#include "tql/bytes.h"
 #include "tql/char_class.h"
 
 #include <charconv>
@@ -16,13 +17,6 @@ constexpr const char* AnyNumber = "a number such as -12, 0.5 or 1e-05";
 constexpr const char* IntRange = "an integer from -2147483648 to 2147483647";
 constexpr const char* DoubleRange = "a number within the range of 64-bit floats";
 
-const char* SkipDigits(const char* p)
-{
-    while (Is(*p, Digit))
-        ++p;
-    return p;
-}
-
 const char* WordEndAt(const char* p)
 {
     while (!Is(*p, WordEnd))
@@ -32,13 +26,11 @@ const char* WordEndAt(const char* p)
 
 bool FitsInt(const char* digits, const char* end, bool negative)
 {
-    std::int64_t value = 0;
-    for (; digits < end; ++digits) {
-        value = value * 10 + (*digits - '0');
-        if (value > std::int64_t{std::numeric_limits<std::int32_t>::max()} + negative)
-            return false;
-    }
-    return true;
+    while (digits < end && *digits == '0')
+        ++digits;
+    std::uint64_t value = 0;
+    return end - digits <= 10 && ReadDigits(digits, value) &&
+           value <= std::uint64_t{std::numeric_limits<std::int32_t>::max()} + negative;
 }
 
 // A value whose text has no exponent and fewer digits than this is in range whatever the digits are.
@@ -88,23 +80,60 @@ NumberScan ScanNumber(const char* const p)
     return {end, TqlType::Double, nullptr};
 }
 
-std::int32_t IntValue(const char* p)
+const char* ReadInt(const char* p, std::int32_t& value)
 {
     const bool negative = *p == '-';
-    std::int64_t value = 0;
-    for (p += negative; Is(*p, Digit); ++p)
-        value = value * 10 + (*p - '0');
-    return static_cast<std::int32_t>(negative ? -value : value);
+    std::uint64_t digits = 0;
+    p = ReadDigits(p + negative, digits);
+    const auto number = static_cast<std::int64_t>(digits);
+    value = static_cast<std::int32_t>(negative ? -number : number);
+    return p;
 }
 
-double DoubleValue(const char* p)
+namespace {
+
+// Powers of ten that are exact as floats.
+constexpr double ExactPowers[] = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
+                                  1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
+
+const char* ReadAnyDouble(const char* p, double& value)
 {
-    const char* const digits = p + (*p == '-');
-    if (*digits == 'n')
-        return std::copysign(std::numeric_limits<double>::quiet_NaN(), digits == p ? 1.0 : -1.0);
-    double value = 0;
-    std::from_chars(p, WordEndAt(p), value);
-    return value;
+    const char* const end = WordEndAt(p);
+    const bool negative = *p == '-';
+    if (p[negative] == 'n')
+        value = std::copysign(std::numeric_limits<double>::quiet_NaN(), negative ? -1.0 : 1.0);
+    else
+        std::from_chars(p, end, value);
+    return end;
+}
+
+} // namespace
+
+// Most numbers have few digits: both the digits as one whole number and the power of ten are exact then, and so their
+// quotient is rounded once, as it should be (W. D. Clinger, How to Read Floating Point Numbers Accurately, 1990).
+const char* ReadDouble(const char* const p, double& value)
+{
+    constexpr std::uint64_t exactLimit = std::uint64_t{1} << 53;
+    constexpr std::ptrdiff_t noOverflow = 19;
+    const bool negative = *p == '-';
+    std::uint64_t digits = 0;
+    const char* end = ReadDigits(p + negative, digits);
+    std::size_t places = 0;
+    const bool isInteger = Is(*end, WordEnd);
+    if (*end == '.') {
+        const char* const fraction = end + 1;
+        end = ReadDigits(fraction, digits);
+        places = static_cast<std::size_t>(end - fraction);
+    }
+    if (!Is(*end, WordEnd) || end - p > noOverflow || digits > exactLimit) {
+        end = ReadAnyDouble(p, value);
+    } else {
+        const double quotient = static_cast<double>(digits) / ExactPowers[places];
+        value = negative ? -quotient : quotient;
+    }
+    if (isInteger && value == 0)
+        value = 0; // the integer -0 is 0
+    return end;
 }
 
 void AppendInt(std::string& out, std::int32_t value)
@@ -120,14 +149,14 @@ void AppendDouble(std::string& out, double value)
         out += std::signbit(value) ? "-nan" : "nan";
         return;
     }
-    char buffer[40];
-    const char* const end = std::to_chars(buffer, buffer + sizeof buffer, value).ptr;
+    char buffer[40 + ReadAhead];
+    char* const end = std::to_chars(buffer, buffer + sizeof buffer - ReadAhead, value).ptr;
+    std::memset(end, 0, ReadAhead);
     out.append(buffer, static_cast<std::size_t>(end - buffer));
     // Whole numbers look like integers; these must be ones, or say that they are floats.
     const char* const digits = buffer + (buffer[0] == '-');
-    for (const char* p = digits; p < end; ++p)
-        if (!Is(*p, Digit))
-            return;
+    if (SkipDigits(digits) != end)
+        return;
     if (!FitsInt(digits, end, digits != buffer) || (value == 0 && std::signbit(value)))
         out += ".0";
 }

@@ -18,12 +18,13 @@ struct NumberScan
 /// Looks at the number, `nan` or `inf` at `p`, in a text that ends in a line feed.
 NumberScan ScanNumber(const char* p);
 
-// The value of a number that was scanned well.
-std::int32_t IntValue(const char* p);
-double DoubleValue(const char* p);
+// Values of numbers that were scanned well; both return the number's end.
+const char* ReadInt(const char* p, std::int32_t& value);
+/// Of integers, too.
+const char* ReadDouble(const char* p, double& value);
 
 void AppendInt(std::string& out, std::int32_t value);
-/// The shortest text from which DoubleValue gives the same bits (of NaNs, the sign only).
+/// The shortest text from which ReadDouble gives the same bits (of NaNs, the sign only).
 void AppendDouble(std::string& out, double value);
 
 } // namespace tql

@@ -1,5 +1,6 @@
 #include "tql/parser.h"
 
+#include "tql/bytes.h"
 #include "tql/char_class.h"
 #include "tql/scan.h"
 #include "tql/utf8.h"
@@ -261,7 +262,9 @@ bool Parse(Structure& structure, const std::string& file)
 
 bool IsParamList(std::string_view params)
 {
-    const std::string line = std::string(params) + '\n';
+    std::string line(params);
+    line += '\n';
+    line.append(ReadAhead, '\0');
     const char* p = line.c_str();
     const char* const end = p + params.size();
     if (FindBadByte(p, end) != end)

@@ -1,6 +1,6 @@
 #include "tql/scan.h"
 
-#include "tql/char_class.h"
+#include "tql/bytes.h"
 #include "tql/number.h"
 #include "tql/utf8.h"
 
@@ -73,8 +73,10 @@ ParamScan ScanQuoted(const char* p)
 {
     const Quoting& quoting = QuotingOf(*p);
     for (++p;;) {
-        while (!Is(*p, quoting.stop))
-            ++p;
+        p = FindByte(p, [&](std::uint64_t block) {
+            return EqualMask(block, quoting.close) | EqualMask(block, '\\') | BelowMask(block, 0x20) |
+                   EqualMask(block, 0x7F);
+        });
         if (*p == quoting.close)
             return {p + 1, nullptr};
         if (*p == '\t') {
@@ -182,29 +184,33 @@ ParamScan ScanParam(const char* p)
     default:
         break;
     }
-    if (!Is(*p, Digit) && *p != '-' && *p != '.' && *p != 'n' && *p != 'i')
+    if (!StartsNumber(*p))
         return {p, "a parameter (a number, true, false, \"text\" or <file name>)"};
     const NumberScan number = ScanNumber(p);
     return number.expected ? ParamScan{p, number.expected} : ParamScan{number.end, nullptr};
 }
 
+namespace {
+
+// Closing quote or next backslash of a string or file name that was checked.
+const char* FindQuoteEnd(const char* p, char close)
+{
+    return FindByte(p, [=](std::uint64_t block) { return EqualMask(block, close) | EqualMask(block, '\\'); });
+}
+
+} // namespace
+
 const char* SkipParam(const char* p)
 {
     if (*p == '"' || *p == '<') {
         const char close = QuotingOf(*p).close;
-        for (++p; *p != close; ++p)
-            p += *p == '\\'; // the letter after it is not looked at
+        for (p = FindQuoteEnd(p + 1, close); *p != close; p = FindQuoteEnd(p, close))
+            p += 2; // the letter behind a backslash is not looked at
         return p + 1;
     }
     while (!Is(*p, WordEnd))
         ++p;
     return p;
-}
-
-const char* NextParam(const char* p)
-{
-    p = SkipBlanks(SkipParam(p));
-    return *p == ',' ? SkipBlanks(p + 1) : nullptr;
 }
 
 TqlType ParamType(const char* p)
@@ -220,23 +226,19 @@ TqlType ParamType(const char* p)
     default:
         break;
     }
-    p += *p == '-';
-    while (Is(*p, Digit))
-        ++p;
-    return Is(*p, WordEnd) ? TqlType::Int : TqlType::Double;
+    return Is(*SkipDigits(p + (*p == '-')), WordEnd) ? TqlType::Int : TqlType::Double;
 }
 
-void UnescapeParam(const char* p, std::string& out)
+const char* UnescapeParam(const char* p, std::string& out)
 {
     const Quoting& quoting = QuotingOf(*p);
     out.clear();
     for (++p;;) {
         const char* const run = p;
-        while (*p != quoting.close && *p != '\\')
-            ++p;
+        p = FindQuoteEnd(p, quoting.close);
         out.append(run, static_cast<std::size_t>(p - run));
         if (*p == quoting.close)
-            return;
+            return p + 1;
         ++p;
         if (*p == quoting.close || *p == '\\') {
             out += *p++;

@@ -65,7 +65,7 @@ tqlHandle tqlTargetByNameNum(tqlHandle structure, std::string_view name, int num
 tqlHandle tqlSectionByNameNum(tqlHandle parent, std::string_view name, int number);
 tqlHandle tqlKeywordByNameNum(tqlHandle section, std::string_view name, int number);
 tqlHandle tqlParamByNum(tqlHandle keyword, int number);
-/// The parameter after this one in its keyword; null after the last. The quick way through all parameters.
+/// The parameter after this one in its keyword; null behind the last.
 tqlHandle tqlNextParam(tqlHandle param);
 
 /// Counts of direct children. For a structure, tqlGetNoSections counts its targets.
@@ -110,6 +110,13 @@ bool tqlGetInt(tqlHandle param, std::int32_t* value);
 bool tqlGetDouble(tqlHandle param, double* value);
 bool tqlGetBool(tqlHandle param, bool* value);
 bool tqlGetString(tqlHandle param, std::string* value);
+
+/// The same, and the handle moves on to the next parameter (null behind the last) whatever the type was. The quick way
+/// through all parameters of a keyword.
+bool tqlTakeInt(tqlHandle* param, std::int32_t* value);
+bool tqlTakeDouble(tqlHandle* param, double* value);
+bool tqlTakeBool(tqlHandle* param, bool* value);
+bool tqlTakeString(tqlHandle* param, std::string* value);
 
 /// Value of parameter `param` of occurrence `keyword` of the named keyword; same contract.
 bool tqlGetParam(tqlHandle section, std::string_view name, bool* value, int keyword = 1, int param = 1);

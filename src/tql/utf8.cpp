@@ -1,6 +1,6 @@
 #include "tql/utf8.h"
 
-#include <cstring>
+#include "tql/bytes.h"
 
 namespace tql {
 
@@ -14,10 +14,8 @@ bool IsContinuation(unsigned char byte)
 // Eight bytes that are all ASCII and none of them NUL.
 bool IsPlainBlock(const char* p)
 {
-    constexpr std::uint64_t low = 0x0101010101010101, high = 0x8080808080808080;
-    std::uint64_t block;
-    std::memcpy(&block, p, sizeof block);
-    return ((block | ((block - low) & ~block)) & high) == 0;
+    const std::uint64_t block = LoadBlock(p);
+    return ((block & Repeat(0x80)) | EqualMask(block, '\0')) == 0;
 }
 
 } // namespace

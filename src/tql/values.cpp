@@ -7,19 +7,12 @@ using namespace tql;
 
 namespace {
 
-// The parameter's text when it is of that type.
-const char* ParamOf(tqlHandle param, TqlType type)
-{
-    const char* const p = AsParam(param);
-    return p && ParamType(p) == type ? p : nullptr;
-}
-
 tqlHandle ParamOf(tqlHandle section, std::string_view name, int keyword, int param)
 {
     return tqlParamByNum(tqlKeywordByNameNum(section, name, keyword), param);
 }
 
-// One letter of a signature: which types it takes, and storing one.
+// Which types a letter of a signature takes.
 bool Fits(char letter, TqlType type)
 {
     switch (letter) {
@@ -45,15 +38,6 @@ bool Fits(char letter, const TqlOut& out)
            std::visit([](const auto* pointer) { return pointer != nullptr; }, out);
 }
 
-struct Store
-{
-    tqlHandle param;
-    void operator()(std::int32_t* value) const { tqlGetInt(param, value); }
-    void operator()(double* value) const { tqlGetDouble(param, value); }
-    void operator()(bool* value) const { tqlGetBool(param, value); }
-    void operator()(std::string* value) const { tqlGetString(param, value); }
-};
-
 } // namespace
 
 TqlType tqlGetType(tqlHandle param)
@@ -62,38 +46,93 @@ TqlType tqlGetType(tqlHandle param)
     return p ? ParamType(p) : TqlType::None;
 }
 
-bool tqlGetInt(tqlHandle param, std::int32_t* value)
-{
-    const char* const p = ParamOf(param, TqlType::Int);
-    if (p)
-        *value = IntValue(p);
-    return p != nullptr;
-}
+// Each looks at the parameter, stores its value when it is of the type, and leaves `end` behind what it looked at.
+namespace {
 
-bool tqlGetDouble(tqlHandle param, double* value)
+bool ReadValue(const char* p, std::int32_t* value, const char*& end)
 {
-    const char* const p = AsParam(param);
-    if (!p || !Fits('d', ParamType(p)))
+    if (!p || ParamType(p) != TqlType::Int)
         return false;
-    *value = DoubleValue(p);
+    end = ReadInt(p, *value);
     return true;
 }
 
-bool tqlGetBool(tqlHandle param, bool* value)
+bool ReadValue(const char* p, double* value, const char*& end)
 {
-    const char* const p = ParamOf(param, TqlType::Bool);
-    if (p)
-        *value = *p == 't';
-    return p != nullptr;
+    if (!p || !StartsNumber(*p))
+        return false;
+    end = ReadDouble(p, *value);
+    return true;
 }
 
-bool tqlGetString(tqlHandle param, std::string* value)
+bool ReadValue(const char* p, bool* value, const char*& end)
 {
-    const char* const p = AsParam(param);
+    if (!p || (*p != 't' && *p != 'f'))
+        return false;
+    *value = *p == 't';
+    end = SkipParam(p);
+    return true;
+}
+
+bool ReadValue(const char* p, std::string* value, const char*& end)
+{
     if (!p || (*p != '"' && *p != '<'))
         return false;
-    UnescapeParam(p, *value);
+    end = UnescapeParam(p, *value);
     return true;
+}
+
+template <typename Value>
+bool Get(tqlHandle param, Value* value)
+{
+    const char* end;
+    return ReadValue(AsParam(param), value, end);
+}
+
+template <typename Value>
+bool Take(tqlHandle* param, Value* value)
+{
+    const char* const p = AsParam(*param);
+    const char* end = nullptr;
+    const bool stored = ReadValue(p, value, end);
+    *param = stored ? HandleOf(ParamBehind(end)) : tqlNextParam(*param);
+    return stored;
+}
+
+} // namespace
+
+bool tqlGetInt(tqlHandle param, std::int32_t* value)
+{
+    return Get(param, value);
+}
+bool tqlGetDouble(tqlHandle param, double* value)
+{
+    return Get(param, value);
+}
+bool tqlGetBool(tqlHandle param, bool* value)
+{
+    return Get(param, value);
+}
+bool tqlGetString(tqlHandle param, std::string* value)
+{
+    return Get(param, value);
+}
+
+bool tqlTakeInt(tqlHandle* param, std::int32_t* value)
+{
+    return Take(param, value);
+}
+bool tqlTakeDouble(tqlHandle* param, double* value)
+{
+    return Take(param, value);
+}
+bool tqlTakeBool(tqlHandle* param, bool* value)
+{
+    return Take(param, value);
+}
+bool tqlTakeString(tqlHandle* param, std::string* value)
+{
+    return Take(param, value);
 }
 
 bool tqlGetParam(tqlHandle section, std::string_view name, bool* value, int keyword, int param)
@@ -133,9 +172,7 @@ bool tqlGetListParam(tqlHandle section, std::string_view name, int number, std::
         if (!Fits(signature[i], tqlGetType(param)) || !Fits(signature[i], out[i]))
             return false;
     param = first;
-    for (const TqlOut& pointer : out) {
-        std::visit(Store{param}, pointer);
-        param = tqlNextParam(param);
-    }
+    for (const TqlOut& pointer : out)
+        std::visit([&](auto* value) { Take(&param, value); }, pointer);
     return true;
 }
