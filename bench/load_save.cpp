@@ -47,8 +47,8 @@ HD_Parameters MakeParameters(int count)
         HD_Initial record;
         record.RiverName = "BRANCH_" + std::to_string(i / 5000 + 1);
         record.Chainage = i % 5000 * 12.5;
-        record.InitialH = 1.25 + i % 1000 * 0.01;
-        record.InitialQ = 10.5 + i % 777 * 0.125;
+        record.InitialH = (125 + i % 1000) / 100.0;
+        record.InitialQ = (105 + i % 777) / 10.0;
         parameters.InitList.Add(std::move(record));
     }
     return parameters;

@@ -11,8 +11,7 @@ void ReadDateTime(ParamCursor& params, HDDateTime& value)
     HDDateTime read;
     bool whole = true; // a date made of halves would be neither the old nor the new one
     for (std::int32_t* const part : {&read.Year, &read.Month, &read.Day, &read.Hour, &read.Minute, &read.Second}) {
-        whole &= tqlGetInt(params.param, part);
-        params.Next();
+        whole &= params.Take(part);
     }
     if (whole)
         value = read;
@@ -125,27 +124,26 @@ void ReadFields(ParamCursor& params, FieldList fields, void* object)
         void* const value = field.address(object);
         switch (field.kind) {
         case FieldKind::Number:
-            tqlGetDouble(params.param, static_cast<double*>(value));
+            params.Take(static_cast<double*>(value));
             break;
         case FieldKind::Integer:
         case FieldKind::Choice:
-            tqlGetInt(params.param, static_cast<std::int32_t*>(value));
+            params.Take(static_cast<std::int32_t*>(value));
             break;
         case FieldKind::Boolean:
-            tqlGetBool(params.param, static_cast<bool*>(value));
+            params.Take(static_cast<bool*>(value));
             break;
         case FieldKind::Text:
         case FieldKind::FileName:
-            tqlGetString(params.param, static_cast<std::string*>(value));
+            params.Take(static_cast<std::string*>(value));
             break;
         case FieldKind::DateTime:
             ReadDateTime(params, *static_cast<HDDateTime*>(value));
-            continue;
+            break;
         case FieldKind::Group:
             ReadGroup(params, *field.group, value);
-            continue;
+            break;
         }
-        params.Next();
     }
 }
 

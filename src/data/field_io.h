@@ -19,6 +19,13 @@ struct ParamCursor
 
     explicit ParamCursor(tqlHandle keyword) : param(tqlParamByNum(keyword, 1)), count(tqlGetNoParams(keyword)) {}
     int Left() const { return count - number + 1; }
+    /// Reads the parameter and goes to the next; false, and the value untouched, when it is of another type.
+    template <typename Value>
+    bool Take(Value* value)
+    {
+        ++number;
+        return tqlTake(&param, value);
+    }
     void Next()
     {
         param = tqlNextParam(param);

@@ -14,10 +14,8 @@ void WriteRecord(tqlHandle structure, const HD_RiverPos& record, FieldList field
 void ReadRecord(tqlHandle keyword, HD_RiverPos& record, FieldList fields)
 {
     ParamCursor params(keyword);
-    tqlGetString(params.param, &record.RiverName);
-    params.Next();
-    tqlGetDouble(params.param, &record.Chainage);
-    params.Next();
+    params.Take(&record.RiverName);
+    params.Take(&record.Chainage);
     ReadFields(params, fields, &record);
     record.Extra.Read(params.param);
 }

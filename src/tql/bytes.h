@@ -74,7 +74,7 @@ constexpr std::uint64_t DigitsValue(std::uint64_t block, int count)
 /// Appends the digits at `p` to `value` (which may overflow) and returns their end.
 inline const char* ReadDigits(const char* p, std::uint64_t& value)
 {
-    constexpr std::uint64_t powers[] = {1, 10, 100, 1000, 10000, 100000, 1000000, 10000000, 100000000};
+    static constexpr std::uint64_t powers[] = {1, 10, 100, 1000, 10000, 100000, 1000000, 10000000, 100000000};
     for (;;) {
         const std::uint64_t block = LoadBlock(p);
         const int count = FirstIn(NoDigitMask(block));

@@ -1,8 +1,5 @@
 #include "tql/number.h"
 
-#include "tql/bytes.h"
-#include "tql/char_class.h"
-
 #include <charconv>
 #include <cmath>
 #include <cstring>
@@ -96,6 +93,7 @@ namespace {
 constexpr double ExactPowers[] = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
                                   1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
 
+// Everything else: long, with an exponent, `nan` or `inf`.
 const char* ReadAnyDouble(const char* p, double& value)
 {
     const char* const end = WordEndAt(p);

@@ -1,6 +1,5 @@
 #include "tql/scan.h"
 
-#include "tql/bytes.h"
 #include "tql/number.h"
 #include "tql/utf8.h"
 
@@ -184,6 +183,8 @@ ParamScan ScanParam(const char* p)
     default:
         break;
     }
+    if (const char* const end = SkipPlainNumber(p))
+        return {end, nullptr};
     if (!StartsNumber(*p))
         return {p, "a parameter (a number, true, false, \"text\" or <file name>)"};
     const NumberScan number = ScanNumber(p);

@@ -113,10 +113,10 @@ bool tqlGetString(tqlHandle param, std::string* value);
 
 /// The same, and the handle moves on to the next parameter (null behind the last) whatever the type was. The quick way
 /// through all parameters of a keyword.
-bool tqlTakeInt(tqlHandle* param, std::int32_t* value);
-bool tqlTakeDouble(tqlHandle* param, double* value);
-bool tqlTakeBool(tqlHandle* param, bool* value);
-bool tqlTakeString(tqlHandle* param, std::string* value);
+bool tqlTake(tqlHandle* param, std::int32_t* value);
+bool tqlTake(tqlHandle* param, double* value);
+bool tqlTake(tqlHandle* param, bool* value);
+bool tqlTake(tqlHandle* param, std::string* value);
 
 /// Value of parameter `param` of occurrence `keyword` of the named keyword; same contract.
 bool tqlGetParam(tqlHandle section, std::string_view name, bool* value, int keyword = 1, int param = 1);

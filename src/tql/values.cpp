@@ -118,19 +118,19 @@ bool tqlGetString(tqlHandle param, std::string* value)
     return Get(param, value);
 }
 
-bool tqlTakeInt(tqlHandle* param, std::int32_t* value)
+bool tqlTake(tqlHandle* param, std::int32_t* value)
 {
     return Take(param, value);
 }
-bool tqlTakeDouble(tqlHandle* param, double* value)
+bool tqlTake(tqlHandle* param, double* value)
 {
     return Take(param, value);
 }
-bool tqlTakeBool(tqlHandle* param, bool* value)
+bool tqlTake(tqlHandle* param, bool* value)
 {
     return Take(param, value);
 }
-bool tqlTakeString(tqlHandle* param, std::string* value)
+bool tqlTake(tqlHandle* param, std::string* value)
 {
     return Take(param, value);
 }

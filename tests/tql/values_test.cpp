@@ -38,6 +38,27 @@ TEST(Values, AnotherTypeLeavesTheValueUntouched)
     }
 }
 
+TEST(Values, TakingGoesThroughAllParametersWhateverTheirType)
+{
+    const Params p("\"a, \\\"b\" , 2,true , 1e3, <f>,7 // c");
+    tqlHandle param = p[1];
+    std::string text;
+    std::int32_t integer = 0, kept = 77;
+    bool flag = false;
+    double number = 0;
+    EXPECT_TRUE(tqlTake(&param, &text));
+    EXPECT_TRUE(tqlTake(&param, &number)) << "an integer is a float, too";
+    EXPECT_TRUE(text == "a, \"b" && number == 2);
+    EXPECT_TRUE(tqlTake(&param, &flag));
+    EXPECT_FALSE(tqlTake(&param, &kept));
+    EXPECT_FALSE(tqlTake(&param, &kept));
+    EXPECT_EQ(param, p[6]);
+    EXPECT_TRUE(tqlTake(&param, &integer));
+    EXPECT_TRUE(flag && integer == 7 && kept == 77);
+    EXPECT_EQ(param, nullptr);
+    EXPECT_FALSE(tqlTake(&param, &kept));
+}
+
 TEST(Values, NumbersInEveryNotation)
 {
     const std::pair<const char*, double> floats[] = {
