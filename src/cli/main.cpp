@@ -57,6 +57,21 @@ public:
     }
 };
 
+/// Says so when the first word is no command, which the parser would only call a missing one.
+bool IsUnknownCommand(const CLI::App& app, int argc, char** argv)
+{
+    if (argc < 2 || argv[1][0] == '-')
+        return false;
+    std::string names;
+    for (const CLI::App* command : app.get_subcommands(nullptr)) {
+        if (command->get_name() == argv[1])
+            return false;
+        names += (names.empty() ? "" : ", ") + command->get_name();
+    }
+    Complain("There is no command \"" + std::string(argv[1]) + "\"; the commands are " + names + ".", Exit::Usage);
+    return true;
+}
+
 struct Arguments
 {
     std::vector<std::string> files;
@@ -106,6 +121,8 @@ int main(int argc, char** argv)
     CLI::App* const create = app.add_subcommand("new", "Write a new file with default values");
     create->add_option("FILE", a.file, "HD parameter file, which must not exist")->required();
 
+    if (IsUnknownCommand(app, argc, argv))
+        return Exit::Usage;
     const std::vector<std::string> literals = SplitLiterals(argc, argv);
     try {
         app.parse(argc, argv);

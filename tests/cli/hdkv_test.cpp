@@ -1,0 +1,211 @@
+// The program itself: exit codes, what goes to which output, and what happens to files.
+#include "data/hd_support.h"
+
+#include <cstdlib>
+
+namespace {
+
+#ifdef _WIN32
+int ExitCode(int status)
+{
+    return status;
+}
+#else
+int ExitCode(int status)
+{
+    return status >> 8 & 255;
+}
+#endif
+
+class Hdkv : public FolderTest
+{
+protected:
+    Hdkv()
+    {
+        Write("bad.hdkv", "[KAVO0_HD]\n  [InitList]\n");
+        Write("found.hdkv", "[KAVO0_HD]\n[InitList]\nDATA = \"\", 1, 2, 3\n[/InitList]\n[/KAVO0_HD]\n");
+        Write("loses.hdkv", "[KAVO0_HD]\n[InitList]\nDATA = \"R\", 1, 2, true\n[/InitList]\n[/KAVO0_HD]\n");
+        Write("other.hdkv", "[KVR_PROJECT]\n[/KVR_PROJECT]\n");
+        HD_Parameters parameters;
+        HD_Initial record;
+        record.RiverName = "A\xC3\x9F, \"x\"";
+        record.Chainage = 12.5;
+        record.InitialH = 1e-7;
+        record.InitialQ = std::numeric_limits<double>::quiet_NaN();
+        parameters.InitList.Add(record);
+        parameters.InitList.Add();
+        HDMixingCoef mixing;
+        mixing.RiverName = "M";
+        mixing.CoefPairs = {{1, 2}, {3, 4.5}};
+        parameters.MixingCoefList.Add(mixing);
+        HDEncroach set;
+        set.RiverName = "E";
+        parameters.EncroachList.Add().Add(set); // one line only: the editor would not keep it
+        EXPECT_TRUE(SaveHDFile(parameters, Path("a.hdkv"), {.everySet = true}));
+    }
+
+    /// Runs hdkv in the folder of the test.
+    int Run(const std::string& arguments)
+    {
+        const std::string command =
+            "cd \"" + m_folder.string() + "\" && " + m_prefix + "\"" HDKV "\" " + arguments + " >out.txt 2>err.txt";
+        const int code = ExitCode(std::system(command.c_str()));
+        out = Text("out.txt");
+        err = Text("err.txt");
+        return code;
+    }
+    std::string Got(const std::string& keyword)
+    {
+        EXPECT_EQ(Run("get a.hdkv " + keyword), 0) << err;
+        return out;
+    }
+
+    std::string out, err, m_prefix;
+};
+
+} // namespace
+
+TEST_F(Hdkv, ExitCodesAndMessages)
+{
+    const struct
+    {
+        const char* arguments;
+        int code;
+        const char* out; // what the outputs contain
+        const char* err;
+    } cases[] = {
+        {"check found.hdkv", 1, "found.hdkv:3:1: InitList: incomplete line, the branch name is empty\n", ""},
+        {"check found.hdkv", 1, "found.hdkv: 1 finding\n", ""},
+        {"check other.hdkv", 1, "other.hdkv:1:1: there is no target [KAVO0_HD]", ""},
+        {"check bad.hdkv", 3, "", "bad.hdkv, line 2, column 13: expected [/InitList]"},
+        {"check missing.hdkv", 3, "", "missing.hdkv"},
+        {"check bad.hdkv found.hdkv", 3, "found.hdkv: 1 finding\n", "bad.hdkv"},
+        {"", 2, "", "subcommand"},
+        {"check", 2, "", "FILE"},
+        {"frobnicate a.hdkv", 2, "", "no command \"frobnicate\"; the commands are check, show, get, set, fmt, new"},
+        {"show a.hdkv InitList --format xml", 2, "", "xml"},
+        {"--help", 0, "check", ""},
+        {"set --help", 0, "FILE KEYWORD VALUE...", ""},
+        {"--version", 0, "hdkv ", ""},
+        {"show a.hdkv", 0, "MixingCoefList               records       1\n", ""},
+        {"show a.hdkv NoList", 2, "", "the lists are InitList, WindList"},
+        {"show other.hdkv", 3, "", "no HD parameter file"},
+        {"get a.hdkv GenerateOutput", 2, "", "TextOutput/GenerateOutput, MapOutput/GenerateOutput"},
+        {"get a.hdkv g_wave", 2, "", "Did you mean Global_Values/G_wave?"},
+        {"get bad.hdkv G_wave", 3, "", "line 2"},
+        {"set a.hdkv G_wave 1.5", 2, "", "Global_Values/G_wave: G_wave should be an integer, found \"1.5\""},
+        {"set a.hdkv G_wave", 2, "", "at least one value"},
+        {"set a.hdkv G_wave 1 2", 2, "", "takes 1 value, 2 were given"},
+        {"set a.hdkv ResisZone 1 2", 2, "", "ZoneResistance2 is missing"},
+        {"set a.hdkv G_f 1e400", 2, "", "should be a number"},
+        {"set a.hdkv MarkTitles 2 A", 2, "", "does not fit the 1 values behind it"},
+        {"set a.hdkv LimitedPeriodStart 2024 2 30 0 0 0", 2, "", "found 2024-02-30 00:00:00"},
+        {"set a.hdkv G_f --loud", 2, "", "no option --loud"},
+        {"set loses.hdkv G_f 1", 1, "", "loses.hdkv:3:19: InitList: parameter 4 (InitialQ)"},
+        {"fmt loses.hdkv", 1, "", "Nothing was written"},
+        {"fmt found.hdkv --check", 1, "", "not in canonical form"},
+        {"fmt a.hdkv --check", 0, "", ""},
+        {"fmt a.hdkv -o missing/b.hdkv", 4, "", "No such file or directory"},
+        {"new a.hdkv", 4, "", "exists already"},
+    };
+    const std::string before = Text("a.hdkv") + Text("loses.hdkv") + Text("found.hdkv");
+    for (const auto& c : cases) {
+        EXPECT_EQ(Run(c.arguments), c.code) << c.arguments << '\n' << out << err;
+        EXPECT_NE(out.find(c.out), std::string::npos) << c.arguments << '\n' << out;
+        EXPECT_NE(err.find(c.err), std::string::npos) << c.arguments << '\n' << err;
+        EXPECT_TRUE(*c.out || out.empty()) << out;
+        EXPECT_TRUE(*c.err || err.empty()) << err;
+    }
+    EXPECT_EQ(Text("a.hdkv") + Text("loses.hdkv") + Text("found.hdkv"), before);
+}
+
+TEST_F(Hdkv, SetThenGet)
+{
+    const struct
+    {
+        const char *keyword, *values, *printed;
+    } cases[] = {{"G_flood_plan_res", "-98.5", "-98.5\n"},
+                 {"delta", "-1e-5", "-1e-05\n"},
+                 {"wind_shear_stress", "true", "true\n"},
+                 {"Defalt_Values/theta", "0.1", "0.1\n"},
+                 {"ResisZone", "2 -1 nan inf", "2\n-1\nnan\ninf\n"},
+                 {"MarkTitles", "2 \"A b\" C", "2\nA b\nC\n"},
+                 {"MarkTitles", "0", "0\n"},
+                 {"Delimiter", "-- --x", "--x\n"},
+                 {"OutputFiles", "1 F true \"a b.txt\"", "1\nF\ntrue\na b.txt\n"},
+                 {"LimitedPeriodEnd", "2024 2 29 1 2 3", "2024\n2\n29\n1\n2\n3\n"},
+                 {"MixingCoef", "1 0.5 2 1 2 3 4", "1\n0.5\n2\n1\n2\n3\n4\n"}};
+    for (const auto& c : cases) {
+        EXPECT_EQ(Run(std::string("set a.hdkv ") + c.keyword + ' ' + c.values), 0) << err;
+        EXPECT_EQ(out + err, "");
+        EXPECT_EQ(Got(c.keyword), c.printed);
+    }
+    const std::string before = Text("a.hdkv");
+    EXPECT_EQ(Run("set -o b.hdkv a.hdkv G_f 7"), 0) << err;
+    EXPECT_EQ(Text("a.hdkv"), before);
+    EXPECT_NE(Text("b.hdkv").find("G_f = 7\n"), std::string::npos);
+    EXPECT_EQ(LoadHDFile(Path("b.hdkv"))->EncroachList.GetCount(), 1u); // nothing else changed, nothing is dropped
+    EXPECT_EQ(LoadHDFile(Path("b.hdkv"))->InitList.GetCount(), 2u);
+}
+
+TEST_F(Hdkv, ShowFormats)
+{
+    const struct
+    {
+        const char *arguments, *printed;
+    } cases[] = {
+        {"initlist", "RiverName  Chainage  InitialH  InitialQ\n"
+                     "A\xC3\x9F, \"x\"        12.5     1e-07       nan\n"
+                     "              1e+10         0         0\n"},
+        {"InitList --format csv", "RiverName,Chainage,InitialH,InitialQ\n"
+                                  "\"A\xC3\x9F, \"\"x\"\"\",12.5,1e-07,nan\n,1e+10,0,0\n"},
+        {"InitList --format json",
+         "[\n  {\"RiverName\": \"A\xC3\x9F, \\\"x\\\"\", \"Chainage\": 12.5, \"InitialH\": 1e-07, \"InitialQ\": "
+         "null},\n"
+         "  {\"RiverName\": \"\", \"Chainage\": 1e+10, \"InitialH\": 0, \"InitialQ\": 0}\n]\n"},
+        {"MixingCoefList --format csv",
+         "RiverName,Chainage,CoefPairs,MixCoef1,MixCoef2,MixCoef3,MixCoef4\nM,1e+10,1 2; 3 4.5,0,0,0,0\n"},
+        {"MixingCoefList --format json",
+         "[\n  {\"RiverName\": \"M\", \"Chainage\": 1e+10, \"CoefPairs\": [{\"First\": 1, \"Second\": 2}, "
+         "{\"First\": 3, \"Second\": 4.5}], \"MixCoef1\": 0, \"MixCoef2\": 0, \"MixCoef3\": 0, \"MixCoef4\": 0}\n]\n"},
+        {"OutputItems --format csv", "Item,UserName,Decimals\n"},
+        {"WindList --format json", "[]\n"},
+        {"Enc_Simulation --format csv",
+         "Set,RiverName,Chainage,EncOption1,EncOption2,EncValues1.1,EncValues1.2,EncValues1.3,EncValues1.4,"
+         "EncValues1.5,EncOption3,EncValues2.1,EncValues2.2,EncValues2.3,EncValues2.4,EncValues2.5\n"
+         "1,E,1e+10,1,1,0,0,0,0,0,1,0,0,0,0,0\n"}};
+    for (const auto& c : cases) {
+        EXPECT_EQ(Run(std::string("show a.hdkv ") + c.arguments), 0) << err;
+        EXPECT_EQ(out, c.printed);
+    }
+}
+
+TEST_F(Hdkv, FmtAndNewWriteCanonicalFiles)
+{
+    EXPECT_EQ(Run("fmt found.hdkv -o b.hdkv"), 0) << err;
+    EXPECT_EQ(Run("fmt --check b.hdkv"), 0) << err;
+    EXPECT_NE(Text("b.hdkv").find("    DATA = \"\", 1, 2, 3\n"), std::string::npos); // incomplete lines too
+    EXPECT_EQ(Run("fmt found.hdkv"), 0);
+    EXPECT_EQ(Run("check found.hdkv"), 1);
+    EXPECT_EQ(Run("new n.hdkv"), 0) << err;
+    EXPECT_EQ(Run("check n.hdkv"), 0) << out;
+    EXPECT_EQ(out, "n.hdkv: 0 findings\n");
+    EXPECT_EQ(Run("fmt --check n.hdkv"), 0);
+    EXPECT_EQ(Run("check \"" KVR_SOURCE_DIR "/examples/river/river.hdkv\""), 0) << out;
+    EXPECT_EQ(Run("fmt --check \"" KVR_SOURCE_DIR "/examples/river/river.hdkv\""), 0) << err;
+}
+
+#ifndef _WIN32
+TEST_F(Hdkv, AFullDiskCostsNothing)
+{
+    const std::string before = Text("a.hdkv");
+    const std::size_t files = FileCount();
+    m_prefix = "trap '' XFSZ; ulimit -f 4; ";
+    EXPECT_EQ(Run("set a.hdkv G_f 7"), 4);
+    EXPECT_NE(err.find("a.hdkv\": File too large."), std::string::npos) << err;
+    EXPECT_EQ(Text("a.hdkv"), before);
+    EXPECT_EQ(FileCount(), files + 2); // the outputs of the run
+    m_prefix.clear();
+    EXPECT_EQ(Run("show a.hdkv >/dev/full 2>err.txt; exit $? #"), 4);
+}
+#endif

@@ -1,0 +1,101 @@
+#include "hd_support.h"
+
+#include "data/hd_check.h"
+
+#include <algorithm>
+
+namespace {
+
+std::vector<std::string> Texts(const std::string& text)
+{
+    std::vector<std::string> texts;
+    for (const Finding& finding : CheckHDStructure(Parsed(text).Get()))
+        texts.push_back(std::to_string(finding.line) + ':' + std::to_string(finding.column) + ": " + finding.text +
+                        (finding.losesContent ? " (loses)" : ""));
+    return texts;
+}
+
+std::string InSection(const std::string& section, const std::string& line)
+{
+    return "[KAVO0_HD]\n[Global_Variables]\n[" + section + "]\n" + line + "\n[/" + section +
+           "]\n[/Global_Variables]\n[/KAVO0_HD]\n";
+}
+
+std::string InList(const std::string& list, const std::string& line)
+{
+    return "[KAVO0_HD]\n[" + list + "]\n" + line + "\n[/" + list + "]\n[/KAVO0_HD]\n";
+}
+
+} // namespace
+
+TEST(Check, FindsWhatIsNotInOrder)
+{
+    const struct
+    {
+        std::string text;
+        const char* finding; // null for none
+    } cases[] = {
+        {InSection("Global_Values", "G_f = 1"), nullptr},
+        {InSection("Global_Values", "G_f = \"x\""),
+         "4:7: G_f: parameter 1 (G_f) should be a number, found a text (loses)"},
+        {InSection("Global_Values", "G_wave = 1.0"),
+         "4:10: G_wave: parameter 1 (G_wave) should be an integer, found a number (loses)"},
+        {InSection("Global_Values", "G_f ="), "4:1: G_f: parameter 1 (G_f) is missing"},
+        {InSection("Global_Values", "ResisZone = 1, 2"),
+         "4:1: ResisZone: parameter 3 (ZoneResistance2) and those behind it are missing"},
+        {InSection("Global_Values", "G_f = 1, 2"), "4:10: G_f: unknown parameters from number 2 on"},
+        {InSection("Global_Values", "g_f = 1"), "4:1: unknown keyword \"g_f\""},
+        {InSection("Default_Values", ""), "3:1: unknown section [Default_Values]"},
+        {InSection("Leakage", "LeakageCoefficient = 1\nLeakageCoefficient = 1"),
+         "5:1: keyword \"LeakageCoefficient\" is there more than once; only the first counts"},
+        {InSection("WaterLevelMarkTitles", "MarkTitles = 0, \"\""), nullptr},
+        {InSection("WaterLevelMarkTitles", "MarkTitles = 0"), nullptr},
+        {InSection("WaterLevelMarkTitles", "MarkTitles = 0, \"\", \"\""),
+         "4:21: MarkTitles: unknown parameters from number 3 on"},
+        {InSection("WaterLevelMarkTitles", "MarkTitles = 2, \"A\""),
+         "4:14: MarkTitles: the count 2 of MarkTitles does not fit the 1 parameters behind it (loses)"},
+        {InSection("WaterLevelMarkTitles", "MarkInterpolate = 1, 0"),
+         "4:22: MarkInterpolate: parameter 2 (Interpolate) should be true or false, found an integer (loses)"},
+        {InSection("MixingCoefficients", "MixingCoef = -1, 1, 1, 1, 1"),
+         "4:14: MixingCoef: the count -1 of CoefPairs does not fit the 4 parameters behind it (loses)"},
+        {InSection("TextOutput", "LimitedPeriodEnd = 2023, 2, 29, 0, 0, 0"),
+         "4:20: LimitedPeriodEnd: the six integers of LimitedPeriodEnd are no date and time"},
+        {InSection("TextOutput", "LimitedPeriodEnd = 2023, 2"),
+         "4:20: LimitedPeriodEnd: LimitedPeriodEnd needs six integers (loses)"},
+        {InSection("TextOutput", "Delimiter = <;>"),
+         "4:13: Delimiter: parameter 1 (Delimiter) should be a text in quotes, found a file name"},
+        {InSection("TextOutput", "[OutputItems]\ndata = 1\n[/OutputItems]"),
+         "5:1: OutputItems: parameter 2 (UserName) and those behind it are missing"},
+        {InSection("MapOutput", "GeoDb = <a>"),
+         "4:1: GeoDb is not read, because ApplyDemGroundElevation is missing (loses)"},
+        {InList("InitList", "DATA = \"R\", 1, 2, 3"), nullptr},
+        {InList("InitList", "DATA = \"\", 1, 2, 3"), "3:1: InitList: incomplete line, the branch name is empty"},
+        {InList("LeakageList", "DATA = \"R\", 1e10, 2"),
+         "3:1: LeakageList: incomplete line, the chainage is not given"},
+        {InList("BedList", "DATA = \"R\", 1, 2"), nullptr},
+        {InList("BedList", "DATA = \"R\", 1, 2, 3, 4"), "3:1: BedList: parameter 6 (ZoneResistance3) is missing"},
+        {InList("WindList", "// \xC3\xBC\nnote = 1"), "4:1: unknown keyword \"note\""},
+        {InList("Enc_Simulation", "[Encroachment_Setup]\nDATA = \"\", 1, 1, 1, 0, 0, 0, 0, 0, 1, 0, 0, 0, 0, 0\n"
+                                  "[/Encroachment_Setup]"),
+         nullptr},
+        {"[KAVO0_HD]\n[/KAVO0_HD]\n[X]\n[/X]\n", "3:1: unknown section [X]"},
+        {"[X]\n[/X]\n", "1:1: there is no target [KAVO0_HD] (loses)"},
+    };
+    for (const auto& c : cases) {
+        const auto expected = c.finding ? std::vector<std::string>{c.finding} : std::vector<std::string>{};
+        EXPECT_EQ(Texts(c.text), expected) << c.text;
+    }
+}
+
+TEST(Check, FindingsComeInFileOrderAndQuickly)
+{
+    EXPECT_TRUE(Texts(HDFileText({}, true)).empty());
+    // Ten thousand findings at the end of a long file: positions are looked up, not counted anew each time.
+    std::string lines(200'000, '\n');
+    for (int i = 0; i < 10'000; ++i)
+        lines += "DATA = \"\", 1, 2, 3\n";
+    const auto findings = CheckHDStructure(Parsed(InList("InitList", lines)).Get());
+    ASSERT_EQ(findings.size(), 10'000u);
+    EXPECT_EQ(findings.back().line, 210'002u);
+    EXPECT_TRUE(std::ranges::is_sorted(findings, {}, &Finding::line));
+}

@@ -1,0 +1,132 @@
+// What the tests of the data room share: parameters from text, and objects whose every field differs from another's.
+#pragma once
+
+#include "data/field_io.h"
+#include "data/hd_file.h"
+
+#include <filesystem>
+#include <fstream>
+#include <gtest/gtest.h>
+#include <limits>
+
+inline TqlStructure Parsed(const std::string& text)
+{
+    TqlStructure structure(tqlLoadText(text, "test.hdkv"));
+    TqlSyntaxError error;
+    if (tqlGetSyntaxErr(structure.Get(), &error))
+        ADD_FAILURE() << error.message;
+    return structure;
+}
+
+/// Reads the content of a target "KAVO0_HD".
+inline HD_Parameters FromTarget(const std::string& content)
+{
+    HD_Parameters parameters;
+    parameters.Load(Parsed("[KAVO0_HD]\n" + content + "\n[/KAVO0_HD]\n").Get());
+    return parameters;
+}
+
+/// Reads lines of one sub-section of the global values.
+inline HD_Parameters FromSection(const std::string& name, const std::string& lines)
+{
+    return FromTarget("[Global_Variables]\n[" + name + "]\n" + lines + "\n[/" + name + "]\n[/Global_Variables]");
+}
+
+inline std::string ReadText(const std::filesystem::path& path)
+{
+    std::ifstream stream(path, std::ios::binary);
+    return {std::istreambuf_iterator<char>(stream), {}};
+}
+
+/// Gives every field, and in groups every element, another value. `seed` makes results differ.
+inline void Disturb(FieldList fields, void* object, int& seed)
+{
+    constexpr double numbers[] = {
+        0.1 + 0.2, -0.0, 5e-324, 1.7976931348623157e308, 1e10 - 1e-6, -1e-7, std::numeric_limits<double>::infinity()};
+    for (const Field& field : fields) {
+        ++seed;
+        switch (field.kind) {
+        case FieldKind::Number: {
+            double& value = field.In<double>(object);
+            value =
+                value == 0 ? -1.0 / seed : value + numbers[static_cast<std::size_t>(seed) % std::size(numbers)] + seed;
+            break;
+        }
+        case FieldKind::Integer:
+        case FieldKind::Choice:
+            field.In<std::int32_t>(object) += 100 + seed;
+            break;
+        case FieldKind::Boolean:
+            field.In<bool>(object) = !field.In<bool>(object);
+            break;
+        case FieldKind::Text:
+        case FieldKind::FileName:
+            field.In<std::string>(object) += "\"<M\xC3\x9CHLE>\\\n\t" + std::to_string(seed);
+            break;
+        case FieldKind::DateTime:
+            field.In<HDDateTime>(object) = {1900 + seed, 13, -1, 25, 61, seed}; // kept though it is no date
+            break;
+        case FieldKind::Group: {
+            void* const container = field.address(object);
+            field.group->resize(container, 2 + static_cast<std::size_t>(seed % 3));
+            for (std::size_t i = 0; i < field.group->size(container); ++i)
+                Disturb(field.group->elements, field.group->at(container, i), seed);
+            break;
+        }
+        }
+    }
+}
+
+/// Calls `visit(name, fields)` for every keyword and item list of the global values.
+template <typename Visit>
+void ForEachGlobal(Visit visit)
+{
+    for (const GlobalSection& section : HDGlobalSections()) {
+        for (const GlobalKeyword& row : section.keywords)
+            visit(std::string(section.name) + "/" + std::string(row.name), row.Fields());
+        for (const Field& items : section.items)
+            visit(std::string(section.name) + "/" + std::string(items.name), FieldList(&items, 1));
+    }
+}
+
+/// Calls `visit(name, list of a, list of b)` for every list, each set of the encroachment lists included.
+template <typename Visit>
+void ForEachList(HD_Parameters& a, HD_Parameters& b, Visit visit)
+{
+    for (const ListEntry& entry : HDLists())
+        if (entry.list)
+            visit(entry.section, *entry.list(a), *entry.list(b));
+    for (std::size_t i = 0; i < std::min(a.EncroachList.GetCount(), b.EncroachList.GetCount()); ++i)
+        visit("Encroachment_Setup", a.EncroachList.GetAt(i), b.EncroachList.GetAt(i));
+}
+
+class FolderTest : public testing::Test
+{
+protected:
+    FolderTest()
+    {
+        const auto* info = testing::UnitTest::GetInstance()->current_test_info();
+        m_folder = std::filesystem::temp_directory_path() /
+                   (std::string("kvr-") + info->test_suite_name() + "-" + info->name());
+        std::filesystem::remove_all(m_folder);
+        std::filesystem::create_directories(m_folder);
+    }
+    ~FolderTest() override
+    {
+        std::error_code error;
+        std::filesystem::permissions(m_folder, std::filesystem::perms::owner_all, error);
+        std::filesystem::remove_all(m_folder, error);
+    }
+    std::string Path(const char* name) const { return (m_folder / name).string(); }
+    void Write(const char* name, std::string_view text) const
+    {
+        std::ofstream(m_folder / name, std::ios::binary) << text;
+    }
+    std::string Text(const char* name) const { return ReadText(m_folder / name); }
+    std::size_t FileCount() const
+    {
+        return static_cast<std::size_t>(std::distance(std::filesystem::directory_iterator(m_folder), {}));
+    }
+
+    std::filesystem::path m_folder;
+};
