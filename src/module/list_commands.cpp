@@ -5,6 +5,12 @@
 
 #include <algorithm>
 
+ChangePlace PlaceOf(const IRowSource& rows, std::size_t row, int column)
+{
+    const std::size_t last = std::max<std::size_t>(rows.Count(), 1) - 1;
+    return {rows.List(), int(rows.ListRow(std::min(row, last))) + 1, column};
+}
+
 CDocumentCommand::CDocumentCommand(CKavo0_hdDoc& document, const QString& text) : m_document(document)
 {
     setText(text);
@@ -33,13 +39,13 @@ CInsertLines::CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> r
 ChangePlace CInsertLines::Apply()
 {
     m_row = m_rows->Put(m_row, std::move(m_lines));
-    return {m_rows->List(), int(m_row) + 1, 1};
+    return PlaceOf(*m_rows, m_row, 1);
 }
 
 ChangePlace CInsertLines::Revert()
 {
     m_lines = m_rows->Take(m_row, m_count);
-    return {m_rows->List(), int(std::min(m_row + 1, m_rows->Count())), 1};
+    return PlaceOf(*m_rows, m_row, 1);
 }
 
 CDeleteLines::CDeleteLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count,
@@ -60,7 +66,7 @@ ChangePlace CDeleteLines::Apply()
     m_replaced = m_rows->Count() == 0 && m_replacement;
     if (m_replaced)
         m_rows->Put(0, std::move(m_replacement));
-    return {m_rows->List(), int(std::min(m_row + 1, m_rows->Count())), 1};
+    return PlaceOf(*m_rows, m_row, 1);
 }
 
 ChangePlace CDeleteLines::Revert()
@@ -68,5 +74,5 @@ ChangePlace CDeleteLines::Revert()
     if (m_replaced)
         m_replacement = m_rows->Take(0, 1);
     m_row = m_rows->Put(m_row, std::move(m_lines));
-    return {m_rows->List(), int(m_row) + 1, 1};
+    return PlaceOf(*m_rows, m_row, 1);
 }

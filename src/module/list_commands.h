@@ -15,6 +15,9 @@ struct ChangePlace
     int row = 0, column = 0;
 };
 
+/// The place of a row of the source; of the last one for a row past the end.
+ChangePlace PlaceOf(const IRowSource& rows, std::size_t row, int column);
+
 /// Every change marks the document modified and reloads the views. A change that undo or redo brings back is also
 /// shown to the user, wherever it is.
 class CDocumentCommand : public QUndoCommand

@@ -45,6 +45,11 @@ public:
     /// The one row that an empty source shows: no change of the document, if the source has a way to say so.
     virtual void AddFirstRow(std::unique_ptr<IRowBlock> block) { Put(0, std::move(block)); }
 
+    /// Whether the source may be left without rows; otherwise it always shows one.
+    virtual bool MayBeEmpty() const { return false; }
+
     /// The list behind the rows; null when they are kept otherwise.
     virtual CGenList* List() const { return nullptr; }
+    /// Where the list shows the row: a row kept inside a record is shown at the record.
+    virtual std::size_t ListRow(std::size_t row) const { return row; }
 };

@@ -36,7 +36,7 @@ QString EditText(const ColumnSpec& column, const CellValue& value)
     if (const auto* number = std::get_if<double>(&value))
         return KsShortestNumber(column.style.UnitConvertFromBase(*number, 1));
     if (const auto* integer = std::get_if<std::int32_t>(&value))
-        return QString::number(*integer);
+        return column.Kind() == CellKind::Choice ? column.choices.TextOf(*integer) : QString::number(*integer);
     return QString::fromStdString(std::get<std::string>(value));
 }
 
@@ -46,6 +46,11 @@ CellReading ReadCell(const ColumnSpec& column, const QString& text)
         return {text.toUpper().toStdString(), {}};
     if (text.isEmpty())
         return {};
+    if (column.Kind() == CellKind::Choice) {
+        if (const auto index = column.choices.IndexOf(text))
+            return {*index, {}};
+        return {{}, LoadString(Str::ChoiceRequired).arg(column.choices.entries().join(QStringLiteral(", ")))};
+    }
     if (column.Kind() == CellKind::Integer) {
         bool isInteger = false;
         const std::int32_t value = text.toInt(&isInteger);

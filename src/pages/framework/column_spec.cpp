@@ -2,6 +2,7 @@
 
 #include "data/river_pos.h"
 
+#include <QCoreApplication>
 #include <algorithm>
 #include <iterator>
 
@@ -11,6 +12,7 @@ constexpr GridControl Controls[] = {
     {Control::Integer, CellKind::Integer, 0, "edit"},
     {Control::Number, CellKind::Number, 3, "doubleEdit_1110"},
     {Control::Text, CellKind::Text, 0, "stringEdit_1111"},
+    {Control::DropDown, CellKind::Choice, 0, "dropDown"},
     {Control::Chainage, CellKind::Number, 0, "doubleEdit_1112"},
 };
 
@@ -43,6 +45,31 @@ CellAccess FieldAccess(const Field& field)
     }
 }
 
+QString Choices::TextOf(std::int32_t index) const
+{
+    const QStringList texts = entries();
+    return index >= first && index - first < texts.size() ? texts[index - first] : QString::number(index);
+}
+
+std::optional<std::int32_t> Choices::IndexOf(const QString& text) const
+{
+    const QStringList texts = entries();
+    const QString wanted = text.trimmed();
+    for (qsizetype i = 0; i < texts.size(); ++i)
+        if (texts[i].compare(wanted, Qt::CaseInsensitive) == 0)
+            return first + std::int32_t(i);
+    bool isNumber = false;
+    const std::int32_t number = wanted.toInt(&isNumber);
+    if (isNumber && number >= first && number - first < texts.size())
+        return number;
+    return std::nullopt;
+}
+
+QString UnitToolTip(const QString& unit)
+{
+    return unit.isEmpty() ? QString() : QCoreApplication::translate("CKsEditStyle", "Unit: %1").arg(unit);
+}
+
 CellValue ColumnSpec::FillValue() const
 {
     return style.UnitConvertFromBase(*fill, 0);
@@ -55,8 +82,27 @@ CellValue ColumnSpec::EmptyValue() const
         return std::string();
     case CellKind::Integer:
         return std::int32_t(0);
+    case CellKind::Choice:
+        return choices.whenEmptied;
     case CellKind::Number:
         break;
     }
     return emptyIsNotGiven ? NotGiven : style.UnitConvertFromBase(0, 0);
+}
+
+CellValue ColumnSpec::NewLineValue() const
+{
+    if (fill)
+        return FillValue();
+    if (choices.inNewLines)
+        return *choices.inNewLines;
+    return emptyIsNotGiven ? CellValue(NotGiven) : CellValue();
+}
+
+QString ColumnSpec::ToolTip(bool isHeader) const
+{
+    const QString unitTip = unitText ? UnitToolTip(unitText()) : style.GetEumToolTipText();
+    if (!isHeader || !hint)
+        return unitTip;
+    return unitTip.isEmpty() ? hint() : hint() + u'\n' + unitTip;
 }

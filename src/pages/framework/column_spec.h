@@ -4,9 +4,10 @@
 #include "data/field.h"
 #include "ks/units/edit_style.h"
 
-#include <QString>
+#include <QStringList>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <variant>
 
 /// What a cell holds, in base units. Nothing stands for an empty cell.
@@ -26,7 +27,8 @@ enum class CellKind
 {
     Text,
     Number,
-    Integer
+    Integer,
+    Choice // an index, shown as the text of its entry
 };
 
 /// The cell editors by number, in one table.
@@ -42,8 +44,26 @@ inline constexpr int Integer = 0;     // the plain edit control
 inline constexpr int Number = 5042;   // three decimals
 inline constexpr int Text = 5043;     // upper case
 inline constexpr int Chainage = 5044; // whole numbers shown
+inline constexpr int DropDown = 52517;
 } // namespace Control
 const GridControl& FindControl(int id);
+
+/// What the cells of a drop-down column can be. A stored index without entry is kept, and shown as its number.
+struct Choices
+{
+    std::function<QStringList()> entries; // in the user's language
+    std::int32_t first = 0;               // stored for the first entry; the others follow
+    std::optional<std::int32_t> inNewLines = {};
+    std::int32_t whenEmptied = 0;
+
+    /// Text of a stored index.
+    QString TextOf(std::int32_t index) const;
+    /// The index that a text means, be it an entry (case does not matter) or the number of one; nothing otherwise.
+    std::optional<std::int32_t> IndexOf(const QString& text) const;
+};
+
+/// "Unit: m"; empty for a quantity without unit.
+QString UnitToolTip(const QString& unit);
 
 struct ColumnSpec
 {
@@ -52,14 +72,22 @@ struct ColumnSpec
     int width = 72;               // pixels at the original font size; the grid scales it
     CKsEditStyle style;           // unit group and format
     bool emptyIsNotGiven = false; // an empty cell is stored as the mark for "not given", and the mark shows as empty
+    Choices choices;              // of a drop-down column
+    std::function<QString()> unitText; // symbol instead of the style's, where the unit depends on a setting
+    std::function<QString()> hint;     // what the column is, for the tool tip of its header
     const double* fill = nullptr; // enters new lines, and blank cells when the page is left; as it is, not converted
     std::function<bool(const void* row)> locked; // the cell of this row cannot be edited
     std::shared_ptr<const CellAccess> access;
 
     CellKind Kind() const { return FindControl(control).kind; }
+    bool IsText() const { return Kind() == CellKind::Text || Kind() == CellKind::Choice; }
     bool IsLocked(const void* row) const { return locked && locked(row); }
     /// `fill` as the stored value that a cell with that text has.
     CellValue FillValue() const;
     /// What an emptied cell is stored as when nothing fills it.
     CellValue EmptyValue() const;
+    /// What a new line holds; nothing where the record's own default stands.
+    CellValue NewLineValue() const;
+    /// Unit of the cells, and on a header also what the column is.
+    QString ToolTip(bool header) const;
 };

@@ -34,7 +34,7 @@ ChangePlace CSetCells::Place()
 {
     const CellChange& first = m_changes.front();
     m_row = m_rows->RowOf(first.row, m_row);
-    return {m_rows->List(), int(m_row) + 1, first.column};
+    return PlaceOf(*m_rows, m_row, first.column);
 }
 
 template <typename T>

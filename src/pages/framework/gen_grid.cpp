@@ -5,10 +5,12 @@
 #include "pages/framework/grid_editors.h"
 #include "pages/framework/grid_keys.h"
 #include "pages/framework/page.h"
+#include "res/strings.h"
 
 #include <QContextMenuEvent>
 #include <QHeaderView>
 #include <QMenu>
+#include <QPainter>
 #include <QScrollBar>
 #include <QUndoStack>
 #include <algorithm>
@@ -52,6 +54,17 @@ void CGenGrid::SetOwnerPage(CGenPropertyPage* page)
 {
     m_page = page;
     page->SetGrid(this);
+}
+
+void CGenGrid::SetPartOfPage(CGenPropertyPage* page)
+{
+    m_page = page;
+    page->AddPartGrid(this);
+}
+
+bool CGenGrid::IsLocationGrid() const
+{
+    return !m_page || m_page->GetGrid() == this;
 }
 
 IPageHost* CGenGrid::Host() const
@@ -128,7 +141,8 @@ void CGenGrid::StoreEditedLine()
         return;
     m_modified = false;
     if (auto* host = Host()) {
-        host->EditedLineChanged(m_locationOnAnyColumn ? 1 : m_modifiedColumn);
+        const int column = m_locationOnAnyColumn ? 1 : m_modifiedColumn;
+        host->EditedLineChanged(IsLocationGrid() ? column : 0);
     } else if (m_page) {
         m_page->StoreToDocument();
         m_page->LoadFromDocument(m_page->GetDocument());
@@ -144,7 +158,7 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
     if (row == m_lastRow)
         return;
     m_lastRow = row;
-    if (row != 0 && Host())
+    if (row != 0 && Host() && IsLocationGrid())
         Host()->CurrentLocationChanged(row);
 }
 
@@ -159,8 +173,27 @@ void CGenGrid::focusOutEvent(QFocusEvent* event)
 
 void CGenGrid::mousePressEvent(QMouseEvent* event)
 {
-    if (CommitEditor())
+    if (m_page ? m_page->CommitGrids() : CommitEditor())
         QTableView::mousePressEvent(event);
+}
+
+void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
+{
+    if (RowCount() == 0 && m_model->Rows())
+        Run(GridAction::AppendLine);
+    else
+        QTableView::mouseDoubleClickEvent(event);
+}
+
+void CGenGrid::paintEvent(QPaintEvent* event)
+{
+    QTableView::paintEvent(event);
+    if (RowCount() > 0 || !m_model->Rows() || !isEnabled())
+        return;
+    QPainter painter(viewport());
+    painter.setPen(palette().color(QPalette::PlaceholderText));
+    painter.drawText(viewport()->rect().adjusted(4, 4, -4, -4), Qt::AlignTop | Qt::AlignHCenter | Qt::TextWordWrap,
+                     LoadString(Str::EmptyTable));
 }
 
 bool CGenGrid::eventFilter(QObject* object, QEvent* event)
@@ -290,8 +323,10 @@ void CGenGrid::contextMenuEvent(QContextMenuEvent* event)
     menu.addSeparator();
     add(GridAction::Copy, CanCopy());
     add(GridAction::Paste, CanPaste());
-    menu.addSeparator();
-    add(GridAction::Search, true);
+    if (IsLocationGrid()) {
+        menu.addSeparator();
+        add(GridAction::Search, true);
+    }
     menu.exec(event->globalPos());
 }
 

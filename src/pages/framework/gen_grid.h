@@ -19,8 +19,10 @@ public:
     explicit CGenGrid(QWidget* parent = nullptr);
     ~CGenGrid() override;
 
-    /// Binds grid and page to each other.
+    /// Binds grid and page to each other: this is the page's grid of locations.
     void SetOwnerPage(CGenPropertyPage* page);
+    /// A further grid of the page, of something else than locations.
+    void SetPartOfPage(CGenPropertyPage* page);
     CGridModel* Model() const { return m_model; }
     CGridDelegate* Delegate() const { return m_delegate; }
 
@@ -46,7 +48,8 @@ public:
     void Reload();
     /// Inserts a line above the first selected range, or behind the last line; returns its row.
     int InsertLine();
-    /// Deletes the selected lines when whole lines are selected, in one range. A grid left empty gets a new line.
+    /// Deletes the selected lines when whole lines are selected, in one range. A grid left empty gets a new line,
+    /// unless its rows may be none.
     bool DeleteSelectedLines();
     void GotoLine(int row);
     /// Looks for a line from `row` on (0 is taken as 1). On success the line becomes current, and `row` is the one
@@ -71,12 +74,15 @@ protected:
     void mousePressEvent(QMouseEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void contextMenuEvent(QContextMenuEvent* event) override;
+    void mouseDoubleClickEvent(QMouseEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
     void changeEvent(QEvent* event) override;
     void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
     void keyboardSearch(const QString&) override {} // typing edits the cell
 
 private:
     IPageHost* Host() const;
+    bool IsLocationGrid() const;
     std::optional<QItemSelectionRange> SelectedBlock() const; // more than the current cell, in one range
     void NextCell();
     void PreviousCell();

@@ -94,7 +94,8 @@ void CGenGrid::Copy() const
 bool CGenGrid::CanPaste() const
 {
     const QMimeData* content = QGuiApplication::clipboard()->mimeData();
-    return content && content->hasText() && !content->text().isEmpty() && currentIndex().isValid();
+    return content && content->hasText() && !content->text().isEmpty() && m_model->Rows() &&
+           (currentIndex().isValid() || RowCount() == 0);
 }
 
 bool CGenGrid::Paste()
@@ -102,8 +103,8 @@ bool CGenGrid::Paste()
     if (!CanPaste())
         return false;
     const auto selected = SelectedBlock();
-    const int top = selected ? selected->top() : currentIndex().row();
-    const int left = selected ? selected->left() : currentIndex().column();
+    const int top = selected ? selected->top() : std::max(0, currentIndex().row());
+    const int left = selected ? selected->left() : std::max(0, currentIndex().column());
     auto cells = ReadTable(QGuiApplication::clipboard()->text());
     if (selected && cells.size() == 1 && cells.front().size() == 1) // one copied cell fills the selection
         cells.assign(std::size_t(selected->height()), QStringList(selected->width(), cells.front().front()));

@@ -6,7 +6,6 @@
 #include "pages/framework/grid_model.h"
 
 #include <QApplication>
-#include <QComboBox>
 #include <QKeyEvent>
 #include <QTimer>
 
@@ -36,6 +35,8 @@ QWidget* MakeEditor(const ColumnSpec& column, QWidget* parent)
 {
     if (column.Kind() == CellKind::Text)
         return new CGridStringEdit(parent);
+    if (column.Kind() == CellKind::Choice)
+        return new CGridChoiceEdit(column.choices.entries(), parent);
     return new CGridDoubleEdit(parent);
 }
 
@@ -60,6 +61,29 @@ CGridStringEdit::CGridStringEdit(QWidget* parent) : QLineEdit(parent)
     });
 }
 
+CGridChoiceEdit::CGridChoiceEdit(const QStringList& entries, QWidget* parent) : QComboBox(parent)
+{
+    addItems(entries);
+    // Opened by the mouse the entries are what the user wants to see next.
+    if (QApplication::mouseButtons() != Qt::NoButton)
+        QTimer::singleShot(0, this, &QComboBox::showPopup);
+}
+
+void CGridChoiceEdit::SetText(const QString& text)
+{
+    if (!text.isEmpty() && findText(text) < 0)
+        addItem(text);
+    setCurrentIndex(findText(text));
+}
+
+void CGridChoiceEdit::keyPressEvent(QKeyEvent* event)
+{
+    if (event->key() == Qt::Key_Backspace)
+        setCurrentIndex(-1);
+    else
+        QComboBox::keyPressEvent(event);
+}
+
 CGridDelegate::CGridDelegate(CGenGrid* grid) : QStyledItemDelegate(grid), m_grid(grid) {}
 
 QWidget* CGridDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&, const QModelIndex& index) const
@@ -82,7 +106,9 @@ void CGridDelegate::setEditorData(QWidget* editor, const QModelIndex& index) con
         return;
     editor->setProperty("opened", true);
     const QString text = index.data(Qt::EditRole).toString();
-    if (auto* list = qobject_cast<QComboBox*>(editor)) {
+    if (auto* choice = qobject_cast<CGridChoiceEdit*>(editor)) {
+        choice->SetText(text);
+    } else if (auto* list = qobject_cast<QComboBox*>(editor)) {
         list->setCurrentText(text);
         list->lineEdit()->selectAll();
     } else {

@@ -1,6 +1,7 @@
 // The cell editors and the delegate that opens them.
 #pragma once
 
+#include <QComboBox>
 #include <QLineEdit>
 #include <QPointer>
 #include <QStyledItemDelegate>
@@ -21,6 +22,19 @@ class CGridStringEdit : public QLineEdit
     Q_OBJECT
 public:
     explicit CGridStringEdit(QWidget* parent = nullptr);
+};
+
+/// Chooses one of a column's entries: by pop-up, arrow keys or first letters; Backspace empties the cell.
+class CGridChoiceEdit : public QComboBox
+{
+    Q_OBJECT
+public:
+    CGridChoiceEdit(const QStringList& entries, QWidget* parent = nullptr);
+    /// Shows a text; one that is no entry is one as long as the editor is open.
+    void SetText(const QString& text);
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override;
 };
 
 /// Opens the editor that a column asks for, and keeps it open while its text is no value of the column.

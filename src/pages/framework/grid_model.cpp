@@ -38,8 +38,8 @@ void CGridModel::SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> r
     m_document = &document;
     m_rows = std::move(rows);
     m_pending.clear();
-    m_rowCount = int(m_rows->Count());
-    m_revision = m_rows->Revision();
+    m_rowCount = m_rows ? int(m_rows->Count()) : 0;
+    m_revision = m_rows ? m_rows->Revision() : 0;
     endResetModel();
 }
 
@@ -112,9 +112,9 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
     case Qt::EditRole:
         return EditText(column, Value(index.row(), index.column()));
     case Qt::TextAlignmentRole:
-        return int(Qt::AlignVCenter | (column.Kind() == CellKind::Text ? Qt::AlignLeft : Qt::AlignRight));
+        return int(Qt::AlignVCenter | (column.IsText() ? Qt::AlignLeft : Qt::AlignRight));
     case Qt::ToolTipRole:
-        return column.style.GetEumToolTipText();
+        return column.ToolTip(false);
     case Qt::BackgroundRole:
         return IsLocked(index.row(), index.column()) ? QVariant(QGuiApplication::palette().brush(QPalette::Button))
                                                      : QVariant();
@@ -133,7 +133,7 @@ QVariant CGridModel::headerData(int section, Qt::Orientation orientation, int ro
     if (role == Qt::DisplayRole)
         return column.header();
     if (role == Qt::ToolTipRole)
-        return column.style.GetEumToolTipText();
+        return column.ToolTip(true);
     return {};
 }
 
@@ -245,16 +245,17 @@ std::unique_ptr<IRowBlock> CGridModel::NewLines(int count) const
 {
     auto lines = m_rows->NewRows(std::size_t(count));
     for (const ColumnSpec& column : m_columns) {
-        if (!column.fill)
-            continue;
-        for (std::size_t i = 0; i < lines->Count(); ++i)
-            column.access->set(lines->At(i), column.FillValue());
+        const CellValue value = column.NewLineValue();
+        for (std::size_t i = 0; i < lines->Count() && !std::holds_alternative<std::monostate>(value); ++i)
+            column.access->set(lines->At(i), value);
     }
     return lines;
 }
 
 void CGridModel::InsertRows(int row, int count)
 {
+    if (!m_rows)
+        return;
     Store();
     m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, std::size_t(row), NewLines(count)));
     Sync();
@@ -263,8 +264,8 @@ void CGridModel::InsertRows(int row, int count)
 void CGridModel::RemoveRows(int row, int count)
 {
     Store();
-    m_document->UndoStack().push(
-        new CDeleteLines(*m_document, m_rows, std::size_t(row), std::size_t(count), NewLines(1)));
+    m_document->UndoStack().push(new CDeleteLines(*m_document, m_rows, std::size_t(row), std::size_t(count),
+                                                  m_rows->MayBeEmpty() ? nullptr : NewLines(1)));
     Sync();
 }
 

@@ -26,7 +26,8 @@ public:
 
     void AddColumn(ColumnSpec column);
     const std::vector<ColumnSpec>& Columns() const { return m_columns; }
-    /// Where the rows are; the document keeps the undo steps. Both outlive the model.
+    /// Where the rows are (null while there are none); the document keeps the undo steps. Both outlive the model. What
+    /// was typed and not stored is dropped.
     void SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows);
     const std::shared_ptr<IRowSource>& Rows() const { return m_rows; }
 
@@ -61,7 +62,7 @@ public:
 
     /// New lines before `row`, with the columns' fill values: an undo step.
     void InsertRows(int row, int count = 1);
-    /// An undo step; a table left without lines gets a new one.
+    /// An undo step; a table left without lines gets a new one, unless its source may be empty.
     void RemoveRows(int row, int count);
     /// Gives a source without rows its one line, silently.
     void EnsureFirstRow();

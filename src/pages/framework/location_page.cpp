@@ -27,6 +27,12 @@ GridColumns& GridColumns::Add(int control, const Field& field, ColumnOptions opt
         column.locked = [locked = std::move(options.locked)](const void* row) {
             return locked(*static_cast<const HD_RiverPos*>(row));
         };
+    column.choices = std::move(options.choice);
+    if (options.choices)
+        column.choices.entries = [entries = *options.choices] { return LoadString(entries).split(u'\n'); };
+    column.unitText = std::move(options.unitText);
+    if (options.hint)
+        column.hint = [hint = *options.hint] { return LoadString(hint); };
     column.access = std::make_shared<CellAccess>(FieldAccess(field));
     m_grid.Model()->AddColumn(std::move(column));
     return *this;
@@ -51,6 +57,7 @@ GridColumns& GridColumns::Value(const Field& field, ColumnOptions options)
 {
     const bool integer = field.kind == FieldKind::Integer || field.kind == FieldKind::Choice;
     const int control = field.kind == FieldKind::Text ? Control::Text
+                        : options.choices             ? Control::DropDown
                         : integer                     ? Control::Integer
                         : options.emptyIsNotGiven     ? Control::Chainage
                                                       : Control::Number;
@@ -58,15 +65,53 @@ GridColumns& GridColumns::Value(const Field& field, ColumnOptions options)
 }
 
 CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent)
-    : CGenPropertyPage(document, parent), m_list(list)
+    : CGenPropertyPage(document, parent), m_list(&list)
 {
 }
 
 GridColumns CLocationPage::Grid(CGenGrid* grid)
 {
     grid->SetOwnerPage(this);
-    grid->Model()->SetSource(*GetDocument(), MakeListRows(*GetDocument(), m_list));
+    ShowList(m_list);
+    connect(grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this, &CLocationPage::ShowParts);
     return GridColumns(*grid);
+}
+
+void CLocationPage::ShowList(CGenList* list)
+{
+    m_list = list;
+    GetGrid()->Model()->SetSource(*GetDocument(), list ? MakeListRows(*GetDocument(), *list) : nullptr);
+    GetGrid()->setEnabled(list != nullptr);
+}
+
+GridColumns CLocationPage::AddPart(CGenGrid* grid, std::shared_ptr<IRowSource> rows, RowsOfLine rowsOfLine)
+{
+    grid->SetPartOfPage(this);
+    grid->Model()->SetSource(*GetDocument(), std::move(rows));
+    m_parts.push_back({grid, std::move(rowsOfLine)});
+    return GridColumns(*grid);
+}
+
+HD_RiverPos* CLocationPage::CurrentRecord() const
+{
+    const int row = GetGrid()->CurrentRow();
+    return m_list && row >= 1 && std::size_t(row) <= m_list->GetCount() ? &m_list->GetAt(std::size_t(row) - 1)
+                                                                        : nullptr;
+}
+
+void CLocationPage::ShowParts()
+{
+    HD_RiverPos* current = CurrentRecord();
+    for (Part& part : m_parts) {
+        if (part.rows && part.shown != current) {
+            part.grid->CommitEditor();
+            part.grid->Model()->Store(); // what was typed belongs to the line that is left
+            part.shown = current;
+            part.grid->Model()->SetSource(*GetDocument(), current ? part.rows(*current) : nullptr);
+        }
+        part.grid->setEnabled(part.grid->Model()->Rows() != nullptr);
+        part.grid->Reload();
+    }
 }
 
 void CLocationPage::LoadFromDocument(CKavo0_hdDoc* document)
@@ -74,27 +119,34 @@ void CLocationPage::LoadFromDocument(CKavo0_hdDoc* document)
     CGenPropertyPage::LoadFromDocument(document);
     GetGrid()->Model()->EnsureFirstRow();
     GetGrid()->Reload();
+    ShowParts();
 }
 
 void CLocationPage::StoreToDocument()
 {
     CGenPropertyPage::StoreToDocument();
-    GetGrid()->CommitEditor();
-    GetGrid()->Model()->Store();
+    Store(BlankRule::Zero);
+}
+
+void CLocationPage::Store(BlankRule rule)
+{
+    CommitGrids();
+    GetGrid()->Model()->Store(rule);
+    for (const Part& part : m_parts)
+        part.grid->Model()->Store(rule);
 }
 
 bool CLocationPage::OnKillActive()
 {
     // Only what is still blank: a cell that was left blank by a move is a stored number by now.
-    GetGrid()->CommitEditor();
-    GetGrid()->Model()->Store(BlankRule::Fill);
+    Store(BlankRule::Fill);
     return CGenPropertyPage::OnKillActive();
 }
 
 void CLocationPage::AppendLine()
 {
-    if (GetGrid()->CommitEditor())
-        GetGrid()->InsertLine();
+    if (LinesGrid()->CommitEditor())
+        LinesGrid()->InsertLine();
 }
 
 void CLocationPage::InsertLocation(const QString& riverName, const QString& chainageText)
@@ -120,7 +172,7 @@ std::unique_ptr<HD_RiverPos> CLocationPage::GetRecordAt(int row) const
 {
     if (row < 1 || row > GetGrid()->RowCount())
         return nullptr;
-    auto record = m_list.NewRecord();
+    auto record = m_list->NewRecord();
     GetGrid()->Model()->CopyRow(row - 1, record.get());
     return record;
 }

@@ -4,6 +4,7 @@
 #include "module/document.h"
 #include "pages/framework/gen_grid.h"
 #include "pages/framework/page.h"
+#include "pages/framework/vector_rows.h"
 #include "res/strings.h"
 
 /// What a column says about itself beyond its field.
@@ -16,6 +17,10 @@ struct ColumnOptions
     const double* fill = nullptr; // see ColumnSpec
     bool emptyIsNotGiven = false;
     std::function<bool(const HD_RiverPos& record)> locked = {};
+    std::optional<Str> choices = {};        // entries of a drop-down column, one a line of the text
+    Choices choice = {};                    // the rest of a drop-down column; its entries come from `choices`
+    std::function<QString()> unitText = {}; // see ColumnSpec
+    std::optional<Str> hint = {};           // tool tip of the header
 };
 
 /// Declares the columns of a grid, from left to right.
@@ -60,7 +65,7 @@ public:
     }
     CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent = nullptr);
 
-    CGenList* GetList() const override { return &m_list; }
+    CGenList* GetList() const override { return m_list; }
     void InsertLocation(const QString& riverName, const QString& chainageText) override;
     void AppendLine() override;
     void LoadFromDocument(CKavo0_hdDoc* document) override;
@@ -71,7 +76,38 @@ public:
 protected:
     /// Makes `grid` the page's grid; its columns are declared on the result.
     GridColumns Grid(CGenGrid* grid);
+    /// A grid of pairs (or other lines without location), over a vector of the global values.
+    template <typename T>
+    GridColumns PairsGrid(CGenGrid* grid, std::vector<T>& pairs)
+    {
+        return AddPart(grid, std::make_shared<VectorRows<T>>(*GetDocument(), pairs), {});
+    }
+    /// Likewise over a vector of the record whose line is current in the page's grid.
+    template <typename Record, typename T>
+    GridColumns PairsGrid(CGenGrid* grid, std::vector<T> Record::*pairs)
+    {
+        return AddPart(grid, nullptr, [this, pairs](HD_RiverPos& record) {
+            return std::make_shared<VectorRows<T>>(*GetDocument(), static_cast<Record&>(record).*pairs,
+                                                   VectorOwner{m_list, &record});
+        });
+    }
+    /// Shows another list in the page's grid; null for none.
+    void ShowList(CGenList* list);
 
 private:
-    CGenList& m_list;
+    using RowsOfLine = std::function<std::shared_ptr<IRowSource>(HD_RiverPos& current)>;
+    struct Part
+    {
+        CGenGrid* grid;
+        RowsOfLine rows;              // empty for a grid that shows the same rows all the time
+        HD_RiverPos* shown = nullptr; // the line whose rows it shows
+    };
+
+    GridColumns AddPart(CGenGrid* grid, std::shared_ptr<IRowSource> rows, RowsOfLine rowsOfLine);
+    HD_RiverPos* CurrentRecord() const;
+    void ShowParts();
+    void Store(BlankRule rule);
+
+    CGenList* m_list;
+    std::vector<Part> m_parts;
 };

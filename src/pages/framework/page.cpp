@@ -3,6 +3,7 @@
 #include "module/document.h"
 #include "pages/framework/gen_grid.h"
 
+#include <QApplication>
 #include <QKeyEvent>
 #include <QUndoStack>
 
@@ -25,8 +26,25 @@ void CGenPropertyPage::AppendLine() {}
 
 void CGenPropertyPage::DeleteLines()
 {
-    if (m_grid)
-        m_grid->DeleteSelectedLines();
+    if (auto* grid = LinesGrid())
+        grid->DeleteSelectedLines();
+}
+
+bool CGenPropertyPage::CommitGrids()
+{
+    bool taken = !m_grid || m_grid->CommitEditor();
+    for (CGenGrid* grid : m_partGrids)
+        taken = grid->CommitEditor() && taken;
+    return taken;
+}
+
+CGenGrid* CGenPropertyPage::LinesGrid() const
+{
+    const QWidget* focus = QApplication::focusWidget();
+    for (CGenGrid* grid : m_partGrids)
+        if (grid == focus || grid->isAncestorOf(focus))
+            return grid;
+    return m_grid;
 }
 
 void CGenPropertyPage::GotoLine(int row)

@@ -9,6 +9,7 @@
 #include <QString>
 #include <QWidget>
 #include <memory>
+#include <vector>
 
 class CGenGrid;
 class CGenList;
@@ -29,6 +30,10 @@ public:
     /// The page's location grid, null on a page without one.
     CGenGrid* GetGrid() const { return m_grid; }
     void SetGrid(CGenGrid* grid) { m_grid = grid; }
+    /// Further grids of the page.
+    void AddPartGrid(CGenGrid* grid) { m_partGrids.push_back(grid); }
+    /// Takes the texts being typed into cells; false when one is refused (the user has been told).
+    bool CommitGrids();
     /// The list that the page's grid edits; null without one.
     virtual CGenList* GetList() const { return nullptr; }
     /// Tab caption in the user's language.
@@ -73,6 +78,8 @@ protected:
     {
         m_bindings.Add(buttons, Globals().*member);
     }
+    /// The grid that inserting and deleting lines mean: a further grid while it has the focus, else the page's grid.
+    CGenGrid* LinesGrid() const;
     CBindings& Bindings() { return m_bindings; }
     HD_Global_Var& Globals() const;
 
@@ -85,6 +92,7 @@ private:
     CKavo0_hdDoc* m_document;
     IPageHost* m_host = nullptr;
     CGenGrid* m_grid = nullptr;
+    std::vector<CGenGrid*> m_partGrids;
     CBindings m_bindings;
     KsUnitSystem m_shownUnits; // what the texts on the page are in
 };
