@@ -1,5 +1,6 @@
 #include "pages/framework/binding.h"
 
+#include "data/global_var.h"
 #include "ks/units/edit_fields.h"
 #include "module/document.h"
 #include "pages/framework/commands.h"
@@ -9,8 +10,24 @@
 #include <QButtonGroup>
 #include <QCheckBox>
 #include <QComboBox>
+#include <QKeyEvent>
 #include <QLabel>
 #include <QRadioButton>
+
+namespace {
+
+/// The unit group that the global value's declaration gives it; none for a number that is not a global value.
+UnitGroup DeclaredUnit(HD_Global_Var& globals, const double& value)
+{
+    for (const GlobalSection& section : HDGlobalSections())
+        for (const GlobalKeyword& keyword : section.keywords)
+            for (const Field& field : keyword.Fields())
+                if (field.address(&globals) == &value)
+                    return field.unit;
+    return UnitGroup::None;
+}
+
+} // namespace
 
 template <typename T>
 void CBindings::Store(T& target, T value)
@@ -27,14 +44,16 @@ void CBindings::ApplyRules()
 
 void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
 {
-    field->Setup(&value, options.textLimit, options.decimals, options.generalNotation, options.unit);
+    field->Setup(&value, options.textLimit, options.decimals, options.generalNotation,
+                 options.unit ? *options.unit : DeclaredUnit(m_document->Parameters().Global, value));
     field->SetRange(options.minimum.has_value(), options.minimum.value_or(0), options.maximum.has_value(),
                     options.maximum.value_or(0));
+    field->SetUnitText(options.unitText);
     field->SetStore([this](double& target, double number) { Store(target, number); });
     m_show.push_back([field, label = options.unitLabel] {
         field->Show();
         if (label)
-            label->setText(field->Style().UnitSymbol());
+            label->setText(field->UnitSymbol());
     });
     m_take.push_back([field] { return field->Commit(); });
 }
@@ -45,6 +64,7 @@ void CBindings::Add(CKsEditLong* field, std::int32_t& value)
         if (!field->isModified()) // a text that has not been taken yet stays
             field->SetValue(value);
     });
+    field->installEventFilter(this);
     const auto take = [this, field, &value](std::optional<std::int32_t> typed) {
         if (!typed)
             return false;
@@ -105,6 +125,25 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
         group->setExclusive(true);
     });
     connect(group, &QButtonGroup::idClicked, this, [this, &value](int chosen) { Store(value, std::int32_t(chosen)); });
+}
+
+void CBindings::AddUnbound(QComboBox* box)
+{
+    m_show.push_back([box] { box->setCurrentIndex(0); });
+}
+
+bool CBindings::eventFilter(QObject* object, QEvent* event)
+{
+    // With nothing typed an integer field leaves undo and redo to the document.
+    if (event->type() == QEvent::ShortcutOverride || event->type() == QEvent::KeyPress) {
+        const auto* key = static_cast<QKeyEvent*>(event);
+        const bool undoRedo = key->matches(QKeySequence::Undo) || key->matches(QKeySequence::Redo);
+        if (undoRedo && !static_cast<CKsEditLong*>(object)->isModified()) {
+            event->ignore();
+            return true;
+        }
+    }
+    return QObject::eventFilter(object, event);
 }
 
 void CBindings::AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets,

@@ -23,11 +23,12 @@ class QWidget;
 /// How a number is edited in a single field.
 struct FieldOptions
 {
-    UnitGroup unit = UnitGroup::None;
+    std::optional<UnitGroup> unit = {}; // by default the declared one of the global value
     int decimals = 6;
     bool generalNotation = true; // false: scientific
     int textLimit = 20;
     std::optional<double> minimum = {}, maximum = {}; // base units
+    std::function<QString()> unitText = {};           // symbol of a unit that depends on a setting
     QLabel* unitLabel = nullptr;                      // shows the unit beside the field
 };
 
@@ -37,7 +38,7 @@ public:
     explicit CBindings(CKavo0_hdDoc* document) : m_document(document) {}
 
     // Each value lives in the document, which outlives the page.
-    void Add(CCtrlEdit* field, double& value, const FieldOptions& options);
+    void Add(CCtrlEdit* field, double& value, const FieldOptions& options = {});
     void Add(CKsEditLong* field, std::int32_t& value);
     void Add(QCheckBox* box, bool& value);
     void Add(QCheckBox* box, std::int32_t& flag);
@@ -45,6 +46,8 @@ public:
     void Add(QComboBox* box, std::int32_t& index);
     /// Button n stands for the value n. Another value is kept, with no button pressed.
     void Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& value);
+    /// A list that stands for no value: whatever is chosen, it shows its first entry when the page is shown afresh.
+    void AddUnbound(QComboBox* box);
 
     /// The widgets are enabled, or visible, exactly while the rule holds; it is asked whenever the page is shown
     /// afresh.
@@ -55,6 +58,9 @@ public:
     void Show();
     /// Takes what is being typed; false when a field refuses it (the user has been told).
     bool Take();
+
+protected:
+    bool eventFilter(QObject* object, QEvent* event) override;
 
 private:
     template <typename T>

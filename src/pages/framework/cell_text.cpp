@@ -23,10 +23,11 @@ QString ShownText(const ColumnSpec& column, const CellValue& value)
         return EditText(column, value);
     // Two steps: the style's format says how much of the number the page shows at all, the editor how it looks.
     const QString styled = column.style.UnitConvertFromBase_T(*number, 1);
+    const int decimals = FindControl(column.control).decimals;
     const auto read = ReadNumber(styled.toStdString());
-    if (!read)
-        return styled; // no finite number
-    return KsFormatNumber(QStringLiteral("%-.%1lf").arg(FindControl(column.control).decimals), *read);
+    if (decimals == AsFormatted || !read) // or no finite number
+        return styled;
+    return KsFormatNumber(QStringLiteral("%-.%1lf").arg(decimals), *read);
 }
 
 QString EditText(const ColumnSpec& column, const CellValue& value)

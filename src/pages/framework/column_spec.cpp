@@ -10,6 +10,7 @@ namespace {
 
 constexpr GridControl Controls[] = {
     {Control::Integer, CellKind::Integer, 0, "edit"},
+    {Control::Formatted, CellKind::Number, AsFormatted, "doubleEdit"},
     {Control::Number, CellKind::Number, 3, "doubleEdit_1110"},
     {Control::Text, CellKind::Text, 0, "stringEdit_1111"},
     {Control::DropDown, CellKind::Choice, 0, "dropDown"},

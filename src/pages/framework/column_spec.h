@@ -31,16 +31,20 @@ enum class CellKind
     Choice // an index, shown as the text of its entry
 };
 
+/// A number that is not being edited stands as the column's format has it.
+inline constexpr int AsFormatted = -1;
+
 /// The cell editors by number, in one table.
 struct GridControl
 {
     int id;
     CellKind kind;
-    int decimals;           // of a number that is not being edited
+    int decimals;           // of a number that is not being edited; AsFormatted
     const char* editorName; // object name of the editor
 };
 namespace Control {
 inline constexpr int Integer = 0;     // the plain edit control
+inline constexpr int Formatted = 1;   // a number of any magnitude
 inline constexpr int Number = 5042;   // three decimals
 inline constexpr int Text = 5043;     // upper case
 inline constexpr int Chainage = 5044; // whole numbers shown

@@ -1,6 +1,7 @@
 #include "pages/framework/ctrl_edit.h"
 
 #include "ks/fc/message_box.h"
+#include "pages/framework/column_spec.h"
 #include "pages/framework/number_syntax.h"
 #include "res/strings.h"
 
@@ -42,14 +43,14 @@ void CCtrlEdit::SetValue(double value)
 
 void CCtrlEdit::Show()
 {
-    setToolTip(m_style.GetEumToolTipText());
+    setToolTip(UnitToolTip(UnitSymbol()));
     if (!hasFocus() || !IsTyped())
         ShowValue();
 }
 
 void CCtrlEdit::ShowValue()
 {
-    setToolTip(m_style.GetEumToolTipText());
+    setToolTip(UnitToolTip(UnitSymbol()));
     m_shown = m_style.UnitConvertFromBase_T(*m_value, 1);
     if (text() != m_shown)
         setText(m_shown);

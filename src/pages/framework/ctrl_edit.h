@@ -20,6 +20,10 @@ public:
     /// How an accepted number gets into the document; without it the bound value is simply set.
     void SetStore(std::function<void(double& target, double value)> store) { m_store = std::move(store); }
 
+    /// Symbol of a unit that depends on a setting, instead of the unit group's.
+    void SetUnitText(std::function<QString()> text) { m_unitText = std::move(text); }
+    QString UnitSymbol() const { return m_unitText ? m_unitText() : m_style.UnitSymbol(); }
+
     /// Stores into the bound value and shows it.
     void SetValue(double value);
     /// Shows the bound value and unit as they are now. A text being typed stays.
@@ -49,6 +53,7 @@ private:
     bool m_hasMinimum = false, m_hasMaximum = false;
     double m_minimum = 0, m_maximum = 0;
     std::function<void(double&, double)> m_store;
+    std::function<QString()> m_unitText;
     QString m_shown;       // the text as last shown
     bool m_warned = false; // during the present event
 };

@@ -38,6 +38,9 @@ CGenGrid::CGenGrid(QWidget* parent)
     setSelectionMode(ContiguousSelection);
     setHorizontalScrollMode(ScrollPerPixel);
     setWordWrap(false);
+    QSizePolicy policy = sizePolicy();
+    policy.setRetainSizeWhenHidden(true); // a hidden grid leaves the rest of the page where it is
+    setSizePolicy(policy);
     verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     verticalHeader()->setHighlightSections(false);
     UpdateRowHeader();
@@ -152,7 +155,8 @@ void CGenGrid::StoreEditedLine()
 void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& previous)
 {
     QTableView::currentChanged(current, previous); // closes an editor, whose text the cell takes
-    StoreEditedLine();
+    if (!m_model->IsSyncing())
+        StoreEditedLine();
     m_lastColumn = current.column() + 1;
     const int row = current.row() + 1;
     if (row == m_lastRow)

@@ -7,6 +7,7 @@
 
 #include <QGuiApplication>
 #include <QPalette>
+#include <QScopedValueRollback>
 #include <QUndoStack>
 #include <bit>
 
@@ -45,8 +46,9 @@ void CGridModel::SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> r
 
 void CGridModel::Sync()
 {
-    if (!m_rows)
+    if (!m_rows || m_syncing)
         return;
+    const QScopedValueRollback syncing(m_syncing, true);
     if (m_revision != m_rows->Revision()) {
         m_revision = m_rows->Revision();
         PruneOverlay();

@@ -33,6 +33,8 @@ public:
 
     /// Shows the source as it is now. Costs the same for any number of rows as long as none came, went or moved.
     void Sync();
+    /// Rows are coming or going: no moment to store anything.
+    bool IsSyncing() const { return m_syncing; }
 
     // QAbstractItemModel
     int rowCount(const QModelIndex& parent = {}) const override;
@@ -89,5 +91,6 @@ private:
     std::shared_ptr<IRowSource> m_rows;
     int m_rowCount = 0; // as the views know it
     std::uint64_t m_revision = 0;
+    bool m_syncing = false;
     std::map<CellKey, Typed> m_pending;
 };

@@ -31,8 +31,7 @@ GridColumns& GridColumns::Add(int control, const Field& field, ColumnOptions opt
     if (options.choices)
         column.choices.entries = [entries = *options.choices] { return LoadString(entries).split(u'\n'); };
     column.unitText = std::move(options.unitText);
-    if (options.hint)
-        column.hint = [hint = *options.hint] { return LoadString(hint); };
+    column.hint = std::move(options.hint);
     column.access = std::make_shared<CellAccess>(FieldAccess(field));
     m_grid.Model()->AddColumn(std::move(column));
     return *this;
@@ -60,12 +59,18 @@ GridColumns& GridColumns::Value(const Field& field, ColumnOptions options)
                         : options.choices             ? Control::DropDown
                         : integer                     ? Control::Integer
                         : options.emptyIsNotGiven     ? Control::Chainage
+                        : options.asFormatted         ? Control::Formatted
                                                       : Control::Number;
     return Add(control, field, std::move(options));
 }
 
 CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent)
-    : CGenPropertyPage(document, parent), m_list(&list)
+    : CLocationPage(document, &list, parent)
+{
+}
+
+CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList* list, QWidget* parent)
+    : CGenPropertyPage(document, parent), m_list(list)
 {
 }
 
@@ -140,7 +145,8 @@ bool CLocationPage::OnKillActive()
 {
     // Only what is still blank: a cell that was left blank by a move is a stored number by now.
     Store(BlankRule::Fill);
-    return CGenPropertyPage::OnKillActive();
+    StoreToDocument();
+    return true; // leaving a table is never refused
 }
 
 void CLocationPage::AppendLine()
@@ -151,6 +157,8 @@ void CLocationPage::AppendLine()
 
 void CLocationPage::InsertLocation(const QString& riverName, const QString& chainageText)
 {
+    if (!m_list)
+        return;
     CGridModel& model = *GetGrid()->Model();
     const QString refusal = model.Refusal(model.rowCount(), 1, chainageText);
     if (!refusal.isEmpty()) {

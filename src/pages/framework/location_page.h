@@ -14,13 +14,14 @@ struct ColumnOptions
     Str caption = Str::RiverName;
     int width = 72;
     const char* format = "%-lf";
+    bool asFormatted = false;     // numbers stand in `format`, not with three decimals
     const double* fill = nullptr; // see ColumnSpec
     bool emptyIsNotGiven = false;
     std::function<bool(const HD_RiverPos& record)> locked = {};
     std::optional<Str> choices = {};        // entries of a drop-down column, one a line of the text
     Choices choice = {};                    // the rest of a drop-down column; its entries come from `choices`
     std::function<QString()> unitText = {}; // see ColumnSpec
-    std::optional<Str> hint = {};           // tool tip of the header
+    std::function<QString()> hint = {};     // see ColumnSpec
 };
 
 /// Declares the columns of a grid, from left to right.
@@ -64,6 +65,8 @@ public:
     {
     }
     CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent = nullptr);
+    /// `list` may be null, and be given or exchanged later (ShowList).
+    CLocationPage(CKavo0_hdDoc* document, CGenList* list, QWidget* parent = nullptr);
 
     CGenList* GetList() const override { return m_list; }
     void InsertLocation(const QString& riverName, const QString& chainageText) override;

@@ -56,6 +56,8 @@ void CGenPropertyPage::GotoLine(int row)
 void CGenPropertyPage::LoadFromDocument(CKavo0_hdDoc*)
 {
     m_bindings.Show();
+    if (m_host) // a rule may have shown or hidden the grid
+        m_host->EnableLinesMenu(m_grid && m_grid->isVisibleTo(this));
 }
 
 void CGenPropertyPage::StoreToDocument()
@@ -83,13 +85,13 @@ void CGenPropertyPage::UndoRedo(bool undo)
 
 void CGenPropertyPage::OnSetActive()
 {
-    if (m_host)
-        m_host->EnableLinesMenu(m_grid != nullptr);
     LoadFromDocument(m_document);
 }
 
 bool CGenPropertyPage::OnKillActive()
 {
+    if (!m_bindings.Take())
+        return false;
     StoreToDocument();
     return true;
 }

@@ -1,0 +1,49 @@
+#include "pages/bed_page.h"
+
+#include "pages/resistance_unit.h"
+#include "ui_bed_page.h"
+
+CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
+    : CLocationPage(document, &HD_Parameters::BedList, parent), m_ui(std::make_unique<Ui::CBedPage>())
+{
+    m_ui->setupUi(this);
+    HD_Global_Var& globals = Globals();
+    const auto usesZones = [&globals] { return globals.ResisZone == 1; };
+    const auto isUniform = [&globals] { return globals.ResisZone != 1; };
+    const auto unit = [&globals] { return ResistanceUnit(globals.resist_num); };
+
+    using G = HD_Global_Var;
+    Bind(m_ui->formula_1300, &G::resist_num);
+    Bind({m_ui->uniform_1301, m_ui->zones_1302}, &G::ResisZone);
+    Bind(m_ui->resistance_1303, &G::G_resistance, {.unitText = unit, .unitLabel = m_ui->unit_1303});
+    Bind(m_ui->zone_1304, &G::ZoneResistance1, {.unitText = unit, .unitLabel = m_ui->unit_1304});
+    Bind(m_ui->zone_1305, &G::ZoneResistance2, {.unitText = unit, .unitLabel = m_ui->unit_1305});
+    Bind(m_ui->zone_1306, &G::ZoneResistance3, {.unitText = unit, .unitLabel = m_ui->unit_1306});
+    Bindings().EnableWhen(isUniform, {m_ui->resistanceLabel_1303, m_ui->resistance_1303, m_ui->unit_1303});
+    Bindings().EnableWhen(usesZones,
+                          {m_ui->zoneLabel_1304, m_ui->zone_1304, m_ui->unit_1304, m_ui->zoneLabel_1305,
+                           m_ui->zone_1305, m_ui->unit_1305, m_ui->zoneLabel_1306, m_ui->zone_1306, m_ui->unit_1306});
+
+    // The values of the approach not in use are kept.
+    const auto column = [&](Str caption, const double& global, bool ofZones) {
+        return ColumnOptions{.caption = caption,
+                             .fill = &global,
+                             .locked = [usesZones, ofZones](const HD_RiverPos&) { return usesZones() != ofZones; },
+                             .unitText = unit};
+    };
+    using R = HD_Resistfact;
+    Grid(m_ui->grid_1307)
+        .BranchName({.width = 80})
+        .Chainage({})
+        .Value(&R::Resistance, column(Str::Resistance, globals.G_resistance, false))
+        .Value(&R::ZoneResistance1, column(Str::Zone1, globals.ZoneResistance1, true))
+        .Value(&R::ZoneResistance2, column(Str::Zone2, globals.ZoneResistance2, true))
+        .Value(&R::ZoneResistance3, column(Str::Zone3, globals.ZoneResistance3, true));
+}
+
+CBedPage::~CBedPage() = default;
+
+void CBedPage::Retranslate()
+{
+    m_ui->retranslateUi(this);
+}

@@ -1,0 +1,149 @@
+#include "pages/encroach_page.h"
+
+#include "pages/setup_command.h"
+#include "ui_encroach_page.h"
+
+#include <QUndoStack>
+
+namespace {
+
+constexpr std::size_t NewSetupLines = 2; // a set-up is saved when its second line is filled
+
+} // namespace
+
+CEncroachPage::CEncroachPage(CKavo0_hdDoc* document, QWidget* parent)
+    : CLocationPage(document, nullptr, parent), m_ui(std::make_unique<Ui::CEncroachPage>())
+{
+    m_ui->setupUi(this);
+    Bind(m_ui->maxIter_1340, &HD_Global_Var::Max_no_iter);
+    Bindings().EnableWhen([this] { return HasSetup(); },
+                          {m_ui->setupLabel, m_ui->setup_1341, m_ui->duplicate_1345, m_ui->delete_1346});
+    Bindings().EnableWhen([this] { return m_current > 0; }, {m_ui->previous_1342});
+    Bindings().EnableWhen([this] { return m_current + 1 < Setups().GetCount(); }, {m_ui->next_1343});
+
+    connect(m_ui->setup_1341, &QComboBox::activated, this, [this](int setup) { GoTo(std::size_t(setup)); });
+    connect(m_ui->previous_1342, &QPushButton::clicked, this, [this] { GoTo(m_current - 1); });
+    connect(m_ui->next_1343, &QPushButton::clicked, this, [this] { GoTo(m_current + 1); });
+    connect(m_ui->add_1344, &QPushButton::clicked, this, [this] {
+        auto setup = NewSetup();
+        for (std::size_t line = 0; line < NewSetupLines; ++line)
+            setup->Add();
+        Insert(std::move(setup));
+    });
+    connect(m_ui->duplicate_1345, &QPushButton::clicked, this, [this] {
+        StoreToDocument();
+        auto setup = NewSetup();
+        const Setup& original = Setups().GetAt(m_current);
+        for (std::size_t line = 0; line < original.GetCount(); ++line)
+            setup->Add(original.GetAt(line));
+        Insert(std::move(setup));
+    });
+    connect(m_ui->delete_1346, &QPushButton::clicked, this, &CEncroachPage::Delete);
+    connect(document, &CKavo0_hdDoc::Reveal, this, [this](const CGenList* list) { Reveal(list); });
+    DeclareColumns();
+}
+
+CEncroachPage::~CEncroachPage() = default;
+
+void CEncroachPage::DeclareColumns()
+{
+    GridColumns columns = Grid(m_ui->grid_1348);
+    columns.BranchName({.width = 80}).Chainage({});
+    const Str entries[] = {Str::EncroachMethods, Str::EncroachBanks, Str::EncroachReductions};
+    const Str* next = entries;
+    qsizetype number = 0;
+    for (const Field& field : HDEncroach::DeclaredFields()) {
+        ColumnOptions options{
+            .header = [number] { return LoadString(Str::EncroachColumns).split(u'\n')[number]; },
+            .hint =
+                [name = field.name] {
+                    return LoadString(Str::StoredAs).arg(QString::fromLatin1(name.data(), name.size()));
+                }};
+        ++number;
+        if (field.kind == FieldKind::Choice) {
+            options.width = 130;
+            options.choices = *next++;
+            options.choice = {.first = 1, .whenEmptied = 1};
+        }
+        columns.Value(field, std::move(options));
+    }
+}
+
+CGenMetaList<HDEncroach>& CEncroachPage::Setups() const
+{
+    return GetDocument()->Parameters().EncroachList;
+}
+
+std::unique_ptr<CEncroachPage::Setup> CEncroachPage::NewSetup() const
+{
+    return std::make_unique<Setup>(Setups().InnerSectionName());
+}
+
+void CEncroachPage::LoadFromDocument(CKavo0_hdDoc* document)
+{
+    const std::size_t count = Setups().GetCount();
+    m_current = std::min(m_current, count > 0 ? count - 1 : 0);
+    CGenList* setup = HasSetup() ? &Setups().GetAt(m_current) : nullptr;
+    if (setup != GetList())
+        ShowList(setup);
+    CLocationPage::LoadFromDocument(document);
+    ShowSetups();
+}
+
+void CEncroachPage::ShowSetups()
+{
+    QComboBox& box = *m_ui->setup_1341;
+    box.clear();
+    for (std::size_t setup = 1; setup <= Setups().GetCount(); ++setup)
+        box.addItem(LoadString(Str::SetupNumber).arg(setup));
+    box.setCurrentIndex(HasSetup() ? int(m_current) : -1);
+
+    QString status;
+    if (!HasSetup())
+        status = LoadString(Str::NoSetups);
+    else if (!CGenMetaList<HDEncroach>::IsWorthKeeping(Setups().GetAt(m_current)))
+        status = LoadString(Str::SetupNotSaved);
+    m_ui->status_1347->setText(status);
+}
+
+void CEncroachPage::GoTo(std::size_t setup)
+{
+    if (CommitGrids()) {
+        StoreToDocument();
+        m_current = setup;
+    }
+    LoadFromDocument(GetDocument());
+}
+
+void CEncroachPage::Insert(std::unique_ptr<Setup> setup)
+{
+    if (!CommitGrids())
+        return;
+    StoreToDocument();
+    m_current = HasSetup() ? m_current + 1 : 0;
+    GetDocument()->UndoStack().push(new CSetupCommand(*GetDocument(), m_current, std::move(setup)));
+    GetGrid()->setFocus();
+}
+
+void CEncroachPage::Delete()
+{
+    if (!CommitGrids())
+        return;
+    StoreToDocument();
+    GetDocument()->UndoStack().push(new CSetupCommand(*GetDocument(), m_current, nullptr));
+}
+
+void CEncroachPage::Reveal(const CGenList* list)
+{
+    for (std::size_t setup = 0; setup < Setups().GetCount(); ++setup) {
+        if (&Setups().GetAt(setup) != list || setup == m_current)
+            continue;
+        m_current = setup;
+        LoadFromDocument(GetDocument());
+    }
+}
+
+void CEncroachPage::Retranslate()
+{
+    m_ui->retranslateUi(this);
+}

@@ -1,0 +1,25 @@
+// "Wave Approx": which approximation of the momentum equation is used, everywhere and in reaches.
+#pragma once
+
+#include "pages/framework/location_page.h"
+
+#include <memory>
+
+namespace Ui {
+class CWavePage;
+}
+
+class CWavePage : public CLocationPage
+{
+    Q_OBJECT
+public:
+    explicit CWavePage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
+    ~CWavePage() override;
+    QString Caption() const override { return LoadString(Str::WaveCaption); }
+
+protected:
+    void Retranslate() override;
+
+private:
+    std::unique_ptr<Ui::CWavePage> m_ui;
+};

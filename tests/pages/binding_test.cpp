@@ -1,0 +1,103 @@
+#include "page_fixture.h"
+
+#include "ks/units/edit_fields.h"
+#include "pages/framework/ctrl_edit.h"
+
+#include <QCheckBox>
+#include <QRadioButton>
+
+class BoundPage : public CGenPropertyPage
+{
+public:
+    explicit BoundPage(CKavo0_hdDoc* doc) : CGenPropertyPage(doc)
+    {
+        list.addItems({"none", "one", "two"});
+        auto* column = new QVBoxLayout(this);
+        for (QWidget* widget : std::initializer_list<QWidget*>{&box, &integer, &list, &level, &depth, &number, &hidden})
+            column->addWidget(widget);
+        Bind(&box, &HD_Global_Var::wind_shear_stress);
+        Bind(&integer, &HD_Global_Var::no_iter);
+        Bind(&list, &HD_Global_Var::G_wave);
+        Bind({&level, &depth}, &HD_Global_Var::iLevelDepth);
+        Bind(&number, &HD_Global_Var::G_wind_factor, {.minimum = 0});
+        Bindings().EnableWhen([this] { return box.isChecked(); }, {&number});
+        Bindings().ShowWhen([this] { return Globals().iLevelDepth == 1; }, {&hidden});
+    }
+    QString Caption() const override { return {}; }
+
+    QCheckBox box;
+    CKsEditLong integer;
+    QComboBox list;
+    QRadioButton level, depth;
+    CCtrlEdit number;
+    QLabel hidden;
+};
+
+class BindingTest : public PageTest
+{
+};
+
+TEST_F(BindingTest, ControlsFollowValuesAndBack)
+{
+    auto& page = Open<BoundPage>();
+    EXPECT_FALSE(view->linesMenu) << "no grid, no lines";
+    const auto flag = globals.wind_shear_stress;
+    page.box.click();
+    EXPECT_NE(globals.wind_shear_stress, flag);
+    EXPECT_EQ(page.number.isEnabled(), page.box.isChecked());
+    page.list.setCurrentIndex(2);
+    emit page.list.activated(2);
+    EXPECT_EQ(globals.G_wave, 2);
+    EXPECT_FALSE(page.hidden.isVisible());
+    page.depth.click();
+    EXPECT_EQ(globals.iLevelDepth, 1);
+    EXPECT_TRUE(page.hidden.isVisible());
+    EXPECT_TRUE(document.IsModified());
+    EXPECT_EQ(document.UndoStack().count(), 3);
+    page.UndoRedo(true);
+    EXPECT_TRUE(page.level.isChecked());
+    EXPECT_FALSE(page.hidden.isVisible());
+    document.UndoStack().setIndex(0);
+    EXPECT_EQ(page.box.isChecked(), bool(flag));
+    EXPECT_EQ(page.list.currentIndex(), globals.G_wave);
+}
+
+TEST_F(BindingTest, UnknownNumbersAreKept)
+{
+    globals.G_wave = 17;
+    globals.iLevelDepth = 5;
+    auto& page = Open<BoundPage>();
+    EXPECT_EQ(page.list.currentText(), "17");
+    EXPECT_FALSE(page.level.isChecked() || page.depth.isChecked());
+    page.StoreToDocument();
+    emit page.list.activated(3);
+    EXPECT_EQ(globals.G_wave, 17);
+    EXPECT_EQ(globals.iLevelDepth, 5);
+    emit page.list.activated(1);
+    EXPECT_EQ(page.list.count(), 3) << "the number is gone once another entry is chosen";
+    EXPECT_EQ(page.list.currentText(), "one");
+    EXPECT_EQ(document.UndoStack().count(), 1);
+}
+
+TEST_F(BindingTest, IntegersAreTakenWhenLeftOrStored)
+{
+    auto& page = Open<BoundPage>();
+    const auto before = globals.no_iter;
+    const auto type = [&](const char* text) {
+        page.integer.setFocus();
+        page.integer.selectAll();
+        QTest::keyClicks(&page.integer, text);
+    };
+    type("x1");
+    page.list.setFocus();
+    EXPECT_EQ(boxes, QStringList()) << "leaving the field says nothing";
+    page.LoadFromDocument(&document);
+    EXPECT_EQ(page.integer.text(), "x1") << "and a reload keeps it";
+    page.StoreToDocument();
+    EXPECT_EQ(boxes.size(), 1);
+    EXPECT_EQ(globals.no_iter, before);
+    type("42");
+    EXPECT_EQ(globals.no_iter, before);
+    page.StoreToDocument();
+    EXPECT_EQ(globals.no_iter, 42);
+}

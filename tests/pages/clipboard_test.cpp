@@ -1,0 +1,128 @@
+#include "page_fixture.h"
+
+#include "pages/framework/grid_clipboard.h"
+#include "pages/init_page.h"
+
+#include <QClipboard>
+
+TEST(TableText, RoundTripAndForeignTexts)
+{
+    const std::vector<QStringList> odd = {{"a", "", "tab\there"}, {"line\nend", "\"quoted\"", " blank "}, {"", "", ""}};
+    EXPECT_EQ(ReadTable(WriteTable(odd)), odd);
+    const struct
+    {
+        const char* text;
+        std::vector<QStringList> table;
+    } cases[] = {
+        {"", {{""}}},
+        {"1\t2\r\n3\t4\r\n", {{"1", "2"}, {"3", "4"}}},
+        {"1\r2", {{"1"}, {"2"}}},
+        {"\t\n", {{"", ""}}},
+        {"a\n\nb", {{"a"}, {""}, {"b"}}},
+        {"\"a\nb\"\tc", {{"a\nb", "c"}}},
+        {"5\" pipe\t\"open", {{"5\" pipe", "\"open"}}},
+    };
+    for (const auto& c : cases)
+        EXPECT_EQ(ReadTable(c.text), c.table) << c.text;
+}
+
+class ClipboardTest : public PageTest
+{
+protected:
+    ClipboardTest()
+    {
+        Add("A", 1.25, 0.1, 20);
+        Add("B", NotGiven, 11, 21);
+        Open<CInitPage>();
+        grid->setFocus();
+    }
+    void Select(int top, int left, int bottom, int right)
+    {
+        grid->SetCurrentCell(top, left);
+        grid->selectionModel()->select(
+            QItemSelection(grid->model()->index(top - 1, left - 1), grid->model()->index(bottom - 1, right - 1)),
+            QItemSelectionModel::ClearAndSelect);
+    }
+    void Paste(int row, int column, const QString& text)
+    {
+        grid->SetCurrentCell(row, column);
+        QGuiApplication::clipboard()->setText(text);
+        QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier);
+    }
+    QString Copied()
+    {
+        QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier);
+        return QGuiApplication::clipboard()->text();
+    }
+};
+
+TEST_F(ClipboardTest, CopiesWholeNumbersInDisplayUnits)
+{
+    Select(1, 1, 2, 3);
+    EXPECT_EQ(Copied(), "A\t1.25\t0.1\nB\t\t11");
+    Select(2, 4, 2, 4);
+    EXPECT_EQ(Copied(), "21");
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    EXPECT_NEAR(Copied().toDouble(), 21 * 35.3147, 0.01);
+}
+
+TEST_F(ClipboardTest, PastesRectangles)
+{
+    Paste(2, 2, "7\t8\n"); // a part of one line
+    EXPECT_EQ(Stored(), "A 1.25 0.1 20, B 7 8 21");
+    Paste(2, 1, "rhine\t1\t2\t3\r\nmain\t\t5\t6\r\nneckar\t9\t\t\r\n"); // past the end
+    EXPECT_EQ(Stored(), "A 1.25 0.1 20, RHINE 1 2 3, MAIN 10000000000 5 6, NECKAR 9 0 0");
+    document.UndoStack().undo();
+    EXPECT_EQ(Stored(), "A 1.25 0.1 20, B 7 8 21") << "one step";
+    document.UndoStack().redo();
+    EXPECT_EQ(init.GetCount(), 4u);
+    Select(1, 3, 3, 4);
+    QGuiApplication::clipboard()->setText("5");
+    QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier); // one cell fills the selection
+    EXPECT_EQ(Stored(), "A 1.25 5 5, RHINE 1 5 5, MAIN 10000000000 5 5, NECKAR 9 0 0");
+    EXPECT_EQ(view->edited.back(), 3);
+    EXPECT_EQ(boxes, QStringList());
+}
+
+TEST_F(ClipboardTest, PastingWhatWasCopiedChangesNothing)
+{
+    for (auto system : {KsUnitSystem::Metric, KsUnitSystem::UsCustomary}) {
+        KsUnits::Instance().SetSystem(system);
+        Select(1, 1, 2, 4);
+        const QString before = Stored();
+        Copied();
+        QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier);
+        EXPECT_EQ(Stored(), before);
+        EXPECT_EQ(document.UndoStack().count(), 0);
+    }
+}
+
+TEST_F(ClipboardTest, RefusesAsAWhole)
+{
+    const QString before = Stored();
+    const struct
+    {
+        int row, column;
+        const char *text, *message;
+    } cases[] = {
+        {1, 1, "X\t1\t2\nY\t2\t1.5.2",
+         "Nothing was pasted. Line 2, column \"Initial h\" cannot take \"1.5.2\":\nFloating point number required"},
+        {2, 2, "1\n2\nabc",
+         "Nothing was pasted. Line 4, column \"Chainage\" cannot take \"abc\":\nFloating point number required"},
+        {1, 3, "1\t2\t3",
+         "Nothing was pasted. The copied cells are 3 columns wide; from column \"Initial h\" on the table has only 2."},
+        {1, 3, " 1",
+         "Nothing was pasted. Line 1, column \"Initial h\" cannot take \" 1\":\nFloating point number required"},
+    };
+    for (const auto& c : cases) {
+        Paste(c.row, c.column, c.text);
+        EXPECT_EQ(boxes, QStringList{c.message});
+        boxes.clear();
+        EXPECT_EQ(Stored(), before) << c.text;
+    }
+    QGuiApplication::clipboard()->setText("bad");
+    grid->SetCurrentCell(1, 3);
+    QTest::keyClick(grid, Qt::Key_Insert, Qt::ShiftModifier);
+    EXPECT_EQ(Stored(), before) << "nor is a line inserted";
+    EXPECT_FALSE(document.IsModified());
+}

@@ -1,0 +1,233 @@
+// What holds for every page of the sheet, whichever it is.
+#include "page_fixture.h"
+
+#include "data/hd_file.h"
+#include "ks/units/edit_fields.h"
+#include "module/page_table.h"
+
+#include <QAbstractButton>
+#include <QFile>
+#include <QGroupBox>
+#include <QTemporaryDir>
+#include <set>
+
+namespace {
+
+constexpr QSize SmallestPage(900, 640);
+
+/// The pages in the order of construction, with their tabs. No caption: decided by the page.
+const struct
+{
+    const char* name;
+    int tab;
+    const char* caption;
+} Sheet[] = {
+    {"CInitPage", 1, "Initial"},
+    {"CWindPage", 2, "Wind"},
+    {"CBedPage", 3, "Bed Resist."},
+    {"CBedToolboxPage", 4, "Bed Resist. Toolbox"},
+    {"CWavePage", 5, "Wave Approx"},
+    {"CDefaultPage", 6, "Default Values"},
+    {"CQuasiPage", 7, "Quasi Steady"},
+    {"CFloodPage", 10, "Flood Plain Resist."},
+    {"CMixingCoefPage", 20, "Mixing Coef."},
+    {"CWLMarkPage", 11, nullptr},
+    {"CLossPage", NotOnSheet, "Water Loss"},
+    {"COutputPage", 9, nullptr},
+    {"CWLCurvePage", 21, nullptr},
+    {"CWLSandBarsPage", 22, nullptr},
+    {"CEncroachPage", 12, "Encroachment"},
+    {"CHeatBalancePage", 13, "Heat Balance"},
+    {"CStratificationPage", 14, "Stratification"},
+    {"CKlrParamPage", 18, nullptr},
+    {"CKlrInitPage", 19, nullptr},
+    {"CReachLengthPage", 8, nullptr},
+    {"CTextOutputPage", 15, nullptr},
+    {"CMapsPage", 16, nullptr},
+    {"CLeakagePage", 17, "Groundwater Leakage"},
+};
+
+/// The parts of a page that a user works with, without those that they are made of.
+QList<QWidget*> Controls(const QWidget& page)
+{
+    QList<QWidget*> controls;
+    for (QWidget* widget : page.findChildren<QWidget*>()) {
+        const bool control = qobject_cast<QLineEdit*>(widget) || qobject_cast<QComboBox*>(widget) ||
+                             qobject_cast<QAbstractButton*>(widget) || qobject_cast<QAbstractItemView*>(widget);
+        if (control && !controls.contains(widget->parentWidget()) && !widget->objectName().startsWith("qt_"))
+            controls << widget;
+    }
+    return controls;
+}
+
+QString Named(const CGenPropertyPage& page, const QWidget* widget)
+{
+    return QString("%1 %2").arg(page.metaObject()->className(), widget->objectName());
+}
+
+} // namespace
+
+class CorePagesTest : public PageTest
+{
+protected:
+    CorePagesTest()
+    {
+        QFile::copy(KVR_SOURCE_DIR "/examples/river/river.hdkv", folder.filePath("river.hdkv"));
+        EXPECT_TRUE(document.OnOpenDocument(folder.filePath("river.hdkv")));
+    }
+    template <typename Check>
+    void OnEveryPage(Check check)
+    {
+        for (const PageEntry& entry : PageTable()) {
+            CGenPropertyPage* page = entry.make(&document).release();
+            tab = entry.tab;
+            SCOPED_TRACE(page->metaObject()->className());
+            view = std::make_unique<TestView>(document, page);
+            grid = page->GetGrid();
+            check(*page);
+        }
+    }
+    std::string Text() const { return HDFileText(document.Parameters(), true); }
+    std::string Saved(CKavo0_hdDoc& saved, const char* name)
+    {
+        EXPECT_TRUE(saved.OnSaveDocument(folder.filePath(name)));
+        QFile file(folder.filePath(name));
+        return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : "(no file)";
+    }
+
+    QTemporaryDir folder;
+    int tab = 0; // of the page shown
+};
+
+TEST_F(CorePagesTest, OrderAndCaptions)
+{
+    const auto* expected = std::begin(Sheet);
+    OnEveryPage([&](CGenPropertyPage& page) {
+        const QString name = page.metaObject()->className();
+        while (expected != std::end(Sheet) && name != expected->name)
+            ++expected;
+        ASSERT_NE(expected, std::end(Sheet)) << "in the order of construction";
+        if (expected->caption) {
+            EXPECT_EQ(page.Caption(), expected->caption);
+        }
+        EXPECT_FALSE(page.Caption().isEmpty());
+        EXPECT_EQ(tab, expected->tab);
+        EXPECT_EQ(view->linesMenu, grid && grid->isVisible());
+    });
+}
+
+TEST_F(CorePagesTest, VisitingChangesNothing)
+{
+    const std::string before = Text();
+    CKavo0_hdDoc unvisited;
+    ASSERT_TRUE(unvisited.OnOpenDocument(KVR_SOURCE_DIR "/examples/river/river.hdkv"));
+    OnEveryPage([&](CGenPropertyPage& page) {
+        // In the other units everything shows, and would be stored, differently.
+        for (const auto system : {KsUnitSystem::UsCustomary, KsUnitSystem::Metric}) {
+            KsUnits::Instance().SetSystem(system);
+            page.StoreToDocument();
+            page.LoadFromDocument(&document);
+        }
+        for (QWidget* control : Controls(page)) {
+            if (!control->isEnabled() || !control->isVisible())
+                continue;
+            control->setFocus(Qt::TabFocusReason);
+            QTest::keyClick(control, Qt::Key_Tab);
+        }
+        EXPECT_TRUE(page.OnKillActive());
+        EXPECT_EQ(Text(), before);
+    });
+    EXPECT_FALSE(document.IsModified());
+    EXPECT_EQ(document.UndoStack().count(), 0);
+    EXPECT_EQ(boxes, QStringList());
+    EXPECT_EQ(Saved(document, "visited.HDKV"), Saved(unvisited, "unvisited.HDKV"));
+}
+
+TEST_F(CorePagesTest, VisitingANewFileLeavesNoLineInTheListsThatASaveCleans)
+{
+    document.DeleteContents();
+    const std::string before = Text();
+    OnEveryPage([](CGenPropertyPage& page) { page.OnKillActive(); });
+    EXPECT_FALSE(document.IsModified());
+    EXPECT_EQ(document.UndoStack().count(), 0);
+    Saved(document, "new.HDKV");
+    for (const ListEntry& entry : HDLists())
+        if (!entry.purgedAtSave && entry.list)
+            entry.list(document.Parameters())->RemoveAll();
+    EXPECT_EQ(Text(), before);
+}
+
+TEST_F(CorePagesTest, EveryFieldRefusesWhatIsNoNumber)
+{
+    int fields = 0;
+    OnEveryPage([&](CGenPropertyPage& page) {
+        const std::string before = Text();
+        for (CCtrlEdit* field : page.findChildren<CCtrlEdit*>()) {
+            if (!field->isEnabled() || !field->isVisible())
+                continue;
+            SCOPED_TRACE(field->objectName().toStdString());
+            ++fields;
+            boxes.clear();
+            field->setFocus();
+            field->selectAll();
+            QTest::keyClicks(field, "1.");
+            QTest::keyClick(field, Qt::Key_Tab);
+            EXPECT_EQ(boxes, QStringList("Invalid floating point number!"));
+            EXPECT_TRUE(field->hasFocus());
+            EXPECT_EQ(Text(), before);
+            QTest::qWait(0); // one box an event
+            QTest::keyClick(field, Qt::Key_Escape);
+        }
+    });
+    EXPECT_GT(fields, 30);
+}
+
+TEST_F(CorePagesTest, EveryControlHasAName)
+{
+    OnEveryPage([&](CGenPropertyPage& page) {
+        std::set<const QWidget*> labelled;
+        std::set<QChar> mnemonics;
+        const auto addMnemonic = [&](const QWidget* widget, const QString& text) {
+            const qsizetype at = text.indexOf('&');
+            ASSERT_NE(at, -1) << "no mnemonic: " << Named(page, widget).toStdString();
+            EXPECT_TRUE(mnemonics.insert(text[at + 1].toUpper()).second)
+                << "mnemonic twice: " << Named(page, widget).toStdString();
+        };
+        for (const QLabel* label : page.findChildren<QLabel*>()) {
+            if (!label->buddy())
+                continue;
+            labelled.insert(label->buddy());
+            if (label->isVisible())
+                addMnemonic(label, label->text());
+        }
+        for (const QWidget* control : Controls(page)) {
+            const auto* button = qobject_cast<const QAbstractButton*>(control);
+            if (button && button->isVisible() && !button->text().isEmpty())
+                addMnemonic(button, button->text());
+            EXPECT_TRUE((button && !button->text().isEmpty()) || labelled.contains(control) ||
+                        !control->accessibleName().isEmpty())
+                << Named(page, control).toStdString();
+        }
+    });
+}
+
+TEST_F(CorePagesTest, NothingIsCutOff)
+{
+    OnEveryPage([&](CGenPropertyPage& page) {
+        EXPECT_LE(page.minimumSizeHint().width(), SmallestPage.width());
+        EXPECT_LE(page.minimumSizeHint().height(), SmallestPage.height());
+        EXPECT_LE(page.sizeHint().width(), SmallestPage.width());
+        EXPECT_LE(page.sizeHint().height(), SmallestPage.height());
+        view->resize(SmallestPage + (view->size() - page.size()));
+        QTest::qWait(0);
+        for (const QWidget* widget : page.findChildren<QWidget*>()) {
+            const auto* label = qobject_cast<const QLabel*>(widget);
+            const bool text = (label && !label->wordWrap()) || qobject_cast<const QAbstractButton*>(widget) ||
+                              qobject_cast<const QComboBox*>(widget) || qobject_cast<const QGroupBox*>(widget);
+            if (!text || !widget->isVisible() || widget->objectName().startsWith("qt_"))
+                continue;
+            EXPECT_GE(widget->width(), widget->minimumSizeHint().width()) << Named(page, widget).toStdString();
+            EXPECT_GE(widget->height(), widget->minimumSizeHint().height()) << Named(page, widget).toStdString();
+        }
+    });
+}

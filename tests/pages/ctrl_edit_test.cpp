@@ -1,0 +1,116 @@
+#include "page_fixture.h"
+
+#include "pages/framework/ctrl_edit.h"
+
+class CtrlEditTest : public PageTest
+{
+protected:
+    CtrlEditTest()
+    {
+        auto* layout = new QVBoxLayout(&window);
+        layout->addWidget(&field);
+        layout->addWidget(&other);
+        field.Setup(&value, 20, 6, true, UnitGroup::WaterLevel);
+        window.show();
+        window.activateWindow();
+        EXPECT_TRUE(QTest::qWaitForWindowActive(&window));
+    }
+    void Type(const char* text)
+    {
+        field.setFocus();
+        field.selectAll();
+        QTest::keyClick(&field, Qt::Key_Backspace);
+        QTest::keyClicks(&field, text);
+    }
+    void Leave()
+    {
+        QTest::qWait(1); // the warning of an earlier event is over
+        other.setFocus(Qt::TabFocusReason);
+    }
+
+    double value = 1.23456789;
+    QWidget window;
+    CCtrlEdit field;
+    QLineEdit other;
+};
+
+TEST_F(CtrlEditTest, ShowsInItsNotation)
+{
+    EXPECT_EQ(field.text(), "1.23457");
+    field.Setup(&value, 20, 3, false, UnitGroup::WaterLevel);
+    EXPECT_EQ(field.text(), "1.235E+00");
+    field.Setup(&value, 4, 3, true, UnitGroup::WaterLevel, 0);
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    field.Show();
+    EXPECT_EQ(field.text(), "1.23") << "asked for the base unit";
+    EXPECT_EQ(field.maxLength(), 4);
+    field.SetValue(2);
+    EXPECT_EQ(value, 2);
+    EXPECT_EQ(field.text(), "2");
+}
+
+TEST_F(CtrlEditTest, AnUntouchedTextChangesNothing)
+{
+    const double before = value;
+    field.setFocus();
+    Leave();
+    Type("1.23457"); // the very text that stood there
+    Leave();
+    EXPECT_EQ(value, before);
+    Type("");
+    Leave();
+    EXPECT_EQ(value, before);
+    EXPECT_EQ(field.text(), "1.23457");
+    EXPECT_EQ(boxes, QStringList());
+}
+
+TEST_F(CtrlEditTest, RefusesAndKeepsTheFocus)
+{
+    const double before = value;
+    field.SetRange(true, 0.5, true, 1.5);
+    const struct
+    {
+        const char *text, *message;
+    } cases[] = {{"abc", "Invalid floating point number!"},
+                 {"1.", "Invalid floating point number!"},
+                 {"0.49", "Floating-point value is out of range"},
+                 {"1.51", "Floating-point value is out of range"},
+                 {"1e999", "Floating-point value is out of range"}};
+    for (const auto& c : cases) {
+        Type(c.text);
+        Leave();
+        EXPECT_EQ(boxes, QStringList{c.message}) << c.text;
+        boxes.clear();
+        EXPECT_TRUE(field.hasFocus()) << c.text;
+        EXPECT_EQ(field.text(), c.text);
+        EXPECT_EQ(value, before);
+    }
+    for (const char* text : {"0.5", "1.5"}) { // the bounds belong to the range
+        Type(text);
+        Leave();
+        EXPECT_EQ(value, QString(text).toDouble());
+        EXPECT_TRUE(other.hasFocus());
+    }
+    Type("7");
+    QTest::keyClick(&field, Qt::Key_Escape);
+    EXPECT_EQ(field.text(), "1.5");
+}
+
+TEST_F(CtrlEditTest, StoresInBaseUnits)
+{
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    field.Show();
+    EXPECT_EQ(field.text(), "4.05042");
+    EXPECT_EQ(field.toolTip(), "Unit: ft");
+    field.SetRange(true, 0, true, 4); // metres
+    double stored = 0;
+    field.SetStore([&](double& target, double number) { target = stored = number; });
+    Type("10");
+    QTest::keyClick(&field, Qt::Key_Return);
+    EXPECT_NEAR(value, 3.048, 1e-5);
+    EXPECT_EQ(stored, value);
+    EXPECT_EQ(field.text(), "10");
+    Type("14");
+    Leave();
+    EXPECT_EQ(boxes.size(), 1) << "more than 4 m";
+}

@@ -1,0 +1,65 @@
+#include "page_fixture.h"
+
+#include "pages/framework/goto_dlg.h"
+#include "pages/framework/search_dlg.h"
+
+#include <QRadioButton>
+
+class DialogsTest : public PageTest
+{
+};
+
+TEST_F(DialogsTest, GotoAsksUntilThereIsALine)
+{
+    CGotoDlg dialog;
+    dialog.show();
+    auto* line = dialog.findChild<QLineEdit*>("line_1057");
+    EXPECT_EQ(line->text(), "0");
+    EXPECT_EQ(dialog.windowTitle(), "Go to grid line");
+    for (const char* text : {"0", "-3", "abc", ""}) {
+        line->setText(text);
+        boxes.clear();
+        QTest::keyClick(&dialog, Qt::Key_Return);
+        EXPECT_EQ(boxes.size(), 1) << text;
+        EXPECT_TRUE(dialog.isVisible()) << text;
+    }
+    line->setText("-3");
+    boxes.clear();
+    dialog.accept();
+    EXPECT_EQ(boxes, QStringList{"Line number must be greater than 0"});
+    line->setText("12");
+    QTest::keyClick(&dialog, Qt::Key_Return);
+    EXPECT_EQ(dialog.result(), QDialog::Accepted);
+    EXPECT_EQ(dialog.Line(), 12);
+}
+
+TEST_F(DialogsTest, SearchConvertsTheChainage)
+{
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    const double odd = 376.2756000000001;
+    CSearchDlg same("MAIN", odd, 1, 1);
+    same.accept();
+    EXPECT_EQ(same.Chainage(), odd) << "not typed: not changed";
+    EXPECT_EQ(same.RiverName(), "MAIN");
+    EXPECT_EQ(same.ChainageCriterion(), 1);
+    EXPECT_EQ(same.NameCriterion(), 1);
+
+    CSearchDlg dialog("", 0, 3, 0);
+    dialog.show();
+    auto* chainage = dialog.findChild<QLineEdit*>("chainage_1061");
+    EXPECT_EQ(chainage->text(), "0");
+    chainage->setText("x");
+    dialog.accept();
+    EXPECT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(dialog.isVisible());
+    chainage->setText("1000");
+    dialog.findChild<QLineEdit*>("riverName_1058")->setText("RIV");
+    dialog.findChild<QRadioButton*>("greater_1064")->click();
+    dialog.findChild<QRadioButton*>("fullMatch_1060")->click();
+    dialog.accept();
+    EXPECT_EQ(dialog.result(), QDialog::Accepted);
+    EXPECT_NEAR(dialog.Chainage(), 304.8, 0.001);
+    EXPECT_EQ(dialog.RiverName(), "RIV");
+    EXPECT_EQ(dialog.ChainageCriterion(), 2);
+    EXPECT_EQ(dialog.NameCriterion(), 1);
+}

@@ -1,0 +1,162 @@
+#include "page_fixture.h"
+
+#include "pages/framework/grid_keys.h"
+#include "pages/init_page.h"
+
+#include <QClipboard>
+#include <QKeyEvent>
+#include <QSignalSpy>
+
+TEST(GridKeys, TableFindsEveryRow)
+{
+    for (const GridKey& row : GridKeys()) {
+        EXPECT_EQ(row.held & row.lookedAt, row.held) << row.key;
+        EXPECT_FALSE(LoadString(row.description).isEmpty()) << row.key;
+        EXPECT_EQ(FindGridKey(QKeyEvent(QEvent::KeyPress, row.key, row.held)), &row) << "hidden by an earlier row";
+    }
+    for (const int key : {Qt::Key_C, Qt::Key_V, Qt::Key_Z, Qt::Key_Up, Qt::Key_Escape})
+        EXPECT_EQ(FindGridKey(QKeyEvent(QEvent::KeyPress, key, Qt::NoModifier)), nullptr);
+    EXPECT_EQ(FindGridKey(QKeyEvent(QEvent::KeyPress, Qt::Key_Tab, Qt::ControlModifier)), nullptr);
+}
+
+class GridKeyTest : public PageTest
+{
+protected:
+    GridKeyTest()
+    {
+        Add("A", 1, 10, 20);
+        Add("B", 2, 11, 21);
+        Open<CInitPage>();
+        grid->setFocus();
+    }
+    void Press(Qt::Key key, Qt::KeyboardModifiers held = {}) { QTest::keyClick(grid, key, held); }
+    std::pair<int, int> From(int row, int column, Qt::Key key, Qt::KeyboardModifiers held = {})
+    {
+        grid->SetCurrentCell(row, column);
+        Press(key, held);
+        return Current();
+    }
+};
+
+TEST_F(GridKeyTest, MovesThroughTheCells)
+{
+    for (const auto key : {Qt::Key_Tab, Qt::Key_Return, Qt::Key_Enter}) {
+        EXPECT_EQ(From(1, 1, key), std::pair(1, 2));
+        EXPECT_EQ(From(1, 4, key), std::pair(2, 1));
+        EXPECT_EQ(From(2, 2, key, Qt::ShiftModifier), std::pair(2, 1));
+        EXPECT_EQ(From(2, 1, key, Qt::ShiftModifier), std::pair(1, 4));
+    }
+    EXPECT_EQ(From(2, 1, Qt::Key_Backtab, Qt::ShiftModifier), std::pair(1, 4));
+    EXPECT_EQ(init.GetCount(), 2u);
+    EXPECT_EQ(From(1, 1, Qt::Key_Tab, Qt::ShiftModifier), std::pair(1, 1)) << "does not wrap";
+    EXPECT_FALSE(grid->hasFocus()) << "and leaves the grid";
+    grid->setFocus();
+    view->locations.clear();
+    grid->SetCurrentCell(1, 3);
+    grid->SetCurrentCell(2, 3);
+    EXPECT_EQ(view->locations, QList<int>{2}) << "told once a line";
+}
+
+TEST_F(GridKeyTest, BehindTheLastCellALineIsAppended)
+{
+    globals.G_waterlevel = 7;
+    EXPECT_EQ(From(2, 4, Qt::Key_Tab), std::pair(3, 1));
+    EXPECT_EQ(Texts(3), "||7.000|0.000");
+    EXPECT_EQ(view->commands, QList<int>());
+    grid->SetAppendThroughPage(false);
+    EXPECT_EQ(From(3, 4, Qt::Key_Return), std::pair(4, 1));
+    EXPECT_EQ(view->commands, QList<int>{Command::InsertLine});
+    EXPECT_EQ(init.GetCount(), 4u);
+}
+
+TEST_F(GridKeyTest, InsertCopiesOrPastesFirst)
+{
+    auto* clipboard = QGuiApplication::clipboard();
+    clipboard->clear();
+    grid->SetCurrentCell(1, 1);
+    Press(Qt::Key_Insert);
+    EXPECT_EQ(init.GetCount(), 3u);
+    EXPECT_TRUE(clipboard->text().isEmpty());
+    grid->SetCurrentCell(2, 1);
+    Press(Qt::Key_Insert, Qt::ControlModifier);
+    EXPECT_EQ(clipboard->text(), "B");
+    EXPECT_EQ(init.GetCount(), 4u);
+    document.SetModifiedFlag(false);
+    grid->SetCurrentCell(3, 1);
+    Press(Qt::Key_Insert, Qt::ShiftModifier);
+    EXPECT_EQ(init.GetAt(2).RiverName, "B");
+    EXPECT_EQ(init.GetCount(), 5u);
+    EXPECT_TRUE(document.IsModified());
+    grid->SetCurrentCell(1, 1);
+    Press(Qt::Key_Insert, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(clipboard->text(), "A") << "with both, Ctrl decides";
+    SelectRows(2, 3);
+    Press(Qt::Key_Insert);
+    EXPECT_EQ(Current(), std::pair(2, 1)) << "above the selection";
+    EXPECT_EQ(init.GetAt(1).RiverName, "");
+    EXPECT_EQ(init.GetAt(2).RiverName, "B");
+}
+
+TEST_F(GridKeyTest, CommandsGoToTheView)
+{
+    Press(Qt::Key_F7);
+    Press(Qt::Key_F3, Qt::ShiftModifier);
+    Press(Qt::Key_Delete, Qt::ControlModifier);
+    EXPECT_EQ(view->commands, (QList<int>{Command::Search, Command::SearchAgain, Command::DeleteLine}));
+    EXPECT_EQ(init.GetCount(), 2u) << "no whole line is selected";
+    // While a cell is being edited as well, its text being taken first; Delete is the text's then.
+    Type(1, 1, "x");
+    QTest::keyClick(Editor(), Qt::Key_Delete);
+    EXPECT_TRUE(Editor());
+    QTest::keyClick(Editor(), Qt::Key_F7);
+    EXPECT_FALSE(Editor());
+    EXPECT_EQ(view->commands.size(), 4);
+    EXPECT_EQ(init.GetAt(0).RiverName, "X");
+}
+
+TEST_F(GridKeyTest, DeletesWholeLinesOfOneRange)
+{
+    Add("C", 3);
+    view->page->LoadFromDocument(&document);
+    auto* selection = grid->selectionModel();
+    const auto row = [&](int n) { return grid->model()->index(n - 1, 0); };
+    grid->SetCurrentCell(1, 1);
+    selection->select(row(1), QItemSelectionModel::Rows | QItemSelectionModel::ClearAndSelect);
+    selection->select(row(3), QItemSelectionModel::Rows | QItemSelectionModel::Select);
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(init.GetCount(), 3u) << "two ranges";
+    // The row's number, clicked.
+    QTest::mouseClick(grid->verticalHeader()->viewport(), Qt::LeftButton, {},
+                      {5, grid->verticalHeader()->sectionViewportPosition(1) + 5});
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(Stored(), "A 1 10 20, C 3 0 0");
+    globals.G_discharge = 4;
+    SelectRows(1, 2);
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(Stored(), " 10000000000 0 4") << "a table without lines gets one";
+    document.UndoStack().undo();
+    EXPECT_EQ(Stored(), "A 1 10 20, C 3 0 0");
+}
+
+TEST_F(GridKeyTest, PlainLettersType)
+{
+    for (const char* text : {"C", "V"}) {
+        Type(1, 1, text);
+        QTest::keyClick(Editor(), Qt::Key_Tab);
+        EXPECT_EQ(Texts(1).left(2), QString(text) + '|');
+    }
+}
+
+TEST_F(GridKeyTest, UndoAndRedo)
+{
+    Enter(1, 3, "5");
+    Type(1, 4, "6"); // still open: undo takes it first
+    QTest::keyClick(Editor(), Qt::Key_Tab);
+    Press(Qt::Key_Z, Qt::ControlModifier);
+    Press(Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(Stored(), "A 1 10 20, B 2 11 21");
+    Press(Qt::Key_Y, Qt::ControlModifier);
+    Press(Qt::Key_Z, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(Stored(), "A 1 5 6, B 2 11 21");
+    EXPECT_EQ(view->revealed, (QList<int>{1, 1, 1, 1}));
+}

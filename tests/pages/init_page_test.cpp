@@ -1,0 +1,147 @@
+#include "pages/init_page.h"
+
+#include "page_fixture.h"
+
+#include "pages/framework/ctrl_edit.h"
+
+#include <QGroupBox>
+#include <QLabel>
+#include <QRadioButton>
+
+class InitPageTest : public PageTest
+{
+protected:
+    template <typename Widget = QWidget>
+    Widget* Find(const char* name)
+    {
+        auto* widget = view->page->findChild<Widget*>(name);
+        EXPECT_TRUE(widget) << name;
+        return widget;
+    }
+    QString Header(int column) { return grid->model()->headerData(column - 1, Qt::Horizontal).toString(); }
+};
+
+TEST_F(InitPageTest, EmptyListShowsTheGlobalValues)
+{
+    globals.G_waterlevel = 1.5;
+    globals.G_discharge = 30;
+    Open<CInitPage>();
+    EXPECT_TRUE(view->linesMenu);
+    EXPECT_EQ(Texts(1), "||1.500|30.000");
+    EXPECT_EQ(Current(), std::pair(1, 1));
+    EXPECT_EQ(init.GetCount(), 1u);
+    EXPECT_TRUE(init.GetAt(0).IsBlank());
+    EXPECT_FALSE(document.IsModified());
+    // New lines take them as plain numbers, whatever the unit.
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    view->page->AppendLine();
+    EXPECT_EQ(Texts(2), "||1.500|30.000");
+    EXPECT_NEAR(init.GetAt(1).InitialH, 1.5 * 0.3048, 1e-5);
+}
+
+TEST_F(InitPageTest, LevelOrDepth)
+{
+    globals.G_waterlevel = 2;
+    Add("A", 1, 2, 3);
+    Open<CInitPage>();
+    const auto shows = [&](bool depth) {
+        EXPECT_EQ(Find("levelLabel_1203")->isVisible(), !depth);
+        EXPECT_EQ(Find("depthLabel_1204")->isVisible(), depth);
+        EXPECT_EQ(Header(3), depth ? "Initial y" : "Initial h");
+        EXPECT_EQ(Find<QRadioButton>("depth_1202")->isChecked(), depth);
+        EXPECT_EQ(globals.iLevelDepth, int(depth));
+    };
+    shows(false);
+    Find<QRadioButton>("depth_1202")->click();
+    shows(true);
+    EXPECT_TRUE(document.IsModified());
+    EXPECT_EQ(globals.G_waterlevel, 2);
+    EXPECT_EQ(Stored(), "A 1 2 3") << "nothing is converted";
+    document.UndoStack().undo();
+    shows(false);
+    EXPECT_EQ(QString("%1 %2 %3 %4").arg(Header(1), Header(2), Header(3), Header(4)),
+              "River Name Chainage Initial h Initial Q");
+}
+
+TEST_F(InitPageTest, UnitsAreLive)
+{
+    globals.G_waterlevel = 3.048;
+    Add("A", 304.8, 3.048, 28.316846592);
+    Open<CInitPage>();
+    const QString before = Stored();
+    auto* level = Find<CCtrlEdit>("levelOrDepth_1001");
+    const auto tip = [&](int column) {
+        return grid->model()->headerData(column - 1, Qt::Horizontal, Qt::ToolTipRole).toString();
+    };
+    EXPECT_EQ(Texts(1), "A|305|3.048|28.317");
+    EXPECT_EQ(tip(3), "Unit: m");
+    EXPECT_EQ(Find<QLabel>("unit_1001")->text(), "m");
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    EXPECT_EQ(level->text(), "10");
+    EXPECT_EQ(level->toolTip(), "Unit: ft");
+    EXPECT_EQ(Find<QLabel>("unit_1001")->text(), "ft");
+    EXPECT_EQ(tip(3), "Unit: ft");
+    EXPECT_EQ(Texts(1), "A|1000|10.000|1000.000");
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    EXPECT_EQ(Texts(1), "A|305|3.048|28.317");
+    EXPECT_EQ(Stored(), before);
+    EXPECT_EQ(globals.G_waterlevel, 3.048);
+    EXPECT_FALSE(document.IsModified());
+}
+
+TEST_F(InitPageTest, GlobalFieldsAreStoredWhenLeft)
+{
+    Open<CInitPage>();
+    auto* discharge = Find<CCtrlEdit>("discharge_1002");
+    discharge->setFocus();
+    discharge->selectAll();
+    QTest::keyClicks(discharge, "12.5");
+    EXPECT_EQ(globals.G_discharge, 0);
+    document.UpdateAllViews(nullptr, Hint::Store); // a save with the field still open
+    EXPECT_EQ(globals.G_discharge, 12.5);
+    EXPECT_TRUE(document.IsModified());
+    QTest::keyClick(discharge, Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(globals.G_discharge, 0) << "with nothing typed, undo is the document's";
+    EXPECT_EQ(discharge->text(), "0");
+    discharge->selectAll();
+    QTest::keyClicks(discharge, "x");
+    EXPECT_TRUE(view->page->OnKillActive()) << "leaving is never refused";
+    EXPECT_EQ(boxes, QStringList{"Invalid floating point number!"});
+}
+
+TEST_F(InitPageTest, LocationsOfOtherEditors)
+{
+    Add("A", 1, 2, 3);
+    auto& page = Open<CInitPage>();
+    page.InsertLocation("side", "12.5");
+    EXPECT_EQ(Texts(2), "SIDE|12|0.000|0.000");
+    EXPECT_EQ(init.GetAt(1).Chainage, 12.5);
+    document.UndoStack().undo();
+    EXPECT_EQ(init.GetCount(), 1u) << "one step";
+    page.InsertLocation("side", "far");
+    EXPECT_EQ(init.GetCount(), 1u);
+    EXPECT_EQ(boxes.size(), 1);
+    grid->Model()->setData(grid->Model()->index(0, 2), "9", Qt::EditRole);
+    const auto record = page.GetRecordAt(1);
+    ASSERT_TRUE(record);
+    const auto& initial = dynamic_cast<const HD_Initial&>(*record);
+    EXPECT_EQ(initial.RiverName, "A");
+    EXPECT_EQ(initial.InitialH, 9) << "as the row shows it";
+    EXPECT_EQ(initial.InitialQ, 3);
+    EXPECT_EQ(page.GetRecordAt(0), nullptr);
+    EXPECT_EQ(page.GetRecordAt(2), nullptr);
+}
+
+TEST_F(InitPageTest, ReachableByKeyboardAndByName)
+{
+    Open<CInitPage>();
+    const char* order[] = {"level_1201", "levelOrDepth_1001", "discharge_1002", "grid_1003"};
+    Find(order[0])->setFocus();
+    for (const char* name : order) {
+        EXPECT_EQ(QApplication::focusWidget()->objectName(), name);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+    }
+    for (const char* label : {"levelLabel_1203", "depthLabel_1204", "dischargeLabel"})
+        EXPECT_TRUE(Find<QLabel>(label)->buddy()) << label;
+    EXPECT_EQ(grid->accessibleName(), "Local Values");
+}
