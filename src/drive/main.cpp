@@ -2,6 +2,7 @@
 // job and says what was done, what was verified and where the pictures are. Exit code 0 when everything held.
 #include "drive/main_job.h"
 #include "drive/robot.h"
+#include "ks/fc/message_box.h"
 #include "shell/main_frame.h"
 #include "shell/shell_main.h"
 
@@ -10,6 +11,7 @@
 #include <QStandardPaths>
 #include <QTimer>
 #include <cstdio>
+#include <cstdlib>
 
 namespace {
 
@@ -54,6 +56,12 @@ int main(int argc, char** argv)
     QByteArray project = QFile::encodeName(work + "/river.kvrp");
     char* arguments[] = {argv[0], project.data(), nullptr};
     int result = 1;
+    // Nobody is there to press a button: an unexpected message ends the drive with its text.
+    KsSetMessageBoxHandler([](const CString& text, QMessageBox::StandardButtons) {
+        std::printf("FAILED: the program says: %s\n", qPrintable(text));
+        std::exit(1);
+        return QMessageBox::Ok;
+    });
     std::printf("Driving the shell on %s\n", project.constData());
     ShellMain(2, arguments, [&](CMainFrame& frame) {
         QTimer::singleShot(0, &frame, [&] {

@@ -106,10 +106,10 @@ void SwitchUnits(Robot& robot, int row)
 {
     auto* grid = InitialGrid(robot);
     robot.Did("Switch to US customary units and back");
-    robot.Trigger("actionUnitsUsCustomary");
+    robot.Trigger("actionUsCustomary");
     robot.Verify(CellText(grid, row, 1) == "4050", "the chainage 1234.5 m shows as 4050 ft");
     robot.Picture("initial-us-units");
-    robot.Trigger("actionUnitsMetric");
+    robot.Trigger("actionMetric");
     robot.Verify(CellText(grid, row, 2) == "2.750", "the level shows 2.750 m again");
 }
 
