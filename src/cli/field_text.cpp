@@ -30,7 +30,7 @@ std::string ScalarText(const Field& field, const void* object)
 {
     switch (field.kind) {
     case FieldKind::Number:
-        return NumberText(field.In<double>(object));
+        return Shortest(field.In<double>(object));
     case FieldKind::Integer:
     case FieldKind::Choice:
         return Shortest(field.In<std::int32_t>(object));
@@ -182,11 +182,6 @@ private:
 };
 
 } // namespace
-
-std::string NumberText(double value)
-{
-    return Shortest(value);
-}
 
 std::string CellText(const Field& field, const void* object)
 {

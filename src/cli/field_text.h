@@ -7,10 +7,8 @@
 #include <string>
 #include <vector>
 
-/// The shortest text that reads back to the same number, whatever the locale.
-std::string NumberText(double value);
-
-/// The field's value as one cell; the elements of a group are parted by "; ", their values by blanks.
+/// The field's value as one cell, numbers in the shortest text that reads back to the same bits, whatever the locale;
+/// the elements of a group are parted by "; ", their values by blanks.
 std::string CellText(const Field& field, const void* object);
 /// The field's value in JSON; a number that JSON cannot express is null.
 std::string JsonText(const Field& field, const void* object);

@@ -106,7 +106,8 @@ TEST(GenList, InsertAndRemoveRanges)
     EXPECT_EQ(removed[1]->RiverName, "D");
     EXPECT_EQ(list.RemoveAt(0)->RiverName, "B");
     ASSERT_EQ(list.GetCount(), 2u);
-    EXPECT_EQ(list.GetAt(0).RiverName + list.GetAt(1).RiverName, "AE");
+    EXPECT_EQ(list.GetAt(0).RiverName, "A");
+    EXPECT_EQ(list.GetAt(1).RiverName, "E");
 }
 
 TEST(MetaList, ASetNeedsAFilledLineBehindItsFirst)
@@ -140,7 +141,7 @@ TEST(Lists, ThirteenAreCleanedAtSave)
     parameters.EncroachList.Add();
     ForEachList(parameters, parameters, [](const char*, CGenParamListBase& list, CGenParamListBase&) {
         list.AddTail(list.NewRecord());
-        list.AddTail(list.NewRecord()).RiverName = "R";
+        list.AddTail(list.NewRecord()).RiverName.assign(1, 'R');
     });
     bool asked = true;
     EXPECT_TRUE(parameters.RemoveIncompleteLines(asked));
