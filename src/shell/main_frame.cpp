@@ -12,6 +12,7 @@
 #include <QScreen>
 #include <QSettings>
 #include <QStatusBar>
+#include <QTabBar>
 
 static void InitResources()
 {
@@ -27,6 +28,9 @@ CMainFrame::CMainFrame() : m_bars(this)
     MdiArea().setTabsClosable(true);
     MdiArea().setTabsMovable(true);
     MdiArea().setDocumentMode(true);
+    m_pluginLabel = new QLabel(this);
+    m_pluginLabel->setObjectName(QStringLiteral("pluginLabel"));
+    statusBar()->addPermanentWidget(m_pluginLabel);
     m_projectLabel = new QLabel(this);
     statusBar()->addPermanentWidget(m_projectLabel);
 
@@ -53,19 +57,29 @@ CMainFrame::~CMainFrame()
 void CMainFrame::LoadPlugins(const QString& folder)
 {
     auto loaded = ::LoadPlugins(folder);
-    QStringList broken;
     for (auto& plugin : loaded) {
-        if (!plugin->IsUsable())
-            broken << plugin->name;
         for (const auto& documents : plugin->templates)
             AddTemplate(documents.get());
         m_plugins.push_back(std::move(plugin));
     }
     m_bars.Create(m_plugins);
-    if (!broken.isEmpty())
-        statusBar()->showMessage(tr("Not loaded: %1 (see Help, Plug-ins)").arg(broken.join(QStringLiteral(", "))));
     Retranslate();
     UpdateActions();
+}
+
+/// Names the plug-ins that are not used, without stopping anybody.
+void CMainFrame::UpdatePluginLabel()
+{
+    QStringList names, reasons;
+    for (const auto& plugin : m_plugins) {
+        if (plugin->IsUsable())
+            continue;
+        names << plugin->name;
+        reasons << plugin->name + QStringLiteral(": ") + plugin->error;
+    }
+    m_pluginLabel->setVisible(!names.isEmpty());
+    m_pluginLabel->setText(tr("Not loaded: %1 (see Help, Plug-ins)").arg(names.join(QStringLiteral(", "))));
+    m_pluginLabel->setToolTip(reasons.join(u'\n'));
 }
 
 LRESULT CMainFrame::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
@@ -128,10 +142,18 @@ void CMainFrame::ReadSettings()
     if (!restoreGeometry(settings.value(Settings::Geometry).toByteArray()))
         resize(QSize(1100, 760).boundedTo(screen()->availableSize()));
     restoreState(settings.value(Settings::State).toByteArray());
-    const bool tabs = settings.value(Settings::Tabs, true).toBool();
-    MdiArea().setViewMode(tabs ? QMdiArea::TabbedView : QMdiArea::SubWindowView);
+    ShowTabs(settings.value(Settings::Tabs, true).toBool());
     const bool usCustomary = settings.value(Settings::UsCustomary, false).toBool();
     KsUnits::Instance().SetSystem(usCustomary ? KsUnitSystem::UsCustomary : KsUnitSystem::Metric);
+}
+
+/// Document windows as tabs, or as windows inside the frame.
+void CMainFrame::ShowTabs(bool tabs)
+{
+    MdiArea().setViewMode(tabs ? QMdiArea::TabbedView : QMdiArea::SubWindowView);
+    if (auto* bar = MdiArea().findChild<QTabBar*>(QString(), Qt::FindDirectChildrenOnly))
+        bar->setExpanding(false);
+    Action("actionTabs")->setChecked(tabs);
 }
 
 void CMainFrame::WriteSettings() const

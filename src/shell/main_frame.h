@@ -93,7 +93,9 @@ private:
     void UpdateActions();
     void UpdateUndoTexts();
     void UpdateTitle();
+    void UpdatePluginLabel();
     QAction* Action(const char* name) const;
+    void ShowTabs(bool tabs);
     void ReadSettings();
     void WriteSettings() const;
     QString HelpFile() const;
@@ -127,5 +129,6 @@ private:
     QMenu* m_languageMenu = nullptr;
     QMenu* m_toolBarMenu = nullptr;
     QToolBar* m_standardBar = nullptr;
+    QLabel* m_pluginLabel = nullptr;
     QLabel* m_projectLabel = nullptr;
 };

@@ -46,6 +46,8 @@ constexpr bool ShownOnly = true;
 /// One entry of a menu. A row without a name is a separator.
 struct CFrameAction
 {
+    Q_DECLARE_TR_FUNCTIONS(CFrameAction)
+public:
     MenuPosition menu;
     const char* name = nullptr; // object name
     const char* text = nullptr;
@@ -60,45 +62,52 @@ struct CFrameAction
 
 std::span<const CFrameAction> CFrameAction::Table()
 {
-#define TEXT(text) QT_TRANSLATE_NOOP("CMainFrame", text)
     using F = CMainFrame;
     using K = QKeySequence;
     // clang-format off
     static const CFrameAction table[] = {
-        {FileMenu, "actionNew", TEXT("&New"), TEXT("Starts a new document"), &F::OnFileNew, K::New, "new"},
-        {FileMenu, "actionOpen", TEXT("&Open..."), TEXT("Opens a document or a project"), &F::OnFileOpen, K::Open, "open"},
-        {FileMenu, "actionOpenProject", TEXT("Open &Project..."), TEXT("Opens a project with all its files"), &F::OnFileOpenProject},
-        {FileMenu, "actionOpenRecent", TEXT("Open &Recent"), TEXT("Opens one of the files used last")},
+        {FileMenu, "actionNew", QT_TR_NOOP("&New"), QT_TR_NOOP("Starts a new document"), &F::OnFileNew, K::New, "new"},
+        {FileMenu, "actionOpen", QT_TR_NOOP("&Open..."), QT_TR_NOOP("Opens a document or a project"), &F::OnFileOpen, K::Open, "open"},
+        {FileMenu, "actionOpenProject", QT_TR_NOOP("Open &Project..."), QT_TR_NOOP("Opens a project with all its files"), &F::OnFileOpenProject},
+        {FileMenu, "actionOpenRecent", QT_TR_NOOP("Open &Recent"), QT_TR_NOOP("Opens one of the files used last")},
         {FileMenu},
-        {FileMenu, "actionSave", TEXT("&Save"), TEXT("Saves the active document"), &F::OnFileSave, K::Save, "save"},
-        {FileMenu, "actionSaveAs", TEXT("Save &As..."), TEXT("Saves the active document under a new name"), &F::OnFileSaveAs, K::SaveAs},
-        {FileMenu, "actionClose", TEXT("&Close"), TEXT("Closes the active window"), &F::OnFileClose, K::Close},
-        {FileMenu, "actionCloseProject", TEXT("Close Projec&t"), TEXT("Closes the project with all its files"), &F::OnFileCloseProject},
+        {FileMenu, "actionSave", QT_TR_NOOP("&Save"), QT_TR_NOOP("Saves the active document"), &F::OnFileSave, K::Save, "save"},
+        {FileMenu, "actionSaveAs", QT_TR_NOOP("Save &As..."), QT_TR_NOOP("Saves the active document under a new name"), &F::OnFileSaveAs, K::SaveAs},
+        {FileMenu, "actionClose", QT_TR_NOOP("&Close"), QT_TR_NOOP("Closes the active window"), &F::OnFileClose, K::Close},
+        {FileMenu, "actionCloseProject", QT_TR_NOOP("Close Projec&t"), QT_TR_NOOP("Closes the project with all its files"), &F::OnFileCloseProject},
         {FileMenu},
-        {FileMenu, "actionExit", TEXT("E&xit"), TEXT("Closes all documents and ends the program"), &F::OnFileExit, K::Quit},
-        {EditMenu, "actionUndo", TEXT("&Undo"), TEXT("Takes the last change back"), &F::OnUndo, K::Undo, "undo"},
-        {EditMenu, "actionRedo", TEXT("&Redo"), TEXT("Makes the change again that was taken back"), &F::OnRedo, K::Redo, "redo"},
+        {FileMenu, "actionExit", QT_TR_NOOP("E&xit"), QT_TR_NOOP("Closes all documents and ends the program"), &F::OnFileExit, K::Quit},
+        {EditMenu, "actionUndo", QT_TR_NOOP("&Undo"), QT_TR_NOOP("Takes the last change back"), &F::OnUndo, K::Undo, "undo"},
+        {EditMenu, "actionRedo", QT_TR_NOOP("&Redo"), QT_TR_NOOP("Makes the change again that was taken back"), &F::OnRedo, K::Redo, "redo"},
         {EditMenu},
-        {EditMenu, "actionCut", TEXT("Cu&t"), TEXT("Moves the selection to the clipboard"), &F::OnCut, K::Cut, nullptr, ShownOnly},
-        {EditMenu, "actionCopy", TEXT("&Copy"), TEXT("Copies the selection to the clipboard"), &F::OnCopy, K::Copy, nullptr, ShownOnly},
-        {EditMenu, "actionPaste", TEXT("&Paste"), TEXT("Puts in what is on the clipboard"), &F::OnPaste, K::Paste, nullptr, ShownOnly},
-        {ViewMenu, "actionUnits", TEXT("&Units"), TEXT("Units in which values are shown; files are not affected")},
-        {ViewMenu, "actionLanguage", TEXT("&Language"), TEXT("Language of the program")},
-        {ViewMenu, "actionToolBars", TEXT("&Tool Bars"), TEXT("Shows or hides tool bars")},
-        {WindowMenu, "actionCascade", TEXT("&Cascade"), TEXT("Arranges the windows one behind the other"), &F::OnCascade},
-        {WindowMenu, "actionTile", TEXT("&Tile"), TEXT("Arranges the windows side by side"), &F::OnTile},
-        {WindowMenu, "actionNextWindow", TEXT("Ne&xt"), TEXT("Goes to the next window"), &F::OnNextWindow, K::NextChild},
-        {WindowMenu, "actionPreviousWindow", TEXT("Pre&vious"), TEXT("Goes to the previous window"), &F::OnPreviousWindow, K::PreviousChild},
-        {WindowMenu, "actionTabs", TEXT("Ta&bs"), TEXT("Shows the windows as tabs"), &F::OnTabs},
+        {EditMenu, "actionCut", QT_TR_NOOP("Cu&t"), QT_TR_NOOP("Moves the selection to the clipboard"), &F::OnCut, K::Cut, nullptr, ShownOnly},
+        {EditMenu, "actionCopy", QT_TR_NOOP("&Copy"), QT_TR_NOOP("Copies the selection to the clipboard"), &F::OnCopy, K::Copy, nullptr, ShownOnly},
+        {EditMenu, "actionPaste", QT_TR_NOOP("&Paste"), QT_TR_NOOP("Puts in what is on the clipboard"), &F::OnPaste, K::Paste, nullptr, ShownOnly},
+        {ViewMenu, "actionUnits", QT_TR_NOOP("&Units"), QT_TR_NOOP("Units in which values are shown; files are not affected")},
+        {ViewMenu, "actionLanguage", QT_TR_NOOP("&Language"), QT_TR_NOOP("Language of the program")},
+        {ViewMenu, "actionToolBars", QT_TR_NOOP("&Tool Bars"), QT_TR_NOOP("Shows or hides tool bars")},
+        {WindowMenu, "actionCascade", QT_TR_NOOP("&Cascade"), QT_TR_NOOP("Arranges the windows one behind the other"), &F::OnCascade},
+        {WindowMenu, "actionTile", QT_TR_NOOP("&Tile"), QT_TR_NOOP("Arranges the windows side by side"), &F::OnTile},
+        {WindowMenu, "actionNextWindow", QT_TR_NOOP("Ne&xt"), QT_TR_NOOP("Goes to the next window"), &F::OnNextWindow, K::NextChild},
+        {WindowMenu, "actionPreviousWindow", QT_TR_NOOP("Pre&vious"), QT_TR_NOOP("Goes to the previous window"), &F::OnPreviousWindow, K::PreviousChild},
+        {WindowMenu, "actionTabs", QT_TR_NOOP("Ta&bs"), QT_TR_NOOP("Shows the windows as tabs"), &F::OnTabs},
         {WindowMenu},
-        {WindowMenu, "actionCloseAll", TEXT("Close &All"), TEXT("Closes all windows"), &F::OnCloseAll},
-        {HelpMenu, "actionContents", TEXT("&Contents"), TEXT("Shows the help of the editor"), &F::OnContents, K::HelpContents},
-        {HelpMenu, "actionPlugins", TEXT("&Plug-ins..."), TEXT("Lists the editors that were loaded"), &F::OnPlugins},
-        {HelpMenu, "actionAbout", TEXT("&About"), TEXT("Name and version of the program"), &F::OnAbout},
+        {WindowMenu, "actionCloseAll", QT_TR_NOOP("Close &All"), QT_TR_NOOP("Closes all windows"), &F::OnCloseAll},
+        {HelpMenu, "actionContents", QT_TR_NOOP("&Contents"), QT_TR_NOOP("Shows the help of the editor"), &F::OnContents, K::HelpContents},
+        {HelpMenu, "actionPlugins", QT_TR_NOOP("&Plug-ins..."), QT_TR_NOOP("Lists the editors that were loaded"), &F::OnPlugins},
+        {HelpMenu, "actionAbout", QT_TR_NOOP("&About"), QT_TR_NOOP("Name and version of the program"), &F::OnAbout},
     };
     // clang-format on
-#undef TEXT
     return table;
+}
+
+/// The desktop's keys for a standard command, Tab spelled as on the keyboard.
+static QList<QKeySequence> KeysFor(QKeySequence::StandardKey key)
+{
+    auto keys = QKeySequence::keyBindings(key);
+    if (key == QKeySequence::PreviousChild)
+        keys.prepend(QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_Tab));
+    return keys;
 }
 
 QAction* CMainFrame::Action(const char* name) const
@@ -116,7 +125,7 @@ void CMainFrame::CreateActions()
         if (row.icon)
             action->setIcon(QIcon(QStringLiteral(":/shell/%1.svg").arg(QLatin1String(row.icon))));
         if (row.key != QKeySequence::UnknownKey && !row.shownOnly)
-            action->setShortcuts(row.key);
+            action->setShortcuts(KeysFor(row.key));
         if (row.run)
             connect(action, &QAction::triggered, this, row.run);
         m_actions.emplace(action->objectName(), action);
@@ -201,11 +210,11 @@ void CMainFrame::Retranslate()
     for (const CFrameAction& row : CFrameAction::Table()) {
         if (!row.name)
             continue;
-        QString text = tr(row.text);
+        QString text = CFrameAction::tr(row.text);
         if (row.shownOnly)
             text += u'\t' + QKeySequence(row.key).toString(QKeySequence::NativeText);
         Action(row.name)->setText(text);
-        Action(row.name)->setStatusTip(tr(row.tip));
+        Action(row.name)->setStatusTip(CFrameAction::tr(row.tip));
     }
     Action("actionMetric")->setText(tr("&Metric"));
     Action("actionUsCustomary")->setText(tr("&US Customary"));
@@ -213,6 +222,7 @@ void CMainFrame::Retranslate()
     MdiArea().SetHint(Templates().empty() ? tr("No editor was found. See Help, Plug-ins.")
                                           : tr("Open a file with File, Open, or drop it here."));
     UpdateUndoTexts();
+    UpdatePluginLabel();
     UpdateTitle();
     FillLinesMenu();
 }
@@ -259,6 +269,7 @@ void CMainFrame::ActiveViewChanged(CView* view)
     EnableMenuItem(LinesMenu, !m_menus[LinesMenu]->isEmpty()); // the view may grey it again
     UpdateActions();
     UpdateTitle();
+    statusBar()->clearMessage(); // it was about the view before
 }
 
 void CMainFrame::FillLinesMenu()
@@ -364,8 +375,7 @@ void CMainFrame::OnPreviousWindow()
 
 void CMainFrame::OnTabs()
 {
-    const bool tabs = Action("actionTabs")->isChecked();
-    MdiArea().setViewMode(tabs ? QMdiArea::TabbedView : QMdiArea::SubWindowView);
+    ShowTabs(Action("actionTabs")->isChecked());
 }
 
 void CMainFrame::OnCloseAll()

@@ -8,10 +8,10 @@
 
 namespace {
 
-QString Tr(const char* text)
+struct PluginLoader
 {
-    return QCoreApplication::translate("PluginLoader", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(PluginLoader)
+};
 
 /// Finds every function of the boundary; names those that are missing.
 QStringList Resolve(QLibrary& library, CPlugin& plugin)
@@ -32,7 +32,7 @@ QString TakeTemplates(CPlugin& plugin)
     for (int i = 0; i < count; ++i) {
         std::unique_ptr<CMultiDocTemplate> documents(plugin.KsGetDocTemplatePtr(i));
         if (!documents || documents->GetDocString(CMultiDocTemplate::filterExt).isEmpty())
-            return Tr("Its document template %1 is missing or names no file extension.").arg(i);
+            return PluginLoader::tr("Its document template %1 is missing or names no file extension.").arg(i);
         plugin.templates.push_back(std::move(documents));
     }
     return {};
@@ -55,12 +55,13 @@ std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
     // Whatever the library lacks itself is found missing now, not when the user works in it.
     library.setLoadHints(QLibrary::ResolveAllSymbolsHint);
     if (!library.load()) {
-        plugin->error = Tr("It could not be loaded: %1").arg(library.errorString());
+        plugin->error = PluginLoader::tr("It could not be loaded: %1").arg(library.errorString());
         return plugin;
     }
     const QStringList missing = Resolve(library, *plugin);
     if (!missing.isEmpty()) {
-        plugin->error = Tr("It is no editor: it does not export %1.").arg(missing.join(QStringLiteral(", ")));
+        plugin->error =
+            PluginLoader::tr("It is no editor: it does not export %1.").arg(missing.join(QStringLiteral(", ")));
         return plugin;
     }
     plugin->UpdateName();

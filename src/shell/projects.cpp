@@ -30,10 +30,10 @@ private:
     tqlHandle m_handle;
 };
 
-QString Tr(const char* text)
+struct Projects
 {
-    return QCoreApplication::translate("Projects", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(Projects)
+};
 
 bool ReadMembers(CProject& project, QString& error)
 {
@@ -46,7 +46,7 @@ bool ReadMembers(CProject& project, QString& error)
     const tqlHandle target = tqlTargetByNameNum(file.Get(), "KVR_PROJECT", 1);
     const tqlHandle section = tqlSectionByNameNum(target, "Members", 1);
     if (!section) {
-        error = Tr("%1 is no project: it has no section [%2].")
+        error = Projects::tr("%1 is no project: it has no section [%2].")
                     .arg(QFileInfo(project.path).fileName(), QString::fromLatin1(target ? "Members" : "KVR_PROJECT"));
         return false;
     }
@@ -55,7 +55,7 @@ bool ReadMembers(CProject& project, QString& error)
         std::string member;
         if (!tqlGetParam(section, "File", &member, i)) {
             const TqlPosition place = tqlGetPosition(tqlKeywordByNameNum(section, "File", i));
-            error = Tr("%1, line %2: expected a file name after \"File =\".")
+            error = Projects::tr("%1, line %2: expected a file name after \"File =\".")
                         .arg(QFileInfo(project.path).fileName())
                         .arg(place.line);
             return false;

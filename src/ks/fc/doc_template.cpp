@@ -103,9 +103,9 @@ bool CMultiDocTemplate::ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame)
         return false;
     CView* shown = view.release(); // the window's from here on
     auto* child = window.release();
-    frame->AddWindow(child);
+    frame->MdiArea().addSubWindow(child);
     shown->OnInitialUpdate();
-    frame->MdiArea().setActiveSubWindow(child);
+    frame->ShowWindow(child); // at the size of what is in it now
     shown->setFocus();
     return true;
 }

@@ -137,10 +137,12 @@ void CKsMDIFrameWnd::EnableMenuItem(int position, bool enable)
         menu->setEnabled(enable);
 }
 
-void CKsMDIFrameWnd::AddWindow(CKsMDIChildWnd* window)
+void CKsMDIFrameWnd::ShowWindow(CKsMDIChildWnd* window)
 {
-    m_area->addSubWindow(window);
+    const QSize area = m_area->viewport()->size();
+    window->resize(window->sizeHint().expandedTo(area * 2 / 3).boundedTo(area));
     window->show();
+    m_area->setActiveSubWindow(window);
 }
 
 bool CKsMDIFrameWnd::CloseAllWindows()

@@ -95,8 +95,8 @@ public:
     CView* GetActiveView() const { return m_activeView; }
     /// Enables or greys the menu at a position of the menu bar, counted from 0.
     void EnableMenuItem(int position, bool enable);
-    /// Puts a document window into the frame and shows it.
-    void AddWindow(CKsMDIChildWnd* window);
+    /// Shows a window of the area for the first time, large enough to work in, and activates it.
+    void ShowWindow(CKsMDIChildWnd* window);
     /// Asks for every modified document first, then closes all windows; false, and nothing closed, when one was kept.
     bool CloseAllWindows();
     /// Sends a command to the active view; false when there is none or it cannot do it now.
