@@ -1,0 +1,187 @@
+// The page of initial conditions with a million lines: how long it takes to show, against a bare table view of the same
+// size; and what storing one edited cell, moving on and repainting costs, against a thousand lines.
+#include "pages/framework/gen_grid.h"
+#include "pages/init_page.h"
+
+#include <QApplication>
+#include <QTableView>
+#include <algorithm>
+#include <chrono>
+#include <cstdio>
+#include <functional>
+#include <string>
+
+namespace {
+
+constexpr int Large = 1'000'000, Small = 1'000;
+
+double Milliseconds(const std::function<void()>& work)
+{
+    const auto start = std::chrono::steady_clock::now();
+    work();
+    return std::chrono::duration<double, std::milli>(std::chrono::steady_clock::now() - start).count();
+}
+
+double Median(std::vector<double> times)
+{
+    std::nth_element(times.begin(), times.begin() + std::ptrdiff_t(times.size() / 2), times.end());
+    return times[times.size() / 2];
+}
+
+/// The yardstick: rows and columns of numbers, nothing else.
+class TrivialModel : public QAbstractTableModel
+{
+public:
+    int rowCount(const QModelIndex& parent = {}) const override { return parent.isValid() ? 0 : Large; }
+    int columnCount(const QModelIndex& parent = {}) const override { return parent.isValid() ? 0 : 4; }
+    QVariant data(const QModelIndex& index, int role) const override
+    {
+        return role == Qt::DisplayRole ? QVariant(index.row() * 0.5) : QVariant();
+    }
+};
+
+/// Relays updates of the document to the page, as the program's view does.
+class View : public CView, public IPageHost
+{
+public:
+    View(CKavo0_hdDoc& document, CGenPropertyPage& page) : m_document(document), m_page(page)
+    {
+        page.SetHost(this);
+        document.AddView(this);
+    }
+    void OnUpdate(CView*, int, CHint*) override { m_page.LoadFromDocument(&m_document); }
+    CView* HostView() override { return this; }
+    void EditedLineChanged(int) override
+    {
+        m_page.StoreToDocument();
+        m_document.UpdateAllViews(nullptr, Hint::Reload);
+    }
+    void CurrentLocationChanged(int) override {}
+    void Execute(int) override {}
+    QStringList BranchNames() override { return {}; }
+    void EnableLinesMenu(bool) override {}
+
+private:
+    CKavo0_hdDoc& m_document;
+    CGenPropertyPage& m_page;
+};
+
+void Fill(CKavo0_hdDoc& document, int lines)
+{
+    auto& list = document.Parameters().InitList;
+    list.Reserve(std::size_t(lines));
+    for (int i = 0; i < lines; ++i) {
+        HD_Initial record;
+        record.RiverName = "RIVER" + std::to_string(i / 1000);
+        record.Chainage = i % 1000 * 12.5;
+        record.InitialH = 10 + i * 1e-5;
+        record.InitialQ = 100;
+        list.Add(record);
+    }
+}
+
+void Show(QWidget& widget)
+{
+    widget.resize(800, 700);
+    widget.show();
+    widget.repaint();
+    QApplication::processEvents();
+}
+
+double ShowPage(CKavo0_hdDoc& document)
+{
+    std::unique_ptr<CInitPage> page;
+    return Milliseconds([&] {
+        page = std::make_unique<CInitPage>(&document);
+        page->OnSetActive();
+        Show(*page);
+    });
+}
+
+double ShowBareTable()
+{
+    TrivialModel model;
+    QTableView view;
+    return Milliseconds([&] {
+        view.setModel(&model);
+        Show(view);
+    });
+}
+
+/// A page on its own document, and the step that is measured.
+struct Edited
+{
+    explicit Edited(int lines)
+    {
+        Fill(document, lines);
+        page = std::make_unique<CInitPage>(&document);
+        view = std::make_unique<View>(document, *page);
+        page->OnSetActive();
+        Show(*page);
+        grid = page->GetGrid();
+    }
+    double Step()
+    {
+        row = row % 900 + 1;
+        grid->SetCurrentCell(row, 3);
+        QApplication::processEvents();
+        value += 0.25;
+        return Milliseconds([&] {
+            grid->Model()->setData(grid->currentIndex(), QString::number(value), Qt::EditRole);
+            grid->SetCurrentCell(row + 1, 1);
+            grid->viewport()->repaint();
+            QApplication::processEvents();
+        });
+    }
+
+    CKavo0_hdDoc document;
+    std::unique_ptr<CInitPage> page;
+    std::unique_ptr<View> view;
+    CGenGrid* grid = nullptr;
+    int row = 0;
+    double value = 1000;
+};
+
+bool Report(const char* what, double measured, double yardstick, double limit)
+{
+    const double ratio = measured / yardstick;
+    std::printf("%-58s %9.3f ms / %9.3f ms = %5.2f (limit %.1f) %s\n", what, measured, yardstick, ratio, limit,
+                ratio <= limit ? "ok" : "TOO SLOW");
+    return ratio <= limit;
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    QApplication app(argc, argv);
+
+    std::vector<double> page, bare;
+    {
+        CKavo0_hdDoc document;
+        Fill(document, Large);
+        ShowPage(document); // warms up fonts and styles
+        ShowBareTable();
+        for (int i = 0; i < 9; ++i) {
+            page.push_back(ShowPage(document));
+            bare.push_back(ShowBareTable());
+        }
+    }
+
+    Edited large(Large), small(Small);
+    std::vector<double> inLarge, inSmall;
+    for (int i = 0; i < 220; ++i) {
+        const double first = large.Step(), second = small.Step();
+        if (i < 20)
+            continue; // warming up
+        inLarge.push_back(first);
+        inSmall.push_back(second);
+    }
+
+    const bool shown = Report("Initial page, 1,000,000 lines, shown / bare table", Median(page), Median(bare), 3.0);
+    const bool stored =
+        Report("One cell stored, next line: 1,000,000 / 1,000 lines", Median(inLarge), Median(inSmall), 1.5);
+    return shown && stored ? 0 : 1;
+}
