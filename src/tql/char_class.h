@@ -1,6 +1,8 @@
 // What a byte can be in the text, one table look-up.
 #pragma once
 
+#include "tql/bytes.h"
+
 #include <array>
 #include <cstdint>
 #include <string_view>
@@ -49,9 +51,11 @@ inline bool Is(char c, int classes)
 
 inline const char* SkipBlanks(const char* p)
 {
-    while (Is(*p, Blank))
-        ++p;
-    return p;
+    for (;; ++p) {
+        p = FindByte(p, [](std::uint64_t block) { return block ^ Repeat(' '); });
+        if (*p != '\t')
+            return p;
+    }
 }
 
 inline bool IsName(std::string_view text)

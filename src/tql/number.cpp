@@ -102,6 +102,8 @@ const char* ReadAnyDouble(const char* p, double& value)
         value = std::copysign(std::numeric_limits<double>::quiet_NaN(), negative ? -1.0 : 1.0);
     else
         std::from_chars(p, end, value);
+    if (value == 0 && SkipDigits(p + negative) == end)
+        value = 0; // the integer -0 is 0
     return end;
 }
 
@@ -114,23 +116,30 @@ const char* ReadDouble(const char* const p, double& value)
     constexpr std::uint64_t exactLimit = std::uint64_t{1} << 53;
     constexpr std::ptrdiff_t noOverflow = 19;
     const bool negative = *p == '-';
+    const char* end = p + negative;
     std::uint64_t digits = 0;
-    const char* end = ReadDigits(p + negative, digits);
     std::size_t places = 0;
-    const bool isInteger = Is(*end, WordEnd);
-    if (*end == '.') {
-        const char* const fraction = end + 1;
-        end = ReadDigits(fraction, digits);
-        places = static_cast<std::size_t>(end - fraction);
-    }
-    if (!Is(*end, WordEnd) || end - p > noOverflow || digits > exactLimit) {
-        end = ReadAnyDouble(p, value);
+    const std::uint64_t block = LoadBlock(end);
+    const int whole = FirstIn(NoDigitMask(block));
+    const bool point = whole < 8 && end[whole] == '.';
+    const int fraction = point ? FirstIn(NoDigitMask(block >> 8 >> whole * 8)) : 0;
+    if (whole + fraction > 0 && whole + point + fraction < 8) { // all of it is in the block
+        const std::uint64_t kept = (std::uint64_t{1} << whole * 8) - 1;
+        digits = DigitsValue((block & kept) | (block >> 8 * point & ~kept), whole + fraction);
+        end += whole + point + fraction;
+        places = static_cast<std::size_t>(fraction);
     } else {
-        const double quotient = static_cast<double>(digits) / ExactPowers[places];
-        value = negative ? -quotient : quotient;
+        end = ReadDigits(end, digits);
+        if (*end == '.') {
+            const char* const first = end + 1;
+            end = ReadDigits(first, digits);
+            places = static_cast<std::size_t>(end - first);
+        }
     }
-    if (isInteger && value == 0)
-        value = 0; // the integer -0 is 0
+    if (!Is(*end, WordEnd) || end - p > noOverflow || digits > exactLimit || (negative && digits == 0))
+        return ReadAnyDouble(p, value);
+    const double quotient = static_cast<double>(digits) / ExactPowers[places];
+    value = negative ? -quotient : quotient;
     return end;
 }
 

@@ -1,7 +1,6 @@
 // Numbers as the text has them; locale plays no part.
 #pragma once
 
-#include "tql/bytes.h"
 #include "tql/char_class.h"
 #include "tql/tql.h"
 

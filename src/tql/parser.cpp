@@ -2,9 +2,11 @@
 
 #include "tql/bytes.h"
 #include "tql/char_class.h"
+#include "tql/number.h"
 #include "tql/scan.h"
 #include "tql/utf8.h"
 
+#include <algorithm>
 #include <cstring>
 #include <limits>
 
@@ -41,9 +43,11 @@ private:
     bool ParseBracket(const char* p);
     bool Open(std::string_view name, const char* at);
     bool Close(std::string_view name, const char* at);
+    const char* SkipKeywordName(const char* p);
     bool ParseKeyword(const char* p);
     /// Counts the parameters from `p` to the end of the line.
     bool ParseParams(const char* p, std::size_t& count);
+    void ReserveKeywords(Section& section);
     void AddKeyword(std::string_view name, const char* params, std::size_t count);
     /// Nothing but blanks and a comment is left.
     bool AtEnd(const char* p) const { return p == m_lineEnd || (*p == '/' && p[1] == '/'); }
@@ -63,7 +67,8 @@ private:
     const char* m_line = nullptr;
     const char* m_lineEnd = nullptr; // without the line end
     std::size_t m_lineNumber = 0;
-    bool m_anything = false; // a comment counts
+    bool m_anything = false;          // a comment counts
+    std::string_view m_lastName = ""; // of a keyword
 };
 
 bool Parser::Run()
@@ -164,11 +169,24 @@ bool Parser::Close(std::string_view name, const char* at)
     return true;
 }
 
-bool Parser::ParseKeyword(const char* p)
+// Most keywords have the name of the one before.
+const char* Parser::SkipKeywordName(const char* p)
 {
+    const std::size_t length = m_lastName.size();
+    if (length <= static_cast<std::size_t>(m_lineEnd - p) && std::memcmp(p, m_lastName.data(), length) == 0 &&
+        !Is(p[length], NameChar))
+        return p + length;
     const char* const begin = p;
     while (Is(*p, NameChar))
         ++p;
+    m_lastName = {begin, static_cast<std::size_t>(p - begin)};
+    return p;
+}
+
+bool Parser::ParseKeyword(const char* p)
+{
+    const char* const begin = p;
+    p = SkipKeywordName(p);
     const std::string_view name(begin, static_cast<std::size_t>(p - begin));
     if (m_open.empty())
         return Fail(TqlError::Syntax, begin, "a target in brackets, such as [Name], before any keyword", Found(begin));
@@ -188,15 +206,32 @@ bool Parser::ParseParams(const char* p, std::size_t& count)
     if (AtEnd(p))
         return ExpectEnd(p);
     for (;;) {
-        const ParamScan param = ScanParam(p);
-        if (param.expected)
-            return Fail(param.end, param.expected);
+        const char* end = SkipPlainNumber(p);
+        if (!end) {
+            const ParamScan param = ScanParam(p);
+            if (param.expected)
+                return Fail(param.end, param.expected);
+            end = param.end;
+        }
         ++count;
-        p = SkipBlanks(param.end);
+        p = SkipBlanks(end);
         if (*p != ',')
             return p == m_lineEnd || ExpectEnd(p, "a comma or the end of the line");
         p = SkipBlanks(p + 1);
     }
+}
+
+// A long list grows in few steps, towards what the rest of the text holds if its lines go on like this.
+void Parser::ReserveKeywords(Section& section)
+{
+    constexpr std::size_t longList = 1024;
+    const std::size_t count = section.keywords.size();
+    if (count < longList || count < section.keywords.capacity())
+        return;
+    const auto soFar = static_cast<std::size_t>(m_line - section.name.data());
+    const auto left = static_cast<std::size_t>(m_structure.text.end() - m_line);
+    const std::size_t likely = count + left / (soFar / count + 1) + 1;
+    section.keywords.reserve(std::clamp(likely, 2 * count, 8 * count));
 }
 
 void Parser::AddKeyword(std::string_view name, const char* params, std::size_t count)
@@ -204,6 +239,7 @@ void Parser::AddKeyword(std::string_view name, const char* params, std::size_t c
     Section& section = *m_open.back();
     if (!section.keywords.empty() && section.sameKeywordNames)
         section.sameKeywordNames = section.keywords.front().Name() == name;
+    ReserveKeywords(section);
     Keyword& keyword = section.keywords.emplace_back();
     if (count <= Keyword::MaxParams && name.size() <= std::numeric_limits<std::uint16_t>::max()) {
         keyword.paramCount = static_cast<std::uint8_t>(count);

@@ -183,8 +183,6 @@ ParamScan ScanParam(const char* p)
     default:
         break;
     }
-    if (const char* const end = SkipPlainNumber(p))
-        return {end, nullptr};
     if (!StartsNumber(*p))
         return {p, "a parameter (a number, true, false, \"text\" or <file name>)"};
     const NumberScan number = ScanNumber(p);
@@ -233,13 +231,10 @@ TqlType ParamType(const char* p)
 const char* UnescapeParam(const char* p, std::string& out)
 {
     const Quoting& quoting = QuotingOf(*p);
-    out.clear();
-    for (++p;;) {
-        const char* const run = p;
-        p = FindQuoteEnd(p, quoting.close);
-        out.append(run, static_cast<std::size_t>(p - run));
-        if (*p == quoting.close)
-            return p + 1;
+    const char* run = p + 1;
+    p = FindQuoteEnd(run, quoting.close);
+    out.assign(run, static_cast<std::size_t>(p - run));
+    while (*p != quoting.close) {
         ++p;
         if (*p == quoting.close || *p == '\\') {
             out += *p++;
@@ -251,7 +246,11 @@ const char* UnescapeParam(const char* p, std::string& out)
             p = ScanCodePoint(p + 1, value);
             AppendCodePoint(out, value);
         }
+        run = p;
+        p = FindQuoteEnd(run, quoting.close);
+        out.append(run, static_cast<std::size_t>(p - run));
     }
+    return p + 1;
 }
 
 void AppendString(std::string& out, std::string_view value)

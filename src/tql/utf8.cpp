@@ -11,11 +11,16 @@ bool IsContinuation(unsigned char byte)
     return (byte & 0xC0) == 0x80;
 }
 
-// Eight bytes that are all ASCII and none of them NUL.
-bool IsPlainBlock(const char* p)
+// Whether all bytes are ASCII and none is NUL: a NUL borrows from the bit that ASCII leaves free.
+bool IsPlain(const char* p, const char* end)
 {
-    const std::uint64_t block = LoadBlock(p);
-    return ((block & Repeat(0x80)) | EqualMask(block, '\0')) == 0;
+    std::uint64_t bits = 0;
+    const auto look = [&](std::uint64_t block) { bits |= block | (block - Repeat(1)); };
+    for (; end - p >= 8; p += 8)
+        look(LoadBlock(p));
+    const std::uint64_t kept = (std::uint64_t{1} << (end - p) * 8) - 1; // of the last block
+    look((LoadBlock(p) & kept) | (Repeat('a') & ~kept));
+    return (bits & Repeat(0x80)) == 0;
 }
 
 } // namespace
@@ -43,11 +48,9 @@ std::size_t SequenceLength(std::string_view text)
 
 const char* FindBadByte(const char* p, const char* end)
 {
+    if (IsPlain(p, end))
+        return end;
     while (p < end) {
-        if (end - p >= 8 && IsPlainBlock(p)) {
-            p += 8;
-            continue;
-        }
         const std::size_t length = SequenceLength({p, static_cast<std::size_t>(end - p)});
         if (length == 0 || *p == '\0')
             return p;

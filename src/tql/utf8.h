@@ -9,7 +9,7 @@
 namespace tql {
 
 /// First byte of [begin, end) that is a NUL or starts a malformed sequence (overlong forms, surrogates and values past
-/// U+10FFFF included); `end` when all is well.
+/// U+10FFFF included); `end` when all is well. ReadAhead bytes behind `end` have to be readable.
 const char* FindBadByte(const char* begin, const char* end);
 
 /// Characters (code points) in well-formed text.
