@@ -1,0 +1,1271 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="en_GB" sourcelanguage="en_US">
+    <context>
+        <name>CBedPage</name>
+        <message>
+            <source>Bed Resistance</source>
+            <translation>Bed Resistance</translation>
+        </message>
+        <message>
+            <source>Formula</source>
+            <translation>Formula</translation>
+        </message>
+        <message>
+            <source>Resistance &amp;formula:</source>
+            <translation>Resistance &amp;formula:</translation>
+        </message>
+        <message>
+            <source>Manning's M</source>
+            <translation>Manning's M</translation>
+        </message>
+        <message>
+            <source>Manning's n</source>
+            <translation>Manning's n</translation>
+        </message>
+        <message>
+            <source>Chezy</source>
+            <translation>Chezy</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>Global Values</translation>
+        </message>
+        <message>
+            <source>&amp;Uniform section</source>
+            <translation>&amp;Uniform section</translation>
+        </message>
+        <message>
+            <source>&amp;Resistance:</source>
+            <translation>&amp;Resistance:</translation>
+        </message>
+        <message>
+            <source>&amp;Three zones</source>
+            <translation>&amp;Three zones</translation>
+        </message>
+        <message>
+            <source>Zone &amp;1 (main channel):</source>
+            <translation>Zone &amp;1 (main channel):</translation>
+        </message>
+        <message>
+            <source>Zone &amp;2 (transition):</source>
+            <translation>Zone &amp;2 (transition):</translation>
+        </message>
+        <message>
+            <source>Zone &amp;3 (flood plain):</source>
+            <translation>Zone &amp;3 (flood plain):</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>Local Values</translation>
+        </message>
+    </context>
+    <context>
+        <name>CBedToolboxPage</name>
+        <message>
+            <source>Bed Resistance Toolbox</source>
+            <translation>Bed Resistance Toolbox</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>Global Values</translation>
+        </message>
+        <message>
+            <source>&amp;Method:</source>
+            <translation>&amp;Method:</translation>
+        </message>
+        <message>
+            <source>Not used</source>
+            <translation>Not used</translation>
+        </message>
+        <message>
+            <source>Coefficients a and b</source>
+            <translation>Coefficients a and b</translation>
+        </message>
+        <message>
+            <source>Table over velocity</source>
+            <translation>Table over velocity</translation>
+        </message>
+        <message>
+            <source>Apply in:</source>
+            <translation>Apply in:</translation>
+        </message>
+        <message>
+            <source>Zone &amp;1</source>
+            <translation>Zone &amp;1</translation>
+        </message>
+        <message>
+            <source>Zone &amp;2</source>
+            <translation>Zone &amp;2</translation>
+        </message>
+        <message>
+            <source>Zone &amp;3</source>
+            <translation>Zone &amp;3</translation>
+        </message>
+        <message>
+            <source>Coefficient &amp;a:</source>
+            <translation>Coefficient &amp;a:</translation>
+        </message>
+        <message>
+            <source>Coefficient &amp;b:</source>
+            <translation>Coefficient &amp;b:</translation>
+        </message>
+        <message>
+            <source>Mi&amp;nimum resistance:</source>
+            <translation>Mi&amp;nimum resistance:</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum resistance:</source>
+            <translation>Ma&amp;ximum resistance:</translation>
+        </message>
+        <message>
+            <source>Resistance over velocity</source>
+            <translation>Resistance over velocity</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Resistance over velocity of the current line</source>
+            <translation>Resistance over velocity of the current line</translation>
+        </message>
+    </context>
+    <context>
+        <name>CDefaultPage</name>
+        <message>
+            <source>Computation Scheme</source>
+            <translation>Computation Scheme</translation>
+        </message>
+        <message>
+            <source>Del&amp;ta:</source>
+            <translation>Del&amp;ta:</translation>
+        </message>
+        <message>
+            <source>Delh&amp;s:</source>
+            <translation>Delh&amp;s:</translation>
+        </message>
+        <message>
+            <source>&amp;Delh:</source>
+            <translation>&amp;Delh:</translation>
+        </message>
+        <message>
+            <source>&amp;Alpha:</source>
+            <translation>&amp;Alpha:</translation>
+        </message>
+        <message>
+            <source>T&amp;heta:</source>
+            <translation>T&amp;heta:</translation>
+        </message>
+        <message>
+            <source>E&amp;ps:</source>
+            <translation>E&amp;ps:</translation>
+        </message>
+        <message>
+            <source>Dh N&amp;ode:</source>
+            <translation>Dh N&amp;ode:</translation>
+        </message>
+        <message>
+            <source>&amp;Zeta Min:</source>
+            <translation>&amp;Zeta Min:</translation>
+        </message>
+        <message>
+            <source>St&amp;ruc Fac:</source>
+            <translation>St&amp;ruc Fac:</translation>
+        </message>
+        <message>
+            <source>&amp;Inter1Max:</source>
+            <translation>&amp;Inter1Max:</translation>
+        </message>
+        <message>
+            <source>&amp;NoIter:</source>
+            <translation>&amp;NoIter:</translation>
+        </message>
+        <message>
+            <source>&amp;MaxIterSteady:</source>
+            <translation>&amp;MaxIterSteady:</translation>
+        </message>
+        <message>
+            <source>Fro&amp;udeMax:</source>
+            <translation>Fro&amp;udeMax:</translation>
+        </message>
+        <message>
+            <source>FroudeE&amp;xp:</source>
+            <translation>FroudeE&amp;xp:</translation>
+        </message>
+        <message>
+            <source>Switches</source>
+            <translation>Switches</translation>
+        </message>
+        <message>
+            <source>Node &amp;Compatibility</source>
+            <translation>Node &amp;Compatibility</translation>
+        </message>
+        <message>
+            <source>Water Level</source>
+            <translation>Water Level</translation>
+        </message>
+        <message>
+            <source>(Energy - Not Avail.)</source>
+            <translation>(Energy - Not Avail.)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CEditorsLoadOptionDlg</name>
+        <message>
+            <source>Load Branch and Chainage</source>
+            <translation>Load Branch and Chainage</translation>
+        </message>
+        <message>
+            <source>&amp;Branch and Chainage,</source>
+            <translation>&amp;Branch and Chainage,</translation>
+        </message>
+        <message>
+            <source>from Cross Section Editor</source>
+            <translation>from Cross Section Editor</translation>
+        </message>
+        <message>
+            <source>Branch, Chainage and &amp;Radius,</source>
+            <translation>Branch, Chainage and &amp;Radius,</translation>
+        </message>
+        <message>
+            <source>from Cross Section Editor and Network Editor</source>
+            <translation>from Cross Section Editor and Network Editor</translation>
+        </message>
+        <message>
+            <source>Branch, Chainage, Radius and Channel &amp;Width,</source>
+            <translation>Branch, Chainage, Radius and Channel &amp;Width,</translation>
+        </message>
+    </context>
+    <context>
+        <name>CEncroachPage</name>
+        <message>
+            <source>Iteration</source>
+            <translation>Iteration</translation>
+        </message>
+        <message>
+            <source>&amp;Maximum number of iterations:</source>
+            <translation>&amp;Maximum number of iterations:</translation>
+        </message>
+        <message>
+            <source>Encroachment set-ups</source>
+            <translation>Encroachment set-ups</translation>
+        </message>
+        <message>
+            <source>Set-&amp;up:</source>
+            <translation>Set-&amp;up:</translation>
+        </message>
+        <message>
+            <source>&amp;Previous</source>
+            <translation>&amp;Previous</translation>
+        </message>
+        <message>
+            <source>Ne&amp;xt</source>
+            <translation>Ne&amp;xt</translation>
+        </message>
+        <message>
+            <source>&amp;Add</source>
+            <translation>&amp;Add</translation>
+        </message>
+        <message>
+            <source>Dup&amp;licate</source>
+            <translation>Dup&amp;licate</translation>
+        </message>
+        <message>
+            <source>D&amp;elete</source>
+            <translation>D&amp;elete</translation>
+        </message>
+        <message>
+            <source>Lines of the set-up</source>
+            <translation>Lines of the set-up</translation>
+        </message>
+    </context>
+    <context>
+        <name>CFloodPage</name>
+        <message>
+            <source>Flood Plain Resistance</source>
+            <translation>Flood Plain Resistance</translation>
+        </message>
+        <message>
+            <source>Global Value</source>
+            <translation>Global Value</translation>
+        </message>
+        <message>
+            <source>Flood Plain &amp;Resistance:</source>
+            <translation>Flood Plain &amp;Resistance:</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>Local Values</translation>
+        </message>
+    </context>
+    <context>
+        <name>CGotoDlg</name>
+        <message>
+            <source>Go to grid line</source>
+            <translation>Go to grid line</translation>
+        </message>
+        <message>
+            <source>&amp;Line number:</source>
+            <translation>&amp;Line number:</translation>
+        </message>
+    </context>
+    <context>
+        <name>CHeatBalancePage</name>
+        <message>
+            <source>Heat Balance Calculation</source>
+            <translation>Heat Balance Calculation</translation>
+        </message>
+        <message>
+            <source>&amp;Included</source>
+            <translation>&amp;Included</translation>
+        </message>
+        <message>
+            <source>Location</source>
+            <translation>Location</translation>
+        </message>
+        <message>
+            <source>L&amp;atitude (N pos.)</source>
+            <translation>L&amp;atitude (N pos.)</translation>
+        </message>
+        <message>
+            <source>L&amp;ongitude (W pos.)</source>
+            <translation>L&amp;ongitude (W pos.)</translation>
+        </message>
+        <message>
+            <source>&amp;Time meridian zone (W pos.)</source>
+            <translation>&amp;Time meridian zone (W pos.)</translation>
+        </message>
+        <message>
+            <source>&amp;Displacement in time</source>
+            <translation>&amp;Displacement in time</translation>
+        </message>
+        <message>
+            <source>Solar absorption</source>
+            <translation>Solar absorption</translation>
+        </message>
+        <message>
+            <source>Li&amp;ght attenuation</source>
+            <translation>Li&amp;ght attenuation</translation>
+        </message>
+        <message>
+            <source>&amp;Constant in Beer's law</source>
+            <translation>&amp;Constant in Beer's law</translation>
+        </message>
+        <message>
+            <source>Radiation under cloudy skies</source>
+            <translation>Radiation under cloudy skies</translation>
+        </message>
+        <message>
+            <source>&amp;Parameter A</source>
+            <translation>&amp;Parameter A</translation>
+        </message>
+        <message>
+            <source>Parameter &amp;B</source>
+            <translation>Parameter &amp;B</translation>
+        </message>
+        <message>
+            <source>Vaporization</source>
+            <translation>Vaporization</translation>
+        </message>
+        <message>
+            <source>Pa&amp;rameter A</source>
+            <translation>Pa&amp;rameter A</translation>
+        </message>
+        <message>
+            <source>Para&amp;meter B</source>
+            <translation>Para&amp;meter B</translation>
+        </message>
+    </context>
+    <context>
+        <name>CInitPage</name>
+        <message>
+            <source>Initial conditions</source>
+            <translation>Initial conditions</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>Global Values</translation>
+        </message>
+        <message>
+            <source>Water &amp;Level</source>
+            <translation>Water &amp;Level</translation>
+        </message>
+        <message>
+            <source>Water &amp;Depth</source>
+            <translation>Water &amp;Depth</translation>
+        </message>
+        <message>
+            <source>&amp;Water Level</source>
+            <translation>&amp;Water Level</translation>
+        </message>
+        <message>
+            <source>&amp;Water Depth</source>
+            <translation>&amp;Water Depth</translation>
+        </message>
+        <message>
+            <source>Disc&amp;harge:</source>
+            <translation>Disc&amp;harge:</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>Local Values</translation>
+        </message>
+    </context>
+    <context>
+        <name>CKsEditStyle</name>
+        <message>
+            <source>Unit: %1</source>
+            <translation>Unit: %1</translation>
+        </message>
+    </context>
+    <context>
+        <name>CLeakagePage</name>
+        <message>
+            <source>&amp;Include Leakage</source>
+            <translation>&amp;Include Leakage</translation>
+        </message>
+        <message>
+            <source>Global Leakage Coefficient</source>
+            <translation>Global Leakage Coefficient</translation>
+        </message>
+        <message>
+            <source>&amp;Coefficient:</source>
+            <translation>&amp;Coefficient:</translation>
+        </message>
+        <message>
+            <source>Local Leakage Coefficients</source>
+            <translation>Local Leakage Coefficients</translation>
+        </message>
+    </context>
+    <context>
+        <name>CLossPage</name>
+        <message>
+            <source>Water Loss</source>
+            <translation>Water Loss</translation>
+        </message>
+    </context>
+    <context>
+        <name>CMixingCoefPage</name>
+        <message>
+            <source>Mixing Coefficients</source>
+            <translation>Mixing Coefficients</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>Global Values</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;1:</source>
+            <translation>Mixing coefficient f&amp;1:</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;2:</source>
+            <translation>Mixing coefficient f&amp;2:</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;3:</source>
+            <translation>Mixing coefficient f&amp;3:</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;4:</source>
+            <translation>Mixing coefficient f&amp;4:</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient over width-depth ratio</source>
+            <translation>Mixing coefficient over width-depth ratio</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient over width-depth ratio of the current line</source>
+            <translation>Mixing coefficient over width-depth ratio of the current line</translation>
+        </message>
+    </context>
+    <context>
+        <name>CQuasiPage</name>
+        <message>
+            <source>Computational parameters</source>
+            <translation>Computational parameters</translation>
+        </message>
+        <message>
+            <source>&amp;Relax:</source>
+            <translation>&amp;Relax:</translation>
+        </message>
+        <message>
+            <source>&amp;Beta_Limit:</source>
+            <translation>&amp;Beta_Limit:</translation>
+        </message>
+        <message>
+            <source>&amp;Fac_0:</source>
+            <translation>&amp;Fac_0:</translation>
+        </message>
+        <message>
+            <source>&amp;Qconv_Factor:</source>
+            <translation>&amp;Qconv_Factor:</translation>
+        </message>
+        <message>
+            <source>&amp;Hconv_Factor:</source>
+            <translation>&amp;Hconv_Factor:</translation>
+        </message>
+        <message>
+            <source>&amp;Min_Hconv_In_Branch:</source>
+            <translation>&amp;Min_Hconv_In_Branch:</translation>
+        </message>
+        <message>
+            <source>Q_&amp;struc_Factor:</source>
+            <translation>Q_&amp;struc_Factor:</translation>
+        </message>
+        <message>
+            <source>Hs&amp;top:</source>
+            <translation>Hs&amp;top:</translation>
+        </message>
+        <message>
+            <source>Steady State Options</source>
+            <translation>Steady State Options</translation>
+        </message>
+        <message>
+            <source>&amp;Use energy equation</source>
+            <translation>&amp;Use energy equation</translation>
+        </message>
+        <message>
+            <source>Model contraction and expansion &amp;losses</source>
+            <translation>Model contraction and expansion &amp;losses</translation>
+        </message>
+        <message>
+            <source>&amp;Allow upstream slope</source>
+            <translation>&amp;Allow upstream slope</translation>
+        </message>
+        <message>
+            <source>&amp;Velocity distribution coefficient based on conveyance</source>
+            <translation>&amp;Velocity distribution coefficient based on conveyance</translation>
+        </message>
+        <message>
+            <source>&amp;No suppression of convective terms</source>
+            <translation>&amp;No suppression of convective terms</translation>
+        </message>
+        <message>
+            <source>Friction slope &amp;evaluation</source>
+            <translation>Friction slope &amp;evaluation</translation>
+        </message>
+        <message>
+            <source>Default</source>
+            <translation>Default</translation>
+        </message>
+        <message>
+            <source>Average conveyance</source>
+            <translation>Average conveyance</translation>
+        </message>
+        <message>
+            <source>Average friction</source>
+            <translation>Average friction</translation>
+        </message>
+        <message>
+            <source>Geometric mean</source>
+            <translation>Geometric mean</translation>
+        </message>
+        <message>
+            <source>Harmonic mean</source>
+            <translation>Harmonic mean</translation>
+        </message>
+        <message>
+            <source>Contraction expansion coefficients</source>
+            <translation>Contraction expansion coefficients</translation>
+        </message>
+        <message>
+            <source>&amp;Contraction</source>
+            <translation>&amp;Contraction</translation>
+        </message>
+        <message>
+            <source>E&amp;xpansion</source>
+            <translation>E&amp;xpansion</translation>
+        </message>
+        <message>
+            <source>Load branch an&amp;d chainages</source>
+            <translation>Load branch an&amp;d chainages</translation>
+        </message>
+    </context>
+    <context>
+        <name>CSearchDlg</name>
+        <message>
+            <source>Search</source>
+            <translation>Search</translation>
+        </message>
+        <message>
+            <source>River Name</source>
+            <translation>River Name</translation>
+        </message>
+        <message>
+            <source>River &amp;name:</source>
+            <translation>River &amp;name:</translation>
+        </message>
+        <message>
+            <source>&amp;Partial match</source>
+            <translation>&amp;Partial match</translation>
+        </message>
+        <message>
+            <source>&amp;Full match</source>
+            <translation>&amp;Full match</translation>
+        </message>
+        <message>
+            <source>Chainage</source>
+            <translation>Chainage</translation>
+        </message>
+        <message>
+            <source>&amp;Chainage:</source>
+            <translation>&amp;Chainage:</translation>
+        </message>
+        <message>
+            <source>&lt;</source>
+            <translation>&lt;</translation>
+        </message>
+        <message>
+            <source>Less than</source>
+            <translation>Less than</translation>
+        </message>
+        <message>
+            <source>=</source>
+            <translation>=</translation>
+        </message>
+        <message>
+            <source>Equal to</source>
+            <translation>Equal to</translation>
+        </message>
+        <message>
+            <source>&gt;</source>
+            <translation>&gt;</translation>
+        </message>
+        <message>
+            <source>Greater than</source>
+            <translation>Greater than</translation>
+        </message>
+        <message>
+            <source>Not &amp;Use</source>
+            <translation>Not &amp;Use</translation>
+        </message>
+    </context>
+    <context>
+        <name>CStratificationPage</name>
+        <message>
+            <source>&amp;No. of layers</source>
+            <translation>&amp;No. of layers</translation>
+        </message>
+        <message>
+            <source>&amp;Densities calculated</source>
+            <translation>&amp;Densities calculated</translation>
+        </message>
+        <message>
+            <source>Turbulence model</source>
+            <translation>Turbulence model</translation>
+        </message>
+        <message>
+            <source>V&amp;iscosity</source>
+            <translation>V&amp;iscosity</translation>
+        </message>
+        <message>
+            <source>&amp;Turbulence model in fluid</source>
+            <translation>&amp;Turbulence model in fluid</translation>
+        </message>
+        <message>
+            <source>constant</source>
+            <translation>constant</translation>
+        </message>
+        <message>
+            <source>mixing-length</source>
+            <translation>mixing-length</translation>
+        </message>
+        <message>
+            <source>k model</source>
+            <translation>k model</translation>
+        </message>
+        <message>
+            <source>k-eps model</source>
+            <translation>k-eps model</translation>
+        </message>
+        <message>
+            <source>Turbulence model at &amp;bed</source>
+            <translation>Turbulence model at &amp;bed</translation>
+        </message>
+        <message>
+            <source>drag coefficient</source>
+            <translation>drag coefficient</translation>
+        </message>
+        <message>
+            <source>Corrections (reductions)</source>
+            <translation>Corrections (reductions)</translation>
+        </message>
+        <message>
+            <source>&amp;Richardson numbers correction</source>
+            <translation>&amp;Richardson numbers correction</translation>
+        </message>
+        <message>
+            <source>Baroclinic Pressure</source>
+            <translation>Baroclinic Pressure</translation>
+        </message>
+        <message>
+            <source>Fa&amp;ctor</source>
+            <translation>Fa&amp;ctor</translation>
+        </message>
+        <message>
+            <source>L&amp;ocal bed slope</source>
+            <translation>L&amp;ocal bed slope</translation>
+        </message>
+        <message>
+            <source>Convection / Advection</source>
+            <translation>Convection / Advection</translation>
+        </message>
+        <message>
+            <source>Factor hori&amp;zontal momentum</source>
+            <translation>Factor hori&amp;zontal momentum</translation>
+        </message>
+        <message>
+            <source>Factor vertical &amp;momentum</source>
+            <translation>Factor vertical &amp;momentum</translation>
+        </message>
+        <message>
+            <source>Factor &amp;advection</source>
+            <translation>Factor &amp;advection</translation>
+        </message>
+        <message>
+            <source>Dispersion</source>
+            <translation>Dispersion</translation>
+        </message>
+        <message>
+            <source>Factor horizontal vi&amp;scosity</source>
+            <translation>Factor horizontal vi&amp;scosity</translation>
+        </message>
+        <message>
+            <source>Factor vertical viscosit&amp;y</source>
+            <translation>Factor vertical viscosit&amp;y</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWavePage</name>
+        <message>
+            <source>Wave Approximation</source>
+            <translation>Wave Approximation</translation>
+        </message>
+        <message>
+            <source>Global Value</source>
+            <translation>Global Value</translation>
+        </message>
+        <message>
+            <source>&amp;Wave Approximation:</source>
+            <translation>&amp;Wave Approximation:</translation>
+        </message>
+        <message>
+            <source>High Order Fully Dynamic</source>
+            <translation>High Order Fully Dynamic</translation>
+        </message>
+        <message>
+            <source>Fully Dynamic</source>
+            <translation>Fully Dynamic</translation>
+        </message>
+        <message>
+            <source>Diffusive Wave</source>
+            <translation>Diffusive Wave</translation>
+        </message>
+        <message>
+            <source>Kinematic Wave</source>
+            <translation>Kinematic Wave</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>Local Values</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWindPage</name>
+        <message>
+            <source>Wind Factor</source>
+            <translation>Wind Factor</translation>
+        </message>
+        <message>
+            <source>&amp;Include wind</source>
+            <translation>&amp;Include wind</translation>
+        </message>
+        <message>
+            <source>Global Factor</source>
+            <translation>Global Factor</translation>
+        </message>
+        <message>
+            <source>&amp;Topographical Factor</source>
+            <translation>&amp;Topographical Factor</translation>
+        </message>
+        <message>
+            <source>Fri&amp;ction Factor</source>
+            <translation>Fri&amp;ction Factor</translation>
+        </message>
+        <message>
+            <source>Local Factors</source>
+            <translation>Local Factors</translation>
+        </message>
+    </context>
+    <context>
+        <name>Kavo0_hd</name>
+        <message>
+            <source>Kvr_Help.chm
+HDPar
+KVR HD Parameters
+KVR HD Parameters (*.hdkv)
+.hdkv
+HDPar.Document
+HDPar Document</source>
+            <translation>Kvr_Help.chm
+HDPar
+KVR HD Parameters
+KVR HD Parameters (*.hdkv)
+.hdkv
+HDPar.Document
+HDPar Document</translation>
+        </message>
+        <message>
+            <source>River Name</source>
+            <translation>River Name</translation>
+        </message>
+        <message>
+            <source>Chainage</source>
+            <translation>Chainage</translation>
+        </message>
+        <message>
+            <source>Flood Pl. Res</source>
+            <translation>Flood Pl. Res</translation>
+        </message>
+        <message>
+            <source>Lines in the editor data-tables with none or only partially
+filled information will be deleted when saving the editor file.
+Proceed Yes/No ?</source>
+            <translation>Lines in the editor data-tables with none or only partially
+filled information will be deleted when saving the editor file.
+Proceed Yes/No ?</translation>
+        </message>
+        <message>
+            <source>HD Parameters</source>
+            <translation>HD Parameters</translation>
+        </message>
+        <message>
+            <source> KVR HD Tools</source>
+            <translation> KVR HD Tools</translation>
+        </message>
+        <message>
+            <source>Unsupported file format</source>
+            <translation>Unsupported file format</translation>
+        </message>
+        <message>
+            <source>Kavo0 HD</source>
+            <translation>Kavo0 HD</translation>
+        </message>
+        <message>
+            <source>UpStr. Chainage</source>
+            <translation>UpStr. Chainage</translation>
+        </message>
+        <message>
+            <source>DnStr. Chainage</source>
+            <translation>DnStr. Chainage</translation>
+        </message>
+        <message>
+            <source>Approx.</source>
+            <translation>Approx.</translation>
+        </message>
+        <message>
+            <source>High Order Fully Dynamic
+Fully Dynamic
+Diffusive Wave
+Kinematic Wave</source>
+            <translation>High Order Fully Dynamic
+Fully Dynamic
+Diffusive Wave
+Kinematic Wave</translation>
+        </message>
+        <message>
+            <source>Leakage Coef</source>
+            <translation>Leakage Coef</translation>
+        </message>
+        <message>
+            <source>%1 already stands beside %2 and holds something else.
+Replace it Yes/No ?</source>
+            <translation>%1 already stands beside %2 and holds something else.
+Replace it Yes/No ?</translation>
+        </message>
+        <message>
+            <source>Removal of incomplete lines</source>
+            <translation>Removal of incomplete lines</translation>
+        </message>
+        <message>
+            <source>Line %1 of %2</source>
+            <translation>Line %1 of %2</translation>
+        </message>
+        <message>
+            <source>Searched item not found</source>
+            <translation>Searched item not found</translation>
+        </message>
+        <message>
+            <source>The last occurence of searched item already found</source>
+            <translation>The last occurence of searched item already found</translation>
+        </message>
+        <message>
+            <source>&amp;Insert Line</source>
+            <translation>&amp;Insert Line</translation>
+        </message>
+        <message>
+            <source>&amp;Delete Line</source>
+            <translation>&amp;Delete Line</translation>
+        </message>
+        <message>
+            <source>&amp;Go to Line...</source>
+            <translation>&amp;Go to Line...</translation>
+        </message>
+        <message>
+            <source>&amp;Search...</source>
+            <translation>&amp;Search...</translation>
+        </message>
+        <message>
+            <source>Search &amp;Again</source>
+            <translation>Search &amp;Again</translation>
+        </message>
+        <message>
+            <source>Initial h</source>
+            <translation>Initial h</translation>
+        </message>
+        <message>
+            <source>Initial y</source>
+            <translation>Initial y</translation>
+        </message>
+        <message>
+            <source>Initial Q</source>
+            <translation>Initial Q</translation>
+        </message>
+        <message>
+            <source>Initial</source>
+            <translation>Initial</translation>
+        </message>
+        <message>
+            <source>Floating point number required</source>
+            <translation>Floating point number required</translation>
+        </message>
+        <message>
+            <source>Invalid floating point number!</source>
+            <translation>Invalid floating point number!</translation>
+        </message>
+        <message>
+            <source>Floating-point value is out of range</source>
+            <translation>Floating-point value is out of range</translation>
+        </message>
+        <message>
+            <source>Please enter an integer.</source>
+            <translation>Please enter an integer.</translation>
+        </message>
+        <message>
+            <source>Line number must be greater than 0</source>
+            <translation>Line number must be greater than 0</translation>
+        </message>
+        <message>
+            <source>Nothing was pasted. Line %1, column "%2" cannot take "%3":
+%4</source>
+            <translation>Nothing was pasted. Line %1, column "%2" cannot take "%3":
+%4</translation>
+        </message>
+        <message>
+            <source>Nothing was pasted. The copied cells are %1 columns wide; from column "%2" on the table has only %3.</source>
+            <translation>Nothing was pasted. The copied cells are %1 columns wide; from column "%2" on the table has only %3.</translation>
+        </message>
+        <message>
+            <source>The cell is locked.</source>
+            <translation>The cell is locked.</translation>
+        </message>
+        <message>
+            <source>Change of cells</source>
+            <translation>Change of cells</translation>
+        </message>
+        <message>
+            <source>Insertion of lines</source>
+            <translation>Insertion of lines</translation>
+        </message>
+        <message>
+            <source>Deletion of lines</source>
+            <translation>Deletion of lines</translation>
+        </message>
+        <message>
+            <source>Paste</source>
+            <translation>Paste</translation>
+        </message>
+        <message>
+            <source>Change of a value</source>
+            <translation>Change of a value</translation>
+        </message>
+        <message>
+            <source>Next cell; behind the last one a new line</source>
+            <translation>Next cell; behind the last one a new line</translation>
+        </message>
+        <message>
+            <source>Previous cell</source>
+            <translation>Previous cell</translation>
+        </message>
+        <message>
+            <source>Insert line</source>
+            <translation>Insert line</translation>
+        </message>
+        <message>
+            <source>Copy, then insert line</source>
+            <translation>Copy, then insert line</translation>
+        </message>
+        <message>
+            <source>Paste, then insert line</source>
+            <translation>Paste, then insert line</translation>
+        </message>
+        <message>
+            <source>Delete selected lines</source>
+            <translation>Delete selected lines</translation>
+        </message>
+        <message>
+            <source>Copy</source>
+            <translation>Copy</translation>
+        </message>
+        <message>
+            <source>Search again</source>
+            <translation>Search again</translation>
+        </message>
+        <message>
+            <source>Search</source>
+            <translation>Search</translation>
+        </message>
+        <message>
+            <source>Undo</source>
+            <translation>Undo</translation>
+        </message>
+        <message>
+            <source>Redo</source>
+            <translation>Redo</translation>
+        </message>
+        <message>
+            <source>Wind</source>
+            <translation>Wind</translation>
+        </message>
+        <message>
+            <source>Topographical factor</source>
+            <translation>Topographical factor</translation>
+        </message>
+        <message>
+            <source>Default Values</source>
+            <translation>Default Values</translation>
+        </message>
+        <message>
+            <source>Heat Balance</source>
+            <translation>Heat Balance</translation>
+        </message>
+        <message>
+            <source>Stratification</source>
+            <translation>Stratification</translation>
+        </message>
+        <message>
+            <source>Groundwater Leakage</source>
+            <translation>Groundwater Leakage</translation>
+        </message>
+        <message>
+            <source>Flood Plain Resist.</source>
+            <translation>Flood Plain Resist.</translation>
+        </message>
+        <message>
+            <source>Water Loss</source>
+            <translation>Water Loss</translation>
+        </message>
+        <message>
+            <source>Water Loss %1</source>
+            <translation>Water Loss %1</translation>
+        </message>
+        <message>
+            <source>One of these is required: %1</source>
+            <translation>One of these is required: %1</translation>
+        </message>
+        <message>
+            <source>No lines. Insert adds one.</source>
+            <translation>No lines. Insert adds one.</translation>
+        </message>
+        <message>
+            <source>Wave Approx</source>
+            <translation>Wave Approx</translation>
+        </message>
+        <message>
+            <source>Quasi Steady</source>
+            <translation>Quasi Steady</translation>
+        </message>
+        <message>
+            <source>Bed Resist.</source>
+            <translation>Bed Resist.</translation>
+        </message>
+        <message>
+            <source>Bed Resist. Toolbox</source>
+            <translation>Bed Resist. Toolbox</translation>
+        </message>
+        <message>
+            <source>Mixing Coef.</source>
+            <translation>Mixing Coef.</translation>
+        </message>
+        <message>
+            <source>Encroachment</source>
+            <translation>Encroachment</translation>
+        </message>
+        <message>
+            <source>Contraction</source>
+            <translation>Contraction</translation>
+        </message>
+        <message>
+            <source>Expansion</source>
+            <translation>Expansion</translation>
+        </message>
+        <message>
+            <source>Resistance</source>
+            <translation>Resistance</translation>
+        </message>
+        <message>
+            <source>Zone 1</source>
+            <translation>Zone 1</translation>
+        </message>
+        <message>
+            <source>Zone 2</source>
+            <translation>Zone 2</translation>
+        </message>
+        <message>
+            <source>Zone 3</source>
+            <translation>Zone 3</translation>
+        </message>
+        <message>
+            <source>Coef. a</source>
+            <translation>Coef. a</translation>
+        </message>
+        <message>
+            <source>Coef. b</source>
+            <translation>Coef. b</translation>
+        </message>
+        <message>
+            <source>Minimum</source>
+            <translation>Minimum</translation>
+        </message>
+        <message>
+            <source>Maximum</source>
+            <translation>Maximum</translation>
+        </message>
+        <message>
+            <source>Velocity</source>
+            <translation>Velocity</translation>
+        </message>
+        <message>
+            <source>Width/depth</source>
+            <translation>Width/depth</translation>
+        </message>
+        <message>
+            <source>Coefficient f</source>
+            <translation>Coefficient f</translation>
+        </message>
+        <message>
+            <source>f%1</source>
+            <translation>f%1</translation>
+        </message>
+        <message>
+            <source>Method
+Banks
+Left offset
+Right offset
+Left position
+Right position
+Width
+Reduction
+Total reduction
+Left reduction
+Right reduction
+Target level
+Target energy</source>
+            <translation>Method
+Banks
+Left offset
+Right offset
+Left position
+Right position
+Width
+Reduction
+Total reduction
+Left reduction
+Right reduction
+Target level
+Target energy</translation>
+        </message>
+        <message>
+            <source>1 Fixed positions
+2 Fixed width
+3 Conveyance reduction
+4 Target level
+5 Target level and energy</source>
+            <translation>1 Fixed positions
+2 Fixed width
+3 Conveyance reduction
+4 Target level
+5 Target level and energy</translation>
+        </message>
+        <message>
+            <source>1 Both banks
+2 Left bank
+3 Right bank</source>
+            <translation>1 Both banks
+2 Left bank
+3 Right bank</translation>
+        </message>
+        <message>
+            <source>1 Equal on both banks
+2 In proportion to conveyance
+3 Bank by bank</source>
+            <translation>1 Equal on both banks
+2 In proportion to conveyance
+3 Bank by bank</translation>
+        </message>
+        <message>
+            <source>Stored as %1.</source>
+            <translation>Stored as %1.</translation>
+        </message>
+        <message>
+            <source>Set-up %1</source>
+            <translation>Set-up %1</translation>
+        </message>
+        <message>
+            <source>This set-up will not be saved as it is: its second line or a later one needs a branch name and a chainage.</source>
+            <translation>This set-up will not be saved as it is: its second line or a later one needs a branch name and a chainage.</translation>
+        </message>
+        <message>
+            <source>There is no set-up yet. Add makes one.</source>
+            <translation>There is no set-up yet. Add makes one.</translation>
+        </message>
+        <message>
+            <source>Addition of a set-up</source>
+            <translation>Addition of a set-up</translation>
+        </message>
+        <message>
+            <source>Deletion of a set-up</source>
+            <translation>Deletion of a set-up</translation>
+        </message>
+        <message>
+            <source>Branches and chainages come from the cross section and network editors of the project.
+This document belongs to no project, so there is nothing to load.</source>
+            <translation>Branches and chainages come from the cross section and network editors of the project.
+This document belongs to no project, so there is nothing to load.</translation>
+        </message>
+        <message>
+            <source>No cross section or network editor of the project has answered.
+Nothing was loaded.</source>
+            <translation>No cross section or network editor of the project has answered.
+Nothing was loaded.</translation>
+        </message>
+        <message>
+            <source>Search for river name/topo ID.
+Search</source>
+            <translation>Search for river name/topo ID.
+Search</translation>
+        </message>
+        <message>
+            <source>Search for next occurence of river name/ topo ID.
+Find Next</source>
+            <translation>Search for next occurence of river name/ topo ID.
+Find Next</translation>
+        </message>
+    </context>
+</TS>

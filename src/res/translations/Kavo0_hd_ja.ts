@@ -1,0 +1,1271 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="ja" sourcelanguage="en_US">
+    <context>
+        <name>CBedPage</name>
+        <message>
+            <source>Bed Resistance</source>
+            <translation>河床抵抗</translation>
+        </message>
+        <message>
+            <source>Formula</source>
+            <translation>抵抗則</translation>
+        </message>
+        <message>
+            <source>Resistance &amp;formula:</source>
+            <translation>抵抗則(&amp;F):</translation>
+        </message>
+        <message>
+            <source>Manning's M</source>
+            <translation>マニングのM(粗度係数の逆数)</translation>
+        </message>
+        <message>
+            <source>Manning's n</source>
+            <translation>マニングの粗度係数n</translation>
+        </message>
+        <message>
+            <source>Chezy</source>
+            <translation>シェジー係数</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>&amp;Uniform section</source>
+            <translation>断面一様(&amp;U)</translation>
+        </message>
+        <message>
+            <source>&amp;Resistance:</source>
+            <translation>抵抗値(&amp;R):</translation>
+        </message>
+        <message>
+            <source>&amp;Three zones</source>
+            <translation>3区分(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Zone &amp;1 (main channel):</source>
+            <translation>区分1(低水路)(&amp;1):</translation>
+        </message>
+        <message>
+            <source>Zone &amp;2 (transition):</source>
+            <translation>区分2(遷移部)(&amp;2):</translation>
+        </message>
+        <message>
+            <source>Zone &amp;3 (flood plain):</source>
+            <translation>区分3(高水敷)(&amp;3):</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>地点別の値</translation>
+        </message>
+    </context>
+    <context>
+        <name>CBedToolboxPage</name>
+        <message>
+            <source>Bed Resistance Toolbox</source>
+            <translation>河床抵抗ツール</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>&amp;Method:</source>
+            <translation>方法(&amp;M):</translation>
+        </message>
+        <message>
+            <source>Not used</source>
+            <translation>使用しない</translation>
+        </message>
+        <message>
+            <source>Coefficients a and b</source>
+            <translation>係数aとb</translation>
+        </message>
+        <message>
+            <source>Table over velocity</source>
+            <translation>流速に対する表</translation>
+        </message>
+        <message>
+            <source>Apply in:</source>
+            <translation>適用範囲:</translation>
+        </message>
+        <message>
+            <source>Zone &amp;1</source>
+            <translation>区分1(&amp;1)</translation>
+        </message>
+        <message>
+            <source>Zone &amp;2</source>
+            <translation>区分2(&amp;2)</translation>
+        </message>
+        <message>
+            <source>Zone &amp;3</source>
+            <translation>区分3(&amp;3)</translation>
+        </message>
+        <message>
+            <source>Coefficient &amp;a:</source>
+            <translation>係数a(&amp;A):</translation>
+        </message>
+        <message>
+            <source>Coefficient &amp;b:</source>
+            <translation>係数b(&amp;B):</translation>
+        </message>
+        <message>
+            <source>Mi&amp;nimum resistance:</source>
+            <translation>最小抵抗値(&amp;N):</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum resistance:</source>
+            <translation>最大抵抗値(&amp;X):</translation>
+        </message>
+        <message>
+            <source>Resistance over velocity</source>
+            <translation>流速と抵抗値</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Resistance over velocity of the current line</source>
+            <translation>現在行の流速と抵抗値</translation>
+        </message>
+    </context>
+    <context>
+        <name>CDefaultPage</name>
+        <message>
+            <source>Computation Scheme</source>
+            <translation>計算スキーム</translation>
+        </message>
+        <message>
+            <source>Del&amp;ta:</source>
+            <translation>Delta(&amp;T):</translation>
+        </message>
+        <message>
+            <source>Delh&amp;s:</source>
+            <translation>Delhs(&amp;S):</translation>
+        </message>
+        <message>
+            <source>&amp;Delh:</source>
+            <translation>Delh(&amp;D):</translation>
+        </message>
+        <message>
+            <source>&amp;Alpha:</source>
+            <translation>Alpha(&amp;A):</translation>
+        </message>
+        <message>
+            <source>T&amp;heta:</source>
+            <translation>Theta(&amp;H):</translation>
+        </message>
+        <message>
+            <source>E&amp;ps:</source>
+            <translation>Eps(&amp;P):</translation>
+        </message>
+        <message>
+            <source>Dh N&amp;ode:</source>
+            <translation>Dh Node(&amp;O):</translation>
+        </message>
+        <message>
+            <source>&amp;Zeta Min:</source>
+            <translation>Zeta Min(&amp;Z):</translation>
+        </message>
+        <message>
+            <source>St&amp;ruc Fac:</source>
+            <translation>Struc Fac(&amp;R):</translation>
+        </message>
+        <message>
+            <source>&amp;Inter1Max:</source>
+            <translation>Inter1Max(&amp;I):</translation>
+        </message>
+        <message>
+            <source>&amp;NoIter:</source>
+            <translation>NoIter(&amp;N):</translation>
+        </message>
+        <message>
+            <source>&amp;MaxIterSteady:</source>
+            <translation>MaxIterSteady(&amp;M):</translation>
+        </message>
+        <message>
+            <source>Fro&amp;udeMax:</source>
+            <translation>FroudeMax(&amp;U):</translation>
+        </message>
+        <message>
+            <source>FroudeE&amp;xp:</source>
+            <translation>FroudeExp(&amp;X):</translation>
+        </message>
+        <message>
+            <source>Switches</source>
+            <translation>スイッチ</translation>
+        </message>
+        <message>
+            <source>Node &amp;Compatibility</source>
+            <translation>節点の適合条件(&amp;C)</translation>
+        </message>
+        <message>
+            <source>Water Level</source>
+            <translation>水位</translation>
+        </message>
+        <message>
+            <source>(Energy - Not Avail.)</source>
+            <translation>(エネルギー - 利用不可)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CEditorsLoadOptionDlg</name>
+        <message>
+            <source>Load Branch and Chainage</source>
+            <translation>河川名と追加距離の読み込み</translation>
+        </message>
+        <message>
+            <source>&amp;Branch and Chainage,</source>
+            <translation>河川名、追加距離(&amp;B)</translation>
+        </message>
+        <message>
+            <source>from Cross Section Editor</source>
+            <translation>横断面エディターから</translation>
+        </message>
+        <message>
+            <source>Branch, Chainage and &amp;Radius,</source>
+            <translation>河川名、追加距離、曲率半径(&amp;R)</translation>
+        </message>
+        <message>
+            <source>from Cross Section Editor and Network Editor</source>
+            <translation>横断面エディターと河道網エディターから</translation>
+        </message>
+        <message>
+            <source>Branch, Chainage, Radius and Channel &amp;Width,</source>
+            <translation>河川名、追加距離、曲率半径、水路幅(&amp;W)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CEncroachPage</name>
+        <message>
+            <source>Iteration</source>
+            <translation>反復計算</translation>
+        </message>
+        <message>
+            <source>&amp;Maximum number of iterations:</source>
+            <translation>最大反復回数(&amp;M):</translation>
+        </message>
+        <message>
+            <source>Encroachment set-ups</source>
+            <translation>河積阻害(エンクローチメント)の設定</translation>
+        </message>
+        <message>
+            <source>Set-&amp;up:</source>
+            <translation>設定(&amp;U):</translation>
+        </message>
+        <message>
+            <source>&amp;Previous</source>
+            <translation>前へ(&amp;P)</translation>
+        </message>
+        <message>
+            <source>Ne&amp;xt</source>
+            <translation>次へ(&amp;X)</translation>
+        </message>
+        <message>
+            <source>&amp;Add</source>
+            <translation>追加(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Dup&amp;licate</source>
+            <translation>複製(&amp;L)</translation>
+        </message>
+        <message>
+            <source>D&amp;elete</source>
+            <translation>削除(&amp;E)</translation>
+        </message>
+        <message>
+            <source>Lines of the set-up</source>
+            <translation>設定の行</translation>
+        </message>
+    </context>
+    <context>
+        <name>CFloodPage</name>
+        <message>
+            <source>Flood Plain Resistance</source>
+            <translation>高水敷の抵抗</translation>
+        </message>
+        <message>
+            <source>Global Value</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>Flood Plain &amp;Resistance:</source>
+            <translation>高水敷の抵抗(&amp;R):</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>地点別の値</translation>
+        </message>
+    </context>
+    <context>
+        <name>CGotoDlg</name>
+        <message>
+            <source>Go to grid line</source>
+            <translation>指定行へ移動</translation>
+        </message>
+        <message>
+            <source>&amp;Line number:</source>
+            <translation>行番号(&amp;L):</translation>
+        </message>
+    </context>
+    <context>
+        <name>CHeatBalancePage</name>
+        <message>
+            <source>Heat Balance Calculation</source>
+            <translation>熱収支計算</translation>
+        </message>
+        <message>
+            <source>&amp;Included</source>
+            <translation>計算する(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Location</source>
+            <translation>位置</translation>
+        </message>
+        <message>
+            <source>L&amp;atitude (N pos.)</source>
+            <translation>緯度(北緯を正)(&amp;A)</translation>
+        </message>
+        <message>
+            <source>L&amp;ongitude (W pos.)</source>
+            <translation>経度(西経を正)(&amp;O)</translation>
+        </message>
+        <message>
+            <source>&amp;Time meridian zone (W pos.)</source>
+            <translation>標準時子午線(西経を正)(&amp;T)</translation>
+        </message>
+        <message>
+            <source>&amp;Displacement in time</source>
+            <translation>時刻のずれ(&amp;D)</translation>
+        </message>
+        <message>
+            <source>Solar absorption</source>
+            <translation>日射の吸収</translation>
+        </message>
+        <message>
+            <source>Li&amp;ght attenuation</source>
+            <translation>光の減衰(&amp;G)</translation>
+        </message>
+        <message>
+            <source>&amp;Constant in Beer's law</source>
+            <translation>ベールの法則の定数(&amp;C)</translation>
+        </message>
+        <message>
+            <source>Radiation under cloudy skies</source>
+            <translation>曇天時の放射</translation>
+        </message>
+        <message>
+            <source>&amp;Parameter A</source>
+            <translation>パラメータA(&amp;P)</translation>
+        </message>
+        <message>
+            <source>Parameter &amp;B</source>
+            <translation>パラメータB(&amp;B)</translation>
+        </message>
+        <message>
+            <source>Vaporization</source>
+            <translation>蒸発</translation>
+        </message>
+        <message>
+            <source>Pa&amp;rameter A</source>
+            <translation>パラメータA(&amp;R)</translation>
+        </message>
+        <message>
+            <source>Para&amp;meter B</source>
+            <translation>パラメータB(&amp;M)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CInitPage</name>
+        <message>
+            <source>Initial conditions</source>
+            <translation>初期条件</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>Water &amp;Level</source>
+            <translation>水位(&amp;L)</translation>
+        </message>
+        <message>
+            <source>Water &amp;Depth</source>
+            <translation>水深(&amp;D)</translation>
+        </message>
+        <message>
+            <source>&amp;Water Level</source>
+            <translation>水位(&amp;W)</translation>
+        </message>
+        <message>
+            <source>&amp;Water Depth</source>
+            <translation>水深(&amp;W)</translation>
+        </message>
+        <message>
+            <source>Disc&amp;harge:</source>
+            <translation>流量(&amp;H):</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>地点別の値</translation>
+        </message>
+    </context>
+    <context>
+        <name>CKsEditStyle</name>
+        <message>
+            <source>Unit: %1</source>
+            <translation>単位: %1</translation>
+        </message>
+    </context>
+    <context>
+        <name>CLeakagePage</name>
+        <message>
+            <source>&amp;Include Leakage</source>
+            <translation>漏水を考慮する(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Global Leakage Coefficient</source>
+            <translation>漏水係数の全体値</translation>
+        </message>
+        <message>
+            <source>&amp;Coefficient:</source>
+            <translation>係数(&amp;C):</translation>
+        </message>
+        <message>
+            <source>Local Leakage Coefficients</source>
+            <translation>地点別の漏水係数</translation>
+        </message>
+    </context>
+    <context>
+        <name>CLossPage</name>
+        <message>
+            <source>Water Loss</source>
+            <translation>損失水量</translation>
+        </message>
+    </context>
+    <context>
+        <name>CMixingCoefPage</name>
+        <message>
+            <source>Mixing Coefficients</source>
+            <translation>混合係数</translation>
+        </message>
+        <message>
+            <source>Global Values</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;1:</source>
+            <translation>混合係数f1(&amp;1):</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;2:</source>
+            <translation>混合係数f2(&amp;2):</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;3:</source>
+            <translation>混合係数f3(&amp;3):</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient f&amp;4:</source>
+            <translation>混合係数f4(&amp;4):</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient over width-depth ratio</source>
+            <translation>川幅水深比と混合係数</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Mixing coefficient over width-depth ratio of the current line</source>
+            <translation>現在行の川幅水深比と混合係数</translation>
+        </message>
+    </context>
+    <context>
+        <name>CQuasiPage</name>
+        <message>
+            <source>Computational parameters</source>
+            <translation>計算パラメータ</translation>
+        </message>
+        <message>
+            <source>&amp;Relax:</source>
+            <translation>Relax(&amp;R):</translation>
+        </message>
+        <message>
+            <source>&amp;Beta_Limit:</source>
+            <translation>Beta_Limit(&amp;B):</translation>
+        </message>
+        <message>
+            <source>&amp;Fac_0:</source>
+            <translation>Fac_0(&amp;F):</translation>
+        </message>
+        <message>
+            <source>&amp;Qconv_Factor:</source>
+            <translation>Qconv_Factor(&amp;Q):</translation>
+        </message>
+        <message>
+            <source>&amp;Hconv_Factor:</source>
+            <translation>Hconv_Factor(&amp;H):</translation>
+        </message>
+        <message>
+            <source>&amp;Min_Hconv_In_Branch:</source>
+            <translation>Min_Hconv_In_Branch(&amp;M):</translation>
+        </message>
+        <message>
+            <source>Q_&amp;struc_Factor:</source>
+            <translation>Q_struc_Factor(&amp;S):</translation>
+        </message>
+        <message>
+            <source>Hs&amp;top:</source>
+            <translation>Hstop(&amp;T):</translation>
+        </message>
+        <message>
+            <source>Steady State Options</source>
+            <translation>定常計算のオプション</translation>
+        </message>
+        <message>
+            <source>&amp;Use energy equation</source>
+            <translation>エネルギー式を用いる(&amp;U)</translation>
+        </message>
+        <message>
+            <source>Model contraction and expansion &amp;losses</source>
+            <translation>急縮・急拡損失を考慮する(&amp;L)</translation>
+        </message>
+        <message>
+            <source>&amp;Allow upstream slope</source>
+            <translation>上流向きの水面勾配を許す(&amp;A)</translation>
+        </message>
+        <message>
+            <source>&amp;Velocity distribution coefficient based on conveyance</source>
+            <translation>通水能から流速分布係数を求める(&amp;V)</translation>
+        </message>
+        <message>
+            <source>&amp;No suppression of convective terms</source>
+            <translation>移流項を抑制しない(&amp;N)</translation>
+        </message>
+        <message>
+            <source>Friction slope &amp;evaluation</source>
+            <translation>摩擦勾配の評価(&amp;E)</translation>
+        </message>
+        <message>
+            <source>Default</source>
+            <translation>既定</translation>
+        </message>
+        <message>
+            <source>Average conveyance</source>
+            <translation>通水能の平均</translation>
+        </message>
+        <message>
+            <source>Average friction</source>
+            <translation>摩擦勾配の算術平均</translation>
+        </message>
+        <message>
+            <source>Geometric mean</source>
+            <translation>幾何平均</translation>
+        </message>
+        <message>
+            <source>Harmonic mean</source>
+            <translation>調和平均</translation>
+        </message>
+        <message>
+            <source>Contraction expansion coefficients</source>
+            <translation>急縮・急拡損失係数</translation>
+        </message>
+        <message>
+            <source>&amp;Contraction</source>
+            <translation>急縮(&amp;C)</translation>
+        </message>
+        <message>
+            <source>E&amp;xpansion</source>
+            <translation>急拡(&amp;X)</translation>
+        </message>
+        <message>
+            <source>Load branch an&amp;d chainages</source>
+            <translation>河川名と追加距離の読み込み(&amp;D)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CSearchDlg</name>
+        <message>
+            <source>Search</source>
+            <translation>検索</translation>
+        </message>
+        <message>
+            <source>River Name</source>
+            <translation>河川名</translation>
+        </message>
+        <message>
+            <source>River &amp;name:</source>
+            <translation>河川名(&amp;N):</translation>
+        </message>
+        <message>
+            <source>&amp;Partial match</source>
+            <translation>前方一致(&amp;P)</translation>
+        </message>
+        <message>
+            <source>&amp;Full match</source>
+            <translation>完全一致(&amp;F)</translation>
+        </message>
+        <message>
+            <source>Chainage</source>
+            <translation>追加距離</translation>
+        </message>
+        <message>
+            <source>&amp;Chainage:</source>
+            <translation>追加距離(&amp;C):</translation>
+        </message>
+        <message>
+            <source>&lt;</source>
+            <translation>&lt;</translation>
+        </message>
+        <message>
+            <source>Less than</source>
+            <translation>より小さい</translation>
+        </message>
+        <message>
+            <source>=</source>
+            <translation>=</translation>
+        </message>
+        <message>
+            <source>Equal to</source>
+            <translation>等しい</translation>
+        </message>
+        <message>
+            <source>&gt;</source>
+            <translation>&gt;</translation>
+        </message>
+        <message>
+            <source>Greater than</source>
+            <translation>より大きい</translation>
+        </message>
+        <message>
+            <source>Not &amp;Use</source>
+            <translation>使わない(&amp;U)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CStratificationPage</name>
+        <message>
+            <source>&amp;No. of layers</source>
+            <translation>層の数(&amp;N)</translation>
+        </message>
+        <message>
+            <source>&amp;Densities calculated</source>
+            <translation>密度を計算する(&amp;D)</translation>
+        </message>
+        <message>
+            <source>Turbulence model</source>
+            <translation>乱流モデル</translation>
+        </message>
+        <message>
+            <source>V&amp;iscosity</source>
+            <translation>粘性係数(&amp;I)</translation>
+        </message>
+        <message>
+            <source>&amp;Turbulence model in fluid</source>
+            <translation>流体中の乱流モデル(&amp;T)</translation>
+        </message>
+        <message>
+            <source>constant</source>
+            <translation>一定</translation>
+        </message>
+        <message>
+            <source>mixing-length</source>
+            <translation>混合距離</translation>
+        </message>
+        <message>
+            <source>k model</source>
+            <translation>kモデル</translation>
+        </message>
+        <message>
+            <source>k-eps model</source>
+            <translation>k-εモデル</translation>
+        </message>
+        <message>
+            <source>Turbulence model at &amp;bed</source>
+            <translation>河床の乱流モデル(&amp;B)</translation>
+        </message>
+        <message>
+            <source>drag coefficient</source>
+            <translation>抗力係数</translation>
+        </message>
+        <message>
+            <source>Corrections (reductions)</source>
+            <translation>補正(低減)</translation>
+        </message>
+        <message>
+            <source>&amp;Richardson numbers correction</source>
+            <translation>リチャードソン数による補正(&amp;R)</translation>
+        </message>
+        <message>
+            <source>Baroclinic Pressure</source>
+            <translation>傾圧項</translation>
+        </message>
+        <message>
+            <source>Fa&amp;ctor</source>
+            <translation>係数(&amp;C)</translation>
+        </message>
+        <message>
+            <source>L&amp;ocal bed slope</source>
+            <translation>局所河床勾配(&amp;O)</translation>
+        </message>
+        <message>
+            <source>Convection / Advection</source>
+            <translation>移流</translation>
+        </message>
+        <message>
+            <source>Factor hori&amp;zontal momentum</source>
+            <translation>水平運動量の係数(&amp;Z)</translation>
+        </message>
+        <message>
+            <source>Factor vertical &amp;momentum</source>
+            <translation>鉛直運動量の係数(&amp;M)</translation>
+        </message>
+        <message>
+            <source>Factor &amp;advection</source>
+            <translation>移流の係数(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Dispersion</source>
+            <translation>分散</translation>
+        </message>
+        <message>
+            <source>Factor horizontal vi&amp;scosity</source>
+            <translation>水平渦動粘性の係数(&amp;S)</translation>
+        </message>
+        <message>
+            <source>Factor vertical viscosit&amp;y</source>
+            <translation>鉛直渦動粘性の係数(&amp;Y)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWavePage</name>
+        <message>
+            <source>Wave Approximation</source>
+            <translation>波動近似</translation>
+        </message>
+        <message>
+            <source>Global Value</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>&amp;Wave Approximation:</source>
+            <translation>波動近似(&amp;W):</translation>
+        </message>
+        <message>
+            <source>High Order Fully Dynamic</source>
+            <translation>高次ダイナミックウェーブ</translation>
+        </message>
+        <message>
+            <source>Fully Dynamic</source>
+            <translation>ダイナミックウェーブ</translation>
+        </message>
+        <message>
+            <source>Diffusive Wave</source>
+            <translation>拡散波近似</translation>
+        </message>
+        <message>
+            <source>Kinematic Wave</source>
+            <translation>キネマティックウェーブ近似</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>地点別の値</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWindPage</name>
+        <message>
+            <source>Wind Factor</source>
+            <translation>風の係数</translation>
+        </message>
+        <message>
+            <source>&amp;Include wind</source>
+            <translation>風を考慮する(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Global Factor</source>
+            <translation>全体の係数</translation>
+        </message>
+        <message>
+            <source>&amp;Topographical Factor</source>
+            <translation>地形係数(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Fri&amp;ction Factor</source>
+            <translation>摩擦係数(&amp;C)</translation>
+        </message>
+        <message>
+            <source>Local Factors</source>
+            <translation>地点別の係数</translation>
+        </message>
+    </context>
+    <context>
+        <name>Kavo0_hd</name>
+        <message>
+            <source>Kvr_Help.chm
+HDPar
+KVR HD Parameters
+KVR HD Parameters (*.hdkv)
+.hdkv
+HDPar.Document
+HDPar Document</source>
+            <translation>Kvr_Help.chm
+HDPar
+KVR HDパラメータ
+KVR HDパラメータ (*.hdkv)
+.hdkv
+HDPar.Document
+HDPar Document</translation>
+        </message>
+        <message>
+            <source>River Name</source>
+            <translation>河川名</translation>
+        </message>
+        <message>
+            <source>Chainage</source>
+            <translation>追加距離</translation>
+        </message>
+        <message>
+            <source>Flood Pl. Res</source>
+            <translation>高水敷抵抗</translation>
+        </message>
+        <message>
+            <source>Lines in the editor data-tables with none or only partially
+filled information will be deleted when saving the editor file.
+Proceed Yes/No ?</source>
+            <translation>データ表のうち、空の行や記入が不完全な行は、
+ファイルの保存時に削除されます。
+続行しますか?</translation>
+        </message>
+        <message>
+            <source>HD Parameters</source>
+            <translation>HDパラメータ</translation>
+        </message>
+        <message>
+            <source> KVR HD Tools</source>
+            <translation> KVR HDツール</translation>
+        </message>
+        <message>
+            <source>Unsupported file format</source>
+            <translation>対応していないファイル形式です</translation>
+        </message>
+        <message>
+            <source>Kavo0 HD</source>
+            <translation>Kavo0 HD</translation>
+        </message>
+        <message>
+            <source>UpStr. Chainage</source>
+            <translation>上流端追加距離</translation>
+        </message>
+        <message>
+            <source>DnStr. Chainage</source>
+            <translation>下流端追加距離</translation>
+        </message>
+        <message>
+            <source>Approx.</source>
+            <translation>近似</translation>
+        </message>
+        <message>
+            <source>High Order Fully Dynamic
+Fully Dynamic
+Diffusive Wave
+Kinematic Wave</source>
+            <translation>高次ダイナミックウェーブ
+ダイナミックウェーブ
+拡散波近似
+キネマティックウェーブ近似</translation>
+        </message>
+        <message>
+            <source>Leakage Coef</source>
+            <translation>漏水係数</translation>
+        </message>
+        <message>
+            <source>%1 already stands beside %2 and holds something else.
+Replace it Yes/No ?</source>
+            <translation>%2 と同じ場所に、内容の異なる %1 が既にあります。
+置き換えますか?</translation>
+        </message>
+        <message>
+            <source>Removal of incomplete lines</source>
+            <translation>不完全な行の削除</translation>
+        </message>
+        <message>
+            <source>Line %1 of %2</source>
+            <translation>%1 行目 / 全 %2 行</translation>
+        </message>
+        <message>
+            <source>Searched item not found</source>
+            <translation>検索した項目が見つかりません</translation>
+        </message>
+        <message>
+            <source>The last occurence of searched item already found</source>
+            <translation>これ以降に該当する項目はありません</translation>
+        </message>
+        <message>
+            <source>&amp;Insert Line</source>
+            <translation>行の挿入(&amp;I)</translation>
+        </message>
+        <message>
+            <source>&amp;Delete Line</source>
+            <translation>行の削除(&amp;D)</translation>
+        </message>
+        <message>
+            <source>&amp;Go to Line...</source>
+            <translation>指定行へ移動(&amp;G)...</translation>
+        </message>
+        <message>
+            <source>&amp;Search...</source>
+            <translation>検索(&amp;S)...</translation>
+        </message>
+        <message>
+            <source>Search &amp;Again</source>
+            <translation>次を検索(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Initial h</source>
+            <translation>初期水位 h</translation>
+        </message>
+        <message>
+            <source>Initial y</source>
+            <translation>初期水深 y</translation>
+        </message>
+        <message>
+            <source>Initial Q</source>
+            <translation>初期流量 Q</translation>
+        </message>
+        <message>
+            <source>Initial</source>
+            <translation>初期条件</translation>
+        </message>
+        <message>
+            <source>Floating point number required</source>
+            <translation>数値を入力してください</translation>
+        </message>
+        <message>
+            <source>Invalid floating point number!</source>
+            <translation>数値の書き方が正しくありません。</translation>
+        </message>
+        <message>
+            <source>Floating-point value is out of range</source>
+            <translation>数値が範囲外です</translation>
+        </message>
+        <message>
+            <source>Please enter an integer.</source>
+            <translation>整数を入力してください。</translation>
+        </message>
+        <message>
+            <source>Line number must be greater than 0</source>
+            <translation>行番号は1以上にしてください</translation>
+        </message>
+        <message>
+            <source>Nothing was pasted. Line %1, column "%2" cannot take "%3":
+%4</source>
+            <translation>貼り付けませんでした。%1 行目の「%2」列には「%3」を入れられません:
+%4</translation>
+        </message>
+        <message>
+            <source>Nothing was pasted. The copied cells are %1 columns wide; from column "%2" on the table has only %3.</source>
+            <translation>貼り付けませんでした。コピーしたセルは %1 列ありますが、表には「%2」列から %3 列しかありません。</translation>
+        </message>
+        <message>
+            <source>The cell is locked.</source>
+            <translation>セルはロックされています。</translation>
+        </message>
+        <message>
+            <source>Change of cells</source>
+            <translation>セルの変更</translation>
+        </message>
+        <message>
+            <source>Insertion of lines</source>
+            <translation>行の挿入</translation>
+        </message>
+        <message>
+            <source>Deletion of lines</source>
+            <translation>行の削除</translation>
+        </message>
+        <message>
+            <source>Paste</source>
+            <translation>貼り付け</translation>
+        </message>
+        <message>
+            <source>Change of a value</source>
+            <translation>値の変更</translation>
+        </message>
+        <message>
+            <source>Next cell; behind the last one a new line</source>
+            <translation>次のセル(最後のセルでは行を追加)</translation>
+        </message>
+        <message>
+            <source>Previous cell</source>
+            <translation>前のセル</translation>
+        </message>
+        <message>
+            <source>Insert line</source>
+            <translation>行の挿入</translation>
+        </message>
+        <message>
+            <source>Copy, then insert line</source>
+            <translation>コピーして行を挿入</translation>
+        </message>
+        <message>
+            <source>Paste, then insert line</source>
+            <translation>貼り付けて行を挿入</translation>
+        </message>
+        <message>
+            <source>Delete selected lines</source>
+            <translation>選択した行の削除</translation>
+        </message>
+        <message>
+            <source>Copy</source>
+            <translation>コピー</translation>
+        </message>
+        <message>
+            <source>Search again</source>
+            <translation>次を検索</translation>
+        </message>
+        <message>
+            <source>Search</source>
+            <translation>検索</translation>
+        </message>
+        <message>
+            <source>Undo</source>
+            <translation>元に戻す</translation>
+        </message>
+        <message>
+            <source>Redo</source>
+            <translation>やり直し</translation>
+        </message>
+        <message>
+            <source>Wind</source>
+            <translation>風</translation>
+        </message>
+        <message>
+            <source>Topographical factor</source>
+            <translation>地形係数</translation>
+        </message>
+        <message>
+            <source>Default Values</source>
+            <translation>既定値</translation>
+        </message>
+        <message>
+            <source>Heat Balance</source>
+            <translation>熱収支</translation>
+        </message>
+        <message>
+            <source>Stratification</source>
+            <translation>成層</translation>
+        </message>
+        <message>
+            <source>Groundwater Leakage</source>
+            <translation>地下水への漏水</translation>
+        </message>
+        <message>
+            <source>Flood Plain Resist.</source>
+            <translation>高水敷抵抗</translation>
+        </message>
+        <message>
+            <source>Water Loss</source>
+            <translation>損失水量</translation>
+        </message>
+        <message>
+            <source>Water Loss %1</source>
+            <translation>損失水量 %1</translation>
+        </message>
+        <message>
+            <source>One of these is required: %1</source>
+            <translation>次のいずれかを入力してください: %1</translation>
+        </message>
+        <message>
+            <source>No lines. Insert adds one.</source>
+            <translation>行がありません。Insertキーで追加します。</translation>
+        </message>
+        <message>
+            <source>Wave Approx</source>
+            <translation>波動近似</translation>
+        </message>
+        <message>
+            <source>Quasi Steady</source>
+            <translation>準定常</translation>
+        </message>
+        <message>
+            <source>Bed Resist.</source>
+            <translation>河床抵抗</translation>
+        </message>
+        <message>
+            <source>Bed Resist. Toolbox</source>
+            <translation>河床抵抗ツール</translation>
+        </message>
+        <message>
+            <source>Mixing Coef.</source>
+            <translation>混合係数</translation>
+        </message>
+        <message>
+            <source>Encroachment</source>
+            <translation>河積阻害</translation>
+        </message>
+        <message>
+            <source>Contraction</source>
+            <translation>急縮</translation>
+        </message>
+        <message>
+            <source>Expansion</source>
+            <translation>急拡</translation>
+        </message>
+        <message>
+            <source>Resistance</source>
+            <translation>抵抗値</translation>
+        </message>
+        <message>
+            <source>Zone 1</source>
+            <translation>区分1</translation>
+        </message>
+        <message>
+            <source>Zone 2</source>
+            <translation>区分2</translation>
+        </message>
+        <message>
+            <source>Zone 3</source>
+            <translation>区分3</translation>
+        </message>
+        <message>
+            <source>Coef. a</source>
+            <translation>係数a</translation>
+        </message>
+        <message>
+            <source>Coef. b</source>
+            <translation>係数b</translation>
+        </message>
+        <message>
+            <source>Minimum</source>
+            <translation>最小</translation>
+        </message>
+        <message>
+            <source>Maximum</source>
+            <translation>最大</translation>
+        </message>
+        <message>
+            <source>Velocity</source>
+            <translation>流速</translation>
+        </message>
+        <message>
+            <source>Width/depth</source>
+            <translation>川幅水深比</translation>
+        </message>
+        <message>
+            <source>Coefficient f</source>
+            <translation>係数f</translation>
+        </message>
+        <message>
+            <source>f%1</source>
+            <translation>f%1</translation>
+        </message>
+        <message>
+            <source>Method
+Banks
+Left offset
+Right offset
+Left position
+Right position
+Width
+Reduction
+Total reduction
+Left reduction
+Right reduction
+Target level
+Target energy</source>
+            <translation>方法
+対象岸
+左岸余裕幅
+右岸余裕幅
+左岸位置
+右岸位置
+幅
+低減方法
+全低減率
+左岸低減率
+右岸低減率
+目標水位
+目標エネルギー高</translation>
+        </message>
+        <message>
+            <source>1 Fixed positions
+2 Fixed width
+3 Conveyance reduction
+4 Target level
+5 Target level and energy</source>
+            <translation>1 位置を固定
+2 幅を固定
+3 通水能の低減
+4 目標水位
+5 目標水位とエネルギー高</translation>
+        </message>
+        <message>
+            <source>1 Both banks
+2 Left bank
+3 Right bank</source>
+            <translation>1 両岸
+2 左岸
+3 右岸</translation>
+        </message>
+        <message>
+            <source>1 Equal on both banks
+2 In proportion to conveyance
+3 Bank by bank</source>
+            <translation>1 両岸等分
+2 通水能に比例
+3 岸ごと</translation>
+        </message>
+        <message>
+            <source>Stored as %1.</source>
+            <translation>%1 として保存されます。</translation>
+        </message>
+        <message>
+            <source>Set-up %1</source>
+            <translation>設定 %1</translation>
+        </message>
+        <message>
+            <source>This set-up will not be saved as it is: its second line or a later one needs a branch name and a chainage.</source>
+            <translation>この設定はこのままでは保存されません。2行目以降のいずれかに河川名と追加距離が必要です。</translation>
+        </message>
+        <message>
+            <source>There is no set-up yet. Add makes one.</source>
+            <translation>設定がまだありません。「追加」で作成します。</translation>
+        </message>
+        <message>
+            <source>Addition of a set-up</source>
+            <translation>設定の追加</translation>
+        </message>
+        <message>
+            <source>Deletion of a set-up</source>
+            <translation>設定の削除</translation>
+        </message>
+        <message>
+            <source>Branches and chainages come from the cross section and network editors of the project.
+This document belongs to no project, so there is nothing to load.</source>
+            <translation>河川名と追加距離は、プロジェクトの横断面エディターと河道網エディターから読み込みます。
+この文書はプロジェクトに属していないため、読み込むものがありません。</translation>
+        </message>
+        <message>
+            <source>No cross section or network editor of the project has answered.
+Nothing was loaded.</source>
+            <translation>プロジェクトの横断面エディターと河道網エディターから応答がありません。
+何も読み込みませんでした。</translation>
+        </message>
+        <message>
+            <source>Search for river name/topo ID.
+Search</source>
+            <translation>河川名/地形IDを検索します。
+検索</translation>
+        </message>
+        <message>
+            <source>Search for next occurence of river name/ topo ID.
+Find Next</source>
+            <translation>次の河川名/地形IDを検索します。
+次を検索</translation>
+        </message>
+    </context>
+</TS>
