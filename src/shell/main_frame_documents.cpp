@@ -7,7 +7,6 @@
 #include <QDir>
 #include <QDropEvent>
 #include <QFileInfo>
-#include <QIcon>
 #include <QInputDialog>
 #include <QMimeData>
 #include <QSettings>
@@ -104,7 +103,7 @@ void CMainFrame::SetWindowIcons()
         for (const auto& plugin : m_plugins) {
             for (const auto& documents : plugin->templates) {
                 if (view && view->GetDocument() && view->GetDocument()->GetDocTemplate() == documents.get())
-                    window->setWindowIcon(QIcon(KsBitmapPath(plugin->KsGetBitmapId())));
+                    window->setWindowIcon(plugin->Icon());
             }
         }
     }

@@ -40,6 +40,12 @@ QString TakeTemplates(CPlugin& plugin)
 
 } // namespace
 
+QIcon CPlugin::Icon() const
+{
+    const QString path = IsUsable() ? KsBitmapPath(KsGetBitmapId()) : QString();
+    return QFileInfo::exists(path) ? QIcon(path) : QIcon();
+}
+
 void CPlugin::UpdateName()
 {
     if (!KsGetEditorString || !KsGetEditorString(&name) || name.isEmpty())

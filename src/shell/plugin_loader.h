@@ -4,6 +4,7 @@
 #include "ks/fc/doc_template.h"
 #include "ks/fc/plugin.h"
 
+#include <QIcon>
 #include <QString>
 #include <memory>
 #include <vector>
@@ -24,6 +25,8 @@ struct CPlugin
     {
         return error.isEmpty();
     }
+    /// The editor's picture; none when it has none.
+    QIcon Icon() const;
     /// Asks the editor for its name again, after the language changed.
     void UpdateName();
 };

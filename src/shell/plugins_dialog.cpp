@@ -5,7 +5,6 @@
 #include <QDialogButtonBox>
 #include <QFileInfo>
 #include <QHeaderView>
-#include <QIcon>
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
@@ -22,8 +21,7 @@ CPluginsDialog::CPluginsDialog(const std::vector<std::unique_ptr<CPlugin>>& plug
                                                 plugin->IsUsable() ? tr("In use") : plugin->error});
         item->setToolTip(1, plugin->file);
         item->setToolTip(2, item->text(2));
-        if (plugin->IsUsable())
-            item->setIcon(0, QIcon(KsBitmapPath(plugin->KsGetBitmapId())));
+        item->setIcon(0, plugin->Icon());
     }
     list->resizeColumnToContents(0);
     list->resizeColumnToContents(1);

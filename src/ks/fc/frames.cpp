@@ -125,8 +125,9 @@ void CKsMDIFrameWnd::DestroyWindows()
 {
     disconnect(m_area, nullptr, this, nullptr);
     disconnect(qApp, nullptr, this, nullptr);
-    const auto windows = m_area->subWindowList();
-    for (QMdiSubWindow* window : windows)
+    // Also those that are closed and wait for their deletion, which the area no longer lists.
+    const auto windows = m_area->findChildren<CKsMDIChildWnd*>();
+    for (CKsMDIChildWnd* window : windows)
         delete window;
     m_activeView = nullptr;
 }

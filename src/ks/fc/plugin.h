@@ -41,7 +41,7 @@ KS_PLUGIN_FUNCTIONS(KS_PLUGIN_DECLARE)
 }
 #undef KS_PLUGIN_DECLARE
 
-/// Where the picture of a number stands among the resources of all editors.
+/// Where the picture of a number stands among the resources of all editors; it may be missing.
 inline CString KsBitmapPath(int id)
 {
     return QStringLiteral(":/bitmaps/%1.svg").arg(id);

@@ -1,0 +1,102 @@
+#include "ks/language/language.h"
+#include "ks/units/edit_style.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QFile>
+#include <QLabel>
+#include <QRegularExpression>
+#include <QSignalSpy>
+#include <QXmlStreamReader>
+#include <gtest/gtest.h>
+
+namespace {
+
+class Language : public testing::Test
+{
+protected:
+    void SetUp() override
+    {
+        KsLanguage::Instance().SetTranslationFolder(QStringLiteral(KVR_BUILD_DIR "/bin/translations"));
+    }
+    void TearDown() override { KsLanguage::Instance().SetCurrent("en_US"); }
+    static QString Tip() { return CKsEditStyle(UnitGroup::WaterLevel).GetEumToolTipText(); }
+};
+
+/// Counts the changes of language that a window hears of.
+struct Listener : QWidget
+{
+    int heard = 0;
+    void changeEvent(QEvent* event) override
+    {
+        heard += event->type() == QEvent::LanguageChange;
+        QWidget::changeEvent(event);
+    }
+};
+
+QStringList Placeholders(const QString& text)
+{
+    QStringList found;
+    static const QRegularExpression expression("%[0-9]|\\(&[A-Z0-9]\\)|&(?=[A-Za-z])");
+    for (auto match = expression.globalMatch(text); match.hasNext();)
+        found << match.next().captured().replace(QRegularExpression("\\(?&.*"), "&");
+    found.sort();
+    return found;
+}
+
+} // namespace
+
+TEST_F(Language, ModulesFollowTheLanguageAndWindowsHearOfIt)
+{
+    Listener window;
+    window.show();
+    KsResourceHandle handle = reinterpret_cast<KsResourceHandle>(1);
+    EXPECT_EQ(KsLangLoadResDll("ks", &handle, 0), nullptr) << "American texts stand in the sources";
+    EXPECT_EQ(handle, nullptr);
+    EXPECT_EQ(Tip(), "Unit: m");
+
+    QSignalSpy changed(&KsLanguage::Instance(), &KsLanguage::Changed);
+    KsLanguage::Instance().SetCurrent("ja");
+    QCoreApplication::processEvents();
+    EXPECT_EQ(Tip(), "単位: m");
+    EXPECT_EQ(QCoreApplication::translate("QPlatformTheme", "Cancel"), "キャンセル") << "Qt's own texts too";
+    EXPECT_EQ(changed.count(), 1);
+    EXPECT_GE(window.heard, 1);
+    EXPECT_TRUE(KsLangLoadResDll("ks", &handle, 0)) << "loading again gives the one that is there";
+    KsLangFreeResDll(handle);
+    EXPECT_EQ(Tip(), "Unit: m") << "a module that is gone translates nothing";
+
+    EXPECT_EQ(KsLangLoadResDll("no_such_module", &handle, 0), nullptr);
+    KsLangFreeResDll(nullptr);
+    KsLanguage::Instance().SetCurrent("xx");
+    EXPECT_EQ(KsLanguage::Instance().Current(), "ja") << "an unknown language changes nothing";
+}
+
+TEST_F(Language, EveryTextIsTranslatedWithItsPlaceholdersAndMnemonics)
+{
+    int texts = 0;
+    for (const char* folder : {"/src/ks/language", "/src/shell/translations"}) {
+        const QDir dir(QStringLiteral(KVR_SOURCE_DIR) + folder);
+        for (const QString& name : dir.entryList({"*.ts"})) {
+            QFile file(dir.filePath(name));
+            ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+            QXmlStreamReader xml(&file);
+            QString source;
+            while (!xml.atEnd()) {
+                xml.readNext();
+                if (xml.name() == u"source" && xml.isStartElement()) {
+                    source = xml.readElementText();
+                } else if (xml.name() == u"translation" && xml.isStartElement()) {
+                    ++texts;
+                    const bool unfinished = xml.attributes().hasAttribute("type");
+                    const QString translation = xml.readElementText();
+                    EXPECT_FALSE(unfinished || translation.isEmpty())
+                        << name.toStdString() << ": " << source.toStdString();
+                    EXPECT_EQ(Placeholders(source), Placeholders(translation)) << source.toStdString();
+                }
+            }
+            EXPECT_FALSE(xml.hasError()) << xml.errorString().toStdString();
+        }
+    }
+    EXPECT_GT(texts, 100);
+}

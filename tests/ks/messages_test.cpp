@@ -1,0 +1,48 @@
+#include "ks_fixture.h"
+
+#include <set>
+
+TEST(Messages, OneNumberForEachNameWhoeverAsks)
+{
+    const std::map<std::string, unsigned> names{
+        {"KavoShellSwitchBoardSevice", KsMessage::SwitchBoard()},
+        {"KavoShellCommunicationBetweenEditors", KsMessage::BetweenEditors()},
+        {"KavoShellProjectManagement", KsMessage::ProjectManagement()},
+        {"KavoShellShowToolbar", KsMessage::ShowToolbar()},
+        {"KavoShellHideToolbar", KsMessage::HideToolbar()},
+        {"KSM_VISUAL_PROJECT_MAP_CHANGED", KsMessage::ProjectMapChanged()},
+    };
+    std::set<unsigned> numbers;
+    for (const auto& [name, number] : names) {
+        EXPECT_EQ(KsRegisterMessage(std::string(name).c_str()), number) << name;
+        numbers.insert(number);
+    }
+    EXPECT_EQ(numbers.size(), names.size());
+    EXPECT_EQ(numbers.count(0), 0u);
+    EXPECT_NE(KsRegisterMessage("kavoshellshowtoolbar"), KsMessage::ShowToolbar()) << "names differ in case";
+}
+
+TEST(Messages, AWindowAnswersSynchronouslyAndTheDefaultIsZero)
+{
+    struct Echo : CKsWindow
+    {
+        LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam) override
+        {
+            return message == KsMessage::SwitchBoard() ? LRESULT(wParam) + lParam
+                                                       : CKsWindow::WindowProc(message, wParam, lParam);
+        }
+    } echo;
+    EXPECT_EQ(KsSendMessage(&echo, KsMessage::SwitchBoard(), 40, -2), 38);
+    EXPECT_EQ(KsSendMessage(&echo, KsMessage::ShowToolbar(), 40, -2), 0);
+    EXPECT_EQ(KsSendMessage(nullptr, KsMessage::SwitchBoard(), 40, -2), 0);
+}
+
+TEST(Messages, AFrameThatGoesIsNoLongerTheMainWindow)
+{
+    {
+        CKsMDIFrameWnd frame;
+        KsSetMainWindow(&frame);
+        EXPECT_EQ(KsMainWindow(), &frame);
+    }
+    EXPECT_EQ(KsMainWindow(), nullptr);
+}

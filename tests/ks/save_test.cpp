@@ -1,0 +1,136 @@
+#include "ks_fixture.h"
+
+#include <QSignalSpy>
+
+using Button = QMessageBox;
+
+TEST_F(KsTest, TheNameWrittenBecomesTheDocumentsName)
+{
+    struct Case
+    {
+        const char* asked;
+        bool namesItself;
+    };
+    for (const auto& [name, namesItself] : {Case{"new.txt", false}, Case{"own.tst", true}, Case{"same.TST", false}}) {
+        TextDoc* document = Open({});
+        document->text = "content";
+        document->namesItself = namesItself;
+        QSignalSpy renamed(document, &CKsDoc::PathNameChanged);
+        EXPECT_TRUE(document->DoSave(Path(name)));
+        EXPECT_TRUE(document->executing);
+        EXPECT_FALSE(document->IsExecuting());
+        const QString written = document->SavePathFor(Path(name));
+        EXPECT_EQ(document->GetPathName(), written);
+        EXPECT_EQ(renamed.count(), 1);
+        EXPECT_EQ(renamed.value(0).value(1).toString(), written);
+        EXPECT_EQ(Read(written), "content");
+        EXPECT_TRUE(document->DoSave(document->GetPathName()));
+        EXPECT_EQ(renamed.count(), 1) << "no news";
+    }
+}
+
+TEST_F(KsTest, AFailedSaveKeepsNameAndFlag)
+{
+    TextDoc* document = Open(Write("a.TST", "old"));
+    document->SetModifiedFlag();
+    document->canSave = false;
+    EXPECT_FALSE(document->DoSave(Path("b.TST")));
+    EXPECT_EQ(document->GetPathName(), Path("a.TST"));
+    EXPECT_TRUE(document->IsModified());
+    EXPECT_FALSE(document->IsExecuting());
+}
+
+TEST_F(KsTest, SaveAsAsksAboutTheFileThatIsReallyWritten)
+{
+    Write("taken.TST", "old");
+    TextDoc* other = Open(Write("other.TST", "other"));
+    TextDoc* document = Open({});
+    document->text = "new";
+    // Another window's file is refused; No asks for a name again; Yes replaces.
+    names << Path("other.tst") << Path("taken.txt") << Path("taken.txt");
+    answers << Button::Ok << Button::No << Button::Yes;
+    EXPECT_TRUE(document->DoSave({}));
+    ASSERT_EQ(asked.size(), 3);
+    EXPECT_TRUE(asked[0].contains("other.TST"));
+    EXPECT_TRUE(asked[1].contains("taken.TST"));
+    EXPECT_EQ(Read(Path("taken.TST")), "new");
+    EXPECT_EQ(Read(other->GetPathName()), "other");
+    EXPECT_TRUE(questions.at(0).save);
+    EXPECT_EQ(questions.at(0).extension, ".tst");
+    EXPECT_EQ(questions.at(2).proposal, Path("taken.txt"));
+
+    names << document->GetPathName();
+    EXPECT_TRUE(document->DoSave({})) << "its own file needs no question";
+    EXPECT_EQ(asked.size(), 3);
+    EXPECT_FALSE(document->DoSave({})) << "cancelled";
+}
+
+TEST_F(KsTest, ClosingTheLastWindowAsks)
+{
+    struct Case
+    {
+        Button::StandardButton answer;
+        bool canSave, closes;
+        const char* content;
+    };
+    const Case cases[] = {{Button::Cancel, true, false, "old"},
+                          {Button::Save, false, false, "old"},
+                          {Button::Save, true, true, "new"},
+                          {Button::Discard, true, true, "old"}};
+    for (const Case& c : cases) {
+        const QString path = Write("a.TST", "old");
+        TextDoc* document = Open(path);
+        document->text = "new";
+        document->canSave = c.canSave;
+        document->SetModifiedFlag();
+        asked.clear();
+        answers = {c.answer};
+        EXPECT_EQ(WindowOf(document)->close(), c.closes);
+        EXPECT_EQ(asked, QStringList("Save the changes to a.TST?"));
+        EXPECT_EQ(Read(path), c.content);
+        if (!c.closes) {
+            answers = {Button::Discard};
+            WindowOf(document)->close();
+        }
+        Settle();
+        EXPECT_TRUE(documents.Documents().empty());
+    }
+}
+
+TEST_F(KsTest, WhatIsBeingTypedCountsWhenAWindowCloses)
+{
+    TextDoc* document = Open(Write("a.TST", "old"));
+    LogView* view = ViewOf(document);
+    view->edit->setFocus();
+    QTest::keyClicks(view->edit, "typed");
+    EXPECT_FALSE(document->IsModified());
+    LogView::log.clear();
+    answers = {Button::Cancel};
+    EXPECT_FALSE(WindowOf(document)->close());
+    EXPECT_EQ(asked.size(), 1) << "the text was taken over before the question";
+    EXPECT_TRUE(LogView::log.contains("a 1")) << "views were asked to store";
+    EXPECT_EQ(QApplication::focusWidget(), view->edit) << "the user goes on where he was";
+
+    answers = {Button::Save};
+    EXPECT_TRUE(WindowOf(document)->close());
+    EXPECT_EQ(Read(Path("a.TST")), "typed");
+}
+
+TEST_F(KsTest, OneRefusalKeepsAllWindows)
+{
+    for (const char* name : {"a.TST", "b.TST", "c.TST"})
+        Open(Write(name, "x"))->SetModifiedFlag();
+    answers = {Button::Discard, Button::Cancel};
+    EXPECT_FALSE(frame.CloseAllWindows());
+    EXPECT_EQ(asked.size(), 2);
+    Settle();
+    EXPECT_EQ(documents.Documents().size(), 3u);
+    EXPECT_TRUE(documents.Documents()[0]->IsModified());
+
+    asked.clear();
+    answers = {Button::Discard, Button::Discard, Button::Discard};
+    EXPECT_TRUE(frame.CloseAllWindows());
+    EXPECT_EQ(asked.size(), 3) << "each once";
+    Settle();
+    EXPECT_TRUE(documents.Documents().empty());
+}

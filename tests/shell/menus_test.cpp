@@ -1,0 +1,127 @@
+#include "ks/fc/frames.h"
+#include "shell_fixture.h"
+
+#include <set>
+
+TEST_F(ShellTest, MnemonicsAreUniqueInEveryMenuAndShortcutsInTheWindow)
+{
+    frame->OpenFile(Write("a.tst"));
+    std::set<QString> keys;
+    QList<QMenu*> menus;
+    for (const QAction* action : frame->menuBar()->actions())
+        menus << action->menu();
+    ASSERT_EQ(menus.size(), 6);
+    EXPECT_EQ(menus.at(2)->title(), "&Lines") << "the third by position";
+    for (QMenu* menu : menus) {
+        std::set<QChar> letters;
+        for (const QAction* action : menu->actions()) {
+            const auto at = action->text().indexOf(u'&');
+            if (at >= 0 && action->text().at(at + 1) != u'&') {
+                EXPECT_TRUE(letters.insert(action->text().at(at + 1).toLower()).second)
+                    << menu->title().toStdString() << ": " << action->text().toStdString();
+            }
+            for (const QKeySequence& key : action->shortcuts())
+                EXPECT_TRUE(keys.insert(key.toString()).second) << key.toString().toStdString();
+        }
+    }
+    for (const char* own : {"Ctrl+S", "Ctrl+O", "Ctrl+Z", "Ctrl+I"})
+        EXPECT_TRUE(keys.count(own)) << own;
+    EXPECT_FALSE(keys.count("Ctrl+C")) << "belongs to what has the focus";
+}
+
+TEST_F(ShellTest, TheLinesMenuBelongsToTheActiveView)
+{
+    QAction* lines = frame->menuBar()->actions().at(2);
+    EXPECT_FALSE(lines->isEnabled());
+    frame->OpenFile(Write("a.tst"));
+    EXPECT_TRUE(lines->isEnabled());
+    emit Menu(2)->aboutToShow();
+    const auto entries = lines->menu()->actions();
+    ASSERT_EQ(entries.size(), 4);
+    EXPECT_TRUE(entries[1]->isSeparator());
+    EXPECT_TRUE(entries[0]->isEnabled());
+    EXPECT_FALSE(entries[3]->isEnabled()) << "the view cannot do it now";
+    emit Menu(2)->aboutToHide();
+    QTest::keyClick(frame.get(), Qt::Key_I, Qt::ControlModifier);
+    EXPECT_EQ(frame->ActiveDocument()->UndoStack().count(), 1);
+    Action("actionClose")->trigger();
+    EXPECT_FALSE(lines->isEnabled());
+}
+
+TEST_F(ShellTest, UndoAndRedoAreThoseOfTheActiveDocument)
+{
+    frame->OpenFile(Write("a.tst"));
+    frame->SendCommand(1);
+    EXPECT_EQ(Action("actionUndo")->text(), "&Undo insert line");
+    frame->OpenFile(Write("b.tst"));
+    EXPECT_FALSE(Action("actionUndo")->isEnabled());
+    EXPECT_EQ(Action("actionUndo")->text(), "&Undo");
+    Activate("a.tst");
+    Action("actionUndo")->trigger();
+    EXPECT_EQ(frame->ActiveDocument()->UndoStack().index(), 0);
+    EXPECT_EQ(Action("actionRedo")->text(), "&Redo insert line");
+    Action("actionRedo")->trigger();
+    EXPECT_EQ(frame->ActiveDocument()->UndoStack().index(), 1);
+}
+
+TEST_F(ShellTest, CutCopyAndPasteActOnTheFieldWithTheFocus)
+{
+    frame->OpenFile(Write("a.tst"));
+    auto* edit = ViewOf("a.tst")->findChild<QLineEdit*>();
+    edit->setFocus();
+    edit->deselect();
+    emit Menu(1)->aboutToShow();
+    EXPECT_FALSE(Action("actionCut")->isEnabled());
+    EXPECT_TRUE(Action("actionPaste")->isEnabled());
+    edit->selectAll();
+    emit Menu(1)->aboutToShow();
+    EXPECT_TRUE(Action("actionCut")->isEnabled());
+    Action("actionCut")->trigger();
+    EXPECT_EQ(edit->text(), "");
+    Action("actionPaste")->trigger();
+    Action("actionPaste")->trigger();
+    EXPECT_EQ(edit->text(), "texttext");
+}
+
+TEST_F(ShellTest, TheWindowMenuListsTheWindows)
+{
+    frame->OpenFile(Write("a&b.tst"));
+    frame->OpenFile(Write("c.tst"));
+    for (int i = 0; i < 2; ++i) { // filling twice adds nothing
+        emit Menu(4)->aboutToShow();
+    }
+    const auto entries = Menu(4)->actions();
+    ASSERT_EQ(entries.last()->text(), "c.tst");
+    EXPECT_TRUE(entries.last()->isChecked());
+    QAction* first = entries.at(entries.size() - 2);
+    EXPECT_EQ(first->text(), "a&&b.tst");
+    first->trigger();
+    EXPECT_EQ(frame->ActiveDocument()->GetTitle(), "a&b.tst");
+    Action("actionTabs")->trigger();
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::SubWindowView);
+    Action("actionCloseAll")->trigger();
+    Settle();
+    EXPECT_TRUE(Texts().Documents().empty());
+}
+
+TEST_F(ShellTest, AnEditorsToolBarShowsWithItsView)
+{
+    auto* bar = frame->findChild<CKsToolBarEx*>();
+    ASSERT_TRUE(bar);
+    EXPECT_EQ(bar->windowTitle(), "Test Tools");
+    EXPECT_FALSE(bar->isVisible());
+    frame->OpenFile(Write("a.tst"));
+    EXPECT_TRUE(bar->isVisible());
+
+    std::unique_ptr<QMenu> bars(frame->createPopupMenu());
+    QAction* toggle = bars->actions().last();
+    EXPECT_EQ(toggle->text(), "Test Tools");
+    toggle->trigger();
+    EXPECT_FALSE(bar->isVisible());
+    frame->OpenFile(Write("b.tst"));
+    EXPECT_FALSE(bar->isVisible()) << "the user has switched it off";
+    bars.reset();
+    Start();
+    frame->OpenFile(Path("a.tst"));
+    EXPECT_FALSE(frame->findChild<CKsToolBarEx*>()->isVisible()) << "for good";
+}

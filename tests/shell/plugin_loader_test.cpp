@@ -1,0 +1,67 @@
+#include "shell/plugins_dialog.h"
+#include "shell_fixture.h"
+
+#include <QLabel>
+#include <QLibrary>
+#include <QTimer>
+#include <QTreeWidget>
+
+namespace {
+
+const CPlugin* Named(const std::vector<std::unique_ptr<CPlugin>>& plugins, const QString& file)
+{
+    for (const auto& plugin : plugins) {
+        if (QFileInfo(plugin->file).baseName() == file)
+            return plugin.get();
+    }
+    return nullptr;
+}
+
+} // namespace
+
+TEST_F(ShellTest, WhatIsNoEditorIsNamedAndTheOthersWork)
+{
+    const CPlugin* good = Named(frame->Plugins(), "test_editor");
+    const CPlugin* broken = Named(frame->Plugins(), "broken_editor");
+    ASSERT_TRUE(good && broken);
+    EXPECT_TRUE(good->IsUsable());
+    EXPECT_EQ(good->name, "Test Editor");
+    for (const char* missing : {"KsGetEditorString", "KsCreateToolbar"})
+        EXPECT_TRUE(broken->error.contains(missing)) << broken->error.toStdString();
+    EXPECT_FALSE(broken->error.contains("KsGetNumDocTemplates")) << "it has that one";
+    EXPECT_TRUE(broken->templates.empty());
+
+    EXPECT_TRUE(asked.isEmpty()) << "nobody is stopped";
+    const auto* label = frame->findChild<QLabel*>("pluginLabel");
+    EXPECT_TRUE(label->isVisible());
+    EXPECT_TRUE(label->text().contains("broken_editor"));
+    CPluginsDialog dialog(frame->Plugins());
+    const auto rows = dialog.findChild<QTreeWidget*>()->findItems("", Qt::MatchContains, 2);
+    EXPECT_EQ(rows.size(), 2);
+    EXPECT_TRUE(frame->OpenFile(Write("a.tst")));
+}
+
+TEST_F(ShellTest, AFolderMayHoldAnything)
+{
+    Write("readme.txt", "no library by its name");
+    Write("text.so", "no library by its content");
+    Write("text.dll", "no library by its content");
+    Write("text.dylib", "no library by its content");
+    QFile::copy(TEST_EDITORS "/test_editor.so", Path("zz_editor.so"));
+    const auto plugins = LoadPlugins(folder.path());
+    ASSERT_GE(plugins.size(), 2u);
+    EXPECT_FALSE(Named(plugins, "text")->IsUsable());
+    EXPECT_FALSE(Named(plugins, "text")->error.isEmpty());
+    EXPECT_TRUE(Named(plugins, "zz_editor")->IsUsable()) << "the one before it did no harm";
+    EXPECT_FALSE(Named(plugins, "readme"));
+    EXPECT_TRUE(LoadPlugins(Path("nowhere")).empty());
+}
+
+TEST_F(ShellTest, AShellWithoutEditorsSaysSo)
+{
+    CMainFrame empty;
+    empty.LoadPlugins(Path("nowhere"));
+    EXPECT_FALSE(empty.findChild<QAction*>("actionNew")->isEnabled());
+    EXPECT_FALSE(empty.OpenFile(Write("a.tst")));
+    EXPECT_TRUE(asked.takeLast().contains("a.tst"));
+}

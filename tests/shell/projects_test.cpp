@@ -1,0 +1,126 @@
+#include "shell_fixture.h"
+
+#include <QLabel>
+
+using testing::ElementsAre;
+
+TEST_F(ShellTest, ProjectsDoNotMix)
+{
+    for (const char* name : {"one/a.tst", "one/b.tst", "two/c.tst", "two/d.tst", "alone.tst"})
+        Write(name);
+    EXPECT_TRUE(frame->OpenFile(WriteProject("one/one.kvrp", "File = <a.tst>\nFile = \"b.tst\"\n")));
+    EXPECT_TRUE(frame->OpenFile(WriteProject("two.kvrp", "File = <two/c.tst>\nFile = <two\\\\d.tst>\n")));
+    EXPECT_TRUE(frame->OpenFile(Path("alone.tst")));
+    const auto one = ProjectOf("one/a.tst"), two = ProjectOf("two/c.tst");
+    EXPECT_NE(one, 0);
+    EXPECT_NE(two, 0);
+    EXPECT_NE(one, two);
+    EXPECT_EQ(ProjectOf("one/b.tst"), one);
+    EXPECT_EQ(ProjectOf("two/d.tst"), two);
+    EXPECT_EQ(ProjectOf("alone.tst"), 0);
+
+    const char* all[] = {"one/a.tst", "one/b.tst", "two/c.tst", "two/d.tst", "alone.tst"};
+    for (const char* name : all)
+        TakeLog(ViewOf(name));
+    Activate("one/a.tst");
+    frame->SendCommand(2); // tells the project
+    EXPECT_THAT(TakeLog(ViewOf("one/b.tst")), ElementsAre(QString("between 522 %1").arg(one)));
+    for (const char* name : {"one/a.tst", "two/c.tst", "two/d.tst", "alone.tst"})
+        EXPECT_THAT(TakeLog(ViewOf(name)), ElementsAre()) << name;
+    EXPECT_TRUE(asked.isEmpty());
+}
+
+TEST_F(ShellTest, AClosedViewLeavesAndTheOthersHearOfIt)
+{
+    Write("a.tst");
+    Write("b.tst");
+    frame->OpenFile(WriteProject("p.kvrp", "File = <a.tst>\nFile = <b.tst>\n"));
+    const auto handle = ProjectOf("a.tst");
+    TakeLog(ViewOf("a.tst"));
+    Activate("b.tst");
+    Action("actionClose")->trigger();
+    Settle();
+    EXPECT_EQ(frame->Projects().Find(handle)->views.size(), 1u);
+    EXPECT_THAT(TakeLog(ViewOf("a.tst")), ElementsAre(QString("between 522 %1").arg(handle)));
+    frame->OpenFile(Path("b.tst"));
+    EXPECT_EQ(ProjectOf("b.tst"), handle) << "it joins again";
+}
+
+TEST_F(ShellTest, AFileOpenBeforeItsProjectJoinsWhenTheProjectOpens)
+{
+    frame->OpenFile(Write("a.tst"));
+    EXPECT_EQ(ProjectOf("a.tst"), 0);
+    frame->ActiveDocument()->SetModifiedFlag();
+    answers << QMessageBox::Cancel;
+    const QString path = WriteProject("p.kvrp", "File = <a.tst>\n");
+    frame->OpenFile(path);
+    EXPECT_EQ(asked.size(), 2) << "the question, and that the file stays outside";
+    EXPECT_EQ(ProjectOf("a.tst"), 0);
+
+    answers << QMessageBox::Save;
+    frame->OpenFile(path);
+    Settle();
+    EXPECT_NE(ProjectOf("a.tst"), 0);
+    EXPECT_EQ(Texts().Documents().size(), 1u);
+}
+
+TEST_F(ShellTest, ClosingAProjectClosesItsWindowsOnly)
+{
+    Write("a.tst");
+    Write("b.tst");
+    frame->OpenFile(Write("alone.tst"));
+    frame->OpenFile(WriteProject("p.kvrp", "File = <a.tst>\nFile = <b.tst>\n"));
+    const auto handle = ProjectOf("a.tst");
+    EXPECT_THAT(TakeLog(ViewOf("alone.tst")), ElementsAre(QString("project 1 %1").arg(handle)));
+    ViewOf("b.tst")->GetDocument()->SetModifiedFlag();
+    answers << QMessageBox::Cancel;
+    EXPECT_FALSE(frame->CloseProject(handle));
+    EXPECT_TRUE(frame->Projects().Find(handle));
+    answers << QMessageBox::Discard;
+    EXPECT_TRUE(frame->CloseProject(handle));
+    Settle();
+    EXPECT_EQ(Texts().Documents().size(), 1u);
+    EXPECT_THAT(TakeLog(ViewOf("alone.tst")), ElementsAre(QString("project 3 %1").arg(handle)));
+    EXPECT_FALSE(frame->CloseProject(handle)) << "a handle is used once";
+    EXPECT_FALSE(Action("actionCloseProject")->isEnabled());
+}
+
+TEST_F(ShellTest, WhatIsWrongWithAProjectIsSaid)
+{
+    struct Case
+    {
+        QString path;
+        const char* says;
+    };
+    const Case refused[] = {
+        {Path("missing.kvrp"), "missing.kvrp"},
+        {Write("syntax.kvrp", "[KVR_PROJECT]\n[Members]\n"), "syntax.kvrp, line"},
+        {Write("other.kvrp", "[KAVO0_HD]\n[/KAVO0_HD]\n"), "KVR_PROJECT"},
+        {Write("empty.kvrp", "[KVR_PROJECT]\n[/KVR_PROJECT]\n"), "Members"},
+        {WriteProject("number.kvrp", "File = <a.tst>\nFile = 7\n"), "line 4"},
+    };
+    for (const Case& c : refused) {
+        EXPECT_FALSE(frame->OpenFile(c.path));
+        EXPECT_TRUE(asked.takeLast().contains(c.says)) << c.says;
+    }
+    EXPECT_TRUE(frame->Projects().All().empty());
+
+    Write("there.tst");
+    EXPECT_TRUE(
+        frame->OpenFile(WriteProject("p.kvrp", "File = <gone.tst>\nFile = <there.tst>\nFile = <p.kvrp.png>\n")));
+    EXPECT_TRUE(asked.at(0).contains("gone.tst"));
+    EXPECT_FALSE(asked.at(0).contains("there.tst"));
+    EXPECT_NE(ProjectOf("there.tst"), 0) << "the rest opens";
+}
+
+TEST_F(ShellTest, TheSwitchboardAnswersNothingElse)
+{
+    CKSComm_Package package;
+    for (const WPARAM request : {0, 24, 25, 40, 200}) {
+        package.text = request == 25 ? Path("nowhere.tst") : QString();
+        EXPECT_EQ(frame->WindowProc(KsMessage::SwitchBoard(), request, reinterpret_cast<LPARAM>(&package)), 0);
+        EXPECT_EQ(frame->WindowProc(KsMessage::SwitchBoard(), request, 0), 0) << "without a package";
+    }
+    package.project = 99;
+    EXPECT_EQ(frame->WindowProc(KsMessage::BetweenEditors(), 522, reinterpret_cast<LPARAM>(&package)), 0);
+}

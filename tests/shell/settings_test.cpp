@@ -1,0 +1,41 @@
+#include "ks/language/language.h"
+#include "ks/units/edit_style.h"
+#include "shell/settings_keys.h"
+#include "shell_fixture.h"
+
+TEST_F(ShellTest, UnitsLanguageAndWindowComeBack)
+{
+    Action("actionUsCustomary")->trigger();
+    Action("actionLanguage_en_GB")->trigger();
+    Action("actionTabs")->trigger();
+    frame->resize(640, 480);
+    const QSize size = frame->size();
+    EXPECT_TRUE(frame->close());
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    EXPECT_EQ(QSettings().value(Settings::Language), "en_GB");
+
+    Start();
+    EXPECT_EQ(KsUnits::Instance().System(), KsUnitSystem::UsCustomary);
+    EXPECT_TRUE(Action("actionUsCustomary")->isChecked());
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::SubWindowView);
+    EXPECT_EQ(frame->size(), size);
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    KsLanguage::Instance().SetCurrent("en_US");
+}
+
+TEST_F(ShellTest, MenusFollowTheLanguageAtOnce)
+{
+    KsLanguage::Instance().SetTranslationFolder(QStringLiteral(KVR_BUILD_DIR "/bin/translations"));
+    KsLangLoadResDll("kvrshell", nullptr, 0);
+    frame->OpenFile(Write("a.tst"));
+    Action("actionLanguage_ja")->trigger();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(Menu(0)->title(), "ファイル(&F)");
+    EXPECT_EQ(Action("actionSave")->text(), "上書き保存(&S)");
+    EXPECT_EQ(Menu(2)->title(), "行(&L)");
+    EXPECT_FALSE(Menu(2)->isEmpty()) << "still the view's";
+    EXPECT_TRUE(frame->findChild<CKsToolBarEx*>()->isVisible()) << "made anew, shown as before";
+    Action("actionLanguage_en_US")->trigger();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(Action("actionSave")->text(), "&Save");
+}
