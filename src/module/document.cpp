@@ -119,10 +119,11 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
 bool CKavo0_hdDoc::MayReplace(const CString& target, const CString& path)
 {
     // Only a plain save whose name changes case can meet a file nobody was asked about: Save As has asked already.
-    if (path != GetPathName() || path == target || !QFileInfo::exists(target) || SameFile(path.toStdString(), target.toStdString()))
+    if (path != GetPathName() || path == target || !QFileInfo::exists(target) ||
+        SameFile(path.toStdString(), target.toStdString()))
         return true;
-    const CString question = LoadString(Str::ReplaceOtherSpelling)
-                                 .arg(QFileInfo(target).fileName(), QFileInfo(path).fileName());
+    const CString question =
+        LoadString(Str::ReplaceOtherSpelling).arg(QFileInfo(target).fileName(), QFileInfo(path).fileName());
     return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
@@ -164,13 +165,15 @@ void CKavo0_hdDoc::AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> r
 
 void CKavo0_hdDoc::RemovePlaceholders()
 {
-    for (const ListEntry& entry : HDLists()) {
-        if (!entry.purgedAtSave)
-            continue;
-        CGenList& list = *entry.list(m_parameters);
+    const auto removeFrom = [this](CGenList& list) {
         if (list.GetCount() == 1 && list.GetAt(0).IsBlank() && m_placeholders.erase(&list.GetAt(0)))
             list.RemoveAt(0);
-    }
+    };
+    for (const ListEntry& entry : HDLists())
+        if (entry.purgedAtSave)
+            removeFrom(*entry.list(m_parameters));
+    for (std::size_t setup = 0; setup < m_parameters.EncroachList.GetCount(); ++setup)
+        removeFrom(m_parameters.EncroachList.GetAt(setup));
 }
 
 void CKavo0_hdDoc::DeleteContents()
@@ -196,6 +199,11 @@ BOOL CKavo0_hdDoc::GetProjectInfo(CView* view, const CString& name)
     m_hProject = 0;
     m_hProject = SendToShell(KsMessage::SwitchBoard(), KsRequest::JoinProject, view, name);
     return m_hProject != 0;
+}
+
+LRESULT CKavo0_hdDoc::AskShell(WPARAM request, CView* view)
+{
+    return m_hProject ? SendToShell(KsMessage::SwitchBoard(), request, view, GetPathName()) : 0;
 }
 
 void CKavo0_hdDoc::LeaveProject(CView* view, const CString& name)

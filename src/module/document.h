@@ -34,11 +34,14 @@ public:
     /// Marks the document modified, updates all views but the sender, and gives the sender the focus back.
     void UpdateAll(CView* sender, int hint, CHint* object);
 
-    /// Gives an empty list the one line that its page shows. The line is no change of the document: neither the modified
-    /// flag nor undo sees it, and a save removes it again while it is untouched.
+    /// Gives an empty list the one line that its page shows. The line is no change of the document: neither the
+    /// modified flag nor undo sees it, and a save removes it again while it is untouched.
     void AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record);
     /// Whatever edits or removes a record says so: a placeholder becomes an ordinary line.
     void PlaceholderTouched(const HD_RiverPos& record) { m_placeholders.erase(&record); }
+
+    /// Sends a request to the shell's switchboard; its answer, 0 outside a project.
+    LRESULT AskShell(WPARAM request, CView* view);
 
     std::intptr_t ProjectHandle() const { return m_hProject; }
     const CString& FilePath() const { return m_strFilePath; }
@@ -59,9 +62,9 @@ private:
     LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name);
 
     HD_Parameters m_parameters;
-    CString m_strFilePath;      // of the file last opened
+    CString m_strFilePath; // of the file last opened
     std::intptr_t m_hProject = 0;
-    bool m_unreadable = false;  // the file at m_strFilePath could not be parsed
+    bool m_unreadable = false; // the file at m_strFilePath could not be parsed
     std::unordered_set<const HD_RiverPos*> m_placeholders;
 };
 

@@ -4,6 +4,7 @@
 #include "data/hd_file.h"
 #include "ks/units/edit_fields.h"
 #include "module/page_table.h"
+#include "pages/framework/ctrl_edit.h"
 
 #include <QAbstractButton>
 #include <QFile>

@@ -64,6 +64,7 @@ void CBindings::Add(CKsEditLong* field, std::int32_t& value)
         if (!field->isModified()) // a text that has not been taken yet stays
             field->SetValue(value);
     });
+    field->setAlignment(Qt::AlignRight); // as the other numbers
     field->installEventFilter(this);
     const auto take = [this, field, &value](std::optional<std::int32_t> typed) {
         if (!typed)
@@ -99,6 +100,7 @@ void CBindings::Add(QCheckBox* box, std::int32_t& flag)
 void CBindings::Add(QComboBox* box, std::int32_t& index)
 {
     const int entries = box->count();
+    box->installEventFilter(this);
     m_show.push_back([box, entries, &index] {
         while (box->count() > entries)
             box->removeItem(entries);
@@ -134,11 +136,12 @@ void CBindings::AddUnbound(QComboBox* box)
 
 bool CBindings::eventFilter(QObject* object, QEvent* event)
 {
-    // With nothing typed an integer field leaves undo and redo to the document.
+    // A list, and an integer field with nothing typed, leave undo and redo to the document.
     if (event->type() == QEvent::ShortcutOverride || event->type() == QEvent::KeyPress) {
         const auto* key = static_cast<QKeyEvent*>(event);
         const bool undoRedo = key->matches(QKeySequence::Undo) || key->matches(QKeySequence::Redo);
-        if (undoRedo && !static_cast<CKsEditLong*>(object)->isModified()) {
+        const auto* field = qobject_cast<CKsEditLong*>(object);
+        if (undoRedo && !(field && field->isModified())) {
             event->ignore();
             return true;
         }

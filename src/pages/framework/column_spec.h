@@ -55,8 +55,8 @@ const GridControl& FindControl(int id);
 /// What the cells of a drop-down column can be. A stored index without entry is kept, and shown as its number.
 struct Choices
 {
-    std::function<QStringList()> entries; // in the user's language
-    std::int32_t first = 0;               // stored for the first entry; the others follow
+    std::function<QStringList()> entries = {}; // in the user's language
+    std::int32_t first = 0;                    // stored for the first entry; the others follow
     std::optional<std::int32_t> inNewLines = {};
     std::int32_t whenEmptied = 0;
 

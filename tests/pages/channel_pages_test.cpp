@@ -1,0 +1,283 @@
+// The pages of bed resistance, wave approximation, the quasi-steady solver and mixing.
+#include "flow_page_fixture.h"
+
+#include "ks/fc/messages.h"
+#include "ks/fc/package.h"
+#include "pages/bed_page.h"
+#include "pages/bed_toolbox_page.h"
+#include "pages/encroach_page.h"
+#include "pages/load_option_dlg.h"
+#include "pages/mixing_coef_page.h"
+#include "pages/quasi_page.h"
+#include "pages/wave_page.h"
+
+#include <QClipboard>
+#include <QRadioButton>
+
+class ChannelPagesTest : public FlowPagesTest
+{
+protected:
+    template <typename Record>
+    Record& AddTo(CGenParamList<Record>& list, const char* name, double chainage)
+    {
+        Record& record = list.Add();
+        record.RiverName = name;
+        record.Chainage = chainage;
+        return record;
+    }
+    bool PasteAt(int row, int column, const char* text)
+    {
+        QGuiApplication::clipboard()->setText(text);
+        grid->SetCurrentCell(row, column);
+        return grid->Paste();
+    }
+};
+
+TEST_F(ChannelPagesTest, ControlsChangeTheirKeywords)
+{
+    globals.G_wave = 3;
+    Open<CWavePage>();
+    EachChangesItsKeyword({{1010, "up", "G_wave = 2"}});
+    globals.resist_num = 2;
+    Open<CBedPage>();
+    EachChangesItsKeyword({{1300, "up", "resist_num = 1"}, {1303, "32.5", "G_resistance = 32.5"}});
+    globals.ResisZone = 1;
+    Open<CBedPage>();
+    EachChangesItsKeyword({{1304, "35", "ResisZone = 1, 35, 25, 20"},
+                           {1305, "0.03", "ResisZone = 1, 35, 0.03, 20"},
+                           {1306, "15", "ResisZone = 1, 35, 0.03, 15"}});
+    globals.BedResist.Method = 2;
+    Open<CBedToolboxPage>();
+    EachChangesItsKeyword({{1310, "up", "BRTools = 1, false, false, false, 0, 0, 0, 0, 0"},
+                           {1311, " ", "BRTools = 1, true, false, false, 0, 0, 0, 0, 0"},
+                           {1312, " ", "BRTools = 1, true, true, false, 0, 0, 0, 0, 0"},
+                           {1313, " ", "BRTools = 1, true, true, true, 0, 0, 0, 0, 0"},
+                           {1314, "1.5", "BRTools = 1, true, true, true, 0, 1.5, 0, 0, 0"},
+                           {1315, "-2", "BRTools = 1, true, true, true, 0, 1.5, -2, 0, 0"},
+                           {1316, "3", "BRTools = 1, true, true, true, 0, 1.5, -2, 3, 0"},
+                           {1317, "44", "BRTools = 1, true, true, true, 0, 1.5, -2, 3, 44"}});
+    Open<CMixingCoefPage>();
+    EachChangesItsKeyword({{1330, "0.5", "MixingCoef = 0, 0.5, 0.04, 0.1, 0.03"},
+                           {1331, "0.25", "MixingCoef = 0, 0.5, 0.25, 0.1, 0.03"},
+                           {1332, "0.125", "MixingCoef = 0, 0.5, 0.25, 0.125, 0.03"},
+                           {1333, "2", "MixingCoef = 0, 0.5, 0.25, 0.125, 2"}});
+    globals.FrictionSlope = 3;
+    Open<CQuasiPage>();
+    EachChangesItsKeyword({{1024, "0.75", "relax = 0.75"},
+                           {1028, "1e-09", "beta_limit = 1e-09"},
+                           {1030, "3", "fac_0 = 3"},
+                           {1032, "0.5", "qconv_factor = 0.5"},
+                           {1034, "0.25", "hconv_factor = 0.25"},
+                           {1036, "0.125", "min_hconv = 0.125"},
+                           {1038, "2", "qstruc_factor = 2"},
+                           {1041, "0.5", "hstop = 0.5"},
+                           {1187, " ", "EnergyEquation = true, 3"},
+                           {1188, " ", "ContractExpansion = true"},
+                           {1189, " ", "SlopeUpstream = true"},
+                           {1190, " ", "VelocityCoefficient = true"},
+                           {1191, " ", "NoConvectiveSuppression = true"},
+                           {1194, "up", "EnergyEquation = true, 2"},
+                           {1042, "0.25", "G_ContractExpansion = 0.25, 0.3"},
+                           {1043, "0.5", "G_ContractExpansion = 0.25, 0.5"}});
+    Open<CEncroachPage>();
+    EachChangesItsKeyword({{1340, "7", "Max_no_iter = 7"}});
+}
+
+TEST_F(ChannelPagesTest, Columns)
+{
+    const auto show = [this] { return Headers().join('|') + " / " + Texts(1); };
+    Open<CWavePage>();
+    EXPECT_EQ(show(), "River Name|UpStr. Chainage|DnStr. Chainage|Approx. / |||Fully Dynamic");
+    Open<CBedPage>();
+    EXPECT_EQ(show(), "River Name|Chainage|Resistance|Zone 1|Zone 2|Zone 3 / ||30.000|30.000|25.000|20.000");
+    globals.G_Expansion = 0.5;
+    globals.EnergyEquation = true;
+    Open<CQuasiPage>();
+    EXPECT_EQ(show(), "River Name|Chainage|Contraction|Expansion / ||0.100|0.500");
+    Open<CMixingCoefPage>();
+    EXPECT_EQ(show(), "River Name|Chainage|f1|f2|f3|f4 / ||0.170|0.040|0.100|0.030");
+    globals.BedResist.MaxRes = 42;
+    Open<CBedToolboxPage>();
+    EXPECT_EQ(show(), "River Name|Chainage|Coef. a|Coef. b|Minimum|Maximum / ||0.000|0.000|0.000|42.000");
+    EXPECT_FALSE(document.IsModified()) << "a line that stands for an empty table is no change";
+}
+
+TEST_F(ChannelPagesTest, ApproximationsAreChosenFromAList)
+{
+    auto& list = document.Parameters().WaveList;
+    AddTo(list, "A", 100).WaveApproximation = 9;
+    AddTo(list, "B", 200).DownstreamChainage = 300;
+    Open<CWavePage>();
+    EXPECT_EQ(Texts(1), "A|100|0|9") << "an index without entry shows as its number";
+    EXPECT_EQ(Texts(2), "B|200|300|High Order Fully Dynamic");
+    grid->setFocus();
+    grid->SetCurrentCell(1, 4);
+    QTest::keyClick(grid, Qt::Key_F2);
+    QTest::keyClick(Editor(), Qt::Key_Return);
+    EXPECT_EQ(list.GetAt(0).WaveApproximation, 9) << "looking changes nothing";
+    EXPECT_FALSE(document.IsModified());
+
+    Enter(1, 4, "Di"); // first letters
+    EXPECT_EQ(list.GetAt(0).WaveApproximation, 2);
+    Enter(2, 4, ""); // emptied
+    EXPECT_EQ(list.GetAt(1).WaveApproximation, 3);
+    EXPECT_EQ(grid->TextAt(2, 4), "Kinematic Wave");
+    Enter(2, 3, "");
+    EXPECT_EQ(list.GetAt(1).DownstreamChainage, NotGiven);
+    EXPECT_EQ(Texts(2), "B|200||Kinematic Wave");
+    while (document.UndoStack().canUndo())
+        document.UndoStack().undo();
+    EXPECT_EQ(list.GetAt(0).WaveApproximation, 9);
+
+    // The texts of spreadsheets: entries, whatever their case, and the numbers of entries.
+    EXPECT_TRUE(PasteAt(1, 4, "fully dynamic\n0"));
+    EXPECT_EQ(list.GetAt(0).WaveApproximation, 1);
+    EXPECT_EQ(list.GetAt(1).WaveApproximation, 0);
+    const auto before = Lines();
+    for (const char* unknown : {"Dynamic", "4", "-1", "1.0"}) {
+        boxes.clear();
+        EXPECT_FALSE(PasteAt(1, 4, unknown)) << unknown;
+        ASSERT_EQ(boxes.size(), 1);
+        EXPECT_TRUE(boxes[0].contains("Diffusive Wave") && boxes[0].contains(unknown)) << boxes[0].toStdString();
+    }
+    EXPECT_EQ(Lines(), before);
+
+    // A new line: the reach has no end yet.
+    view->page->AppendLine();
+    EXPECT_EQ(list.GetAt(2).DownstreamChainage, NotGiven);
+    EXPECT_EQ(list.GetAt(2).WaveApproximation, 1);
+}
+
+TEST_F(ChannelPagesTest, ResistanceApproachAndFormula)
+{
+    AddTo(document.Parameters().BedList, "A", 1).Resistance = 33;
+    globals.ResisZone = 7;
+    globals.resist_num = 5;
+    Open<CBedPage>();
+    auto* formula = Find<QComboBox>(1300);
+    auto *uniform = Find<QRadioButton>(1301), *zones = Find<QRadioButton>(1302);
+    EXPECT_EQ(formula->currentText(), "5") << "kept, though nobody knows it";
+    EXPECT_FALSE(uniform->isChecked() || zones->isChecked());
+    const auto unit = [&](int number) {
+        return view->page->findChild<QLabel*>(QString("unit_%1").arg(number))->text();
+    };
+    const auto tip = [&](int column) {
+        return grid->model()->headerData(column - 1, Qt::Horizontal, Qt::ToolTipRole).toString();
+    };
+    const char* units[] = {"m^(1/3)/s", "s/m^(1/3)", "m^(1/2)/s", ""};
+    for (int index : {3, 2, 1, 0}) {
+        if (index < 3) {
+            formula->setFocus();
+            QTest::keyClick(formula, Qt::Key_Up);
+            EXPECT_EQ(globals.resist_num, index);
+        }
+        for (int number : {1303, 1304, 1305, 1306})
+            EXPECT_EQ(unit(number), units[index]);
+        for (int column : {3, 4, 5, 6})
+            EXPECT_EQ(tip(column), *units[index] ? QString("Unit: %1").arg(units[index]) : QString());
+        EXPECT_EQ(Find<QLineEdit>(1303)->toolTip(), tip(3));
+    }
+    EXPECT_EQ(globals.G_resistance, 30) << "no value is converted";
+    EXPECT_EQ(Texts(1), "A|1|33.000|30.000|25.000|20.000");
+
+    // What the approach does not use is locked, and kept.
+    const auto expectZones = [&](bool inUse) {
+        EXPECT_EQ(Find(1303)->isEnabled(), !inUse);
+        for (int number : {1304, 1305, 1306})
+            EXPECT_EQ(Find(number)->isEnabled(), inUse);
+        for (int column = 3; column <= 6; ++column) {
+            const QModelIndex cell = grid->model()->index(0, column - 1);
+            const bool locked = (column > 3) != inUse;
+            EXPECT_EQ(bool(cell.flags() & Qt::ItemIsEditable), !locked) << column;
+            EXPECT_EQ(cell.data(Qt::BackgroundRole).value<QBrush>() == QApplication::palette().brush(QPalette::Button),
+                      locked);
+        }
+    };
+    uniform->click();
+    EXPECT_EQ(globals.ResisZone, 0);
+    expectZones(false);
+    zones->click();
+    EXPECT_EQ(globals.ResisZone, 1);
+    expectZones(true);
+    EXPECT_FALSE(PasteAt(1, 3, "31"));
+    EXPECT_TRUE(boxes.value(0).contains("The cell is locked."));
+    EXPECT_TRUE(PasteAt(1, 4, "31\t26\t21"));
+    EXPECT_EQ(Texts(1), "A|1|33.000|31.000|26.000|21.000");
+}
+
+TEST_F(ChannelPagesTest, EnergyEquationEnablesItsOptions)
+{
+    AddTo(document.Parameters().QSSContractionExpansionList, "A", 1);
+    globals.FrictionSlope = 3;
+    Open<CQuasiPage>();
+    const auto expectUsed = [&](bool used) {
+        for (int number : {1188, 1189, 1190, 1191, 1194, 1042, 1043, 1104})
+            EXPECT_EQ(Find(number)->isEnabled(), used) << number;
+        for (const char* label : {"frictionSlopeLabel_1193", "contractionLabel_1198", "expansionLabel_1199"})
+            EXPECT_EQ(view->page->findChild<QLabel*>(label)->isEnabled(), used) << label;
+        EXPECT_EQ(grid->isVisible(), used);
+        for (int number : {1024, 1028, 1030, 1032, 1034, 1036, 1038, 1041, 1187})
+            EXPECT_TRUE(Find(number)->isEnabled()) << number;
+    };
+    expectUsed(false);
+    EXPECT_EQ(Find<QComboBox>(1194)->currentText(), "Geometric mean");
+    const auto* relax = Find(1024);
+    const QPoint before = relax->mapTo(view.get(), QPoint());
+    Find<QAbstractButton>(1187)->click();
+    expectUsed(true);
+    EXPECT_EQ(relax->mapTo(view.get(), QPoint()), before) << "the page does not jump";
+    Find<QAbstractButton>(1187)->click();
+    expectUsed(false);
+    EXPECT_EQ(document.Parameters().QSSContractionExpansionList.GetCount(), 1u);
+}
+
+namespace {
+
+/// A shell with one project and no editor but this one.
+struct ProjectShell : CKsWindow
+{
+    ProjectShell() { KsSetMainWindow(this); }
+    ~ProjectShell() override { KsSetMainWindow(nullptr); }
+    LRESULT WindowProc(unsigned, WPARAM request, LPARAM) override
+    {
+        requests << int(request);
+        return request == KsRequest::JoinProject;
+    }
+    QList<int> requests;
+};
+
+} // namespace
+
+TEST_F(ChannelPagesTest, LoadingLocationsSaysWhyItCannot)
+{
+    globals.EnergyEquation = true;
+    Open<CQuasiPage>();
+    Find<QAbstractButton>(1104)->click();
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(boxes[0].contains("belongs to no project"));
+
+    ProjectShell shell;
+    document.GetProjectInfo(view.get(), "x");
+    const struct
+    {
+        const char* button; // null cancels
+        int request;
+    } cases[] = {{"branch_1105", 40}, {"radius_1106", 49}, {"width_1107", 49}, {nullptr, 0}};
+    for (const auto& c : cases) {
+        boxes.clear();
+        shell.requests.clear();
+        QTimer::singleShot(0, [&] {
+            auto* dialog = qobject_cast<CEditorsLoadOptionDlg*>(QApplication::activeModalWidget());
+            ASSERT_TRUE(dialog);
+            EXPECT_EQ(dialog->windowTitle(), "Load Branch and Chainage");
+            EXPECT_TRUE(dialog->findChild<QRadioButton*>("branch_1105")->isChecked());
+            if (c.button)
+                dialog->findChild<QRadioButton*>(c.button)->click();
+            QTest::keyClick(dialog, c.button ? Qt::Key_Return : Qt::Key_Escape);
+        });
+        Find<QAbstractButton>(1104)->click();
+        EXPECT_EQ(shell.requests, c.button ? QList<int>{c.request} : QList<int>());
+        EXPECT_EQ(boxes.size(), c.button ? 1 : 0);
+    }
+    EXPECT_FALSE(document.IsModified());
+}

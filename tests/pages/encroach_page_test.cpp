@@ -1,0 +1,170 @@
+// Encroachment set-ups: stepping through them, making and deleting them, and what a save makes of them.
+#include "flow_page_fixture.h"
+
+#include "pages/encroach_page.h"
+
+#include <QAbstractButton>
+
+class EncroachPageTest : public FlowPagesTest
+{
+protected:
+    /// A set-up whose lines are named.
+    void AddSetup(std::initializer_list<const char*> names)
+    {
+        auto& setup = setups.Add();
+        for (const char* name : names) {
+            HDEncroach& line = setup.Add();
+            line.RiverName = name;
+            line.Chainage = *name ? 1 : NotGiven;
+        }
+    }
+    /// Branch names of every set-up.
+    QString Content() const
+    {
+        QStringList content;
+        for (std::size_t i = 0; i < setups.GetCount(); ++i) {
+            QString names;
+            for (std::size_t line = 0; line < setups.GetAt(i).GetCount(); ++line)
+                names += QString::fromStdString(setups.GetAt(i).GetAt(line).RiverName) + ',';
+            content << names;
+        }
+        return content.join(' ');
+    }
+    void Click(const char* button)
+    {
+        auto* found = view->page->findChild<QAbstractButton*>(button);
+        ASSERT_TRUE(found && found->isEnabled()) << button;
+        found->click();
+    }
+    /// Enabled buttons, and the set-up shown.
+    QString Shown() const
+    {
+        QString shown;
+        for (const char* button : {"previous_1342", "next_1343", "add_1344", "duplicate_1345", "delete_1346"})
+            shown += view->page->findChild<QAbstractButton*>(button)->isEnabled() ? button[0] : '-';
+        return shown + " " + view->page->findChild<QComboBox*>("setup_1341")->currentText() + " " + grid->TextAt(1, 1);
+    }
+    bool Warns() const { return !view->page->findChild<QLabel*>("status_1347")->text().isEmpty(); }
+
+    CGenMetaList<HDEncroach>& setups = document.Parameters().EncroachList;
+};
+
+TEST_F(EncroachPageTest, EveryFieldHasItsColumn)
+{
+    AddSetup({"A", "B"});
+    HDEncroach& line = setups.GetAt(0).GetAt(0);
+    line.EncOption1 = 2;
+    line.EncOption2 = 6; // nobody knows it
+    for (int i = 0; i < 5; ++i) {
+        line.EncValues1[i] = i;
+        line.EncValues2[i] = 10 + i;
+    }
+    Open<CEncroachPage>();
+    EXPECT_EQ(Headers().join('|'), "River Name|Chainage|Method|Banks|Left offset|Right offset|Left position|"
+                                   "Right position|Width|Reduction|Total reduction|Left reduction|Right reduction|"
+                                   "Target level|Target energy");
+    EXPECT_EQ(Texts(1), "A|1|2 Fixed width|6|0.000|1.000|2.000|3.000|4.000|1 Equal on both banks|10.000|11.000|"
+                        "12.000|13.000|14.000");
+    int column = 2;
+    for (const Field& field : HDEncroach::DeclaredFields())
+        EXPECT_TRUE(grid->model()
+                        ->headerData(column++, Qt::Horizontal, Qt::ToolTipRole)
+                        .toString()
+                        .contains(QString::fromStdString(std::string(field.name))));
+    Enter(1, 3, "5");
+    EXPECT_EQ(line.EncOption1, 5) << "the numbers in front of the entries choose them";
+    Enter(1, 13, "0.5");
+    EXPECT_EQ(line.EncValues2[2], 0.5);
+    EXPECT_EQ(line.EncOption2, 6);
+}
+
+TEST_F(EncroachPageTest, StepAddDuplicateDelete)
+{
+    Open<CEncroachPage>();
+    EXPECT_EQ(Shown(), "--a--  ");
+    EXPECT_FALSE(grid->isEnabled());
+    view->page->AppendLine(); // nowhere to go
+    view->page->InsertLocation("A", "1");
+    EXPECT_EQ(document.UndoStack().count(), 0);
+    EXPECT_FALSE(document.IsModified());
+    Click("add_1344");
+    EXPECT_EQ(Shown(), "--add Set-up 1 ");
+    Enter(1, 1, "a");
+    Click("add_1344");
+    EXPECT_EQ(Shown(), "p-add Set-up 2 ");
+    Enter(1, 1, "b");
+    Click("previous_1342");
+    EXPECT_EQ(Shown(), "-nadd Set-up 1 A");
+    grid->setFocus();
+    Type(1, 1, "C"); // what is being typed goes with the duplicate
+    Click("duplicate_1345");
+    EXPECT_EQ(Content(), "C,, C,, B,,");
+    EXPECT_EQ(Shown(), "pnadd Set-up 2 C");
+    Enter(1, 1, "D");
+    EXPECT_EQ(Content(), "C,, D,, B,,") << "a copy, not the same lines";
+    Click("next_1343");
+    Click("delete_1346");
+    EXPECT_EQ(Content(), "C,, D,,");
+    EXPECT_EQ(Shown(), "p-add Set-up 2 D");
+
+    // Undo steps back through all of it, each time with the set-up it is about in sight.
+    for (const char* expected : {"C,, D,, B,,|p-add Set-up 3 B", "C,, C,, B,,|pnadd Set-up 2 C",
+                                 "C,, B,,|p-add Set-up 2 B", "A,, B,,|-nadd Set-up 1 A"}) {
+        document.UndoStack().undo();
+        EXPECT_EQ(Content() + "|" + Shown(), expected);
+    }
+    while (document.UndoStack().canUndo())
+        document.UndoStack().undo();
+    EXPECT_EQ(Content(), "");
+    while (document.UndoStack().canRedo())
+        document.UndoStack().redo();
+    EXPECT_EQ(Content(), "C,, D,,");
+}
+
+TEST_F(EncroachPageTest, TellsWhatASaveWouldLeaveOut)
+{
+    const struct
+    {
+        std::initializer_list<const char*> names;
+        bool saved;
+    } cases[] = {{{}, false}, {{"A"}, false}, {{"A", ""}, false}, {{"", "B"}, true}, {{"", "", "C"}, true}};
+    for (const auto& c : cases)
+        AddSetup(c.names);
+    Open<CEncroachPage>();
+    QComboBox* box = view->page->findChild<QComboBox*>("setup_1341");
+    int written = 0;
+    for (const auto& c : cases) {
+        EXPECT_EQ(!Warns(), c.saved) << box->currentText().toStdString();
+        written += c.saved;
+        QTest::keyClick(box, Qt::Key_Down);
+    }
+    EXPECT_EQ(Lines().filter("[Encroachment_Setup]").size(), written) << "as the file has it";
+    // The warning goes as soon as the line is there, and comes back with undo.
+    box->setFocus();
+    for (int i = 0; i < 2; ++i)
+        Click("previous_1342");
+    ASSERT_TRUE(Warns());
+    Enter(2, 1, "b");
+    EXPECT_TRUE(Warns());
+    Enter(2, 2, "5");
+    EXPECT_FALSE(Warns());
+    document.UndoStack().undo();
+    EXPECT_TRUE(Warns());
+}
+
+TEST_F(EncroachPageTest, AWrongCellKeepsTheSetup)
+{
+    AddSetup({"A", "B"});
+    AddSetup({"C", "D"});
+    Open<CEncroachPage>();
+    Type(1, 5, "1.");
+    Click("next_1343");
+    EXPECT_EQ(boxes.value(0), "Floating point number required");
+    EXPECT_EQ(Shown(), "-nadd Set-up 1 A");
+    QTest::qWait(0);
+    Click("delete_1346");
+    EXPECT_EQ(Content(), "A,B, C,D,");
+    QTest::keyClick(Editor(), Qt::Key_Escape);
+    Click("next_1343");
+    EXPECT_EQ(Shown(), "p-add Set-up 2 C");
+}
