@@ -1,15 +1,19 @@
 #include "drive/main_job.h"
 
 #include "data/hd_file.h"
+#include "drive/page_tour.h"
 #include "drive/robot.h"
 #include "ks/fc/doc.h"
 #include "shell/main_frame.h"
 
 #include <QAbstractItemModel>
+#include <QAction>
 #include <QApplication>
 #include <QDialog>
 #include <QFileInfo>
 #include <QLineEdit>
+#include <QMenu>
+#include <QTabWidget>
 #include <QTableView>
 
 namespace {
@@ -130,8 +134,29 @@ bool HoldsNewLine(const HD_Parameters& parameters, int row)
            line.InitialH == 2.75 && line.InitialQ == 18.25;
 }
 
+QAction* RecentFile(Robot& robot, const QString& path)
+{
+    auto* menu = robot.Frame().findChild<QAction*>("actionOpenRecent")->menu();
+    emit menu->aboutToShow();
+    for (QAction* action : menu->actions()) {
+        if (action->text().endsWith(QFileInfo(path).fileName()))
+            return action;
+    }
+    return nullptr;
+}
+
 void SaveCloseReopen(Robot& robot, const QString& file, int row)
 {
+    auto* sheet = robot.Frame().GetActiveView()->findChild<QTabWidget*>("sheet");
+    const bool otherPages = sheet && sheet->count() > 1;
+    std::vector<PageChange> changes;
+    if (otherPages) {
+        robot.Did("Visit every page and change a global and a local value on each");
+        changes = ChangeEveryPage(robot);
+        sheet->setCurrentIndex(0);
+        robot.Settle();
+    }
+    const double level = robot.Control<QLineEdit>(GlobalLevel)->text().toDouble();
     robot.Did("Save with Ctrl+S");
     robot.Trigger("actionSave");
     const QString saved = robot.Frame().GetActiveView()->GetDocument()->GetPathName();
@@ -143,20 +168,26 @@ void SaveCloseReopen(Robot& robot, const QString& file, int row)
     robot.Did("Close the document and open it again from the recent files");
     robot.Trigger("actionClose");
     robot.Verify(!robot.Frame().GetActiveView(), "no document is open");
-    robot.Trigger("actionRecent_1");
+    auto* recent = RecentFile(robot, saved);
+    robot.Verify(recent != nullptr, "the saved file is among the recent files");
+    if (!recent)
+        return;
+    recent->trigger();
+    robot.Settle();
     robot.Verify(robot.Frame().GetActiveView() != nullptr, "the document is open again");
     auto* grid = InitialGrid(robot);
     if (!grid)
         return;
     robot.Verify(CellText(grid, row, 0) == NewLine.river.toUpper(), "the typed line is there");
 
+    VerifyEveryPage(robot, changes);
     robot.Did("Read the saved file without the program and compare");
     const auto parameters = LoadHDFile(saved.toStdString());
     robot.Verify(bool(parameters), "the file reads without an error");
     if (!parameters)
         return;
     robot.Verify(HoldsNewLine(parameters.value(), row), "the typed line is in the file, bit for bit");
-    robot.Verify(parameters.value().Global.G_waterlevel == 3.125, "G_waterlevel is 3.125");
+    robot.Verify(parameters.value().Global.G_waterlevel == level, "the global water level is in the file");
     robot.Verify(static_cast<int>(parameters.value().InitList.GetCount()) == grid->model()->rowCount(),
                  "the file has as many lines as the grid");
 }

@@ -42,16 +42,32 @@ void Robot::Type(QWidget* target, const QString& text)
     Settle();
 }
 
+QWidget* Robot::Focus()
+{
+    // The window may have lost the activation to a dialog that is gone; nobody else gives it back without a display.
+    if (!QApplication::focusWidget()) {
+        m_frame.activateWindow();
+        Settle();
+    }
+    return QApplication::focusWidget() ? QApplication::focusWidget() : m_frame.focusWidget();
+}
+
 void Robot::KeyToFocus(int key, Qt::KeyboardModifiers modifiers)
 {
-    Key(QApplication::focusWidget(), key, modifiers);
+    Key(Focus(), key, modifiers);
 }
 
 void Robot::TypeToFocus(const QString& text)
 {
     // A character at a time: the first one opens the cell's editor, which then has the focus.
     for (const QChar c : text)
-        QTest::keyClick(QApplication::focusWidget(), c.toLatin1());
+        QTest::keyClick(Focus(), c.toLatin1());
+    Settle();
+}
+
+void Robot::Click(QWidget* widget, const QPoint& place)
+{
+    QTest::mouseClick(widget, Qt::LeftButton, {}, place);
     Settle();
 }
 

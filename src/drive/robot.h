@@ -29,6 +29,7 @@ public:
     /// Whatever has the focus: the cell editor that typing opened, or the grid itself.
     void KeyToFocus(int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void TypeToFocus(const QString& text);
+    void Click(QWidget* widget, const QPoint& place);
     void ClickCell(QTableView* table, int row, int column);
     void ClickRowHeader(QTableView* table, int row);
     /// Triggers a menu action by object name, as its menu entry would.
@@ -46,6 +47,8 @@ public:
     const QStringList& Pictures() const { return m_pictures; }
 
 private:
+    QWidget* Focus();
+
     CMainFrame& m_frame;
     QString m_folder;
     QStringList m_pictures;
