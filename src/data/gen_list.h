@@ -131,8 +131,16 @@ public:
     void RemoveAllRecords() { m_lists.clear(); }
     void ClearUnknown() { m_unknown.clear(); }
 
-    /// A sub-list is written only when one of its records from the second on is filled (or it holds unknown content),
-    /// unless `everySet` asks for all of them.
+    /// A sub-list is written only when one of its records from the second on is filled (or it holds unknown content).
+    static bool IsWorthKeeping(const CGenParamList<T>& list)
+    {
+        for (std::size_t index = 1; index < list.GetCount(); ++index)
+            if (!list.GetAt(index).IsBlank())
+                return true;
+        return !list.Unknown().empty();
+    }
+
+    /// Writes the sub-lists that are worth it, or `everySet`.
     void Save(tqlHandle structure, bool everySet = false) const
     {
         tqlAddSection(structure, m_outerSection);
@@ -159,14 +167,6 @@ public:
     }
 
 private:
-    static bool IsWorthKeeping(const CGenParamList<T>& list)
-    {
-        for (std::size_t index = 1; index < list.GetCount(); ++index)
-            if (!list.GetAt(index).IsBlank())
-                return true;
-        return !list.Unknown().empty();
-    }
-
     std::string m_outerSection, m_innerSection;
     std::vector<std::unique_ptr<CGenParamList<T>>> m_lists;
     UnknownNodes m_unknown;
