@@ -18,11 +18,17 @@
 namespace {
 
 constexpr int NumberColumnWidth = 40;
-constexpr double OriginalFontHeight = 13; // pixels; the columns' widths are meant for it
+// Pixels of the font that the columns' widths are meant for: its height, and the mean width of the Latin letters.
+constexpr int RowsMeasured = 100;  // for the first widths of the columns; the user may change them
+constexpr int MostOfAWindow = 320; // pixels that a long name may take at the start
+constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
 
 double FontScale(const QWidget& widget)
 {
-    return std::max(1.0, widget.fontMetrics().height() / OriginalFontHeight);
+    const QFontMetrics font = widget.fontMetrics();
+    const QString letters = QStringLiteral("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz");
+    const double letterWidth = double(font.horizontalAdvance(letters)) / double(letters.size());
+    return std::max({1.0, font.height() / OriginalFontHeight, letterWidth / OriginalLetterWidth});
 }
 
 } // namespace
@@ -43,6 +49,7 @@ CGenGrid::CGenGrid(QWidget* parent)
     setSizePolicy(policy);
     verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     verticalHeader()->setHighlightSections(false);
+    verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
     UpdateRowHeader();
     horizontalHeader()->setHighlightSections(false);
     // A click on a header moves the current cell as one on a cell does.
@@ -101,8 +108,10 @@ void CGenGrid::SetColumnWidths()
     m_widthsSet = true;
     for (int column = 0; column < ColumnCount(); ++column) {
         const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
-        const int header = fontMetrics().horizontalAdvance(spec.header()) + 16;
-        setColumnWidth(column, std::max(int(spec.width * FontScale(*this)), header));
+        int text = fontMetrics().horizontalAdvance(spec.header());
+        for (int row = 0; row < std::min(RowCount(), RowsMeasured); ++row)
+            text = std::max(text, fontMetrics().horizontalAdvance(TextAt(row + 1, column + 1)));
+        setColumnWidth(column, std::max(int(spec.width * FontScale(*this)), std::min(text + 16, MostOfAWindow)));
     }
 }
 
@@ -212,7 +221,8 @@ void CGenGrid::changeEvent(QEvent* event)
     QTableView::changeEvent(event);
     if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) {
         UpdateRowHeader();
-        SetColumnWidths();
+        if (m_widthsSet) // not before there are columns
+            SetColumnWidths();
     }
 }
 
