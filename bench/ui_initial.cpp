@@ -1,32 +1,16 @@
 // The page of initial conditions with a million lines: how long it takes to show, against a bare table view of the same
 // size; and what storing one edited cell, moving on and repainting costs, against a thousand lines.
+#include "bench/report.h"
 #include "pages/framework/gen_grid.h"
 #include "pages/init_page.h"
 
 #include <QApplication>
 #include <QTableView>
-#include <algorithm>
-#include <chrono>
-#include <cstdio>
-#include <functional>
 #include <string>
 
 namespace {
 
 constexpr int Large = 1'000'000, Small = 1'000;
-
-double Milliseconds(const std::function<void()>& work)
-{
-    const auto start = std::chrono::steady_clock::now();
-    work();
-    return std::chrono::duration<double, std::milli>(std::chrono::steady_clock::now() - start).count();
-}
-
-double Median(std::vector<double> times)
-{
-    std::nth_element(times.begin(), times.begin() + std::ptrdiff_t(times.size() / 2), times.end());
-    return times[times.size() / 2];
-}
 
 /// The yardstick: rows and columns of numbers, nothing else.
 class TrivialModel : public QAbstractTableModel
@@ -141,14 +125,6 @@ struct Edited
     int row = 0;
     double value = 1000;
 };
-
-bool Report(const char* what, double measured, double yardstick, double limit)
-{
-    const double ratio = measured / yardstick;
-    std::printf("%-58s %9.3f ms / %9.3f ms = %5.2f (limit %.1f) %s\n", what, measured, yardstick, ratio, limit,
-                ratio <= limit ? "ok" : "TOO SLOW");
-    return ratio <= limit;
-}
 
 } // namespace
 

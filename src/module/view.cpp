@@ -81,6 +81,8 @@ void CKavo0_hdView::MakePages()
     for (const PageEntry& entry : PageTable()) {
         auto page = entry.make(GetDocument());
         page->SetHost(this);
+        if (entry.offersBranchNames)
+            m_branchNamePages.push_back(page.get());
         if (entry.tab == NotOnSheet)
             m_offSheet.push_back(std::move(page));
         else
@@ -95,9 +97,8 @@ void CKavo0_hdView::JoinProject()
 {
     if (!GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName()))
         return;
-    std::vector<CGenPropertyPage*> pages;
-    for (int tab = 0; tab < m_sheet->PageCount(); ++tab) {
-        if (auto* grid = m_sheet->PageAt(tab)->GetGrid())
+    for (CGenPropertyPage* page : m_branchNamePages) {
+        if (auto* grid = page->GetGrid())
             grid->SetBranchNameColumn(1);
     }
 }

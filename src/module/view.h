@@ -65,6 +65,7 @@ private:
 
     CDlgPropertySheet* m_sheet = nullptr;              // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
+    std::vector<CGenPropertyPage*> m_branchNamePages; // owned by the sheet
     SearchState m_search;
     bool m_linesEnabled = true;
 };
