@@ -9,7 +9,7 @@ CFloodPage::CFloodPage(CKavo0_hdDoc* document, QWidget* parent)
     Bind(m_ui->resistance_1040, &HD_Global_Var::G_flood_plan_res, {.decimals = 2});
 
     Grid(m_ui->grid_1043)
-        .BranchName({.width = 80})
+        .BranchName({.width = 100})
         .Chainage({.width = 72})
         .Value(&HD_Flood_resist::FloodPlainResistance, {.caption = Str::FloodPlRes, .width = 72});
 }

@@ -15,7 +15,7 @@ CLeakagePage::CLeakagePage(CKavo0_hdDoc* document, QWidget* parent)
 
     // Coefficients are far below one, so three decimals would show nothing of them.
     Grid(m_ui->grid_1186)
-        .BranchName({.width = 80})
+        .BranchName({.width = 100})
         .Chainage({.width = 72})
         .Value(&HDLeakage::LeakageCoefficient,
                {.caption = Str::LeakageCoef, .width = 82, .format = "%.6lg", .asFormatted = true});

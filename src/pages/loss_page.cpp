@@ -7,7 +7,7 @@ CLossPage::CLossPage(CKavo0_hdDoc* document, QWidget* parent)
 {
     m_ui->setupUi(this);
     auto columns = Grid(m_ui->grid);
-    columns.BranchName({.width = 80}).Chainage({.width = 72});
+    columns.BranchName({.width = 100}).Chainage({.width = 72});
     int number = 0;
     for (const Field& field : HD_Waterloss::DeclaredFields())
         columns.Value(field, {.header = [n = ++number] { return LoadString(Str::WaterLossNumber).arg(n); },

@@ -2,6 +2,7 @@
 #include "flow_page_fixture.h"
 
 #include "ks/units/edit_fields.h"
+#include "module/sheet.h"
 #include "pages/default_page.h"
 #include "pages/flood_page.h"
 #include "pages/heat_balance_page.h"
@@ -133,6 +134,38 @@ TEST_F(FlowPagesTest, AWrongIntegerKeepsThePage)
     TypeInto(1026, "101");
     EXPECT_TRUE(view->page->OnKillActive());
     EXPECT_EQ(globals.max_iter, 101);
+}
+
+TEST_F(FlowPagesTest, TheSheetStaysOnAPageWithAWrongEntry)
+{
+    CDlgPropertySheet sheet(nullptr);
+    sheet.AddPage(new CDefaultPage(&document));
+    sheet.AddPage(new CHeatBalancePage(&document));
+    sheet.show();
+    sheet.activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&sheet));
+    sheet.ActivePage()->OnSetActive();
+    const std::pair<const char*, const char*> entries[] = {{"noIter_1024", "x"}, {"delta_1012", "7"}};
+    for (const auto& [name, wrong] : entries) {
+        SCOPED_TRACE(name);
+        boxes.clear();
+        auto* field = sheet.findChild<QLineEdit*>(name);
+        field->setFocus();
+        field->selectAll();
+        QTest::keyClicks(field, wrong);
+        EXPECT_FALSE(sheet.SetActivePage(1));
+        EXPECT_EQ(sheet.currentIndex(), 0);
+        EXPECT_EQ(boxes.size(), 1);
+        EXPECT_TRUE(field->hasFocus());
+        EXPECT_EQ(field->text(), wrong);
+        QTest::qWait(0);
+        field->selectAll();
+        QTest::keyClicks(field, "1");
+        EXPECT_TRUE(sheet.SetActivePage(1));
+        EXPECT_TRUE(sheet.SetActivePage(0));
+    }
+    EXPECT_EQ(globals.delta, 1);
+    EXPECT_EQ(globals.no_iter, 1);
 }
 
 TEST_F(FlowPagesTest, TheOnlyNodeCompatibilityIsWaterLevel)

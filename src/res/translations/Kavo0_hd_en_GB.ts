@@ -665,8 +665,8 @@
             <translation>V&amp;iscosity</translation>
         </message>
         <message>
-            <source>&amp;Turbulence model in fluid</source>
-            <translation>&amp;Turbulence model in fluid</translation>
+            <source>Turb&amp;ulence model in fluid</source>
+            <translation>Turb&amp;ulence model in fluid</translation>
         </message>
         <message>
             <source>constant</source>
@@ -791,8 +791,8 @@
             <translation>Global Factor</translation>
         </message>
         <message>
-            <source>&amp;Topographical Factor</source>
-            <translation>&amp;Topographical Factor</translation>
+            <source>To&amp;pographical Factor</source>
+            <translation>To&amp;pographical Factor</translation>
         </message>
         <message>
             <source>Fri&amp;ction Factor</source>

@@ -665,8 +665,8 @@
             <translation>粘性係数(&amp;I)</translation>
         </message>
         <message>
-            <source>&amp;Turbulence model in fluid</source>
-            <translation>流体中の乱流モデル(&amp;T)</translation>
+            <source>Turb&amp;ulence model in fluid</source>
+            <translation>流体中の乱流モデル(&amp;U)</translation>
         </message>
         <message>
             <source>constant</source>
@@ -791,8 +791,8 @@
             <translation>全体の係数</translation>
         </message>
         <message>
-            <source>&amp;Topographical Factor</source>
-            <translation>地形係数(&amp;T)</translation>
+            <source>To&amp;pographical Factor</source>
+            <translation>地形係数(&amp;P)</translation>
         </message>
         <message>
             <source>Fri&amp;ction Factor</source>
