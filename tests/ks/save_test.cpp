@@ -134,3 +134,21 @@ TEST_F(KsTest, OneRefusalKeepsAllWindows)
     Settle();
     EXPECT_TRUE(documents.Documents().empty());
 }
+
+TEST_F(KsTest, AfterACancelTheFocusIsBackEvenWhenItsFieldIsGone)
+{
+    TextDoc* document = Open({});
+    auto* around = new QWidget(ViewOf(document)); // as a grid with its cell editor
+    around->setFocusPolicy(Qt::StrongFocus);
+    auto* editor = new QLineEdit(around);
+    around->show();
+    editor->setFocus();
+    QTest::keyClicks(editor, "x");
+    QObject::connect(editor, &QLineEdit::editingFinished, [&] {
+        editor->hide();
+        document->SetModifiedFlag();
+    });
+    answers = {Button::Cancel};
+    EXPECT_FALSE(WindowOf(document)->close());
+    EXPECT_EQ(QApplication::focusWidget(), around);
+}

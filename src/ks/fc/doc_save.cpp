@@ -28,9 +28,15 @@ void CommitFocus(const std::vector<CView*>& views)
         focus && std::any_of(views.begin(), views.end(), [&](const CView* view) { return view->isAncestorOf(focus); });
     if (!inside)
         return;
+    std::vector<QPointer<QWidget>> candidates;
+    for (QWidget* widget = focus; widget; widget = widget->parentWidget())
+        candidates.emplace_back(widget);
     focus->clearFocus();
-    if (focus && !QApplication::focusWidget())
-        focus->setFocus(Qt::OtherFocusReason);
+    // A grid has taken its cell editor away by now; then the grid itself goes on.
+    for (const QPointer<QWidget>& widget : candidates) {
+        if (widget && !QApplication::focusWidget() && widget->isVisible() && widget->focusPolicy() != Qt::NoFocus)
+            widget->setFocus(Qt::OtherFocusReason);
+    }
 }
 
 } // namespace

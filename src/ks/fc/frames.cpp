@@ -7,6 +7,7 @@
 #include <QCloseEvent>
 #include <QMenuBar>
 #include <QPainter>
+#include <QStyle>
 #include <set>
 #include <utility>
 
@@ -143,6 +144,12 @@ void CKsMDIFrameWnd::ShowWindow(CKsMDIChildWnd* window)
     const QSize area = m_area->viewport()->size();
     window->resize(window->sizeHint().expandedTo(area * 2 / 3).boundedTo(area));
     window->show();
+    if (m_area->viewMode() == QMdiArea::SubWindowView) {
+        // One behind the other, every title in sight.
+        const int step = window->style()->pixelMetric(QStyle::PM_TitleBarHeight), places = 6;
+        const int place = int(m_area->subWindowList().size() - 1) % places;
+        window->move(place * step, place * step);
+    }
     m_area->setActiveSubWindow(window);
 }
 
