@@ -7,6 +7,13 @@
 
 namespace {
 
+std::string Tagged(char tag, std::string_view value)
+{
+    std::string text(1, tag);
+    text += value;
+    return text;
+}
+
 // The value of a parameter in words that two equal values share.
 std::string ValueOf(tqlHandle param)
 {
@@ -16,15 +23,15 @@ std::string ValueOf(tqlHandle param)
     std::string text;
     switch (tqlGetType(param)) {
     case TqlType::Int:
-        return tqlGetInt(param, &integer) ? "i" + std::to_string(integer) : "?";
+        return tqlGetInt(param, &integer) ? Tagged('i', std::to_string(integer)) : "?";
     case TqlType::Double:
-        return tqlGetDouble(param, &number) ? "d" + std::to_string(std::bit_cast<std::uint64_t>(number)) : "?";
+        return tqlGetDouble(param, &number) ? Tagged('d', std::to_string(std::bit_cast<std::uint64_t>(number))) : "?";
     case TqlType::Bool:
         return tqlGetBool(param, &flag) ? (flag ? "b1" : "b0") : "?";
     case TqlType::String:
-        return tqlGetString(param, &text) ? "s" + text : "?";
+        return tqlGetString(param, &text) ? Tagged('s', text) : "?";
     case TqlType::FileName:
-        return tqlGetString(param, &text) ? "n" + text : "?";
+        return tqlGetString(param, &text) ? Tagged('n', text) : "?";
     case TqlType::None:
         break;
     }
@@ -83,7 +90,7 @@ void List(tqlHandle node, std::vector<std::string>& out)
 {
     for (int k = 1; k <= tqlGetNoKeywords(node); ++k) {
         const tqlHandle keyword = tqlKeywordByNum(node, k);
-        out.push_back("=" + std::string(tqlName(keyword)));
+        out.push_back(Tagged('=', tqlName(keyword)));
         tqlHandle next = tqlParamByNum(keyword, 1);
         for (int p = 1; p <= tqlGetNoParams(keyword); ++p, next = tqlNextParam(next)) {
             double number = 0;
@@ -97,7 +104,7 @@ void List(tqlHandle node, std::vector<std::string>& out)
             out.push_back("a parameter too many");
     }
     for (int s = 1; s <= tqlGetNoSections(node); ++s) {
-        out.push_back("[" + std::string(tqlName(tqlSectionByNum(node, s))));
+        out.push_back(Tagged('[', tqlName(tqlSectionByNum(node, s))));
         List(tqlSectionByNum(node, s), out);
         out.push_back("]");
     }

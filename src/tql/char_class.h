@@ -51,11 +51,12 @@ inline bool Is(char c, int classes)
 
 inline const char* SkipBlanks(const char* p)
 {
-    for (;; ++p) {
+    for (; Is(*p, Blank); ++p) {
         p = FindByte(p, [](std::uint64_t block) { return block ^ Repeat(' '); });
         if (*p != '\t')
-            return p;
+            break;
     }
+    return p;
 }
 
 inline bool IsName(std::string_view text)

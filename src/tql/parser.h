@@ -5,8 +5,8 @@
 
 namespace tql {
 
-inline constexpr std::size_t MaxDepth = 128;                   // sections inside one another, the target included
-inline constexpr std::size_t MaxLineLength = 16 * 1024 * 1024; // bytes, without the line end
+inline constexpr std::size_t MaxDepth = 128;                        // sections inside one another, the target included
+inline constexpr std::size_t MaxLineLength = std::size_t{16} << 20; // bytes, without the line end
 
 /// Parses `structure.text`; false, with `structure.error` filled and the tree half built, at the first error.
 bool Parse(Structure& structure, const std::string& file);

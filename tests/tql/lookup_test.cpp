@@ -110,13 +110,13 @@ TEST(LookUp, PositionsAreLinesAndCharacters)
 TEST(LookUp, CostsTheSameInAnyOrderAndMixture)
 {
     constexpr int count = 200000;
+    const auto name = [](int i) { return std::string("N").append(std::to_string(i)); };
     for (const bool mixed : {false, true}) {
         std::string text = "[T]\n";
         for (int i = 0; i < count; ++i) {
             text += "DATA = " + std::to_string(i) + "\n";
             if (mixed)
-                text += "N" + std::to_string(i) + " = " + std::to_string(i) + "\n[S" + std::to_string(i % 3) +
-                        "]\n[/S" + std::to_string(i % 3) + "]\n";
+                text += name(i) + " = " + std::to_string(i) + "\n[" + name(i % 3) + "]\n[/" + name(i % 3) + "]\n";
         }
         const Structure file = LoadText(text + "[/T]\n");
         const tqlHandle target = tqlTargetByNameNum(file, "T", 1);
@@ -128,9 +128,9 @@ TEST(LookUp, CostsTheSameInAnyOrderAndMixture)
             ASSERT_TRUE(tqlGetParam(target, "DATA", &value, number + 1));
             ASSERT_EQ(value, number);
             if (mixed) {
-                ASSERT_TRUE(tqlGetParam(target, "N" + std::to_string(number), &value));
+                ASSERT_TRUE(tqlGetParam(target, name(number), &value));
                 ASSERT_EQ(value, number);
-                ASSERT_NE(tqlSectionByNameNum(target, "S1", number / 3 + 1), nullptr);
+                ASSERT_NE(tqlSectionByNameNum(target, "N1", number / 3 + 1), nullptr);
             }
         }
         EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(10));
