@@ -33,7 +33,7 @@ CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
     };
     using R = HD_Resistfact;
     Grid(m_ui->grid_1307)
-        .BranchName({.width = 80})
+        .BranchName({.width = 110})
         .Chainage({})
         .Value(&R::Resistance, column(Str::Resistance, globals.G_resistance, false))
         .Value(&R::ZoneResistance1, column(Str::Zone1, globals.ZoneResistance1, true))

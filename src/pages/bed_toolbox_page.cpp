@@ -21,7 +21,7 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document, QWidget* parent)
 
     using R = HDBedResTool;
     Grid(m_ui->grid_1319)
-        .BranchName({.width = 80})
+        .BranchName({.width = 110})
         .Chainage({})
         .Value(&R::CoefA, {.caption = Str::CoefA, .width = 60, .fill = &tools.CoefA})
         .Value(&R::CoefB, {.caption = Str::CoefB, .width = 60, .fill = &tools.CoefB})

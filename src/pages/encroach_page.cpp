@@ -48,7 +48,7 @@ CEncroachPage::~CEncroachPage() = default;
 void CEncroachPage::DeclareColumns()
 {
     GridColumns columns = Grid(m_ui->grid_1348);
-    columns.BranchName({.width = 80}).Chainage({});
+    columns.BranchName({.width = 110}).Chainage({});
     const Str entries[] = {Str::EncroachMethods, Str::EncroachBanks, Str::EncroachReductions};
     const Str* next = entries;
     qsizetype number = 0;

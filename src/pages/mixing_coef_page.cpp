@@ -18,7 +18,7 @@ CMixingCoefPage::CMixingCoefPage(CKavo0_hdDoc* document, QWidget* parent)
     };
     using R = HDMixingCoef;
     Grid(m_ui->grid_1335)
-        .BranchName({.width = 80})
+        .BranchName({.width = 110})
         .Chainage({})
         .Value(&R::MixCoef1, coefficient(1, mixing.MixCoef1))
         .Value(&R::MixCoef2, coefficient(2, mixing.MixCoef2))

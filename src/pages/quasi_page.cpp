@@ -37,7 +37,7 @@ CQuasiPage::CQuasiPage(CKavo0_hdDoc* document, QWidget* parent)
     connect(m_ui->loadBranches_1104, &QPushButton::clicked, this, &CQuasiPage::LoadBranches);
 
     Grid(m_ui->grid_1197)
-        .BranchName({.width = 80})
+        .BranchName({.width = 110})
         .Chainage({})
         .Value(&HDContraExpan::Contraction, {.caption = Str::Contraction, .fill = &Globals().G_Contraction})
         .Value(&HDContraExpan::Expansion, {.caption = Str::Expansion, .fill = &Globals().G_Expansion});

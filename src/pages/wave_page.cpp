@@ -14,7 +14,7 @@ CWavePage::CWavePage(CKavo0_hdDoc* document, QWidget* parent)
     m_ui->setupUi(this);
     Bind(m_ui->wave_1010, &HD_Global_Var::G_wave);
     Grid(m_ui->grid_1011)
-        .BranchName({.width = 80})
+        .BranchName({.width = 110})
         .Chainage({.caption = Str::UpstreamChainage})
         .Value(&HD_Wavetype::DownstreamChainage, {.caption = Str::DownstreamChainage, .emptyIsNotGiven = true})
         .Value(&HD_Wavetype::WaveApproximation, {.caption = Str::WaveApproximation,
