@@ -27,8 +27,8 @@ void Fill(CGenList& list, int lines)
 void Fill(HD_Parameters& parameters, int lines)
 {
     for (const ListEntry& entry : HDLists()) {
-        if (auto* list = entry.list(parameters))
-            Fill(*list, lines);
+        if (entry.list)
+            Fill(*entry.list(parameters), lines);
     }
     Fill(parameters.EncroachList.Add(), lines);
     // Whatever hides a grid is switched on.

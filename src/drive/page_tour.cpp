@@ -124,7 +124,7 @@ std::vector<PageChange> ChangeEveryPage(Robot& robot)
                       .arg(change.page, change.control, change.controlText)
                       .arg(change.column + 1)
                       .arg(change.cellText));
-        robot.Picture(QStringLiteral("page-%1-%2").arg(tab + 1, 2, 10, QLatin1Char('0')).arg(page->objectName()));
+        robot.Picture(QStringLiteral("page-%1").arg(tab + 1, 2, 10, QLatin1Char('0')));
         changes.push_back(change);
     }
     return changes;

@@ -24,20 +24,20 @@ std::unique_ptr<CGenPropertyPage> Make(CKavo0_hdDoc* document)
 }
 
 constexpr PageEntry Pages[] = {
-    {&Make<CInitPage>, 1, true},
-    {&Make<CWindPage>, 2, true},
-    {&Make<CBedPage>, 3, true},
-    {&Make<CBedToolboxPage>, 4, true},
-    {&Make<CWavePage>, 5, true},
-    {&Make<CDefaultPage>, 6, false},
-    {&Make<CQuasiPage>, 7, true},
-    {&Make<CFloodPage>, 10, true},
-    {&Make<CMixingCoefPage>, 20, true},
-    {&Make<CLossPage>, NotOnSheet, false},
-    {&Make<CEncroachPage>, 12, true},
-    {&Make<CHeatBalancePage>, 13, false},
-    {&Make<CStratificationPage>, 14, false},
-    {&Make<CLeakagePage>, 17, true},
+    {&Make<CInitPage>, Str::InitialCaption, 1, true},
+    {&Make<CWindPage>, Str::WindCaption, 2, true},
+    {&Make<CBedPage>, Str::BedCaption, 3, true},
+    {&Make<CBedToolboxPage>, Str::BedToolboxCaption, 4, true},
+    {&Make<CWavePage>, Str::WaveCaption, 5, true},
+    {&Make<CDefaultPage>, Str::DefaultCaption, 6, false},
+    {&Make<CQuasiPage>, Str::QuasiCaption, 7, true},
+    {&Make<CFloodPage>, Str::FloodCaption, 10, true},
+    {&Make<CMixingCoefPage>, Str::MixingCaption, 20, true},
+    {&Make<CLossPage>, Str::LossCaption, NotOnSheet, false},
+    {&Make<CEncroachPage>, Str::EncroachCaption, 12, true},
+    {&Make<CHeatBalancePage>, Str::HeatBalanceCaption, 13, false},
+    {&Make<CStratificationPage>, Str::StratificationCaption, 14, false},
+    {&Make<CLeakagePage>, Str::LeakageCaption, 17, true},
 };
 
 } // namespace

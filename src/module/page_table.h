@@ -1,6 +1,8 @@
 // The pages of the sheet, one row a page.
 #pragma once
 
+#include "res/strings.h"
+
 #include <memory>
 #include <span>
 
@@ -10,6 +12,7 @@ class CKavo0_hdDoc;
 struct PageEntry
 {
     std::unique_ptr<CGenPropertyPage> (*make)(CKavo0_hdDoc* document);
+    Str caption;             // of its tab
     int tab;                 // place on the sheet, ascending; NotOnSheet for a page that is only constructed
     bool offersBranchNames;  // inside a project its location grid offers the network's branch names in column 1
 };

@@ -8,6 +8,8 @@
 #include <QStyleOptionTab>
 #include <QStylePainter>
 #include <QTabBar>
+#include <QVBoxLayout>
+#include <algorithm>
 
 namespace {
 
@@ -57,18 +59,35 @@ CDlgPropertySheet::CDlgPropertySheet(CKavo0_hdView* view) : QTabWidget(view), m_
     connect(this, &QTabWidget::currentChanged, this, &CDlgPropertySheet::TabChanged);
 }
 
-void CDlgPropertySheet::AddPage(CGenPropertyPage* page)
+void CDlgPropertySheet::AddPage(Str caption, MakePage make)
 {
-    page->installEventFilter(this);
+    m_tabs.push_back({caption, std::move(make)});
     const QSignalBlocker quiet(this);
-    addTab(page, page->Caption());
+    auto* place = new QWidget;
+    auto* layout = new QVBoxLayout(place);
+    layout->setContentsMargins(0, 0, 0, 0);
+    addTab(place, LoadString(caption));
     if (m_active < 0)
         m_active = 0;
 }
 
 CGenPropertyPage* CDlgPropertySheet::PageAt(int tab) const
 {
-    return qobject_cast<CGenPropertyPage*>(widget(tab));
+    if (tab < 0 || tab >= count())
+        return nullptr;
+    Tab& entry = m_tabs[std::size_t(tab)];
+    if (!entry.page) {
+        entry.page = entry.make().release();
+        entry.page->installEventFilter(const_cast<CDlgPropertySheet*>(this));
+        widget(tab)->layout()->addWidget(entry.page);
+    }
+    return entry.page;
+}
+
+bool CDlgPropertySheet::MakeNextPage() const
+{
+    const auto next = std::find_if(m_tabs.begin(), m_tabs.end(), [](const Tab& tab) { return !tab.page; });
+    return next != m_tabs.end() && PageAt(int(next - m_tabs.begin()));
 }
 
 CGenPropertyPage* CDlgPropertySheet::ActivePage() const
@@ -98,11 +117,6 @@ bool CDlgPropertySheet::SetActivePage(int tab)
     return m_active == tab;
 }
 
-bool CDlgPropertySheet::SetActivePage(CGenPropertyPage* page)
-{
-    return SetActivePage(indexOf(page));
-}
-
 bool CDlgPropertySheet::eventFilter(QObject* watched, QEvent* event)
 {
     // Ctrl+F4 belongs to the document window even while the focus is in a page.
@@ -119,12 +133,6 @@ bool CDlgPropertySheet::eventFilter(QObject* watched, QEvent* event)
 void CDlgPropertySheet::changeEvent(QEvent* event)
 {
     QTabWidget::changeEvent(event);
-    if (event->type() == QEvent::LanguageChange)
-        UpdateCaptions();
-}
-
-void CDlgPropertySheet::UpdateCaptions()
-{
-    for (int i = 0; i < count(); ++i)
-        setTabText(i, PageAt(i)->Caption());
+    for (int tab = 0; event->type() == QEvent::LanguageChange && tab < count(); ++tab)
+        setTabText(tab, LoadString(m_tabs[std::size_t(tab)].caption));
 }

@@ -1,7 +1,10 @@
 // The sheet of parameter pages: one tab a page, named in a column at the left so that all of them are in sight.
 #pragma once
 
+#include "res/strings.h"
+
 #include <QTabWidget>
+#include <functional>
 #include <vector>
 
 class CGenPropertyPage;
@@ -11,25 +14,34 @@ class CDlgPropertySheet : public QTabWidget
 {
     Q_OBJECT
 public:
+    using MakePage = std::function<std::unique_ptr<CGenPropertyPage>()>;
+
     explicit CDlgPropertySheet(CKavo0_hdView* view);
 
-    /// Takes the page over (ownership by the widget tree).
-    void AddPage(CGenPropertyPage* page);
+    /// Adds a tab. Its page is made when it is first asked for, and belongs to the widget tree.
+    void AddPage(Str caption, MakePage make);
     CGenPropertyPage* ActivePage() const;
     CGenPropertyPage* PageAt(int tab) const;
+    /// Makes the next page that has not been made; false when all have.
+    bool MakeNextPage() const;
     int PageCount() const { return count(); }
     /// Switches to a tab; false when the active page refuses to be left.
     bool SetActivePage(int tab);
-    bool SetActivePage(CGenPropertyPage* page);
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
     void changeEvent(QEvent* event) override;
 
 private:
+    struct Tab
+    {
+        Str caption;
+        MakePage make;
+        CGenPropertyPage* page = nullptr;
+    };
     void TabChanged(int tab);
-    void UpdateCaptions();
 
     CKavo0_hdView* m_view;
+    mutable std::vector<Tab> m_tabs; // in the order of the tab bar
     int m_active = -1;
 };

@@ -68,38 +68,45 @@ void CKavo0_hdView::OnInitialUpdate()
     layout->addWidget(m_sheet);
     setFocusProxy(m_sheet);
 
-    MakePages();
-    JoinProject();
+    AddTabs();
+    m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())
         page->OnSetActive();
+    QTimer::singleShot(0, this, &CKavo0_hdView::MakeOtherPages);
 }
 
-void CKavo0_hdView::MakePages()
+void CKavo0_hdView::AddTabs()
 {
-    std::vector<std::pair<int, CGenPropertyPage*>> tabs;
+    std::vector<const PageEntry*> tabs;
     for (const PageEntry& entry : PageTable()) {
-        auto page = entry.make(GetDocument());
-        page->SetHost(this);
-        if (entry.offersBranchNames)
-            m_branchNamePages.push_back(page.get());
-        if (entry.tab == NotOnSheet)
-            m_offSheet.push_back(std::move(page));
-        else
-            tabs.emplace_back(entry.tab, page.release());
+        if (entry.tab != NotOnSheet)
+            tabs.push_back(&entry);
     }
-    std::sort(tabs.begin(), tabs.end());
-    for (const auto& [place, page] : tabs)
-        m_sheet->AddPage(page);
+    std::sort(tabs.begin(), tabs.end(), [](const PageEntry* a, const PageEntry* b) { return a->tab < b->tab; });
+    for (const PageEntry* entry : tabs)
+        m_sheet->AddPage(entry->caption, [this, entry] { return MakePage(*entry); });
 }
 
-void CKavo0_hdView::JoinProject()
+std::unique_ptr<CGenPropertyPage> CKavo0_hdView::MakePage(const PageEntry& entry)
 {
-    if (!GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName()))
+    auto page = entry.make(GetDocument());
+    page->SetHost(this);
+    if (entry.offersBranchNames && m_inProject && page->GetGrid())
+        page->GetGrid()->SetBranchNameColumn(1);
+    return page;
+}
+
+// One page a turn of the event loop: the first page is painted, and answers, before the others are made.
+void CKavo0_hdView::MakeOtherPages()
+{
+    if (m_sheet->MakeNextPage()) {
+        QTimer::singleShot(0, this, &CKavo0_hdView::MakeOtherPages);
         return;
-    for (CGenPropertyPage* page : m_branchNamePages) {
-        if (auto* grid = page->GetGrid())
-            grid->SetBranchNameColumn(1);
+    }
+    for (const PageEntry& entry : PageTable()) {
+        if (entry.tab == NotOnSheet)
+            m_offSheet.push_back(MakePage(entry));
     }
 }
 

@@ -9,6 +9,7 @@
 
 class CDlgPropertySheet;
 class CGenPropertyPage;
+struct PageEntry;
 
 class CKavo0_hdView : public CView, public CCommandTarget, public IPageHost
 {
@@ -54,8 +55,9 @@ private:
         bool asked = false, found = false;
     };
 
-    void MakePages();
-    void JoinProject();
+    void AddTabs();
+    std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
+    void MakeOtherPages();
     void Search();
     void SearchAgain();
     void GotoLine();
@@ -65,7 +67,7 @@ private:
 
     CDlgPropertySheet* m_sheet = nullptr;              // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
-    std::vector<CGenPropertyPage*> m_branchNamePages; // owned by the sheet
+    bool m_inProject = false;
     SearchState m_search;
     bool m_linesEnabled = true;
 };

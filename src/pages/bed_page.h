@@ -15,7 +15,6 @@ class CBedPage : public CLocationPage
 public:
     explicit CBedPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CBedPage() override;
-    QString Caption() const override { return LoadString(Str::BedCaption); }
 
 protected:
     void Retranslate() override;

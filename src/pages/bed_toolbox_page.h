@@ -15,7 +15,6 @@ class CBedToolboxPage : public CLocationPage
 public:
     explicit CBedToolboxPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CBedToolboxPage() override;
-    QString Caption() const override { return LoadString(Str::BedToolboxCaption); }
 
 protected:
     void Retranslate() override;

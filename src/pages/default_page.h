@@ -16,7 +16,6 @@ class CDefaultPage : public CGenPropertyPage
 public:
     explicit CDefaultPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CDefaultPage() override;
-    QString Caption() const override { return LoadString(Str::DefaultCaption); }
 
 protected:
     void Retranslate() override;

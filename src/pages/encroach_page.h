@@ -15,7 +15,6 @@ class CEncroachPage : public CLocationPage
 public:
     explicit CEncroachPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CEncroachPage() override;
-    QString Caption() const override { return LoadString(Str::EncroachCaption); }
     void LoadFromDocument(CKavo0_hdDoc* document) override;
 
 protected:

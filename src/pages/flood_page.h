@@ -15,7 +15,6 @@ class CFloodPage : public CLocationPage
 public:
     explicit CFloodPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CFloodPage() override;
-    QString Caption() const override { return LoadString(Str::FloodCaption); }
 
 protected:
     void Retranslate() override;

@@ -16,7 +16,6 @@ class CHeatBalancePage : public CGenPropertyPage
 public:
     explicit CHeatBalancePage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CHeatBalancePage() override;
-    QString Caption() const override { return LoadString(Str::HeatBalanceCaption); }
 
 protected:
     void Retranslate() override;

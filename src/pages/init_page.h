@@ -15,7 +15,6 @@ class CInitPage : public CLocationPage
 public:
     explicit CInitPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CInitPage() override;
-    QString Caption() const override { return LoadString(Str::InitialCaption); }
 
 protected:
     void Retranslate() override;

@@ -15,7 +15,6 @@ class CLeakagePage : public CLocationPage
 public:
     explicit CLeakagePage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CLeakagePage() override;
-    QString Caption() const override { return LoadString(Str::LeakageCaption); }
 
 protected:
     void Retranslate() override;

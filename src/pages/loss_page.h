@@ -15,7 +15,6 @@ class CLossPage : public CLocationPage
 public:
     explicit CLossPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CLossPage() override;
-    QString Caption() const override { return LoadString(Str::LossCaption); }
 
 protected:
     void Retranslate() override;

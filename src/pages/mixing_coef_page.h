@@ -15,7 +15,6 @@ class CMixingCoefPage : public CLocationPage
 public:
     explicit CMixingCoefPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CMixingCoefPage() override;
-    QString Caption() const override { return LoadString(Str::MixingCaption); }
 
 protected:
     void Retranslate() override;

@@ -15,7 +15,6 @@ class CQuasiPage : public CLocationPage
 public:
     explicit CQuasiPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CQuasiPage() override;
-    QString Caption() const override { return LoadString(Str::QuasiCaption); }
 
 protected:
     void Retranslate() override;

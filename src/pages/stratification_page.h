@@ -16,7 +16,6 @@ class CStratificationPage : public CGenPropertyPage
 public:
     explicit CStratificationPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CStratificationPage() override;
-    QString Caption() const override { return LoadString(Str::StratificationCaption); }
 
 protected:
     void Retranslate() override;

@@ -15,7 +15,6 @@ class CWavePage : public CLocationPage
 public:
     explicit CWavePage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CWavePage() override;
-    QString Caption() const override { return LoadString(Str::WaveCaption); }
 
 protected:
     void Retranslate() override;

@@ -15,7 +15,6 @@ class CWindPage : public CLocationPage
 public:
     explicit CWindPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CWindPage() override;
-    QString Caption() const override { return LoadString(Str::WindCaption); }
 
 protected:
     void Retranslate() override;

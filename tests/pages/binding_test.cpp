@@ -23,7 +23,6 @@ public:
         Bindings().EnableWhen([this] { return box.isChecked(); }, {&number});
         Bindings().ShowWhen([this] { return Globals().iLevelDepth == 1; }, {&hidden});
     }
-    QString Caption() const override { return {}; }
 
     QCheckBox box;
     CKsEditLong integer;

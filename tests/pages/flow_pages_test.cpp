@@ -139,8 +139,8 @@ TEST_F(FlowPagesTest, AWrongIntegerKeepsThePage)
 TEST_F(FlowPagesTest, TheSheetStaysOnAPageWithAWrongEntry)
 {
     CDlgPropertySheet sheet(nullptr);
-    sheet.AddPage(new CDefaultPage(&document));
-    sheet.AddPage(new CHeatBalancePage(&document));
+    sheet.AddPage(Str::DefaultCaption, [this] { return std::make_unique<CDefaultPage>(&document); });
+    sheet.AddPage(Str::HeatBalanceCaption, [this] { return std::make_unique<CHeatBalancePage>(&document); });
     sheet.show();
     sheet.activateWindow();
     ASSERT_TRUE(QTest::qWaitForWindowActive(&sheet));

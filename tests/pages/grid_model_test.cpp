@@ -183,7 +183,6 @@ TEST_F(ModelTest, LockedCells)
                 &HD_Initial::InitialH,
                 {.locked = [](const HD_RiverPos& record) { return record.RiverName == "FIXED"; }});
         }
-        QString Caption() const override { return {}; }
     };
     Add("FIXED", 1, 2);
     Add("FREE", 1, 2);

@@ -77,7 +77,6 @@ public:
                 columns.Value(field,
                               {.header = [name = std::string(field.name)] { return QString::fromStdString(name); }});
     }
-    QString Caption() const override { return {}; }
 };
 
 class PageTest : public testing::Test

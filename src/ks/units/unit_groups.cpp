@@ -43,11 +43,17 @@ constexpr std::array Groups{
     KsUnitGroupRow{UnitGroup::LeakageCoefficient, "leakage coefficient", AsStored, AsStored, AsStored},
 };
 
+/// Nothing to convert: one spelling, or none at all.
+bool IsSame(const KsUnit& base, const KsUnit& display)
+{
+    return !base.spelling || base.spelling == display.spelling;
+}
+
 using UnitPtr = std::unique_ptr<ut_unit, decltype(&ut_free)>;
 
 double FactorToBase(ut_system* system, const KsUnitGroupRow& row, const KsUnit& display)
 {
-    if (!row.base.spelling || row.base.spelling == display.spelling)
+    if (IsSame(row.base, display))
         return 1;
     const UnitPtr from(ut_parse(system, display.spelling, UT_ASCII), ut_free);
     const UnitPtr to(ut_parse(system, row.base.spelling, UT_ASCII), ut_free);
@@ -103,10 +109,10 @@ const KsUnitGroupRow* KsFindUnitGroup(UnitGroup group)
 
 KsConversion KsUnitConversion(UnitGroup group, KsUnitSystem system)
 {
-    static const Conversions conversions;
     const KsUnitGroupRow* row = KsFindUnitGroup(group);
-    if (!row)
+    if (!row || IsSame(row->base, row->Display(system)))
         return {};
+    static const Conversions conversions; // reading the unit definitions takes time that metric users need not spend
     const auto& pair = conversions.pairs[std::size_t(row - Groups.data())];
     return system == KsUnitSystem::Metric ? pair.metric : pair.usCustomary;
 }

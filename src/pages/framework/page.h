@@ -36,8 +36,6 @@ public:
     bool CommitGrids();
     /// The list that the page's grid edits; null without one.
     virtual CGenList* GetList() const { return nullptr; }
-    /// Tab caption in the user's language.
-    virtual QString Caption() const = 0;
 
     // What the grid, the view and other editors' messages call. Rows count from 1.
     virtual void InsertLocation(const QString& riverName, const QString& chainageText);
