@@ -8,14 +8,22 @@
 
 namespace {
 
+/// One object for the whole run: it writes when the program is idle, a short-lived one would write to disk at once.
+QSettings& UserSettings()
+{
+    static QSettings settings;
+    return settings;
+}
+
 QStringList Read()
 {
-    return QSettings().value(Settings::RecentFiles).toStringList();
+    return UserSettings().value(Settings::RecentFiles).toStringList();
 }
 
 void Write(const QStringList& files)
 {
-    QSettings().setValue(Settings::RecentFiles, files);
+    if (files != Read())
+        UserSettings().setValue(Settings::RecentFiles, files);
 }
 
 } // namespace

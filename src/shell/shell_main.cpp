@@ -56,12 +56,10 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
     CMainFrame frame;
     frame.LoadPlugins(parser.value(plugins));
     frame.show();
-    QTimer::singleShot(0, &frame, [&] {
-        const QStringList files = parser.positionalArguments();
-        for (const QString& file : files)
-            frame.OpenFile(QDir::current().absoluteFilePath(file));
-        if (onStarted)
-            onStarted(frame);
-    });
+    // Before control returns to the event loop: the first thing painted is the first page, not an empty frame.
+    for (const QString& file : parser.positionalArguments())
+        frame.OpenFile(QDir::current().absoluteFilePath(file));
+    if (onStarted)
+        QTimer::singleShot(0, &frame, [&] { onStarted(frame); });
     return QApplication::exec();
 }

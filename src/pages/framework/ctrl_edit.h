@@ -17,6 +17,8 @@ public:
     void Setup(double* value, int textLimit, int decimals, bool generalNotation, UnitGroup group, int unit = -1);
     /// Bounds of what may be typed, in base units.
     void SetRange(bool hasMinimum, double minimum, bool hasMaximum, double maximum);
+    /// The page goes; the field lets the value be.
+    void Unbind() { m_value = nullptr; }
     /// How an accepted number gets into the document; without it the bound value is simply set.
     void SetStore(std::function<void(double& target, double value)> store) { m_store = std::move(store); }
 

@@ -19,9 +19,18 @@ namespace {
 
 constexpr int NumberColumnWidth = 40;
 // Pixels of the font that the columns' widths are meant for: its height, and the mean width of the Latin letters.
-constexpr int RowsMeasured = 100;  // for the first widths of the columns; the user may change them
+constexpr int RowsMeasured = 30;   // for the first widths of the columns; the user may change them
 constexpr int MostOfAWindow = 320; // pixels that a long name may take at the start
 constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
+
+/// The row numbers. They are as wide as the grid says: measuring texts of many rows, as the base does whenever the table is
+/// laid out, would cost more than all the rest of showing it.
+class RowNumbers : public QHeaderView
+{
+public:
+    explicit RowNumbers(QWidget* parent) : QHeaderView(Qt::Vertical, parent) { setSectionsClickable(true); }
+    QSize sizeHint() const override { return {minimumWidth(), QHeaderView::minimumSizeHint().height()}; }
+};
 
 double FontScale(const QWidget& widget)
 {
@@ -47,6 +56,7 @@ CGenGrid::CGenGrid(QWidget* parent)
     QSizePolicy policy = sizePolicy();
     policy.setRetainSizeWhenHidden(true); // a hidden grid leaves the rest of the page where it is
     setSizePolicy(policy);
+    setVerticalHeader(new RowNumbers(this));
     verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     verticalHeader()->setHighlightSections(false);
     verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);

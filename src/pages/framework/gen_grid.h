@@ -23,6 +23,9 @@ public:
     void SetOwnerPage(CGenPropertyPage* page);
     /// A further grid of the page, of something else than locations.
     void SetPartOfPage(CGenPropertyPage* page);
+    /// The page goes; nothing is reported or stored any more.
+    void LeavePage() { m_page = nullptr; }
+    bool HasPage() const { return m_page; }
     CGridModel* Model() const { return m_model; }
     CGridDelegate* Delegate() const { return m_delegate; }
 

@@ -1,6 +1,7 @@
 #include "pages/framework/page.h"
 
 #include "module/document.h"
+#include "pages/framework/ctrl_edit.h"
 #include "pages/framework/gen_grid.h"
 
 #include <QApplication>
@@ -13,7 +14,14 @@ CGenPropertyPage::CGenPropertyPage(CKavo0_hdDoc* document, QWidget* parent)
     connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CGenPropertyPage::UnitsChanged);
 }
 
-CGenPropertyPage::~CGenPropertyPage() = default;
+CGenPropertyPage::~CGenPropertyPage()
+{
+    // The controls go after the page, and a cell or field that is being edited must not report to it then.
+    for (auto* grid : findChildren<CGenGrid*>())
+        grid->LeavePage();
+    for (auto* field : findChildren<CCtrlEdit*>())
+        field->Unbind();
+}
 
 HD_Global_Var& CGenPropertyPage::Globals() const
 {
