@@ -119,16 +119,16 @@
             <translation>Ma&amp;ximum resistance:</translation>
         </message>
         <message>
-            <source>Resistance over velocity</source>
-            <translation>Resistance over velocity</translation>
-        </message>
-        <message>
             <source>Local Values</source>
             <translation>Local Values</translation>
         </message>
         <message>
-            <source>Resistance over velocity of the current line</source>
-            <translation>Resistance over velocity of the current line</translation>
+            <source>Velocity table</source>
+            <translation>Velocity table</translation>
+        </message>
+        <message>
+            <source>Velocity table of the current line</source>
+            <translation>Velocity table of the current line</translation>
         </message>
     </context>
     <context>
@@ -472,16 +472,16 @@
             <translation>Mixing coefficient f&amp;4:</translation>
         </message>
         <message>
-            <source>Mixing coefficient over width-depth ratio</source>
-            <translation>Mixing coefficient over width-depth ratio</translation>
-        </message>
-        <message>
             <source>Local Values</source>
             <translation>Local Values</translation>
         </message>
         <message>
-            <source>Mixing coefficient over width-depth ratio of the current line</source>
-            <translation>Mixing coefficient over width-depth ratio of the current line</translation>
+            <source>Table over the width-depth ratio</source>
+            <translation>Table over the width-depth ratio</translation>
+        </message>
+        <message>
+            <source>Table of the current line</source>
+            <translation>Table of the current line</translation>
         </message>
     </context>
     <context>

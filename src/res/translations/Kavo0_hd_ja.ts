@@ -119,16 +119,16 @@
             <translation>最大抵抗値(&amp;X):</translation>
         </message>
         <message>
-            <source>Resistance over velocity</source>
-            <translation>流速と抵抗値</translation>
-        </message>
-        <message>
             <source>Local Values</source>
             <translation>地点別の値</translation>
         </message>
         <message>
-            <source>Resistance over velocity of the current line</source>
-            <translation>現在行の流速と抵抗値</translation>
+            <source>Velocity table</source>
+            <translation>流速の表</translation>
+        </message>
+        <message>
+            <source>Velocity table of the current line</source>
+            <translation>現在行の流速の表</translation>
         </message>
     </context>
     <context>
@@ -472,16 +472,16 @@
             <translation>混合係数f4(&amp;4):</translation>
         </message>
         <message>
-            <source>Mixing coefficient over width-depth ratio</source>
-            <translation>川幅水深比と混合係数</translation>
-        </message>
-        <message>
             <source>Local Values</source>
             <translation>地点別の値</translation>
         </message>
         <message>
-            <source>Mixing coefficient over width-depth ratio of the current line</source>
-            <translation>現在行の川幅水深比と混合係数</translation>
+            <source>Table over the width-depth ratio</source>
+            <translation>川幅水深比の表</translation>
+        </message>
+        <message>
+            <source>Table of the current line</source>
+            <translation>現在行の表</translation>
         </message>
     </context>
     <context>
