@@ -37,6 +37,7 @@ public:
     /// Gives an empty list the one line that its page shows. The line is no change of the document: neither the
     /// modified flag nor undo sees it, and a save removes it again while it is untouched.
     void AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record);
+    void RemovePlaceholders();
     /// Whatever edits or removes a record says so: a placeholder becomes an ordinary line.
     void PlaceholderTouched(const HD_RiverPos& record) { m_placeholders.erase(&record); }
 
@@ -58,7 +59,6 @@ private:
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);
     void RemoveOldSpelling(const CString& target);
-    void RemovePlaceholders();
     LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name);
 
     HD_Parameters m_parameters;

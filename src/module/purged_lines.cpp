@@ -38,6 +38,7 @@ void CPurgedLines::Apply()
 
 void CPurgedLines::Revert()
 {
+    m_document.RemovePlaceholders(); // an emptied list may show one by now
     for (List& purged : m_lists) {
         auto kept = purged.list->RemoveAt(0, purged.list->GetCount());
         std::vector<std::unique_ptr<HD_RiverPos>> all;

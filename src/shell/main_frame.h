@@ -63,6 +63,7 @@ private:
     void OnFileSaveAs();
     void OnFileClose();
     void OnFileExit();
+    void StoreTyping();
     void OnUndo();
     void OnRedo();
     void OnCut();

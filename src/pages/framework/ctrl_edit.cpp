@@ -11,6 +11,7 @@
 CCtrlEdit::CCtrlEdit(QWidget* parent) : QLineEdit(parent)
 {
     setAlignment(Qt::AlignRight);
+    setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed); // a number needs no more room in a wide window
 }
 
 void CCtrlEdit::Setup(double* value, int textLimit, int decimals, bool generalNotation, UnitGroup group, int unit)

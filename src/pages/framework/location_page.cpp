@@ -1,6 +1,7 @@
 #include "pages/framework/location_page.h"
 
 #include "ks/fc/message_box.h"
+#include "ks/fc/wnd_resizer.h"
 #include "module/list_rows.h"
 
 #include <QUndoStack>
@@ -77,6 +78,7 @@ CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList* list, QWidget* pa
 GridColumns CLocationPage::Grid(CGenGrid* grid)
 {
     grid->SetOwnerPage(this);
+    CWndResizer(this).SetAnchor(grid, CWndResizer::All);
     ShowList(m_list);
     connect(grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this, &CLocationPage::ShowParts);
     return GridColumns(*grid);
