@@ -62,7 +62,7 @@ TEST_F(GridKeyTest, BehindTheLastCellALineIsAppended)
     globals.G_waterlevel = 7;
     EXPECT_EQ(From(2, 4, Qt::Key_Tab), std::pair(3, 1));
     EXPECT_EQ(Texts(3), "||7.000|0.000");
-    EXPECT_EQ(view->commands, QList<int>());
+    EXPECT_TRUE(view->commands.isEmpty());
     grid->SetAppendThroughPage(false);
     EXPECT_EQ(From(3, 4, Qt::Key_Return), std::pair(4, 1));
     EXPECT_EQ(view->commands, QList<int>{Command::InsertLine});
