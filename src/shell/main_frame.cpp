@@ -1,5 +1,6 @@
 #include "shell/main_frame.h"
 
+#include "ks/fc/exports.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 #include "shell/settings_keys.h"
@@ -50,6 +51,7 @@ CMainFrame::CMainFrame() : m_bars(this)
 CMainFrame::~CMainFrame()
 {
     DestroyWindows(); // while this still answers the editors' messages
+    KsClearExports();
     for (const auto& plugin : m_plugins)
         plugin->templates.clear();
 }
@@ -84,7 +86,7 @@ void CMainFrame::UpdatePluginLabel()
 
 LRESULT CMainFrame::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
 {
-    const auto* package = reinterpret_cast<const CKSComm_Package*>(lParam);
+    auto* package = reinterpret_cast<CKSComm_Package*>(lParam);
     if (message == KsMessage::ShowToolbar() || message == KsMessage::HideToolbar()) {
         m_bars.Show(package ? package->view : GetActiveView(), message == KsMessage::ShowToolbar());
         return 0;
@@ -92,7 +94,7 @@ LRESULT CMainFrame::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
     if (package && message == KsMessage::SwitchBoard())
         return m_projects.SwitchBoard(wParam, *package);
     if (package && message == KsMessage::BetweenEditors())
-        m_projects.Forward(message, wParam, *package);
+        m_projects.Forward(wParam, *package);
     return CKsMDIFrameWnd::WindowProc(message, wParam, lParam);
 }
 

@@ -1,5 +1,7 @@
 #include "shell/plugin_loader.h"
 
+#include "ks/fc/exports.h"
+
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
@@ -72,6 +74,8 @@ std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
     }
     plugin->UpdateName();
     plugin->error = TakeTemplates(*plugin);
+    if (plugin->IsUsable())
+        KsAddExports([file](const char* name) { return QLibrary::resolve(file, name); });
     return plugin;
 }
 

@@ -1,11 +1,13 @@
 #include "shell/projects.h"
 
+#include "ks/fc/exchange.h"
 #include "tql/tql.h"
 
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -124,9 +126,39 @@ const CProject* CProjects::FindByMember(const QString& path) const
     return nullptr;
 }
 
-LRESULT CProjects::SwitchBoard(WPARAM request, const CKSComm_Package& package)
+/// Views of the project's documents but the sender's.
+std::vector<QPointer<CView>> CProjects::Others(const CKSComm_Package& package) const
 {
-    if (request == KsRequest::JoinProject) {
+    std::vector<QPointer<CView>> others;
+    const CProject* project = Find(package.project);
+    if (!project)
+        return others;
+    // The sender's package may name no view, so its document is known by its path.
+    const QString sender = FileKey(package.text);
+    std::copy_if(project->views.begin(), project->views.end(), std::back_inserter(others), [&](const auto& view) {
+        return view && view != package.view && view->GetDocument() &&
+               FileKey(view->GetDocument()->GetPathName()) != sender;
+    });
+    return others;
+}
+
+/// Asks the other views, all of them or until one has an answer.
+LRESULT CProjects::Ask(WPARAM request, CKSComm_Package& package, bool all)
+{
+    LRESULT answered = 0;
+    for (const QPointer<CView>& view : Others(package)) { // a copy: a receiver may leave
+        if (!all && answered)
+            break;
+        if (KsSendMessage(view, KsMessage::BetweenEditors(), request, reinterpret_cast<LPARAM>(&package)))
+            answered = 1;
+    }
+    return answered;
+}
+
+LRESULT CProjects::SwitchBoard(WPARAM request, CKSComm_Package& package)
+{
+    switch (request) {
+    case KsRequest::JoinProject: {
         const CProject* found = package.text.isEmpty() ? nullptr : FindByMember(package.text);
         if (!found)
             return 0;
@@ -135,25 +167,37 @@ LRESULT CProjects::SwitchBoard(WPARAM request, const CKSComm_Package& package)
             project->views.emplace_back(package.view);
         return project->handle;
     }
-    if (request == KsRequest::LeaveProject) {
+    case KsRequest::LeaveProject:
         if (CProject* project = FindForChange(package.project))
             std::erase_if(project->views, [&](const QPointer<CView>& view) { return !view || view == package.view; });
+        return 0;
+    case KsRequest::LoadLocations:
+    case KsRequest::BranchNames:
+        return package.objects ? Ask(request, package, true) : 0;
+    case KsRequest::LoadLocationsAndChannel:
+        if (!package.objects || !Ask(KsRequest::LoadLocations, package, true))
+            return 0;
+        Ask(request, package, true);
+        return 1;
+    case KsRequest::FetchLocation:
+        return package.objects ? Ask(request, package, false) : 0;
+    case KsRequest::ProjectViews:
+        if (!package.objects)
+            return 0;
+        for (const QPointer<CView>& view : Others(package)) {
+            auto item = std::make_unique<CKvrCBEView>();
+            item->view = view;
+            package.objects->push_back(std::move(item));
+        }
+        return 1;
+    default:
+        qDebug("switchboard: unknown request %llu", static_cast<unsigned long long>(request));
+        return 0;
     }
-    return 0;
 }
 
-void CProjects::Forward(unsigned message, WPARAM request, const CKSComm_Package& package)
+void CProjects::Forward(WPARAM request, CKSComm_Package& package)
 {
-    const CProject* project = Find(package.project);
-    if (request != KsRequest::DataChanged || !project)
-        return;
-    const auto views = project->views; // a receiver may leave
-    const QString sender = FileKey(package.text);
-    for (const QPointer<CView>& view : views) {
-        // The sender's package may name no view, so its document is known by its path.
-        if (!view || view == package.view || !view->GetDocument() ||
-            FileKey(view->GetDocument()->GetPathName()) == sender)
-            continue;
-        KsSendMessage(view, message, request, reinterpret_cast<LPARAM>(&package));
-    }
+    if (request == KsRequest::DataChanged || request == KsRequest::LocationShown)
+        Ask(request, package, true);
 }

@@ -37,13 +37,14 @@ public:
     const CProject* FindByMember(const QString& path) const;
     const std::vector<std::unique_ptr<CProject>>& All() const { return m_projects; }
 
-    /// Answers the switchboard: 25 with the handle of the project that the package's file is a member of or 0, 24 takes
-    /// the package's view out of its project. The package is not kept.
-    LRESULT SwitchBoard(WPARAM request, const CKSComm_Package& package);
-    /// Hands a change of data on to every other document's view of the package's project.
-    void Forward(unsigned message, WPARAM request, const CKSComm_Package& package);
+    /// Answers the switchboard (KsRequest). The package is not kept.
+    LRESULT SwitchBoard(WPARAM request, CKSComm_Package& package);
+    /// Hands news of a document (KsRequest) on to the views of the other documents of the package's project.
+    void Forward(WPARAM request, CKSComm_Package& package);
 
 private:
+    std::vector<QPointer<CView>> Others(const CKSComm_Package& package) const;
+    LRESULT Ask(WPARAM request, CKSComm_Package& package, bool all);
     CProject* FindForChange(CProjectHandle handle);
     std::vector<std::unique_ptr<CProject>> m_projects; // in the order of opening
     CProjectHandle m_last = 0;

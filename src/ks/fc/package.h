@@ -27,4 +27,5 @@ public:
     CString text;              // a document's path name
     int kind = 0;              // 8: HD parameters
     std::intptr_t project = 0; // handle from joining, 0 for none
+    CObList* objects = nullptr; // the sender's list, for what the request asks or brings; null for none
 };
