@@ -225,10 +225,14 @@ constexpr Field textOutItem[] = {Choice<&CTextOutItem::Item>("Item"), Text<&CTex
                                  Integer<&CTextOutItem::Decimals>("Decimals")};
 constexpr Field textAutoFile[] = {Text<&CTextAutoFile::Format>("Format"), Boolean<&CTextAutoFile::AutoName>("AutoName"),
                                   FileName<&CTextAutoFile::FileName>("FileName")};
-constexpr GroupAccess textOutItems = GroupOf<std::vector<CTextOutItem>>(textOutItem);
-constexpr GroupAccess textAutoFiles = GroupOf<std::vector<CTextAutoFile>>(textAutoFile);
-constexpr Field textLists[] = {Group<&G::TextOutput, &O::OutputItems>("OutputItems", textOutItems),
-                               Group<&G::TextOutput, &O::OutputFiles>("OutputFiles", textAutoFiles)};
+
+} // namespace
+constexpr GroupAccess TextOutItems = GroupOf<std::vector<CTextOutItem>>(textOutItem);
+constexpr GroupAccess TextAutoFiles = GroupOf<std::vector<CTextAutoFile>>(textAutoFile);
+namespace {
+
+constexpr Field textLists[] = {Group<&G::TextOutput, &O::OutputItems>("OutputItems", TextOutItems),
+                               Group<&G::TextOutput, &O::OutputFiles>("OutputFiles", TextAutoFiles)};
 
 // Files from before ground elevations could come from a DEM have no use for the three keywords that refine it.
 constexpr std::string_view groundElevation = "ApplyDemGroundElevation";
@@ -259,10 +263,14 @@ constexpr Field mapsOutput[] = {Number<&R::XOrigin>("XOrigin", U::Coordinate),
                                 DateTime<&R::EndTime>("EndTime")};
 constexpr Field mapsInput[] = {FileName<&CMapsInput::FileName>("FileName"), Integer<&CMapsInput::ItemNo>("ItemNo"),
                                Integer<&CMapsInput::Order>("Order")};
-constexpr GroupAccess mapsOutputs = GroupOf<std::vector<CMapsOutput>>(mapsOutput);
-constexpr GroupAccess mapsInputs = GroupOf<std::vector<CMapsInput>>(mapsInput);
-constexpr Field mapLists[] = {Group<&G::MapOutput, &M::MapOutputFiles>("MapOutputFiles", mapsOutputs),
-                              Group<&G::MapOutput, &M::DemInputFiles>("DemInputFiles", mapsInputs)};
+
+} // namespace
+constexpr GroupAccess MapsOutputs = GroupOf<std::vector<CMapsOutput>>(mapsOutput);
+constexpr GroupAccess MapsInputs = GroupOf<std::vector<CMapsInput>>(mapsInput);
+namespace {
+
+constexpr Field mapLists[] = {Group<&G::MapOutput, &M::MapOutputFiles>("MapOutputFiles", MapsOutputs),
+                              Group<&G::MapOutput, &M::DemInputFiles>("DemInputFiles", MapsInputs)};
 
 using L = HDLeakageGlobal;
 constexpr GlobalKeyword leakage[] = {

@@ -224,6 +224,9 @@ private:
     std::map<const GlobalKeyword*, ExtraParams> m_extra;
 };
 
+// The elements of the lists without locations.
+extern const GroupAccess TextOutItems, TextAutoFiles, MapsOutputs, MapsInputs;
+
 /// The section of a file that holds the global values.
 inline constexpr std::string_view HDGlobalSectionName = "Global_Variables";
 /// The keyword that holds one element of an item sub-section.

@@ -5,6 +5,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/package.h"
 #include "module/purged_lines.h"
+#include "module/row_source.h"
 #include "res/strings.h"
 
 #include <QApplication>
@@ -163,8 +164,15 @@ void CKavo0_hdDoc::AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> r
     list.InsertAt(0, std::move(record));
 }
 
+void CKavo0_hdDoc::CleanAtSave(std::shared_ptr<IRowSource> rows, std::function<bool(const void* row)> isIncomplete)
+{
+    m_cleanedRows.push_back({std::move(rows), std::move(isIncomplete)});
+}
+
 void CKavo0_hdDoc::RemovePlaceholders()
 {
+    for (const CCleanedRows& cleaned : m_cleanedRows)
+        cleaned.rows->TakeFirstRow();
     const auto removeFrom = [this](CGenList& list) {
         if (list.GetCount() == 1 && list.GetAt(0).IsBlank() && m_placeholders.erase(&list.GetAt(0)))
             list.RemoveAt(0);
@@ -180,6 +188,7 @@ void CKavo0_hdDoc::DeleteContents()
 {
     UndoStack().clear();
     m_placeholders.clear();
+    m_placeholderRows.clear();
     m_parameters.RemoveAllRecords();
     CKsDoc::DeleteContents();
 }

@@ -5,9 +5,13 @@
 #include "ks/fc/doc.h"
 
 #include <cstdint>
+#include <functional>
+#include <memory>
 #include <unordered_set>
+#include <vector>
 
 class CPurgedLines;
+class IRowSource;
 
 class CKavo0_hdDoc : public CKsDoc
 {
@@ -41,6 +45,21 @@ public:
     /// Whatever edits or removes a record says so: a placeholder becomes an ordinary line.
     void PlaceholderTouched(const HD_RiverPos& record) { m_placeholders.erase(&record); }
 
+    // Likewise for a list without locations, named by its address.
+    void AddPlaceholderRow(const void* rows) { m_placeholderRows.insert(rows); }
+    bool IsPlaceholderRow(const void* rows) const { return m_placeholderRows.contains(rows); }
+    void PlaceholderRowTouched(const void* rows) { m_placeholderRows.erase(rows); }
+
+    /// From now on a save leaves out the rows that are incomplete, as one step to undo. For lists without locations:
+    /// a page says so when it shows one, and tells the user on the page.
+    void CleanAtSave(std::shared_ptr<IRowSource> rows, std::function<bool(const void* row)> isIncomplete);
+    struct CCleanedRows
+    {
+        std::shared_ptr<IRowSource> rows;
+        std::function<bool(const void* row)> isIncomplete;
+    };
+    const std::vector<CCleanedRows>& CleanedRows() const { return m_cleanedRows; }
+
     /// Sends a request to the shell's switchboard; its answer, 0 outside a project.
     LRESULT AskShell(WPARAM request, CView* view);
 
@@ -66,6 +85,8 @@ private:
     std::intptr_t m_hProject = 0;
     bool m_unreadable = false; // the file at m_strFilePath could not be parsed
     std::unordered_set<const HD_RiverPos*> m_placeholders;
+    std::unordered_set<const void*> m_placeholderRows;
+    std::vector<CCleanedRows> m_cleanedRows;
 };
 
 /// Update hints of the document.

@@ -63,16 +63,16 @@ ChangePlace CDeleteLines::Apply()
     for (std::size_t i = 0; i < m_count; ++i)
         m_rows->Touch(m_rows->KeyAt(m_row + i));
     m_lines = m_rows->Take(m_row, m_count);
-    m_replaced = m_rows->Count() == 0 && m_replacement;
+    m_replaced = m_rows->IsEmpty() && m_replacement;
     if (m_replaced)
-        m_rows->Put(0, std::move(m_replacement));
+        m_rows->Put(m_rows->FixedRows(), std::move(m_replacement));
     return PlaceOf(*m_rows, m_row, 1);
 }
 
 ChangePlace CDeleteLines::Revert()
 {
     if (m_replaced)
-        m_replacement = m_rows->Take(0, 1);
+        m_replacement = m_rows->Take(m_rows->FixedRows(), 1);
     m_row = m_rows->Put(m_row, std::move(m_lines));
     return PlaceOf(*m_rows, m_row, 1);
 }

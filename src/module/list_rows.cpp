@@ -76,7 +76,56 @@ private:
     CGenList& m_list;
 };
 
+/// Rows are counted with the fixed one; the list counts without it.
+class CGlobalAndListRows : public IRowSource
+{
+public:
+    CGlobalAndListRows(std::shared_ptr<IRowSource> lines, void* globals) : m_lines(std::move(lines)), m_globals(globals)
+    {
+    }
+
+    std::size_t FixedRows() const override { return 1; }
+    std::size_t Count() const override { return 1 + m_lines->Count(); }
+    void* At(std::size_t row) override { return row == 0 ? m_globals : m_lines->At(row - 1); }
+    std::uint64_t Revision() const override { return m_lines->Revision(); }
+
+    RowKey KeyAt(std::size_t row) override { return row == 0 ? GlobalKey() : m_lines->KeyAt(row - 1); }
+    void* Object(RowKey key) override { return key == GlobalKey() ? m_globals : m_lines->Object(key); }
+    std::size_t RowOf(RowKey key, std::size_t hint) override
+    {
+        return key == GlobalKey() ? 0 : 1 + m_lines->RowOf(key, hint > 0 ? hint - 1 : 0);
+    }
+    void Touch(RowKey key) override
+    {
+        if (key != GlobalKey())
+            m_lines->Touch(key);
+    }
+
+    std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override { return m_lines->NewRows(count); }
+    std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
+    {
+        return 1 + m_lines->Put(row > 0 ? row - 1 : 0, std::move(block));
+    }
+    std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
+    {
+        return m_lines->Take(row - 1, count);
+    }
+    void AddFirstRow(std::unique_ptr<IRowBlock> block) override { m_lines->AddFirstRow(std::move(block)); }
+    CGenList* List() const override { return m_lines->List(); }
+
+private:
+    RowKey GlobalKey() const { return reinterpret_cast<RowKey>(m_globals); }
+
+    std::shared_ptr<IRowSource> m_lines;
+    void* m_globals;
+};
+
 } // namespace
+
+std::shared_ptr<IRowSource> MakeGlobalAndListRows(CKavo0_hdDoc& document, CGenList& list, void* globals)
+{
+    return std::make_shared<CGlobalAndListRows>(MakeListRows(document, list), globals);
+}
 
 std::shared_ptr<IRowSource> MakeListRows(CKavo0_hdDoc& document, CGenList& list)
 {

@@ -7,3 +7,6 @@ class CKavo0_hdDoc;
 
 /// `list` is one of the document's lists.
 std::shared_ptr<IRowSource> MakeListRows(CKavo0_hdDoc& document, CGenList& list);
+
+/// The same behind one fixed row, whose object is `globals`: something else than a record, which the columns know.
+std::shared_ptr<IRowSource> MakeGlobalAndListRows(CKavo0_hdDoc& document, CGenList& list, void* globals);

@@ -9,11 +9,16 @@
 #include "pages/init_page.h"
 #include "pages/leakage_page.h"
 #include "pages/loss_page.h"
+#include "pages/maps_page.h"
 #include "pages/mixing_coef_page.h"
 #include "pages/quasi_page.h"
 #include "pages/stratification_page.h"
+#include "pages/text_output_page.h"
 #include "pages/wave_page.h"
 #include "pages/wind_page.h"
+#include "pages/wl_curve_page.h"
+#include "pages/wl_mark_page.h"
+#include "pages/wl_sand_bars_page.h"
 
 namespace {
 
@@ -33,10 +38,15 @@ constexpr PageEntry Pages[] = {
     {&Make<CQuasiPage>, Str::QuasiCaption, 7, true},
     {&Make<CFloodPage>, Str::FloodCaption, 10, true},
     {&Make<CMixingCoefPage>, Str::MixingCaption, 20, true},
+    {&Make<CWLMarkPage>, Str::WLMarkCaption, 11, true},
     {&Make<CLossPage>, Str::LossCaption, NotOnSheet, false},
+    {&Make<CWLCurvePage>, Str::WLCurveCaption, 21, true},
+    {&Make<CWLSandBarsPage>, Str::WLSandBarsCaption, 22, true},
     {&Make<CEncroachPage>, Str::EncroachCaption, 12, true},
     {&Make<CHeatBalancePage>, Str::HeatBalanceCaption, 13, false},
     {&Make<CStratificationPage>, Str::StratificationCaption, 14, false},
+    {&Make<CTextOutputPage>, Str::TextOutputCaption, 15, true},
+    {&Make<CMapsPage>, Str::MapsCaption, 16, false},
     {&Make<CLeakagePage>, Str::LeakageCaption, 17, true},
 };
 

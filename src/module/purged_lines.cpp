@@ -10,6 +10,24 @@ CPurgedLines::CPurgedLines(CKavo0_hdDoc& document) : m_document(document)
 
 void CPurgedLines::Apply()
 {
+    PurgeLists();
+    PurgeRows();
+    m_applied = true;
+}
+
+void CPurgedLines::PurgeRows()
+{
+    m_rows.clear();
+    for (const auto& cleaned : m_document.CleanedRows()) {
+        for (std::size_t index = cleaned.rows->Count(); index-- > 0;) {
+            if (cleaned.isIncomplete(cleaned.rows->At(index)))
+                m_rows.push_back({cleaned.rows, index, cleaned.rows->Take(index, 1)});
+        }
+    }
+}
+
+void CPurgedLines::PurgeLists()
+{
     m_lists.clear();
     for (const ListEntry& entry : HDLists()) {
         if (!entry.purgedAtSave)
@@ -33,7 +51,6 @@ void CPurgedLines::Apply()
         list.InsertAt(0, std::move(kept));
         m_lists.push_back(std::move(purged));
     }
-    m_applied = true;
 }
 
 void CPurgedLines::Revert()
@@ -52,6 +69,8 @@ void CPurgedLines::Revert()
         std::move(next, kept.end(), std::back_inserter(all));
         purged.list->InsertAt(0, std::move(all));
     }
+    for (auto taken = m_rows.rbegin(); taken != m_rows.rend(); ++taken)
+        taken->source->Put(taken->index, std::move(taken->row));
     m_applied = false;
 }
 

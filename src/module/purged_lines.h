@@ -2,6 +2,7 @@
 #pragma once
 
 #include "data/hd_parameters.h"
+#include "module/row_source.h"
 
 #include <QUndoCommand>
 #include <vector>
@@ -16,7 +17,7 @@ public:
     /// Takes the incomplete lines out of the lists that are cleaned at save, in one pass a list.
     void Apply();
     void Revert();
-    bool IsEmpty() const { return m_lists.empty(); }
+    bool IsEmpty() const { return m_lists.empty() && m_rows.empty(); }
 
     void undo() override;
     void redo() override;
@@ -32,7 +33,17 @@ private:
         CGenList* list;
         std::vector<Line> lines; // ascending
     };
+    struct Row // of a list without locations
+    {
+        std::shared_ptr<IRowSource> source;
+        std::size_t index; // when it was taken
+        std::unique_ptr<IRowBlock> row;
+    };
+    void PurgeLists();
+    void PurgeRows();
+
     CKavo0_hdDoc& m_document;
     std::vector<List> m_lists;
-    bool m_applied = false; // by the save itself, before the command came onto the stack
+    std::vector<Row> m_rows; // in the order of taking
+    bool m_applied = false;  // by the save itself, before the command came onto the stack
 };

@@ -44,7 +44,12 @@ public:
     virtual std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) = 0;
     /// The one row that an empty source shows: no change of the document, if the source has a way to say so.
     virtual void AddFirstRow(std::unique_ptr<IRowBlock> block) { Put(0, std::move(block)); }
+    /// Removes that row again, silently, if it is untouched.
+    virtual void TakeFirstRow() {}
 
+    /// The first rows that belong to the source itself: none of them comes, goes or moves.
+    virtual std::size_t FixedRows() const { return 0; }
+    bool IsEmpty() const { return Count() == FixedRows(); }
     /// Whether the source may be left without rows; otherwise it always shows one.
     virtual bool MayBeEmpty() const { return false; }
 

@@ -218,6 +218,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     switch (id) {
     case Command::InsertLine:
     case Command::DeleteLine:
+        return m_linesEnabled && page && page->LinesGrid();
     case Command::GotoLine:
     case Command::Search:
         return lines;

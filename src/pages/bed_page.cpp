@@ -28,7 +28,7 @@ CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
     const auto column = [&](Str caption, const double& global, bool ofZones) {
         return ColumnOptions{.caption = caption,
                              .fill = &global,
-                             .locked = [usesZones, ofZones](const HD_RiverPos&) { return usesZones() != ofZones; },
+                             .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
                              .unitText = unit};
     };
     using R = HD_Resistfact;

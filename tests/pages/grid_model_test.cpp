@@ -181,7 +181,7 @@ TEST_F(ModelTest, LockedCells)
             (new QVBoxLayout(this))->addWidget(table);
             Grid(table).BranchName({}).Chainage({}).Value(
                 &HD_Initial::InitialH,
-                {.locked = [](const HD_RiverPos& record) { return record.RiverName == "FIXED"; }});
+                {.locked = [](const void* row) { return static_cast<const HD_RiverPos*>(row)->RiverName == "FIXED"; }});
         }
     };
     Add("FIXED", 1, 2);

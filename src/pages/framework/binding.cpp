@@ -5,6 +5,7 @@
 #include "module/document.h"
 #include "pages/framework/commands.h"
 #include "pages/framework/ctrl_edit.h"
+#include "pages/framework/date_time_edit.h"
 #include "res/strings.h"
 
 #include <QButtonGroup>
@@ -13,6 +14,7 @@
 #include <QKeyEvent>
 #include <QLabel>
 #include <QRadioButton>
+#include <QUndoStack>
 
 namespace {
 
@@ -80,16 +82,74 @@ void CBindings::Add(CKsEditLong* field, std::int32_t& value)
     m_take.push_back([field, take] { return !field->isModified() || take(field->CheckedValue()); });
 }
 
-template <typename T>
-void CBindings::AddFlag(QCheckBox* box, T& value)
+void CBindings::Add(QLineEdit* field, std::string& value)
 {
-    m_show.push_back([box, &value] { box->setChecked(value != T(0)); });
-    connect(box, &QCheckBox::clicked, this, [this, &value](bool checked) { Store(value, T(checked)); });
+    m_show.push_back([field, &value] {
+        const QString text = QString::fromStdString(value);
+        if (!field->isModified() && field->text() != text)
+            field->setText(text);
+    });
+    field->installEventFilter(this);
+    const auto take = [this, field, &value] {
+        if (!field->isModified())
+            return;
+        field->setModified(false);
+        Store(value, field->text().toStdString());
+    };
+    connect(field, &QLineEdit::editingFinished, this, take);
+    m_take.push_back([take] {
+        take();
+        return true;
+    });
 }
 
-void CBindings::Add(QCheckBox* box, bool& value)
+void CBindings::Add(CGeoFileEdit* field, std::string& value, const FileKind& kind)
 {
-    AddFlag(box, value);
+    field->SetUp(*m_document, kind);
+    Add(field->Field(), value);
+    connect(field, &CGeoFileEdit::Chosen, this,
+            [this, field, &value] { Store(value, field->Field()->text().toStdString()); });
+}
+
+void CBindings::Add(CDateTimeEdit* field, HDDateTime& value)
+{
+    m_show.push_back([field, &value] {
+        if (!field->isModified())
+            field->SetValue(value);
+    });
+    field->installEventFilter(this);
+    const auto take = [this, field, &value](std::optional<HDDateTime> typed) {
+        if (!typed)
+            return false;
+        field->SetValue(*typed);
+        Store(value, *typed);
+        return true;
+    };
+    connect(field, &QLineEdit::editingFinished, this, [field, take] {
+        if (field->isModified())
+            take(field->Value()); // what is no date stays, and the field says so
+    });
+    m_take.push_back([field, take] { return !field->isModified() || take(field->CheckedValue()); });
+}
+
+template <typename T>
+void CBindings::AddFlag(QCheckBox* box, T& value, std::function<void(bool checked)> consequences)
+{
+    m_show.push_back([box, &value] { box->setChecked(value != T(0)); });
+    connect(box, &QCheckBox::clicked, this, [this, &value, consequences](bool checked) {
+        if (!consequences)
+            return Store(value, T(checked));
+        QUndoStack& steps = m_document->UndoStack();
+        steps.beginMacro(LoadString(Str::UndoValue));
+        Store(value, T(checked));
+        consequences(checked);
+        steps.endMacro();
+    });
+}
+
+void CBindings::Add(QCheckBox* box, bool& value, std::function<void(bool checked)> consequences)
+{
+    AddFlag(box, value, std::move(consequences));
 }
 
 void CBindings::Add(QCheckBox* box, std::int32_t& flag)
@@ -136,11 +196,11 @@ void CBindings::AddUnbound(QComboBox* box)
 
 bool CBindings::eventFilter(QObject* object, QEvent* event)
 {
-    // A list, and an integer field with nothing typed, leave undo and redo to the document.
+    // A list, and a field with nothing typed, leave undo and redo to the document.
     if (event->type() == QEvent::ShortcutOverride || event->type() == QEvent::KeyPress) {
         const auto* key = static_cast<QKeyEvent*>(event);
         const bool undoRedo = key->matches(QKeySequence::Undo) || key->matches(QKeySequence::Redo);
-        const auto* field = qobject_cast<CKsEditLong*>(object);
+        const auto* field = qobject_cast<QLineEdit*>(object);
         if (undoRedo && !(field && field->isModified())) {
             event->ignore();
             return true;

@@ -2,21 +2,25 @@
 // user has changed a control, each change being an undo step; nothing is written that nobody changed.
 #pragma once
 
-#include "ks/units/unit_group.h"
+#include "data/field.h"
+#include "pages/framework/file_browse.h"
 
 #include <QObject>
 #include <cstdint>
 #include <functional>
 #include <initializer_list>
 #include <optional>
+#include <string>
 #include <vector>
 
 class CCtrlEdit;
+class CDateTimeEdit;
 class CKavo0_hdDoc;
 class CKsEditLong;
 class QCheckBox;
 class QComboBox;
 class QLabel;
+class QLineEdit;
 class QRadioButton;
 class QWidget;
 
@@ -40,7 +44,11 @@ public:
     // Each value lives in the document, which outlives the page.
     void Add(CCtrlEdit* field, double& value, const FieldOptions& options = {});
     void Add(CKsEditLong* field, std::int32_t& value);
-    void Add(QCheckBox* box, bool& value);
+    void Add(QLineEdit* field, std::string& value);
+    void Add(CGeoFileEdit* field, std::string& value, const FileKind& kind);
+    void Add(CDateTimeEdit* field, HDDateTime& value);
+    /// `consequences` of a click are part of the same undo step.
+    void Add(QCheckBox* box, bool& value, std::function<void(bool checked)> consequences = {});
     void Add(QCheckBox* box, std::int32_t& flag);
     /// By index of the entry. An index without an entry is kept, and shown as its number.
     void Add(QComboBox* box, std::int32_t& index);
@@ -67,7 +75,7 @@ private:
     void Store(T& target, T value);
     void ApplyRules();
     template <typename T>
-    void AddFlag(QCheckBox* box, T& value);
+    void AddFlag(QCheckBox* box, T& value, std::function<void(bool checked)> consequences = {});
     void AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets, void (QWidget::*apply)(bool));
 
     CKavo0_hdDoc* m_document;

@@ -1,6 +1,7 @@
 #include "pages/framework/cell_text.h"
 
 #include "data/river_pos.h"
+#include "pages/framework/date_time_text.h"
 #include "pages/framework/number_syntax.h"
 #include "res/strings.h"
 
@@ -18,6 +19,8 @@ bool IsEmpty(const ColumnSpec& column, const CellValue& value)
 
 QString ShownText(const ColumnSpec& column, const CellValue& value)
 {
+    if (column.ActsAtOnce())
+        return {}; // a picture
     const auto* number = std::get_if<double>(&value);
     if (!number || IsEmpty(column, value))
         return EditText(column, value);
@@ -38,15 +41,31 @@ QString EditText(const ColumnSpec& column, const CellValue& value)
         return KsShortestNumber(column.style.UnitConvertFromBase(*number, 1));
     if (const auto* integer = std::get_if<std::int32_t>(&value))
         return column.Kind() == CellKind::Choice ? column.choices.TextOf(*integer) : QString::number(*integer);
+    if (const auto* time = std::get_if<HDDateTime>(&value))
+        return DateTimeText(*time);
     return QString::fromStdString(std::get<std::string>(value));
 }
 
 CellReading ReadCell(const ColumnSpec& column, const QString& text)
 {
     if (column.Kind() == CellKind::Text)
-        return {text.toUpper().toStdString(), {}};
+        return {(FindControl(column.control).upperCase ? text.toUpper() : text).toStdString(), {}};
     if (text.isEmpty())
         return {};
+    if (column.Kind() == CellKind::Button)
+        return {{}, LoadString(Str::CellLocked)};
+    if (column.Kind() == CellKind::Flag)
+        return text == u'0' || text == u'1' ? CellReading{std::int32_t(text == u'1'), {}}
+                                            : CellReading{{}, LoadString(Str::FlagRequired)};
+    if (column.Kind() == CellKind::DateTime) {
+        const auto time = ReadDateTime(text);
+        return time ? CellReading{*time, {}} : CellReading{{}, DateTimeRefusal(text)};
+    }
+    if (column.Kind() == CellKind::TextChoice) {
+        if (const auto entry = column.choices.EntryOf(text))
+            return {entry->toStdString(), {}};
+        return {{}, LoadString(Str::ChoiceRequired).arg(column.choices.entries().join(QStringLiteral(", ")))};
+    }
     if (column.Kind() == CellKind::Choice) {
         if (const auto index = column.choices.IndexOf(text))
             return {*index, {}};

@@ -12,8 +12,13 @@ constexpr GridControl Controls[] = {
     {Control::Integer, CellKind::Integer, 0, "edit"},
     {Control::Formatted, CellKind::Number, AsFormatted, "doubleEdit"},
     {Control::Number, CellKind::Number, 3, "doubleEdit_1110"},
-    {Control::Text, CellKind::Text, 0, "stringEdit_1111"},
+    {Control::Text, CellKind::Text, 0, "stringEdit_1111", true},
+    {Control::FreeText, CellKind::Text, 0, "textEdit"},
     {Control::DropDown, CellKind::Choice, 0, "dropDown"},
+    {Control::DropDownList, CellKind::TextChoice, 0, "dropDownList"},
+    {Control::CheckBox, CellKind::Flag, 0, "checkBox"},
+    {Control::PushButton, CellKind::Button, 0, "pushButton"},
+    {Control::DateTime, CellKind::DateTime, 0, "dateTimeEdit"},
     {Control::Chainage, CellKind::Number, 0, "doubleEdit_1112"},
 };
 
@@ -41,6 +46,12 @@ CellAccess FieldAccess(const Field& field)
     case FieldKind::Text:
     case FieldKind::FileName:
         return AccessAs<std::string>(field);
+    case FieldKind::DateTime:
+        return AccessAs<HDDateTime>(field);
+    case FieldKind::Boolean:
+        return {
+            [field](const void* row) -> CellValue { return std::int32_t(field.In<bool>(row)); },
+            [field](void* row, const CellValue& value) { field.In<bool>(row) = std::get<std::int32_t>(value) != 0; }};
     default:
         return AccessAs<double>(field);
     }
@@ -52,13 +63,21 @@ QString Choices::TextOf(std::int32_t index) const
     return index >= first && index - first < texts.size() ? texts[index - first] : QString::number(index);
 }
 
+std::optional<QString> Choices::EntryOf(const QString& text) const
+{
+    for (const QString& entry : entries())
+        if (entry.compare(text.trimmed(), Qt::CaseInsensitive) == 0)
+            return entry;
+    return std::nullopt;
+}
+
 std::optional<std::int32_t> Choices::IndexOf(const QString& text) const
 {
     const QStringList texts = entries();
     const QString wanted = text.trimmed();
-    for (qsizetype i = 0; i < texts.size(); ++i)
-        if (texts[i].compare(wanted, Qt::CaseInsensitive) == 0)
-            return first + std::int32_t(i);
+    const qsizetype entry = texts.indexOf(EntryOf(text).value_or(QString()));
+    if (entry >= 0)
+        return first + std::int32_t(entry);
     bool isNumber = false;
     const std::int32_t number = wanted.toInt(&isNumber);
     if (isNumber && number >= first && number - first < texts.size())
@@ -80,9 +99,15 @@ CellValue ColumnSpec::EmptyValue() const
 {
     switch (Kind()) {
     case CellKind::Text:
+    case CellKind::TextChoice:
         return std::string();
     case CellKind::Integer:
+    case CellKind::Flag:
         return std::int32_t(0);
+    case CellKind::DateTime:
+        return HDDateTime{};
+    case CellKind::Button:
+        return {};
     case CellKind::Choice:
         return choices.whenEmptied;
     case CellKind::Number:

@@ -11,13 +11,15 @@
 #include <variant>
 
 /// What a cell holds, in base units. Nothing stands for an empty cell.
-using CellValue = std::variant<std::monostate, double, std::int32_t, std::string>;
+using CellValue = std::variant<std::monostate, double, std::int32_t, std::string, HDDateTime>;
 
 /// How a column reaches its value in the object of a row.
 struct CellAccess
 {
     std::function<CellValue(const void* row)> get;
     std::function<void(void* row, const CellValue& value)> set;
+    /// Where setting a cell changes more of the row than the cell: what puts the row back as it is now.
+    std::function<std::function<void(void* row)>(const void* row)> restore = {};
 };
 
 /// Access to a declared field.
@@ -28,7 +30,11 @@ enum class CellKind
     Text,
     Number,
     Integer,
-    Choice // an index, shown as the text of its entry
+    Choice,     // an index, shown as the text of its entry
+    TextChoice, // one of the entries, kept as text
+    Flag,       // 0 or 1, a check box
+    DateTime,
+    Button // no value: the page does something for the row
 };
 
 /// A number that is not being edited stands as the column's format has it.
@@ -41,6 +47,7 @@ struct GridControl
     CellKind kind;
     int decimals;           // of a number that is not being edited; AsFormatted
     const char* editorName; // object name of the editor
+    bool upperCase = false; // of a text
 };
 namespace Control {
 inline constexpr int Integer = 0;     // the plain edit control
@@ -49,6 +56,11 @@ inline constexpr int Number = 5042;   // three decimals
 inline constexpr int Text = 5043;     // upper case
 inline constexpr int Chainage = 5044; // whole numbers shown
 inline constexpr int DropDown = 52517;
+inline constexpr int DropDownList = 52518; // texts to choose from
+inline constexpr int FreeText = 52519;     // as it is typed
+inline constexpr int CheckBox = 52520;
+inline constexpr int PushButton = 52521;
+inline constexpr int DateTime = 52522;
 } // namespace Control
 const GridControl& FindControl(int id);
 
@@ -60,6 +72,8 @@ struct Choices
     std::optional<std::int32_t> inNewLines = {};
     std::int32_t whenEmptied = 0;
 
+    /// The entry that a text means, as it is spelt in the list; nothing when it means none.
+    std::optional<QString> EntryOf(const QString& text) const;
     /// Text of a stored index.
     QString TextOf(std::int32_t index) const;
     /// The index that a text means, be it an entry (case does not matter) or the number of one; nothing otherwise.
@@ -84,7 +98,9 @@ struct ColumnSpec
     std::shared_ptr<const CellAccess> access;
 
     CellKind Kind() const { return FindControl(control).kind; }
-    bool IsText() const { return Kind() == CellKind::Text || Kind() == CellKind::Choice; }
+    bool IsRightAligned() const { return Kind() == CellKind::Number || Kind() == CellKind::Integer; }
+    /// The cells have no editor: a click or the space bar acts at once.
+    bool ActsAtOnce() const { return Kind() == CellKind::Flag || Kind() == CellKind::Button; }
     bool IsLocked(const void* row) const { return locked && locked(row); }
     /// `fill` as the stored value that a cell with that text has.
     CellValue FillValue() const;

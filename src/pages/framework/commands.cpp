@@ -16,17 +16,25 @@ CSetCells::CSetCells(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, s
 
 ChangePlace CSetCells::Apply()
 {
-    for (const CellChange& change : m_changes) {
+    for (CellChange& change : m_changes) {
         m_rows->Touch(change.row);
-        change.access->set(m_rows->Object(change.row), change.after);
+        void* row = m_rows->Object(change.row);
+        if (change.access->restore)
+            change.restore = change.access->restore(row);
+        change.access->set(row, change.after);
     }
     return Place();
 }
 
 ChangePlace CSetCells::Revert()
 {
-    for (auto change = m_changes.rbegin(); change != m_changes.rend(); ++change)
-        change->access->set(m_rows->Object(change->row), change->before);
+    for (auto change = m_changes.rbegin(); change != m_changes.rend(); ++change) {
+        void* row = m_rows->Object(change->row);
+        if (change->restore)
+            change->restore(row);
+        else
+            change->access->set(row, change->before);
+    }
     return Place();
 }
 
@@ -41,8 +49,10 @@ template <typename T>
 void StoreValue(CKavo0_hdDoc& document, T& target, T value)
 {
     if (target != value)
-        document.UndoStack().push(new CSetValue<T>(document, LoadString(Str::UndoValue), target, value));
+        document.UndoStack().push(new CSetValue<T>(document, LoadString(Str::UndoValue), target, std::move(value)));
 }
 template void StoreValue(CKavo0_hdDoc&, double&, double);
 template void StoreValue(CKavo0_hdDoc&, std::int32_t&, std::int32_t);
 template void StoreValue(CKavo0_hdDoc&, bool&, bool);
+template void StoreValue(CKavo0_hdDoc&, std::string&, std::string);
+template void StoreValue(CKavo0_hdDoc&, HDDateTime&, HDDateTime);

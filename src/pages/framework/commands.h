@@ -13,6 +13,7 @@ struct CellChange
     int column; // from 1
     std::shared_ptr<const CellAccess> access;
     CellValue before, after;
+    std::function<void(void* row)> restore = {}; // instead of setting `before`; see CellAccess
 };
 
 /// Changes cells, and nothing but them.
@@ -68,3 +69,5 @@ void StoreValue(CKavo0_hdDoc& document, T& target, T value);
 extern template void StoreValue(CKavo0_hdDoc&, double&, double);
 extern template void StoreValue(CKavo0_hdDoc&, std::int32_t&, std::int32_t);
 extern template void StoreValue(CKavo0_hdDoc&, bool&, bool);
+extern template void StoreValue(CKavo0_hdDoc&, std::string&, std::string);
+extern template void StoreValue(CKavo0_hdDoc&, HDDateTime&, HDDateTime);

@@ -23,8 +23,8 @@ constexpr int RowsMeasured = 30;   // for the first widths of the columns; the u
 constexpr int MostOfAWindow = 320; // pixels that a long name may take at the start
 constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
 
-/// The row numbers. They are as wide as the grid says: measuring texts of many rows, as the base does whenever the table is
-/// laid out, would cost more than all the rest of showing it.
+/// The row numbers. They are as wide as the grid says: measuring texts of many rows, as the base does whenever the
+/// table is laid out, would cost more than all the rest of showing it.
 class RowNumbers : public QHeaderView
 {
 public:
@@ -113,10 +113,10 @@ void CGenGrid::UpdateRowHeader()
         verticalHeader()->setFixedWidth(width);
 }
 
-void CGenGrid::SetColumnWidths()
+void CGenGrid::SetColumnWidths(int first)
 {
-    m_widthsSet = true;
-    for (int column = 0; column < ColumnCount(); ++column) {
+    m_widthsSet = ColumnCount();
+    for (int column = first; column < ColumnCount(); ++column) {
         const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
         int text = fontMetrics().horizontalAdvance(spec.header());
         for (int row = 0; row < std::min(RowCount(), RowsMeasured); ++row)
@@ -129,8 +129,7 @@ void CGenGrid::Reload()
 {
     m_model->Sync();
     UpdateRowHeader();
-    if (!m_widthsSet) // afterwards they are the user's
-        SetColumnWidths();
+    SetColumnWidths(std::min(m_widthsSet, ColumnCount()));
     if (!currentIndex().isValid() && RowCount() > 0)
         setCurrentIndex(m_model->index(0, 0));
 }
@@ -181,8 +180,8 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
     if (row == m_lastRow)
         return;
     m_lastRow = row;
-    if (row != 0 && Host() && IsLocationGrid())
-        Host()->CurrentLocationChanged(row);
+    if (row > m_model->FixedRows() && Host() && IsLocationGrid())
+        Host()->CurrentLocationChanged(row - m_model->FixedRows());
 }
 
 void CGenGrid::focusOutEvent(QFocusEvent* event)
@@ -231,8 +230,8 @@ void CGenGrid::changeEvent(QEvent* event)
     QTableView::changeEvent(event);
     if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) {
         UpdateRowHeader();
-        if (m_widthsSet) // not before there are columns
-            SetColumnWidths();
+        if (m_widthsSet > 0) // not before the rows are there
+            SetColumnWidths(0);
     }
 }
 
@@ -343,7 +342,7 @@ void CGenGrid::contextMenuEvent(QContextMenuEvent* event)
             ->setEnabled(enabled);
     };
     add(GridAction::AppendLine, true);
-    add(GridAction::DeleteLine, SelectedBlock() && SelectedBlock()->width() == ColumnCount());
+    add(GridAction::DeleteLine, LinesToDelete().has_value());
     menu.addSeparator();
     add(GridAction::Copy, CanCopy());
     add(GridAction::Paste, CanPaste());
@@ -371,7 +370,7 @@ std::optional<QItemSelectionRange> CGenGrid::SelectedBlock() const
 int CGenGrid::InsertLine()
 {
     const auto selected = SelectedBlock();
-    const int row = selected ? selected->top() : RowCount();
+    const int row = selected ? std::max(selected->top(), m_model->FixedRows()) : RowCount();
     m_model->InsertRows(row);
     UpdateRowHeader();
     clearSelection();
@@ -379,16 +378,44 @@ int CGenGrid::InsertLine()
     return row + 1;
 }
 
+/// Lines of the table among the selected ones.
+std::optional<QItemSelectionRange> CGenGrid::LinesToDelete() const
+{
+    auto lines = SelectedBlock();
+    if (!lines && m_deletesCurrentLine && currentIndex().isValid())
+        lines.emplace(currentIndex().siblingAtColumn(0), currentIndex().siblingAtColumn(ColumnCount() - 1));
+    if (!lines || lines->width() != ColumnCount() || lines->bottom() < m_model->FixedRows())
+        return std::nullopt;
+    const int top = std::max(lines->top(), m_model->FixedRows());
+    return QItemSelectionRange(m_model->index(top, 0), lines->bottomRight());
+}
+
 bool CGenGrid::DeleteSelectedLines()
 {
-    const auto selected = SelectedBlock();
-    if (!selected || selected->width() != ColumnCount())
+    const auto lines = LinesToDelete();
+    if (!lines)
         return false;
-    const int row = selected->top(), column = CurrentColumn();
-    m_model->RemoveRows(row, selected->height());
+    const int row = lines->top(), column = CurrentColumn();
+    m_model->RemoveRows(row, lines->height());
     clearSelection();
     SetCurrentCell(row + 1, column);
     return true;
+}
+
+void CGenGrid::ActOn(int row, int column)
+{
+    const QModelIndex cell = m_model->index(row - 1, column - 1);
+    const ColumnSpec& spec = m_model->Columns()[std::size_t(cell.column())];
+    if (!spec.ActsAtOnce() || m_model->IsLocked(cell.row(), cell.column()))
+        return;
+    if (spec.Kind() == CellKind::Flag) {
+        const bool checked = cell.data(Qt::CheckStateRole).toInt() == Qt::Checked;
+        m_model->setData(cell, checked ? QStringLiteral("0") : QStringLiteral("1"), Qt::EditRole);
+        StoreEditedLine();
+    } else if (m_page) {
+        StoreEditedLine();
+        m_page->OnGridButtonClicked(*this, row, column);
+    }
 }
 
 void CGenGrid::GotoLine(int row)

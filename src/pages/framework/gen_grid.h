@@ -51,9 +51,12 @@ public:
     void Reload();
     /// Inserts a line above the first selected range, or behind the last line; returns its row.
     int InsertLine();
-    /// Deletes the selected lines when whole lines are selected, in one range. A grid left empty gets a new line,
-    /// unless its rows may be none.
+    /// Deletes the selected lines when whole lines are selected, in one range; the current line without a selection in
+    /// a grid that says so. A grid left empty gets a new line, unless its rows may be none.
     bool DeleteSelectedLines();
+    void SetDeletesCurrentLine(bool deletes) { m_deletesCurrentLine = deletes; }
+    /// A click or the space bar on a cell that acts at once.
+    void ActOn(int row, int column);
     void GotoLine(int row);
     /// Looks for a line from `row` on (0 is taken as 1). On success the line becomes current, and `row` is the one
     /// behind it; otherwise `row` is 0. `chainage` is in metres, and compared as shown in the chainage column.
@@ -87,13 +90,14 @@ private:
     IPageHost* Host() const;
     bool IsLocationGrid() const;
     std::optional<QItemSelectionRange> SelectedBlock() const; // more than the current cell, in one range
+    std::optional<QItemSelectionRange> LinesToDelete() const;
     void NextCell();
     void PreviousCell();
     void AppendLine();
     void Execute(int command);
     void CellModified(int row, int column);
     void UpdateRowHeader();
-    void SetColumnWidths();
+    void SetColumnWidths(int first);
 
     CGridModel* m_model;       // child
     CGridDelegate* m_delegate; // child
@@ -104,5 +108,6 @@ private:
     bool m_appendThroughPage = true;
     int m_branchNameColumn = 0;
     bool m_locationOnAnyColumn = false;
-    bool m_widthsSet = false;
+    bool m_deletesCurrentLine = false;
+    int m_widthsSet = 0; // of so many columns; from then on they are the user's
 };

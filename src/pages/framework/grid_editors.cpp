@@ -7,6 +7,7 @@
 
 #include <QApplication>
 #include <QKeyEvent>
+#include <QPainter>
 #include <QTimer>
 
 namespace {
@@ -33,11 +34,21 @@ QWidget* MakeBranchList(const QStringList& names, QWidget* parent)
 
 QWidget* MakeEditor(const ColumnSpec& column, QWidget* parent)
 {
-    if (column.Kind() == CellKind::Text)
-        return new CGridStringEdit(parent);
-    if (column.Kind() == CellKind::Choice)
+    switch (column.Kind()) {
+    case CellKind::Choice:
+    case CellKind::TextChoice:
         return new CGridChoiceEdit(column.choices.entries(), parent);
-    return new CGridDoubleEdit(parent);
+    case CellKind::Number:
+    case CellKind::Integer:
+        return new CGridDoubleEdit(parent);
+    default:
+        break;
+    }
+    if (FindControl(column.control).upperCase)
+        return new CGridStringEdit(parent);
+    auto* edit = new QLineEdit(parent);
+    edit->setFrame(false);
+    return edit;
 }
 
 } // namespace
@@ -126,6 +137,64 @@ void CGridDelegate::destroyEditor(QWidget* editor, const QModelIndex& index) con
     if (editor == m_editor)
         m_editor = nullptr;
     QStyledItemDelegate::destroyEditor(editor, index);
+}
+
+void CGridDelegate::PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
+{
+    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
+    const QStyle& style = *m_grid->style();
+    const bool locked = m_grid->Model()->IsLocked(index.row(), index.column());
+    QStyleOptionButton button;
+    button.palette = cell.palette;
+    button.state = cell.state & (QStyle::State_Enabled | QStyle::State_MouseOver);
+    button.state.setFlag(QStyle::State_Enabled, cell.state.testFlag(QStyle::State_Enabled) && !locked);
+    if (column.Kind() == CellKind::Flag) {
+        const QSize size(style.pixelMetric(QStyle::PM_IndicatorWidth, nullptr, m_grid),
+                         style.pixelMetric(QStyle::PM_IndicatorHeight, nullptr, m_grid));
+        button.rect = QStyle::alignedRect(cell.direction, Qt::AlignCenter, size, cell.rect);
+        button.state |= index.data(Qt::CheckStateRole).toInt() == Qt::Checked ? QStyle::State_On : QStyle::State_Off;
+        style.drawPrimitive(QStyle::PE_IndicatorCheckBox, &button, painter, m_grid);
+    } else {
+        button.rect = cell.rect.adjusted(1, 1, -1, -1);
+        button.state |= QStyle::State_Raised;
+        button.text = QStringLiteral("...");
+        button.fontMetrics = cell.fontMetrics;
+        style.drawControl(QStyle::CE_PushButton, &button, painter, m_grid);
+    }
+}
+
+void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const
+{
+    if (!m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce())
+        return QStyledItemDelegate::paint(painter, option, index);
+    QStyleOptionViewItem cell = option;
+    initStyleOption(&cell, index);
+    cell.features &= ~QStyleOptionViewItem::HasCheckIndicator; // drawn centred below
+    m_grid->style()->drawControl(QStyle::CE_ItemViewItem, &cell, painter, m_grid);
+    PaintControl(painter, cell, index);
+}
+
+bool CGridDelegate::editorEvent(QEvent* event, QAbstractItemModel*, const QStyleOptionViewItem& option,
+                                const QModelIndex& index)
+{
+    if (!m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce())
+        return false;
+    switch (event->type()) {
+    case QEvent::MouseButtonRelease: {
+        const auto* mouse = static_cast<QMouseEvent*>(event);
+        if (mouse->button() != Qt::LeftButton || !option.rect.contains(mouse->position().toPoint()))
+            return false;
+        break;
+    }
+    case QEvent::KeyPress:
+        if (static_cast<QKeyEvent*>(event)->key() != Qt::Key_Space)
+            return false;
+        break;
+    default:
+        return event->type() == QEvent::MouseButtonDblClick; // the second release acts
+    }
+    m_grid->ActOn(index.row() + 1, index.column() + 1);
+    return true;
 }
 
 bool CGridDelegate::Commit()

@@ -54,12 +54,17 @@ public:
     void setEditorData(QWidget* editor, const QModelIndex& index) const override;
     void setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const override;
     void destroyEditor(QWidget* editor, const QModelIndex& index) const override;
+    void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+    /// A click or the space bar on a check box or push button.
+    bool editorEvent(QEvent* event, QAbstractItemModel* model, const QStyleOptionViewItem& option,
+                     const QModelIndex& index) override;
 
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;
 
 private:
     void LostFocus(const QEvent* event);
+    void PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
 
     CGenGrid* m_grid;
     mutable QPointer<QWidget> m_editor;

@@ -9,6 +9,7 @@
 #include <QPalette>
 #include <QScopedValueRollback>
 #include <QUndoStack>
+#include <algorithm>
 #include <bit>
 
 namespace {
@@ -31,6 +32,15 @@ void CGridModel::AddColumn(ColumnSpec column)
     beginInsertColumns({}, at, at);
     m_columns.push_back(std::move(column));
     endInsertColumns();
+}
+
+void CGridModel::RemoveColumnsFrom(int count)
+{
+    if (count >= columnCount())
+        return;
+    beginRemoveColumns({}, count, columnCount() - 1);
+    m_columns.resize(std::size_t(count));
+    endRemoveColumns();
 }
 
 void CGridModel::SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows)
@@ -100,7 +110,18 @@ CellValue CGridModel::Value(int row, int column) const
 
 bool CGridModel::IsLocked(int row, int column) const
 {
-    return m_columns[std::size_t(column)].IsLocked(m_rows->At(std::size_t(row)));
+    const ColumnSpec& spec = m_columns[std::size_t(column)];
+    if (!spec.locked)
+        return false;
+    const RowKey key = m_rows->KeyAt(std::size_t(row));
+    const auto typed = m_pending.lower_bound({key, 0});
+    const bool edited = typed != m_pending.end() && typed->first.first == key;
+    if (!edited || row < FixedRows())
+        return spec.locked(m_rows->At(std::size_t(row)));
+    // A lock follows the cells as the user sees them.
+    const auto shown = m_rows->NewRows(1);
+    CopyRow(row, shown->At(0));
+    return spec.locked(shown->At(0));
 }
 
 QVariant CGridModel::data(const QModelIndex& index, int role) const
@@ -114,9 +135,17 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
     case Qt::EditRole:
         return EditText(column, Value(index.row(), index.column()));
     case Qt::TextAlignmentRole:
-        return int(Qt::AlignVCenter | (column.IsText() ? Qt::AlignLeft : Qt::AlignRight));
+        return int(Qt::AlignVCenter | (column.IsRightAligned() ? Qt::AlignRight : Qt::AlignLeft));
+    case Qt::CheckStateRole:
+        if (column.Kind() != CellKind::Flag)
+            return {};
+        return Value(index.row(), index.column()) == CellValue(std::int32_t(0)) ? Qt::Unchecked : Qt::Checked;
+    case Qt::AccessibleTextRole:
+        return EditText(column, Value(index.row(), index.column()));
     case Qt::ToolTipRole:
-        return column.ToolTip(false);
+        // A text may be longer than its cell, a path in particular.
+        return column.Kind() == CellKind::Text ? ShownText(column, Value(index.row(), index.column()))
+                                               : column.ToolTip(false);
     case Qt::BackgroundRole:
         return IsLocked(index.row(), index.column()) ? QVariant(QGuiApplication::palette().brush(QPalette::Button))
                                                      : QVariant();
@@ -144,7 +173,7 @@ Qt::ItemFlags CGridModel::flags(const QModelIndex& index) const
     const auto flags = QAbstractTableModel::flags(index);
     if (!index.isValid() || !IsRow(index.row()) || IsLocked(index.row(), index.column()))
         return flags;
-    return flags | Qt::ItemIsEditable;
+    return m_columns[std::size_t(index.column())].ActsAtOnce() ? flags : flags | Qt::ItemIsEditable;
 }
 
 QString CGridModel::Refusal(int row, int column, const QString& text) const
@@ -259,7 +288,8 @@ void CGridModel::InsertRows(int row, int count)
     if (!m_rows)
         return;
     Store();
-    m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, std::size_t(row), NewLines(count)));
+    const auto at = std::size_t(std::max(row, FixedRows()));
+    m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, at, NewLines(count)));
     Sync();
 }
 
@@ -273,6 +303,6 @@ void CGridModel::RemoveRows(int row, int count)
 
 void CGridModel::EnsureFirstRow()
 {
-    if (m_rows && m_rows->Count() == 0)
+    if (m_rows && m_rows->IsEmpty())
         m_rows->AddFirstRow(NewLines(1));
 }

@@ -25,6 +25,8 @@ public:
     explicit CGridModel(QObject* parent = nullptr);
 
     void AddColumn(ColumnSpec column);
+    /// Only the first `count` columns stay.
+    void RemoveColumnsFrom(int count);
     const std::vector<ColumnSpec>& Columns() const { return m_columns; }
     /// Where the rows are (null while there are none); the document keeps the undo steps. Both outlive the model. What
     /// was typed and not stored is dropped.
@@ -64,7 +66,10 @@ public:
 
     /// New lines before `row`, with the columns' fill values: an undo step.
     void InsertRows(int row, int count = 1);
-    /// An undo step; a table left without lines gets a new one, unless its source may be empty.
+    /// Rows at the top that are no lines of the table.
+    int FixedRows() const { return m_rows ? int(m_rows->FixedRows()) : 0; }
+    /// An undo step; a table left without lines gets a new one, unless its source may be empty. No fixed row is among
+    /// the rows.
     void RemoveRows(int row, int count);
     /// Gives a source without rows its one line, silently.
     void EnsureFirstRow();

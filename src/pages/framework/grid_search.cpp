@@ -56,7 +56,7 @@ bool CGenGrid::SearchRows(int& row, const QString& name, double chainage, int ch
     const std::string wantedName = name.toStdString();
     const ColumnSpec& chainageColumn = m_model->Columns()[ChainageColumn];
     const double wanted = AsShown(chainageColumn, chainage);
-    for (row = std::max(row, 1); row <= RowCount();) {
+    for (row = std::max(row, m_model->FixedRows() + 1); row <= RowCount();) {
         const int line = row++ - 1;
         if (!NamePasses(std::get<std::string>(m_model->Value(line, NameColumn)), wantedName, nameCriterion))
             continue;

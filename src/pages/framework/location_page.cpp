@@ -13,7 +13,47 @@ constexpr Field ChainageField = Number<&HD_RiverPos::Chainage>("Chainage", UnitG
 
 } // namespace
 
-GridColumns& GridColumns::Add(int control, const Field& field, ColumnOptions options)
+std::function<QString()> LineOf(Str text, int line)
+{
+    return [text, line] { return LoadString(text).split(u'\n').value(line); };
+}
+
+const Field& GridColumns::FieldAt(FieldList fields, void* object, const void* member)
+{
+    for (const Field& field : fields)
+        if (field.address(object) == member)
+            return field;
+    Q_UNREACHABLE(); // a member that is no parameter of the file
+}
+
+/// The row of the globals reads and writes what the options name; records go on as before.
+void GridColumns::AddGlobalRow(ColumnSpec& column, CellAccess& access, const ColumnOptions& options) const
+{
+    const auto isGlobal = [globals = m_globals](const void* row) { return row == globals; };
+    access.get = [isGlobal, get = access.get, number = options.globalNumber, index = options.globalIndex,
+                  isText = column.Kind() == CellKind::Text](const void* row) -> CellValue {
+        if (!isGlobal(row))
+            return get(row);
+        if (number || index)
+            return number ? CellValue(*number) : CellValue(*index);
+        return isText ? CellValue(LoadString(Str::GlobalRow).toStdString()) : CellValue();
+    };
+    access.set = [isGlobal, set = access.set, number = options.globalNumber,
+                  index = options.globalIndex](void* row, const CellValue& value) {
+        if (!isGlobal(row))
+            set(row, value);
+        else if (number)
+            *number = std::get<double>(value);
+        else if (index)
+            *index = std::get<std::int32_t>(value);
+    };
+    const bool hasGlobal = options.globalNumber || options.globalIndex;
+    column.locked = [isGlobal, hasGlobal, locked = column.locked](const void* row) {
+        return isGlobal(row) ? !hasGlobal || (locked && locked(nullptr)) : locked && locked(row);
+    };
+}
+
+GridColumns& GridColumns::Add(int control, UnitGroup unit, CellAccess access, ColumnOptions options)
 {
     ColumnSpec column;
     column.control = control;
@@ -21,19 +61,18 @@ GridColumns& GridColumns::Add(int control, const Field& field, ColumnOptions opt
     if (!column.header)
         column.header = [caption = options.caption] { return LoadString(caption); };
     column.width = options.width;
-    column.style = CKsEditStyle(field.unit, options.format);
+    column.style = CKsEditStyle(unit, options.format);
     column.emptyIsNotGiven = options.emptyIsNotGiven;
     column.fill = options.fill;
-    if (options.locked)
-        column.locked = [locked = std::move(options.locked)](const void* row) {
-            return locked(*static_cast<const HD_RiverPos*>(row));
-        };
+    column.locked = options.locked;
+    if (m_globals)
+        AddGlobalRow(column, access, options);
     column.choices = std::move(options.choice);
     if (options.choices)
         column.choices.entries = [entries = *options.choices] { return LoadString(entries).split(u'\n'); };
     column.unitText = std::move(options.unitText);
     column.hint = std::move(options.hint);
-    column.access = std::make_shared<CellAccess>(FieldAccess(field));
+    column.access = std::make_shared<CellAccess>(std::move(access));
     m_grid.Model()->AddColumn(std::move(column));
     return *this;
 }
@@ -42,7 +81,7 @@ GridColumns& GridColumns::BranchName(ColumnOptions options)
 {
     if (!options.header)
         options.caption = Str::RiverName;
-    return Add(Control::Text, NameField, std::move(options));
+    return Add(Control::Text, UnitGroup::None, FieldAccess(NameField), std::move(options));
 }
 
 GridColumns& GridColumns::Chainage(ColumnOptions options)
@@ -50,19 +89,42 @@ GridColumns& GridColumns::Chainage(ColumnOptions options)
     if (!options.header && options.caption == Str::RiverName)
         options.caption = Str::Chainage;
     options.emptyIsNotGiven = true;
-    return Add(Control::Chainage, ChainageField, std::move(options));
+    return Add(Control::Chainage, ChainageField.unit, FieldAccess(ChainageField), std::move(options));
 }
 
 GridColumns& GridColumns::Value(const Field& field, ColumnOptions options)
 {
-    const bool integer = field.kind == FieldKind::Integer || field.kind == FieldKind::Choice;
-    const int control = field.kind == FieldKind::Text ? Control::Text
-                        : options.choices             ? Control::DropDown
-                        : integer                     ? Control::Integer
-                        : options.emptyIsNotGiven     ? Control::Chainage
-                        : options.asFormatted         ? Control::Formatted
-                                                      : Control::Number;
-    return Add(control, field, std::move(options));
+    return Value(FieldAccess(field), field.kind, field.unit, std::move(options));
+}
+
+GridColumns& GridColumns::Value(CellAccess access, FieldKind kind, UnitGroup unit, ColumnOptions options)
+{
+    const auto control = [&] {
+        switch (kind) {
+        case FieldKind::Text:
+            return options.choices ? Control::DropDownList : options.upperCase ? Control::Text : Control::FreeText;
+        case FieldKind::FileName:
+            return Control::FreeText;
+        case FieldKind::Integer:
+        case FieldKind::Choice:
+            return options.choices ? Control::DropDown : Control::Integer;
+        case FieldKind::Boolean:
+            return Control::CheckBox;
+        case FieldKind::DateTime:
+            return Control::DateTime;
+        default:
+            return options.asFormatted                                      ? Control::Formatted
+                   : options.emptyIsNotGiven && unit == UnitGroup::Chainage ? Control::Chainage
+                                                                            : Control::Number;
+        }
+    }();
+    return Add(control, unit, std::move(access), std::move(options));
+}
+
+GridColumns& GridColumns::Button(ColumnOptions options)
+{
+    CellAccess nothing{[](const void*) { return CellValue(); }, [](void*, const CellValue&) {}};
+    return Add(Control::PushButton, UnitGroup::None, std::move(nothing), std::move(options));
 }
 
 CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent)
@@ -75,19 +137,28 @@ CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList* list, QWidget* pa
 {
 }
 
+GridColumns CLocationPage::GridWithGlobals(CGenGrid* grid, void* globals)
+{
+    m_globals = globals;
+    return Grid(grid);
+}
+
 GridColumns CLocationPage::Grid(CGenGrid* grid)
 {
     grid->SetOwnerPage(this);
     CWndResizer(this).SetAnchor(grid, CWndResizer::All);
     ShowList(m_list);
     connect(grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this, &CLocationPage::ShowParts);
-    return GridColumns(*grid);
+    return GridColumns(*grid, m_globals);
 }
 
 void CLocationPage::ShowList(CGenList* list)
 {
     m_list = list;
-    GetGrid()->Model()->SetSource(*GetDocument(), list ? MakeListRows(*GetDocument(), *list) : nullptr);
+    CKavo0_hdDoc& document = *GetDocument();
+    GetGrid()->Model()->SetSource(document, !list       ? nullptr
+                                            : m_globals ? MakeGlobalAndListRows(document, *list, m_globals)
+                                                        : MakeListRows(document, *list));
     GetGrid()->setEnabled(list != nullptr);
 }
 
@@ -101,7 +172,9 @@ GridColumns CLocationPage::AddPart(CGenGrid* grid, std::shared_ptr<IRowSource> r
 
 HD_RiverPos* CLocationPage::CurrentRecord() const
 {
-    const int row = GetGrid()->CurrentRow();
+    if (!GetGrid())
+        return nullptr;
+    const int row = GetGrid()->CurrentRow() - GetGrid()->Model()->FixedRows();
     return m_list && row >= 1 && std::size_t(row) <= m_list->GetCount() ? &m_list->GetAt(std::size_t(row) - 1)
                                                                         : nullptr;
 }
@@ -116,7 +189,8 @@ void CLocationPage::ShowParts()
             part.shown = current;
             part.grid->Model()->SetSource(*GetDocument(), current ? part.rows(*current) : nullptr);
         }
-        part.grid->setEnabled(part.grid->Model()->Rows() != nullptr);
+        if (part.rows)
+            part.grid->setEnabled(part.grid->Model()->Rows() != nullptr);
         part.grid->Reload();
     }
 }
@@ -124,8 +198,15 @@ void CLocationPage::ShowParts()
 void CLocationPage::LoadFromDocument(CKavo0_hdDoc* document)
 {
     CGenPropertyPage::LoadFromDocument(document);
-    GetGrid()->Model()->EnsureFirstRow();
-    GetGrid()->Reload();
+    if (auto* grid = GetGrid()) {
+        grid->Model()->EnsureFirstRow();
+        grid->Reload();
+    }
+    for (const Part& part : m_parts) {
+        const auto& rows = part.grid->Model()->Rows();
+        if (rows && !rows->MayBeEmpty())
+            part.grid->Model()->EnsureFirstRow();
+    }
     ShowParts();
 }
 
@@ -138,7 +219,8 @@ void CLocationPage::StoreToDocument()
 void CLocationPage::Store(BlankRule rule)
 {
     CommitGrids();
-    GetGrid()->Model()->Store(rule);
+    if (GetGrid())
+        GetGrid()->Model()->Store(rule);
     for (const Part& part : m_parts)
         part.grid->Model()->Store(rule);
 }
@@ -151,10 +233,21 @@ bool CLocationPage::OnKillActive()
     return true; // leaving a table is never refused
 }
 
+void CLocationPage::BrowseInto(CGenGrid& grid, int row, int column, const FileKind& kind)
+{
+    const auto chosen = BrowseForFile(*GetDocument(), grid.TextAt(row, column), kind, this);
+    if (!chosen)
+        return;
+    CGridModel& model = *grid.Model();
+    model.setData(model.index(row - 1, column - 1), *chosen, Qt::EditRole);
+    grid.StoreEditedLine();
+}
+
 void CLocationPage::AppendLine()
 {
-    if (LinesGrid()->CommitEditor())
-        LinesGrid()->InsertLine();
+    CGenGrid* grid = LinesGrid();
+    if (grid && grid->CommitEditor())
+        grid->InsertLine();
 }
 
 void CLocationPage::InsertLocation(const QString& riverName, const QString& chainageText)
@@ -180,7 +273,7 @@ void CLocationPage::InsertLocation(const QString& riverName, const QString& chai
 
 std::unique_ptr<HD_RiverPos> CLocationPage::GetRecordAt(int row) const
 {
-    if (row < 1 || row > GetGrid()->RowCount())
+    if (!GetGrid() || row <= GetGrid()->Model()->FixedRows() || row > GetGrid()->RowCount())
         return nullptr;
     auto record = m_list->NewRecord();
     GetGrid()->Model()->CopyRow(row - 1, record.get());

@@ -17,18 +17,26 @@ struct ColumnOptions
     bool asFormatted = false;     // numbers stand in `format`, not with three decimals
     const double* fill = nullptr; // see ColumnSpec
     bool emptyIsNotGiven = false;
-    std::function<bool(const HD_RiverPos& record)> locked = {};
-    std::optional<Str> choices = {};        // entries of a drop-down column, one a line of the text
-    Choices choice = {};                    // the rest of a drop-down column; its entries come from `choices`
-    std::function<QString()> unitText = {}; // see ColumnSpec
-    std::function<QString()> hint = {};     // see ColumnSpec
+    std::function<bool(const void* row)> locked = {}; // see ColumnSpec
+    std::optional<Str> choices = {};                  // entries of a drop-down column, one a line of the text
+    Choices choice = {};                              // the rest of a drop-down column; its entries come from `choices`
+    std::function<QString()> unitText = {};           // see ColumnSpec
+    std::function<QString()> hint = {};               // see ColumnSpec
+    bool upperCase = false;                           // of a text
+    // What the row "Global" of a grid shows in the column, where the grid has one; the cell is locked without.
+    double* globalNumber = nullptr;
+    std::int32_t* globalIndex = nullptr;
 };
+
+/// One line of a text that holds several.
+std::function<QString()> LineOf(Str text, int line);
 
 /// Declares the columns of a grid, from left to right.
 class GridColumns
 {
 public:
-    explicit GridColumns(CGenGrid& grid) : m_grid(grid) {}
+    /// `globals` is the object of the row "Global"; null for a grid without one.
+    explicit GridColumns(CGenGrid& grid, const void* globals = nullptr) : m_grid(grid), m_globals(globals) {}
 
     GridColumns& BranchName(ColumnOptions options);
     GridColumns& Chainage(ColumnOptions options);
@@ -37,22 +45,29 @@ public:
     template <typename Record, typename T>
     GridColumns& Value(T Record::*member, ColumnOptions options)
     {
-        return Value(FieldOf(member), std::move(options));
+        static Record record;
+        return Value(FieldAt(Record::DeclaredFields(), static_cast<HD_RiverPos*>(&record), &(record.*member)),
+                     std::move(options));
     }
+    /// Likewise of the elements of a group.
+    template <typename Element, typename T>
+    GridColumns& Value(const GroupAccess& group, T Element::*member, ColumnOptions options)
+    {
+        static Element element;
+        return Value(FieldAt(group.elements, &element, &(element.*member)), std::move(options));
+    }
+    /// A value of the rows that is no declared field; `kind` says how it is edited.
+    GridColumns& Value(CellAccess access, FieldKind kind, UnitGroup unit, ColumnOptions options);
+    /// Push buttons; the page answers them (OnGridButtonClicked).
+    GridColumns& Button(ColumnOptions options);
 
 private:
-    template <typename Record, typename T>
-    static const Field& FieldOf(T Record::*member)
-    {
-        static Record record;
-        for (const Field& field : Record::DeclaredFields())
-            if (field.address(static_cast<HD_RiverPos*>(&record)) == &(record.*member))
-                return field;
-        Q_UNREACHABLE(); // a member that is no parameter of the file
-    }
-    GridColumns& Add(int control, const Field& field, ColumnOptions options);
+    static const Field& FieldAt(FieldList fields, void* object, const void* member);
+    GridColumns& Add(int control, UnitGroup unit, CellAccess access, ColumnOptions options);
+    void AddGlobalRow(ColumnSpec& column, CellAccess& access, const ColumnOptions& options) const;
 
     CGenGrid& m_grid;
+    const void* m_globals;
 };
 
 class CLocationPage : public CGenPropertyPage
@@ -79,11 +94,24 @@ public:
 protected:
     /// Makes `grid` the page's grid; its columns are declared on the result.
     GridColumns Grid(CGenGrid* grid);
+    /// Likewise with a first row of its own for global values, kept in the object `globals`.
+    GridColumns GridWithGlobals(CGenGrid* grid, void* globals);
     /// A grid of pairs (or other lines without location), over a vector of the global values.
     template <typename T>
     GridColumns PairsGrid(CGenGrid* grid, std::vector<T>& pairs)
     {
         return AddPart(grid, std::make_shared<VectorRows<T>>(*GetDocument(), pairs), {});
+    }
+    /// Likewise, for a list that always shows a row: one with the defaults when it is empty.
+    template <typename T>
+    GridColumns ItemsGrid(CGenGrid* grid, std::vector<T>& items)
+    {
+        return AddPart(grid, std::make_shared<VectorRows<T>>(*GetDocument(), items, VectorOwner{}, WhenEmpty::OneRow),
+                       {});
+    }
+    GridColumns RowsGrid(CGenGrid* grid, std::shared_ptr<IRowSource> rows)
+    {
+        return AddPart(grid, std::move(rows), {});
     }
     /// Likewise over a vector of the record whose line is current in the page's grid.
     template <typename Record, typename T>
@@ -94,6 +122,8 @@ protected:
                                                    VectorOwner{m_list, &record});
         });
     }
+    /// Has the user choose the file that a cell names.
+    void BrowseInto(CGenGrid& grid, int row, int column, const FileKind& kind);
     /// Shows another list in the page's grid; null for none.
     void ShowList(CGenList* list);
 
@@ -112,5 +142,6 @@ private:
     void Store(BlankRule rule);
 
     CGenList* m_list;
+    void* m_globals = nullptr; // of the row "Global"
     std::vector<Part> m_parts;
 };

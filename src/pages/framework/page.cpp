@@ -7,6 +7,7 @@
 #include <QApplication>
 #include <QKeyEvent>
 #include <QUndoStack>
+#include <algorithm>
 
 CGenPropertyPage::CGenPropertyPage(CKavo0_hdDoc* document, QWidget* parent)
     : QWidget(parent), m_document(document), m_bindings(document), m_shownUnits(KsUnits::Instance().System())
@@ -64,8 +65,12 @@ void CGenPropertyPage::GotoLine(int row)
 void CGenPropertyPage::LoadFromDocument(CKavo0_hdDoc*)
 {
     m_bindings.Show();
-    if (m_host) // a rule may have shown or hidden the grid
-        m_host->EnableLinesMenu(m_grid && m_grid->isVisibleTo(this));
+    if (!m_host)
+        return;
+    // A rule may have shown or hidden a grid.
+    const auto isShown = [this](const CGenGrid* grid) { return grid && grid->isVisibleTo(this); };
+    m_host->EnableLinesMenu(isShown(m_grid) ||
+                            (!m_grid && std::any_of(m_partGrids.begin(), m_partGrids.end(), isShown)));
 }
 
 void CGenPropertyPage::StoreToDocument()
@@ -80,7 +85,7 @@ std::unique_ptr<HD_RiverPos> CGenPropertyPage::GetRecordAt(int) const
 
 void CGenPropertyPage::OnGridCellModified(int, int) {}
 
-void CGenPropertyPage::OnGridButtonClicked(int, int) {}
+void CGenPropertyPage::OnGridButtonClicked(CGenGrid&, int, int) {}
 
 void CGenPropertyPage::UndoRedo(bool undo)
 {

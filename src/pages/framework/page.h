@@ -32,6 +32,9 @@ public:
     void SetGrid(CGenGrid* grid) { m_grid = grid; }
     /// Further grids of the page.
     void AddPartGrid(CGenGrid* grid) { m_partGrids.push_back(grid); }
+    /// The grid that inserting and deleting lines mean: a further grid while it has the focus, else the
+    /// page's grid; null on a page without one.
+    CGenGrid* LinesGrid() const;
     /// Takes the texts being typed into cells; false when one is refused (the user has been told).
     bool CommitGrids();
     /// The list that the page's grid edits; null without one.
@@ -47,7 +50,8 @@ public:
     /// A new record with what the row shows; null when there is no such row. The caller owns it.
     virtual std::unique_ptr<HD_RiverPos> GetRecordAt(int row) const;
     virtual void OnGridCellModified(int row, int column);
-    virtual void OnGridButtonClicked(int row, int column);
+    /// A push button of `grid`, one of the page's.
+    virtual void OnGridButtonClicked(CGenGrid& grid, int row, int column);
 
     /// Takes what is being typed, then undoes or redoes one step of the document.
     void UndoRedo(bool undo);
@@ -76,8 +80,6 @@ protected:
     {
         m_bindings.Add(buttons, Globals().*member);
     }
-    /// The grid that inserting and deleting lines mean: a further grid while it has the focus, else the page's grid.
-    CGenGrid* LinesGrid() const;
     CBindings& Bindings() { return m_bindings; }
     HD_Global_Var& Globals() const;
 

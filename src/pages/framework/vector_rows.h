@@ -15,6 +15,13 @@ struct VectorOwner
     HD_RiverPos* record = nullptr;
 };
 
+/// What a source of rows shows that has none.
+enum class WhenEmpty
+{
+    Nothing,
+    OneRow
+};
+
 /// A vector of the document, which exists as long as the document, or as long as the record that owns it.
 /// A row's key is its place. Elements move in memory, so no address could name one; and a command that holds keys is
 /// only run with the vector as it was when the command was made, undo being strictly backwards.
@@ -22,8 +29,9 @@ template <typename T>
 class VectorRows : public IRowSource
 {
 public:
-    VectorRows(CKavo0_hdDoc& document, std::vector<T>& rows, VectorOwner owner = {})
-        : m_document(document), m_rows(rows), m_owner(owner)
+    VectorRows(CKavo0_hdDoc& document, std::vector<T>& rows, VectorOwner owner = {},
+               WhenEmpty whenEmpty = WhenEmpty::Nothing)
+        : m_document(document), m_rows(rows), m_owner(owner), m_whenEmpty(whenEmpty)
     {
     }
 
@@ -52,13 +60,24 @@ public:
     }
     std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
     {
+        TouchOwner();
         const auto first = m_rows.begin() + std::ptrdiff_t(row), last = first + std::ptrdiff_t(count);
         std::vector<T> taken(std::make_move_iterator(first), std::make_move_iterator(last));
         m_rows.erase(first, last);
         return std::make_unique<Block>(std::move(taken));
     }
 
-    bool MayBeEmpty() const override { return true; }
+    void AddFirstRow(std::unique_ptr<IRowBlock> block) override
+    {
+        Put(0, std::move(block));
+        m_document.AddPlaceholderRow(&m_rows);
+    }
+    void TakeFirstRow() override
+    {
+        if (m_document.IsPlaceholderRow(&m_rows))
+            Take(0, 1);
+    }
+    bool MayBeEmpty() const override { return m_whenEmpty == WhenEmpty::Nothing; }
     CGenList* List() const override { return m_owner.list; }
     std::size_t ListRow(std::size_t row) const override
     {
@@ -81,6 +100,7 @@ private:
 
     void TouchOwner()
     {
+        m_document.PlaceholderRowTouched(&m_rows);
         if (m_owner.record)
             m_document.PlaceholderTouched(*m_owner.record);
     }
@@ -88,4 +108,5 @@ private:
     CKavo0_hdDoc& m_document;
     std::vector<T>& m_rows;
     VectorOwner m_owner;
+    WhenEmpty m_whenEmpty;
 };

@@ -1,0 +1,29 @@
+// A field for a date and time in the user's locale.
+#pragma once
+
+#include "data/field.h"
+
+#include <QLineEdit>
+#include <optional>
+
+class CDateTimeEdit : public QLineEdit
+{
+    Q_OBJECT
+public:
+    explicit CDateTimeEdit(QWidget* parent = nullptr);
+
+    void SetValue(const HDDateTime& value);
+    /// What the text means; nothing for a text that is no date and time. A text that nobody changed is the value set,
+    /// be it a date or not.
+    std::optional<HDDateTime> Value() const;
+    /// Likewise, and tells the user when there is none.
+    std::optional<HDDateTime> CheckedValue();
+
+protected:
+    void focusOutEvent(QFocusEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+
+private:
+    HDDateTime m_value;
+    bool m_telling = false;
+};

@@ -1,0 +1,125 @@
+#include "pages/maps_page.h"
+
+#include "ui_maps_page.h"
+
+#include <algorithm>
+
+namespace {
+
+constexpr int MapFileColumn = 7, DemFileColumn = 1;
+constexpr std::int32_t DynamicType = 2;         // not the extreme over the simulation, but every so many steps
+constexpr std::int32_t AdItem = 4, DemItem = 5; // of the items
+
+FileKind GridFile(bool isWritten)
+{
+    return {.extension = QStringLiteral("kvt2"), .isWritten = isWritten};
+}
+
+const CMapsOutput& Map(const void* row)
+{
+    return *static_cast<const CMapsOutput*>(row);
+}
+
+bool IsNotDynamic(const void* row)
+{
+    return Map(row).Type != DynamicType;
+}
+
+template <typename T>
+bool HasNoFile(const void* row)
+{
+    return static_cast<const T*>(row)->FileName.empty();
+}
+
+} // namespace
+
+CMapsPage::CMapsPage(CKavo0_hdDoc* document, QWidget* parent)
+    : CLocationPage(document, nullptr, parent), m_ui(std::make_unique<Ui::CMapsPage>())
+{
+    m_ui->setupUi(this);
+    HDMapOutput& maps = Globals().MapOutput;
+    Bindings().Add(m_ui->generate_1228, maps.GenerateOutput);
+    Bindings().Add(m_ui->groundElevation_1239, maps.ApplyDemGroundElevation);
+    Bindings().Add(m_ui->riverXsec_1237, maps.ApplyDemInRiverXsec);
+    Bindings().Add(m_ui->geoDb_1240, maps.MapAreaGeoDb);
+    Bindings().Add(m_ui->helpGrid_1241, maps.GeoDb, GridFile(false));
+
+    const auto writesMaps = [&maps] { return maps.GenerateOutput; };
+    const auto usesDem = [&maps] { return maps.GenerateOutput && maps.ApplyDemGroundElevation; };
+    Bindings().ShowWhen(writesMaps, {m_ui->maps_1226, m_ui->status_1229});
+    Bindings().EnableWhen(writesMaps, {m_ui->groundElevation_1239});
+    Bindings().EnableWhen(usesDem, {m_ui->riverXsec_1237, m_ui->geoDb_1240});
+    Bindings().ShowWhen(usesDem, {m_ui->dem_1227});
+    Bindings().EnableWhen([usesDem, &maps] { return usesDem() && maps.MapAreaGeoDb; },
+                          {m_ui->helpGridLabel_1243, m_ui->helpGrid_1241});
+
+    m_ui->maps_1226->SetDeletesCurrentLine(true);
+    m_ui->dem_1227->SetDeletesCurrentLine(true);
+    DeclareMaps();
+    ItemsGrid(m_ui->dem_1227, maps.DemInputFiles)
+        .Value(MapsInputs, &CMapsInput::FileName, {.header = LineOf(Str::DemColumns, 0), .width = 150})
+        .Button({.header = LineOf(Str::DemColumns, 1), .width = 20})
+        .Value(MapsInputs, &CMapsInput::ItemNo, {.header = LineOf(Str::DemColumns, 2)})
+        .Value(MapsInputs, &CMapsInput::Order, {.header = LineOf(Str::DemColumns, 3)});
+}
+
+CMapsPage::~CMapsPage() = default;
+
+void CMapsPage::DeclareMaps()
+{
+    int next = 0;
+    const auto column = [&next](ColumnOptions options) {
+        options.header = LineOf(Str::MapColumns, next++);
+        return options;
+    };
+    const auto isDem = [](const void* row) { return Map(row).Item == DemItem; };
+    using M = CMapsOutput;
+    GridColumns columns = ItemsGrid(m_ui->maps_1226, Globals().MapOutput.MapOutputFiles);
+    for (double M::*number : {&M::XOrigin, &M::YOrigin, &M::Rotation, &M::GridSize})
+        columns.Value(MapsOutputs, number, column({.width = 50}));
+    for (std::int32_t M::*cells : {&M::JCells, &M::KCells})
+        columns.Value(MapsOutputs, cells, column({.width = 50}));
+    columns.Value(MapsOutputs, &M::FileName, column({}))
+        .Button(column({.width = 20}))
+        .Value(MapsOutputs, &M::Type, column({.locked = isDem, .choices = Str::MapTypes}))
+        .Value(MapsOutputs, &M::Item, column({.choices = Str::MapItems}))
+        .Value(MapsOutputs, &M::ComponentNo,
+               column({.width = 50, .locked = [](const void* row) { return Map(row).Item != AdItem; }}))
+        .Value(MapsOutputs, &M::StoringFrequency,
+               column({.width = 50, .locked = [isDem](const void* row) { return IsNotDynamic(row) || isDem(row); }}))
+        .Value(MapsOutputs, &M::DefaultPeriod, column({.width = 20, .locked = IsNotDynamic}))
+        .Value(MapsOutputs, &M::StartTime, column({.width = 110, .locked = IsNotDynamic}))
+        .Value(MapsOutputs, &M::EndTime, column({.width = 110, .locked = IsNotDynamic}));
+}
+
+void CMapsPage::LoadFromDocument(CKavo0_hdDoc* document)
+{
+    if (!std::exchange(m_cleaned, true)) {
+        document->CleanAtSave(m_ui->maps_1226->Model()->Rows(), &HasNoFile<CMapsOutput>);
+        document->CleanAtSave(m_ui->dem_1227->Model()->Rows(), &HasNoFile<CMapsInput>);
+    }
+    CLocationPage::LoadFromDocument(document);
+    ShowStatus();
+}
+
+/// Rows without a file mean nothing to the simulation: a save leaves them out, and says so beforehand.
+void CMapsPage::ShowStatus()
+{
+    const HDMapOutput& maps = Globals().MapOutput;
+    const auto nameless = [](const auto& rows) {
+        return std::count_if(rows.begin(), rows.end(), [](const auto& row) { return row.FileName.empty(); });
+    };
+    const auto count = nameless(maps.MapOutputFiles) + nameless(maps.DemInputFiles);
+    m_ui->status_1229->setText(count > 0 ? LoadString(Str::RowsWithoutFile).arg(count) : QString());
+}
+
+void CMapsPage::OnGridButtonClicked(CGenGrid& grid, int row, int /*column*/)
+{
+    const bool isMap = &grid == m_ui->maps_1226;
+    BrowseInto(grid, row, isMap ? MapFileColumn : DemFileColumn, GridFile(isMap));
+}
+
+void CMapsPage::Retranslate()
+{
+    m_ui->retranslateUi(this);
+}

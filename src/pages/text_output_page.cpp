@@ -1,0 +1,61 @@
+#include "pages/text_output_page.h"
+
+#include "pages/framework/date_time_edit.h"
+#include "ui_text_output_page.h"
+
+namespace {
+
+constexpr int FileFormatColumn = 1, FileNameColumn = 3;
+
+} // namespace
+
+CTextOutputPage::CTextOutputPage(CKavo0_hdDoc* document, QWidget* parent)
+    : CLocationPage(document, &HD_Parameters::OutputGridPoints, parent), m_ui(std::make_unique<Ui::CTextOutputPage>())
+{
+    m_ui->setupUi(this);
+    HDTextOutput& output = Globals().TextOutput;
+    Bindings().Add(m_ui->generate_1205, output.GenerateOutput);
+    Bindings().Add(m_ui->delimiter_1208, output.Delimiter);
+    Bindings().Add(m_ui->width_1209, output.ColumnWidth);
+    bool* summary = output.SummaryInfo;
+    for (QCheckBox* box : {m_ui->minimum_1212, m_ui->maximum_1213, m_ui->timeOfMinimum_1214, m_ui->timeOfMaximum_1215})
+        Bindings().Add(box, *summary++);
+    Bindings().Add(m_ui->limited_1221, output.LimitedPeriod);
+    Bindings().Add(m_ui->start_1223, output.LimitedPeriodStart);
+    Bindings().Add(m_ui->end_1225, output.LimitedPeriodEnd);
+    Bindings().EnableWhen([&output] { return output.LimitedPeriod; },
+                          {m_ui->startLabel_1222, m_ui->start_1223, m_ui->endLabel_1224, m_ui->end_1225});
+    Bindings().Add({m_ui->all_1218, m_ui->only_1219, m_ui->except_1220}, output.GridPointOutputType);
+
+    for (CGenGrid* grid : {m_ui->grid_1217, m_ui->items_1216, m_ui->files_1226})
+        grid->SetDeletesCurrentLine(true);
+    Grid(m_ui->grid_1217)
+        .BranchName({.width = 110})
+        .Chainage({.caption = Str::UpstreamChainage})
+        .Value(&HDOutputGridPoint::PointValue, {.caption = Str::DownstreamChainage, .emptyIsNotGiven = true});
+    ItemsGrid(m_ui->items_1216, output.OutputItems)
+        .Value(TextOutItems, &CTextOutItem::Item,
+               {.header = LineOf(Str::OutputItemColumns, 0), .width = 200, .choices = Str::OutputItems})
+        .Value(TextOutItems, &CTextOutItem::UserName, {.header = LineOf(Str::OutputItemColumns, 1), .width = 110})
+        .Value(TextOutItems, &CTextOutItem::Decimals, {.header = LineOf(Str::OutputItemColumns, 2), .width = 110});
+    ItemsGrid(m_ui->files_1226, output.OutputFiles)
+        .Value(TextAutoFiles, &CTextAutoFile::Format,
+               {.header = LineOf(Str::OutputFileColumns, 0), .width = 185, .choices = Str::OutputFormats})
+        .Value(TextAutoFiles, &CTextAutoFile::AutoName, {.header = LineOf(Str::OutputFileColumns, 1), .width = 35})
+        .Value(TextAutoFiles, &CTextAutoFile::FileName, {.header = LineOf(Str::OutputFileColumns, 2), .width = 185})
+        .Button({.header = LineOf(Str::OutputFileColumns, 3), .width = 20});
+}
+
+CTextOutputPage::~CTextOutputPage() = default;
+
+void CTextOutputPage::OnGridButtonClicked(CGenGrid& grid, int row, int /*column*/)
+{
+    const bool isBridge = grid.TextAt(row, FileFormatColumn) == LineOf(Str::OutputFormats, 0)();
+    BrowseInto(grid, row, FileNameColumn,
+               {.extension = isBridge ? QStringLiteral("kvt0") : QStringLiteral("txt"), .isWritten = true});
+}
+
+void CTextOutputPage::Retranslate()
+{
+    m_ui->retranslateUi(this);
+}

@@ -1,0 +1,130 @@
+#include "pages/wl_mark_page.h"
+
+#include "pages/mark_title_rows.h"
+#include "ui_wl_mark_page.h"
+
+namespace {
+
+constexpr int LocationColumns = 2; // the columns of levels follow
+
+CellAccess TitleAccess()
+{
+    return {[](const void* row) -> CellValue { return static_cast<const MarkTitle*>(row)->Title(); },
+            [](void* row, const CellValue& value) {
+                static_cast<MarkTitle*>(row)->SetTitle(std::get<std::string>(value));
+            }};
+}
+
+CellAccess InterpolateAccess()
+{
+    return {
+        [](const void* row) -> CellValue { return std::int32_t(static_cast<const MarkTitle*>(row)->Interpolate()); },
+        [](void* row, const CellValue& value) {
+            static_cast<MarkTitle*>(row)->SetInterpolate(std::get<std::int32_t>(value) != 0);
+        },
+        [](const void* object) {
+            // The list of flags may have ended before this one.
+            const auto* title = static_cast<const MarkTitle*>(object);
+            const std::size_t flags = title->globals ? title->globals->MarkInterpolate.size() : 0;
+            return [flags, on = title->Interpolate()](void* row) {
+                auto* changed = static_cast<MarkTitle*>(row);
+                changed->SetInterpolate(on);
+                if (changed->globals)
+                    changed->globals->MarkInterpolate.resize(flags);
+            };
+        }};
+}
+
+const HDWLMark& Mark(const void* row)
+{
+    return static_cast<const HDWLMark&>(*static_cast<const HD_RiverPos*>(row));
+}
+
+HDWLMark& Mark(void* row)
+{
+    return static_cast<HDWLMark&>(*static_cast<HD_RiverPos*>(row));
+}
+
+/// The level under one title. A record may hold fewer levels than there are titles; a level that is given lengthens it.
+CellAccess LevelAccess(std::size_t title)
+{
+    return {[title](const void* row) -> CellValue {
+                const auto& levels = Mark(row).MarkLevels;
+                return title < levels.size() ? CellValue(levels[title]) : CellValue();
+            },
+            [title](void* row, const CellValue& value) {
+                auto& levels = Mark(row).MarkLevels;
+                if (title >= levels.size())
+                    levels.resize(title + 1, NotGiven);
+                levels[title] = std::get<double>(value);
+            },
+            [title](const void* object) {
+                const auto& levels = Mark(object).MarkLevels;
+                return [title, count = levels.size(),
+                        level = title < levels.size() ? levels[title] : NotGiven](void* row) {
+                    auto& changed = Mark(row).MarkLevels;
+                    changed[title] = level;
+                    changed.resize(count);
+                };
+            }};
+}
+
+} // namespace
+
+CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document, QWidget* parent)
+    : CLocationPage(document, &HD_Parameters::WaterLevelMarkList, parent), m_ui(std::make_unique<Ui::CWLMarkPage>())
+{
+    m_ui->setupUi(this);
+    m_ui->grid_1074->SetDeletesCurrentLine(true);
+    Grid(m_ui->grid_1074).BranchName({.width = 71}).Chainage({.width = 71});
+    RowsGrid(m_ui->titles_1075, MakeMarkTitleRows(*document))
+        .Value(TitleAccess(), FieldKind::Text, UnitGroup::None,
+               {.caption = Str::MarkTitle, .width = 300, .upperCase = true})
+        .Value(InterpolateAccess(), FieldKind::Boolean, UnitGroup::None,
+               {.caption = Str::MarkInterpolate, .width = 50});
+    document->CleanAtSave(m_ui->titles_1075->Model()->Rows(),
+                          [](const void* row) { return static_cast<const MarkTitle*>(row)->Title().empty(); });
+}
+
+CWLMarkPage::~CWLMarkPage() = default;
+
+/// One column of levels a title.
+void CWLMarkPage::ShowLevelColumns()
+{
+    const std::vector<std::string>& titles = Globals().MarkTitles;
+    CGridModel& model = *GetGrid()->Model();
+    model.RemoveColumnsFrom(LocationColumns + int(titles.size()));
+    GridColumns columns(*GetGrid());
+    for (auto title = std::size_t(model.columnCount() - LocationColumns); title < titles.size(); ++title)
+        columns.Value(LevelAccess(title), FieldKind::Number, UnitGroup::None,
+                      {.header = [&titles, title] { return QString::fromStdString(titles[title]); },
+                       .width = 62,
+                       .emptyIsNotGiven = true});
+}
+
+void CWLMarkPage::LoadFromDocument(CKavo0_hdDoc* document)
+{
+    m_ui->titles_1075->Model()->EnsureFirstRow();
+    ShowLevelColumns();
+    CLocationPage::LoadFromDocument(document);
+}
+
+void CWLMarkPage::AppendLine()
+{
+    StoreToDocument(); // what is typed below a title stays below it
+    CLocationPage::AppendLine();
+}
+
+void CWLMarkPage::DeleteLines()
+{
+    StoreToDocument();
+    const CGenGrid* grid = LinesGrid();
+    if (grid == m_ui->titles_1075 && grid->RowCount() <= 1)
+        return; // there is always a title to name
+    CLocationPage::DeleteLines();
+}
+
+void CWLMarkPage::Retranslate()
+{
+    m_ui->retranslateUi(this);
+}

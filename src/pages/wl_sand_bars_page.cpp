@@ -1,0 +1,46 @@
+#include "pages/wl_sand_bars_page.h"
+
+#include "pages/load_option_dlg.h"
+#include "ui_wl_sand_bars_page.h"
+
+namespace {
+
+constexpr std::int32_t ObservedMethod = 1; // the increment itself is given, not what it is computed from
+
+} // namespace
+
+CWLSandBarsPage::CWLSandBarsPage(CKavo0_hdDoc* document, QWidget* parent)
+    : CLocationPage(document, &HD_Parameters::WLSandBarsList, parent), m_ui(std::make_unique<Ui::CWLSandBarsPage>())
+{
+    m_ui->setupUi(this);
+    HDSandBarIncrement& sand = Globals().SandBarIncrement;
+    Bindings().Add(m_ui->enable_1098, sand.Enabled);
+    Bindings().Add({m_ui->slope_1108, m_ui->observed_1109}, sand.Method);
+    Bindings().EnableWhen([&sand] { return sand.Enabled; }, {m_ui->method, m_ui->load_1104, m_ui->grid_1103});
+    connect(m_ui->load_1104, &QPushButton::clicked, this, [this] { AskForLocations(*this); });
+
+    const auto number = [&sand](Str caption, double& global) {
+        const bool isObserved = &global == &sand.Observed;
+        return ColumnOptions{
+            .caption = caption,
+            .width = 62,
+            .emptyIsNotGiven = true,
+            .locked = [&sand, isObserved](const void*) { return (sand.Method == ObservedMethod) != isObserved; },
+            .globalNumber = &global};
+    };
+    using R = HDWLSandBars;
+    GridWithGlobals(m_ui->grid_1103, &sand)
+        .BranchName({.width = 71})
+        .Chainage({.width = 71})
+        .Value(&R::SandBarValue1, number(Str::BedSlope, sand.Slope))
+        .Value(&R::SandBarValue2, number(Str::LowWaterWidth, sand.Width))
+        .Value(&R::SandBarValue3, number(Str::LowWaterArea, sand.Area))
+        .Value(&R::SandBarValue4, number(Str::ObservedIncrement, sand.Observed));
+}
+
+CWLSandBarsPage::~CWLSandBarsPage() = default;
+
+void CWLSandBarsPage::Retranslate()
+{
+    m_ui->retranslateUi(this);
+}
