@@ -7,10 +7,14 @@
 #include "pages/flood_page.h"
 #include "pages/heat_balance_page.h"
 #include "pages/init_page.h"
+#include "pages/klr_init_page.h"
+#include "pages/klr_param_page.h"
 #include "pages/leakage_page.h"
 #include "pages/loss_page.h"
 #include "pages/mixing_coef_page.h"
+#include "pages/output_page.h"
 #include "pages/quasi_page.h"
+#include "pages/reach_length_page.h"
 #include "pages/stratification_page.h"
 #include "pages/wave_page.h"
 #include "pages/wind_page.h"
@@ -34,9 +38,13 @@ constexpr PageEntry Pages[] = {
     {&Make<CFloodPage>, Str::FloodCaption, 10, true},
     {&Make<CMixingCoefPage>, Str::MixingCaption, 20, true},
     {&Make<CLossPage>, Str::LossCaption, NotOnSheet, false},
+    {&Make<COutputPage>, Str::OutputCaption, 9, false},
     {&Make<CEncroachPage>, Str::EncroachCaption, 12, true},
     {&Make<CHeatBalancePage>, Str::HeatBalanceCaption, 13, false},
     {&Make<CStratificationPage>, Str::StratificationCaption, 14, false},
+    {&Make<CKlrParamPage>, Str::KlrParamCaption, 18, true},
+    {&Make<CKlrInitPage>, Str::KlrInitCaption, 19, true},
+    {&Make<CReachLengthPage>, Str::ReachLengthCaption, 8, true},
     {&Make<CLeakagePage>, Str::LeakageCaption, 17, true},
 };
 
