@@ -108,8 +108,9 @@ TEST_F(LayerPagesTest, ControlsChangeTheirKeywords)
     Open<CKlrInitPage>();
     EachChangesItsKeyword({{1183, "12.5", "h1 = 12.5"},
                            {1184, "-3.25", "h0 = -3.25"},
-                           {1185, "250", "Q1 = 250"},
+                           {1185, "12345.678", "Q1 = 12345.678"},
                            {1161, "1e-05", "Q0 = 1e-05"}});
+    EXPECT_EQ(Find<QLineEdit>(1185)->text(), "12345.678");
     EXPECT_EQ(globals.G_friction_factor, 0.0024) << "of the same section, but of another page";
     Open<CReachLengthPage>();
     globals.FrictionSlope = 3;
@@ -130,7 +131,7 @@ TEST_F(LayerPagesTest, UnitsAndActions)
     {
         int control;
         const char *text, *unit;
-    } shown[] = {{1153, "3531.47", "ft³"}, {1154, "0.0295276", "ft/s"}, {1155, "0.0328084", "ft"}};
+    } shown[] = {{1153, "3531.4667", "ft³"}, {1154, "0.0295276", "ft/s"}, {1155, "0.0328084", "ft"}};
     for (const auto& s : shown) {
         EXPECT_EQ(Find<QLineEdit>(s.control)->text(), s.text);
         EXPECT_EQ(view->page->findChild<QLabel*>(QString("unit_%1").arg(s.control))->text(), s.unit);
