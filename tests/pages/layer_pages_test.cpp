@@ -12,6 +12,7 @@
 #include <QCheckBox>
 #include <QScrollArea>
 #include <QTemporaryDir>
+#include <QTranslator>
 
 namespace {
 
@@ -44,6 +45,17 @@ const struct
     {1184, "BedShearStress", "Bed shear stress, H or Q points"},
     {1228, "GroundwaterHead", "Groundwater head, H or Q points"},
     {1200, "TimeStep", "Time Step, Total"},
+};
+
+/// A language whose words stand in brackets.
+class Brackets : public QTranslator
+{
+public:
+    bool isEmpty() const override { return false; }
+    QString translate(const char*, const char* text, const char*, int) const override
+    {
+        return QString("[%1]").arg(text);
+    }
 };
 
 } // namespace
@@ -268,4 +280,30 @@ TEST_F(LayerPagesTest, TheEnergyEquationIsTheQuasiSteadyPagesToo)
         uses->click();
         EXPECT_EQ(globals.EnergyEquation, !before);
     }
+}
+
+TEST_F(LayerPagesTest, TextsFollowTheLanguage)
+{
+    globals.EnergyEquation = true;
+    Brackets language;
+    const auto follows = [&](auto text, const char* expected) {
+        EXPECT_EQ(text(), expected);
+        QCoreApplication::installTranslator(&language);
+        QCoreApplication::sendPostedEvents();
+        const QString translated = text();
+        QCoreApplication::removeTranslator(&language);
+        QCoreApplication::sendPostedEvents();
+        EXPECT_NE(translated, expected);
+        EXPECT_EQ(translated.count('['), QString(expected).count(", ") + 1) << translated.toStdString();
+        EXPECT_EQ(text(), expected);
+    };
+    Open<COutputPage>();
+    follows([&] { return Find(1037)->accessibleName(); }, "Velocity, H and Q points");
+    Open<CKlrParamPage>();
+    follows([&] { return Find<QComboBox>(1182)->itemText(2); }, "Moving interface down");
+    Open<CKlrInitPage>();
+    follows([&] { return Headers().back(); }, "Q0");
+    Open<CReachLengthPage>();
+    follows([&] { return Headers().back(); }, "Right bank");
+    follows([&] { return Find<QAbstractButton>(1104)->text(); }, "&Load branch and chainages");
 }
