@@ -51,7 +51,13 @@ QString TextOf(const QWidget* control)
     return button && button->isChecked() ? "checked" : "not checked";
 }
 
-/// Changes the first field, list or box that the page offers, by keyboard; null when it has none.
+QTableView* FirstGrid(QWidget* page)
+{
+    return FirstControl<QTableView>(page, "CGenGrid");
+}
+
+/// Changes the first field, list or box that the page offers, by keyboard; null when it has none. A box beside a table
+/// is left alone: it may hide tables, here and on other pages.
 QWidget* ChangeControl(Robot& robot, QWidget* page)
 {
     QLineEdit* edit = FirstControl<QLineEdit>(page, "CCtrlEdit");
@@ -68,17 +74,12 @@ QWidget* ChangeControl(Robot& robot, QWidget* page)
         robot.Key(box, box->currentIndex() + 1 < box->count() ? Qt::Key_Down : Qt::Key_Up);
         return box;
     }
-    if (auto* box = FirstControl<QAbstractButton>(page, "QCheckBox")) {
+    if (auto* box = FirstControl<QAbstractButton>(page, "QCheckBox"); box && !FirstGrid(page)) {
         box->setFocus();
         robot.Key(box, Qt::Key_Space);
         return box;
     }
     return nullptr;
-}
-
-QTableView* FirstGrid(QWidget* page)
-{
-    return FirstControl<QTableView>(page, "CGenGrid");
 }
 
 void ChangeCell(Robot& robot, QWidget* page, PageChange& change)

@@ -7,11 +7,15 @@
 #include "pages/flood_page.h"
 #include "pages/heat_balance_page.h"
 #include "pages/init_page.h"
+#include "pages/klr_init_page.h"
+#include "pages/klr_param_page.h"
 #include "pages/leakage_page.h"
 #include "pages/loss_page.h"
 #include "pages/maps_page.h"
 #include "pages/mixing_coef_page.h"
+#include "pages/output_page.h"
 #include "pages/quasi_page.h"
+#include "pages/reach_length_page.h"
 #include "pages/stratification_page.h"
 #include "pages/text_output_page.h"
 #include "pages/wave_page.h"
@@ -40,11 +44,15 @@ constexpr PageEntry Pages[] = {
     {&Make<CMixingCoefPage>, Str::MixingCaption, 20, true},
     {&Make<CWLMarkPage>, Str::WLMarkCaption, 11, true},
     {&Make<CLossPage>, Str::LossCaption, NotOnSheet, false},
+    {&Make<COutputPage>, Str::OutputCaption, 9, false},
     {&Make<CWLCurvePage>, Str::WLCurveCaption, 21, true},
     {&Make<CWLSandBarsPage>, Str::WLSandBarsCaption, 22, true},
     {&Make<CEncroachPage>, Str::EncroachCaption, 12, true},
     {&Make<CHeatBalancePage>, Str::HeatBalanceCaption, 13, false},
     {&Make<CStratificationPage>, Str::StratificationCaption, 14, false},
+    {&Make<CKlrParamPage>, Str::KlrParamCaption, 18, true},
+    {&Make<CKlrInitPage>, Str::KlrInitCaption, 19, true},
+    {&Make<CReachLengthPage>, Str::ReachLengthCaption, 8, true},
     {&Make<CTextOutputPage>, Str::TextOutputCaption, 15, true},
     {&Make<CMapsPage>, Str::MapsCaption, 16, false},
     {&Make<CLeakagePage>, Str::LeakageCaption, 17, true},

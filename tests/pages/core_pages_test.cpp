@@ -16,7 +16,7 @@ namespace {
 
 constexpr QSize SmallestPage(900, 640);
 
-/// The pages in the order of construction, with their tabs. No caption: decided by the page.
+/// The pages in the order of construction, with their tabs.
 const struct
 {
     const char* name;
@@ -32,19 +32,19 @@ const struct
     {"CQuasiPage", 7, "Quasi Steady"},
     {"CFloodPage", 10, "Flood Plain Resist."},
     {"CMixingCoefPage", 20, "Mixing Coef."},
-    {"CWLMarkPage", 11, nullptr},
+    {"CWLMarkPage", 11, "User Def. Marks"},
     {"CLossPage", NotOnSheet, "Water Loss"},
-    {"COutputPage", 9, nullptr},
-    {"CWLCurvePage", 21, nullptr},
-    {"CWLSandBarsPage", 22, nullptr},
+    {"COutputPage", 9, "Add. Output"},
+    {"CWLCurvePage", 21, "W. L. Incr. - Curves"},
+    {"CWLSandBarsPage", 22, "W. L. Incr. - Sand Bars"},
     {"CEncroachPage", 12, "Encroachment"},
     {"CHeatBalancePage", 13, "Heat Balance"},
     {"CStratificationPage", 14, "Stratification"},
-    {"CKlrParamPage", 18, nullptr},
-    {"CKlrInitPage", 19, nullptr},
-    {"CReachLengthPage", 8, nullptr},
-    {"CTextOutputPage", 15, nullptr},
-    {"CMapsPage", 16, nullptr},
+    {"CKlrParamPage", 18, "KLR Parameters"},
+    {"CKlrInitPage", 19, "KLR Initial"},
+    {"CReachLengthPage", 8, "Reach Lengths"},
+    {"CTextOutputPage", 15, "Time Series Output"},
+    {"CMapsPage", 16, "Maps"},
     {"CLeakagePage", 17, "Groundwater Leakage"},
 };
 
@@ -106,20 +106,17 @@ TEST_F(CorePagesTest, OrderAndCaptions)
 {
     const auto* expected = std::begin(Sheet);
     OnEveryPage([&](CGenPropertyPage& page) {
-        const QString name = page.metaObject()->className();
-        while (expected != std::end(Sheet) && name != expected->name)
-            ++expected;
-        ASSERT_NE(expected, std::end(Sheet)) << "in the order of construction";
-        if (expected->caption) {
-            EXPECT_EQ(caption, expected->caption);
-        }
-        EXPECT_FALSE(caption.isEmpty());
+        ASSERT_NE(expected, std::end(Sheet));
+        EXPECT_STREQ(page.metaObject()->className(), expected->name);
+        EXPECT_EQ(caption, expected->caption);
         EXPECT_EQ(tab, expected->tab);
+        ++expected;
         const auto grids = page.findChildren<CGenGrid*>();
         EXPECT_EQ(view->linesMenu, grid ? grid->isVisible() : std::any_of(grids.begin(), grids.end(), [](auto* each) {
-            return each->isVisible();
-        }));
+                      return each->isVisible();
+                  }));
     });
+    EXPECT_EQ(expected, std::end(Sheet));
 }
 
 TEST_F(CorePagesTest, VisitingChangesNothing)

@@ -413,6 +413,104 @@
         </message>
     </context>
     <context>
+        <name>CKlrInitPage</name>
+        <message>
+            <source>Initial conditions</source>
+            <translation>Initial conditions</translation>
+        </message>
+        <message>
+            <source>Global values</source>
+            <translation>Global values</translation>
+        </message>
+        <message>
+            <source>&amp;Water level (h1)</source>
+            <translation>&amp;Water level (h1)</translation>
+        </message>
+        <message>
+            <source>&amp;Interface level (h0)</source>
+            <translation>&amp;Interface level (h0)</translation>
+        </message>
+        <message>
+            <source>Discharge &amp;toplayer (Q1)</source>
+            <translation>Discharge &amp;toplayer (Q1)</translation>
+        </message>
+        <message>
+            <source>Discharge &amp;bottom layer (Q0)</source>
+            <translation>Discharge &amp;bottom layer (Q0)</translation>
+        </message>
+        <message>
+            <source>Local values</source>
+            <translation>Local values</translation>
+        </message>
+    </context>
+    <context>
+        <name>CKlrParamPage</name>
+        <message>
+            <source>Model Constants</source>
+            <translation>Model Constants</translation>
+        </message>
+        <message>
+            <source>&amp;Interface Friction Factor</source>
+            <translation>&amp;Interface Friction Factor</translation>
+        </message>
+        <message>
+            <source>Maximum &amp;volume of entrainment</source>
+            <translation>Maximum &amp;volume of entrainment</translation>
+        </message>
+        <message>
+            <source>Maximum &amp;entrainment velocity</source>
+            <translation>Maximum &amp;entrainment velocity</translation>
+        </message>
+        <message>
+            <source>Minimum layer &amp;thickness for entrainment cutoff</source>
+            <translation>Minimum layer &amp;thickness for entrainment cutoff</translation>
+        </message>
+        <message>
+            <source>Minimum relative &amp;density difference</source>
+            <translation>Minimum relative &amp;density difference</translation>
+        </message>
+        <message>
+            <source>&amp;Action for disappearing interface</source>
+            <translation>&amp;Action for disappearing interface</translation>
+        </message>
+        <message>
+            <source>Nothing</source>
+            <translation>Nothing</translation>
+        </message>
+        <message>
+            <source>Moving interface up</source>
+            <translation>Moving interface up</translation>
+        </message>
+        <message>
+            <source>Moving interface down</source>
+            <translation>Moving interface down</translation>
+        </message>
+        <message>
+            <source>Richardsens Bulk Flux No.</source>
+            <translation>Richardsens Bulk Flux No.</translation>
+        </message>
+        <message>
+            <source>Global values</source>
+            <translation>Global values</translation>
+        </message>
+        <message>
+            <source>R1 &amp;upward entrainment</source>
+            <translation>R1 &amp;upward entrainment</translation>
+        </message>
+        <message>
+            <source>R1 d&amp;ownward entrainment</source>
+            <translation>R1 d&amp;ownward entrainment</translation>
+        </message>
+        <message>
+            <source>&amp;Rs upward entrainment at controls</source>
+            <translation>&amp;Rs upward entrainment at controls</translation>
+        </message>
+        <message>
+            <source>Local values</source>
+            <translation>Local values</translation>
+        </message>
+    </context>
+    <context>
         <name>CKsEditStyle</name>
         <message>
             <source>Unit: %1</source>
@@ -482,6 +580,101 @@
         <message>
             <source>Table of the current line</source>
             <translation>Table of the current line</translation>
+        </message>
+    </context>
+    <context>
+        <name>COutputPage</name>
+        <message>
+            <source>H or Q points</source>
+            <translation>H or Q points</translation>
+        </message>
+        <message>
+            <source>H and Q points</source>
+            <translation>H and Q points</translation>
+        </message>
+        <message>
+            <source>Total</source>
+            <translation>Total</translation>
+        </message>
+        <message>
+            <source>Structures</source>
+            <translation>Structures</translation>
+        </message>
+        <message>
+            <source>Velocity</source>
+            <translation>Velocity</translation>
+        </message>
+        <message>
+            <source>Discharge</source>
+            <translation>Discharge</translation>
+        </message>
+        <message>
+            <source>Cross Section Area</source>
+            <translation>Cross Section Area</translation>
+        </message>
+        <message>
+            <source>Flow Width</source>
+            <translation>Flow Width</translation>
+        </message>
+        <message>
+            <source>Radius</source>
+            <translation>Radius</translation>
+        </message>
+        <message>
+            <source>Resistance</source>
+            <translation>Resistance</translation>
+        </message>
+        <message>
+            <source>Conveyance</source>
+            <translation>Conveyance</translation>
+        </message>
+        <message>
+            <source>Froude Number</source>
+            <translation>Froude Number</translation>
+        </message>
+        <message>
+            <source>Volume</source>
+            <translation>Volume</translation>
+        </message>
+        <message>
+            <source>Flood Area</source>
+            <translation>Flood Area</translation>
+        </message>
+        <message>
+            <source>Mass Error</source>
+            <translation>Mass Error</translation>
+        </message>
+        <message>
+            <source>Accumulated Mass Error</source>
+            <translation>Accumulated Mass Error</translation>
+        </message>
+        <message>
+            <source>Lateral Inflows</source>
+            <translation>Lateral Inflows</translation>
+        </message>
+        <message>
+            <source>Water level slope</source>
+            <translation>Water level slope</translation>
+        </message>
+        <message>
+            <source>Energy level slope</source>
+            <translation>Energy level slope</translation>
+        </message>
+        <message>
+            <source>Energy level</source>
+            <translation>Energy level</translation>
+        </message>
+        <message>
+            <source>Bed shear stress</source>
+            <translation>Bed shear stress</translation>
+        </message>
+        <message>
+            <source>Groundwater head</source>
+            <translation>Groundwater head</translation>
+        </message>
+        <message>
+            <source>Time Step</source>
+            <translation>Time Step</translation>
         </message>
     </context>
     <context>
@@ -585,6 +778,21 @@
         <message>
             <source>Load branch an&amp;d chainages</source>
             <translation>Load branch an&amp;d chainages</translation>
+        </message>
+    </context>
+    <context>
+        <name>CReachLengthPage</name>
+        <message>
+            <source>Over bank reach lengths</source>
+            <translation>Over bank reach lengths</translation>
+        </message>
+        <message>
+            <source>&amp;Use energy equation</source>
+            <translation>&amp;Use energy equation</translation>
+        </message>
+        <message>
+            <source>&amp;Load branch and chainages</source>
+            <translation>&amp;Load branch and chainages</translation>
         </message>
     </context>
     <context>
@@ -806,6 +1014,14 @@
     <context>
         <name>Kavo0_hd</name>
         <message>
+            <source>R1</source>
+            <translation>R1</translation>
+        </message>
+        <message>
+            <source>R2</source>
+            <translation>R2</translation>
+        </message>
+        <message>
             <source>Kvr_Help.chm
 HDPar
 KVR HD Parameters
@@ -820,6 +1036,30 @@ KVR HD Parameters (*.hdkv)
 .hdkv
 HDPar.Document
 HDPar Document</translation>
+        </message>
+        <message>
+            <source>h0</source>
+            <translation>h0</translation>
+        </message>
+        <message>
+            <source>h1</source>
+            <translation>h1</translation>
+        </message>
+        <message>
+            <source>Q0</source>
+            <translation>Q0</translation>
+        </message>
+        <message>
+            <source>Q1</source>
+            <translation>Q1</translation>
+        </message>
+        <message>
+            <source>Left bank</source>
+            <translation>Left bank</translation>
+        </message>
+        <message>
+            <source>Right bank</source>
+            <translation>Right bank</translation>
         </message>
         <message>
             <source>River Name</source>
@@ -1254,6 +1494,22 @@ This document belongs to no project, so there is nothing to load.</translation>
 Nothing was loaded.</source>
             <translation>No cross section or network editor of the project has answered.
 Nothing was loaded.</translation>
+        </message>
+        <message>
+            <source>Add. Output</source>
+            <translation>Add. Output</translation>
+        </message>
+        <message>
+            <source>KLR Parameters</source>
+            <translation>KLR Parameters</translation>
+        </message>
+        <message>
+            <source>KLR Initial</source>
+            <translation>KLR Initial</translation>
+        </message>
+        <message>
+            <source>Reach Lengths</source>
+            <translation>Reach Lengths</translation>
         </message>
         <message>
             <source>Search for river name/topo ID.

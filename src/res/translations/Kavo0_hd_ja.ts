@@ -413,6 +413,104 @@
         </message>
     </context>
     <context>
+        <name>CKlrInitPage</name>
+        <message>
+            <source>Initial conditions</source>
+            <translation>初期条件</translation>
+        </message>
+        <message>
+            <source>Global values</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>&amp;Water level (h1)</source>
+            <translation>水位(h1)(&amp;W)</translation>
+        </message>
+        <message>
+            <source>&amp;Interface level (h0)</source>
+            <translation>界面の標高(h0)(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Discharge &amp;toplayer (Q1)</source>
+            <translation>上層の流量(Q1)(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Discharge &amp;bottom layer (Q0)</source>
+            <translation>下層の流量(Q0)(&amp;B)</translation>
+        </message>
+        <message>
+            <source>Local values</source>
+            <translation>地点別の値</translation>
+        </message>
+    </context>
+    <context>
+        <name>CKlrParamPage</name>
+        <message>
+            <source>Model Constants</source>
+            <translation>モデル定数</translation>
+        </message>
+        <message>
+            <source>&amp;Interface Friction Factor</source>
+            <translation>界面摩擦係数(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Maximum &amp;volume of entrainment</source>
+            <translation>最大連行量(&amp;V)</translation>
+        </message>
+        <message>
+            <source>Maximum &amp;entrainment velocity</source>
+            <translation>最大連行速度(&amp;E)</translation>
+        </message>
+        <message>
+            <source>Minimum layer &amp;thickness for entrainment cutoff</source>
+            <translation>連行を打ち切る最小層厚(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Minimum relative &amp;density difference</source>
+            <translation>最小相対密度差(&amp;D)</translation>
+        </message>
+        <message>
+            <source>&amp;Action for disappearing interface</source>
+            <translation>界面消失時の処理(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Nothing</source>
+            <translation>処理なし</translation>
+        </message>
+        <message>
+            <source>Moving interface up</source>
+            <translation>界面を上へ移動</translation>
+        </message>
+        <message>
+            <source>Moving interface down</source>
+            <translation>界面を下へ移動</translation>
+        </message>
+        <message>
+            <source>Richardsens Bulk Flux No.</source>
+            <translation>バルクフラックス・リチャードソン数</translation>
+        </message>
+        <message>
+            <source>Global values</source>
+            <translation>全体値</translation>
+        </message>
+        <message>
+            <source>R1 &amp;upward entrainment</source>
+            <translation>R1 上向きの連行(&amp;U)</translation>
+        </message>
+        <message>
+            <source>R1 d&amp;ownward entrainment</source>
+            <translation>R1 下向きの連行(&amp;O)</translation>
+        </message>
+        <message>
+            <source>&amp;Rs upward entrainment at controls</source>
+            <translation>Rs 支配断面での上向きの連行(&amp;R)</translation>
+        </message>
+        <message>
+            <source>Local values</source>
+            <translation>地点別の値</translation>
+        </message>
+    </context>
+    <context>
         <name>CKsEditStyle</name>
         <message>
             <source>Unit: %1</source>
@@ -482,6 +580,101 @@
         <message>
             <source>Table of the current line</source>
             <translation>現在行の表</translation>
+        </message>
+    </context>
+    <context>
+        <name>COutputPage</name>
+        <message>
+            <source>H or Q points</source>
+            <translation>H点またはQ点</translation>
+        </message>
+        <message>
+            <source>H and Q points</source>
+            <translation>H点およびQ点</translation>
+        </message>
+        <message>
+            <source>Total</source>
+            <translation>合計</translation>
+        </message>
+        <message>
+            <source>Structures</source>
+            <translation>構造物</translation>
+        </message>
+        <message>
+            <source>Velocity</source>
+            <translation>流速</translation>
+        </message>
+        <message>
+            <source>Discharge</source>
+            <translation>流量</translation>
+        </message>
+        <message>
+            <source>Cross Section Area</source>
+            <translation>流水断面積</translation>
+        </message>
+        <message>
+            <source>Flow Width</source>
+            <translation>水面幅</translation>
+        </message>
+        <message>
+            <source>Radius</source>
+            <translation>径深</translation>
+        </message>
+        <message>
+            <source>Resistance</source>
+            <translation>抵抗値</translation>
+        </message>
+        <message>
+            <source>Conveyance</source>
+            <translation>通水能</translation>
+        </message>
+        <message>
+            <source>Froude Number</source>
+            <translation>フルード数</translation>
+        </message>
+        <message>
+            <source>Volume</source>
+            <translation>貯水量</translation>
+        </message>
+        <message>
+            <source>Flood Area</source>
+            <translation>氾濫面積</translation>
+        </message>
+        <message>
+            <source>Mass Error</source>
+            <translation>質量誤差</translation>
+        </message>
+        <message>
+            <source>Accumulated Mass Error</source>
+            <translation>累積質量誤差</translation>
+        </message>
+        <message>
+            <source>Lateral Inflows</source>
+            <translation>横流入量</translation>
+        </message>
+        <message>
+            <source>Water level slope</source>
+            <translation>水面勾配</translation>
+        </message>
+        <message>
+            <source>Energy level slope</source>
+            <translation>エネルギー勾配</translation>
+        </message>
+        <message>
+            <source>Energy level</source>
+            <translation>エネルギー水位</translation>
+        </message>
+        <message>
+            <source>Bed shear stress</source>
+            <translation>河床せん断応力</translation>
+        </message>
+        <message>
+            <source>Groundwater head</source>
+            <translation>地下水頭</translation>
+        </message>
+        <message>
+            <source>Time Step</source>
+            <translation>計算時間間隔</translation>
         </message>
     </context>
     <context>
@@ -585,6 +778,21 @@
         <message>
             <source>Load branch an&amp;d chainages</source>
             <translation>河川名と追加距離の読み込み(&amp;D)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CReachLengthPage</name>
+        <message>
+            <source>Over bank reach lengths</source>
+            <translation>高水敷の区間長</translation>
+        </message>
+        <message>
+            <source>&amp;Use energy equation</source>
+            <translation>エネルギー式を用いる(&amp;U)</translation>
+        </message>
+        <message>
+            <source>&amp;Load branch and chainages</source>
+            <translation>河川名と追加距離の読み込み(&amp;L)</translation>
         </message>
     </context>
     <context>
@@ -806,6 +1014,14 @@
     <context>
         <name>Kavo0_hd</name>
         <message>
+            <source>R1</source>
+            <translation>R1</translation>
+        </message>
+        <message>
+            <source>R2</source>
+            <translation>R2</translation>
+        </message>
+        <message>
             <source>Kvr_Help.chm
 HDPar
 KVR HD Parameters
@@ -820,6 +1036,30 @@ KVR HDパラメータ (*.hdkv)
 .hdkv
 HDPar.Document
 HDPar Document</translation>
+        </message>
+        <message>
+            <source>h0</source>
+            <translation>h0</translation>
+        </message>
+        <message>
+            <source>h1</source>
+            <translation>h1</translation>
+        </message>
+        <message>
+            <source>Q0</source>
+            <translation>Q0</translation>
+        </message>
+        <message>
+            <source>Q1</source>
+            <translation>Q1</translation>
+        </message>
+        <message>
+            <source>Left bank</source>
+            <translation>左岸</translation>
+        </message>
+        <message>
+            <source>Right bank</source>
+            <translation>右岸</translation>
         </message>
         <message>
             <source>River Name</source>
@@ -1254,6 +1494,22 @@ This document belongs to no project, so there is nothing to load.</source>
 Nothing was loaded.</source>
             <translation>プロジェクトの横断面エディターと河道網エディターから応答がありません。
 何も読み込みませんでした。</translation>
+        </message>
+        <message>
+            <source>Add. Output</source>
+            <translation>追加出力</translation>
+        </message>
+        <message>
+            <source>KLR Parameters</source>
+            <translation>KLRパラメータ</translation>
+        </message>
+        <message>
+            <source>KLR Initial</source>
+            <translation>KLR初期条件</translation>
+        </message>
+        <message>
+            <source>Reach Lengths</source>
+            <translation>区間長</translation>
         </message>
         <message>
             <source>Search for river name/topo ID.
