@@ -1,0 +1,272 @@
+// The sheet as a whole against the declared tables of the file: nothing is lost by a visit, nothing is out of reach.
+#include "page_fixture.h"
+
+#include "data/hd_file.h"
+#include "data/hd_support.h"
+#include "ks/fc/file_dialog.h"
+#include "ks/units/edit_fields.h"
+#include "module/page_table.h"
+#include "pages/framework/ctrl_edit.h"
+#include "pages/framework/date_time_edit.h"
+
+#include <QCheckBox>
+#include <QRadioButton>
+#include <QTemporaryDir>
+#include <set>
+
+namespace {
+
+/// A value that differs from the default, and that a page can show and take.
+void Change(const Field& field, void* object, int& seed)
+{
+    ++seed;
+    switch (field.kind) {
+    case FieldKind::Number:
+        field.In<double>(object) += 0.25 + seed;
+        break;
+    case FieldKind::Integer:
+        field.In<std::int32_t>(object) += seed;
+        break;
+    case FieldKind::Choice:
+        field.In<std::int32_t>(object) = field.In<std::int32_t>(object) == 1 ? 2 : 1;
+        break;
+    case FieldKind::Boolean:
+        field.In<bool>(object) = !field.In<bool>(object);
+        break;
+    case FieldKind::Text:
+    case FieldKind::FileName:
+        field.In<std::string>(object) = "TEXT " + std::to_string(seed);
+        break;
+    case FieldKind::DateTime:
+        field.In<HDDateTime>(object) = {2000 + seed, 2, 28, 23, 59, 1};
+        break;
+    case FieldKind::Group: {
+        void* container = field.address(object);
+        field.group->resize(container, 2);
+        for (std::size_t i = 0; i < 2; ++i)
+            for (const Field& element : field.group->elements)
+                Change(element, field.group->at(container, i), seed);
+        break;
+    }
+    }
+}
+
+/// Every value of every section is another one than in a new file.
+void ChangeEverything(HD_Parameters& parameters)
+{
+    int seed = 0;
+    ForEachGlobal([&](const std::string&, FieldList fields) {
+        for (const Field& field : fields)
+            Change(field, &parameters.Global, seed);
+    });
+    parameters.EncroachList.Add();
+    ForEachList(parameters, parameters, [&](const char*, CGenList& list, CGenList&) {
+        for (int line = 0; line < 2; ++line) {
+            HD_RiverPos& record = list.AddTail(list.NewRecord());
+            record.RiverName = "RIVER " + std::to_string(++seed);
+            record.Chainage = seed;
+            for (const Field& field : list.Fields())
+                Change(field, &record, seed);
+        }
+    });
+    // What an increment, a map or a period needs so that its other cells are open.
+    parameters.Global.MapOutput.MapOutputFiles[0].Type = 2;
+    parameters.Global.MapOutput.MapOutputFiles[0].Item = 4;
+}
+
+/// "Section/keyword parameter", for a line of a file's text. Lists of lines are one name: the first line stands for
+/// all.
+class Places
+{
+public:
+    explicit Places(const QStringList& lines)
+    {
+        QStringList sections;
+        for (const QString& line : lines) {
+            const QString text = line.trimmed();
+            if (text.startsWith("[/") && !sections.isEmpty())
+                sections.removeLast();
+            else if (text.startsWith('['))
+                sections << text.mid(1, text.size() - 2);
+            m_names << (text.contains(" = ") ? sections.mid(1).join('/') + '/' + text.section(" = ", 0, 0) : QString());
+        }
+    }
+    /// Names of the parameters that differ between two texts of as many lines.
+    static std::set<QString> Differences(const QStringList& before, const QStringList& after)
+    {
+        std::set<QString> changed;
+        if (before.size() != after.size())
+            return changed;
+        const Places places(before);
+        for (qsizetype line = 0; line < before.size(); ++line) {
+            if (before[line] == after[line])
+                continue;
+            const QStringList old = Parameters(before[line]), now = Parameters(after[line]);
+            for (qsizetype i = 0; i < std::min(old.size(), now.size()); ++i)
+                if (old[i] != now[i])
+                    changed.insert(Name(places.m_names[line], i));
+        }
+        return changed;
+    }
+    static std::set<QString> All(const QStringList& lines)
+    {
+        std::set<QString> all;
+        const Places places(lines);
+        for (qsizetype line = 0; line < lines.size(); ++line)
+            for (qsizetype i = 0; !places.m_names[line].isEmpty() && i < Parameters(lines[line]).size(); ++i)
+                all.insert(Name(places.m_names[line], i));
+        return all;
+    }
+
+private:
+    static QStringList Parameters(const QString& line) { return line.section(" = ", 1).split(", "); }
+    static QString Name(const QString& keyword, qsizetype parameter)
+    {
+        return QString("%1 %2").arg(keyword).arg(parameter + 1);
+    }
+    QStringList m_names;
+};
+
+} // namespace
+
+class CompleteSheetTest : public PageTest
+{
+protected:
+    CompleteSheetTest()
+    {
+        KsSetFileDialogHandler([](const KsFileQuestion&) { return CString(); });
+        HD_Parameters parameters;
+        ChangeEverything(parameters);
+        EXPECT_TRUE(SaveHDFile(parameters, Path("all.HDKV"), {.everySet = true}));
+        EXPECT_TRUE(document.OnOpenDocument(QString::fromStdString(Path("all.HDKV"))));
+    }
+    ~CompleteSheetTest() override { KsSetFileDialogHandler({}); }
+    std::string Path(const char* name) const { return folder.filePath(name).toStdString(); }
+    QStringList Lines() const { return QString::fromStdString(HDFileText(document.Parameters(), true)).split('\n'); }
+    void Show(const PageEntry& entry)
+    {
+        CGenPropertyPage* page = entry.make(&document).release();
+        view = std::make_unique<TestView>(document, page);
+    }
+    /// Does something to the page, and notes which parameters of the file that changed.
+    template <typename Act>
+    void Try(Act act)
+    {
+        const QStringList before = Lines();
+        act();
+        reached.merge(Places::Differences(before, Lines()));
+        if (!boxes.isEmpty()) { // a range: the field keeps what it had
+            boxes.clear();
+            QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
+        }
+    }
+    void TypeInto(QLineEdit& field, const char* text)
+    {
+        field.setFocus();
+        field.selectAll();
+        QTest::keyClicks(&field, text);
+        QTest::keyClick(&field, Qt::Key_Tab);
+        QTest::qWait(0);
+    }
+    void DriveControls(QWidget& page, bool backwards)
+    {
+        for (auto* field : page.findChildren<QLineEdit*>())
+            if (field->isEnabled() && field->isVisible() && !qobject_cast<QComboBox*>(field->parent()))
+                for (const char* text : {"0.5", "3", "2031-01-02 03:04:05", "TYPED"})
+                    Try([&] { TypeInto(*field, text); });
+        for (auto* list : page.findChildren<QComboBox*>())
+            if (list->isEnabled() && list->isVisible())
+                Try([&] { QTest::keyClick(list, list->currentIndex() > 0 ? Qt::Key_Up : Qt::Key_Down); });
+        auto buttons = page.findChildren<QAbstractButton*>();
+        if (backwards)
+            std::reverse(buttons.begin(), buttons.end());
+        for (auto* button : buttons)
+            if (button->isEnabled() && button->isVisible() &&
+                (qobject_cast<QCheckBox*>(button) || qobject_cast<QRadioButton*>(button)))
+                Try([&] { button->click(); });
+    }
+    void Set(CGenGrid& cells, int row, int column, const QString& text)
+    {
+        CGridModel& model = *cells.Model();
+        if (model.flags(model.index(row, column)) & Qt::ItemIsEditable)
+            model.setData(model.index(row, column), text, Qt::EditRole);
+        else
+            cells.ActOn(row + 1, column + 1);
+        view->page->StoreToDocument();
+    }
+    void DriveCells(CGenGrid& cells)
+    {
+        const CGridModel& model = *cells.Model();
+        // One entry of the lists after the other, because they lock other cells.
+        const bool hasLists = std::any_of(model.Columns().begin(), model.Columns().end(),
+                                          [](const ColumnSpec& column) { return bool(column.choices.entries); });
+        for (int entry = 0; entry < (hasLists ? 6 : 1); ++entry)
+            for (int row = 0; row < std::min(model.rowCount(), 2); ++row)
+                for (int column = 0; column < model.columnCount(); ++column) {
+                    const Choices& choices = model.Columns()[std::size_t(column)].choices;
+                    const QStringList entries = choices.entries ? choices.entries() : QStringList();
+                    if (!entries.isEmpty())
+                        Try([&] { Set(cells, row, column, entries[entry % entries.size()]); });
+                    else
+                        for (const char* text : {"0.5", "3", "2031-01-02 03:04:05", "TYPED"})
+                            Try([&] { Set(cells, row, column, text); });
+                }
+    }
+
+    QTemporaryDir folder;
+    std::set<QString> reached;
+};
+
+TEST_F(CompleteSheetTest, VisitingAndSavingEverythingKeepsTheFile)
+{
+    const std::string before = ReadText(Path("all.HDKV"));
+    for (const PageEntry& entry : PageTable()) {
+        Show(entry);
+        SCOPED_TRACE(view->page->metaObject()->className());
+        for (const auto system : {KsUnitSystem::UsCustomary, KsUnitSystem::Metric}) {
+            KsUnits::Instance().SetSystem(system);
+            view->page->LoadFromDocument(&document);
+        }
+        EXPECT_TRUE(view->page->OnKillActive());
+        ASSERT_EQ(HDFileText(document.Parameters(), true), before);
+    }
+    EXPECT_FALSE(document.IsModified());
+    ASSERT_TRUE(document.OnSaveDocument(document.GetPathName().isEmpty() ? folder.filePath("all.HDKV")
+                                                                         : document.GetPathName()));
+    EXPECT_EQ(ReadText(Path("all.HDKV")), before);
+    EXPECT_EQ(boxes, QStringList());
+}
+
+TEST_F(CompleteSheetTest, EveryValueCanBeChangedOnSomePage)
+{
+    const std::set<QString> all = Places::All(Lines());
+    for (const PageEntry& entry : PageTable()) {
+        if (entry.tab == NotOnSheet)
+            continue;
+        // Several times, because switches open and lock the rest; a switch stands before what it opens.
+        for (const bool backwards : {true, false, true, true}) {
+            Show(entry);
+            const auto grids = view->page->findChildren<CGenGrid*>();
+            for (auto* cells : grids)
+                DriveCells(*cells);
+            for (auto* cells : grids) {
+                cells->setFocus();
+                Try([&] { view->page->AppendLine(); });
+            }
+            DriveControls(*view->page, backwards);
+        }
+    }
+    // What no page shows, so that it is carried through, and the losses, whose page is not on the sheet.
+    const std::set<QString> carried = {
+        "Add_Output/ReducedOut", "Add_Output/Topo_print",     "Add_Output/Coef_print",     "Add_Output/Test_print",
+        "Defalt_Values/spilfc",  "Defalt_Values/storfc",      "Global_Values/G_S_max",     "Global_Values/G_f",
+        "Global_Values/G_k_100", "Global_Values/G_min_width", "MapOutput/AddToCalculation"};
+    QStringList missed;
+    for (const QString& name : all) {
+        const QString keyword = name.section(' ', 0, 0).remove("Global_Variables/");
+        if (!reached.contains(name) && !carried.contains(keyword) && !name.startsWith("WaterList/") &&
+            keyword + name.section(' ', 1) != "MapOutput/MapOutputFiles/data7")
+            missed << name;
+    }
+    EXPECT_EQ(missed.join('\n').toStdString(), "");
+}

@@ -1,0 +1,245 @@
+// The pages of user-defined marks, increment curves and sand bars: columns that come and go, a global row, locks.
+#include "page_fixture.h"
+
+#include "data/hd_file.h"
+#include "pages/wl_curve_page.h"
+#include "pages/wl_mark_page.h"
+#include "pages/wl_sand_bars_page.h"
+
+#include <QCheckBox>
+#include <QRadioButton>
+
+class MarkPagesTest : public PageTest
+{
+protected:
+    QStringList Text() const { return QString::fromStdString(HDFileText(document.Parameters())).split('\n'); }
+    HDWLMark& AddMark(const char* name, double chainage, std::vector<double> levels)
+    {
+        HDWLMark mark;
+        mark.RiverName = name;
+        mark.Chainage = chainage;
+        mark.MarkLevels = std::move(levels);
+        return document.Parameters().WaterLevelMarkList.Add(mark);
+    }
+    CGenGrid& OpenMarks()
+    {
+        Open<CWLMarkPage>();
+        return *view->page->findChild<CGenGrid*>("titles_1075");
+    }
+    QStringList Headers() const
+    {
+        QStringList headers;
+        for (int column = 2; column < grid->ColumnCount(); ++column)
+            headers << grid->model()->headerData(column, Qt::Horizontal).toString();
+        return headers;
+    }
+    /// "levels of the first record | of the second", missing ones left out.
+    QString Levels() const
+    {
+        QStringList records;
+        auto& marks = document.Parameters().WaterLevelMarkList;
+        for (std::size_t i = 0; i < marks.GetCount(); ++i) {
+            QStringList levels;
+            for (const double level : marks.GetAt(i).MarkLevels)
+                levels << (level == NotGiven ? "-" : KsShortestNumber(level));
+            records << levels.join(' ');
+        }
+        return records.join(" | ");
+    }
+    void Undo() { view->page->UndoRedo(true); }
+
+    HD_Global_Var& g = document.Parameters().Global;
+};
+
+TEST_F(MarkPagesTest, TitlesAndLevelsStayInStep)
+{
+    g.MarkTitles = {"LOW", "HIGH"};
+    g.MarkInterpolate = {true}; // one short
+    AddMark("A", 1, {3}); // a shorter list
+    AddMark("B", 2, {1, 2});
+    CGenGrid& titles = OpenMarks();
+    const QStringList before = Text();
+    EXPECT_EQ(Headers(), QStringList({"LOW", "HIGH"}));
+    EXPECT_EQ(Texts(1), "A|1|3.000|");
+    EXPECT_EQ(Texts(2), "B|2|1.000|2.000");
+
+    // Insert above the second title.
+    titles.setFocus();
+    titles.selectRow(1);
+    QTest::keyClick(&titles, Qt::Key_Insert);
+    EXPECT_EQ(Headers(), QStringList({"LOW", "", "HIGH"}));
+    EXPECT_EQ(Levels(), "3 | 1 - 2") << "a list that ends before the column is left as it is";
+    // Typed in lower case it stands in upper case, in the cell and above the column.
+    QTest::keyClicks(&titles, "m");
+    QTest::keyClicks(titles.Delegate()->Editor(), "id");
+    QTest::keyClick(titles.Delegate()->Editor(), Qt::Key_Return);
+    titles.StoreEditedLine();
+    EXPECT_EQ(titles.TextAt(2, 1), "MID");
+    EXPECT_EQ(Headers(), QStringList({"LOW", "MID", "HIGH"}));
+    // A level for the record that is too short.
+    Enter(1, 5, "7.5");
+    grid->StoreEditedLine();
+    EXPECT_EQ(Levels(), "3 - 7.5 | 1 - 2");
+
+    Undo();
+    EXPECT_EQ(Levels(), "3 | 1 - 2") << "as short as it was";
+    Undo();
+    EXPECT_EQ(Headers(), QStringList({"LOW", "", "HIGH"}));
+    Undo();
+    EXPECT_TRUE(Text() == before);
+    EXPECT_EQ(Headers(), QStringList({"LOW", "HIGH"}));
+
+    // Delete the first title, and bring it back.
+    titles.setFocus();
+    titles.selectRow(0);
+    QTest::keyClick(&titles, Qt::Key_Delete);
+    EXPECT_EQ(Headers(), QStringList("HIGH"));
+    EXPECT_EQ(Levels(), " | 2");
+    titles.selectRow(0);
+    QTest::keyClick(&titles, Qt::Key_Delete);
+    EXPECT_EQ(Headers(), QStringList("HIGH")) << "the only title stays";
+    Undo();
+    EXPECT_TRUE(Text() == before);
+    EXPECT_EQ(boxes, QStringList());
+}
+
+TEST_F(MarkPagesTest, InterpolateIsAClickOnItsBox)
+{
+    g.MarkTitles = {"LOW", "HIGH"};
+    CGenGrid& titles = OpenMarks();
+    const QStringList before = Text();
+    const auto click = [&](int row, int column) {
+        QTest::mouseClick(titles.viewport(), Qt::LeftButton, {},
+                          titles.visualRect(titles.model()->index(row, column)).center());
+    };
+    click(1, 1);
+    EXPECT_EQ(g.MarkInterpolate, (std::deque<bool>{false, true}));
+    EXPECT_TRUE(document.IsModified());
+    QTest::keyClick(&titles, Qt::Key_Space);
+    EXPECT_EQ(g.MarkInterpolate, (std::deque<bool>{false, false}));
+    Undo();
+    Undo();
+    EXPECT_TRUE(Text() == before) << "and the list of flags is as short as it was";
+    // Keys that would open an editor elsewhere do nothing here.
+    QTest::keyClick(&titles, Qt::Key_A);
+    EXPECT_FALSE(titles.Delegate()->Editor());
+    EXPECT_TRUE(Text() == before);
+}
+
+TEST_F(MarkPagesTest, ATitleWithoutTextIsLeftOutOfTheFile)
+{
+    QTemporaryDir folder;
+    CGenGrid& titles = OpenMarks();
+    EXPECT_EQ(titles.RowCount(), 1) << "a row to name the first title in";
+    EXPECT_EQ(Headers(), QStringList(""));
+    ASSERT_TRUE(document.OnSaveDocument(folder.filePath("new.HDKV")));
+    EXPECT_EQ(g.MarkTitles.size(), 1U) << "shown again";
+    EXPECT_EQ(document.UndoStack().count(), 0);
+    titles.setFocus();
+    QTest::keyClick(&titles, Qt::Key_F);
+    QTest::keyClick(titles.Delegate()->Editor(), Qt::Key_Return);
+    titles.StoreEditedLine();
+    titles.setFocus();
+    QTest::keyClick(&titles, Qt::Key_Insert); // a second one, never named
+    EXPECT_EQ(g.MarkTitles, (std::vector<std::string>{"F", ""}));
+    ASSERT_TRUE(document.OnSaveDocument(folder.filePath("new.HDKV")));
+    EXPECT_EQ(g.MarkTitles, std::vector<std::string>{"F"});
+    Undo();
+    EXPECT_EQ(g.MarkTitles, (std::vector<std::string>{"F", ""}));
+}
+
+TEST_F(MarkPagesTest, TheGlobalRowIsNoLineOfTheList)
+{
+    HDWLCurve record;
+    record.RiverName = "A";
+    record.Chainage = 10;
+    record.CurveOption = 4;
+    record.CurveValue1 = NotGiven;
+    record.CurveValue2 = 250;
+    document.Parameters().WLCurveList.Add(record);
+    g.CurveIncrement = {.Enabled = true, .Range = 1, .Width = 40, .Radius = 300, .Velocity = 1.25};
+    Open<CWLCurvePage>();
+    EXPECT_EQ(Texts(1), "Global||Single|40.000|300.000|1.250");
+    EXPECT_EQ(Texts(2), "A|10|Multiple ½||250.000|0.000");
+
+    Enter(1, 4, "55.5");
+    Type(2, 5, ""); // emptied
+    QTest::keyClick(Editor(), Qt::Key_Return);
+    grid->StoreEditedLine();
+    EXPECT_EQ(g.CurveIncrement.Width, 55.5);
+    EXPECT_EQ(document.Parameters().WLCurveList.GetAt(0).CurveValue2, NotGiven);
+    for (const int column : {1, 2}) {
+        SCOPED_TRACE(column);
+        grid->SetCurrentCell(1, column);
+        QTest::keyClick(grid, Qt::Key_X);
+        EXPECT_FALSE(Editor()) << "caption of the row";
+    }
+    // It can neither be deleted nor moved down by an insertion.
+    SelectRows(1, 1);
+    QTest::keyClick(grid, Qt::Key_Delete);
+    SelectRows(1, 2);
+    QTest::keyClick(grid, Qt::Key_Delete);
+    EXPECT_EQ(grid->RowCount(), 2) << "an empty list shows a blank line";
+    EXPECT_EQ(Texts(2), "||None|||");
+    SelectRows(1, 1);
+    QTest::keyClick(grid, Qt::Key_Insert);
+    EXPECT_EQ(grid->RowCount(), 3);
+    EXPECT_EQ(grid->TextAt(1, 1), "Global");
+    Undo();
+    Undo();
+    EXPECT_EQ(Texts(2), "A|10|Multiple ½|||0.000");
+    view->page->InsertLocation("NEW", "12.5");
+    EXPECT_EQ(document.Parameters().WLCurveList.GetAt(1).RiverName, "NEW");
+    EXPECT_EQ(Current(), std::pair(3, 1));
+    EXPECT_FALSE(view->page->GetRecordAt(1));
+    EXPECT_EQ(view->page->GetRecordAt(2)->RiverName, "A");
+    int row = 1;
+    EXPECT_FALSE(grid->SearchRows(row, "GLOBAL", 0, 3, 0));
+}
+
+TEST_F(MarkPagesTest, CurveSwitchesTakeEachOtherAlong)
+{
+    g.CurveIncrement.Enabled = true;
+    Open<CWLCurvePage>();
+    const struct
+    {
+        const char* box;
+        const char* state;  // of range, width, radius, velocity afterwards
+        const char* locked; // columns
+    } steps[] = {{"range_1099", "1000", "3"},      {"radius_1101", "1011", "3 5 6"}, {"width_1100", "1111", "3 4 5 6"},
+                 {"radius_1101", "1101", "3 4 6"}, {"velocity_1102", "1000", "3"},   {"velocity_1102", "1001", "3 6"},
+                 {"range_1099", "0001", "6"}};
+    const auto state = [this] {
+        const auto& c = g.CurveIncrement;
+        return QString("%1%2%3%4").arg(c.SystemRange).arg(c.SystemWidth).arg(c.SystemRadius).arg(c.SystemVelocity);
+    };
+    const auto locked = [this](int row) {
+        QStringList columns;
+        for (int column = 3; column <= 6; ++column)
+            if (grid->Model()->IsLocked(row, column - 1))
+                columns << QString::number(column);
+        return columns.join(' ');
+    };
+    for (const auto& step : steps) {
+        SCOPED_TRACE(step.box);
+        const QString before = state();
+        view->page->findChild<QCheckBox*>(step.box)->click();
+        EXPECT_EQ(state(), step.state);
+        EXPECT_EQ(locked(0), step.locked);
+        EXPECT_EQ(locked(1), step.locked);
+        Undo();
+        EXPECT_EQ(state(), before) << "one step";
+        view->page->UndoRedo(false);
+    }
+    view->page->findChild<QCheckBox*>("enable_1098")->click();
+    EXPECT_FALSE(grid->isEnabled());
+    EXPECT_FALSE(view->page->findChild<QCheckBox*>("velocity_1102")->isEnabled());
+
+    g.SandBarIncrement.Enabled = true;
+    Open<CWLSandBarsPage>();
+    EXPECT_EQ(locked(1), "6");
+    view->page->findChild<QRadioButton*>("observed_1109")->click();
+    EXPECT_EQ(g.SandBarIncrement.Method, 1);
+    EXPECT_EQ(locked(0), "3 4 5");
+    EXPECT_EQ(locked(1), "3 4 5");
+}
