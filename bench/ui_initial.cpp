@@ -1,5 +1,6 @@
 // The page of initial conditions with a million lines: how long it takes to show, against a bare table view of the same
 // size; and what storing one edited cell, moving on and repainting costs, against a thousand lines.
+#include "bench/page_view.h"
 #include "bench/report.h"
 #include "pages/framework/gen_grid.h"
 #include "pages/init_page.h"
@@ -24,32 +25,6 @@ public:
     }
 };
 
-/// Relays updates of the document to the page, as the program's view does.
-class View : public CView, public IPageHost
-{
-public:
-    View(CKavo0_hdDoc& document, CGenPropertyPage& page) : m_document(document), m_page(page)
-    {
-        page.SetHost(this);
-        document.AddView(this);
-    }
-    void OnUpdate(CView*, int, CHint*) override { m_page.LoadFromDocument(&m_document); }
-    CView* HostView() override { return this; }
-    void EditedLineChanged(int) override
-    {
-        m_page.StoreToDocument();
-        m_document.UpdateAllViews(nullptr, Hint::Reload);
-    }
-    void CurrentLocationChanged(int) override {}
-    void Execute(int) override {}
-    QStringList BranchNames() override { return {}; }
-    void EnableLinesMenu(bool) override {}
-
-private:
-    CKavo0_hdDoc& m_document;
-    CGenPropertyPage& m_page;
-};
-
 void Fill(CKavo0_hdDoc& document, int lines)
 {
     auto& list = document.Parameters().InitList;
@@ -62,14 +37,6 @@ void Fill(CKavo0_hdDoc& document, int lines)
         record.InitialQ = 100;
         list.Add(record);
     }
-}
-
-void Show(QWidget& widget)
-{
-    widget.resize(800, 700);
-    widget.show();
-    widget.repaint();
-    QApplication::processEvents();
 }
 
 double ShowPage(CKavo0_hdDoc& document)
@@ -99,7 +66,7 @@ struct Edited
     {
         Fill(document, lines);
         page = std::make_unique<CInitPage>(&document);
-        view = std::make_unique<View>(document, *page);
+        view = std::make_unique<PageView>(document, *page);
         page->OnSetActive();
         Show(*page);
         grid = page->GetGrid();
@@ -120,7 +87,7 @@ struct Edited
 
     CKavo0_hdDoc document;
     std::unique_ptr<CInitPage> page;
-    std::unique_ptr<View> view;
+    std::unique_ptr<PageView> view;
     CGenGrid* grid = nullptr;
     int row = 0;
     double value = 1000;

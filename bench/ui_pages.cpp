@@ -34,6 +34,7 @@ void Fill(HD_Parameters& parameters, int lines)
     // Whatever hides a grid is switched on.
     parameters.Global.EnergyEquation = true;
     parameters.Global.Leakage.IncludeLeakage = true;
+    parameters.Global.MarkTitles = {"LOW", "HIGH"};
 }
 
 /// A document in a window, as the shell shows it.
@@ -85,7 +86,8 @@ int main(int argc, char** argv)
                 inSmall.push_back(second);
             }
         }
-        const std::string what = "To \"" + large.view->Sheet()->tabText(tab).toStdString() + "\": 100,000 / 100 records";
+        const std::string what =
+            "To \"" + large.view->Sheet()->tabText(tab).toStdString() + "\": 100,000 / 100 records";
         fast = Report(what.c_str(), Median(inLarge), Median(inSmall), 2.0) && fast;
     }
     FreeModuleResources();
