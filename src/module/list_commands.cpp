@@ -27,17 +27,20 @@ void CDocumentCommand::Run(bool forward)
 }
 
 CInsertLines::CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row,
-                           std::unique_ptr<IRowBlock> lines)
+                           std::unique_ptr<IRowBlock> lines, FirstLine first)
     : CDocumentCommand(document, LoadString(Str::UndoInsert)),
       m_rows(std::move(rows)),
       m_row(row),
       m_count(lines->Count()),
-      m_lines(std::move(lines))
+      m_lines(std::move(lines)),
+      m_first(first)
 {
 }
 
 ChangePlace CInsertLines::Apply()
 {
+    if (m_first == FirstLine::Goes)
+        m_rows->RemoveFirstRow();
     m_row = m_rows->Put(m_row, std::move(m_lines));
     return PlaceOf(*m_rows, m_row, 1);
 }
@@ -63,7 +66,8 @@ ChangePlace CDeleteLines::Apply()
     for (std::size_t i = 0; i < m_count; ++i)
         m_rows->Touch(m_rows->KeyAt(m_row + i));
     m_lines = m_rows->Take(m_row, m_count);
-    m_replaced = m_rows->Count() == 0 && m_replacement;
+    m_leftEmpty = m_rows->Count() == 0;
+    m_replaced = m_leftEmpty && m_replacement;
     if (m_replaced)
         m_rows->Put(0, std::move(m_replacement));
     return PlaceOf(*m_rows, m_row, 1);
@@ -73,6 +77,8 @@ ChangePlace CDeleteLines::Revert()
 {
     if (m_replaced)
         m_replacement = m_rows->Take(0, 1);
+    else if (m_leftEmpty)
+        m_rows->RemoveFirstRow();
     m_row = m_rows->Put(m_row, std::move(m_lines));
     return PlaceOf(*m_rows, m_row, 1);
 }

@@ -62,7 +62,8 @@ enum HDDataType
 };
 
 /// The user-defined marks. The first item of a list has their titles and, as `flags`, whether each is interpolated;
-/// every further item has a location: the branch, and as `values` the chainage and then a level a title.
+/// every further item has a location: the branch, and as `values` the chainage and then a level for each title (more
+/// where the line holds more).
 class KS_API CKvrCBEUserDefMark : public CKsCBEItem
 {
 public:

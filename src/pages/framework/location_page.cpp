@@ -33,6 +33,7 @@ GridColumns& GridColumns::Add(int control, const Field& field, ColumnOptions opt
         column.choices.entries = [entries = *options.choices] { return LoadString(entries).split(u'\n'); };
     column.unitText = std::move(options.unitText);
     column.hint = std::move(options.hint);
+    column.locationValue = options.locationValue;
     column.access = std::make_shared<CellAccess>(FieldAccess(field));
     m_grid.Model()->AddColumn(std::move(column));
     return *this;

@@ -22,6 +22,7 @@ struct ColumnOptions
     Choices choice = {};                    // the rest of a drop-down column; its entries come from `choices`
     std::function<QString()> unitText = {}; // see ColumnSpec
     std::function<QString()> hint = {};     // see ColumnSpec
+    LocationValue locationValue = LocationValue::None;
 };
 
 /// Declares the columns of a grid, from left to right.
