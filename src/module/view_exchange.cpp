@@ -88,5 +88,4 @@ void CKavo0_hdView::FetchLocation()
     }
     const double shown = CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(place->chainage, 1);
     ActivePage()->InsertLocation(place->branch, KsShortestNumber(shown));
-    TellLater(m_tellChange);
 }

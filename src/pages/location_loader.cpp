@@ -10,6 +10,7 @@
 #include <QUndoStack>
 #include <cmath>
 #include <map>
+#include <set>
 
 namespace {
 
@@ -42,10 +43,13 @@ public:
 private:
     void Take(const CKvrCBELocation& place)
     {
-        const auto [line, isNew] = m_known.emplace(Place(place.branch.toUpper(), place.chainage), IsNew);
-        if (isNew) {
+        const Place key(place.branch.toUpper(), place.chainage);
+        if (!m_taken.insert(key).second)
+            return; // it came already
+        const auto line = m_known.find(key);
+        if (line == m_known.end()) {
             m_new.push_back(&place);
-        } else if (line->second != IsNew) { // else the place came twice
+        } else {
             ++m_result.known;
             Change(line->second, place);
         }
@@ -111,15 +115,14 @@ private:
         document.DataChange(document.GetPathName());
     }
 
-    static constexpr std::size_t IsNew = std::size_t(-1);
-
     CGenPropertyPage& m_page;
     LocationValues m_values;
     std::shared_ptr<IRowSource> m_rows;
     std::map<Place, std::size_t> m_known; // the row of each place
+    std::set<Place> m_taken;
     std::vector<const CKvrCBELocation*> m_new;
     std::vector<CellChange> m_changes;
-    std::size_t m_firstChanged = IsNew;
+    std::size_t m_firstChanged = 0;
     LoadedLocations m_result;
 };
 
