@@ -842,6 +842,78 @@ filled information will be deleted when saving the editor file.
 Proceed Yes/No ?</translation>
         </message>
         <message>
+            <source>Data deleted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Wave page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Init page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Bed Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Wind page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Water Loss page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Init page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Bed Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Wave page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Wind page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Water Loss page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Wave page because of error on active page</source>
+            <translation>Can't select Wave page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Init page because of error on active page</source>
+            <translation>Can't select Init page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Bed Resist. page because of error on active page</source>
+            <translation>Can't select Bed Resist. page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Wind page because of error on active page</source>
+            <translation>Can't select Wind page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Water Loss page because of error on active page</source>
+            <translation>Can't select Water Loss page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Flood Plain Resist. page because of error on active page</source>
+            <translation>Can't select Flood Plain Resist. page because of error on active page</translation>
+        </message>
+        <message>
             <source>HD Parameters</source>
             <translation>HD Parameters</translation>
         </message>
@@ -878,6 +950,18 @@ Kinematic Wave</source>
 Fully Dynamic
 Diffusive Wave
 Kinematic Wave</translation>
+        </message>
+        <message>
+            <source>Data deleted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Mixing Coef. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Mixing Coef. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Mixing Coef. page because of error on active page</source>
+            <translation>Can't select Mixing Coef. page because of error on active page</translation>
         </message>
         <message>
             <source>Leakage Coef</source>
@@ -924,6 +1008,16 @@ Replace it Yes/No ?</translation>
         <message>
             <source>Search &amp;Again</source>
             <translation>Search &amp;Again</translation>
+        </message>
+        <message>
+            <source>Insert &amp;Location from Network</source>
+            <translation>Insert &amp;Location from Network</translation>
+        </message>
+        <message>
+            <source>No network editor of the project has a picked location.
+Pick a place on the network's map first.</source>
+            <translation>No network editor of the project has a picked location.
+Pick a place on the network's map first.</translation>
         </message>
         <message>
             <source>Initial h</source>
@@ -994,6 +1088,10 @@ Replace it Yes/No ?</translation>
         <message>
             <source>Change of a value</source>
             <translation>Change of a value</translation>
+        </message>
+        <message>
+            <source>Loading of locations</source>
+            <translation>Loading of locations</translation>
         </message>
         <message>
             <source>Next cell; behind the last one a new line</source>
@@ -1254,6 +1352,14 @@ This document belongs to no project, so there is nothing to load.</translation>
 Nothing was loaded.</source>
             <translation>No cross section or network editor of the project has answered.
 Nothing was loaded.</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1 locations added, %2 were there already.</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
+            <translation>%1 locations added, %2 were there already; %3 of these have new values.</translation>
         </message>
         <message>
             <source>Search for river name/topo ID.

@@ -842,6 +842,78 @@ Proceed Yes/No ?</source>
 続行しますか?</translation>
         </message>
         <message>
+            <source>Data deleted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>「波動近似」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>「初期条件」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「河床抵抗」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>「風」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>「損失水量」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「高水敷抵抗」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>「初期条件」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「河床抵抗」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>「波動近似」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>「風」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>「損失水量」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「高水敷抵抗」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Can't select Wave page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「波動近似」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Init page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「初期条件」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Bed Resist. page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「河床抵抗」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Wind page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「風」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Water Loss page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「損失水量」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Flood Plain Resist. page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「高水敷抵抗」ページを選択できません。</translation>
+        </message>
+        <message>
             <source>HD Parameters</source>
             <translation>HDパラメータ</translation>
         </message>
@@ -878,6 +950,18 @@ Kinematic Wave</source>
 ダイナミックウェーブ
 拡散波近似
 キネマティックウェーブ近似</translation>
+        </message>
+        <message>
+            <source>Data deleted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>「混合係数」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>「混合係数」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Can't select Mixing Coef. page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「混合係数」ページを選択できません。</translation>
         </message>
         <message>
             <source>Leakage Coef</source>
@@ -924,6 +1008,16 @@ Replace it Yes/No ?</source>
         <message>
             <source>Search &amp;Again</source>
             <translation>次を検索(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Insert &amp;Location from Network</source>
+            <translation>河道網の位置を挿入(&amp;L)</translation>
+        </message>
+        <message>
+            <source>No network editor of the project has a picked location.
+Pick a place on the network's map first.</source>
+            <translation>プロジェクトの河道網エディターで位置が選択されていません。
+先に河道網の平面図で位置を選択してください。</translation>
         </message>
         <message>
             <source>Initial h</source>
@@ -994,6 +1088,10 @@ Replace it Yes/No ?</source>
         <message>
             <source>Change of a value</source>
             <translation>値の変更</translation>
+        </message>
+        <message>
+            <source>Loading of locations</source>
+            <translation>位置の読み込み</translation>
         </message>
         <message>
             <source>Next cell; behind the last one a new line</source>
@@ -1254,6 +1352,14 @@ This document belongs to no project, so there is nothing to load.</source>
 Nothing was loaded.</source>
             <translation>プロジェクトの横断面エディターと河道網エディターから応答がありません。
 何も読み込みませんでした。</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1地点を追加しました。%2地点は既にありました。</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
+            <translation>%1地点を追加しました。%2地点は既にあり、うち%3地点の値を更新しました。</translation>
         </message>
         <message>
             <source>Search for river name/topo ID.
