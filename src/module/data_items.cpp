@@ -4,6 +4,7 @@
 #include "module/document.h"
 
 #include <algorithm>
+#include <string_view>
 
 namespace {
 
@@ -13,7 +14,14 @@ bool IsShownOnly(const CKavo0_hdDoc& document, const HD_RiverPos& record)
     return record.IsBlank() && document.IsPlaceholder(record);
 }
 
-/// Branch names as texts. Neighbours in a list mostly share their branch, and then share one text.
+CString TextOf(std::string_view name)
+{
+    const auto size = qsizetype(name.size());
+    const bool plain = std::all_of(name.begin(), name.end(), [](char c) { return static_cast<signed char>(c) >= 0; });
+    return plain ? CString::fromLatin1(name.data(), size) : CString::fromUtf8(name.data(), size);
+}
+
+/// Branch names of one list as texts. Neighbours mostly share their branch, and then share one text.
 class BranchTexts
 {
 public:
@@ -21,13 +29,13 @@ public:
     {
         if (name != m_name) {
             m_name = name;
-            m_text = CString::fromStdString(name);
+            m_text = TextOf(name);
         }
         return m_text;
     }
 
 private:
-    std::string m_name;
+    std::string_view m_name; // in the record before
     CString m_text = QStringLiteral("");
 };
 

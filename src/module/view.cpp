@@ -1,7 +1,6 @@
 #include "module/view.h"
 
 #include "ks/fc/message_box.h"
-#include "ks/fc/package.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -134,13 +133,6 @@ void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deact
             SendToolbarMessage(KsMessage::HideToolbar());
     }
     CView::OnActivateView(activate, activated, deactivated);
-}
-
-void CKavo0_hdView::SendToolbarMessage(unsigned message)
-{
-    CKSComm_Package package;
-    package.view = this;
-    KsSendMessage(KsMainWindow(), message, 0, reinterpret_cast<LPARAM>(&package));
 }
 
 LRESULT CKavo0_hdView::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)

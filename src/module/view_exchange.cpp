@@ -12,6 +12,13 @@
 #include <cmath>
 #include <iterator>
 
+void CKavo0_hdView::SendToolbarMessage(unsigned message)
+{
+    CKSComm_Package package;
+    package.view = this;
+    KsSendMessage(KsMainWindow(), message, 0, reinterpret_cast<LPARAM>(&package));
+}
+
 LRESULT CKavo0_hdView::AnswerEditor(WPARAM request, CKSComm_Package* package)
 {
     if (request != KsRequest::GetData && request != KsRequest::InsertData && request != KsRequest::DeleteData)

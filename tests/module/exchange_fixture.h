@@ -36,6 +36,15 @@ private:
     QtMessageHandler m_old;
 };
 
+/// A list that an exported function returned.
+using Owned = std::unique_ptr<CObList>;
+
+/// What ExchangeTest::WriteFile writes, as ExchangeTest::Summary has it.
+inline constexpr const char* AllItems =
+    "0 MAIN 100, 0 SIDE 0.1, 1 MAIN 101, 1 SIDE 1.1, 2 MAIN 102, 2 SIDE 2.1, "
+    "3 MAIN 103 to 250, 3 SIDE 3.1 to 0, 4 MAIN 104, 4 SIDE 4.1, 5 MAIN 105, 5 SIDE 5.1, "
+    "6 MAIN 106, 6 SIDE 6.1";
+
 class ExchangeTest : public ModuleTest
 {
 protected:
@@ -164,5 +173,5 @@ protected:
     ShellAnswer answerShell;
     std::unique_ptr<CMultiDocTemplate> documents{CKavo0_hd::CreateMainDlg()};
     Frame frame{*this}; // its windows go before the documents do
-    CView other; // of another editor
+    CView other;        // of another editor
 };

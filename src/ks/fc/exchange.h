@@ -46,6 +46,11 @@ public:
     int type = 0;            // HDDataType
     CString text;
     int flag = 0;
+
+    // Items come by the hundred thousand, so they have a store of their own. As all of the exchange it belongs to the
+    // user-interface thread.
+    static void* operator new(std::size_t size);
+    static void operator delete(void* item, std::size_t size);
 };
 
 /// The tables that exchange locations, by type code.
