@@ -39,8 +39,8 @@ CInsertLines::CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> r
 
 ChangePlace CInsertLines::Apply()
 {
-    if (m_first == FirstLine::Goes)
-        m_rows->RemoveFirstRow();
+    if (m_first == FirstLine::Goes && m_rows->List())
+        Document().RemovePlaceholder(*m_rows->List());
     m_row = m_rows->Put(m_row, std::move(m_lines));
     return PlaceOf(*m_rows, m_row, 1);
 }
@@ -66,8 +66,7 @@ ChangePlace CDeleteLines::Apply()
     for (std::size_t i = 0; i < m_count; ++i)
         m_rows->Touch(m_rows->KeyAt(m_row + i));
     m_lines = m_rows->Take(m_row, m_count);
-    m_leftEmpty = m_rows->Count() == 0;
-    m_replaced = m_leftEmpty && m_replacement;
+    m_replaced = m_rows->Count() == 0 && m_replacement;
     if (m_replaced)
         m_rows->Put(0, std::move(m_replacement));
     return PlaceOf(*m_rows, m_row, 1);
@@ -77,8 +76,8 @@ ChangePlace CDeleteLines::Revert()
 {
     if (m_replaced)
         m_replacement = m_rows->Take(0, 1);
-    else if (m_leftEmpty)
-        m_rows->RemoveFirstRow();
+    else if (!m_replacement && m_rows->List())
+        Document().RemovePlaceholder(*m_rows->List());
     m_row = m_rows->Put(m_row, std::move(m_lines));
     return PlaceOf(*m_rows, m_row, 1);
 }

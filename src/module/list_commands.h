@@ -30,6 +30,7 @@ public:
 protected:
     virtual ChangePlace Apply() = 0;
     virtual ChangePlace Revert() = 0;
+    CKavo0_hdDoc& Document() const { return m_document; }
 
 private:
     void Run(bool forward);
@@ -79,5 +80,5 @@ private:
     std::size_t m_row, m_count;
     std::unique_ptr<IRowBlock> m_lines;       // while they are out of the list
     std::unique_ptr<IRowBlock> m_replacement; // while it is not in the list
-    bool m_leftEmpty = false, m_replaced = false;
+    bool m_replaced = false;
 };

@@ -67,7 +67,6 @@ public:
         for (auto& record : RecordsOf(std::move(block)))
             m_document.AddPlaceholder(m_list, std::move(record));
     }
-    void RemoveFirstRow() override { m_document.RemovePlaceholder(m_list); }
     CGenList* List() const override { return &m_list; }
 
 private:

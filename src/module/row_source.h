@@ -44,8 +44,6 @@ public:
     virtual std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) = 0;
     /// The one row that an empty source shows: no change of the document, if the source has a way to say so.
     virtual void AddFirstRow(std::unique_ptr<IRowBlock> block) { Put(0, std::move(block)); }
-    /// Takes that row out again when it is still the only one and as it came.
-    virtual void RemoveFirstRow() {}
 
     /// Whether the source may be left without rows; otherwise it always shows one.
     virtual bool MayBeEmpty() const { return false; }

@@ -1,7 +1,6 @@
 #include "pages/location_loader.h"
 
 #include "module/document.h"
-#include "module/list_rows.h"
 #include "pages/framework/commands.h"
 #include "pages/framework/gen_grid.h"
 #include "pages/framework/page.h"
@@ -20,10 +19,12 @@ class LocationLoader
 {
 public:
     LocationLoader(CGenPropertyPage& page, LocationValues values)
-        : m_page(page), m_values(values), m_rows(MakeListRows(*page.GetDocument(), *page.GetList()))
+        : m_page(page), m_values(values), m_rows(page.GetGrid()->Model()->Rows())
     {
-        for (std::size_t row = 0; row < m_rows->Count(); ++row) {
-            const HD_RiverPos& record = page.GetList()->GetAt(row);
+        const CGenList& list = *page.GetList();
+        const std::size_t head = m_rows->Count() - list.GetCount(); // rows that are no records
+        for (std::size_t row = head; row < m_rows->Count(); ++row) {
+            const HD_RiverPos& record = list.GetAt(row - head);
             if (!record.IsBlank() && std::isfinite(record.Chainage))
                 m_known.emplace(Place(QString::fromStdString(record.RiverName).toUpper(), record.Chainage), row);
         }
@@ -130,7 +131,7 @@ private:
 
 LoadedLocations LoadLocations(CGenPropertyPage& page, const CObList& places, LocationValues values)
 {
-    if (!page.GetGrid() || !page.GetList())
+    if (!page.GetGrid() || !page.GetList() || !page.GetGrid()->Model()->Rows())
         return {};
     page.StoreToDocument();
     return LocationLoader(page, values).Load(places);

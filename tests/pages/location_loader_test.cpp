@@ -18,7 +18,7 @@ public:
             .Chainage({})
             .Value(&HDWLCurve::CurveValue1, {.fill = &width, .locationValue = LocationValue::Width})
             .Value(&HDWLCurve::CurveValue2,
-                   {.locked = [this](const HD_RiverPos&) { return locked; }, .locationValue = LocationValue::Radius});
+                   {.locked = [this](const auto&) { return locked; }, .locationValue = LocationValue::Radius});
     }
     double width = 7;
     bool locked = false;
