@@ -247,7 +247,7 @@ void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(
         changed = exchange.changed;
     }
     // By now others may ask again: those that hear of the change do so at once.
-    if (changed && served->GetDocument())
+    if (changed && served && served->GetDocument())
         served->GetDocument()->DataChange(served->GetDocument()->GetPathName());
     if (!message.isEmpty())
         KsMessageBox(message, QMessageBox::Ok, served);
