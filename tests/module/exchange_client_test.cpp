@@ -120,6 +120,7 @@ TEST_F(ExchangeClientTest, TheBranchListIsAskedForWhenACellOpens)
     grid->SetCurrentCell(1, 3);
     QTest::keyClick(grid, Qt::Key_F2);
     EXPECT_EQ(requests, 1) << "no other column asks";
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
 }
 
 TEST_F(ExchangeClientTest, TheCurrentLocationIsToldOnceAnEvent)
