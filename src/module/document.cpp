@@ -3,7 +3,6 @@
 #include "data/hd_file.h"
 #include "data/safe_file.h"
 #include "ks/fc/message_box.h"
-#include "ks/fc/package.h"
 #include "module/purged_lines.h"
 #include "module/row_source.h"
 #include "res/strings.h"
@@ -173,15 +172,17 @@ void CKavo0_hdDoc::RemovePlaceholders()
 {
     for (const CCleanedRows& cleaned : m_cleanedRows)
         cleaned.rows->TakeFirstRow();
-    const auto removeFrom = [this](CGenList& list) {
-        if (list.GetCount() == 1 && list.GetAt(0).IsBlank() && m_placeholders.erase(&list.GetAt(0)))
-            list.RemoveAt(0);
-    };
     for (const ListEntry& entry : HDLists())
         if (entry.purgedAtSave)
-            removeFrom(*entry.list(m_parameters));
+            RemovePlaceholder(*entry.list(m_parameters));
     for (std::size_t setup = 0; setup < m_parameters.EncroachList.GetCount(); ++setup)
-        removeFrom(m_parameters.EncroachList.GetAt(setup));
+        RemovePlaceholder(m_parameters.EncroachList.GetAt(setup));
+}
+
+void CKavo0_hdDoc::RemovePlaceholder(CGenList& list)
+{
+    if (list.GetCount() == 1 && list.GetAt(0).IsBlank() && m_placeholders.erase(&list.GetAt(0)))
+        list.RemoveAt(0);
 }
 
 void CKavo0_hdDoc::DeleteContents()
@@ -193,13 +194,14 @@ void CKavo0_hdDoc::DeleteContents()
     CKsDoc::DeleteContents();
 }
 
-LRESULT CKavo0_hdDoc::SendToShell(unsigned message, WPARAM request, CView* view, const CString& name)
+LRESULT CKavo0_hdDoc::SendToShell(unsigned message, WPARAM request, CView* view, const CString& name, CObList* objects)
 {
     CKSComm_Package package;
     package.view = view;
     package.text = name;
     package.kind = HDPackageKind;
     package.project = m_hProject;
+    package.objects = objects;
     return KsSendMessage(KsMainWindow(), message, request, reinterpret_cast<LPARAM>(&package));
 }
 
@@ -210,9 +212,15 @@ BOOL CKavo0_hdDoc::GetProjectInfo(CView* view, const CString& name)
     return m_hProject != 0;
 }
 
-LRESULT CKavo0_hdDoc::AskShell(WPARAM request, CView* view)
+LRESULT CKavo0_hdDoc::AskShell(WPARAM request, CView* view, CObList* objects)
 {
-    return m_hProject ? SendToShell(KsMessage::SwitchBoard(), request, view, GetPathName()) : 0;
+    return m_hProject ? SendToShell(KsMessage::SwitchBoard(), request, view, GetPathName(), objects) : 0;
+}
+
+void CKavo0_hdDoc::TellShell(WPARAM news, CView* view, CObList* objects)
+{
+    if (m_hProject)
+        SendToShell(KsMessage::BetweenEditors(), news, view, GetPathName(), objects);
 }
 
 void CKavo0_hdDoc::LeaveProject(CView* view, const CString& name)

@@ -3,6 +3,7 @@
 
 #include "data/hd_parameters.h"
 #include "ks/fc/doc.h"
+#include "ks/fc/package.h"
 
 #include <cstdint>
 #include <functional>
@@ -42,6 +43,9 @@ public:
     /// modified flag nor undo sees it, and a save removes it again while it is untouched.
     void AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record);
     void RemovePlaceholders();
+    /// Takes the placeholder out of a list that holds nothing else.
+    void RemovePlaceholder(CGenList& list);
+    bool IsPlaceholder(const HD_RiverPos& record) const { return m_placeholders.contains(&record); }
     /// Whatever edits or removes a record says so: a placeholder becomes an ordinary line.
     void PlaceholderTouched(const HD_RiverPos& record) { m_placeholders.erase(&record); }
 
@@ -60,11 +64,16 @@ public:
     };
     const std::vector<CCleanedRows>& CleanedRows() const { return m_cleanedRows; }
 
-    /// Sends a request to the shell's switchboard; its answer, 0 outside a project.
-    LRESULT AskShell(WPARAM request, CView* view);
+    /// Sends a request to the shell's switchboard; its answer, 0 outside a project. What the other editors have to say
+    /// is appended to `objects`, which stays the caller's.
+    LRESULT AskShell(WPARAM request, CView* view, CObList* objects = nullptr);
+    /// Tells the other editors of the project something (KsRequest); nothing outside a project.
+    void TellShell(WPARAM news, CView* view, CObList* objects);
 
     std::intptr_t ProjectHandle() const { return m_hProject; }
     const CString& FilePath() const { return m_strFilePath; }
+    /// The file at FilePath could not be parsed; the document holds nothing of it.
+    bool IsUnreadable() const { return m_unreadable; }
 
 signals:
     /// Undo or redo changed a list (or a global value: null list); the view brings its page forward.
@@ -78,7 +87,7 @@ private:
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);
     void RemoveOldSpelling(const CString& target);
-    LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name);
+    LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name, CObList* objects = nullptr);
 
     HD_Parameters m_parameters;
     CString m_strFilePath; // of the file last opened

@@ -11,6 +11,7 @@
 namespace {
 
 KsResourceHandle g_languageModule = nullptr;
+std::vector<QPointer<CMultiDocTemplate>> g_templates; // those that are gone included
 
 constexpr int ToolBarCommands[] = {Command::Search, Command::SearchAgain};
 
@@ -42,10 +43,23 @@ void FreeModuleResources()
 
 CMultiDocTemplate* CKavo0_hd::CreateMainDlg()
 {
-    return new CMultiDocTemplate(Resource::Document, LoadString(Str::DocumentTemplate),
-                                 {[]() -> CKsDoc* { return new CKavo0_hdDoc; },
-                                  []() -> CKsMDIChildWnd* { return new CDlgFrame; },
-                                  []() -> CView* { return new CKavo0_hdView; }});
+    auto* documents = new CMultiDocTemplate(Resource::Document, LoadString(Str::DocumentTemplate),
+                                            {[]() -> CKsDoc* { return new CKavo0_hdDoc; },
+                                             []() -> CKsMDIChildWnd* { return new CDlgFrame; },
+                                             []() -> CView* { return new CKavo0_hdView; }});
+    std::erase(g_templates, nullptr);
+    g_templates.emplace_back(documents);
+    return documents;
+}
+
+std::vector<CMultiDocTemplate*> CKavo0_hd::Templates()
+{
+    std::vector<CMultiDocTemplate*> templates;
+    for (const auto& documents : g_templates) {
+        if (documents)
+            templates.push_back(documents);
+    }
+    return templates;
 }
 
 BOOL CKavo0_hd::InitToolBar(CKsToolBarEx* bar, CKsMDIFrameWnd* frame, unsigned style, unsigned controlId)

@@ -27,17 +27,20 @@ void CDocumentCommand::Run(bool forward)
 }
 
 CInsertLines::CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row,
-                           std::unique_ptr<IRowBlock> lines)
+                           std::unique_ptr<IRowBlock> lines, FirstLine first)
     : CDocumentCommand(document, LoadString(Str::UndoInsert)),
       m_rows(std::move(rows)),
       m_row(row),
       m_count(lines->Count()),
-      m_lines(std::move(lines))
+      m_lines(std::move(lines)),
+      m_first(first)
 {
 }
 
 ChangePlace CInsertLines::Apply()
 {
+    if (m_first == FirstLine::Goes && m_rows->List())
+        Document().RemovePlaceholder(*m_rows->List());
     m_row = m_rows->Put(m_row, std::move(m_lines));
     return PlaceOf(*m_rows, m_row, 1);
 }
@@ -73,6 +76,8 @@ ChangePlace CDeleteLines::Revert()
 {
     if (m_replaced)
         m_replacement = m_rows->Take(m_rows->FixedRows(), 1);
+    else if (!m_replacement && m_rows->List())
+        Document().RemovePlaceholder(*m_rows->List());
     m_row = m_rows->Put(m_row, std::move(m_lines));
     return PlaceOf(*m_rows, m_row, 1);
 }

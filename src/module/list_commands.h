@@ -30,6 +30,7 @@ public:
 protected:
     virtual ChangePlace Apply() = 0;
     virtual ChangePlace Revert() = 0;
+    CKavo0_hdDoc& Document() const { return m_document; }
 
 private:
     void Run(bool forward);
@@ -38,12 +39,19 @@ private:
     bool m_repeated = false;
 };
 
+/// What becomes of the line that an empty list shows, when others come.
+enum class FirstLine
+{
+    Stays,
+    Goes // while nobody has touched it
+};
+
 /// Puts new lines into a list.
 class CInsertLines : public CDocumentCommand
 {
 public:
     CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row,
-                 std::unique_ptr<IRowBlock> lines);
+                 std::unique_ptr<IRowBlock> lines, FirstLine first = FirstLine::Stays);
 
 protected:
     ChangePlace Apply() override;
@@ -53,6 +61,7 @@ private:
     std::shared_ptr<IRowSource> m_rows;
     std::size_t m_row, m_count;
     std::unique_ptr<IRowBlock> m_lines; // while they are not in the list
+    FirstLine m_first;
 };
 
 /// Removes lines from a list. A list that would be left empty gets `replacement`, when there is one.

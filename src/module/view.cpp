@@ -1,7 +1,6 @@
 #include "module/view.h"
 
 #include "ks/fc/message_box.h"
-#include "ks/fc/package.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -12,6 +11,7 @@
 
 #include <QStatusTipEvent>
 #include <QTimer>
+#include <QUndoStack>
 #include <QVBoxLayout>
 #include <algorithm>
 
@@ -135,17 +135,10 @@ void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deact
     CView::OnActivateView(activate, activated, deactivated);
 }
 
-void CKavo0_hdView::SendToolbarMessage(unsigned message)
-{
-    CKSComm_Package package;
-    package.view = this;
-    KsSendMessage(KsMainWindow(), message, 0, reinterpret_cast<LPARAM>(&package));
-}
-
 LRESULT CKavo0_hdView::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
 {
     if (message == KsMessage::BetweenEditors())
-        return 0;
+        return AnswerEditor(wParam, reinterpret_cast<CKSComm_Package*>(lParam));
     if (message == KsMessage::ProjectManagement() && wParam != 2)
         return 0;
     return CView::WindowProc(message, wParam, lParam);
@@ -170,11 +163,7 @@ void CKavo0_hdView::CurrentLocationChanged(int row)
         return;
     QStatusTipEvent tip(LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()));
     QCoreApplication::sendEvent(MainFrame(), &tip);
-}
-
-QStringList CKavo0_hdView::BranchNames()
-{
-    return {};
+    TellLater(m_tellLocation);
 }
 
 void CKavo0_hdView::EnableLinesMenu(bool enable)
@@ -192,6 +181,7 @@ void CKavo0_hdView::RevealChange(CGenList* list, int row, int /*column*/)
             continue;
         if (m_sheet->SetActivePage(tab) && row > 0)
             page->GotoLine(row);
+        TellLater(m_tellChange);
         return;
     }
 }
@@ -200,7 +190,7 @@ void CKavo0_hdView::RevealChange(CGenList* list, int row, int /*column*/)
 
 std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
 {
-    return {
+    std::vector<CKsMenuCommand> menu{
         {Command::InsertLine, LoadString(Str::MenuInsertLine), QKeySequence()},
         {Command::DeleteLine, LoadString(Str::MenuDeleteLine), QKeySequence()},
         {},
@@ -209,6 +199,10 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
         {Command::Search, LoadString(Str::MenuSearch), QKeySequence(Qt::Key_F7)},
         {Command::SearchAgain, LoadString(Str::MenuSearchAgain), QKeySequence(Qt::Key_F3)},
     };
+    if (m_inProject)
+        menu.insert(menu.begin() + 1,
+                    {Command::FetchLocation, LoadString(Str::MenuFetchLocation), QKeySequence(Qt::CTRL | Qt::Key_L)});
+    return menu;
 }
 
 bool CKavo0_hdView::IsCommandEnabled(int id) const
@@ -222,6 +216,8 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     case Command::GotoLine:
     case Command::Search:
         return lines;
+    case Command::FetchLocation:
+        return lines && m_inProject;
     case Command::SearchAgain:
         return lines && m_search.asked;
     default:
@@ -239,7 +235,10 @@ bool CKavo0_hdView::OnCommand(int id)
         page->AppendLine();
         return true;
     case Command::DeleteLine:
-        page->DeleteLines();
+        DeleteLines();
+        return true;
+    case Command::FetchLocation:
+        FetchLocation();
         return true;
     case Command::GotoLine:
         GotoLine();
@@ -253,6 +252,15 @@ bool CKavo0_hdView::OnCommand(int id)
     default:
         return false;
     }
+}
+
+void CKavo0_hdView::DeleteLines()
+{
+    const QUndoStack& steps = GetDocument()->UndoStack();
+    const int before = steps.index();
+    ActivePage()->DeleteLines();
+    if (steps.index() != before)
+        TellLater(m_tellChange);
 }
 
 void CKavo0_hdView::GotoLine()

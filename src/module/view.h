@@ -51,9 +51,15 @@ private:
         QString name;
         double chainage = 0; // metres
         int chainageCriterion = 3, nameCriterion = 0;
-        int row = 0;         // the next search starts here; 0 is the first row
+        int row = 0; // the next search starts here; 0 is the first row
         bool asked = false, found = false;
     };
+
+    LRESULT AnswerEditor(WPARAM request, CKSComm_Package* package);
+    void FetchLocation();
+    void DeleteLines();
+    void TellLater(bool& news);
+    void Tell();
 
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
@@ -65,9 +71,10 @@ private:
     void SendToolbarMessage(unsigned message);
     CKsMDIFrameWnd* MainFrame() const;
 
-    CDlgPropertySheet* m_sheet = nullptr;              // child
+    CDlgPropertySheet* m_sheet = nullptr;                      // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_inProject = false;
+    bool m_tellLocation = false, m_tellChange = false; // once the present event is over
     SearchState m_search;
     bool m_linesEnabled = true;
 };

@@ -3,16 +3,11 @@
 #include "ks/fc/message_box.h"
 #include "module/document.h"
 #include "pages/framework/page.h"
+#include "pages/location_loader.h"
 #include "res/strings.h"
 #include "ui_load_option_dlg.h"
 
-namespace {
-
-// Requests of the shell's switchboard to the editors of a project.
-constexpr WPARAM LoadFromCrossSections = 40;
-constexpr WPARAM LoadFromCrossSectionsAndNetwork = 49;
-
-} // namespace
+#include <QStatusTipEvent>
 
 CEditorsLoadOptionDlg::CEditorsLoadOptionDlg(QWidget* parent)
     : QDialog(parent), m_ui(std::make_unique<Ui::CEditorsLoadOptionDlg>())
@@ -39,7 +34,15 @@ void AskForLocations(CGenPropertyPage& page)
     CEditorsLoadOptionDlg dialog(&page);
     if (dialog.exec() != QDialog::Accepted)
         return;
-    const WPARAM request = dialog.Option() == 0 ? LoadFromCrossSections : LoadFromCrossSectionsAndNetwork;
-    if (!document.AskShell(request, page.GetHost() ? page.GetHost()->HostView() : nullptr))
+    const WPARAM request = dialog.Option() == 0 ? KsRequest::LoadLocations : KsRequest::LoadLocationsAndChannel;
+    CObList places;
+    if (!document.AskShell(request, page.GetHost() ? page.GetHost()->HostView() : nullptr, &places)) {
         KsMessageBox(LoadString(Str::LoadNoAnswer), QMessageBox::Ok, &page);
+        return;
+    }
+    const LoadedLocations loaded = LoadLocations(page, places, {dialog.Option() >= 1, dialog.Option() == 2});
+    QStatusTipEvent told(
+        loaded.changed ? LoadString(Str::LocationsLoadedChanged).arg(loaded.added).arg(loaded.known).arg(loaded.changed)
+                       : LoadString(Str::LocationsLoaded).arg(loaded.added).arg(loaded.known));
+    QCoreApplication::sendEvent(page.window(), &told);
 }

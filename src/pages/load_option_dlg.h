@@ -27,6 +27,6 @@ private:
     int m_option = 0;
 };
 
-/// Asks the user what to load and the project's editors for it. The user is told when the document belongs to no
-/// project, and when no editor answers.
+/// Asks the user what to load and the project's editors for it, and puts it into the page's grid (location_loader.h).
+/// The user is told how many lines came, when the document belongs to no project, and when no editor answers.
 void AskForLocations(CGenPropertyPage& page);

@@ -44,11 +44,13 @@ CWLCurvePage::CWLCurvePage(CKavo0_hdDoc* document, QWidget* parent)
                                  .width = 53,
                                  .emptyIsNotGiven = true,
                                  .locked = [&curve](const void*) { return curve.SystemWidth; },
+                                 .locationValue = LocationValue::Width,
                                  .globalNumber = &curve.Width})
         .Value(&R::CurveValue2, {.caption = Str::CurveRadius,
                                  .width = 53,
                                  .emptyIsNotGiven = true,
                                  .locked = [&curve](const void*) { return curve.SystemRadius; },
+                                 .locationValue = LocationValue::Radius,
                                  .globalNumber = &curve.Radius})
         .Value(&R::CurveValue3, {.caption = Str::Velocity,
                                  .width = 53,

@@ -1,5 +1,8 @@
 #include "ks_fixture.h"
 
+#include "ks/fc/exchange.h"
+
+#include <cmath>
 #include <set>
 
 TEST(Messages, OneNumberForEachNameWhoeverAsks)
@@ -45,4 +48,32 @@ TEST(Messages, AFrameThatGoesIsNoLongerTheMainWindow)
         EXPECT_EQ(KsMainWindow(), &frame);
     }
     EXPECT_EQ(KsMainWindow(), nullptr);
+}
+
+TEST(ExchangeItems, ComeAndGoInAnyOrder)
+{
+    struct Larger : CKvr_CBE_ModelDataItem
+    {
+        double more = 5;
+    };
+    for (int round = 0; round < 2; ++round) { // all of them go, then all come again
+        CObList items;
+        for (int i = 0; i < 1000; ++i) {
+            auto item = i % 7 == 0 ? std::make_unique<Larger>() : std::make_unique<CKvr_CBE_ModelDataItem>();
+            item->type = i;
+            item->branch = CString::number(i);
+            items.push_back(std::move(item));
+            if (i % 3 == 0)
+                items[std::size_t(i / 2)] = nullptr;
+        }
+        int left = 0;
+        for (const auto& object : items) {
+            if (const auto* item = dynamic_cast<const CKvr_CBE_ModelDataItem*>(object.get())) {
+                ++left;
+                EXPECT_EQ(item->branch, CString::number(item->type));
+                EXPECT_TRUE(std::isnan(item->second));
+            }
+        }
+        EXPECT_EQ(left, 666);
+    }
 }

@@ -1,9 +1,12 @@
 // The plug-in as the shell sees it: loaded by name, reached through its exported functions alone.
 #include "ks/fc/doc_template.h"
 #include "ks/fc/frames.h"
+#include "ks/fc/hd_messages.h"
+#include "ks/fc/plugin.h"
 
 #include <QLibrary>
 #include <QProcess>
+#include <QTemporaryDir>
 #include <gtest/gtest.h>
 
 namespace {
@@ -63,6 +66,21 @@ TEST_F(ExportsTest, BuildsItsToolBar)
     EXPECT_NE(create(&frame, 0, 2, 0), nullptr);
 }
 
+TEST_F(ExportsTest, OtherEditorsFindTheirFunctions)
+{
+    QTemporaryDir folder;
+    QFile file(folder.filePath("river.hdkv"));
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+    file.write("[KAVO0_HD]\n[WindList]\nDATA = \"MAIN\", 7, 1\n[/WindList]\n[/KAVO0_HD]\n");
+    file.close();
+    const std::unique_ptr<CObList> items(Get<decltype(KvrMSGGetData)>("KvrMSGGetData")(file.fileName(), nullptr));
+    ASSERT_TRUE(items && items->size() == 1);
+    EXPECT_EQ(dynamic_cast<const CKvr_CBE_ModelDataItem&>(*items->front()).branch, "MAIN")
+        << "the items' types are known across libraries";
+    EXPECT_EQ(Get<decltype(KvrMSGGetHDMaps)>("KvrMSGGetHDMaps")({}, nullptr), nullptr);
+    Get<decltype(KvrMSGInsertData)>("KvrMSGInsertData")({}, nullptr, items.get());
+}
+
 TEST_F(ExportsTest, ExportsNothingElse)
 {
 #ifdef Q_OS_UNIX
@@ -78,8 +96,13 @@ TEST_F(ExportsTest, ExportsNothingElse)
             names << name;
     }
     names.sort();
-    EXPECT_EQ(names, (QStringList{"KsCreateToolbar", "KsGetBitmapId", "KsGetDocTemplatePtr", "KsGetEditorString",
-                                  "KsGetNumDocTemplates", "KsGetNumToolbars", "KsGetToolbarString", "KsInitToolbar"}));
+    QStringList declared;
+#define KVR_NAME(result, name, arguments) declared << #name;
+    KS_PLUGIN_FUNCTIONS(KVR_NAME)
+    KVR_HD_FUNCTIONS(KVR_NAME)
+#undef KVR_NAME
+    declared.sort();
+    EXPECT_EQ(names, declared);
 #endif
 }
 

@@ -91,6 +91,7 @@ TEST_F(ViewTest, AChangedLocationIsToldToTheProjectAndLeavingIsToo)
     EXPECT_EQ(view->GetDocument()->Parameters().InitList.GetAt(0).Chainage, 150);
 
     view->GetDocument()->SetModifiedFlag(false);
+    QTest::qWait(1); // news of the current line
     messages.clear();
     view->CloseWindow();
     QTest::qWait(50);

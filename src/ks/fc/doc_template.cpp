@@ -16,20 +16,11 @@ CString FileKey(const CString& path)
     return canonical.isEmpty() ? QDir::cleanPath(QFileInfo(path).absoluteFilePath()) : canonical;
 }
 
-CKsMDIChildWnd* WindowOf(const CView* view)
-{
-    for (QWidget* widget = view->parentWidget(); widget; widget = widget->parentWidget()) {
-        if (auto* window = qobject_cast<CKsMDIChildWnd*>(widget))
-            return window;
-    }
-    return nullptr;
-}
-
 bool IsClosing(const CKsDoc* document)
 {
     const auto& views = document->Views();
     return !views.empty() && std::all_of(views.begin(), views.end(), [](const CView* view) {
-        const auto* window = WindowOf(view);
+        const auto* window = CKsMDIChildWnd::Of(view);
         return window && window->IsClosing();
     });
 }
@@ -114,8 +105,8 @@ CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString
 {
     const CString absolute = path.isEmpty() ? path : QFileInfo(path).absoluteFilePath();
     if (CKsDoc* open = absolute.isEmpty() ? nullptr : FindDocument(absolute)) {
-        if (auto* window = open->Views().empty() ? nullptr : WindowOf(open->Views().front()))
-            frame->MdiArea().setActiveSubWindow(window);
+        if (auto* window = open->Views().empty() ? nullptr : CKsMDIChildWnd::Of(open->Views().front()))
+            window->BringToFront();
         return open;
     }
     auto loaded = LoadDocument(absolute);

@@ -46,6 +46,11 @@ public:
     int type = 0;            // HDDataType
     CString text;
     int flag = 0;
+
+    // Items come by the hundred thousand, so they have a store of their own. As all of the exchange it belongs to the
+    // user-interface thread.
+    static void* operator new(std::size_t size);
+    static void operator delete(void* item, std::size_t size);
 };
 
 /// The tables that exchange locations, by type code.
@@ -62,7 +67,8 @@ enum HDDataType
 };
 
 /// The user-defined marks. The first item of a list has their titles and, as `flags`, whether each is interpolated;
-/// every further item has a location: the branch, and as `values` the chainage and then a level a title.
+/// every further item has a location: the branch, and as `values` the chainage and then a level for each title (more
+/// where the line holds more).
 class KS_API CKvrCBEUserDefMark : public CKsCBEItem
 {
 public:

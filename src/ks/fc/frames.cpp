@@ -56,6 +56,23 @@ bool CKsMDIChildWnd::OnCreateClient(CView* view)
     return true;
 }
 
+CKsMDIChildWnd* CKsMDIChildWnd::Of(const CView* view)
+{
+    for (QWidget* widget = view ? view->parentWidget() : nullptr; widget; widget = widget->parentWidget()) {
+        if (auto* window = qobject_cast<CKsMDIChildWnd*>(widget))
+            return window;
+    }
+    return nullptr;
+}
+
+void CKsMDIChildWnd::BringToFront()
+{
+    if (isMinimized())
+        showNormal();
+    if (mdiArea())
+        mdiArea()->setActiveSubWindow(this);
+}
+
 void CKsMDIChildWnd::UpdateTitle()
 {
     if (!m_view || !m_view->GetDocument())

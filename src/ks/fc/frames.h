@@ -51,6 +51,10 @@ public:
     /// Puts the view into the window; an editor's frame may prepare something first. False gives the window up.
     virtual bool OnCreateClient(CView* view);
     CView* GetActiveView() const { return m_view; }
+    /// The window that a view is in; null for none.
+    static CKsMDIChildWnd* Of(const CView* view);
+    /// Makes it the area's active window, in its usual size if it was an icon.
+    void BringToFront();
     /// Closed by the user; the window lives until control returns to the event loop.
     bool IsClosing() const { return m_closing; }
 

@@ -83,6 +83,14 @@ struct Choices
 /// "Unit: m"; empty for a quantity without unit.
 QString UnitToolTip(const QString& unit);
 
+/// What a column holds of a place that another editor sends, beside its branch and chainage.
+enum class LocationValue
+{
+    None,
+    Radius, // of curvature
+    Width   // of the channel
+};
+
 struct ColumnSpec
 {
     int control = Control::Number;
@@ -95,6 +103,7 @@ struct ColumnSpec
     std::function<QString()> hint;     // what the column is, for the tool tip of its header
     const double* fill = nullptr; // enters new lines, and blank cells when the page is left; as it is, not converted
     std::function<bool(const void* row)> locked; // the cell of this row cannot be edited
+    LocationValue locationValue = LocationValue::None;
     std::shared_ptr<const CellAccess> access;
 
     CellKind Kind() const { return FindControl(control).kind; }

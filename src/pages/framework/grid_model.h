@@ -64,6 +64,8 @@ public:
     /// Every text must have passed Refusal.
     void Paste(int row, int column, const std::vector<QStringList>& texts);
 
+    /// New lines with the columns' fill values, not in the source.
+    std::unique_ptr<IRowBlock> NewLines(int count) const;
     /// New lines before `row`, with the columns' fill values: an undo step.
     void InsertRows(int row, int count = 1);
     /// Rows at the top that are no lines of the table.
@@ -86,7 +88,6 @@ private:
         std::size_t row; // where the row was
     };
 
-    std::unique_ptr<IRowBlock> NewLines(int count) const;
     CellValue Resolved(int column, const CellValue& value, BlankRule rule) const;
     void PruneOverlay();
     bool IsRow(int row) const { return m_rows && row >= 0 && std::size_t(row) < m_rows->Count(); }

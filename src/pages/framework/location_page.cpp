@@ -72,6 +72,7 @@ GridColumns& GridColumns::Add(int control, UnitGroup unit, CellAccess access, Co
         column.choices.entries = [entries = *options.choices] { return LoadString(entries).split(u'\n'); };
     column.unitText = std::move(options.unitText);
     column.hint = std::move(options.hint);
+    column.locationValue = options.locationValue;
     column.access = std::make_shared<CellAccess>(std::move(access));
     m_grid.Model()->AddColumn(std::move(column));
     return *this;

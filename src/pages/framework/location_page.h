@@ -23,6 +23,7 @@ struct ColumnOptions
     std::function<QString()> unitText = {};           // see ColumnSpec
     std::function<QString()> hint = {};               // see ColumnSpec
     bool upperCase = false;                           // of a text
+    LocationValue locationValue = LocationValue::None; // see ColumnSpec
     // What the row "Global" of a grid shows in the column, where the grid has one; the cell is locked without.
     double* globalNumber = nullptr;
     std::int32_t* globalIndex = nullptr;

@@ -12,6 +12,7 @@ inline constexpr int SearchAgain = 42601;
 inline constexpr int InsertLine = 42602;
 inline constexpr int DeleteLine = 42603;
 inline constexpr int GotoLine = 42604;
+inline constexpr int FetchLocation = 42605;
 } // namespace Command
 
 class IPageHost

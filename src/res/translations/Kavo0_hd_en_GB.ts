@@ -544,6 +544,45 @@
         </message>
     </context>
     <context>
+        <name>CMapsPage</name>
+        <message>
+            <source>&amp;Generate maps</source>
+            <translation>&amp;Generate maps</translation>
+        </message>
+        <message>
+            <source>Output</source>
+            <translation>Output</translation>
+        </message>
+        <message>
+            <source>Map output files</source>
+            <translation>Map output files</translation>
+        </message>
+        <message>
+            <source>Apply DEM input data for ground &amp;elevations</source>
+            <translation>Apply DEM input data for ground &amp;elevations</translation>
+        </message>
+        <message>
+            <source>Input topography</source>
+            <translation>Input topography</translation>
+        </message>
+        <message>
+            <source>Apply DEM data between river &amp;cross-sections</source>
+            <translation>Apply DEM data between river &amp;cross-sections</translation>
+        </message>
+        <message>
+            <source>DEM input files</source>
+            <translation>DEM input files</translation>
+        </message>
+        <message>
+            <source>&amp;Map additional flooded areas using help grid from KVR GIS</source>
+            <translation>&amp;Map additional flooded areas using help grid from KVR GIS</translation>
+        </message>
+        <message>
+            <source>&amp;Help grid</source>
+            <translation>&amp;Help grid</translation>
+        </message>
+    </context>
+    <context>
         <name>CMixingCoefPage</name>
         <message>
             <source>Mixing Coefficients</source>
@@ -950,6 +989,166 @@
         </message>
     </context>
     <context>
+        <name>CTextOutputPage</name>
+        <message>
+            <source>&amp;Generate time series output files</source>
+            <translation>&amp;Generate time series output files</translation>
+        </message>
+        <message>
+            <source>Output files</source>
+            <translation>Output files</translation>
+        </message>
+        <message>
+            <source>Text file settings</source>
+            <translation>Text file settings</translation>
+        </message>
+        <message>
+            <source>&amp;Delimiter in output file</source>
+            <translation>&amp;Delimiter in output file</translation>
+        </message>
+        <message>
+            <source>&amp;Width of columns</source>
+            <translation>&amp;Width of columns</translation>
+        </message>
+        <message>
+            <source>&amp;Minimum</source>
+            <translation>&amp;Minimum</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum</source>
+            <translation>Ma&amp;ximum</translation>
+        </message>
+        <message>
+            <source>Time &amp;of minimum</source>
+            <translation>Time &amp;of minimum</translation>
+        </message>
+        <message>
+            <source>&amp;Time of maximum</source>
+            <translation>&amp;Time of maximum</translation>
+        </message>
+        <message>
+            <source>Time period in output</source>
+            <translation>Time period in output</translation>
+        </message>
+        <message>
+            <source>&amp;Limited output period</source>
+            <translation>&amp;Limited output period</translation>
+        </message>
+        <message>
+            <source>&amp;Start</source>
+            <translation>&amp;Start</translation>
+        </message>
+        <message>
+            <source>&amp;End</source>
+            <translation>&amp;End</translation>
+        </message>
+        <message>
+            <source>Items in output</source>
+            <translation>Items in output</translation>
+        </message>
+        <message>
+            <source>Grid points in output</source>
+            <translation>Grid points in output</translation>
+        </message>
+        <message>
+            <source>Selected grid points in output</source>
+            <translation>Selected grid points in output</translation>
+        </message>
+        <message>
+            <source>&amp;All</source>
+            <translation>&amp;All</translation>
+        </message>
+        <message>
+            <source>Only from the l&amp;ist</source>
+            <translation>Only from the l&amp;ist</translation>
+        </message>
+        <message>
+            <source>All ex&amp;cepted those from the list</source>
+            <translation>All ex&amp;cepted those from the list</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWLCurvePage</name>
+        <message>
+            <source>&amp;Enabling water level increment due to curve</source>
+            <translation>&amp;Enabling water level increment due to curve</translation>
+        </message>
+        <message>
+            <source>System Definition</source>
+            <translation>System Definition</translation>
+        </message>
+        <message>
+            <source>Average &amp;Range</source>
+            <translation>Average &amp;Range</translation>
+        </message>
+        <message>
+            <source>&amp;Water Surface width</source>
+            <translation>&amp;Water Surface width</translation>
+        </message>
+        <message>
+            <source>&amp;Curvature Radius</source>
+            <translation>&amp;Curvature Radius</translation>
+        </message>
+        <message>
+            <source>&amp;Velocity</source>
+            <translation>&amp;Velocity</translation>
+        </message>
+        <message>
+            <source>Values</source>
+            <translation>Values</translation>
+        </message>
+        <message>
+            <source>&amp;Load Branch &amp;&amp; Chainage</source>
+            <translation>&amp;Load Branch &amp;&amp; Chainage</translation>
+        </message>
+        <message>
+            <source>Water level increment due to curve</source>
+            <translation>Water level increment due to curve</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWLMarkPage</name>
+        <message>
+            <source>Mark titles</source>
+            <translation>Mark titles</translation>
+        </message>
+        <message>
+            <source>Local values</source>
+            <translation>Local values</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWLSandBarsPage</name>
+        <message>
+            <source>&amp;Enabling water level increment due to sand bars</source>
+            <translation>&amp;Enabling water level increment due to sand bars</translation>
+        </message>
+        <message>
+            <source>Method</source>
+            <translation>Method</translation>
+        </message>
+        <message>
+            <source>&amp;Slope / Low Water channel Width / Water Area of Annual Max Discharge</source>
+            <translation>&amp;Slope / Low Water channel Width / Water Area of Annual Max Discharge</translation>
+        </message>
+        <message>
+            <source>&amp;dH (Observed)</source>
+            <translation>&amp;dH (Observed)</translation>
+        </message>
+        <message>
+            <source>Values</source>
+            <translation>Values</translation>
+        </message>
+        <message>
+            <source>&amp;Load Branch &amp;&amp; Chainage</source>
+            <translation>&amp;Load Branch &amp;&amp; Chainage</translation>
+        </message>
+        <message>
+            <source>Water level increment due to sand bars</source>
+            <translation>Water level increment due to sand bars</translation>
+        </message>
+    </context>
+    <context>
         <name>CWavePage</name>
         <message>
             <source>Wave Approximation</source>
@@ -1082,6 +1281,78 @@ filled information will be deleted when saving the editor file.
 Proceed Yes/No ?</translation>
         </message>
         <message>
+            <source>Data deleted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Wave page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Init page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Bed Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Wind page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Water Loss page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data deleted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Init page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Bed Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Wave page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Wind page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Water Loss page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Wave page because of error on active page</source>
+            <translation>Can't select Wave page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Init page because of error on active page</source>
+            <translation>Can't select Init page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Bed Resist. page because of error on active page</source>
+            <translation>Can't select Bed Resist. page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Wind page because of error on active page</source>
+            <translation>Can't select Wind page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Water Loss page because of error on active page</source>
+            <translation>Can't select Water Loss page because of error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Flood Plain Resist. page because of error on active page</source>
+            <translation>Can't select Flood Plain Resist. page because of error on active page</translation>
+        </message>
+        <message>
             <source>HD Parameters</source>
             <translation>HD Parameters</translation>
         </message>
@@ -1118,6 +1389,18 @@ Kinematic Wave</source>
 Fully Dynamic
 Diffusive Wave
 Kinematic Wave</translation>
+        </message>
+        <message>
+            <source>Data deleted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data deleted in Mixing Coef. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Data inserted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>Data inserted in Mixing Coef. page, but to switch there, you must first repair error on active page</translation>
+        </message>
+        <message>
+            <source>Can't select Mixing Coef. page because of error on active page</source>
+            <translation>Can't select Mixing Coef. page because of error on active page</translation>
         </message>
         <message>
             <source>Leakage Coef</source>
@@ -1164,6 +1447,16 @@ Replace it Yes/No ?</translation>
         <message>
             <source>Search &amp;Again</source>
             <translation>Search &amp;Again</translation>
+        </message>
+        <message>
+            <source>Insert &amp;Location from Network</source>
+            <translation>Insert &amp;Location from Network</translation>
+        </message>
+        <message>
+            <source>No network editor of the project has a picked location.
+Pick a place on the network's map first.</source>
+            <translation>No network editor of the project has a picked location.
+Pick a place on the network's map first.</translation>
         </message>
         <message>
             <source>Initial h</source>
@@ -1234,6 +1527,10 @@ Replace it Yes/No ?</translation>
         <message>
             <source>Change of a value</source>
             <translation>Change of a value</translation>
+        </message>
+        <message>
+            <source>Loading of locations</source>
+            <translation>Loading of locations</translation>
         </message>
         <message>
             <source>Next cell; behind the last one a new line</source>
@@ -1510,6 +1807,12 @@ Nothing was loaded.</translation>
         <message>
             <source>Reach Lengths</source>
             <translation>Reach Lengths</translation>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1 locations added, %2 were there already.</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
+            <translation>%1 locations added, %2 were there already; %3 of these have new values.</translation>
         </message>
         <message>
             <source>Search for river name/topo ID.
@@ -1522,6 +1825,262 @@ Search</translation>
 Find Next</source>
             <translation>Search for next occurence of river name/ topo ID.
 Find Next</translation>
+        </message>
+        <message>
+            <source>Default name
+User defined name
+No decimals</source>
+            <translation>Default name
+User defined name
+No decimals</translation>
+        </message>
+        <message>
+            <source>Format
+Auto name
+Filename
+Browse</source>
+            <translation>Format
+Auto name
+Filename
+Browse</translation>
+        </message>
+        <message>
+            <source>Interpolate</source>
+            <translation>Interpolate</translation>
+        </message>
+        <message>
+            <source>Global</source>
+            <translation>Global</translation>
+        </message>
+        <message>
+            <source>kvt Timeseries Bridge
+Ascii Format 1 Timeseries Bridge
+Ascii Format 2 Timeseries Bridge</source>
+            <translation>kvt Timeseries Bridge
+Ascii Format 1 Timeseries Bridge
+Ascii Format 2 Timeseries Bridge</translation>
+        </message>
+        <message>
+            <source>None
+Single
+Multiple 1
+Multiple 2
+Multiple ½</source>
+            <translation>None
+Single
+Multiple 1
+Multiple 2
+Multiple ½</translation>
+        </message>
+        <message>
+            <source>Filename
+Browse
+Item no.
+Order</source>
+            <translation>Filename
+Browse
+Item no.
+Order</translation>
+        </message>
+        <message>
+            <source>X Orig.
+Y Orig.
+Rotation
+Grid Size
+J Cells no.
+K Cells no.
+Filename
+Browse
+Type
+Item
+Component no.
+Storing frequency
+Default period
+Start time
+End time</source>
+            <translation>X Orig.
+Y Orig.
+Rotation
+Grid Size
+J Cells no.
+K Cells no.
+Filename
+Browse
+Type
+Item
+Component no.
+Storing frequency
+Default period
+Start time
+End time</translation>
+        </message>
+        <message>
+            <source>Max
+Min
+Dynamic</source>
+            <translation>Max
+Min
+Dynamic</translation>
+        </message>
+        <message>
+            <source>Water level
+Water depth
+Velocity
+Velocity * Depth
+AD component
+DEM
+(h,p,q)</source>
+            <translation>Water level
+Water depth
+Velocity
+Velocity * Depth
+AD component
+DEM
+(h,p,q)</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1 locations added, %2 were there already.</translation>
+        </message>
+        <message>
+            <source>Invalid DateTime</source>
+            <translation>Invalid DateTime</translation>
+        </message>
+        <message>
+            <source>"%1" is no date and time. Expected one such as %2.</source>
+            <translation>"%1" is no date and time. Expected one such as %2.</translation>
+        </message>
+        <message>
+            <source>Please enter 0 or 1.</source>
+            <translation>Please enter 0 or 1.</translation>
+        </message>
+        <message>
+            <source>%1 already exists.
+The simulation will write over it. Use this name?</source>
+            <translation>%1 already exists.
+The simulation will write over it. Use this name?</translation>
+        </message>
+        <message>
+            <source>Choose a File</source>
+            <translation>Choose a File</translation>
+        </message>
+        <message>
+            <source>Rows without a file name (%1) are left out when the file is saved.</source>
+            <translation>Rows without a file name (%1) are left out when the file is saved.</translation>
+        </message>
+        <message>
+            <source>Mark title</source>
+            <translation>Mark title</translation>
+        </message>
+        <message>
+            <source>Average Range</source>
+            <translation>Average Range</translation>
+        </message>
+        <message>
+            <source>Water Width</source>
+            <translation>Water Width</translation>
+        </message>
+        <message>
+            <source>Radius</source>
+            <translation>Radius</translation>
+        </message>
+        <message>
+            <source>Slope of Bed Channel</source>
+            <translation>Slope of Bed Channel</translation>
+        </message>
+        <message>
+            <source>Width of Low Water Channel</source>
+            <translation>Width of Low Water Channel</translation>
+        </message>
+        <message>
+            <source>Area of Low Water Channel</source>
+            <translation>Area of Low Water Channel</translation>
+        </message>
+        <message>
+            <source>dH (Observed)</source>
+            <translation>dH (Observed)</translation>
+        </message>
+        <message>
+            <source>User Def. Marks</source>
+            <translation>User Def. Marks</translation>
+        </message>
+        <message>
+            <source>W. L. Incr. - Curves</source>
+            <translation>W. L. Incr. - Curves</translation>
+        </message>
+        <message>
+            <source>W. L. Incr. - Sand Bars</source>
+            <translation>W. L. Incr. - Sand Bars</translation>
+        </message>
+        <message>
+            <source>Time Series Output</source>
+            <translation>Time Series Output</translation>
+        </message>
+        <message>
+            <source>Maps</source>
+            <translation>Maps</translation>
+        </message>
+        <message>
+            <source>File name</source>
+            <translation>File name</translation>
+        </message>
+        <message>
+            <source>Water level
+Discharge
+Velocity
+Cross section area
+Flow width
+Radius
+Resistance number
+Conveyance
+Froude number
+Volume
+Flooded area
+Mass error
+Lateral inflows
+Water level slope
+Energy level slope
+Energy level
+Bed shear stress
+Lowest river bed level
+Left levee bank level (marker 1)
+Right levee bank level (marker 3)
+Min. of left and right levee bank level
+Left low flow bank level (marker 4)
+Right low flow bank level (marker 5)
+Min. of left and right low flow bank level
+Center X-Y coordinates
+Left X-Y coordinates
+Right X-Y coordinates
+User defined marks</source>
+            <translation>Water level
+Discharge
+Velocity
+Cross section area
+Flow width
+Radius
+Resistance number
+Conveyance
+Froude number
+Volume
+Flooded area
+Mass error
+Lateral inflows
+Water level slope
+Energy level slope
+Energy level
+Bed shear stress
+Lowest river bed level
+Left levee bank level (marker 1)
+Right levee bank level (marker 3)
+Min. of left and right levee bank level
+Left low flow bank level (marker 4)
+Right low flow bank level (marker 5)
+Min. of left and right low flow bank level
+Center X-Y coordinates
+Left X-Y coordinates
+Right X-Y coordinates
+User defined marks</translation>
         </message>
     </context>
 </TS>

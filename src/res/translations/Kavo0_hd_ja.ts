@@ -544,6 +544,45 @@
         </message>
     </context>
     <context>
+        <name>CMapsPage</name>
+        <message>
+            <source>&amp;Generate maps</source>
+            <translation>マップを作成する(&amp;G)</translation>
+        </message>
+        <message>
+            <source>Output</source>
+            <translation>出力</translation>
+        </message>
+        <message>
+            <source>Map output files</source>
+            <translation>マップ出力ファイル</translation>
+        </message>
+        <message>
+            <source>Apply DEM input data for ground &amp;elevations</source>
+            <translation>地盤高にDEM入力データを使用する(&amp;E)</translation>
+        </message>
+        <message>
+            <source>Input topography</source>
+            <translation>入力地形</translation>
+        </message>
+        <message>
+            <source>Apply DEM data between river &amp;cross-sections</source>
+            <translation>河川横断面の間にもDEMデータを使用する(&amp;C)</translation>
+        </message>
+        <message>
+            <source>DEM input files</source>
+            <translation>DEM入力ファイル</translation>
+        </message>
+        <message>
+            <source>&amp;Map additional flooded areas using help grid from KVR GIS</source>
+            <translation>KVR GISの補助グリッドで追加の浸水域を表示する(&amp;M)</translation>
+        </message>
+        <message>
+            <source>&amp;Help grid</source>
+            <translation>補助グリッド(&amp;H)</translation>
+        </message>
+    </context>
+    <context>
         <name>CMixingCoefPage</name>
         <message>
             <source>Mixing Coefficients</source>
@@ -950,6 +989,166 @@
         </message>
     </context>
     <context>
+        <name>CTextOutputPage</name>
+        <message>
+            <source>&amp;Generate time series output files</source>
+            <translation>時系列出力ファイルを作成する(&amp;G)</translation>
+        </message>
+        <message>
+            <source>Output files</source>
+            <translation>出力ファイル</translation>
+        </message>
+        <message>
+            <source>Text file settings</source>
+            <translation>テキストファイルの設定</translation>
+        </message>
+        <message>
+            <source>&amp;Delimiter in output file</source>
+            <translation>区切り文字(&amp;D)</translation>
+        </message>
+        <message>
+            <source>&amp;Width of columns</source>
+            <translation>列幅(&amp;W)</translation>
+        </message>
+        <message>
+            <source>&amp;Minimum</source>
+            <translation>最小値(&amp;M)</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum</source>
+            <translation>最大値(&amp;X)</translation>
+        </message>
+        <message>
+            <source>Time &amp;of minimum</source>
+            <translation>最小値の時刻(&amp;O)</translation>
+        </message>
+        <message>
+            <source>&amp;Time of maximum</source>
+            <translation>最大値の時刻(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Time period in output</source>
+            <translation>出力期間</translation>
+        </message>
+        <message>
+            <source>&amp;Limited output period</source>
+            <translation>出力期間を限定する(&amp;L)</translation>
+        </message>
+        <message>
+            <source>&amp;Start</source>
+            <translation>開始(&amp;S)</translation>
+        </message>
+        <message>
+            <source>&amp;End</source>
+            <translation>終了(&amp;E)</translation>
+        </message>
+        <message>
+            <source>Items in output</source>
+            <translation>出力項目</translation>
+        </message>
+        <message>
+            <source>Grid points in output</source>
+            <translation>出力格子点</translation>
+        </message>
+        <message>
+            <source>Selected grid points in output</source>
+            <translation>出力する格子点の選択</translation>
+        </message>
+        <message>
+            <source>&amp;All</source>
+            <translation>すべて(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Only from the l&amp;ist</source>
+            <translation>一覧のもののみ(&amp;I)</translation>
+        </message>
+        <message>
+            <source>All ex&amp;cepted those from the list</source>
+            <translation>一覧のものを除くすべて(&amp;C)</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWLCurvePage</name>
+        <message>
+            <source>&amp;Enabling water level increment due to curve</source>
+            <translation>湾曲による水位上昇を考慮する(&amp;E)</translation>
+        </message>
+        <message>
+            <source>System Definition</source>
+            <translation>システムで決定</translation>
+        </message>
+        <message>
+            <source>Average &amp;Range</source>
+            <translation>平均範囲(&amp;R)</translation>
+        </message>
+        <message>
+            <source>&amp;Water Surface width</source>
+            <translation>水面幅(&amp;W)</translation>
+        </message>
+        <message>
+            <source>&amp;Curvature Radius</source>
+            <translation>曲率半径(&amp;C)</translation>
+        </message>
+        <message>
+            <source>&amp;Velocity</source>
+            <translation>流速(&amp;V)</translation>
+        </message>
+        <message>
+            <source>Values</source>
+            <translation>値</translation>
+        </message>
+        <message>
+            <source>&amp;Load Branch &amp;&amp; Chainage</source>
+            <translation>河道と距離標を読み込む(&amp;L)</translation>
+        </message>
+        <message>
+            <source>Water level increment due to curve</source>
+            <translation>湾曲による水位上昇</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWLMarkPage</name>
+        <message>
+            <source>Mark titles</source>
+            <translation>マークの名称</translation>
+        </message>
+        <message>
+            <source>Local values</source>
+            <translation>地点別の値</translation>
+        </message>
+    </context>
+    <context>
+        <name>CWLSandBarsPage</name>
+        <message>
+            <source>&amp;Enabling water level increment due to sand bars</source>
+            <translation>砂州による水位上昇を考慮する(&amp;E)</translation>
+        </message>
+        <message>
+            <source>Method</source>
+            <translation>方法</translation>
+        </message>
+        <message>
+            <source>&amp;Slope / Low Water channel Width / Water Area of Annual Max Discharge</source>
+            <translation>河床勾配・低水路幅・年最大流量時の流積(&amp;S)</translation>
+        </message>
+        <message>
+            <source>&amp;dH (Observed)</source>
+            <translation>dH(実測値)(&amp;D)</translation>
+        </message>
+        <message>
+            <source>Values</source>
+            <translation>値</translation>
+        </message>
+        <message>
+            <source>&amp;Load Branch &amp;&amp; Chainage</source>
+            <translation>河道と距離標を読み込む(&amp;L)</translation>
+        </message>
+        <message>
+            <source>Water level increment due to sand bars</source>
+            <translation>砂州による水位上昇</translation>
+        </message>
+    </context>
+    <context>
         <name>CWavePage</name>
         <message>
             <source>Wave Approximation</source>
@@ -1082,6 +1281,78 @@ Proceed Yes/No ?</source>
 続行しますか?</translation>
         </message>
         <message>
+            <source>Data deleted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>「波動近似」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>「初期条件」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「河床抵抗」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>「風」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>「損失水量」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data deleted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「高水敷抵抗」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Init page, but to switch there, you must first repair error on active page</source>
+            <translation>「初期条件」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Bed Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「河床抵抗」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wave page, but to switch there, you must first repair error on active page</source>
+            <translation>「波動近似」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Wind page, but to switch there, you must first repair error on active page</source>
+            <translation>「風」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Water Loss page, but to switch there, you must first repair error on active page</source>
+            <translation>「損失水量」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Flood Plain Resist. page, but to switch there, you must first repair error on active page</source>
+            <translation>「高水敷抵抗」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Can't select Wave page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「波動近似」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Init page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「初期条件」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Bed Resist. page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「河床抵抗」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Wind page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「風」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Water Loss page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「損失水量」ページを選択できません。</translation>
+        </message>
+        <message>
+            <source>Can't select Flood Plain Resist. page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「高水敷抵抗」ページを選択できません。</translation>
+        </message>
+        <message>
             <source>HD Parameters</source>
             <translation>HDパラメータ</translation>
         </message>
@@ -1118,6 +1389,18 @@ Kinematic Wave</source>
 ダイナミックウェーブ
 拡散波近似
 キネマティックウェーブ近似</translation>
+        </message>
+        <message>
+            <source>Data deleted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>「混合係数」ページのデータを削除しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Data inserted in Mixing Coef. page, but to switch there, you must first repair error on active page</source>
+            <translation>「混合係数」ページにデータを挿入しました。ページを切り替えるには、先に表示中のページの誤りを直してください。</translation>
+        </message>
+        <message>
+            <source>Can't select Mixing Coef. page because of error on active page</source>
+            <translation>表示中のページに誤りがあるため、「混合係数」ページを選択できません。</translation>
         </message>
         <message>
             <source>Leakage Coef</source>
@@ -1164,6 +1447,16 @@ Replace it Yes/No ?</source>
         <message>
             <source>Search &amp;Again</source>
             <translation>次を検索(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Insert &amp;Location from Network</source>
+            <translation>河道網の位置を挿入(&amp;L)</translation>
+        </message>
+        <message>
+            <source>No network editor of the project has a picked location.
+Pick a place on the network's map first.</source>
+            <translation>プロジェクトの河道網エディターで位置が選択されていません。
+先に河道網の平面図で位置を選択してください。</translation>
         </message>
         <message>
             <source>Initial h</source>
@@ -1234,6 +1527,10 @@ Replace it Yes/No ?</source>
         <message>
             <source>Change of a value</source>
             <translation>値の変更</translation>
+        </message>
+        <message>
+            <source>Loading of locations</source>
+            <translation>位置の読み込み</translation>
         </message>
         <message>
             <source>Next cell; behind the last one a new line</source>
@@ -1510,6 +1807,12 @@ Nothing was loaded.</source>
         <message>
             <source>Reach Lengths</source>
             <translation>区間長</translation>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1地点を追加しました。%2地点は既にありました。</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
+            <translation>%1地点を追加しました。%2地点は既にあり、うち%3地点の値を更新しました。</translation>
         </message>
         <message>
             <source>Search for river name/topo ID.
@@ -1522,6 +1825,262 @@ Search</source>
 Find Next</source>
             <translation>次の河川名/地形IDを検索します。
 次を検索</translation>
+        </message>
+        <message>
+            <source>Default name
+User defined name
+No decimals</source>
+            <translation>既定の名称
+ユーザー定義の名称
+小数桁数</translation>
+        </message>
+        <message>
+            <source>Format
+Auto name
+Filename
+Browse</source>
+            <translation>形式
+自動命名
+ファイル名
+参照</translation>
+        </message>
+        <message>
+            <source>Interpolate</source>
+            <translation>補間</translation>
+        </message>
+        <message>
+            <source>Global</source>
+            <translation>全体</translation>
+        </message>
+        <message>
+            <source>kvt Timeseries Bridge
+Ascii Format 1 Timeseries Bridge
+Ascii Format 2 Timeseries Bridge</source>
+            <translation>kvt Timeseries Bridge
+Ascii Format 1 Timeseries Bridge
+Ascii Format 2 Timeseries Bridge</translation>
+        </message>
+        <message>
+            <source>None
+Single
+Multiple 1
+Multiple 2
+Multiple ½</source>
+            <translation>なし
+単一
+複数1
+複数2
+複数½</translation>
+        </message>
+        <message>
+            <source>Filename
+Browse
+Item no.
+Order</source>
+            <translation>ファイル名
+参照
+項目番号
+優先順位</translation>
+        </message>
+        <message>
+            <source>X Orig.
+Y Orig.
+Rotation
+Grid Size
+J Cells no.
+K Cells no.
+Filename
+Browse
+Type
+Item
+Component no.
+Storing frequency
+Default period
+Start time
+End time</source>
+            <translation>X原点
+Y原点
+回転角
+格子間隔
+J方向格子数
+K方向格子数
+ファイル名
+参照
+種類
+項目
+成分番号
+保存間隔
+既定期間
+開始時刻
+終了時刻</translation>
+        </message>
+        <message>
+            <source>Max
+Min
+Dynamic</source>
+            <translation>最大
+最小
+時系列</translation>
+        </message>
+        <message>
+            <source>Water level
+Water depth
+Velocity
+Velocity * Depth
+AD component
+DEM
+(h,p,q)</source>
+            <translation>水位
+水深
+流速
+流速×水深
+移流拡散成分
+DEM
+(h,p,q)</translation>
+        </message>
+        <message>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1地点を追加しました。%2地点は既にありました。</translation>
+        </message>
+        <message>
+            <source>Invalid DateTime</source>
+            <translation>無効な日時</translation>
+        </message>
+        <message>
+            <source>"%1" is no date and time. Expected one such as %2.</source>
+            <translation>「%1」は日時ではありません。%2 のように入力してください。</translation>
+        </message>
+        <message>
+            <source>Please enter 0 or 1.</source>
+            <translation>0または1を入力してください。</translation>
+        </message>
+        <message>
+            <source>%1 already exists.
+The simulation will write over it. Use this name?</source>
+            <translation>%1 は既に存在します。
+計算を実行すると上書きされます。この名前を使いますか?</translation>
+        </message>
+        <message>
+            <source>Choose a File</source>
+            <translation>ファイルの選択</translation>
+        </message>
+        <message>
+            <source>Rows without a file name (%1) are left out when the file is saved.</source>
+            <translation>ファイル名のない行(%1行)は、保存時に除かれます。</translation>
+        </message>
+        <message>
+            <source>Mark title</source>
+            <translation>マークの名称</translation>
+        </message>
+        <message>
+            <source>Average Range</source>
+            <translation>平均範囲</translation>
+        </message>
+        <message>
+            <source>Water Width</source>
+            <translation>水面幅</translation>
+        </message>
+        <message>
+            <source>Radius</source>
+            <translation>半径</translation>
+        </message>
+        <message>
+            <source>Slope of Bed Channel</source>
+            <translation>河床勾配</translation>
+        </message>
+        <message>
+            <source>Width of Low Water Channel</source>
+            <translation>低水路幅</translation>
+        </message>
+        <message>
+            <source>Area of Low Water Channel</source>
+            <translation>低水路流積</translation>
+        </message>
+        <message>
+            <source>dH (Observed)</source>
+            <translation>dH(実測値)</translation>
+        </message>
+        <message>
+            <source>User Def. Marks</source>
+            <translation>ユーザー定義マーク</translation>
+        </message>
+        <message>
+            <source>W. L. Incr. - Curves</source>
+            <translation>水位上昇 - 湾曲</translation>
+        </message>
+        <message>
+            <source>W. L. Incr. - Sand Bars</source>
+            <translation>水位上昇 - 砂州</translation>
+        </message>
+        <message>
+            <source>Time Series Output</source>
+            <translation>時系列出力</translation>
+        </message>
+        <message>
+            <source>Maps</source>
+            <translation>マップ</translation>
+        </message>
+        <message>
+            <source>File name</source>
+            <translation>ファイル名</translation>
+        </message>
+        <message>
+            <source>Water level
+Discharge
+Velocity
+Cross section area
+Flow width
+Radius
+Resistance number
+Conveyance
+Froude number
+Volume
+Flooded area
+Mass error
+Lateral inflows
+Water level slope
+Energy level slope
+Energy level
+Bed shear stress
+Lowest river bed level
+Left levee bank level (marker 1)
+Right levee bank level (marker 3)
+Min. of left and right levee bank level
+Left low flow bank level (marker 4)
+Right low flow bank level (marker 5)
+Min. of left and right low flow bank level
+Center X-Y coordinates
+Left X-Y coordinates
+Right X-Y coordinates
+User defined marks</source>
+            <translation>水位
+流量
+流速
+流積
+水面幅
+径深
+抵抗係数
+通水能
+フルード数
+貯留量
+浸水面積
+質量誤差
+横流入
+水面勾配
+エネルギー勾配
+エネルギー水頭
+河床せん断応力
+最深河床高
+左岸堤防高(マーカー1)
+右岸堤防高(マーカー3)
+左右岸堤防高の低い方
+左岸低水路岸高(マーカー4)
+右岸低水路岸高(マーカー5)
+左右岸低水路岸高の低い方
+中央XY座標
+左岸XY座標
+右岸XY座標
+ユーザー定義マーク</translation>
         </message>
     </context>
 </TS>

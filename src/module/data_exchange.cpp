@@ -1,0 +1,296 @@
+#include "module/data_exchange.h"
+
+#include "ks/fc/message_box.h"
+#include "module/data_tables.h"
+#include "module/kavo0_hd.h"
+#include "module/list_commands.h"
+#include "module/list_rows.h"
+#include "module/sheet.h"
+#include "module/view.h"
+#include "pages/framework/page.h"
+
+#include <QPointer>
+#include <QUndoStack>
+#include <cmath>
+
+namespace {
+
+void Log(const char* why)
+{
+    qDebug("HD data exchange: %s; nothing is done", why);
+}
+
+/// One request is met at a time: what it changes makes others ask again, and they would meet a table half changed.
+class OneRequest
+{
+public:
+    OneRequest() : m_entered(!s_busy)
+    {
+        s_busy = true;
+        if (!m_entered)
+            Log("a request inside a request");
+    }
+    ~OneRequest()
+    {
+        if (m_entered)
+            s_busy = false;
+    }
+    OneRequest(const OneRequest&) = delete;
+    OneRequest& operator=(const OneRequest&) = delete;
+    explicit operator bool() const { return m_entered; }
+
+private:
+    static inline bool s_busy = false;
+    bool m_entered;
+};
+
+/// Messages of a file that is only looked at go to the debug log.
+class NoMessageBoxes
+{
+public:
+    NoMessageBoxes()
+        : m_old(KsSetMessageBoxHandler([](const CString& text, QMessageBox::StandardButtons) {
+              qDebug("HD data exchange: %s", qPrintable(text));
+              return QMessageBox::Ok;
+          }))
+    {
+    }
+    ~NoMessageBoxes() { KsSetMessageBoxHandler(std::move(m_old)); }
+    NoMessageBoxes(const NoMessageBoxes&) = delete;
+    NoMessageBoxes& operator=(const NoMessageBoxes&) = delete;
+
+private:
+    KsMessageBoxHandler m_old;
+};
+
+std::unique_ptr<CKavo0_hdDoc> ReadFile(const CString& path)
+{
+    const NoMessageBoxes quiet;
+    auto document = std::make_unique<CKavo0_hdDoc>();
+    if (document->OnOpenDocument(path) && !document->IsUnreadable())
+        return document;
+    Log("the file cannot be read");
+    return nullptr;
+}
+
+bool IsReady(const CKavo0_hdDoc& document)
+{
+    if (document.IsExecuting()) {
+        Log("the document is being opened or saved");
+        return false;
+    }
+    for (const CView* view : document.Views()) {
+        const auto* window = CKsMDIChildWnd::Of(view);
+        if (window && window->IsClosing()) {
+            Log("the document is being closed");
+            return false;
+        }
+    }
+    return true;
+}
+
+/// The view as one of this editor's that can serve a request.
+CKavo0_hdView* Ready(CView* view)
+{
+    auto* served = qobject_cast<CKavo0_hdView*>(view);
+    if (!served || !served->GetDocument() || !served->ActivePage()) {
+        Log("the view is none of this editor's, or has no document");
+        return nullptr;
+    }
+    return IsReady(*served->GetDocument()) ? served : nullptr;
+}
+
+/// The document of the file in this program, opened if need be. A file that is open already is never opened again:
+/// the two would overwrite each other. A new window is one of the shell's own template, as if the user had opened it.
+CKsDoc* OpenFile(const CString& path, CKsMDIFrameWnd& frame)
+{
+    for (CMultiDocTemplate* documents : CKavo0_hd::Templates()) {
+        if (CKsDoc* document = documents->FindDocument(path))
+            return document;
+    }
+    if (!ReadFile(path))
+        return nullptr;
+    const auto templates = CKavo0_hd::Templates();
+    CMultiDocTemplate* documents = templates.empty() ? nullptr : templates.front();
+    if (!documents) {
+        documents = CKavo0_hd::CreateMainDlg();
+        documents->setParent(&frame);
+    }
+    return documents->OpenDocumentFile(&frame, path);
+}
+
+CKavo0_hdView* ViewOfFile(const CString& path)
+{
+    auto* frame = dynamic_cast<CKsMDIFrameWnd*>(KsMainWindow());
+    const CKsDoc* document = frame && !path.isEmpty() ? OpenFile(path, *frame) : nullptr;
+    if (!document || document->Views().empty()) {
+        Log("there is neither a view nor a file");
+        return nullptr;
+    }
+    return Ready(document->Views().front());
+}
+
+const CKvr_CBE_ModelDataItem* FirstItem(const CObList* items)
+{
+    const auto* item =
+        items && !items->empty() ? dynamic_cast<const CKvr_CBE_ModelDataItem*>(items->front().get()) : nullptr;
+    if (!item)
+        Log("there is no item of model data");
+    else if (!FindDataTable(item->type))
+        Log("the item's type is unknown");
+    else
+        return item;
+    return nullptr;
+}
+
+/// A request under way, at a view with its document.
+struct Exchange
+{
+    const CKvr_CBE_ModelDataItem& item;
+    const HDDataTable& table;
+    CKavo0_hdView& view;
+    CKavo0_hdDoc& document;
+    CGenList& list;
+    CString message{}; // for the user, when all is done
+    bool changed = false;
+
+    /// Shows the window and the table's tab; otherwise leaves the message.
+    bool Show(Str refusal)
+    {
+        if (auto* window = CKsMDIChildWnd::Of(&view))
+            window->BringToFront();
+        if (view.Sheet()->SetActivePage(table.tab))
+            return true;
+        message = LoadString(refusal);
+        return false;
+    }
+    /// Row of the first record at exactly the item's place; GetCount() for none.
+    std::size_t Find() const
+    {
+        const std::string branch = item.branch.toStdString();
+        std::size_t row = 0;
+        while (row < list.GetCount() &&
+               (list.GetAt(row).RiverName != branch || list.GetAt(row).Chainage != item.chainage))
+            ++row;
+        if (row == list.GetCount())
+            Log("there is no line at the item's place");
+        return row;
+    }
+    bool IsShown() const { return view.Sheet()->currentIndex() == table.tab; }
+};
+
+void Insert(Exchange& exchange)
+{
+    if (exchange.item.branch.isEmpty() || !std::isfinite(exchange.item.chainage))
+        return Log("the item has no branch or no chainage");
+    // What is being typed is taken first: by the switch, which may be refused, or where no switch is needed.
+    if (exchange.IsShown())
+        exchange.view.ActivePage()->StoreToDocument();
+    exchange.Show(exchange.table.inserted);
+
+    const auto rows = MakeListRows(exchange.document, exchange.list);
+    auto lines = rows->NewRows(1);
+    auto& record = *static_cast<HD_RiverPos*>(lines->At(0));
+    record.RiverName = exchange.item.branch.toStdString();
+    record.Chainage = exchange.item.chainage;
+    if (exchange.table.fill)
+        exchange.table.fill(record, exchange.document.Parameters().Global, exchange.item);
+    exchange.document.UndoStack().push(
+        new CInsertLines(exchange.document, rows, rows->Count(), std::move(lines), FirstLine::Goes));
+    exchange.changed = true;
+    if (auto* page = exchange.view.ActivePage(); exchange.IsShown() && page->GetList() == &exchange.list)
+        page->GotoLine(int(exchange.list.GetCount()));
+}
+
+void Delete(Exchange& exchange)
+{
+    exchange.view.ActivePage()->StoreToDocument();
+    if (exchange.Find() == exchange.list.GetCount())
+        return;
+    exchange.Show(exchange.table.deleted);
+    const std::size_t row = exchange.Find(); // the page that was left may have stored
+    if (row == exchange.list.GetCount())
+        return;
+    const auto rows = MakeListRows(exchange.document, exchange.list);
+    exchange.document.UndoStack().push(new CDeleteLines(exchange.document, rows, row, 1));
+    exchange.changed = true;
+}
+
+void Select(Exchange& exchange)
+{
+    exchange.view.ActivePage()->StoreToDocument();
+    const std::size_t row = exchange.Find();
+    if (row == exchange.list.GetCount() || !exchange.Show(exchange.table.selected))
+        return;
+    if (auto* page = exchange.view.ActivePage(); page->GetGrid())
+        page->GotoLine(int(row) + 1);
+}
+
+void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(Exchange& exchange))
+{
+    QPointer<CKavo0_hdView> served;
+    CString message;
+    bool changed = false;
+    {
+        const OneRequest request;
+        const auto* item = request ? FirstItem(items) : nullptr;
+        if (!item)
+            return;
+        served = view ? Ready(view) : ViewOfFile(path);
+        if (!served)
+            return;
+        CKavo0_hdDoc& document = *served->GetDocument();
+        const HDDataTable& table = *FindDataTable(item->type);
+        Exchange exchange{*item, table, *served, document, table.list(document.Parameters())};
+        meet(exchange);
+        message = exchange.message;
+        changed = exchange.changed;
+    }
+    // By now others may ask again: those that hear of the change do so at once.
+    if (changed && served && served->GetDocument())
+        served->GetDocument()->DataChange(served->GetDocument()->GetPathName());
+    if (!message.isEmpty())
+        KsMessageBox(message, QMessageBox::Ok, served);
+}
+
+} // namespace
+
+std::unique_ptr<CObList> ItemsOf(const CString& path, CKsDoc* document, MakeItems make)
+{
+    const OneRequest request;
+    if (!request)
+        return nullptr;
+    if (auto* open = qobject_cast<CKavo0_hdDoc*>(document)) {
+        if (!IsReady(*open))
+            return nullptr;
+        open->UpdateAllViews(nullptr, Hint::Store);
+        return make(*open);
+    }
+    const auto file = ReadFile(path);
+    return file ? make(*file) : nullptr;
+}
+
+CObList* CKavo0_hd::GetData(const CString& path, CView* view)
+{
+    if (!view)
+        return ItemsOf(path, nullptr, &DataItems).release();
+    const auto* served = Ready(view);
+    return served ? ItemsOf({}, served->GetDocument(), &DataItems).release() : nullptr;
+}
+
+void CKavo0_hd::InsertData(const CString& path, CView* view, CObList* items)
+{
+    Serve(path, view, items, &Insert);
+}
+
+void CKavo0_hd::DeleteData(const CString& path, CView* view, CObList* items)
+{
+    Serve(path, view, items, &Delete);
+}
+
+void CKavo0_hd::ChangeData(const CString&, CView*, CObList*) {}
+
+void CKavo0_hd::SelectData(const CString& path, CView* view, CObList* items)
+{
+    Serve(path, view, items, &Select);
+}

@@ -1,0 +1,118 @@
+#include "module/data_items.h"
+
+#include "module/data_tables.h"
+#include "module/document.h"
+
+#include <algorithm>
+#include <string_view>
+
+namespace {
+
+/// The line that an empty table shows is no line of the document.
+bool IsShownOnly(const CKavo0_hdDoc& document, const HD_RiverPos& record)
+{
+    return record.IsBlank() && document.IsPlaceholder(record);
+}
+
+CString TextOf(std::string_view name)
+{
+    const auto size = qsizetype(name.size());
+    const bool plain = std::all_of(name.begin(), name.end(), [](char c) { return static_cast<signed char>(c) >= 0; });
+    return plain ? CString::fromLatin1(name.data(), size) : CString::fromUtf8(name.data(), size);
+}
+
+/// Branch names of one list as texts. Neighbours mostly share their branch, and then share one text.
+class BranchTexts
+{
+public:
+    const CString& Of(const std::string& name)
+    {
+        if (name != m_name) {
+            m_name = name;
+            m_text = TextOf(name);
+        }
+        return m_text;
+    }
+
+private:
+    std::string_view m_name; // in the record before
+    CString m_text = QStringLiteral("");
+};
+
+void AppendTable(const HDDataTable& table, int type, CKavo0_hdDoc& document, CObList& items)
+{
+    const CGenList& list = table.list(document.Parameters());
+    BranchTexts branches;
+    for (std::size_t i = 0; i < list.GetCount(); ++i) {
+        const HD_RiverPos& record = list.GetAt(i);
+        if (IsShownOnly(document, record))
+            continue;
+        auto item = std::make_unique<CKvr_CBE_ModelDataItem>();
+        item->branch = branches.Of(record.RiverName);
+        item->chainage = record.Chainage;
+        if (table.second)
+            item->second = table.second(record);
+        item->type = type;
+        items.push_back(std::move(item));
+    }
+}
+
+} // namespace
+
+std::unique_ptr<CObList> DataItems(CKavo0_hdDoc& document)
+{
+    auto items = std::make_unique<CObList>();
+    std::size_t count = 0;
+    for (const HDDataTable& table : HDDataTables())
+        count += table.list(document.Parameters()).GetCount();
+    items->reserve(count);
+    int type = 0;
+    for (const HDDataTable& table : HDDataTables())
+        AppendTable(table, type++, document, *items);
+    return items;
+}
+
+std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
+{
+    const HD_Global_Var& globals = document.Parameters().Global;
+    const std::size_t titles = globals.MarkTitles.size();
+    auto items = std::make_unique<CObList>();
+
+    auto head = std::make_unique<CKvrCBEUserDefMark>();
+    for (const std::string& title : globals.MarkTitles)
+        head->titles.push_back(CString::fromStdString(title));
+    head->flags.assign(globals.MarkInterpolate.begin(), globals.MarkInterpolate.end());
+    head->flags.resize(titles, 0);
+    items->push_back(std::move(head));
+
+    const auto& list = document.Parameters().WaterLevelMarkList;
+    for (std::size_t i = 0; i < list.GetCount(); ++i) {
+        const HDWLMark& mark = list.GetAt(i);
+        if (IsShownOnly(document, mark))
+            continue;
+        auto item = std::make_unique<CKvrCBEUserDefMark>();
+        item->branch = CString::fromStdString(mark.RiverName);
+        item->values.push_back(mark.Chainage);
+        item->values.insert(item->values.end(), mark.MarkLevels.begin(), mark.MarkLevels.end());
+        item->values.resize(std::max(item->values.size(), titles + 1), NotGiven);
+        items->push_back(std::move(item));
+    }
+    return items;
+}
+
+std::unique_ptr<CObList> MapItems(CKavo0_hdDoc& document)
+{
+    auto items = std::make_unique<CObList>();
+    for (const CMapsOutput& map : document.Parameters().Global.MapOutput.MapOutputFiles) {
+        auto item = std::make_unique<CKvr_CBE_HDMaps>();
+        item->xOrigin = map.XOrigin;
+        item->yOrigin = map.YOrigin;
+        item->rotation = map.Rotation;
+        item->cellSize = map.GridSize;
+        item->jCells = map.JCells;
+        item->kCells = map.KCells;
+        item->fileName = CString::fromStdString(map.FileName);
+        items->push_back(std::move(item));
+    }
+    return items;
+}

@@ -1,0 +1,98 @@
+// The view and the other editors of the project: what it answers, what it asks and what it tells.
+#include "module/view.h"
+
+#include "ks/fc/exchange.h"
+#include "ks/fc/message_box.h"
+#include "module/kavo0_hd.h"
+#include "pages/framework/gen_grid.h"
+#include "pages/framework/page.h"
+#include "res/strings.h"
+
+#include <QTimer>
+#include <cmath>
+#include <iterator>
+
+void CKavo0_hdView::SendToolbarMessage(unsigned message)
+{
+    CKSComm_Package package;
+    package.view = this;
+    KsSendMessage(KsMainWindow(), message, 0, reinterpret_cast<LPARAM>(&package));
+}
+
+LRESULT CKavo0_hdView::AnswerEditor(WPARAM request, CKSComm_Package* package)
+{
+    if (request != KsRequest::GetData && request != KsRequest::InsertData && request != KsRequest::DeleteData)
+        return 0;
+    // One of these documents never meets the requests of another.
+    if (!package || !package->view || !package->objects || qobject_cast<CKavo0_hdView*>(package->view)) {
+        qDebug("HD data exchange: a request without sender or list, or of this editor; nothing is done");
+        return 0;
+    }
+    if (request == KsRequest::InsertData) {
+        CKavo0_hd::InsertData({}, this, package->objects);
+    } else if (request == KsRequest::DeleteData) {
+        CKavo0_hd::DeleteData({}, this, package->objects);
+    } else if (const std::unique_ptr<CObList> items{CKavo0_hd::GetData({}, this)}) {
+        package->objects->insert(package->objects->end(), std::make_move_iterator(items->begin()),
+                                 std::make_move_iterator(items->end()));
+    }
+    return 0;
+}
+
+/// News wait until the present event is over: a row becomes current, or a step is undone, in the middle of changes, and
+/// who hears of it asks at once. Many moves in one event are told once.
+void CKavo0_hdView::TellLater(bool& news)
+{
+    if (!m_inProject)
+        return;
+    if (!m_tellLocation && !m_tellChange)
+        QTimer::singleShot(0, this, &CKavo0_hdView::Tell);
+    news = true;
+}
+
+void CKavo0_hdView::Tell()
+{
+    const bool location = std::exchange(m_tellLocation, false), change = std::exchange(m_tellChange, false);
+    if (!GetDocument())
+        return;
+    if (change)
+        GetDocument()->DataChange(GetDocument()->GetPathName());
+    const auto* page = ActivePage();
+    const auto record =
+        location && page && page->GetGrid() ? page->GetRecordAt(page->GetGrid()->CurrentRow()) : nullptr;
+    if (!record || record->IsBlank())
+        return;
+    auto shown = std::make_unique<CKvrCBELocation>();
+    shown->branch = QString::fromStdString(record->RiverName);
+    shown->chainage = record->Chainage;
+    CObList objects;
+    objects.push_back(std::move(shown));
+    GetDocument()->TellShell(KsRequest::LocationShown, this, &objects);
+}
+
+QStringList CKavo0_hdView::BranchNames()
+{
+    CObList names;
+    QStringList branches;
+    GetDocument()->AskShell(KsRequest::BranchNames, this, &names);
+    for (const auto& item : names) {
+        const auto* name = dynamic_cast<const CKvrCBEText*>(item.get());
+        if (name && !name->text.isEmpty())
+            branches << name->text.toUpper(); // as the column stores them
+    }
+    branches.removeDuplicates();
+    return branches;
+}
+
+void CKavo0_hdView::FetchLocation()
+{
+    CObList objects;
+    GetDocument()->AskShell(KsRequest::FetchLocation, this, &objects);
+    const auto* place = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
+    if (!place || place->branch.isEmpty() || !std::isfinite(place->chainage)) {
+        KsMessageBox(LoadString(Str::FetchNoAnswer), QMessageBox::Ok, this);
+        return;
+    }
+    const double shown = CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(place->chainage, 1);
+    ActivePage()->InsertLocation(place->branch, KsShortestNumber(shown));
+}
