@@ -125,7 +125,7 @@ void ReadFile(const QString& path, CGisFile& file)
         if (IsGeographic(*source, layer)) {
             file.layers.clear();
             file.error = GisLines::tr("%1: the layer \"%2\" is in degrees of longitude and latitude. Distances along "
-                                      "a branch need map coordinates in metres: project the file first.")
+                                      "a branch need map coordinates in meters: project the file first.")
                              .arg(name, layer.name);
             return;
         }

@@ -69,11 +69,11 @@ void CImportDialog::LayerChanged()
 void CImportDialog::UpdateSummary()
 {
     const CGisLayer& layer = m_file.layers[std::size_t(Layer())];
-    QString text = tr("%n line(s)", nullptr, static_cast<int>(layer.lines.size()));
+    QString text = tr("Lines: %1").arg(layer.lines.size());
     const QString first = layer.lines.front().values.value(m_name->currentData().toInt());
     if (m_name->currentData().toInt() >= 0)
         text += tr(", the first is named \"%1\"").arg(first);
     if (layer.others > 0)
-        text += u'\n' + tr("%n feature(s) that are no lines are left out", nullptr, layer.others);
+        text += u'\n' + tr("Left out, because they are no lines: %1").arg(layer.others);
     m_summary->setText(text);
 }

@@ -34,6 +34,26 @@ QPainterPath Circle()
     return path;
 }
 
+QPainterPath Plus()
+{
+    constexpr double arm = 0.94, half = 0.38;
+    QPainterPath path;
+    path.addPolygon(QPolygonF{{-half, -arm},
+                              {half, -arm},
+                              {half, -half},
+                              {arm, -half},
+                              {arm, half},
+                              {half, half},
+                              {half, arm},
+                              {-half, arm},
+                              {-half, half},
+                              {-arm, half},
+                              {-arm, -half},
+                              {-half, -half}});
+    path.closeSubpath();
+    return path;
+}
+
 struct KindRow
 {
     const char* name;
@@ -51,7 +71,7 @@ const std::array<KindRow, HDDataTypeCount>& Kinds()
         {QT_TRANSLATE_NOOP("LocationKinds", "Bed resistance"), 0xffd55e00, [] { return Polygon(4, M_PI / 4); }},
         {QT_TRANSLATE_NOOP("LocationKinds", "Wave"), 0xffcc79a7, [] { return Polygon(4, 0); }},
         {QT_TRANSLATE_NOOP("LocationKinds", "Water loss"), 0xff009e73, [] { return Polygon(3, M_PI); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Flood plain"), 0xfff0e442, [] { return Polygon(6, 0); }},
+        {QT_TRANSLATE_NOOP("LocationKinds", "Flood plain"), 0xfff0e442, [] { return Plus(); }},
         {QT_TRANSLATE_NOOP("LocationKinds", "Mixing"), 0xffe69f00, [] { return Polygon(5, 0, 0.5); }},
     }};
     return rows;

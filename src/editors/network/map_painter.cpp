@@ -4,7 +4,7 @@
 
 namespace {
 // Pixels of the user.
-constexpr double LineWidth = 2.2, CurrentWidth = 3.6, Casing = 2.5, HaloWidth = 3.5, ArrowSize = 7.5;
+constexpr double LineWidth = 2.2, CurrentWidth = 3.6, Casing = 2.5, HaloWidth = 2.5, ArrowSize = 7.5;
 } // namespace
 
 CMapPainter::CMapPainter(const CMapScene& scene, const CMapStyle& style, int currentBranch)
@@ -43,6 +43,8 @@ void CMapPainter::PaintLines(QPainter& painter, const QRectF& part) const
         for (const auto& [colour, extra] :
              {std::pair(m_style.ground, Casing), std::pair(current ? m_style.chosen : m_style.water, 0.0)}) {
             const bool casing = extra > 0;
+            if (casing && !m_scene.HasCasings())
+                continue;
             painter.setPen(QPen(colour, (width + extra) * ratio, Qt::SolidLine, casing ? Qt::FlatCap : Qt::RoundCap,
                                 casing ? Qt::BevelJoin : Qt::RoundJoin));
             for (const QPolygonF& each : parts)
@@ -101,7 +103,9 @@ void CMapPainter::PaintLabels(QPainter& painter, const QRectF& part) const
         painter.save();
         painter.translate(label.center);
         painter.rotate(label.angle);
-        painter.strokePath(text, QPen(m_style.Ground(220), halo, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+        painter.setPen(Qt::NoPen);
+        painter.setBrush(m_style.Ground(190)); // keeps the name legible on whatever is under it
+        painter.drawRoundedRect(text.boundingRect().adjusted(-halo, -halo, halo, halo), halo, halo);
         painter.fillPath(text, current ? m_style.chosen : m_style.text);
         painter.restore();
     }

@@ -9,7 +9,8 @@ namespace {
 
 constexpr double ArrowSpacing = 130, LabelSpacing = 700, LabelGap = 5; // pixels of the user
 constexpr double MaxArrows = 400, MaxLabels = 200;                     // a branch, however large the scale
-constexpr double LeaderSpacing = 9; // leaders are drawn while symbols of a kind are on average that far apart
+constexpr double CasingDensity = 0.02; // pixels of lines a square pixel: where they stand closer, casings hide too much
+constexpr double LeaderSpacing = 9;    // leaders are drawn while symbols of a kind are on average that far apart
 
 } // namespace
 
@@ -32,6 +33,19 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
     }
     std::stable_sort(placed.begin(), placed.end(), [](const auto& a, const auto& b) { return a.kind < b.kind; });
     return placed;
+}
+
+std::vector<QPainterPath> NameOutlines(const CNetwork& network, const QFont& font, double ratio)
+{
+    std::vector<QPainterPath> outlines;
+    outlines.reserve(network.branches.size());
+    for (const CNetworkBranch& branch : network.branches) {
+        QPainterPath text;
+        text.addText(0, 0, font, branch.name);
+        outlines.push_back(QTransform::fromScale(ratio, ratio).map(text));
+        outlines.back().translate(-outlines.back().boundingRect().center());
+    }
+    return outlines;
 }
 
 /// Counts what a rectangle would cover, by cells.
@@ -74,15 +88,18 @@ private:
 CMapScene::~CMapScene() = default;
 
 CMapScene::CMapScene(const CNetwork& network, const std::vector<CPlacedLocation>& placed,
-                     const CMapProjection& projection, const QFont& font, double ratio)
-    : m_ratio(ratio)
+                     const CMapProjection& projection, const std::vector<QPainterPath>& names, double ratio)
+    : m_ratio(ratio), m_texts(names)
 {
     m_lines.reserve(network.branches.size());
     for (const CNetworkBranch& branch : network.branches)
         m_lines.emplace_back(branch.line, projection);
+    for (const CPlaneLine& line : m_lines)
+        m_length += line.Length();
+    const QSizeF extent = network.Extent().size() * projection.scale / ratio;
+    m_casings = m_lines.size() < 20 || m_length / ratio < CasingDensity * extent.width() * extent.height();
     AddSymbols(placed, projection);
     AddArrows(network);
-    AddTexts(network, font);
     AddLabels();
 }
 
@@ -101,10 +118,7 @@ void CMapScene::AddSymbols(const std::vector<CPlacedLocation>& placed, const CMa
             offsets[kind] = (lane++ - (kinds - 1) / 2.0) * LaneWidth * m_ratio;
     }
     m_lanes = kinds > 0 ? (kinds - 1) / 2.0 * LaneWidth * m_ratio + SymbolSize / 2 * m_ratio : 0;
-    double length = 0;
-    for (const CPlaneLine& line : m_lines)
-        length += line.Length();
-    m_leaders = kinds > 1 && length * kinds > LeaderSpacing * m_ratio * static_cast<double>(placed.size());
+    m_leaders = kinds > 1 && m_length * kinds > LeaderSpacing * m_ratio * static_cast<double>(placed.size());
 
     m_symbols.reserve(placed.size());
     for (const CPlacedLocation& each : placed) {
@@ -128,17 +142,6 @@ void CMapScene::AddArrows(const CNetwork& network)
             const QPointF along = line.Direction(distance, 5 * m_ratio);
             m_arrows.push_back({line.At(distance), network.branches[i].FlowsAlongLine() ? along : -along});
         }
-    }
-}
-
-void CMapScene::AddTexts(const CNetwork& network, const QFont& font)
-{
-    for (const CNetworkBranch& branch : network.branches) {
-        QPainterPath text;
-        text.addText(0, 0, font, branch.name);
-        m_texts.push_back(QTransform::fromScale(m_ratio, m_ratio).map(text));
-        const QPointF middle = m_texts.back().boundingRect().center();
-        m_texts.back().translate(-middle);
     }
 }
 

@@ -22,6 +22,9 @@ struct CPlacedLocation
 /// The places of locations; those that are nowhere in the network are left out. Kinds stand in the order of drawing.
 std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const std::vector<CMapLocation>& locations);
 
+/// The names of the branches as outlines around zero, in device pixels.
+std::vector<QPainterPath> NameOutlines(const CNetwork& network, const QFont& font, double ratio);
+
 class CMapScene
 {
 public:
@@ -43,17 +46,18 @@ public:
         std::size_t location;
     };
 
-    /// `ratio`: device pixels a pixel of the user's.
+    /// `ratio`: device pixels a pixel of the user's. `names` outlives the scene.
     CMapScene(const CNetwork& network, const std::vector<CPlacedLocation>& placed, const CMapProjection& projection,
-              const QFont& font, double ratio);
+              const std::vector<QPainterPath>& names, double ratio);
     ~CMapScene();
 
     const std::vector<CPlaneLine>& Lines() const { return m_lines; } // as the network's branches
     const std::vector<Arrow>& Arrows() const { return m_arrows; }
     const std::vector<Label>& Labels() const { return m_labels; }
     const std::vector<Symbol>& Symbols() const { return m_symbols; }
-    const QPainterPath& Text(std::size_t branch) const { return m_texts[branch]; } // around zero
+    const QPainterPath& Text(std::size_t branch) const { return m_texts[branch]; }
     bool HasLeaders() const { return m_leaders; }
+    bool HasCasings() const { return m_casings; }
     double Ratio() const { return m_ratio; }
 
     static constexpr double SymbolSize = 11, LaneWidth = 10; // pixels of the user
@@ -61,19 +65,19 @@ public:
 private:
     void AddSymbols(const std::vector<CPlacedLocation>& placed, const CMapProjection& projection);
     void AddArrows(const CNetwork& network);
-    void AddTexts(const CNetwork& network, const QFont& font);
     void AddLabels();
     void AddLabel(std::size_t branch, double distance, double shift, const QRectF& text);
     Label LabelAt(std::size_t branch, double distance, double side, const QRectF& text, double& bulge) const;
 
     double m_ratio;
-    double m_lanes = 0; // half the width of the symbols' band
-    bool m_leaders = false;
+    double m_length = 0; // of all lines
+    double m_lanes = 0;  // half the width of the symbols' band
+    bool m_leaders = false, m_casings = false;
     std::vector<CPlaneLine> m_lines;
     std::vector<Arrow> m_arrows;
     std::vector<Label> m_labels;
     std::vector<Symbol> m_symbols;
-    std::vector<QPainterPath> m_texts;
+    const std::vector<QPainterPath>& m_texts;
     class Boxes;
     std::unique_ptr<Boxes> m_labelBoxes, m_symbolBoxes; // while labels are placed
 };

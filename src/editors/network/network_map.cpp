@@ -31,6 +31,7 @@ CNetworkMap::~CNetworkMap() = default;
 
 void CNetworkMap::NetworkChanged()
 {
+    m_names.clear();
     PlaceAll();
     if (m_fitted)
         FitAll();
@@ -72,7 +73,10 @@ const CMapScene& CNetworkMap::Scene() const
         QFont names = font();
         names.setPointSizeF(names.pointSizeF() > 0 ? names.pointSizeF() : 9);
         names.setWeight(QFont::DemiBold);
-        m_scene = std::make_unique<CMapScene>(m_document.Network(), m_placed, m_projection, names, devicePixelRatioF());
+        if (m_names.empty())
+            m_names = NameOutlines(m_document.Network(), names, devicePixelRatioF());
+        m_scene =
+            std::make_unique<CMapScene>(m_document.Network(), m_placed, m_projection, m_names, devicePixelRatioF());
     }
     return *m_scene;
 }
@@ -310,6 +314,7 @@ void CNetworkMap::paintEvent(QPaintEvent*)
         m_projection.scale *= devicePixelRatioF() / m_scene->Ratio();
         m_projection.offset = (QPointF(m_projection.offset) * devicePixelRatioF() / m_scene->Ratio()).toPoint();
         SceneChanged();
+        m_names.clear(); // of the other screen's pixels
     }
     UpdateBuffer();
     QPainter painter(this);
@@ -362,6 +367,7 @@ void CNetworkMap::changeEvent(QEvent* event)
     case QEvent::PaletteChange:
     case QEvent::FontChange:
     case QEvent::StyleChange:
+        m_names.clear();
         SceneChanged();
         break;
     default:

@@ -94,6 +94,7 @@ private:
     std::vector<CPlacedLocation> m_placed;
     CMapProjection m_projection;
     bool m_fitted = false;                      // keep all in sight while the window is resized
+    mutable std::vector<QPainterPath> m_names;  // of the branches; empty when something changed
     mutable std::unique_ptr<CMapScene> m_scene; // of the present scale; null when something changed
 
     QPixmap m_buffer; // the window without marks

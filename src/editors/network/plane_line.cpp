@@ -1,12 +1,20 @@
 #include "editors/network/plane_line.h"
 
+#include "editors/network/linear_reference.h"
+
 #include <algorithm>
 #include <cmath>
 
 namespace {
 
 constexpr qsizetype BoxSegments = 32;
-constexpr double Thin = 0.7; // pixels between the vertices that are kept
+constexpr double Thin = 0.7;       // pixels between vertices that are looked at
+constexpr double Tolerance = 0.35; // pixels that the line may be off
+
+double Distance(const QPointF& a, const QPointF& b)
+{
+    return std::hypot(a.x() - b.x(), a.y() - b.y());
+}
 
 QRectF BoxOf(const QPointF* points, qsizetype count)
 {
@@ -28,18 +36,54 @@ bool Meets(const QRectF& a, const QRectF& b)
 
 CPlaneLine::CPlaneLine(const std::vector<QPointF>& line, const CMapProjection& projection)
 {
-    m_points.reserve(static_cast<qsizetype>(line.size()));
+    QPolygonF all;
+    all.reserve(static_cast<qsizetype>(line.size()));
     for (std::size_t i = 0; i < line.size(); ++i) {
         const QPointF at = projection.ToPlane(line[i]);
-        const double step =
-            m_points.isEmpty() ? 0 : std::hypot(at.x() - m_points.back().x(), at.y() - m_points.back().y());
-        if (i > 0 && i + 1 < line.size() && step < Thin)
-            continue;
-        m_along.push_back(m_along.empty() ? 0 : m_along.back() + step);
-        m_points.append(at);
+        if (i == 0 || i + 1 == line.size() || Distance(at, all.back()) >= Thin)
+            all.append(at);
     }
+    Simplify(all);
+    for (qsizetype i = 0; i < m_points.size(); ++i)
+        m_along.push_back(i == 0 ? 0 : m_along.back() + Distance(m_points[i - 1], m_points[i]));
     for (qsizetype i = 0; i + 1 < m_points.size(); i += BoxSegments)
         m_boxes.push_back(BoxOf(m_points.constData() + i, std::min(BoxSegments + 1, m_points.size() - i)));
+}
+
+/// Keeps the vertices without which the line would be off by more than a tolerance. D. Douglas, T. Peucker, Algorithms
+/// for the reduction of the number of points required to represent a digitized line or its caricature, 1973.
+void CPlaneLine::Simplify(const QPolygonF& all)
+{
+    if (all.size() < 3) {
+        m_points = all;
+        return;
+    }
+    std::vector<bool> kept(static_cast<std::size_t>(all.size()), false);
+    kept.front() = kept.back() = true;
+    std::vector<std::pair<qsizetype, qsizetype>> ranges{{0, all.size() - 1}};
+    while (!ranges.empty()) {
+        const auto [first, last] = ranges.back();
+        ranges.pop_back();
+        double farthest = Tolerance;
+        qsizetype at = -1;
+        for (qsizetype i = first + 1; i < last; ++i) {
+            const QPointF way = all[last] - all[first];
+            const QPointF nearest = all[first] + NearestPart(all[i], all[first], all[last]) * way;
+            if (const double off = Distance(all[i], nearest); off > farthest) {
+                farthest = off;
+                at = i;
+            }
+        }
+        if (at < 0)
+            continue;
+        kept[static_cast<std::size_t>(at)] = true;
+        ranges.emplace_back(first, at);
+        ranges.emplace_back(at, last);
+    }
+    for (qsizetype i = 0; i < all.size(); ++i) {
+        if (kept[static_cast<std::size_t>(i)])
+            m_points.append(all[i]);
+    }
 }
 
 QPointF CPlaneLine::At(double distance) const

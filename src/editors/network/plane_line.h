@@ -21,6 +21,7 @@ public:
     void Clip(const QRectF& rect, std::vector<QPolygonF>& parts) const;
 
 private:
+    void Simplify(const QPolygonF& all);
     QPolygonF m_points;
     std::vector<double> m_along;
     std::vector<QRectF> m_boxes; // of so many segments each

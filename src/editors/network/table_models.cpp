@@ -95,6 +95,8 @@ int CBranchTable::columnCount(const QModelIndex& parent) const
 
 Qt::ItemFlags CBranchTable::flags(const QModelIndex& index) const
 {
+    if (!index.isValid())
+        return Qt::NoItemFlags;
     switch (index.column()) {
     case Vertices:
         return ReadOnly;
@@ -115,6 +117,8 @@ QVariant CBranchTable::headerData(int section, Qt::Orientation orientation, int 
 
 QVariant CBranchTable::data(const QModelIndex& index, int role) const
 {
+    if (!index.isValid())
+        return {};
     const CNetworkBranch& branch = m_document.Network().branches.at(std::size_t(index.row()));
     const bool edit = role == Qt::EditRole;
     if (role == Qt::TextAlignmentRole)
@@ -207,9 +211,9 @@ int CChannelTable::columnCount(const QModelIndex& parent) const
     return parent.isValid() ? 0 : ColumnCount;
 }
 
-Qt::ItemFlags CChannelTable::flags(const QModelIndex&) const
+Qt::ItemFlags CChannelTable::flags(const QModelIndex& index) const
 {
-    return ReadOnly | Qt::ItemIsEditable;
+    return index.isValid() ? ReadOnly | Qt::ItemIsEditable : Qt::ItemFlags(Qt::NoItemFlags);
 }
 
 QVariant CChannelTable::headerData(int section, Qt::Orientation orientation, int role) const
@@ -223,7 +227,7 @@ QVariant CChannelTable::data(const QModelIndex& index, int role) const
 {
     if (role == Qt::TextAlignmentRole)
         return int(Qt::AlignVCenter | Qt::AlignRight);
-    if (!Current() || (role != Qt::DisplayRole && role != Qt::EditRole))
+    if (!index.isValid() || !Current() || (role != Qt::DisplayRole && role != Qt::EditRole))
         return {};
     const ChannelColumn& column = ChannelAt(index.column());
     const double value = Current()->channel.at(std::size_t(index.row())).*column.value;

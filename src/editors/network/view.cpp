@@ -35,7 +35,7 @@ void CNetworkView::OnInitialUpdate()
     splitter->setStretchFactor(0, 1);
     splitter->setStretchFactor(1, 0);
     splitter->setCollapsible(0, false);
-    splitter->setSizes({700, 360}); // in proportion
+    splitter->setSizes({860, 420}); // in proportion
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(splitter);
