@@ -13,7 +13,8 @@ LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
     if (!m_map) // before the first update
         return 0;
     if (request == KsRequest::DataChanged) {
-        LocationsChanged();
+        if (!m_fetching) // an HD document that is asked may store what is being typed, and says so
+            LocationsChanged();
         return 0;
     }
     const bool known = request == KsRequest::FetchLocation || request == KsRequest::BranchNames ||
@@ -116,8 +117,10 @@ void CNetworkView::showEvent(QShowEvent* event)
 
 void CNetworkView::RefreshLocations()
 {
-    m_stale = false;
-    m_map->SetLocations(m_source->Fetch());
+    m_fetching = true;
+    auto locations = m_source->Fetch();
+    m_fetching = m_stale = false;
+    m_map->SetLocations(std::move(locations));
 }
 
 void CNetworkView::DeleteLocation()

@@ -155,7 +155,7 @@ protected:
         view->Map()->setFocus();
         return view;
     }
-    LRESULT Ask(CNetworkView* view, WPARAM request, CObList* objects) const
+    static LRESULT Ask(CNetworkView* view, WPARAM request, CObList* objects)
     {
         CKSComm_Package package;
         package.objects = objects;
@@ -181,6 +181,8 @@ protected:
     static CObList* GetData(const CString& path, CKsDoc* document)
     {
         current->log << QString("get data %1").arg(document == &current->hdDoc && path == document->GetPathName());
+        if (current->storing) // the document takes over what is being typed
+            Ask(current->storing, KsRequest::DataChanged, nullptr);
         auto list = std::make_unique<CObList>();
         list->push_back(std::make_unique<CKvrCBEText>()); // not what was asked for
         for (const CMapLocation& each : current->hdLocations) {
@@ -203,6 +205,7 @@ protected:
     QStringList boxes, log;
     std::intptr_t project = 7;
     bool hdOpen = true;
+    CNetworkView* storing = nullptr; // told of a change while data are fetched
     std::vector<CMapLocation> hdLocations{{"MAIN", 2000, HDInitialData, {}, KsUnset},
                                           {"MAIN", 5000, HDBedData, {}, KsUnset},
                                           {"MAIN", 9000, HDBedData, {}, KsUnset}, // behind the end

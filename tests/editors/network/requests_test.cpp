@@ -101,6 +101,12 @@ TEST_F(NetworkTest, LocationsAreFetchedAtTheStartAndWhenDataChange)
     ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->PlacedCount() == 3; }));
     EXPECT_EQ(log.count("get data 1"), 1);
 
+    storing = view;
+    log.clear();
+    Ask(view, KsRequest::DataChanged, nullptr);
+    QTest::qWait(250);
+    EXPECT_EQ(log.count("get data 1"), 1); // fetching does not lead to fetching
+
     hdOpen = false; // closed meanwhile
     Ask(view, KsRequest::DataChanged, nullptr);
     ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Locations().empty(); }));
