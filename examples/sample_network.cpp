@@ -180,7 +180,7 @@ std::string SampleNetworkText()
         tqlPutParam(file, "FlowsDownstream", true);
         tqlAddSection(file, "Line");
         for (std::size_t i = 0; i < river.size(); ++i) {
-            if (i % 4 == 0 || i + 1 == river.size())
+            if (i % 2 == 0 || i + 1 == river.size())
                 Numbers(file, "Vertex", {Rounded(river[i].x, 0.5), Rounded(river[i].y, 0.5)});
         }
         tqlEndSection(file);

@@ -10,7 +10,8 @@ namespace {
 constexpr double ArrowSpacing = 130, LabelSpacing = 700, LabelGap = 5; // pixels of the user
 constexpr double MaxArrows = 400, MaxLabels = 200;                     // a branch, however large the scale
 constexpr double CasingDensity = 0.02; // pixels of lines a square pixel: where they stand closer, casings hide too much
-constexpr double LeaderSpacing = 9;    // leaders are drawn while symbols of a kind are on average that far apart
+constexpr double MaxLineBoxes = 10'000;
+constexpr double LeaderSpacing = 9; // leaders are drawn while symbols of a kind are on average that far apart
 
 } // namespace
 
@@ -145,13 +146,26 @@ void CMapScene::AddArrows(const CNetwork& network)
     }
 }
 
+/// What names should not cover: symbols, and the lines themselves.
+void CMapScene::AddObstacles()
+{
+    m_obstacles = std::make_unique<Boxes>(60 * m_ratio);
+    const auto add = [this](const QPointF& at, double size) {
+        m_obstacles->Add(QRectF(at.x() - size / 2, at.y() - size / 2, size, size));
+    };
+    for (const Symbol& symbol : m_symbols)
+        add(symbol.at, SymbolSize * m_ratio);
+    const double step = std::max(10 * m_ratio, m_length / MaxLineBoxes);
+    for (const CPlaneLine& line : m_lines) {
+        for (double distance = 0; distance < line.Length(); distance += step)
+            add(line.At(distance), 4 * m_ratio);
+    }
+}
+
 void CMapScene::AddLabels()
 {
     m_labelBoxes = std::make_unique<Boxes>(120 * m_ratio);
-    m_symbolBoxes = std::make_unique<Boxes>(60 * m_ratio);
-    const double size = SymbolSize * m_ratio;
-    for (const Symbol& symbol : m_symbols)
-        m_symbolBoxes->Add(QRectF(symbol.at.x() - size / 2, symbol.at.y() - size / 2, size, size));
+    AddObstacles();
     std::vector<std::size_t> order(m_lines.size()); // long branches first: they matter most
     for (std::size_t i = 0; i < order.size(); ++i)
         order[i] = i;
@@ -167,21 +181,21 @@ void CMapScene::AddLabels()
             AddLabel(branch, (label + 0.5) * length / count, 0.3 * length / count, text);
     }
     m_labelBoxes.reset();
-    m_symbolBoxes.reset();
+    m_obstacles.reset();
 }
 
-/// Beside the line near a distance, where the line is straightest and the fewest symbols are covered; nowhere when
+/// Beside the line near a distance, where the line is straightest and the least is covered; nowhere when
 /// other names leave no room.
 void CMapScene::AddLabel(std::size_t branch, double distance, double shift, const QRectF& text)
 {
-    constexpr double symbolPrice = 12; // pixels that the name may be farther from the line to cover a symbol less
+    constexpr double obstaclePrice = 12; // pixels that the name may be farther from the line to cover a thing less
     std::optional<Label> best;
     double lowest = HUGE_VAL;
     for (const double part : {0.0, -0.25, 0.25, -0.5, 0.5, -0.75, 0.75, -1.0, 1.0}) {
         for (const double side : {1.0, -1.0}) {
             double bulge = 0;
             const Label label = LabelAt(branch, distance + part * shift, side, text, bulge);
-            const double price = bulge + symbolPrice * m_ratio * m_symbolBoxes->Count(label.box);
+            const double price = bulge + obstaclePrice * m_ratio * m_obstacles->Count(label.box);
             if (price < lowest && m_labelBoxes->Count(label.box) == 0) {
                 best = label;
                 lowest = price;
@@ -205,7 +219,7 @@ CMapScene::Label CMapScene::LabelAt(std::size_t branch, double distance, double 
         along = -along; // not upside down
     const QPointF away = side * QPointF(along.y(), -along.x());
     const QPointF foot = line.At(distance);
-    for (int step = -4; step <= 4; ++step) {
+    for (int step = -10; step <= 10; ++step) { // a winding line is longer than the text beside it
         const QPointF way = line.At(distance + step * half / 4) - foot;
         if (std::abs(QPointF::dotProduct(way, along)) <= half)
             bulge = std::max(bulge, QPointF::dotProduct(way, away));

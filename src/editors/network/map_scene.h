@@ -65,6 +65,7 @@ public:
 private:
     void AddSymbols(const std::vector<CPlacedLocation>& placed, const CMapProjection& projection);
     void AddArrows(const CNetwork& network);
+    void AddObstacles();
     void AddLabels();
     void AddLabel(std::size_t branch, double distance, double shift, const QRectF& text);
     Label LabelAt(std::size_t branch, double distance, double side, const QRectF& text, double& bulge) const;
@@ -79,5 +80,5 @@ private:
     std::vector<Symbol> m_symbols;
     const std::vector<QPainterPath>& m_texts;
     class Boxes;
-    std::unique_ptr<Boxes> m_labelBoxes, m_symbolBoxes; // while labels are placed
+    std::unique_ptr<Boxes> m_labelBoxes, m_obstacles; // while labels are placed
 };
