@@ -7,6 +7,7 @@
 #include <QImage>
 #include <QPainter>
 #include <cmath>
+#include <numbers>
 #include <random>
 
 namespace {
@@ -24,7 +25,7 @@ std::vector<CNetworkBranch> MakeBranches()
         CNetworkBranch branch;
         branch.name = QStringLiteral("RIVER %1").arg(i + 1);
         QPointF at(between(0, 100'000), between(0, 62'000));
-        double direction = between(0, 2 * M_PI);
+        double direction = between(0, 2 * std::numbers::pi);
         for (int vertex = 0; vertex < Vertices; ++vertex) {
             branch.line.push_back(at);
             direction += between(-0.35, 0.35);

@@ -8,6 +8,7 @@
 
 #include "editors/network/network.h"
 
+#include <cmath>
 #include <optional>
 
 struct CNetworkPlace

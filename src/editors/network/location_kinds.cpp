@@ -5,6 +5,7 @@
 #include <QPainterPath>
 #include <array>
 #include <cmath>
+#include <numbers>
 
 namespace {
 
@@ -18,7 +19,7 @@ QPainterPath Polygon(int corners, double turn, double inner = 1)
     QPolygonF points;
     const int count = inner < 1 ? 2 * corners : corners;
     for (int i = 0; i < count; ++i) {
-        const double angle = turn + 2 * M_PI * i / count, radius = inner < 1 && i % 2 ? inner : 1.0;
+        const double angle = turn + 2 * std::numbers::pi * i / count, radius = inner < 1 && i % 2 ? inner : 1.0;
         points << QPointF(radius * std::sin(angle), -radius * std::cos(angle));
     }
     QPainterPath path;
@@ -68,9 +69,10 @@ const std::array<KindRow, HDDataTypeCount>& Kinds()
     static const std::array<KindRow, HDDataTypeCount> rows{{
         {QT_TRANSLATE_NOOP("LocationKinds", "Initial"), 0xff0072b2, [] { return Circle(); }},
         {QT_TRANSLATE_NOOP("LocationKinds", "Wind"), 0xff56b4e9, [] { return Polygon(3, 0); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Bed resistance"), 0xffd55e00, [] { return Polygon(4, M_PI / 4); }},
+        {QT_TRANSLATE_NOOP("LocationKinds", "Bed resistance"), 0xffd55e00,
+         [] { return Polygon(4, std::numbers::pi / 4); }},
         {QT_TRANSLATE_NOOP("LocationKinds", "Wave"), 0xffcc79a7, [] { return Polygon(4, 0); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Water loss"), 0xff009e73, [] { return Polygon(3, M_PI); }},
+        {QT_TRANSLATE_NOOP("LocationKinds", "Water loss"), 0xff009e73, [] { return Polygon(3, std::numbers::pi); }},
         {QT_TRANSLATE_NOOP("LocationKinds", "Flood plain"), 0xfff0e442, [] { return Plus(); }},
         {QT_TRANSLATE_NOOP("LocationKinds", "Mixing"), 0xffe69f00, [] { return Polygon(5, 0, 0.5); }},
     }};

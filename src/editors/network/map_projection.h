@@ -5,6 +5,7 @@
 #include <QRectF>
 #include <QSizeF>
 #include <algorithm>
+#include <cmath>
 
 /// A pixel is one of the device. The plane is the whole map at the present scale; a window shows the part of it that
 /// begins at -offset. Everything drawn is computed on the plane, so that moving the window moves it as a whole.

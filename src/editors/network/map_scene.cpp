@@ -4,6 +4,7 @@
 #include <QHash>
 #include <algorithm>
 #include <cmath>
+#include <numbers>
 
 namespace {
 
@@ -227,6 +228,6 @@ CMapScene::Label CMapScene::LabelAt(std::size_t branch, double distance, double 
     const QPointF center = foot + (bulge + m_lanes + text.height() / 2 + LabelGap * m_ratio) * away;
     const double width = std::abs(along.x()) * text.width() + std::abs(along.y()) * text.height();
     const double height = std::abs(along.y()) * text.width() + std::abs(along.x()) * text.height();
-    return {branch, center, std::atan2(along.y(), along.x()) * 180 / M_PI,
+    return {branch, center, std::atan2(along.y(), along.x()) * 180 / std::numbers::pi,
             QRectF(center.x() - width / 2, center.y() - height / 2, width, height)};
 }

@@ -102,14 +102,15 @@ QTableView* CNetworkView::MakeTable(CNetworkTable* model, const char* name)
         connect(action, &QAction::triggered, this, run);
         table->addAction(action);
     }
-    // The message waits until the cell's editor has closed: it takes the focus.
+    // Both wait until the cell's editor has closed: it would commit once more to where its line stood before.
     connect(model, &CNetworkTable::Refused, this, &CNetworkView::Refused, Qt::QueuedConnection);
-    connect(model, &CNetworkTable::LineMoved, this,
-            [this, table](int row, int column) { ZoomOnTable(table, row, column); });
+    connect(
+        model, &CNetworkTable::LineMoved, this, [this, table](int row, int column) { GoToCell(table, row, column); },
+        Qt::QueuedConnection);
     return table;
 }
 
-void CNetworkView::ZoomOnTable(QTableView* table, int row, int column) const
+void CNetworkView::GoToCell(QTableView* table, int row, int column) const
 {
     const QModelIndex at = table->model()->index(row, column);
     table->setCurrentIndex(at);
@@ -148,7 +149,7 @@ void CNetworkView::InsertLine()
     const int row = m_channelTable->InsertLine(m_channel->currentIndex().row());
     if (row < 0)
         return;
-    ZoomOnTable(m_channel, row, CChannelTable::Chainage);
+    GoToCell(m_channel, row, CChannelTable::Chainage);
     m_channel->setFocus();
 }
 

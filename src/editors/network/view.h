@@ -61,7 +61,7 @@ private:
     void DeleteLocation();
     void InsertLine();
     void DeleteLines();
-    void ZoomOnTable(QTableView* table, int row, int column) const;
+    void GoToCell(QTableView* table, int row, int column) const;
     void AskForImport();
     void Refused(const QString& message);
 

@@ -126,7 +126,8 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     QTest::keyClick(editor, Qt::Key_Enter);
     QCoreApplication::processEvents(); // the editor commits later
     EXPECT_EQ(chainages(), "2000 4000 6000 7000");
-    EXPECT_EQ(channel->currentIndex().row(), 3);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return channel->currentIndex().row() == 3; }));
+    EXPECT_TRUE(boxes.isEmpty()) << boxes.join(';').toStdString();
     QTest::keyClick(channel, Qt::Key_Insert); // towards the branch's end
     EXPECT_EQ(chainages(), "2000 4000 6000 7000 7500");
     channel->selectRow(0);
