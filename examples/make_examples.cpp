@@ -3,6 +3,7 @@
 //   make_examples --locations N FILE
 #include "data/hd_file.h"
 #include "data/utf8_path.h"
+#include "sample_network.h"
 #include "sample_river.h"
 
 #include <charconv>
@@ -33,7 +34,8 @@ int WriteProject(const std::string& folder)
 {
     std::error_code error;
     std::filesystem::create_directories(PathFromUtf8(folder), error);
-    const int failed = Outcome(SaveHDFile(SampleRiver(), folder + "/river.hdkv"));
+    int failed = Outcome(SaveHDFile(SampleRiver(), folder + "/river.hdkv"));
+    failed = failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvnw", SampleNetworkText()));
     return failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvrp", ProjectText("river.hdkv")));
 }
 

@@ -1,0 +1,33 @@
+// The document of an editor that takes part in projects: joins and leaves them, tells the others of changes, asks them.
+#pragma once
+
+#include "ks/fc/doc.h"
+#include "ks/fc/package.h"
+
+class CProjectDoc : public CKsDoc
+{
+    Q_OBJECT
+public:
+    /// `kind`: what the editor's packages call themselves.
+    explicit CProjectDoc(int kind) : m_kind(kind) {}
+
+    /// Joins the project that the document's file is a member of; false when there is none.
+    bool JoinProject(CView* view);
+    void LeaveProject(CView* view);
+    /// Tells the other editors of the project that data changed.
+    void DataChanged() const;
+    std::intptr_t ProjectHandle() const { return m_project; }
+
+    /// Sends a request to the shell's switchboard, which answers into `objects`; 0 outside a project.
+    LRESULT AskProject(WPARAM request, CView* view, CObList* objects) const;
+    /// Sends a request with `objects` to one view of another editor.
+    LRESULT AskView(CView* receiver, WPARAM request, CView* sender, CObList* objects) const;
+    /// The views of the project's other documents, for the duration of the present event.
+    std::vector<CView*> ProjectViews(CView* view) const;
+
+private:
+    CKSComm_Package Package(CView* view, CObList* objects) const;
+
+    int m_kind;
+    std::intptr_t m_project = 0;
+};

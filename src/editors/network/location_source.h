@@ -1,0 +1,32 @@
+// The locations of the HD documents of the project, and requests about them. No address outlives a call: documents are
+// known by their paths, and their views are asked for anew each time.
+#pragma once
+
+#include "editors/network/document.h"
+#include "editors/network/location_kinds.h"
+
+class CLocationSource
+{
+public:
+    /// `view` asks in the name of `document`; both outlive this.
+    CLocationSource(const CNetworkDoc& document, CView& view) : m_document(document), m_view(view) {}
+
+    /// Copies the locations of every open HD document of the project; of none when their editor is not there.
+    std::vector<CMapLocation> Fetch() const;
+    /// Paths of the open HD documents.
+    QStringList Files() const;
+
+    // Each does nothing when the HD document has been closed.
+    void Delete(const CMapLocation& location) const;
+    void Insert(const CMapLocation& location) const;
+    /// Brings the location's line forward in its document.
+    void Show(const CMapLocation& location) const;
+
+private:
+    std::vector<CView*> HDViews() const;
+    CView* FindView(const QString& file) const;
+    void Send(WPARAM request, const CMapLocation& location) const;
+
+    const CNetworkDoc& m_document;
+    CView& m_view;
+};

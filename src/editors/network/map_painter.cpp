@@ -1,0 +1,112 @@
+#include "editors/network/map_painter.h"
+
+#include <cmath>
+
+namespace {
+// Pixels of the user.
+constexpr double LineWidth = 2.2, CurrentWidth = 3.6, Casing = 2.5, HaloWidth = 2.5, ArrowSize = 7.5;
+} // namespace
+
+CMapPainter::CMapPainter(const CMapScene& scene, const CMapStyle& style, int currentBranch)
+    : m_scene(scene), m_style(style), m_currentBranch(currentBranch)
+{
+    for (int kind = 0; kind < HDDataTypeCount; ++kind)
+        m_symbols[std::size_t(kind)] = LocationKindSymbol(kind, CMapScene::SymbolSize * scene.Ratio(), style.outline);
+}
+
+void CMapPainter::Paint(QPainter& painter, const QRect& part, const QPoint& offset) const
+{
+    painter.save();
+    painter.setClipRect(part);
+    painter.fillRect(part, m_style.ground);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.translate(offset);
+    const QRectF plane = QRectF(part).translated(-offset);
+    PaintLines(painter, plane);
+    PaintArrows(painter, plane);
+    PaintSymbols(painter, plane);
+    PaintLabels(painter, plane);
+    painter.restore();
+}
+
+void CMapPainter::PaintLines(QPainter& painter, const QRectF& part) const
+{
+    const double ratio = m_scene.Ratio(), reach = (CurrentWidth + Casing) * ratio;
+    const QRectF near = part.adjusted(-reach, -reach, reach, reach);
+    const auto& lines = m_scene.Lines();
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        std::vector<QPolygonF> parts;
+        lines[i].Clip(near, parts);
+        const bool current = static_cast<int>(i) == m_currentBranch;
+        const double width = current ? CurrentWidth : LineWidth;
+        // The ground's colour around a line shows which of two crossing branches is above.
+        for (const auto& [colour, extra] :
+             {std::pair(m_style.ground, Casing), std::pair(current ? m_style.chosen : m_style.water, 0.0)}) {
+            const bool casing = extra > 0;
+            if (casing && !m_scene.HasCasings())
+                continue;
+            painter.setPen(QPen(colour, (width + extra) * ratio, Qt::SolidLine, casing ? Qt::FlatCap : Qt::RoundCap,
+                                casing ? Qt::BevelJoin : Qt::RoundJoin));
+            for (const QPolygonF& each : parts)
+                painter.drawPolyline(each);
+        }
+    }
+}
+
+void CMapPainter::PaintArrows(QPainter& painter, const QRectF& part) const
+{
+    const double size = ArrowSize * m_scene.Ratio();
+    const QRectF near = part.adjusted(-size, -size, size, size);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(m_style.dark ? m_style.water.lighter(125) : m_style.water.darker(160));
+    for (const CMapScene::Arrow& arrow : m_scene.Arrows()) {
+        if (!near.contains(arrow.at))
+            continue;
+        const QPointF along = size * arrow.direction, across(-along.y(), along.x());
+        const QPointF corners[] = {arrow.at + along, arrow.at - 0.7 * along + 0.75 * across, arrow.at - 0.3 * along,
+                                   arrow.at - 0.7 * along - 0.75 * across};
+        painter.drawPolygon(corners, 4);
+    }
+}
+
+void CMapPainter::PaintSymbols(QPainter& painter, const QRectF& part) const
+{
+    const double size = CMapScene::SymbolSize * m_scene.Ratio(), lanes = 8 * CMapScene::LaneWidth * m_scene.Ratio();
+    if (m_scene.HasLeaders()) {
+        const QRectF near = part.adjusted(-lanes, -lanes, lanes, lanes);
+        painter.setPen(QPen(m_style.muted, 0.8 * m_scene.Ratio()));
+        for (const CMapScene::Symbol& symbol : m_scene.Symbols()) {
+            if (near.contains(symbol.at))
+                painter.drawLine(symbol.foot, symbol.at);
+        }
+    }
+    const QRectF near = part.adjusted(-size, -size, size, size);
+    for (const CMapScene::Symbol& symbol : m_scene.Symbols()) {
+        if (!near.contains(symbol.at))
+            continue;
+        // On whole pixels, so that it looks the same wherever it is.
+        const QPixmap& pixmap = m_symbols[std::size_t(symbol.kind)];
+        painter.drawPixmap(static_cast<int>(std::floor(symbol.at.x() - pixmap.width() / 2.0 + 0.5)),
+                           static_cast<int>(std::floor(symbol.at.y() - pixmap.height() / 2.0 + 0.5)), pixmap);
+    }
+}
+
+void CMapPainter::PaintLabels(QPainter& painter, const QRectF& part) const
+{
+    const double halo = HaloWidth * m_scene.Ratio();
+    const QRectF near = part.adjusted(-halo, -halo, halo, halo);
+    for (const CMapScene::Label& label : m_scene.Labels()) {
+        if (!near.intersects(label.box))
+            continue;
+        const QPainterPath& text = m_scene.Text(label.branch);
+        const bool current = static_cast<int>(label.branch) == m_currentBranch;
+        painter.save();
+        painter.translate(label.center);
+        painter.rotate(label.angle);
+        painter.setPen(Qt::NoPen);
+        painter.setBrush(m_style.Ground(190)); // keeps the name legible on whatever is under it
+        painter.drawRoundedRect(text.boundingRect().adjusted(-halo, -halo, halo, halo), halo, halo);
+        painter.fillPath(text, current ? m_style.chosen : m_style.text);
+        painter.restore();
+    }
+}

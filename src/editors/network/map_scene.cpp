@@ -1,0 +1,233 @@
+#include "editors/network/map_scene.h"
+
+#include <QFontMetricsF>
+#include <QHash>
+#include <algorithm>
+#include <cmath>
+#include <numbers>
+
+namespace {
+
+constexpr double ArrowSpacing = 130, LabelSpacing = 700, LabelGap = 5; // pixels of the user
+constexpr double MaxArrows = 400, MaxLabels = 200;                     // a branch, however large the scale
+constexpr double CasingDensity = 0.02; // pixels of lines a square pixel: where they stand closer, casings hide too much
+constexpr double MaxLineBoxes = 10'000;
+constexpr double LeaderSpacing = 9; // leaders are drawn while symbols of a kind are on average that far apart
+
+} // namespace
+
+std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const std::vector<CMapLocation>& locations)
+{
+    const CNetwork& network = document.Network();
+    QHash<QString, int> branches;
+    for (std::size_t i = 0; i < network.branches.size(); ++i)
+        branches.insert(network.branches[i].name, static_cast<int>(i));
+    std::vector<CPlacedLocation> placed;
+    placed.reserve(locations.size());
+    for (std::size_t i = 0; i < locations.size(); ++i) {
+        const CMapLocation& location = locations[i];
+        const int branch = branches.value(location.branch, -1);
+        const auto point = document.Reference().PointAt(branch, location.chainage);
+        if (!point)
+            continue;
+        const CNetworkBranch& on = network.branches[static_cast<std::size_t>(branch)];
+        placed.push_back({i, location.kind, branch, (location.chainage - on.start) / (on.end - on.start), *point});
+    }
+    std::stable_sort(placed.begin(), placed.end(), [](const auto& a, const auto& b) { return a.kind < b.kind; });
+    return placed;
+}
+
+std::vector<QPainterPath> NameOutlines(const CNetwork& network, const QFont& font, double ratio)
+{
+    std::vector<QPainterPath> outlines;
+    outlines.reserve(network.branches.size());
+    for (const CNetworkBranch& branch : network.branches) {
+        QPainterPath text;
+        text.addText(0, 0, font, branch.name);
+        outlines.push_back(QTransform::fromScale(ratio, ratio).map(text));
+        outlines.back().translate(-outlines.back().boundingRect().center());
+    }
+    return outlines;
+}
+
+/// Counts what a rectangle would cover, by cells.
+class CMapScene::Boxes
+{
+public:
+    explicit Boxes(double cell) : m_cell(cell) {}
+    void Add(const QRectF& box)
+    {
+        ForCells(box, [&](const Cell& cell) { m_boxes[cell].push_back(box); });
+    }
+    /// A box that reaches over several cells may count more than once.
+    int Count(const QRectF& box) const
+    {
+        int count = 0;
+        ForCells(box, [&](const Cell& cell) {
+            const auto found = m_boxes.constFind(cell);
+            if (found != m_boxes.constEnd())
+                count += static_cast<int>(std::count_if(found->begin(), found->end(),
+                                                        [&](const QRectF& each) { return each.intersects(box); }));
+        });
+        return count;
+    }
+
+private:
+    using Cell = std::pair<int, int>;
+    template <typename Action>
+    void ForCells(const QRectF& box, Action action) const
+    {
+        const auto cell = [this](double value) { return static_cast<int>(std::floor(value / m_cell)); };
+        for (int x = cell(box.left()); x <= cell(box.right()); ++x) {
+            for (int y = cell(box.top()); y <= cell(box.bottom()); ++y)
+                action(Cell(x, y));
+        }
+    }
+    double m_cell;
+    QHash<Cell, std::vector<QRectF>> m_boxes;
+};
+
+CMapScene::~CMapScene() = default;
+
+CMapScene::CMapScene(const CNetwork& network, const std::vector<CPlacedLocation>& placed,
+                     const CMapProjection& projection, const std::vector<QPainterPath>& names, double ratio)
+    : m_ratio(ratio), m_texts(names)
+{
+    m_lines.reserve(network.branches.size());
+    for (const CNetworkBranch& branch : network.branches)
+        m_lines.emplace_back(branch.line, projection);
+    for (const CPlaneLine& line : m_lines)
+        m_length += line.Length();
+    const QSizeF extent = network.Extent().size() * projection.scale / ratio;
+    m_casings = m_lines.size() < 20 || m_length / ratio < CasingDensity * extent.width() * extent.height();
+    AddSymbols(placed, projection);
+    AddArrows(network);
+    AddLabels();
+}
+
+/// Every kind that is there has a lane of its own beside the branch, so that kinds do not hide each other.
+void CMapScene::AddSymbols(const std::vector<CPlacedLocation>& placed, const CMapProjection& projection)
+{
+    std::array<int, HDDataTypeCount> counts{};
+    for (const CPlacedLocation& each : placed)
+        ++counts.at(static_cast<std::size_t>(each.kind));
+    std::array<double, HDDataTypeCount> offsets{};
+    const auto kinds =
+        static_cast<int>(std::count_if(counts.begin(), counts.end(), [](int count) { return count > 0; }));
+    int lane = 0;
+    for (std::size_t kind = 0; kind < counts.size(); ++kind) {
+        if (counts[kind] > 0)
+            offsets[kind] = (lane++ - (kinds - 1) / 2.0) * LaneWidth * m_ratio;
+    }
+    m_lanes = kinds > 0 ? (kinds - 1) / 2.0 * LaneWidth * m_ratio + SymbolSize / 2 * m_ratio : 0;
+    m_leaders = kinds > 1 && m_length * kinds > LeaderSpacing * m_ratio * static_cast<double>(placed.size());
+
+    m_symbols.reserve(placed.size());
+    for (const CPlacedLocation& each : placed) {
+        const CPlaneLine& line = m_lines[static_cast<std::size_t>(each.branch)];
+        const double distance = each.part * line.Length();
+        const QPointF direction = line.Direction(distance, 2 * m_lanes + m_ratio);
+        const QPointF normal(-direction.y(), direction.x());
+        const QPointF foot = projection.ToPlane(each.map);
+        m_symbols.push_back(
+            {foot, foot + offsets[static_cast<std::size_t>(each.kind)] * normal, each.kind, each.location});
+    }
+}
+
+void CMapScene::AddArrows(const CNetwork& network)
+{
+    for (std::size_t i = 0; i < m_lines.size(); ++i) {
+        const CPlaneLine& line = m_lines[i];
+        const double count = std::min(std::floor(line.Length() / (ArrowSpacing * m_ratio)), MaxArrows);
+        for (double arrow = 0; arrow < count; ++arrow) {
+            const double distance = (arrow + 0.5) * line.Length() / count;
+            const QPointF along = line.Direction(distance, 5 * m_ratio);
+            m_arrows.push_back({line.At(distance), network.branches[i].FlowsAlongLine() ? along : -along});
+        }
+    }
+}
+
+/// What names should not cover: symbols, and the lines themselves.
+void CMapScene::AddObstacles()
+{
+    m_obstacles = std::make_unique<Boxes>(60 * m_ratio);
+    const auto add = [this](const QPointF& at, double size) {
+        m_obstacles->Add(QRectF(at.x() - size / 2, at.y() - size / 2, size, size));
+    };
+    for (const Symbol& symbol : m_symbols)
+        add(symbol.at, SymbolSize * m_ratio);
+    const double step = std::max(10 * m_ratio, m_length / MaxLineBoxes);
+    for (const CPlaneLine& line : m_lines) {
+        for (double distance = 0; distance < line.Length(); distance += step)
+            add(line.At(distance), 4 * m_ratio);
+    }
+}
+
+void CMapScene::AddLabels()
+{
+    m_labelBoxes = std::make_unique<Boxes>(120 * m_ratio);
+    AddObstacles();
+    std::vector<std::size_t> order(m_lines.size()); // long branches first: they matter most
+    for (std::size_t i = 0; i < order.size(); ++i)
+        order[i] = i;
+    std::stable_sort(order.begin(), order.end(),
+                     [this](std::size_t a, std::size_t b) { return m_lines[a].Length() > m_lines[b].Length(); });
+    for (const std::size_t branch : order) {
+        const double length = m_lines[branch].Length();
+        const QRectF text = m_texts[branch].boundingRect();
+        if (m_lines[branch].IsEmpty() || length < 0.8 * text.width())
+            continue;
+        const double count = std::clamp(std::floor(length / (LabelSpacing * m_ratio)), 1.0, MaxLabels);
+        for (double label = 0; label < count; ++label)
+            AddLabel(branch, (label + 0.5) * length / count, 0.3 * length / count, text);
+    }
+    m_labelBoxes.reset();
+    m_obstacles.reset();
+}
+
+/// Beside the line near a distance, where the line is straightest and the least is covered; nowhere when
+/// other names leave no room.
+void CMapScene::AddLabel(std::size_t branch, double distance, double shift, const QRectF& text)
+{
+    constexpr double obstaclePrice = 12; // pixels that the name may be farther from the line to cover a thing less
+    std::optional<Label> best;
+    double lowest = HUGE_VAL;
+    for (const double part : {0.0, -0.25, 0.25, -0.5, 0.5, -0.75, 0.75, -1.0, 1.0}) {
+        for (const double side : {1.0, -1.0}) {
+            double bulge = 0;
+            const Label label = LabelAt(branch, distance + part * shift, side, text, bulge);
+            const double price = bulge + obstaclePrice * m_ratio * m_obstacles->Count(label.box);
+            if (price < lowest && m_labelBoxes->Count(label.box) == 0) {
+                best = label;
+                lowest = price;
+            }
+        }
+    }
+    if (!best)
+        return;
+    m_labelBoxes->Add(best->box);
+    m_labels.push_back(*best);
+}
+
+/// `side` 1 is above the line, -1 below. `bulge`: how far the line comes towards the text.
+CMapScene::Label CMapScene::LabelAt(std::size_t branch, double distance, double side, const QRectF& text,
+                                    double& bulge) const
+{
+    const CPlaneLine& line = m_lines[branch];
+    const double half = text.width() / 2;
+    QPointF along = line.Direction(distance, half);
+    if (along.x() < 0 || (along.x() == 0 && along.y() > 0))
+        along = -along; // not upside down
+    const QPointF away = side * QPointF(along.y(), -along.x());
+    const QPointF foot = line.At(distance);
+    for (int step = -10; step <= 10; ++step) { // a winding line is longer than the text beside it
+        const QPointF way = line.At(distance + step * half / 4) - foot;
+        if (std::abs(QPointF::dotProduct(way, along)) <= half)
+            bulge = std::max(bulge, QPointF::dotProduct(way, away));
+    }
+    const QPointF center = foot + (bulge + m_lanes + text.height() / 2 + LabelGap * m_ratio) * away;
+    const double width = std::abs(along.x()) * text.width() + std::abs(along.y()) * text.height();
+    const double height = std::abs(along.y()) * text.width() + std::abs(along.x()) * text.height();
+    return {branch, center, std::atan2(along.y(), along.x()) * 180 / std::numbers::pi,
+            QRectF(center.x() - width / 2, center.y() - height / 2, width, height)};
+}

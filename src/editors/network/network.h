@@ -1,0 +1,50 @@
+// The river network: branches with their course on the map and the channel along them.
+#pragma once
+
+#include "editors/common/parameter_file.h"
+#include "ks/fc/exchange.h"
+
+#include <QPointF>
+#include <QRectF>
+#include <QString>
+#include <vector>
+
+/// The channel at a place of a branch. Metres; KsUnset for what is not known.
+struct CChannelRow
+{
+    double chainage = 0;
+    double radius = KsUnset; // of curvature
+    double width = KsUnset;  // of the water surface
+};
+
+struct CNetworkBranch
+{
+    QString name;
+    double start = 0, end = 0;        // chainages of the first and the last vertex, metres; they differ
+    bool downstream = true;           // water flows towards increasing chainage
+    std::vector<QPointF> line;        // map coordinates, metres: x to the east, y to the north
+    std::vector<CChannelRow> channel; // by increasing chainage
+    CKeptSection kept;                // what the file says beyond that
+
+    /// Whether water flows from the first vertex to the last.
+    bool FlowsAlongLine() const { return downstream == (end >= start); }
+    /// Metres along the line.
+    double Length() const;
+    void SortChannel();
+};
+
+struct CNetwork
+{
+    std::vector<CNetworkBranch> branches;
+    std::vector<CKeptSection> keptTargets;
+    CKeptSection kept; // of the network's own target
+
+    /// -1 for none. Names are compared exactly, as in the HD parameters.
+    int FindBranch(const QString& name) const;
+    /// Around all vertices; null without any.
+    QRectF Extent() const;
+};
+
+/// A value of the channel at a chainage: between the nearest rows that have it, in proportion to the distance. KsUnset
+/// outside the rows that have it: nothing is extrapolated.
+double ChannelValue(const std::vector<CChannelRow>& channel, double CChannelRow::*value, double chainage);

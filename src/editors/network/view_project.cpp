@@ -1,0 +1,174 @@
+// The network's view among other editors: what it answers them, and the locations it gets from the HD documents.
+#include "editors/network/view.h"
+
+#include <QFileInfo>
+#include <QMenu>
+#include <QTableView>
+#include <cmath>
+
+// ---- requests ----------------------------------------------------------------------------------
+
+LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
+{
+    if (!m_map) // before the first update
+        return 0;
+    if (request == KsRequest::DataChanged) {
+        if (!m_fetching) // an HD document that is asked may store what is being typed, and says so
+            LocationsChanged();
+        return 0;
+    }
+    const bool known = request == KsRequest::FetchLocation || request == KsRequest::BranchNames ||
+                       request == KsRequest::LoadLocationsAndChannel || request == KsRequest::LocationShown;
+    if (!known)
+        return CProjectView::OnRequest(request, package);
+    if (!package.objects) {
+        qDebug("network: request %llu without a list", static_cast<unsigned long long>(request));
+        return 0;
+    }
+    switch (request) {
+    case KsRequest::FetchLocation:
+        return FetchLocation(*package.objects);
+    case KsRequest::BranchNames:
+        return BranchNames(*package.objects);
+    case KsRequest::LoadLocationsAndChannel:
+        return FillChannel(*package.objects);
+    default:
+        return ShowLocation(*package.objects);
+    }
+}
+
+LRESULT CNetworkView::FetchLocation(CObList& objects) const
+{
+    const auto picked = m_map->Picked();
+    if (!picked)
+        return 0;
+    auto item = std::make_unique<CKvrCBELocation>();
+    item->branch = picked->branch;
+    item->chainage = picked->chainage;
+    objects.push_back(std::move(item));
+    return 1;
+}
+
+LRESULT CNetworkView::BranchNames(CObList& objects) const
+{
+    for (const CNetworkBranch& branch : Document()->Network().branches) {
+        auto item = std::make_unique<CKvrCBEText>();
+        item->text = branch.name;
+        objects.push_back(std::move(item));
+    }
+    return !Document()->Network().branches.empty();
+}
+
+/// Radius and width where the list lacks them and the tables have them.
+LRESULT CNetworkView::FillChannel(const CObList& objects) const
+{
+    const CNetwork& network = Document()->Network();
+    bool filled = false;
+    for (const auto& object : objects) {
+        auto* item = dynamic_cast<CKvrCBELocation*>(object.get());
+        const int branch = item ? network.FindBranch(item->branch) : -1;
+        if (branch < 0)
+            continue;
+        const auto& channel = network.branches[std::size_t(branch)].channel;
+        for (const auto& [to, from] : {std::pair(&CKvrCBELocation::radius, &CChannelRow::radius),
+                                       std::pair(&CKvrCBELocation::width, &CChannelRow::width)}) {
+            if (!std::isnan(item->*to))
+                continue;
+            item->*to = ChannelValue(channel, from, item->chainage);
+            filled = filled || !std::isnan(item->*to);
+        }
+    }
+    return filled;
+}
+
+LRESULT CNetworkView::ShowLocation(const CObList& objects)
+{
+    const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
+    if (item)
+        m_map->ShowPlace({item->branch, item->chainage});
+    return 0;
+}
+
+void CNetworkView::OnProjectsChanged()
+{
+    if (!m_map)
+        return;
+    if (!Document()->ProjectHandle())
+        Document()->JoinProject(this);
+    LocationsChanged();
+}
+
+// ---- locations ---------------------------------------------------------------------------------
+
+/// They are fetched soon, but not within the message that tells of the change: its sender is busy.
+void CNetworkView::LocationsChanged()
+{
+    m_stale = true;
+    if (isVisible())
+        m_refresh.start();
+}
+
+void CNetworkView::showEvent(QShowEvent* event)
+{
+    CProjectView::showEvent(event);
+    if (m_stale && m_map)
+        m_refresh.start();
+}
+
+void CNetworkView::RefreshLocations()
+{
+    m_fetching = true;
+    auto locations = m_source->Fetch();
+    m_fetching = m_stale = false;
+    m_map->SetLocations(std::move(locations));
+}
+
+void CNetworkView::DeleteLocation()
+{
+    if (!m_map->Selected())
+        return;
+    const CMapLocation location = *m_map->Selected(); // the map's own list may change meanwhile
+    m_source->Delete(location);
+    LocationsChanged();
+}
+
+/// The table follows the map.
+void CNetworkView::PickedChanged()
+{
+    const auto picked = m_map->Picked();
+    const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
+    if (branch >= 0 && branch != m_branches->currentIndex().row())
+        m_branches->setCurrentIndex(m_branchTable->index(branch, 0));
+}
+
+std::unique_ptr<QMenu> CNetworkView::MapMenu()
+{
+    auto menu = std::make_unique<QMenu>(this);
+    if (m_map->Selected()) {
+        const CMapLocation location = *m_map->Selected();
+        connect(menu->addAction(tr("&Show in HD Parameters")), &QAction::triggered, this,
+                [this, location] { m_source->Show(location); });
+        QAction* remove = menu->addAction(tr("&Delete Location"));
+        remove->setShortcut(Qt::Key_Delete);
+        connect(remove, &QAction::triggered, this, &CNetworkView::DeleteLocation);
+        menu->addSeparator();
+    }
+    const auto picked = m_map->Picked();
+    const QStringList files = picked ? m_source->Files() : QStringList();
+    if (files.isEmpty())
+        return menu;
+    QMenu* insert = menu->addMenu(tr("&Insert Here as"));
+    for (int kind = 0; kind < HDDataTypeCount; ++kind) {
+        // With one HD document there is nothing to choose.
+        QMenu* among = files.size() > 1 ? insert->addMenu(LocationKindName(kind)) : insert;
+        for (const QString& file : files) {
+            const CMapLocation location{picked->branch, picked->chainage, kind, file, KsUnset};
+            QAction* action = among->addAction(files.size() > 1 ? QFileInfo(file).fileName() : LocationKindName(kind));
+            connect(action, &QAction::triggered, this, [this, location] {
+                m_source->Insert(location);
+                LocationsChanged();
+            });
+        }
+    }
+    return menu;
+}

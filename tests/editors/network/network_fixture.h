@@ -1,0 +1,218 @@
+// A small network, a shell that answers its requests, and a document of HD parameters that only looks like one.
+#pragma once
+
+#include "editors/network/module.h"
+#include "editors/network/view.h"
+#include "ks/fc/doc_template.h"
+#include "ks/fc/exports.h"
+#include "ks/fc/file_dialog.h"
+#include "ks/fc/hd_messages.h"
+#include "ks/fc/message_box.h"
+#include "ks/units/edit_style.h"
+
+#include <QFile>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QUndoStack>
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+/// MAIN goes 3000 m to the east and 4000 m to the north, its chainages from 1000 to 8000; SIDE joins it from the south,
+/// digitised from its mouth up.
+inline constexpr const char* SmallNetwork = R"([KVR_NETWORK]
+  Survey = "2019", 3   // unknown to the editor
+  [Branch]
+    Name = "MAIN"
+    Chainage = 1000, 8000
+    FlowsDownstream = true
+    Owner = <C:\\data\\owner.txt>
+    [Line]
+      Vertex = 0, 0
+      Vertex = 3000, 0
+      Vertex = 3000, 4000
+    [/Line]
+    [Channel]
+      DATA = 2000, 400, 30
+      DATA = 4000, nan, 50
+      DATA = 6000, 800, nan
+    [/Channel]
+    [Bridges]
+      At = 2500, "RAILWAY"
+      [Piers]
+        Count = 2
+      [/Piers]
+    [/Bridges]
+  [/Branch]
+  [Branch]
+    Name = "SIDE"
+    Chainage = 500, 0
+    FlowsDownstream = true
+    [Line]
+      Vertex = 3000, 0
+      Vertex = 3000, -1000
+    [/Line]
+    [Channel]
+    [/Channel]
+  [/Branch]
+[/KVR_NETWORK]
+[OTHER_PROGRAM]
+  Colour = 7
+[/OTHER_PROGRAM]
+)";
+
+class FakeHDDoc : public CKsDoc
+{
+public:
+    BOOL OnSaveDocument(const CString&) override { return false; }
+};
+
+class FakeHDView : public CView
+{
+public:
+    LRESULT WindowProc(unsigned message, WPARAM request, LPARAM lParam) override
+    {
+        const auto* package = reinterpret_cast<const CKSComm_Package*>(lParam);
+        const auto* item = dynamic_cast<const CKvr_CBE_ModelDataItem*>(package->objects->front().get());
+        requests << QString("%1 %2 %3 %4 from %5")
+                        .arg(message == KsMessage::BetweenEditors() ? int(request) : -1)
+                        .arg(item->branch)
+                        .arg(item->chainage)
+                        .arg(item->type)
+                        .arg(package->view ? package->view->objectName() : QString("nobody"));
+        return 0;
+    }
+    QStringList requests;
+};
+
+class NetworkTest : public testing::Test, public CKsWindow
+{
+protected:
+    NetworkTest()
+    {
+        KsSetMainWindow(this);
+        KsSetMessageBoxHandler([this](const CString& text, QMessageBox::StandardButtons) {
+            boxes << text;
+            return QMessageBox::Ok;
+        });
+        hdDoc.SetPathName(folder.filePath("river.HDKV"));
+        hdDoc.AddView(&hdView);
+        current = this;
+        KsAddExports([](const char* name) -> QFunctionPointer {
+            if (qstrcmp(name, "KvrMSGGetData") == 0)
+                return reinterpret_cast<QFunctionPointer>(&GetData);
+            return qstrcmp(name, "KvrMSGSelectData") == 0 ? reinterpret_cast<QFunctionPointer>(&SelectData) : nullptr;
+        });
+    }
+    ~NetworkTest() override
+    {
+        KsClearExports();
+        frame.reset();
+        KsSetMessageBoxHandler({});
+        KsSetFileDialogHandler({});
+        KsSetMainWindow(nullptr);
+        KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    }
+
+    LRESULT WindowProc(unsigned message, WPARAM request, LPARAM lParam) override
+    {
+        auto* package = reinterpret_cast<CKSComm_Package*>(lParam);
+        log << QString("%1 %2").arg(message == KsMessage::SwitchBoard() ? "shell" : "others").arg(request);
+        if (message != KsMessage::SwitchBoard())
+            return 0;
+        if (request == KsRequest::ProjectViews && package->objects && hdOpen) {
+            auto item = std::make_unique<CKvrCBEView>();
+            item->view = &hdView;
+            package->objects->push_back(std::move(item));
+        }
+        return request == KsRequest::JoinProject ? project : 0;
+    }
+
+    QString Write(const QString& name, const QByteArray& text) const
+    {
+        QFile file(folder.filePath(name));
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(text);
+        return file.fileName();
+    }
+    static QByteArray Read(const QString& path)
+    {
+        QFile file(path);
+        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
+    }
+
+    /// Opens the small network in a window.
+    CNetworkView* Open(const QByteArray& text = SmallNetwork)
+    {
+        frame = std::make_unique<CKsMDIFrameWnd>();
+        frame->resize(900, 600);
+        frame->show();
+        documents.reset(NetworkModule::CreateTemplate());
+        auto* document = documents->OpenDocumentFile(frame.get(), Write("river.kvnw", text));
+        if (!document)
+            return nullptr;
+        EXPECT_TRUE(QTest::qWaitForWindowActive(frame.get()));
+        auto* view = static_cast<CNetworkView*>(document->Views().at(0));
+        view->Map()->setFocus();
+        return view;
+    }
+    static LRESULT Ask(CNetworkView* view, WPARAM request, CObList* objects)
+    {
+        CKSComm_Package package;
+        package.objects = objects;
+        return KsSendMessage(view, KsMessage::BetweenEditors(), request, reinterpret_cast<LPARAM>(&package));
+    }
+    static std::unique_ptr<CKvrCBELocation> Location(const char* branch, double chainage)
+    {
+        auto item = std::make_unique<CKvrCBELocation>();
+        item->branch = branch;
+        item->chainage = chainage;
+        return item;
+    }
+    static void Click(CNetworkMap* map, const std::optional<QPointF>& at, const QPoint& off = {})
+    {
+        ASSERT_TRUE(at.has_value());
+        QTest::mouseClick(map, Qt::LeftButton, Qt::NoModifier, at->toPoint() + off);
+    }
+    QPointF PointOf(CNetworkMap* map, const char* branch, double chainage) const
+    {
+        return map->WindowPoint({branch, chainage}).value_or(QPointF(-1, -1));
+    }
+
+    static CObList* GetData(const CString& path, CKsDoc* document)
+    {
+        current->log << QString("get data %1").arg(document == &current->hdDoc && path == document->GetPathName());
+        if (current->storing) // the document takes over what is being typed
+            Ask(current->storing, KsRequest::DataChanged, nullptr);
+        auto list = std::make_unique<CObList>();
+        list->push_back(std::make_unique<CKvrCBEText>()); // not what was asked for
+        for (const CMapLocation& each : current->hdLocations) {
+            auto item = std::make_unique<CKvr_CBE_ModelDataItem>();
+            item->branch = each.branch;
+            item->chainage = each.chainage;
+            item->type = each.kind;
+            list->push_back(std::move(item));
+        }
+        return list.release();
+    }
+    static void SelectData(const CString&, CView* view, CObList* items)
+    {
+        const auto* item = dynamic_cast<const CKvr_CBE_ModelDataItem*>(items->front().get());
+        current->log << QString("select %1 %2 %3").arg(view == &current->hdView).arg(item->branch).arg(item->chainage);
+    }
+
+    inline static NetworkTest* current = nullptr;
+    QTemporaryDir folder;
+    QStringList boxes, log;
+    std::intptr_t project = 7;
+    bool hdOpen = true;
+    CNetworkView* storing = nullptr; // told of a change while data are fetched
+    std::vector<CMapLocation> hdLocations{{"MAIN", 2000, HDInitialData, {}, KsUnset},
+                                          {"MAIN", 5000, HDBedData, {}, KsUnset},
+                                          {"MAIN", 9000, HDBedData, {}, KsUnset}, // behind the end
+                                          {"LOST", 100, HDWindData, {}, KsUnset},
+                                          {"SIDE", 250, HDDataTypeCount, {}, KsUnset}}; // no such kind
+    FakeHDDoc hdDoc;
+    FakeHDView hdView; // goes before its document
+    std::unique_ptr<CMultiDocTemplate> documents;
+    std::unique_ptr<CKsMDIFrameWnd> frame;
+};
