@@ -35,6 +35,16 @@ CMainFrame::CMainFrame() : m_bars(this)
     m_projectLabel = new QLabel(this);
     statusBar()->addPermanentWidget(m_projectLabel);
 
+    m_projectTree = new CProjectTree(this);
+    addDockWidget(Qt::LeftDockWidgetArea, m_projectTree);
+    m_projectTree->hide(); // until there is a project
+    connect(m_projectTree, &CProjectTree::MemberChosen, this, [this](CProjectHandle handle, const QString& path) {
+        const CProject* project = m_projects.Find(handle);
+        if (project && TemplateFor(path))
+            OpenMember(CProject(*project), ExistingSpelling(path), true);
+    });
+    connect(m_projectTree, &CProjectTree::CloseProjectChosen, this, &CMainFrame::CloseProject, Qt::QueuedConnection);
+
     CreateActions();
     CreateMenus();
     connect(&m_undo, &QUndoGroup::canUndoChanged, this, &CMainFrame::UpdateUndoTexts);
@@ -113,6 +123,7 @@ void CMainFrame::UpdateTitle()
     const CProject* project = m_projects.FindByView(GetActiveView());
     m_projectLabel->setText(project ? tr("Project: %1").arg(project->name) : QString());
     m_projectLabel->setToolTip(project ? project->path : QString());
+    UpdateProjectTree();
 }
 
 void CMainFrame::changeEvent(QEvent* event)
@@ -144,6 +155,7 @@ void CMainFrame::ReadSettings()
     if (!restoreGeometry(settings.value(Settings::Geometry).toByteArray()))
         resize(QSize(1100, 760).boundedTo(screen()->availableSize()));
     restoreState(settings.value(Settings::State).toByteArray());
+    m_projectTree->hide(); // until a project is opened
     ShowTabs(settings.value(Settings::Tabs, true).toBool());
     const bool usCustomary = settings.value(Settings::UsCustomary, false).toBool();
     KsUnits::Instance().SetSystem(usCustomary ? KsUnitSystem::UsCustomary : KsUnitSystem::Metric);

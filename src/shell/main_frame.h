@@ -4,6 +4,7 @@
 #include "ks/fc/frames.h"
 #include "shell/editor_bars.h"
 #include "shell/plugin_loader.h"
+#include "shell/project_tree.h"
 #include "shell/projects.h"
 #include "shell/recent_files.h"
 
@@ -75,6 +76,7 @@ private:
     void OnTile();
     void OnNextWindow();
     void OnPreviousWindow();
+    void OnProjectTree();
     void OnTabs();
     void OnCloseAll();
     void OnContents();
@@ -108,9 +110,11 @@ private:
     QString AskOpen(const QString& title, const QString& filters);
     CKsDoc* OpenDocument(CMultiDocTemplate& documents, const QString& path);
     void SetWindowIcons();
+    void UpdateProjectTree();
+    CMemberState StateOf(const QString& stored) const;
     void Announce(WPARAM what, const CProject& project);
     QString OpenMembers(const CProject& project);
-    bool OpenMember(const CProject& project, const QString& member);
+    bool OpenMember(const CProject& project, const QString& member, bool show);
 
     // Edit commands go to what has the focus.
     void RouteEdit(int command, QKeySequence::StandardKey key);
@@ -130,6 +134,7 @@ private:
     QMenu* m_languageMenu = nullptr;
     QMenu* m_toolBarMenu = nullptr;
     QToolBar* m_standardBar = nullptr;
+    CProjectTree* m_projectTree = nullptr;
     QLabel* m_pluginLabel = nullptr;
     QLabel* m_projectLabel = nullptr;
 };

@@ -40,6 +40,11 @@ void CMainFrame::OnPreviousWindow()
     MdiArea().activatePreviousSubWindow();
 }
 
+void CMainFrame::OnProjectTree()
+{
+    m_projectTree->setVisible(!m_projectTree->isVisible());
+}
+
 void CMainFrame::OnTabs()
 {
     ShowTabs(Action("actionTabs")->isChecked());

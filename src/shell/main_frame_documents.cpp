@@ -51,6 +51,7 @@ CMultiDocTemplate* CMainFrame::TemplateFor(const QString& path) const
 
 void CMainFrame::AddTemplate(CMultiDocTemplate* documents)
 {
+    connect(documents, &CMultiDocTemplate::DocumentClosing, this, &CMainFrame::UpdateProjectTree, Qt::QueuedConnection);
     connect(documents, &CMultiDocTemplate::DocumentOpened, this, [this](CKsDoc* document) {
         m_undo.addStack(&document->UndoStack());
         connect(document, &CKsDoc::TitleChanged, this, &CMainFrame::UpdateTitle);

@@ -81,6 +81,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {ViewMenu, "actionUnits", QT_TR_NOOP("&Units"), QT_TR_NOOP("Units in which values are shown; files are not affected")},
         {ViewMenu, "actionLanguage", QT_TR_NOOP("&Language"), QT_TR_NOOP("Language of the program")},
         {ViewMenu, "actionToolBars", QT_TR_NOOP("&Tool Bars"), QT_TR_NOOP("Shows or hides tool bars")},
+        {ViewMenu, "actionProjectTree", QT_TR_NOOP("&Project"), QT_TR_NOOP("Shows or hides the files of the project"), &F::OnProjectTree},
         {WindowMenu, "actionCascade", QT_TR_NOOP("&Cascade"), QT_TR_NOOP("Arranges the windows one behind the other"), &F::OnCascade},
         {WindowMenu, "actionTile", QT_TR_NOOP("&Tile"), QT_TR_NOOP("Arranges the windows side by side"), &F::OnTile},
         {WindowMenu, "actionNextWindow", QT_TR_NOOP("Ne&xt"), QT_TR_NOOP("Goes to the next window"), &F::OnNextWindow, K::NextChild},
@@ -126,6 +127,7 @@ void CMainFrame::CreateActions()
         m_actions.emplace(action->objectName(), action);
     }
     Action("actionTabs")->setCheckable(true);
+    Action("actionProjectTree")->setCheckable(true);
     Action("actionExit")->setMenuRole(QAction::QuitRole);
     Action("actionAbout")->setMenuRole(QAction::AboutRole);
 }
@@ -229,6 +231,8 @@ void CMainFrame::UpdateActions()
         Action(name)->setEnabled(document);
     Action("actionNew")->setEnabled(!Templates().empty());
     Action("actionCloseProject")->setEnabled(!m_projects.All().empty());
+    Action("actionProjectTree")->setEnabled(!m_projects.All().empty());
+    Action("actionProjectTree")->setChecked(m_projectTree->isVisible());
     Action("actionOpenRecent")->setEnabled(!m_recent.Files().isEmpty());
     const bool usCustomary = KsUnits::Instance().System() == KsUnitSystem::UsCustomary;
     Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);

@@ -34,34 +34,67 @@ bool CMainFrame::OpenProject(const QString& path)
     const QString missing = OpenMembers(project);
     if (!missing.isEmpty())
         KsMessageBox(tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing));
+    m_projectTree->show();
     UpdateTitle();
     UpdateActions();
     return true;
+}
+
+CMemberState CMainFrame::StateOf(const QString& stored) const
+{
+    const QString member = ExistingSpelling(stored);
+    CMemberState state;
+    for (const auto& plugin : m_plugins) {
+        for (const auto& documents : plugin->templates) {
+            if (!documents->MatchesExtension(member))
+                continue;
+            const CKsDoc* open = documents->FindDocument(member);
+            state.icon = plugin->Icon();
+            state.kind = open ? CMemberState::Open : CMemberState::Closed;
+            state.modified = open && open->IsModified();
+            if (!open && !QFileInfo::exists(member))
+                state.kind = CMemberState::Missing;
+            return state;
+        }
+    }
+    state.kind = QFileInfo::exists(member) ? CMemberState::Unknown : CMemberState::Missing;
+    return state;
+}
+
+void CMainFrame::UpdateProjectTree()
+{
+    m_projectTree->Show(m_projects, [this](const QString& member) { return StateOf(member); });
+    if (m_projects.All().empty())
+        m_projectTree->hide();
 }
 
 /// Opens all members; what could not be opened, a line each.
 QString CMainFrame::OpenMembers(const CProject& project)
 {
     QStringList missing;
-    for (const QString& member : project.members) {
+    for (const QString& stored : project.members) {
+        const QString member = ExistingSpelling(stored);
         const QString name = QDir::toNativeSeparators(member);
         if (!QFileInfo::exists(member))
             missing << tr("%1: the file does not exist").arg(name);
         else if (!TemplateFor(member))
             missing << tr("%1: no editor reads files of this kind").arg(name);
-        else if (!OpenMember(project, member))
+        else if (!OpenMember(project, member, false))
             missing << name;
     }
     return missing.join(u'\n');
 }
 
-bool CMainFrame::OpenMember(const CProject& project, const QString& member)
+/// Opens a member, or, when it is open, brings it to the front if `show`.
+bool CMainFrame::OpenMember(const CProject& project, const QString& member, bool show)
 {
     CMultiDocTemplate& documents = *TemplateFor(member);
     if (const CKsDoc* open = documents.FindDocument(member)) {
         // A view joins when it first appears. One that is open already outside any project is opened anew.
         const CView* view = open->Views().empty() ? nullptr : open->Views().front();
         auto* window = WindowOf(MdiArea(), view);
+        if (show && window)
+            MdiArea().setActiveSubWindow(window);
         if (m_projects.FindByView(view) || !window)
             return true;
         if (!window->close())

@@ -72,6 +72,17 @@ bool ReadMembers(CProject& project, QString& error)
 
 } // namespace
 
+QString ExistingSpelling(const QString& path)
+{
+    const QFileInfo file(path);
+    if (file.exists())
+        return path;
+    for (const QString& name : file.dir().entryList(QDir::Files, QDir::Name))
+        if (name.compare(file.fileName(), Qt::CaseInsensitive) == 0)
+            return file.dir().filePath(name);
+    return path;
+}
+
 const CProject* CProjects::Open(const QString& path, QString& error)
 {
     const QString key = FileKey(QFileInfo(path).absoluteFilePath());
@@ -120,7 +131,8 @@ const CProject* CProjects::FindByMember(const QString& path) const
     const QString key = FileKey(path);
     for (auto project = m_projects.rbegin(); project != m_projects.rend(); ++project) {
         const QStringList& members = (*project)->members;
-        if (std::any_of(members.begin(), members.end(), [&](const QString& member) { return FileKey(member) == key; }))
+        if (std::any_of(members.begin(), members.end(),
+                        [&](const QString& member) { return FileKey(ExistingSpelling(member)) == key; }))
             return project->get();
     }
     return nullptr;

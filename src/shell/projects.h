@@ -19,9 +19,13 @@ struct CProject
     CProjectHandle handle = 0;
     QString path;                       // absolute
     QString name;                       // the file's base name
-    QStringList members;                // absolute paths, in file order
+    QStringList members;                // absolute paths, in file order; see ExistingSpelling
     std::vector<QPointer<CView>> views; // those that joined
 };
+
+/// The path as the file is spelt now: an editor may have saved a member with its extension in capitals. The path itself
+/// when there is no such file.
+QString ExistingSpelling(const QString& path);
 
 class CProjects
 {

@@ -1,6 +1,7 @@
 #include "shell_fixture.h"
 
 #include <QLabel>
+#include <QTreeWidget>
 
 using testing::ElementsAre;
 
@@ -123,4 +124,50 @@ TEST_F(ShellTest, TheSwitchboardAnswersNothingElse)
     }
     package.project = 99;
     EXPECT_EQ(frame->WindowProc(KsMessage::BetweenEditors(), 522, reinterpret_cast<LPARAM>(&package)), 0);
+}
+
+TEST_F(ShellTest, ATreeShowsTheProjectsFiles)
+{
+    auto* dock = frame->findChild<CProjectTree*>();
+    auto* tree = dock->findChild<QTreeWidget*>();
+    EXPECT_FALSE(dock->isVisible());
+    EXPECT_FALSE(Action("actionProjectTree")->isEnabled());
+    Write("a.tst");
+    Write("b.tst");
+    answers << QMessageBox::Ok;
+    frame->OpenFile(WriteProject("p.kvrp", "File = <a.tst>\nFile = <b.tst>\nFile = <gone.tst>\nFile = <p.kvrp>\n"));
+    EXPECT_TRUE(dock->isVisible());
+    const auto shown = [&] {
+        QStringList files;
+        const QTreeWidgetItem* project = tree->topLevelItem(0);
+        for (int i = 0; project && i < project->childCount(); ++i)
+            files << project->child(i)->text(0) + (project->child(i)->font(0).bold() ? " open" : "");
+        return files.join(", ").toStdString();
+    };
+    EXPECT_EQ(shown(), "a.tst open, b.tst open, gone.tst (missing), p.kvrp (no editor)");
+    ViewOf("a.tst")->GetDocument()->SetModifiedFlag();
+    EXPECT_EQ(shown(), "a.tst* open, b.tst open, gone.tst (missing), p.kvrp (no editor)");
+    ViewOf("a.tst")->GetDocument()->SetModifiedFlag(false);
+    frame->MdiArea().activeSubWindow()->close();
+    Settle();
+    EXPECT_EQ(shown(), "a.tst open, b.tst, gone.tst (missing), p.kvrp (no editor)");
+    // Enter opens the file in its project again.
+    tree->setCurrentItem(tree->topLevelItem(0)->child(1));
+    tree->setFocus();
+    QTest::keyClick(tree, Qt::Key_Return);
+    EXPECT_NE(ProjectOf("b.tst"), 0);
+    EXPECT_EQ(shown(), "a.tst open, b.tst open, gone.tst (missing), p.kvrp (no editor)");
+    Action("actionProjectTree")->trigger();
+    EXPECT_FALSE(dock->isVisible());
+    EXPECT_TRUE(frame->CloseProject(frame->Projects().All().front()->handle));
+    EXPECT_EQ(tree->topLevelItemCount(), 0);
+}
+
+TEST_F(ShellTest, AMemberIsFoundInWhateverCaseItWasSaved)
+{
+    Write("a.TST");
+    EXPECT_TRUE(frame->OpenFile(WriteProject("p.kvrp", "File = <a.tst>\n")));
+    EXPECT_EQ(asked, QStringList());
+    ASSERT_TRUE(ViewOf("a.TST"));
+    EXPECT_NE(ProjectOf("a.TST"), 0);
 }

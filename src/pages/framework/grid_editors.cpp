@@ -163,9 +163,38 @@ void CGridDelegate::PaintControl(QPainter* painter, const QStyleOptionViewItem& 
     }
 }
 
+/// A text on its background. The style would lay it out as it does rich contents, which takes several times as long,
+/// and a table repaints hundreds of cells at each step of scrolling.
+void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
+{
+    const QVariant background = index.data(Qt::BackgroundRole);
+    if (background.isValid())
+        painter->fillRect(cell.rect, qvariant_cast<QBrush>(background));
+    QString text = index.data(Qt::DisplayRole).toString();
+    if (text.isEmpty())
+        return;
+    const int margin = m_grid->style()->pixelMetric(QStyle::PM_FocusFrameHMargin, nullptr, m_grid) + 1;
+    const QRect inside = cell.rect.adjusted(margin, 0, -margin, 0);
+    int width = cell.fontMetrics.horizontalAdvance(text);
+    if (width > inside.width()) {
+        text = cell.fontMetrics.elidedText(text, cell.textElideMode, inside.width());
+        width = cell.fontMetrics.horizontalAdvance(text);
+    }
+    const bool isRight = m_grid->Model()->Columns()[std::size_t(index.column())].IsRightAligned();
+    const int x = isRight ? inside.right() + 1 - width : inside.left();
+    const int y = inside.top() + (inside.height() - cell.fontMetrics.height() + 1) / 2 + cell.fontMetrics.ascent();
+    const bool enabled = cell.state.testFlag(QStyle::State_Enabled);
+    painter->setPen(cell.palette.color(enabled ? QPalette::Normal : QPalette::Disabled, QPalette::Text));
+    painter->drawText(x, y, text);
+}
+
 void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const
 {
-    if (!m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce())
+    constexpr QStyle::State special = QStyle::State_Selected | QStyle::State_HasFocus | QStyle::State_MouseOver;
+    const bool isText = !m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce();
+    if (isText && !(option.state & special) && option.direction == Qt::LeftToRight)
+        return PaintText(painter, option, index);
+    if (isText)
         return QStyledItemDelegate::paint(painter, option, index);
     QStyleOptionViewItem cell = option;
     initStyleOption(&cell, index);

@@ -211,6 +211,14 @@
             <source>Name and version of the program</source>
             <translation>Name and version of the program</translation>
         </message>
+        <message>
+            <source>&amp;Project</source>
+            <translation>&amp;Project</translation>
+        </message>
+        <message>
+            <source>Shows or hides the files of the project</source>
+            <translation>Shows or hides the files of the project</translation>
+        </message>
     </context>
     <context>
         <name>CMainFrame</name>
@@ -362,6 +370,33 @@ Shell of the river model editors.</translation>
         <message>
             <source>In use</source>
             <translation>In use</translation>
+        </message>
+    </context>
+    <context>
+        <name>CProjectTree</name>
+        <message>
+            <source>%1 (missing)</source>
+            <translation>%1 (missing)</translation>
+        </message>
+        <message>
+            <source>%1 (no editor)</source>
+            <translation>%1 (no editor)</translation>
+        </message>
+        <message>
+            <source>&amp;Open</source>
+            <translation>&amp;Open</translation>
+        </message>
+        <message>
+            <source>&amp;Close Project</source>
+            <translation>&amp;Close Project</translation>
+        </message>
+        <message>
+            <source>Project</source>
+            <translation>Project</translation>
+        </message>
+        <message>
+            <source>Files of the project</source>
+            <translation>Files of the project</translation>
         </message>
     </context>
     <context>

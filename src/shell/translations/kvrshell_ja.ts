@@ -211,6 +211,14 @@
             <source>Name and version of the program</source>
             <translation>プログラムの名称とバージョンを表示します</translation>
         </message>
+        <message>
+            <source>&amp;Project</source>
+            <translation>プロジェクト(&amp;P)</translation>
+        </message>
+        <message>
+            <source>Shows or hides the files of the project</source>
+            <translation>プロジェクトのファイル一覧の表示と非表示を切り替えます</translation>
+        </message>
     </context>
     <context>
         <name>CMainFrame</name>
@@ -362,6 +370,33 @@ Shell of the river model editors.</source>
         <message>
             <source>In use</source>
             <translation>使用中</translation>
+        </message>
+    </context>
+    <context>
+        <name>CProjectTree</name>
+        <message>
+            <source>%1 (missing)</source>
+            <translation>%1 (ファイルなし)</translation>
+        </message>
+        <message>
+            <source>%1 (no editor)</source>
+            <translation>%1 (エディタなし)</translation>
+        </message>
+        <message>
+            <source>&amp;Open</source>
+            <translation>開く(&amp;O)</translation>
+        </message>
+        <message>
+            <source>&amp;Close Project</source>
+            <translation>プロジェクトを閉じる(&amp;C)</translation>
+        </message>
+        <message>
+            <source>Project</source>
+            <translation>プロジェクト</translation>
+        </message>
+        <message>
+            <source>Files of the project</source>
+            <translation>プロジェクトのファイル</translation>
         </message>
     </context>
     <context>

@@ -1,0 +1,95 @@
+#include "shell/project_tree.h"
+
+#include <QDir>
+#include <QEvent>
+#include <QFileInfo>
+#include <QHeaderView>
+#include <QMenu>
+#include <QTreeWidget>
+
+namespace {
+
+constexpr int HandleRole = Qt::UserRole, PathRole = Qt::UserRole + 1; // the path is that of a member
+
+} // namespace
+
+CProjectTree::CProjectTree(QWidget* parent) : QDockWidget(parent), m_tree(new QTreeWidget(this))
+{
+    setObjectName(QStringLiteral("projectTree"));
+    setWidget(m_tree);
+    m_tree->setHeaderHidden(true);
+    m_tree->setContextMenuPolicy(Qt::CustomContextMenu);
+    m_tree->setUniformRowHeights(true);
+    connect(m_tree, &QTreeWidget::itemActivated, this, [this](QTreeWidgetItem* item) { Chosen(item); });
+    connect(m_tree, &QTreeWidget::customContextMenuRequested, this, &CProjectTree::ShowMenu);
+    QEvent translate(QEvent::LanguageChange);
+    changeEvent(&translate);
+}
+
+void CProjectTree::Show(const CProjects& projects, const std::function<CMemberState(const QString&)>& state)
+{
+    const QTreeWidgetItem* current = m_tree->currentItem();
+    const QString path = current ? current->data(0, PathRole).toString() : QString();
+    m_tree->clear();
+    for (const auto& project : projects.All()) {
+        auto* root = new QTreeWidgetItem(m_tree, {project->name});
+        root->setData(0, HandleRole, qlonglong(project->handle));
+        root->setToolTip(0, QDir::toNativeSeparators(project->path));
+        for (const QString& member : project->members)
+            AddMember(*root, member, state(member));
+        root->setExpanded(true);
+        for (int i = 0; i < root->childCount(); ++i)
+            if (root->child(i)->data(0, PathRole).toString() == path)
+                m_tree->setCurrentItem(root->child(i));
+    }
+}
+
+void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, const CMemberState& state)
+{
+    QString text = QFileInfo(path).fileName();
+    if (state.modified)
+        text += u'*';
+    if (state.kind == CMemberState::Missing)
+        text = tr("%1 (missing)").arg(text);
+    else if (state.kind == CMemberState::Unknown)
+        text = tr("%1 (no editor)").arg(text);
+    auto* item = new QTreeWidgetItem(&project, {text});
+    item->setData(0, HandleRole, project.data(0, HandleRole));
+    item->setData(0, PathRole, path);
+    item->setIcon(0, state.icon);
+    item->setToolTip(0, QDir::toNativeSeparators(path));
+    QFont font = m_tree->font();
+    font.setBold(state.kind == CMemberState::Open);
+    item->setFont(0, font);
+    if (state.kind == CMemberState::Missing || state.kind == CMemberState::Unknown)
+        item->setForeground(0, palette().color(QPalette::Disabled, QPalette::Text));
+}
+
+void CProjectTree::Chosen(QTreeWidgetItem* item)
+{
+    const QString path = item->data(0, PathRole).toString();
+    if (!path.isEmpty())
+        emit MemberChosen(CProjectHandle(item->data(0, HandleRole).toLongLong()), path);
+}
+
+void CProjectTree::ShowMenu(const QPoint& position)
+{
+    QTreeWidgetItem* item = m_tree->itemAt(position);
+    if (!item)
+        return;
+    const auto handle = CProjectHandle(item->data(0, HandleRole).toLongLong());
+    QMenu menu(this);
+    if (item->parent())
+        menu.addAction(tr("&Open"), this, [this, item] { Chosen(item); });
+    menu.addAction(tr("&Close Project"), this, [this, handle] { emit CloseProjectChosen(handle); });
+    menu.exec(m_tree->viewport()->mapToGlobal(position));
+}
+
+void CProjectTree::changeEvent(QEvent* event)
+{
+    QDockWidget::changeEvent(event);
+    if (event->type() != QEvent::LanguageChange)
+        return;
+    setWindowTitle(tr("Project"));
+    m_tree->setAccessibleName(tr("Files of the project"));
+}

@@ -1,0 +1,51 @@
+// The open projects and their files, in a window at the side of the frame.
+#pragma once
+
+#include "shell/projects.h"
+
+#include <QDockWidget>
+#include <QIcon>
+#include <functional>
+
+class QTreeWidget;
+class QTreeWidgetItem;
+
+/// A file of a project, as the tree shows it.
+struct CMemberState
+{
+    enum Kind
+    {
+        Closed,
+        Open,
+        Missing, // the file is not there
+        Unknown  // no editor reads it
+    };
+    Kind kind = Closed;
+    bool modified = false;
+    QIcon icon;
+};
+
+class CProjectTree : public QDockWidget
+{
+    Q_OBJECT
+public:
+    explicit CProjectTree(QWidget* parent);
+
+    /// Shows the projects as they are now; `state` is asked for each file.
+    void Show(const CProjects& projects, const std::function<CMemberState(const QString& path)>& state);
+
+signals:
+    /// The user wants to see a file: double click or Enter.
+    void MemberChosen(CProjectHandle project, const QString& path);
+    void CloseProjectChosen(CProjectHandle project);
+
+protected:
+    void changeEvent(QEvent* event) override;
+
+private:
+    void Chosen(QTreeWidgetItem* item);
+    void ShowMenu(const QPoint& position);
+    void AddMember(QTreeWidgetItem& project, const QString& path, const CMemberState& state);
+
+    QTreeWidget* m_tree; // child
+};
