@@ -1,6 +1,7 @@
-// kvrshell_drive SAMPLE_FOLDER OUT_FOLDER: copies the sample project, starts the shell on the copy, drives it through its main
-// job and says what was done, what was verified and where the pictures are. Exit code 0 when everything held.
+// kvrshell_drive SAMPLE_FOLDER OUT_FOLDER: copies the sample project, starts the shell on the copy, drives it through
+// its main job and says what was done, what was verified and where the pictures are. Exit code 0 when everything held.
 #include "drive/main_job.h"
+#include "drive/project_job.h"
 #include "drive/robot.h"
 #include "ks/fc/message_box.h"
 #include "shell/main_frame.h"
@@ -67,6 +68,7 @@ int main(int argc, char** argv)
         QTimer::singleShot(0, &frame, [&] {
             Robot robot(frame, out);
             DriveMainJob(robot, work + "/river.hdkv");
+            DriveProjectJob(robot);
             result = Report(robot);
             QCoreApplication::exit(result);
         });

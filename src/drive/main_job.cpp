@@ -15,6 +15,7 @@
 #include <QMenu>
 #include <QTabWidget>
 #include <QTableView>
+#include <algorithm>
 
 namespace {
 
@@ -167,7 +168,10 @@ void SaveCloseReopen(Robot& robot, const QString& file, int row)
 
     robot.Did("Close the document and open it again from the recent files");
     robot.Trigger("actionClose");
-    robot.Verify(!robot.Frame().GetActiveView(), "no document is open");
+    const auto windows = robot.Frame().MdiArea().subWindowList();
+    robot.Verify(std::none_of(windows.begin(), windows.end(),
+                              [&](QMdiSubWindow* window) { return window->windowTitle().contains(".HDKV"); }),
+                 "the document is closed");
     auto* recent = RecentFile(robot, saved);
     robot.Verify(recent != nullptr, "the saved file is among the recent files");
     if (!recent)

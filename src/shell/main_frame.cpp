@@ -38,11 +38,7 @@ CMainFrame::CMainFrame() : m_bars(this)
     m_projectTree = new CProjectTree(this);
     addDockWidget(Qt::LeftDockWidgetArea, m_projectTree);
     m_projectTree->hide(); // until there is a project
-    connect(m_projectTree, &CProjectTree::MemberChosen, this, [this](CProjectHandle handle, const QString& path) {
-        const CProject* project = m_projects.Find(handle);
-        if (project && TemplateFor(path))
-            OpenMember(CProject(*project), ExistingSpelling(path), true);
-    });
+    connect(m_projectTree, &CProjectTree::MemberChosen, this, &CMainFrame::ShowMember);
     connect(m_projectTree, &CProjectTree::CloseProjectChosen, this, &CMainFrame::CloseProject, Qt::QueuedConnection);
 
     CreateActions();
@@ -153,7 +149,7 @@ void CMainFrame::ReadSettings()
 {
     const QSettings settings;
     if (!restoreGeometry(settings.value(Settings::Geometry).toByteArray()))
-        resize(QSize(1100, 760).boundedTo(screen()->availableSize()));
+        resize(QSize(1500, 940).boundedTo(screen()->availableSize()));
     restoreState(settings.value(Settings::State).toByteArray());
     m_projectTree->hide(); // until a project is opened
     ShowTabs(settings.value(Settings::Tabs, true).toBool());

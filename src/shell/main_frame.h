@@ -74,6 +74,7 @@ private:
     void OnUsCustomary();
     void OnCascade();
     void OnTile();
+    void OnSideBySide();
     void OnNextWindow();
     void OnPreviousWindow();
     void OnProjectTree();
@@ -111,6 +112,7 @@ private:
     CKsDoc* OpenDocument(CMultiDocTemplate& documents, const QString& path);
     void SetWindowIcons();
     void UpdateProjectTree();
+    void ShowMember(CProjectHandle handle, const QString& stored);
     CMemberState StateOf(const QString& stored) const;
     void Announce(WPARAM what, const CProject& project);
     QString OpenMembers(const CProject& project);

@@ -9,6 +9,7 @@
 #include <QFileInfo>
 #include <QMessageBox>
 #include <QUrl>
+#include <algorithm>
 
 void CMainFrame::OnMetric()
 {
@@ -38,6 +39,29 @@ void CMainFrame::OnNextWindow()
 void CMainFrame::OnPreviousWindow()
 {
     MdiArea().activatePreviousSubWindow();
+}
+
+/// The active window stands at the left, the others stand one below the other beside it.
+void CMainFrame::OnSideBySide()
+{
+    QMdiSubWindow* first = MdiArea().currentSubWindow();
+    if (!first)
+        return;
+    QList<QMdiSubWindow*> windows = MdiArea().subWindowList(QMdiArea::CreationOrder);
+    windows.removeOne(first);
+    ShowTabs(false);
+    first->showNormal();
+    for (QMdiSubWindow* window : windows)
+        window->showNormal();
+    const QRect area(QPoint(), MdiArea().viewport()->size());
+    const int most = windows.isEmpty() ? area.width() : area.width() * 2 / 3;
+    const int width = windows.isEmpty() ? most : std::clamp(first->minimumSizeHint().width(), area.width() / 2, most);
+    first->setGeometry(0, 0, width, area.height());
+    for (qsizetype i = 0; i < windows.size(); ++i) {
+        const int top = int(area.height() * i / windows.size()), bottom = int(area.height() * (i + 1) / windows.size());
+        windows[i]->setGeometry(width, top, area.width() - width, bottom - top);
+    }
+    MdiArea().setActiveSubWindow(first);
 }
 
 void CMainFrame::OnProjectTree()

@@ -84,6 +84,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {ViewMenu, "actionProjectTree", QT_TR_NOOP("&Project"), QT_TR_NOOP("Shows or hides the files of the project"), &F::OnProjectTree},
         {WindowMenu, "actionCascade", QT_TR_NOOP("&Cascade"), QT_TR_NOOP("Arranges the windows one behind the other"), &F::OnCascade},
         {WindowMenu, "actionTile", QT_TR_NOOP("&Tile"), QT_TR_NOOP("Arranges the windows side by side"), &F::OnTile},
+        {WindowMenu, "actionSideBySide", QT_TR_NOOP("&Side by Side"), QT_TR_NOOP("Puts the other windows beside the active one"), &F::OnSideBySide},
         {WindowMenu, "actionNextWindow", QT_TR_NOOP("Ne&xt"), QT_TR_NOOP("Goes to the next window"), &F::OnNextWindow, K::NextChild},
         {WindowMenu, "actionPreviousWindow", QT_TR_NOOP("Pre&vious"), QT_TR_NOOP("Goes to the previous window"), &F::OnPreviousWindow, K::PreviousChild},
         {WindowMenu, "actionTabs", QT_TR_NOOP("Ta&bs"), QT_TR_NOOP("Shows the windows as tabs"), &F::OnTabs},
@@ -327,7 +328,7 @@ void CMainFrame::FillWindowMenu()
     Action("actionTabs")->setChecked(tabs);
     for (const char* name : {"actionCascade", "actionTile"})
         Action(name)->setEnabled(!tabs && !windows.isEmpty());
-    for (const char* name : {"actionNextWindow", "actionPreviousWindow", "actionCloseAll"})
+    for (const char* name : {"actionSideBySide", "actionNextWindow", "actionPreviousWindow", "actionCloseAll"})
         Action(name)->setEnabled(!windows.isEmpty());
     if (!windows.isEmpty())
         menu->addSeparator();

@@ -1,9 +1,12 @@
 // Projects in the main frame.
 #include "ks/fc/message_box.h"
 #include "shell/main_frame.h"
+#include "shell/settings_keys.h"
 
 #include <QDir>
 #include <QFileInfo>
+#include <QLayout>
+#include <QSettings>
 
 namespace {
 
@@ -35,6 +38,12 @@ bool CMainFrame::OpenProject(const QString& path)
     if (!missing.isEmpty())
         KsMessageBox(tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing));
     m_projectTree->show();
+    if (MdiArea().subWindowList().size() > 1 && !project.members.isEmpty() &&
+        !QSettings().value(Settings::Tabs, false).toBool()) {
+        layout()->activate();                                // the tree takes its room first
+        ShowMember(project.handle, project.members.front()); // the first file is the main one
+        OnSideBySide();
+    }
     UpdateTitle();
     UpdateActions();
     return true;
@@ -83,6 +92,14 @@ QString CMainFrame::OpenMembers(const CProject& project)
             missing << name;
     }
     return missing.join(u'\n');
+}
+
+void CMainFrame::ShowMember(CProjectHandle handle, const QString& stored)
+{
+    const CProject* project = m_projects.Find(handle);
+    const QString member = ExistingSpelling(stored);
+    if (project && TemplateFor(member) && QFileInfo::exists(member))
+        OpenMember(CProject(*project), member, true);
 }
 
 /// Opens a member, or, when it is open, brings it to the front if `show`.

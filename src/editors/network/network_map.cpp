@@ -147,6 +147,17 @@ std::optional<CNetworkMap::Place> CNetworkMap::Picked() const
     return m_picked && WindowPoint(*m_picked) ? m_picked : std::nullopt;
 }
 
+QString CNetworkMap::MarkedText() const
+{
+    const auto text = [](const QString& branch, double chainage) {
+        return branch + u' ' + QString::number(chainage, 'f', 1);
+    };
+    if (const CMapLocation* location = Selected())
+        return text(location->branch, location->chainage);
+    const auto place = m_picked ? m_picked : m_shown;
+    return place ? text(place->branch, place->chainage) : QString();
+}
+
 void CNetworkMap::SetPicked(std::optional<Place> place)
 {
     if (place == m_picked)

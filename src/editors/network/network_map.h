@@ -11,6 +11,9 @@
 class CNetworkMap : public QWidget
 {
     Q_OBJECT
+    // For programs that read the screen, and those that drive it.
+    Q_PROPERTY(QString marked READ MarkedText)
+    Q_PROPERTY(int placedCount READ PlacedCount)
 public:
     /// The document outlives the map.
     explicit CNetworkMap(const CNetworkDoc& document, QWidget* parent = nullptr);
@@ -33,6 +36,8 @@ public:
     void SetPicked(std::optional<Place> place);
     /// The location that is selected; null for none. Valid until the locations change.
     const CMapLocation* Selected() const;
+    /// "BRANCH 1234.5" of the location selected, else of the place picked, else of the place shown; in metres.
+    QString MarkedText() const;
     /// Marks a place and brings it into sight.
     void ShowPlace(const Place& place);
     void SetCurrentBranch(int branch);

@@ -219,6 +219,14 @@
             <source>Shows or hides the files of the project</source>
             <translation>Shows or hides the files of the project</translation>
         </message>
+        <message>
+            <source>&amp;Side by Side</source>
+            <translation>&amp;Side by Side</translation>
+        </message>
+        <message>
+            <source>Puts the other windows beside the active one</source>
+            <translation>Puts the other windows beside the active one</translation>
+        </message>
     </context>
     <context>
         <name>CMainFrame</name>

@@ -219,6 +219,14 @@
             <source>Shows or hides the files of the project</source>
             <translation>プロジェクトのファイル一覧の表示と非表示を切り替えます</translation>
         </message>
+        <message>
+            <source>&amp;Side by Side</source>
+            <translation>横に並べて表示(&amp;S)</translation>
+        </message>
+        <message>
+            <source>Puts the other windows beside the active one</source>
+            <translation>作業中のウィンドウの横にほかのウィンドウを並べます</translation>
+        </message>
     </context>
     <context>
         <name>CMainFrame</name>
