@@ -11,12 +11,13 @@
 
 namespace {
 
-std::string ProjectText(std::string_view member)
+std::string ProjectText(std::initializer_list<std::string_view> members)
 {
     const TqlStructure project(tqlCreate());
     tqlAddTarget(project.Get(), "KVR_PROJECT");
     tqlAddSection(project.Get(), "Members");
-    tqlPutParamFilename(project.Get(), "File", member);
+    for (const std::string_view member : members)
+        tqlPutParamFilename(project.Get(), "File", member);
     tqlEndSection(project.Get());
     tqlEndSection(project.Get());
     return std::string(tqlGetText(project.Get()));
@@ -36,7 +37,7 @@ int WriteProject(const std::string& folder)
     std::filesystem::create_directories(PathFromUtf8(folder), error);
     int failed = Outcome(SaveHDFile(SampleRiver(), folder + "/river.hdkv"));
     failed = failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvnw", SampleNetworkText()));
-    return failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvrp", ProjectText("river.hdkv")));
+    return failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvrp", ProjectText({"river.hdkv", "river.kvnw", "river.kvxs"})));
 }
 
 int WriteLongRiver(std::string_view locations, const std::string& file)
