@@ -66,6 +66,7 @@ int main(int argc, char** argv)
     std::printf("Driving the shell on %s\n", project.constData());
     ShellMain(2, arguments, [&](CMainFrame& frame) {
         QTimer::singleShot(0, &frame, [&] {
+            frame.resize(1600, 1000); // whatever the size of the screen that is not there
             Robot robot(frame, out);
             DriveMainJob(robot, work + "/river.hdkv");
             DriveProjectJob(robot);

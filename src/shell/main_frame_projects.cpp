@@ -10,6 +10,8 @@
 
 namespace {
 
+constexpr int ProjectTreeWidth = 190; // pixels, until the user pulls it
+
 CKsMDIChildWnd* WindowOf(const QMdiArea& area, const CView* view)
 {
     const auto windows = area.subWindowList();
@@ -38,6 +40,7 @@ bool CMainFrame::OpenProject(const QString& path)
     if (!missing.isEmpty())
         KsMessageBox(tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing));
     m_projectTree->show();
+    resizeDocks({m_projectTree}, {ProjectTreeWidth}, Qt::Horizontal);
     if (MdiArea().subWindowList().size() > 1 && !project.members.isEmpty() &&
         !QSettings().value(Settings::Tabs, false).toBool()) {
         layout()->activate();                                // the tree takes its room first
