@@ -75,12 +75,13 @@ std::unique_ptr<CObList> DataItems(CKavo0_hdDoc& document)
 std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
 {
     const HD_Global_Var& globals = document.Parameters().Global;
-    const std::size_t titles = globals.MarkTitles.size();
+    const bool isShownOnly = document.IsPlaceholderRow(&globals.MarkTitles);
+    const std::size_t titles = isShownOnly ? 0 : globals.MarkTitles.size();
     auto items = std::make_unique<CObList>();
 
     auto head = std::make_unique<CKvrCBEUserDefMark>();
-    for (const std::string& title : globals.MarkTitles)
-        head->titles.push_back(CString::fromStdString(title));
+    for (std::size_t title = 0; title < titles; ++title)
+        head->titles.push_back(CString::fromStdString(globals.MarkTitles[title]));
     head->flags.assign(globals.MarkInterpolate.begin(), globals.MarkInterpolate.end());
     head->flags.resize(titles, 0);
     items->push_back(std::move(head));
@@ -103,7 +104,10 @@ std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
 std::unique_ptr<CObList> MapItems(CKavo0_hdDoc& document)
 {
     auto items = std::make_unique<CObList>();
-    for (const CMapsOutput& map : document.Parameters().Global.MapOutput.MapOutputFiles) {
+    const auto& maps = document.Parameters().Global.MapOutput.MapOutputFiles;
+    if (document.IsPlaceholderRow(&maps)) // the row of an empty table
+        return items;
+    for (const CMapsOutput& map : maps) {
         auto item = std::make_unique<CKvr_CBE_HDMaps>();
         item->xOrigin = map.XOrigin;
         item->yOrigin = map.YOrigin;

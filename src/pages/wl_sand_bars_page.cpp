@@ -24,6 +24,7 @@ CWLSandBarsPage::CWLSandBarsPage(CKavo0_hdDoc* document, QWidget* parent)
         return ColumnOptions{
             .caption = caption,
             .width = 62,
+            .asFormatted = &global == &sand.Slope, // slopes are far below one, three decimals show nothing of them
             .emptyIsNotGiven = true,
             .locked = [&sand, isObserved](const void*) { return (sand.Method == ObservedMethod) != isObserved; },
             .globalNumber = &global};
