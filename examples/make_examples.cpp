@@ -5,6 +5,7 @@
 #include "data/utf8_path.h"
 #include "sample_network.h"
 #include "sample_river.h"
+#include "sample_sections.h"
 
 #include <charconv>
 #include <iostream>
@@ -37,7 +38,10 @@ int WriteProject(const std::string& folder)
     std::filesystem::create_directories(PathFromUtf8(folder), error);
     int failed = Outcome(SaveHDFile(SampleRiver(), folder + "/river.hdkv"));
     failed = failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvnw", SampleNetworkText()));
-    return failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvrp", ProjectText({"river.hdkv", "river.kvnw", "river.kvxs"})));
+    failed = failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvxs", SampleSectionsText()));
+    return failed ? failed
+                  : Outcome(WriteFileSafely(folder + "/river.kvrp",
+                                            ProjectText({"river.hdkv", "river.kvnw", "river.kvxs"})));
 }
 
 int WriteLongRiver(std::string_view locations, const std::string& file)

@@ -46,6 +46,19 @@ void CProjectDoc::DataChanged() const
     Send(KsMainWindow(), KsMessage::BetweenEditors(), KsRequest::DataChanged, package);
 }
 
+void CProjectDoc::LocationShown(CView* view, const CString& branch, double chainage) const
+{
+    if (!m_project)
+        return;
+    auto item = std::make_unique<CKvrCBELocation>();
+    item->branch = branch;
+    item->chainage = chainage;
+    CObList objects;
+    objects.push_back(std::move(item));
+    CKSComm_Package package = Package(view, &objects);
+    Send(KsMainWindow(), KsMessage::BetweenEditors(), KsRequest::LocationShown, package);
+}
+
 LRESULT CProjectDoc::AskProject(WPARAM request, CView* view, CObList* objects) const
 {
     if (!m_project)

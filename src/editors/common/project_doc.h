@@ -16,6 +16,8 @@ public:
     void LeaveProject(CView* view);
     /// Tells the other editors of the project that data changed.
     void DataChanged() const;
+    /// Tells the other editors of the project that the user of `view` looks at a place.
+    void LocationShown(CView* view, const CString& branch, double chainage) const;
     std::intptr_t ProjectHandle() const { return m_project; }
 
     /// Sends a request to the shell's switchboard, which answers into `objects`; 0 outside a project.

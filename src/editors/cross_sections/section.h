@@ -1,0 +1,65 @@
+// A cross section: the ground across the river at a place of a branch.
+#pragma once
+
+#include "editors/common/parameter_file.h"
+#include "ks/fc/exchange.h"
+
+#include <QString>
+#include <optional>
+#include <tuple>
+#include <vector>
+
+struct CSectionPoint
+{
+    double offset = 0; // across the section from its left end, looking downstream; metres
+    double level = 0;  // of the ground; metres above datum
+    bool operator==(const CSectionPoint&) const = default;
+};
+
+/// Metres; KsUnset for what is not known.
+struct CCrossSection
+{
+    QString branch;
+    double chainage = 0;
+    QString topoId;                    // names the survey; several may have measured the same place
+    double radius = KsUnset;           // of curvature
+    double width = KsUnset;            // of the water surface
+    std::vector<CSectionPoint> points; // from left to right; offsets do not decrease
+    CKeptSection kept, keptProfile;    // what the file says beyond that, and among the points
+
+    /// Branch, survey and PlaceOf(chainage): no two sections share it.
+    std::tuple<QString, QString, double> Key() const;
+};
+
+/// Chainages in metres that the tables do not tell apart have the same place.
+double PlaceOf(double chainage);
+
+struct CCrossSections
+{
+    std::vector<CCrossSection> sections;
+    std::vector<CKeptSection> keptTargets;
+    CKeptSection kept; // of the sections' own target
+
+    /// Whether a section but the one at `except` (-1: any) has the key of `section`.
+    bool IsTaken(const CCrossSection& section, int except = -1) const;
+    /// The section of the branch nearest to the chainage; -1 without any. Names are compared exactly, as in the HD
+    /// parameters.
+    int Nearest(const QString& branch, double chainage) const;
+    /// The branches in the order in which they are first met.
+    QStringList Branches() const;
+    /// Indexes of the sections: branches in the order of Branches(), chainages increasing within one.
+    std::vector<int> ByPlace() const;
+    void SortByPlace();
+};
+
+/// The water surface in a section: its level, and where it meets the ground.
+struct CWaterSurface
+{
+    double level = 0, left = 0, right = 0; // metres
+    bool operator==(const CWaterSurface&) const = default;
+};
+
+/// The lowest surface about the deepest point that is as wide as the section's width says. Nothing without a width, or
+/// where such a surface would run over an end of the section. Where a bank is overtopped the surface widens at once:
+/// the width may be less than asked for.
+std::optional<CWaterSurface> WaterSurface(const CCrossSection& section);

@@ -1,0 +1,35 @@
+#include "editors/cross_sections/section_rules.h"
+
+#include "ks/units/edit_style.h"
+
+#include <QCoreApplication>
+
+namespace {
+
+struct SectionRules
+{
+    Q_DECLARE_TR_FUNCTIONS(SectionRules)
+};
+
+} // namespace
+
+CSectionFault FindFault(const CCrossSection& section)
+{
+    if (section.branch.isEmpty())
+        return {CSectionFault::Branch, -1, SectionRules::tr("a cross section needs the name of its branch.")};
+    if (section.width < 0)
+        return {CSectionFault::Width, -1, SectionRules::tr("expected a width that is not negative.")};
+    for (std::size_t i = 1; i < section.points.size(); ++i) {
+        if (section.points[i].offset < section.points[i - 1].offset)
+            return {CSectionFault::Point, static_cast<int>(i),
+                    SectionRules::tr("expected offsets that do not decrease from point to point.")};
+    }
+    return {};
+}
+
+QString WhyTaken(const CCrossSection& section)
+{
+    return SectionRules::tr(
+               "there is a cross section of branch \"%1\" at chainage %2 m with the topo ID \"%3\" already.")
+        .arg(section.branch, KsShortestNumber(section.chainage), section.topoId);
+}

@@ -1,0 +1,91 @@
+// The tables beside the plot: the cross sections, and the points of one of them.
+#pragma once
+
+#include "editors/cross_sections/document.h"
+
+#include <QAbstractTableModel>
+
+/// What both tables do alike. Rows follow the document; a change that cannot be made is refused with a message.
+class CLinesTable : public QAbstractTableModel
+{
+    Q_OBJECT
+public:
+    int rowCount(const QModelIndex& parent = {}) const override;
+    Qt::ItemFlags flags(const QModelIndex& index) const override;
+    /// Shows the document's present state.
+    void Reload();
+    virtual void RemoveLines(const std::vector<int>& rows) = 0;
+
+signals:
+    /// For the user: where, what was expected and what was typed.
+    void Refused(const QString& message);
+
+protected:
+    CLinesTable(CCrossSectionDoc& document, QObject* parent) : QAbstractTableModel(parent), m_document(document) {}
+    virtual int Lines() const = 0;
+    bool Refuse(const QModelIndex& index, const QString& message);
+    bool RefuseNumber(const QModelIndex& index, const QString& typed);
+    /// Puts a changed section in its place, unless it may not stand there.
+    bool Replace(const QModelIndex& index, int section, CCrossSection changed, const QString& text);
+    CCrossSectionDoc& m_document;
+
+private:
+    int m_rows = 0;
+};
+
+class CSectionTable : public CLinesTable
+{
+    Q_OBJECT
+public:
+    enum Column
+    {
+        Branch,
+        Chainage,
+        TopoId,
+        Radius,
+        Width,
+        ColumnCount
+    };
+    CSectionTable(CCrossSectionDoc& document, QObject* parent);
+    int columnCount(const QModelIndex& parent = {}) const override;
+    QVariant data(const QModelIndex& index, int role = Qt::DisplayRole) const override;
+    QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
+    bool setData(const QModelIndex& index, const QVariant& value, int role = Qt::EditRole) override;
+    void RemoveLines(const std::vector<int>& rows) override;
+    /// Adds a section without points behind `row` (-1: at the end), on the same branch between it and the next one; the
+    /// first of all is on `branch`. Returns its row.
+    int InsertLine(int row, const QString& branch);
+
+protected:
+    int Lines() const override;
+};
+
+class CPointTable : public CLinesTable
+{
+    Q_OBJECT
+public:
+    enum Column
+    {
+        Offset,
+        Level,
+        ColumnCount
+    };
+    CPointTable(CCrossSectionDoc& document, QObject* parent);
+    /// -1 for none.
+    void SetSection(int section);
+    int Section() const { return m_section; }
+    int columnCount(const QModelIndex& parent = {}) const override;
+    QVariant data(const QModelIndex& index, int role = Qt::DisplayRole) const override;
+    QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
+    bool setData(const QModelIndex& index, const QVariant& value, int role = Qt::EditRole) override;
+    void RemoveLines(const std::vector<int>& rows) override;
+    /// Adds a point behind `row` (-1: at the end), half way to the next one. Returns its row; -1 without a section.
+    int InsertLine(int row);
+
+protected:
+    int Lines() const override;
+
+private:
+    const CCrossSection* Current() const { return m_document.Section(m_section); }
+    int m_section = -1;
+};

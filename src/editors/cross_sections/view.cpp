@@ -1,0 +1,190 @@
+#include "editors/cross_sections/view.h"
+
+#include "ks/fc/message_box.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QHeaderView>
+#include <QLabel>
+#include <QSplitter>
+#include <QTableView>
+#include <QVBoxLayout>
+
+CCrossSectionView::CCrossSectionView(QWidget* parent) : CProjectView(parent)
+{
+    setObjectName(QStringLiteral("crossSectionView"));
+}
+
+void CCrossSectionView::OnInitialUpdate()
+{
+    m_plot = new CSectionPlot;
+    auto* splitter = new QSplitter(Qt::Horizontal, this);
+    splitter->addWidget(m_plot);
+    MakeTables(splitter);
+    splitter->setStretchFactor(0, 1);
+    splitter->setStretchFactor(1, 0);
+    splitter->setCollapsible(0, false);
+    splitter->setSizes({780, 500}); // in proportion
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(splitter);
+    setFocusProxy(m_sections);
+    ConnectTables();
+    CProjectView::OnInitialUpdate();
+
+    m_showing = true; // the user has not asked for the first one
+    if (m_sectionTable->rowCount() > 0)
+        m_sections->setCurrentIndex(m_sectionTable->index(0, 0));
+    m_showing = false;
+    Retranslate();
+}
+
+// ---- tables ------------------------------------------------------------------------------------
+
+void CCrossSectionView::MakeTables(QSplitter* splitter)
+{
+    auto* side = new QSplitter(Qt::Vertical);
+    m_sectionTable = new CSectionTable(*Document(), this);
+    m_pointTable = new CPointTable(*Document(), this);
+    m_sections = MakeTable(m_sectionTable, "sectionTable");
+    m_points = MakeTable(m_pointTable, "pointTable");
+    m_lines = m_sections;
+    m_sectionTitle = new QLabel;
+    m_pointTitle = new QLabel;
+    m_pointTitle->setWordWrap(true);
+    for (const auto& [title, table] : {std::pair(m_sectionTitle, m_sections), std::pair(m_pointTitle, m_points)}) {
+        auto* pane = new QWidget;
+        auto* layout = new QVBoxLayout(pane);
+        layout->setContentsMargins(6, 6, 6, 6);
+        layout->addWidget(title);
+        layout->addWidget(table);
+        title->setBuddy(table);
+        side->addWidget(pane);
+    }
+    splitter->addWidget(side);
+}
+
+QTableView* CCrossSectionView::MakeTable(CLinesTable* model, const char* name)
+{
+    auto* table = new QTableView;
+    table->setObjectName(QString::fromLatin1(name));
+    table->setModel(model);
+    table->setAlternatingRowColors(true);
+    table->setSelectionBehavior(QAbstractItemView::SelectRows);
+    table->setContextMenuPolicy(Qt::CustomContextMenu);
+    table->horizontalHeader()->setHighlightSections(false);
+    table->horizontalHeader()->setStretchLastSection(true);
+    table->verticalHeader()->setDefaultSectionSize(table->fontMetrics().height() + 8);
+    for (const auto& [key, run] : {std::pair(Qt::Key_Delete, &CCrossSectionView::DeleteLines),
+                                   std::pair(Qt::Key_Insert, &CCrossSectionView::InsertLine)}) {
+        auto* action = new QAction(table);
+        action->setShortcut(key);
+        action->setShortcutContext(Qt::WidgetShortcut);
+        connect(action, &QAction::triggered, this, run);
+        table->addAction(action);
+    }
+    connect(table, &QWidget::customContextMenuRequested, this,
+            [this, table](const QPoint& at) { ShowContextMenu(table, at); });
+    // The message waits until the cell's editor has closed: it takes the focus.
+    connect(
+        model, &CLinesTable::Refused, this,
+        [this](const QString& message) { KsMessageBox(message, QMessageBox::Ok, this); }, Qt::QueuedConnection);
+    return table;
+}
+
+void CCrossSectionView::ConnectTables()
+{
+    connect(m_sections->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
+            &CCrossSectionView::CurrentSectionChanged);
+    connect(m_points->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
+            [this](const QModelIndex& now) { m_plot->SetCurrentPoint(now.row()); });
+    connect(Document(), &CCrossSectionDoc::SectionsChanged, this, &CCrossSectionView::SectionsChanged);
+    connect(m_plot, &CSectionPlot::PointPicked, this, [this](int point) { GoToRow(m_points, point); });
+    connect(m_plot, &CSectionPlot::SectionStep, this, &CCrossSectionView::StepSection);
+    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CCrossSectionView::UnitsChanged);
+    connect(qApp, &QApplication::focusChanged, this, [this](QWidget*, QWidget* now) {
+        for (QTableView* table : {m_sections, m_points}) {
+            if (now && (table == now || table->isAncestorOf(now)))
+                m_lines = table;
+        }
+    });
+}
+
+int CCrossSectionView::CurrentSection() const
+{
+    return m_sections ? m_sections->currentIndex().row() : -1;
+}
+
+bool CCrossSectionView::HasFocusWithin() const
+{
+    const QWidget* focus = QApplication::focusWidget();
+    return focus && isAncestorOf(focus);
+}
+
+void CCrossSectionView::GoToRow(QTableView* table, int row) const
+{
+    const QModelIndex at = table->model()->index(row, std::max(table->currentIndex().column(), 0));
+    table->setCurrentIndex(at);
+    table->scrollTo(at);
+}
+
+/// The tables follow the document. The view that the user works in goes to what changed, so that undo shows its work.
+void CCrossSectionView::SectionsChanged(int index)
+{
+    const int row = CurrentSection(), point = m_points->currentIndex().row();
+    m_sectionTable->Reload();
+    const bool here = HasFocusWithin() || Document()->Views().size() == 1;
+    const int go = std::min(here ? index : row, m_sectionTable->rowCount() - 1);
+    if (go >= 0 && go != CurrentSection())
+        GoToRow(m_sections, go);
+    ShowSection();
+    if (go == row && point >= 0 && m_pointTable->rowCount() > 0)
+        GoToRow(m_points, std::min(point, m_pointTable->rowCount() - 1));
+}
+
+void CCrossSectionView::CurrentSectionChanged()
+{
+    m_points->setCurrentIndex({});
+    ShowSection();
+    TellLocation();
+}
+
+void CCrossSectionView::ShowSection()
+{
+    m_pointTable->SetSection(CurrentSection());
+    m_plot->Show(Document()->Section(CurrentSection()));
+    m_plot->SetCurrentPoint(m_points->currentIndex().row());
+    const QString title = m_plot->Title().replace(u'&', QStringLiteral("&&"));
+    m_pointTitle->setText(title.isEmpty() ? tr("&Points") : tr("&Points of %1").arg(title));
+}
+
+void CCrossSectionView::UnitsChanged()
+{
+    m_sectionTable->Reload();
+    ShowSection();
+}
+
+void CCrossSectionView::Retranslate()
+{
+    m_sectionTitle->setText(tr("&Cross sections"));
+    m_sections->setAccessibleName(tr("Cross sections by branch and chainage"));
+    m_points->setAccessibleName(tr("Points of the current cross section"));
+    UnitsChanged();
+    m_sections->resizeColumnsToContents();
+    m_points->resizeColumnsToContents();
+}
+
+void CCrossSectionView::changeEvent(QEvent* event)
+{
+    if (event->type() == QEvent::LanguageChange && m_plot)
+        Retranslate();
+    CProjectView::changeEvent(event);
+}
+
+/// Hint 1 of the shell: what is being typed moves into the document.
+void CCrossSectionView::OnUpdate(CView*, int hint, CHint*)
+{
+    const QWidget* focus = QApplication::focusWidget();
+    if (hint == CKsDoc::StoreHint && m_lines && m_lines != focus && m_lines->isAncestorOf(focus))
+        m_lines->setFocus(); // the cell's editor commits as it loses the focus
+}

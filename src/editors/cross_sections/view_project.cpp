@@ -1,0 +1,136 @@
+// The cross sections' view among other editors: what it answers them, and the place it shows them.
+#include "editors/cross_sections/view.h"
+
+#include <QScopedValueRollback>
+#include <QTableView>
+#include <cmath>
+#include <map>
+
+LRESULT CCrossSectionView::OnRequest(WPARAM request, CKSComm_Package& package)
+{
+    if (!m_plot || request == KsRequest::DataChanged) // before the first update; or nothing that is shown here
+        return 0;
+    const bool known = request == KsRequest::LoadLocations || request == KsRequest::LoadLocationsAndChannel ||
+                       request == KsRequest::BranchNames || request == KsRequest::LocationShown;
+    if (!known)
+        return CProjectView::OnRequest(request, package);
+    if (!package.objects) {
+        qDebug("cross sections: request %llu without a list", static_cast<unsigned long long>(request));
+        return 0;
+    }
+    switch (request) {
+    case KsRequest::LoadLocations:
+        return LoadLocations(*package.objects);
+    case KsRequest::LoadLocationsAndChannel:
+        return FillChannel(*package.objects);
+    case KsRequest::BranchNames:
+        return BranchNames(*package.objects);
+    default:
+        return ShowLocation(*package.objects);
+    }
+}
+
+LRESULT CCrossSectionView::LoadLocations(CObList& objects) const
+{
+    const CCrossSections& all = Document()->Sections();
+    for (const int index : all.ByPlace()) {
+        const CCrossSection& section = all.sections[std::size_t(index)];
+        auto item = std::make_unique<CKvrCBELocation>();
+        item->branch = section.branch;
+        item->chainage = section.chainage;
+        objects.push_back(std::move(item));
+    }
+    return !all.sections.empty();
+}
+
+/// Radius and width where the list lacks them and a section at the place has them.
+LRESULT CCrossSectionView::FillChannel(const CObList& objects) const
+{
+    std::multimap<std::pair<QString, double>, const CCrossSection*> places;
+    for (const CCrossSection& section : Document()->Sections().sections)
+        places.emplace(std::pair(section.branch, PlaceOf(section.chainage)), &section);
+    bool filled = false;
+    for (const auto& object : objects) {
+        auto* item = dynamic_cast<CKvrCBELocation*>(object.get());
+        if (!item)
+            continue;
+        const auto [first, last] = places.equal_range({item->branch, PlaceOf(item->chainage)});
+        for (auto place = first; place != last; ++place) {
+            for (const auto& [to, from] : {std::pair(&CKvrCBELocation::radius, &CCrossSection::radius),
+                                           std::pair(&CKvrCBELocation::width, &CCrossSection::width)}) {
+                if (!std::isnan(item->*to) || std::isnan(place->second->*from))
+                    continue;
+                item->*to = place->second->*from;
+                filled = true;
+            }
+        }
+    }
+    return filled;
+}
+
+LRESULT CCrossSectionView::BranchNames(CObList& objects) const
+{
+    QStringList known;
+    for (const auto& object : objects) {
+        if (const auto* item = dynamic_cast<const CKvrCBEText*>(object.get()))
+            known << item->text;
+    }
+    const QStringList branches = Document()->Sections().Branches();
+    for (const QString& branch : branches) {
+        if (known.contains(branch))
+            continue;
+        auto item = std::make_unique<CKvrCBEText>();
+        item->text = branch;
+        objects.push_back(std::move(item));
+    }
+    return !branches.isEmpty();
+}
+
+/// Goes to the nearest section, unless the one that is shown is as near.
+LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
+{
+    const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
+    if (!item || m_telling) // an answer to what this view tells would move its user away
+        return 0;
+    const int nearest = Document()->Sections().Nearest(item->branch, item->chainage);
+    const CCrossSection *there = Document()->Section(nearest), *here = Document()->Section(CurrentSection());
+    if (!there || (here && here->branch == there->branch &&
+                   std::abs(here->chainage - item->chainage) <= std::abs(there->chainage - item->chainage)))
+        return 0;
+    const QScopedValueRollback showing(m_showing, true);
+    GoToRow(m_sections, nearest);
+    return 0;
+}
+
+/// Tells the project where the user looks now; not while another editor leads.
+void CCrossSectionView::TellLocation()
+{
+    const CCrossSection* section = Document()->Section(CurrentSection());
+    if (!section || (section->branch == m_toldBranch && section->chainage == m_toldChainage))
+        return;
+    m_toldBranch = section->branch;
+    m_toldChainage = section->chainage;
+    if (m_showing || m_telling)
+        return;
+    const QScopedValueRollback telling(m_telling, true);
+    Document()->LocationShown(this, m_toldBranch, m_toldChainage);
+}
+
+/// For the first section of a document: a branch that the project has.
+QString CCrossSectionView::NewBranch()
+{
+    CObList items;
+    Document()->AskProject(KsRequest::BranchNames, this, &items);
+    for (const auto& item : items) {
+        const auto* text = dynamic_cast<const CKvrCBEText*>(item.get());
+        if (text && !text->text.isEmpty())
+            return text->text;
+    }
+    return tr("BRANCH");
+}
+
+void CCrossSectionView::OnProjectsChanged()
+{
+    if (m_plot && !Document()->ProjectHandle())
+        Document()->JoinProject(this);
+}
