@@ -1,7 +1,10 @@
 // The main of every test program that needs Qt: an application on the offscreen platform, the C
-// locale kept for numbers as in the shell, and settings kept away from the user's own.
+// locale kept for numbers as in the shell, and settings kept away from the user's own and from those of the tests that
+// run at the same time.
 #include <QApplication>
+#include <QSettings>
 #include <QStandardPaths>
+#include <QTemporaryDir>
 #include <gtest/gtest.h>
 
 int main(int argc, char** argv)
@@ -11,6 +14,8 @@ int main(int argc, char** argv)
     QStandardPaths::setTestModeEnabled(true);
     QCoreApplication::setOrganizationName("KVR-test");
     QCoreApplication::setApplicationName("kvr-tests");
+    const QTemporaryDir settings;
+    QSettings::setPath(QSettings::NativeFormat, QSettings::UserScope, settings.path());
     testing::InitGoogleTest(&argc, argv);
     QApplication app(argc, argv);
     return RUN_ALL_TESTS();

@@ -18,7 +18,8 @@
 
 namespace {
 
-constexpr int InitGrid = 1003, CurveEnable = 1098, CurveGrid = 1103, LoadButton = 1104, WithWidth = 1107;
+constexpr int InitGrid = 1003, CurveEnable = 1098, SystemWidth = 1100, CurveGrid = 1103, LoadButton = 1104,
+              WithWidth = 1107;
 constexpr int InitTab = 0, CurveTab = 20;
 
 /// The windows of the project, by the extension of their documents.
@@ -151,6 +152,9 @@ void LoadCurves(Robot& robot, Project& project)
     auto* enable = robot.Control<QCheckBox>(CurveEnable);
     if (enable && !enable->isChecked())
         robot.Key(enable, Qt::Key_Space);
+    auto* systemWidth = robot.Control<QCheckBox>(SystemWidth);
+    if (systemWidth && systemWidth->isChecked()) // else the column would be locked
+        robot.Key(systemWidth, Qt::Key_Space);
     const int before = grid->model()->rowCount();
     auto* load = robot.Control(LoadButton);
     robot.WithDialog([&] { robot.Key(load, Qt::Key_Space); },

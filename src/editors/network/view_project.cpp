@@ -17,6 +17,8 @@ LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
             LocationsChanged();
         return 0;
     }
+    if (request == KsRequest::LoadLocations)
+        return 0; // a network has branches, but no list of locations
     const bool known = request == KsRequest::FetchLocation || request == KsRequest::BranchNames ||
                        request == KsRequest::LoadLocationsAndChannel || request == KsRequest::LocationShown;
     if (!known)
