@@ -68,6 +68,7 @@ int main(int argc, char** argv)
         QTimer::singleShot(0, &frame, [&] {
             frame.resize(1600, 1000); // whatever the size of the screen that is not there
             Robot robot(frame, out);
+            robot.Trigger("actionSideBySide");
             DriveMainJob(robot, work + "/river.hdkv");
             DriveProjectJob(robot);
             result = Report(robot);

@@ -27,6 +27,7 @@ CWLSandBarsPage::CWLSandBarsPage(CKavo0_hdDoc* document, QWidget* parent)
             .asFormatted = &global == &sand.Slope, // slopes are far below one, three decimals show nothing of them
             .emptyIsNotGiven = true,
             .locked = [&sand, isObserved](const void*) { return (sand.Method == ObservedMethod) != isObserved; },
+            .locationValue = &global == &sand.Width ? LocationValue::Width : LocationValue::None,
             .globalNumber = &global};
     };
     using R = HDWLSandBars;

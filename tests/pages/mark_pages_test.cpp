@@ -2,6 +2,7 @@
 #include "page_fixture.h"
 
 #include "data/hd_file.h"
+#include "pages/location_loader.h"
 #include "pages/wl_curve_page.h"
 #include "pages/wl_mark_page.h"
 #include "pages/wl_sand_bars_page.h"
@@ -242,4 +243,28 @@ TEST_F(MarkPagesTest, CurveSwitchesTakeEachOtherAlong)
     EXPECT_EQ(g.SandBarIncrement.Method, 1);
     EXPECT_EQ(locked(0), "3 4 5");
     EXPECT_EQ(locked(1), "3 4 5");
+}
+
+TEST_F(MarkPagesTest, PlacesAreLoadedBelowTheGlobalRow)
+{
+    CObList places;
+    auto place = std::make_unique<CKvrCBELocation>();
+    place->branch = "MAIN";
+    place->chainage = 125;
+    place->radius = 300;
+    place->width = 42;
+    places.push_back(std::move(place));
+    g.CurveIncrement = {.Enabled = true, .Width = 7, .Radius = 8};
+    Open<CWLCurvePage>();
+    EXPECT_EQ(LoadLocations(*view->page, places, {true, true}).added, 1);
+    EXPECT_EQ(Texts(1), "Global||None|7.000|8.000|0.000");
+    EXPECT_EQ(Texts(2), "MAIN|125|None|42.000|300.000|") << "instead of the line that the empty list showed";
+    EXPECT_EQ(grid->RowCount(), 2);
+    Undo();
+    EXPECT_EQ(Texts(2), "||None|||");
+    EXPECT_EQ(g.CurveIncrement.Width, 7);
+    g.SandBarIncrement.Enabled = true;
+    Open<CWLSandBarsPage>();
+    EXPECT_EQ(LoadLocations(*view->page, places, {true, true}).added, 1);
+    EXPECT_EQ(Texts(2), "MAIN|125||42.000||");
 }

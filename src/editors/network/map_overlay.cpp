@@ -6,6 +6,7 @@
 
 #include <QCoreApplication>
 #include <QFontMetrics>
+#include <algorithm>
 #include <cmath>
 
 namespace {
@@ -109,6 +110,7 @@ void PaintPlaceLabel(QPainter& painter, const CMapStyle& style, const QRect& win
         box.moveRight(at.x() - 14);
     if (box.top() < window.top() + 4)
         box.moveTop(at.y() + 14);
+    box.moveLeft(std::max(box.left(), window.left() + 4.0)); // in a narrow window both sides are too small
     painter.setPen(QPen(style.mark, 1.2));
     painter.setBrush(style.Ground(240));
     painter.drawRoundedRect(box, 4, 4);

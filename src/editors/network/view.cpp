@@ -32,8 +32,8 @@ void CNetworkView::OnInitialUpdate()
     auto* splitter = new QSplitter(Qt::Horizontal, this);
     splitter->addWidget(m_map);
     MakeTables(splitter);
-    splitter->setStretchFactor(0, 1);
-    splitter->setStretchFactor(1, 0);
+    splitter->setStretchFactor(0, 2);
+    splitter->setStretchFactor(1, 1);
     splitter->setCollapsible(0, false);
     splitter->setSizes({860, 420}); // in proportion
     auto* layout = new QVBoxLayout(this);
