@@ -17,9 +17,9 @@ struct SectionColumn
 constexpr std::array<SectionColumn, CSectionTable::ColumnCount> Columns{{
     {QT_TRANSLATE_NOOP("CSectionTable", "Branch"), &CCrossSection::branch, nullptr, UnitGroup::None},
     {QT_TRANSLATE_NOOP("CSectionTable", "Chainage"), nullptr, &CCrossSection::chainage, UnitGroup::Chainage},
-    {QT_TRANSLATE_NOOP("CSectionTable", "Topo ID"), &CCrossSection::topoId, nullptr, UnitGroup::None},
     {QT_TRANSLATE_NOOP("CSectionTable", "Radius"), nullptr, &CCrossSection::radius, UnitGroup::Radius},
     {QT_TRANSLATE_NOOP("CSectionTable", "Width"), nullptr, &CCrossSection::width, UnitGroup::Width},
+    {QT_TRANSLATE_NOOP("CSectionTable", "Topo ID"), &CCrossSection::topoId, nullptr, UnitGroup::None},
 }};
 
 const SectionColumn& ColumnAt(int column)

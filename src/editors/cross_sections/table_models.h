@@ -41,9 +41,9 @@ public:
     {
         Branch,
         Chainage,
-        TopoId,
         Radius,
         Width,
+        TopoId,
         ColumnCount
     };
     CSectionTable(CCrossSectionDoc& document, QObject* parent);

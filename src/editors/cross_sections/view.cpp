@@ -48,6 +48,7 @@ void CCrossSectionView::MakeTables(QSplitter* splitter)
     m_pointTable = new CPointTable(*Document(), this);
     m_sections = MakeTable(m_sectionTable, "sectionTable");
     m_points = MakeTable(m_pointTable, "pointTable");
+    m_points->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
     m_lines = m_sections;
     m_sectionTitle = new QLabel;
     m_pointTitle = new QLabel;
@@ -171,7 +172,6 @@ void CCrossSectionView::Retranslate()
     m_points->setAccessibleName(tr("Points of the current cross section"));
     UnitsChanged();
     m_sections->resizeColumnsToContents();
-    m_points->resizeColumnsToContents();
 }
 
 void CCrossSectionView::changeEvent(QEvent* event)
