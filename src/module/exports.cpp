@@ -1,72 +1,24 @@
-// The functions that the shell calls, and the module's start and end.
-#include "ks/fc/plugin.h"
+// The functions that the shell calls.
+#include "ks/fc/single_editor.h"
 #include "module/kavo0_hd.h"
 #include "res/strings.h"
 
-#include <QtGlobal>
-#include <memory>
-
 namespace {
 
-// Texts and pictures live as long as the library is loaded.
-struct ModuleState
+struct HDModule
 {
-    ModuleState() { LoadModuleResources(); }
-    ~ModuleState() { FreeModuleResources(); }
-} g_module;
+    static constexpr int Bitmap = Resource::EditorBitmap;
+    static void LoadResources() { LoadModuleResources(); }
+    static void FreeResources() { FreeModuleResources(); }
+    static CMultiDocTemplate* CreateTemplate() { return CKavo0_hd::CreateMainDlg(); }
+    static CString EditorName() { return LoadString(Str::EditorName); }
+    static CString ToolBarName() { return LoadString(Str::ToolBarName); }
+    static BOOL InitToolBar(CKsToolBarEx* bar, CKsMDIFrameWnd* frame, unsigned style, unsigned controlId)
+    {
+        return CKavo0_hd::InitToolBar(bar, frame, style, controlId);
+    }
+};
 
 } // namespace
 
-extern "C" {
-
-Q_DECL_EXPORT int KsGetNumDocTemplates()
-{
-    return 1;
-}
-
-Q_DECL_EXPORT CMultiDocTemplate* KsGetDocTemplatePtr(int index)
-{
-    return index == 0 ? CKavo0_hd::CreateMainDlg() : nullptr;
-}
-
-Q_DECL_EXPORT BOOL KsGetEditorString(CString* text)
-{
-    if (!text)
-        return false;
-    *text = LoadString(Str::EditorName);
-    return true;
-}
-
-Q_DECL_EXPORT int KsGetBitmapId()
-{
-    return Resource::EditorBitmap;
-}
-
-Q_DECL_EXPORT int KsGetNumToolbars()
-{
-    return 1;
-}
-
-Q_DECL_EXPORT BOOL KsGetToolbarString(CString* text, int index)
-{
-    if (index != 0)
-        return false;
-    *text = LoadString(Str::ToolBarName);
-    return true;
-}
-
-Q_DECL_EXPORT BOOL KsInitToolbar(CKsToolBarEx* bar, CKsMDIFrameWnd* frame, unsigned style, unsigned controlId,
-                                 unsigned index)
-{
-    return index == 0 && CKavo0_hd::InitToolBar(bar, frame, style, controlId);
-}
-
-Q_DECL_EXPORT CKsToolBarEx* KsCreateToolbar(CKsMDIFrameWnd* frame, unsigned style, unsigned controlId, int index)
-{
-    if (index != 0)
-        return nullptr;
-    auto bar = std::make_unique<CKsToolBarEx>();
-    return CKavo0_hd::InitToolBar(bar.get(), frame, style, controlId) ? bar.release() : nullptr;
-}
-
-} // extern "C"
+KS_SINGLE_EDITOR(HDModule)

@@ -1,7 +1,7 @@
 // What both tables do alike, and the table of the branches.
 #include "editors/network/table_models.h"
 
-#include "editors/network/quantity.h"
+#include "editors/common/quantity.h"
 
 #include <array>
 

@@ -1,5 +1,5 @@
 // The table of radius and width along a branch.
-#include "editors/network/quantity.h"
+#include "editors/common/quantity.h"
 #include "editors/network/table_models.h"
 
 #include <algorithm>

@@ -1,6 +1,6 @@
 #include "editors/network/view.h"
 
-#include "editors/network/quantity.h"
+#include "editors/common/quantity.h"
 #include "ks/fc/message_box.h"
 
 #include <QHeaderView>
