@@ -42,6 +42,7 @@ private:
     void MakeTables(QSplitter* splitter);
     QTableView* MakeTable(CLinesTable* model, const char* name);
     void ConnectTables();
+    void CommandsChanged();
     void Retranslate();
     void UnitsChanged();
     void SectionsChanged(int index);

@@ -3,7 +3,7 @@
 #include "ks/language/language.h"
 
 #include <QAbstractItemModelTester>
-#include <QLabel>
+#include <QSignalSpy>
 
 namespace {
 
@@ -196,6 +196,9 @@ TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
     EXPECT_FALSE(view->OnCommand(CrossSectionCommand::Next));
     EXPECT_TRUE(view->OnCommand(CrossSectionCommand::Previous));
     EXPECT_FALSE(view->OnCommand(4711));
+    QSignalSpy changed(frame.get(), &CKsMDIFrameWnd::CommandStateChanged);
+    Select(view->Sections(), Main1000);
+    EXPECT_GE(changed.count(), 1) << "tool bars hear of what can be done now";
     std::set<int> known;
     for (const CKsMenuCommand& command : view->LinesMenu())
         known.insert(command.id);

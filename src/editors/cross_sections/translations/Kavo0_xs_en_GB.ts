@@ -114,10 +114,6 @@
             <translation>Bed level</translation>
         </message>
         <message>
-            <source>Width %1 %2</source>
-            <translation>Width %1 %2</translation>
-        </message>
-        <message>
             <source>This cross section has no points yet. The Insert key in the table of points adds one.</source>
             <translation>This cross section has no points yet. The Insert key in the table of points adds one.</translation>
         </message>
@@ -134,10 +130,6 @@
             <translation>Radius %1</translation>
         </message>
         <message>
-            <source>Width %1 (wider than the profile)</source>
-            <translation>Width %1 (wider than the profile)</translation>
-        </message>
-        <message>
             <source>Plot of the cross section</source>
             <translation>Plot of the cross section</translation>
         </message>
@@ -150,6 +142,14 @@
 Bed level %2</source>
             <translation>Offset %1
 Bed level %2</translation>
+        </message>
+        <message>
+            <source>Width %1 (not within the profile)</source>
+            <translation>Width %1 (not within the profile)</translation>
+        </message>
+        <message>
+            <source>Width %1</source>
+            <translation>Width %1</translation>
         </message>
     </context>
     <context>

@@ -114,10 +114,6 @@
             <translation>河床高</translation>
         </message>
         <message>
-            <source>Width %1 %2</source>
-            <translation>水面幅 %1 %2</translation>
-        </message>
-        <message>
             <source>This cross section has no points yet. The Insert key in the table of points adds one.</source>
             <translation>この横断面にはまだ測点がありません。測点の表でInsertキーを押すと追加できます。</translation>
         </message>
@@ -134,10 +130,6 @@
             <translation>曲率半径 %1</translation>
         </message>
         <message>
-            <source>Width %1 (wider than the profile)</source>
-            <translation>水面幅 %1(横断形状より広い)</translation>
-        </message>
-        <message>
             <source>Plot of the cross section</source>
             <translation>横断図</translation>
         </message>
@@ -150,6 +142,14 @@
 Bed level %2</source>
             <translation>横断距離 %1
 河床高 %2</translation>
+        </message>
+        <message>
+            <source>Width %1 (not within the profile)</source>
+            <translation>水面幅 %1(横断形状に収まらない)</translation>
+        </message>
+        <message>
+            <source>Width %1</source>
+            <translation>水面幅 %1</translation>
         </message>
     </context>
     <context>
