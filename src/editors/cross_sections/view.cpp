@@ -76,8 +76,10 @@ QTableView* CCrossSectionView::MakeTable(CLinesTable* model, const char* name)
     table->horizontalHeader()->setHighlightSections(false);
     table->horizontalHeader()->setStretchLastSection(true);
     table->verticalHeader()->setDefaultSectionSize(table->fontMetrics().height() + 8);
-    for (const auto& [key, run] : {std::pair(Qt::Key_Delete, &CCrossSectionView::DeleteLines),
-                                   std::pair(Qt::Key_Insert, &CCrossSectionView::InsertLine)}) {
+    for (const auto& [key, run] : {std::pair(QKeySequence(Qt::Key_Delete), &CCrossSectionView::DeleteLines),
+                                   std::pair(QKeySequence(Qt::Key_Insert), &CCrossSectionView::InsertLine),
+                                   std::pair(QKeySequence(QKeySequence::Copy), &CCrossSectionView::CopyLines),
+                                   std::pair(QKeySequence(QKeySequence::Paste), &CCrossSectionView::PasteLines)}) {
         auto* action = new QAction(table);
         action->setShortcut(key);
         action->setShortcutContext(Qt::WidgetShortcut);

@@ -102,6 +102,18 @@
             <source>Insert Point</source>
             <translation>Insert Point</translation>
         </message>
+        <message>
+            <source>Line %1 of the pasted text: expected an offset and a bed level, found "%2".</source>
+            <translation>Line %1 of the pasted text: expected an offset and a bed level, found "%2".</translation>
+        </message>
+        <message>
+            <source>The pasted text does not fit here: %1</source>
+            <translation>The pasted text does not fit here: %1</translation>
+        </message>
+        <message>
+            <source>Paste Points</source>
+            <translation>Paste Points</translation>
+        </message>
     </context>
     <context>
         <name>CSectionPlot</name>

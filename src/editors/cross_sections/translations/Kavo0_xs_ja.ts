@@ -102,6 +102,18 @@
             <source>Insert Point</source>
             <translation>測点の挿入</translation>
         </message>
+        <message>
+            <source>Line %1 of the pasted text: expected an offset and a bed level, found "%2".</source>
+            <translation>貼り付けるテキストの%1行目: 横断距離と河床高が必要です(内容: 「%2」)。</translation>
+        </message>
+        <message>
+            <source>The pasted text does not fit here: %1</source>
+            <translation>ここには貼り付けられません: %1</translation>
+        </message>
+        <message>
+            <source>Paste Points</source>
+            <translation>測点の貼り付け</translation>
+        </message>
     </context>
     <context>
         <name>CSectionPlot</name>
