@@ -36,3 +36,9 @@ inline QString WithUnit(const QString& name, UnitGroup group)
 {
     return QStringLiteral("%1 [%2]").arg(name, CKsEditStyle(group).UnitSymbol());
 }
+
+/// "12.5 m"
+inline QString WithSymbol(UnitGroup group, double value)
+{
+    return QStringLiteral("%1 %2").arg(ShowQuantity(group, value), CKsEditStyle(group).UnitSymbol());
+}

@@ -42,3 +42,15 @@ bool CLinesTable::Replace(const QModelIndex& index, int section, CCrossSection c
     m_document.ReplaceSection(section, std::move(changed), text);
     return true;
 }
+
+QString CLinesTable::TextOf(const std::vector<int>& rows) const
+{
+    QString text;
+    for (const int row : rows) {
+        QStringList cells;
+        for (int column = 0; column < columnCount(); ++column)
+            cells << index(row, column).data(Qt::EditRole).toString();
+        text += cells.join(u'\t') + u'\n';
+    }
+    return text;
+}

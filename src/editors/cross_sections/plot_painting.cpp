@@ -159,9 +159,7 @@ void CSectionPlot::PaintWidth(QPainter& painter, const CPlotStyle& style) const
         if (right.x() - left.x() > 3 * head)
             painter.drawPolygon(QPolygonF{{x, y}, {x + way * head, y - slim}, {x + way * head, y + slim}});
     }
-    const QString label =
-        tr("Width %1 %2")
-            .arg(ShowQuantity(UnitGroup::Width, m_section->width), CKsEditStyle(UnitGroup::Width).UnitSymbol());
+    const QString label = tr("Width %1").arg(WithSymbol(UnitGroup::Width, m_section->width));
     QRectF box(0, 0, fontMetrics().horizontalAdvance(label) + 0.6 * line, 1.15 * line);
     box.moveCenter({(left.x() + right.x()) / 2, y - 0.75 * line});
     box.moveLeft(

@@ -1,6 +1,7 @@
 #include "editors/common/quantity.h"
 #include "editors/cross_sections/table_models.h"
 
+#include <QRegularExpression>
 #include <algorithm>
 #include <array>
 #include <numeric>
@@ -111,4 +112,38 @@ int CPointTable::InsertLine(int row)
     points.insert(points.begin() + at + 1, point);
     m_document.ReplaceSection(m_section, std::move(section), tr("Insert Point"));
     return at + 1;
+}
+
+int CPointTable::InsertText(int row, const QString& text)
+{
+    static const QRegularExpression lineEnd(QStringLiteral("\r\n|\r|\n")), separator(QStringLiteral("[\t;]"));
+    const QStringList lines = text.split(lineEnd);
+    if (!Current() || text.trimmed().isEmpty())
+        return -1;
+    std::vector<CSectionPoint> pasted;
+    for (qsizetype i = 0; i < lines.size(); ++i) {
+        if (lines[i].trimmed().isEmpty())
+            continue;
+        const QStringList cells = lines[i].split(separator);
+        const auto offset = ReadQuantity(ColumnAt(Offset).group, cells.value(Offset));
+        const auto level = ReadQuantity(ColumnAt(Level).group, cells.value(Level));
+        if (!offset || !level || cells.size() != ColumnCount) {
+            emit Refused(tr("Line %1 of the pasted text: expected an offset and a bed level, found \"%2\".")
+                             .arg(i + 1)
+                             .arg(lines[i].simplified()));
+            return -1;
+        }
+        pasted.push_back({*offset, *level});
+    }
+    CCrossSection section = *Current();
+    auto& points = section.points;
+    const int last = static_cast<int>(points.size()) - 1;
+    const int at = (row < 0 ? last : std::min(row, last)) + 1;
+    points.insert(points.begin() + at, pasted.begin(), pasted.end());
+    if (const QString reason = m_document.WhyNot(m_section, section); !reason.isEmpty()) {
+        emit Refused(tr("The pasted text does not fit here: %1").arg(reason));
+        return -1;
+    }
+    m_document.ReplaceSection(m_section, std::move(section), tr("Paste Points"));
+    return at + static_cast<int>(pasted.size()) - 1;
 }

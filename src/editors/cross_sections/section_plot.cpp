@@ -21,11 +21,6 @@ constexpr PlotKey Keys[] = {{Qt::Key_PageUp, -1, 0}, {Qt::Key_PageDown, 1, 0}, {
 
 constexpr double Reach = 12; // pixels from a point that still hit it
 
-QString WithSymbol(UnitGroup group, double value)
-{
-    return QStringLiteral("%1 %2").arg(ShowQuantity(group, value), CKsEditStyle(group).UnitSymbol());
-}
-
 } // namespace
 
 CSectionPlot::CSectionPlot(QWidget* parent) : QWidget(parent)
@@ -64,8 +59,10 @@ QString CSectionPlot::Caption() const
         parts << tr("Topo ID %1").arg(m_section->topoId);
     if (!std::isnan(m_section->radius))
         parts << tr("Radius %1").arg(WithSymbol(UnitGroup::Radius, m_section->radius));
-    if (!std::isnan(m_section->width) && !m_water) // otherwise it stands at the marker
-        parts << tr("Width %1 (wider than the profile)").arg(WithSymbol(UnitGroup::Width, m_section->width));
+    if (!std::isnan(m_section->width) && !m_water) { // otherwise it stands at the marker
+        const QString width = WithSymbol(UnitGroup::Width, m_section->width);
+        parts << (HasPoints() ? tr("Width %1 (not within the profile)").arg(width) : tr("Width %1").arg(width));
+    }
     return parts.join(QStringLiteral("  \u00b7  "));
 }
 

@@ -15,6 +15,8 @@ public:
     /// Shows the document's present state.
     void Reload();
     virtual void RemoveLines(const std::vector<int>& rows) = 0;
+    /// The lines as text for a spreadsheet, in the user's units with every digit: cells separated by tabs.
+    QString TextOf(const std::vector<int>& rows) const;
 
 signals:
     /// For the user: where, what was expected and what was typed.
@@ -81,6 +83,10 @@ public:
     void RemoveLines(const std::vector<int>& rows) override;
     /// Adds a point behind `row` (-1: at the end), half way to the next one. Returns its row; -1 without a section.
     int InsertLine(int row);
+    /// Adds the points of a text behind `row`: lines of offset and bed level in the user's units, separated by tabs or
+    /// semicolons. All or none. Returns the row of the last one; -1 when there is none, after a message when that is
+    /// the text's fault.
+    int InsertText(int row, const QString& text);
 
 protected:
     int Lines() const override;

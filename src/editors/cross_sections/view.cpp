@@ -21,10 +21,10 @@ void CCrossSectionView::OnInitialUpdate()
     auto* splitter = new QSplitter(Qt::Horizontal, this);
     splitter->addWidget(m_plot);
     MakeTables(splitter);
-    splitter->setStretchFactor(0, 1);
-    splitter->setStretchFactor(1, 0);
+    splitter->setStretchFactor(0, 8); // in proportion, whatever the window's size
+    splitter->setStretchFactor(1, 5);
     splitter->setCollapsible(0, false);
-    splitter->setSizes({780, 500}); // in proportion
+    splitter->setSizes({800, 500});
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(splitter);
@@ -76,8 +76,10 @@ QTableView* CCrossSectionView::MakeTable(CLinesTable* model, const char* name)
     table->horizontalHeader()->setHighlightSections(false);
     table->horizontalHeader()->setStretchLastSection(true);
     table->verticalHeader()->setDefaultSectionSize(table->fontMetrics().height() + 8);
-    for (const auto& [key, run] : {std::pair(Qt::Key_Delete, &CCrossSectionView::DeleteLines),
-                                   std::pair(Qt::Key_Insert, &CCrossSectionView::InsertLine)}) {
+    for (const auto& [key, run] : {std::pair(QKeySequence(Qt::Key_Delete), &CCrossSectionView::DeleteLines),
+                                   std::pair(QKeySequence(Qt::Key_Insert), &CCrossSectionView::InsertLine),
+                                   std::pair(QKeySequence(QKeySequence::Copy), &CCrossSectionView::CopyLines),
+                                   std::pair(QKeySequence(QKeySequence::Paste), &CCrossSectionView::PasteLines)}) {
         auto* action = new QAction(table);
         action->setShortcut(key);
         action->setShortcutContext(Qt::WidgetShortcut);
@@ -99,6 +101,9 @@ void CCrossSectionView::ConnectTables()
             &CCrossSectionView::CurrentSectionChanged);
     connect(m_points->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
             [this](const QModelIndex& now) { m_plot->SetCurrentPoint(now.row()); });
+    for (const QTableView* table : {m_sections, m_points})
+        connect(table->selectionModel(), &QItemSelectionModel::selectionChanged, this,
+                &CCrossSectionView::CommandsChanged);
     connect(Document(), &CCrossSectionDoc::SectionsChanged, this, &CCrossSectionView::SectionsChanged);
     connect(m_plot, &CSectionPlot::PointPicked, this, [this](int point) { GoToRow(m_points, point); });
     connect(m_plot, &CSectionPlot::SectionStep, this, &CCrossSectionView::StepSection);
@@ -109,6 +114,13 @@ void CCrossSectionView::ConnectTables()
                 m_lines = table;
         }
     });
+}
+
+/// Tool bars show what can be done with what is selected.
+void CCrossSectionView::CommandsChanged()
+{
+    if (auto* frame = qobject_cast<CKsMDIFrameWnd*>(window()))
+        emit frame->CommandStateChanged();
 }
 
 int CCrossSectionView::CurrentSection() const
@@ -141,6 +153,7 @@ void CCrossSectionView::SectionsChanged(int index)
     ShowSection();
     if (go == row && point >= 0 && m_pointTable->rowCount() > 0)
         GoToRow(m_points, std::min(point, m_pointTable->rowCount() - 1));
+    CommandsChanged(); // a table that was filled anew has no selection, and does not say so
 }
 
 void CCrossSectionView::CurrentSectionChanged()

@@ -42,6 +42,7 @@ private:
     void MakeTables(QSplitter* splitter);
     QTableView* MakeTable(CLinesTable* model, const char* name);
     void ConnectTables();
+    void CommandsChanged();
     void Retranslate();
     void UnitsChanged();
     void SectionsChanged(int index);
@@ -51,6 +52,9 @@ private:
     void ShowContextMenu(QTableView* table, const QPoint& at);
     void InsertLine();
     void DeleteLines();
+    void CopyLines();
+    void PasteLines();
+    std::vector<int> SelectedRows() const;
     void GoToRow(QTableView* table, int row) const;
     void StepSection(int step);
     bool HasFocusWithin() const;

@@ -1,8 +1,11 @@
 // The commands of the cross sections' view.
 #include "editors/cross_sections/view.h"
 
+#include <QClipboard>
+#include <QGuiApplication>
 #include <QMenu>
 #include <QTableView>
+#include <algorithm>
 
 std::vector<CKsMenuCommand> CCrossSectionView::LinesMenu() const
 {
@@ -29,6 +32,10 @@ bool CCrossSectionView::IsCommandEnabled(int id) const
         return m_lines == m_sections || CurrentSection() >= 0;
     case CrossSectionCommand::DeleteLine:
         return m_lines->selectionModel()->hasSelection();
+    case KsCommand::Copy: // a cell's editor has a text of its own
+        return m_lines->hasFocus() && m_lines->selectionModel()->hasSelection();
+    case KsCommand::Paste:
+        return m_points->hasFocus() && CurrentSection() >= 0;
     case CrossSectionCommand::Previous:
         return CurrentSection() > 0;
     case CrossSectionCommand::Next:
@@ -48,6 +55,12 @@ bool CCrossSectionView::OnCommand(int id)
         break;
     case CrossSectionCommand::DeleteLine:
         DeleteLines();
+        break;
+    case KsCommand::Copy:
+        CopyLines();
+        break;
+    case KsCommand::Paste:
+        PasteLines();
         break;
     default:
         StepSection(id == CrossSectionCommand::Next ? 1 : -1);
@@ -90,11 +103,33 @@ void CCrossSectionView::InsertLine()
     table->setFocus();
 }
 
-void CCrossSectionView::DeleteLines()
+/// Increasing.
+std::vector<int> CCrossSectionView::SelectedRows() const
 {
     std::vector<int> rows;
     const auto selected = m_lines->selectionModel()->selectedRows();
     for (const QModelIndex& index : selected)
         rows.push_back(index.row());
-    static_cast<CLinesTable*>(m_lines->model())->RemoveLines(rows);
+    std::sort(rows.begin(), rows.end());
+    return rows;
+}
+
+void CCrossSectionView::DeleteLines()
+{
+    static_cast<CLinesTable*>(m_lines->model())->RemoveLines(SelectedRows());
+}
+
+void CCrossSectionView::CopyLines()
+{
+    if (const QString text = static_cast<CLinesTable*>(m_lines->model())->TextOf(SelectedRows()); !text.isEmpty())
+        QGuiApplication::clipboard()->setText(text);
+}
+
+void CCrossSectionView::PasteLines()
+{
+    if (!IsCommandEnabled(KsCommand::Paste))
+        return;
+    const int row = m_pointTable->InsertText(m_points->currentIndex().row(), QGuiApplication::clipboard()->text());
+    if (row >= 0)
+        GoToRow(m_points, row);
 }

@@ -3,7 +3,8 @@
 #include "ks/language/language.h"
 
 #include <QAbstractItemModelTester>
-#include <QLabel>
+#include <QClipboard>
+#include <QSignalSpy>
 
 namespace {
 
@@ -184,6 +185,48 @@ TEST_F(CrossSectionTest, PointsAreInsertedAndDeletedWithKeys)
     EXPECT_EQ(view->Sections()->model()->rowCount(), SmallRows) << "the lines are those of the table with the focus";
 }
 
+TEST_F(CrossSectionTest, LinesGoToASpreadsheetAndPointsComeBack)
+{
+    CCrossSectionView* view = Open();
+    QClipboard* clipboard = QGuiApplication::clipboard();
+    Select(view->Sections(), Main2500);
+    EXPECT_TRUE(view->OnCommand(KsCommand::Copy));
+    EXPECT_EQ(clipboard->text(), "MAIN\t2500.5\t400\t20\t2019\n");
+    EXPECT_FALSE(view->IsCommandEnabled(KsCommand::Paste)) << "sections are not pasted";
+    QTableView* table = view->Points();
+    table->setFocus();
+    table->selectAll();
+    QTest::keyClick(table, Qt::Key_C, Qt::ControlModifier);
+    EXPECT_EQ(clipboard->text(), "0\t110\n10\t100\n20\t100\n30\t110\n");
+
+    struct Case
+    {
+        const char *text, *message; // no message: the points are added
+        int rows;
+    };
+    const Case cases[] = {
+        {"", nullptr, 4},
+        {"0;110\r\n\r\n 1.5 ; 109 \r\n", nullptr, 6},
+        {"0\t110\nend\t1\n", "Line 2 of the pasted text: expected an offset and a bed level, found", 4},
+        {"0\t110\t3", "Line 1 of the pasted text: expected", 4},
+        {"20\t110", "The pasted text does not fit here: expected offsets that do not decrease", 4}};
+    for (const Case& each : cases) {
+        Select(table, 0);
+        clipboard->setText(each.text);
+        QTest::keyClick(table, Qt::Key_V, Qt::ControlModifier);
+        QCoreApplication::processEvents();
+        EXPECT_EQ(table->model()->rowCount(), each.rows) << each.text;
+        ASSERT_EQ(boxes.size(), each.message ? 1 : 0) << each.text;
+        if (each.message) {
+            EXPECT_TRUE(boxes.takeFirst().startsWith(each.message)) << each.message;
+        }
+        UndoAll(view);
+    }
+    table->edit(table->model()->index(0, P::Level));
+    EXPECT_FALSE(view->IsCommandEnabled(KsCommand::Copy)) << "the editor's own text";
+    EXPECT_FALSE(view->IsCommandEnabled(KsCommand::Paste));
+}
+
 TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
 {
     CCrossSectionView* view = Open();
@@ -196,6 +239,9 @@ TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
     EXPECT_FALSE(view->OnCommand(CrossSectionCommand::Next));
     EXPECT_TRUE(view->OnCommand(CrossSectionCommand::Previous));
     EXPECT_FALSE(view->OnCommand(4711));
+    QSignalSpy changed(frame.get(), &CKsMDIFrameWnd::CommandStateChanged);
+    Select(view->Sections(), Main1000);
+    EXPECT_GE(changed.count(), 1) << "tool bars hear of what can be done now";
     std::set<int> known;
     for (const CKsMenuCommand& command : view->LinesMenu())
         known.insert(command.id);

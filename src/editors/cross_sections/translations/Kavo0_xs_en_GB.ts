@@ -102,6 +102,18 @@
             <source>Insert Point</source>
             <translation>Insert Point</translation>
         </message>
+        <message>
+            <source>Line %1 of the pasted text: expected an offset and a bed level, found "%2".</source>
+            <translation>Line %1 of the pasted text: expected an offset and a bed level, found "%2".</translation>
+        </message>
+        <message>
+            <source>The pasted text does not fit here: %1</source>
+            <translation>The pasted text does not fit here: %1</translation>
+        </message>
+        <message>
+            <source>Paste Points</source>
+            <translation>Paste Points</translation>
+        </message>
     </context>
     <context>
         <name>CSectionPlot</name>
@@ -112,10 +124,6 @@
         <message>
             <source>Bed level</source>
             <translation>Bed level</translation>
-        </message>
-        <message>
-            <source>Width %1 %2</source>
-            <translation>Width %1 %2</translation>
         </message>
         <message>
             <source>This cross section has no points yet. The Insert key in the table of points adds one.</source>
@@ -134,10 +142,6 @@
             <translation>Radius %1</translation>
         </message>
         <message>
-            <source>Width %1 (wider than the profile)</source>
-            <translation>Width %1 (wider than the profile)</translation>
-        </message>
-        <message>
             <source>Plot of the cross section</source>
             <translation>Plot of the cross section</translation>
         </message>
@@ -150,6 +154,14 @@
 Bed level %2</source>
             <translation>Offset %1
 Bed level %2</translation>
+        </message>
+        <message>
+            <source>Width %1 (not within the profile)</source>
+            <translation>Width %1 (not within the profile)</translation>
+        </message>
+        <message>
+            <source>Width %1</source>
+            <translation>Width %1</translation>
         </message>
     </context>
     <context>

@@ -102,6 +102,18 @@
             <source>Insert Point</source>
             <translation>測点の挿入</translation>
         </message>
+        <message>
+            <source>Line %1 of the pasted text: expected an offset and a bed level, found "%2".</source>
+            <translation>貼り付けるテキストの%1行目: 横断距離と河床高が必要です(内容: 「%2」)。</translation>
+        </message>
+        <message>
+            <source>The pasted text does not fit here: %1</source>
+            <translation>ここには貼り付けられません: %1</translation>
+        </message>
+        <message>
+            <source>Paste Points</source>
+            <translation>測点の貼り付け</translation>
+        </message>
     </context>
     <context>
         <name>CSectionPlot</name>
@@ -112,10 +124,6 @@
         <message>
             <source>Bed level</source>
             <translation>河床高</translation>
-        </message>
-        <message>
-            <source>Width %1 %2</source>
-            <translation>水面幅 %1 %2</translation>
         </message>
         <message>
             <source>This cross section has no points yet. The Insert key in the table of points adds one.</source>
@@ -134,10 +142,6 @@
             <translation>曲率半径 %1</translation>
         </message>
         <message>
-            <source>Width %1 (wider than the profile)</source>
-            <translation>水面幅 %1(横断形状より広い)</translation>
-        </message>
-        <message>
             <source>Plot of the cross section</source>
             <translation>横断図</translation>
         </message>
@@ -150,6 +154,14 @@
 Bed level %2</source>
             <translation>横断距離 %1
 河床高 %2</translation>
+        </message>
+        <message>
+            <source>Width %1 (not within the profile)</source>
+            <translation>水面幅 %1(横断形状に収まらない)</translation>
+        </message>
+        <message>
+            <source>Width %1</source>
+            <translation>水面幅 %1</translation>
         </message>
     </context>
     <context>
