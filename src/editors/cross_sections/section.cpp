@@ -30,7 +30,7 @@ int CCrossSections::Nearest(const QString& branch, double chainage) const
     double least = HUGE_VAL;
     for (std::size_t i = 0; i < sections.size(); ++i) {
         const double distance = std::abs(sections[i].chainage - chainage);
-        if (sections[i].branch == branch && distance < least) {
+        if (distance < least && sections[i].branch.compare(branch, Qt::CaseInsensitive) == 0) {
             least = distance;
             nearest = static_cast<int>(i);
         }

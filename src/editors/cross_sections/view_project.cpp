@@ -43,18 +43,19 @@ LRESULT CCrossSectionView::LoadLocations(CObList& objects) const
     return !all.sections.empty();
 }
 
-/// Radius and width where the list lacks them and a section at the place has them.
+/// Radius and width where the list lacks them and a section at the place has them. The case of names does not matter:
+/// the HD parameters keep them in capitals.
 LRESULT CCrossSectionView::FillChannel(const CObList& objects) const
 {
     std::multimap<std::pair<QString, double>, const CCrossSection*> places;
     for (const CCrossSection& section : Document()->Sections().sections)
-        places.emplace(std::pair(section.branch, PlaceOf(section.chainage)), &section);
+        places.emplace(std::pair(section.branch.toCaseFolded(), PlaceOf(section.chainage)), &section);
     bool filled = false;
     for (const auto& object : objects) {
         auto* item = dynamic_cast<CKvrCBELocation*>(object.get());
         if (!item)
             continue;
-        const auto [first, last] = places.equal_range({item->branch, PlaceOf(item->chainage)});
+        const auto [first, last] = places.equal_range({item->branch.toCaseFolded(), PlaceOf(item->chainage)});
         for (auto place = first; place != last; ++place) {
             for (const auto& [to, from] : {std::pair(&CKvrCBELocation::radius, &CCrossSection::radius),
                                            std::pair(&CKvrCBELocation::width, &CCrossSection::width)}) {

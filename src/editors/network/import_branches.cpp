@@ -53,7 +53,7 @@ std::optional<double> Number(const CGisLine& line, int field)
 QString FreeName(const QString& wanted, const QSet<QString>& taken)
 {
     QString name = wanted;
-    for (int number = 2; taken.contains(name); ++number)
+    for (int number = 2; taken.contains(name.toCaseFolded()); ++number)
         name = QStringLiteral("%1 (%2)").arg(wanted).arg(number);
     return name;
 }
@@ -96,7 +96,7 @@ std::vector<CNetworkBranch> MakeBranches(const CGisLayer& layer, const CImportFi
 {
     QSet<QString> taken;
     for (const CNetworkBranch& branch : network.branches)
-        taken << branch.name;
+        taken << branch.name.toCaseFolded();
     std::vector<CNetworkBranch> branches;
     for (const CGisLine& line : layer.lines) {
         CNetworkBranch branch;
@@ -105,7 +105,7 @@ std::vector<CNetworkBranch> MakeBranches(const CGisLayer& layer, const CImportFi
         branch.name = FreeName(given.isEmpty() ? ImportBranches::tr("Branch") : given, taken);
         if (!given.isEmpty() && branch.name != given)
             notes << ImportBranches::tr("\"%1\" is taken and becomes \"%2\".").arg(given, branch.name);
-        taken << branch.name;
+        taken << branch.name.toCaseFolded();
         const auto start = Number(line, fields.start), end = Number(line, fields.end);
         const bool both = start && end && *start != *end;
         if (!both && fields.start >= 0)

@@ -21,12 +21,17 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
     const CNetwork& network = document.Network();
     QHash<QString, int> branches;
     for (std::size_t i = 0; i < network.branches.size(); ++i)
-        branches.insert(network.branches[i].name, static_cast<int>(i));
+        branches.insert(network.branches[i].name.toCaseFolded(), static_cast<int>(i));
     std::vector<CPlacedLocation> placed;
     placed.reserve(locations.size());
+    QString name; // of the location before: most follow one of the same branch
+    int branch = -1;
     for (std::size_t i = 0; i < locations.size(); ++i) {
         const CMapLocation& location = locations[i];
-        const int branch = branches.value(location.branch, -1);
+        if (name != location.branch || i == 0) {
+            name = location.branch;
+            branch = branches.value(name.toCaseFolded(), -1);
+        }
         const auto point = document.Reference().PointAt(branch, location.chainage);
         if (!point)
             continue;

@@ -19,8 +19,9 @@ void CNetworkBranch::SortChannel()
 
 int CNetwork::FindBranch(const QString& name) const
 {
-    const auto found =
-        std::find_if(branches.begin(), branches.end(), [&](const CNetworkBranch& each) { return each.name == name; });
+    const auto found = std::find_if(branches.begin(), branches.end(), [&](const CNetworkBranch& each) {
+        return each.name.compare(name, Qt::CaseInsensitive) == 0;
+    });
     return found == branches.end() ? -1 : static_cast<int>(found - branches.begin());
 }
 

@@ -93,7 +93,7 @@ TEST_F(NetworkTest, LocationsAreFetchedAtTheStartAndWhenDataChange)
     EXPECT_EQ(view->Map()->PlacedCount(), 2u);
     EXPECT_EQ(view->Map()->Locations()[0].file, hdDoc.GetPathName());
 
-    hdLocations.push_back({"SIDE", 250, HDMixingData, {}, KsUnset});
+    hdLocations.push_back({"Side", 250, HDMixingData, {}, KsUnset}); // in whatever case
     log.clear();
     for (int i = 0; i < 5; ++i)
         Ask(view, KsRequest::DataChanged, nullptr);
