@@ -129,6 +129,10 @@ TEST_F(CrossSectionTest, SectionsAreInsertedAndDeletedWithKeys)
     QTest::keyClick(table, Qt::Key_Insert); // behind the only one of its branch
     QTest::keyClick(table, Qt::Key_Insert); // as far again
     EXPECT_EQ(chainages(), "MAIN1000 MAIN1750.25 MAIN2500.5 MAIN2500.5 SIDE300 SIDE400 SIDE500");
+    view->Document()->UndoStack().undo();
+    EXPECT_EQ(view->CurrentSection(), 5) << "the line above the one that is gone";
+    view->Document()->UndoStack().redo();
+    EXPECT_EQ(view->CurrentSection(), 6);
     QTest::keyClick(table, Qt::Key_Up, Qt::ShiftModifier);
     QTest::keyClick(table, Qt::Key_Delete);
     EXPECT_EQ(chainages(), "MAIN1000 MAIN1750.25 MAIN2500.5 MAIN2500.5 SIDE300");
