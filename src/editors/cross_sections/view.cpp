@@ -21,10 +21,10 @@ void CCrossSectionView::OnInitialUpdate()
     auto* splitter = new QSplitter(Qt::Horizontal, this);
     splitter->addWidget(m_plot);
     MakeTables(splitter);
-    splitter->setStretchFactor(0, 8); // in proportion, whatever the window's size
+    splitter->setStretchFactor(0, 7); // in proportion, whatever the window's size
     splitter->setStretchFactor(1, 5);
     splitter->setCollapsible(0, false);
-    splitter->setSizes({800, 500});
+    splitter->setSizes({700, 500});
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(splitter);

@@ -4,7 +4,9 @@
 
 #include <QAbstractItemModelTester>
 #include <QClipboard>
+#include <QMenu>
 #include <QSignalSpy>
+#include <QTimer>
 
 namespace {
 
@@ -250,6 +252,24 @@ TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
     for (const CKsMenuCommand& command : view->LinesMenu())
         known.insert(command.id);
     EXPECT_EQ(known.size(), 5u) << "four commands and a separator";
+}
+
+TEST_F(CrossSectionTest, TheContextMenuIsAboutTheTableItWasAskedFor)
+{
+    CCrossSectionView* view = Open();
+    QStringList offered;
+    QTimer::singleShot(0, view, [&] {
+        auto* menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
+        ASSERT_NE(menu, nullptr);
+        for (const QAction* action : menu->actions())
+            offered << (action->isEnabled() ? action->text().remove('&') : QString("-"));
+        menu->actions().at(0)->trigger();
+        menu->close();
+    });
+    emit view->Points()->customContextMenuRequested({5, 5}); // the focus is in the other table
+    EXPECT_EQ(offered, QStringList({"Insert Line", "-", "", "-", "Next Cross Section"}));
+    EXPECT_EQ(view->Points()->model()->rowCount(), 3);
+    EXPECT_EQ(view->Sections()->model()->rowCount(), SmallRows);
 }
 
 TEST_F(CrossSectionTest, TextsFollowTheLanguage)
