@@ -15,6 +15,11 @@ CCrossSectionView::CCrossSectionView(QWidget* parent) : CProjectView(parent)
     setObjectName(QStringLiteral("crossSectionView"));
 }
 
+CCrossSectionView::~CCrossSectionView()
+{
+    disconnect(qApp, nullptr, this, nullptr); // the tables lose the focus when this is no such view any more
+}
+
 void CCrossSectionView::OnInitialUpdate()
 {
     m_plot = new CSectionPlot;
