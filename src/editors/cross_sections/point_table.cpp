@@ -109,7 +109,7 @@ int CPointTable::InsertLine(int row)
             point.offset += at > 0 ? point.offset - points[std::size_t(at) - 1].offset : step;
         }
     }
-    points.insert(points.begin() + at + 1, point);
+    points.insert(points.begin() + (at + 1), point);
     m_document.ReplaceSection(m_section, std::move(section), tr("Insert Point"));
     return at + 1;
 }

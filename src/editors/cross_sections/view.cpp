@@ -15,16 +15,21 @@ CCrossSectionView::CCrossSectionView(QWidget* parent) : CProjectView(parent)
     setObjectName(QStringLiteral("crossSectionView"));
 }
 
+CCrossSectionView::~CCrossSectionView()
+{
+    disconnect(qApp, nullptr, this, nullptr); // the tables lose the focus when this is no such view any more
+}
+
 void CCrossSectionView::OnInitialUpdate()
 {
     m_plot = new CSectionPlot;
     auto* splitter = new QSplitter(Qt::Horizontal, this);
     splitter->addWidget(m_plot);
     MakeTables(splitter);
-    splitter->setStretchFactor(0, 8); // in proportion, whatever the window's size
+    splitter->setStretchFactor(0, 7); // in proportion, whatever the window's size
     splitter->setStretchFactor(1, 5);
     splitter->setCollapsible(0, false);
-    splitter->setSizes({800, 500});
+    splitter->setSizes({700, 500});
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(splitter);

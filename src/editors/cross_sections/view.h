@@ -19,6 +19,7 @@ class CCrossSectionView : public CProjectView
     Q_OBJECT
 public:
     explicit CCrossSectionView(QWidget* parent = nullptr);
+    ~CCrossSectionView() override;
 
     CCrossSectionDoc* Document() const { return static_cast<CCrossSectionDoc*>(GetDocument()); }
     CSectionPlot* Plot() const { return m_plot; }

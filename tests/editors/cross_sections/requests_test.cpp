@@ -96,6 +96,7 @@ TEST_F(CrossSectionTest, APlaceShownElsewhereSelectsTheNearestSectionAndIsNotTol
         EXPECT_EQ(view->Points()->model()->rowCount(),
                   int(view->Document()->Sections().sections[std::size_t(each.row)].points.size()));
     }
+    EXPECT_TRUE(log.isEmpty()) << log.join(' ').toStdString();
     Select(view->Sections(), Main2500Later);
     log.clear();
     CObList objects;

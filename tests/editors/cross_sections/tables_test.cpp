@@ -4,7 +4,9 @@
 
 #include <QAbstractItemModelTester>
 #include <QClipboard>
+#include <QMenu>
 #include <QSignalSpy>
+#include <QTimer>
 
 namespace {
 
@@ -129,6 +131,10 @@ TEST_F(CrossSectionTest, SectionsAreInsertedAndDeletedWithKeys)
     QTest::keyClick(table, Qt::Key_Insert); // behind the only one of its branch
     QTest::keyClick(table, Qt::Key_Insert); // as far again
     EXPECT_EQ(chainages(), "MAIN1000 MAIN1750.25 MAIN2500.5 MAIN2500.5 SIDE300 SIDE400 SIDE500");
+    view->Document()->UndoStack().undo();
+    EXPECT_EQ(view->CurrentSection(), 5) << "the line above the one that is gone";
+    view->Document()->UndoStack().redo();
+    EXPECT_EQ(view->CurrentSection(), 6);
     QTest::keyClick(table, Qt::Key_Up, Qt::ShiftModifier);
     QTest::keyClick(table, Qt::Key_Delete);
     EXPECT_EQ(chainages(), "MAIN1000 MAIN1750.25 MAIN2500.5 MAIN2500.5 SIDE300");
@@ -246,6 +252,24 @@ TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
     for (const CKsMenuCommand& command : view->LinesMenu())
         known.insert(command.id);
     EXPECT_EQ(known.size(), 5u) << "four commands and a separator";
+}
+
+TEST_F(CrossSectionTest, TheContextMenuIsAboutTheTableItWasAskedFor)
+{
+    CCrossSectionView* view = Open();
+    QStringList offered;
+    QTimer::singleShot(0, view, [&] {
+        auto* menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
+        ASSERT_NE(menu, nullptr);
+        for (const QAction* action : menu->actions())
+            offered << (action->isEnabled() ? action->text().remove('&') : QString("-"));
+        menu->actions().at(0)->trigger();
+        menu->close();
+    });
+    emit view->Points()->customContextMenuRequested({5, 5}); // the focus is in the other table
+    EXPECT_EQ(offered, QStringList({"Insert Line", "-", "", "-", "Next Cross Section"}));
+    EXPECT_EQ(view->Points()->model()->rowCount(), 3);
+    EXPECT_EQ(view->Sections()->model()->rowCount(), SmallRows);
 }
 
 TEST_F(CrossSectionTest, TextsFollowTheLanguage)
