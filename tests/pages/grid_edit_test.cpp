@@ -142,3 +142,11 @@ TEST_F(GridEditTest, UnitsSwitchedWhileTyping)
     KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
     EXPECT_NEAR(init.GetAt(0).InitialH, 3.048, 1e-5);
 }
+
+TEST_F(GridEditTest, AnOpenEditorGoesWithItsWindow)
+{
+    Type(1, 1, "half typed");
+    view.reset();
+    EXPECT_EQ(init.GetAt(0).RiverName, "A");
+    EXPECT_FALSE(document.IsModified());
+}

@@ -68,7 +68,12 @@ CGenGrid::CGenGrid(QWidget* parent)
     connect(m_model, &CGridModel::CellModified, this, &CGenGrid::CellModified);
 }
 
-CGenGrid::~CGenGrid() = default;
+CGenGrid::~CGenGrid()
+{
+    // An open editor loses the focus while the grid is taken apart; it must not commit to what is left of it.
+    if (QWidget* editor = m_delegate->Editor())
+        editor->removeEventFilter(m_delegate);
+}
 
 void CGenGrid::SetOwnerPage(CGenPropertyPage* page)
 {
