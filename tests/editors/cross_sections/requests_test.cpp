@@ -43,7 +43,7 @@ TEST_F(CrossSectionTest, RadiusAndWidthAreFilledWhereTheyAreMissing)
                           {"MAIN", 2500, KsUnset, KsUnset, KsUnset},
                           {"MAIN", 1000, KsUnset, KsUnset, KsUnset},
                           {"SIDE", 300.0001, 0, 0, 7},
-                          {"side", 300, KsUnset, KsUnset, KsUnset}};
+                          {"side", 300, KsUnset, KsUnset, 7}};
     CObList objects;
     objects.push_back(nullptr);
     objects.push_back(std::make_unique<CKvrCBEText>());
