@@ -5,6 +5,7 @@
 #include "ks/fc/file_dialog.h"
 #include "pages/framework/date_time_edit.h"
 #include "pages/framework/date_time_text.h"
+#include "pages/framework/file_browse.h"
 #include "pages/maps_page.h"
 #include "pages/text_output_page.h"
 
@@ -13,6 +14,8 @@
 #include <QLabel>
 #include <QLocale>
 #include <QTemporaryDir>
+#include <QToolButton>
+#include <functional>
 
 class OutputFilesTest : public PageTest
 {
@@ -115,6 +118,37 @@ TEST_F(OutputFilesTest, BrowsingStartsAtTheFileNamed)
     Click(files, 1, 4);
     EXPECT_EQ(text.OutputFiles[0].FileName, chosen.toStdString());
     EXPECT_TRUE(document.IsModified());
+}
+
+TEST_F(OutputFilesTest, AFileThatExistsIsAskedAbout)
+{
+    chosen = folder.filePath("there.kvt2");
+    QFile(chosen).open(QIODevice::WriteOnly);
+    maps.GenerateOutput = maps.ApplyDemGroundElevation = maps.MapAreaGeoDb = true;
+    Open<CMapsPage>();
+    auto* help = view->page->findChild<CGeoFileEdit*>("helpGrid_1241");
+    const struct
+    {
+        std::function<void()> browse;
+        std::function<QString()> name;
+        const char* says;
+    } cases[] = {
+        {[&] { Click(Part("maps_1226"), 1, 8); }, [&] { return Part("maps_1226").TextAt(1, 7); }, "write over it"},
+        {[&] { Click(Part("dem_1227"), 1, 2); }, [&] { return Part("dem_1227").TextAt(1, 1); }, "read it"},
+        {[&] { help->findChild<QToolButton*>()->click(); }, [&] { return help->Field()->text(); }, "read it"}};
+    for (const auto& c : cases) {
+        SCOPED_TRACE(&c - cases);
+        boxes.clear();
+        answer = QMessageBox::No;
+        c.browse();
+        EXPECT_EQ(c.name(), "");
+        answer = QMessageBox::Yes;
+        c.browse();
+        EXPECT_EQ(c.name(), chosen);
+        c.browse();
+        ASSERT_EQ(boxes.size(), 2) << "not when it is the one named already";
+        EXPECT_TRUE(boxes[0].contains(c.says)) << boxes[0].toStdString();
+    }
 }
 
 TEST_F(OutputFilesTest, DatesAreKeptUnlessTheyAreTyped)

@@ -86,7 +86,7 @@ protected:
     {
         KsSetMessageBoxHandler([this](const CString& text, QMessageBox::StandardButtons) {
             boxes << text;
-            return QMessageBox::Ok;
+            return answer;
         });
     }
     ~PageTest() override
@@ -165,6 +165,7 @@ protected:
     CGenParamList<HD_Initial>& init = document.Parameters().InitList;
     HD_Global_Var& globals = document.Parameters().Global;
     QStringList boxes;
+    QMessageBox::StandardButton answer = QMessageBox::Ok; // to every box
     std::unique_ptr<TestView> view;
     CGenGrid* grid = nullptr;
 };

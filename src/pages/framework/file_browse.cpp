@@ -29,9 +29,10 @@ std::optional<QString> BrowseForFile(const CKavo0_hdDoc& document, const QString
     if (chosen.isEmpty())
         return std::nullopt;
     const bool isOther = !isReadable || QFileInfo(chosen) != named;
-    if (kind.isWritten && isOther && QFileInfo::exists(chosen) &&
-        KsMessageBox(LoadString(Str::FileExists).arg(QDir::toNativeSeparators(chosen)),
-                     QMessageBox::Yes | QMessageBox::No, parent) != QMessageBox::Yes)
+    const Str existsText = kind.isWritten ? Str::FileIsWritten : Str::FileIsRead;
+    if (isOther && QFileInfo::exists(chosen) &&
+        KsMessageBox(LoadString(existsText).arg(QDir::toNativeSeparators(chosen)), QMessageBox::Yes | QMessageBox::No,
+                     parent) != QMessageBox::Yes)
         return std::nullopt;
     return QDir::toNativeSeparators(chosen);
 }

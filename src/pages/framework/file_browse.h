@@ -12,11 +12,12 @@ class QToolButton;
 struct FileKind
 {
     QString extension;      // without its point
-    bool isWritten = false; // by the simulation, so that a file of that name is asked about
+    bool isWritten = false; // by the simulation, which otherwise reads it: the question about a file that exists says so
 };
 
 /// Asks for a file name, starting in the folder of the file named, or in the document's. Names in a document are
-/// relative to its folder, or absolute. Nothing when the user cancelled, or would rather keep an existing file.
+/// relative to its folder, or absolute. Asks before the name of another existing file is taken. Nothing
+/// when the user cancelled or declined.
 std::optional<QString> BrowseForFile(const CKavo0_hdDoc& document, const QString& current, const FileKind& kind,
                                      QWidget* parent);
 

@@ -1961,6 +1961,12 @@ The simulation will write over it. Use this name?</source>
 The simulation will write over it. Use this name?</translation>
         </message>
         <message>
+            <source>%1 already exists.
+The simulation will read it. Use this name?</source>
+            <translation>%1 already exists.
+The simulation will read it. Use this name?</translation>
+        </message>
+        <message>
             <source>Choose a File</source>
             <translation>Choose a File</translation>
         </message>

@@ -1961,6 +1961,12 @@ The simulation will write over it. Use this name?</source>
 計算を実行すると上書きされます。この名前を使いますか?</translation>
         </message>
         <message>
+            <source>%1 already exists.
+The simulation will read it. Use this name?</source>
+            <translation>%1 は既に存在します。
+計算を実行すると読み込まれます。この名前を使いますか?</translation>
+        </message>
+        <message>
             <source>Choose a File</source>
             <translation>ファイルの選択</translation>
         </message>
