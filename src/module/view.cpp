@@ -70,6 +70,7 @@ void CKavo0_hdView::OnInitialUpdate()
 
     AddTabs();
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
+    connect(m_sheet, &QTabWidget::currentChanged, this, &CKavo0_hdView::ShowLine);
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())
         page->OnSetActive();
@@ -126,6 +127,7 @@ void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deact
     if (activate) {
         SendToolbarMessage(KsMessage::ShowToolbar());
         EnableLinesMenu(m_linesEnabled);
+        ShowLine();
     } else if (activated) {
         if (activated == deactivated)
             SendToolbarMessage(KsMessage::HideToolbar());
@@ -156,14 +158,22 @@ void CKavo0_hdView::EditedLineChanged(int column)
     GetDocument()->UpdateAllViews(nullptr, Hint::Reload);
 }
 
-void CKavo0_hdView::CurrentLocationChanged(int row)
+void CKavo0_hdView::CurrentLocationChanged(int /*row*/)
+{
+    ShowLine();
+    if (MainFrame())
+        TellLater(m_tellLocation);
+}
+
+/// The line of the page in front, in the status bar; nothing for a page without a list.
+void CKavo0_hdView::ShowLine()
 {
     const auto* page = ActivePage();
-    if (!page || !page->GetList() || !MainFrame())
-        return;
-    QStatusTipEvent tip(LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()));
-    QCoreApplication::sendEvent(MainFrame(), &tip);
-    TellLater(m_tellLocation);
+    const auto* grid = page && page->GetList() ? page->GetGrid() : nullptr;
+    const int row = grid ? grid->CurrentRow() - grid->Model()->FixedRows() : 0;
+    QStatusTipEvent tip(row > 0 ? LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()) : QString());
+    if (MainFrame())
+        QCoreApplication::sendEvent(MainFrame(), &tip);
 }
 
 void CKavo0_hdView::EnableLinesMenu(bool enable)

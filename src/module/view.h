@@ -57,6 +57,7 @@ private:
 
     LRESULT AnswerEditor(WPARAM request, CKSComm_Package* package);
     void FetchLocation();
+    void ShowLine();
     void DeleteLines();
     void TellLater(bool& news);
     void Tell();

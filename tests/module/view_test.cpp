@@ -11,6 +11,7 @@
 #include <QApplication>
 #include <QDialog>
 #include <QLineEdit>
+#include <QStatusBar>
 #include <QTest>
 #include <QTimer>
 #include <QUndoStack>
@@ -64,6 +65,27 @@ TEST_F(ViewTest, ShowsThePagesInOrderAndJoinsTheProject)
     EXPECT_EQ(view->ActivePage()->GetGrid()->BranchNameColumn(), 1);
     EXPECT_EQ(view->GetDocument()->ProjectHandle(), 5);
     EXPECT_FALSE(view->GetDocument()->IsModified());
+}
+
+TEST_F(ViewTest, TheStatusBarShowsTheLineOfThePageInFront)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    const auto status = [bar = frame.statusBar()] { return bar->currentMessage(); };
+    view->ActivePage()->GetGrid()->SetCurrentCell(2, 1);
+    const QString second = status();
+    EXPECT_TRUE(second.startsWith("Line 2 of ")) << second.toStdString();
+    const auto tab = [view](const char* text) {
+        for (int i = 0; i < view->Sheet()->PageCount(); ++i) {
+            if (view->Sheet()->tabText(i) == text)
+                return i;
+        }
+        return -1;
+    };
+    ASSERT_TRUE(view->Sheet()->SetActivePage(tab("Stratification")));
+    EXPECT_EQ(status(), "");
+    ASSERT_TRUE(view->Sheet()->SetActivePage(0));
+    EXPECT_EQ(status(), second);
 }
 
 TEST_F(ViewTest, AChangedLocationIsToldToTheProjectAndLeavingIsToo)

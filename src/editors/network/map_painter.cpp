@@ -7,8 +7,8 @@ namespace {
 constexpr double LineWidth = 2.2, CurrentWidth = 3.6, Casing = 2.5, HaloWidth = 2.5, ArrowSize = 7.5;
 } // namespace
 
-CMapPainter::CMapPainter(const CMapScene& scene, const CMapStyle& style, int currentBranch)
-    : m_scene(scene), m_style(style), m_currentBranch(currentBranch)
+CMapPainter::CMapPainter(const CMapScene& scene, const CMapStyle& style, int currentBranch, LabelPictures& pictures)
+    : m_scene(scene), m_style(style), m_currentBranch(currentBranch), m_pictures(pictures)
 {
     for (int kind = 0; kind < HDDataTypeCount; ++kind)
         m_symbols[std::size_t(kind)] = LocationKindSymbol(kind, CMapScene::SymbolSize * scene.Ratio(), style.outline);
@@ -45,8 +45,9 @@ void CMapPainter::PaintLines(QPainter& painter, const QRectF& part) const
             const bool casing = extra > 0;
             if (casing && !m_scene.HasCasings())
                 continue;
+            // Lines bend so little between their vertices that round joins would look the same, at twice the time.
             painter.setPen(QPen(colour, (width + extra) * ratio, Qt::SolidLine, casing ? Qt::FlatCap : Qt::RoundCap,
-                                casing ? Qt::BevelJoin : Qt::RoundJoin));
+                                Qt::BevelJoin));
             for (const QPolygonF& each : parts)
                 painter.drawPolyline(each);
         }
@@ -95,18 +96,44 @@ void CMapPainter::PaintLabels(QPainter& painter, const QRectF& part) const
 {
     const double halo = HaloWidth * m_scene.Ratio();
     const QRectF near = part.adjusted(-halo, -halo, halo, halo);
-    for (const CMapScene::Label& label : m_scene.Labels()) {
-        if (!near.intersects(label.box))
+    const auto& labels = m_scene.Labels();
+    for (std::size_t i = 0; i < labels.size(); ++i) {
+        if (!near.intersects(labels[i].box))
             continue;
-        const QPainterPath& text = m_scene.Text(label.branch);
-        const bool current = static_cast<int>(label.branch) == m_currentBranch;
-        painter.save();
-        painter.translate(label.center);
-        painter.rotate(label.angle);
-        painter.setPen(Qt::NoPen);
-        painter.setBrush(m_style.Ground(190)); // keeps the name legible on whatever is under it
-        painter.drawRoundedRect(text.boundingRect().adjusted(-halo, -halo, halo, halo), halo, halo);
-        painter.fillPath(text, current ? m_style.chosen : m_style.text);
-        painter.restore();
+        if (static_cast<int>(labels[i].branch) == m_currentBranch) {
+            PaintLabel(painter, labels[i], m_style.chosen);
+            continue;
+        }
+        const QRect box = labels[i].box.adjusted(-2 * halo, -2 * halo, 2 * halo, 2 * halo).toAlignedRect();
+        painter.drawPixmap(box.topLeft(), LabelPicture(i, box));
     }
+}
+
+QPixmap CMapPainter::LabelPicture(std::size_t label, const QRect& box) const
+{
+    if (const QPixmap* known = m_pictures.object(label))
+        return *known;
+    QPixmap picture(box.size());
+    picture.fill(Qt::transparent);
+    QPainter painter(&picture);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.translate(-box.topLeft());
+    PaintLabel(painter, m_scene.Labels()[label], m_style.text);
+    painter.end();
+    m_pictures.insert(label, new QPixmap(picture), 4 * box.width() * box.height());
+    return picture;
+}
+
+void CMapPainter::PaintLabel(QPainter& painter, const CMapScene::Label& label, const QColor& colour) const
+{
+    const double halo = HaloWidth * m_scene.Ratio();
+    const QPainterPath& text = m_scene.Text(label.branch);
+    painter.save();
+    painter.translate(label.center);
+    painter.rotate(label.angle);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(m_style.Ground(190)); // keeps the name legible on whatever is under it
+    painter.drawRoundedRect(text.boundingRect().adjusted(-halo, -halo, halo, halo), halo, halo);
+    painter.fillPath(text, colour);
+    painter.restore();
 }

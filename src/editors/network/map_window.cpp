@@ -30,7 +30,7 @@ void CNetworkMap::UpdateBuffer()
     }
     if (!missing.isEmpty()) {
         const CMapStyle style(palette());
-        const CMapPainter map(Scene(), style, m_currentBranch);
+        const CMapPainter map(Scene(), style, m_currentBranch, m_labelPictures);
         QPainter painter(&m_buffer);
         for (const QRect& part : missing)
             map.Paint(painter, part, m_projection.offset);

@@ -59,6 +59,7 @@ void CNetworkMap::PlaceAll()
 void CNetworkMap::SceneChanged()
 {
     m_scene.reset();
+    m_labelPictures.clear();
     m_bufferValid = false;
     update();
 }

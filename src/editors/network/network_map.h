@@ -75,6 +75,7 @@ protected:
     bool event(QEvent* event) override;
 
 private:
+    static constexpr int LabelMemory = 32 << 20; // bytes
     struct Key;
     static const std::vector<Key>& Keys();
     void NetworkChanged();
@@ -104,6 +105,7 @@ private:
 
     QPixmap m_buffer; // the window without marks
     QPoint m_bufferOffset;
+    CMapPainter::LabelPictures m_labelPictures{LabelMemory}; // of the present scene
     bool m_bufferValid = false;
 
     std::optional<Place> m_picked, m_shown;
