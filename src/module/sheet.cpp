@@ -4,11 +4,11 @@
 #include "pages/framework/page.h"
 
 #include <QKeyEvent>
+#include <QScrollArea>
 #include <QSignalBlocker>
 #include <QStyleOptionTab>
 #include <QStylePainter>
 #include <QTabBar>
-#include <QVBoxLayout>
 #include <algorithm>
 
 namespace {
@@ -36,8 +36,8 @@ protected:
             painter.drawControl(QStyle::CE_TabBarTabShape, option);
             const QRect text = option.rect.adjusted(fontMetrics().height() * 2 / 3, 0, -4, 0);
             const auto role = option.state & QStyle::State_Enabled ? QPalette::Normal : QPalette::Disabled;
-            style()->drawItemText(&painter, text, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextShowMnemonic,
-                                  palette(), role == QPalette::Normal, tabText(i), QPalette::WindowText);
+            style()->drawItemText(&painter, text, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextShowMnemonic, palette(),
+                                  role == QPalette::Normal, tabText(i), QPalette::WindowText);
             if (hasFocus() && i == currentIndex()) {
                 QStyleOptionFocusRect focus;
                 focus.initFrom(this);
@@ -63,9 +63,11 @@ void CDlgPropertySheet::AddPage(Str caption, MakePage make)
 {
     m_tabs.push_back({caption, std::move(make)});
     const QSignalBlocker quiet(this);
-    auto* place = new QWidget;
-    auto* layout = new QVBoxLayout(place);
-    layout->setContentsMargins(0, 0, 0, 0);
+    auto* place = new QScrollArea; // in a small window a page scrolls rather than being cut off
+    place->setWidgetResizable(true);
+    place->setFrameShape(QFrame::NoFrame);
+    place->setFocusPolicy(Qt::NoFocus);
+    place->viewport()->setAutoFillBackground(false);
     addTab(place, LoadString(caption));
     if (m_active < 0)
         m_active = 0;
@@ -79,7 +81,9 @@ CGenPropertyPage* CDlgPropertySheet::PageAt(int tab) const
     if (!entry.page) {
         entry.page = entry.make().release();
         entry.page->installEventFilter(const_cast<CDlgPropertySheet*>(this));
-        widget(tab)->layout()->addWidget(entry.page);
+        static_cast<QScrollArea*>(widget(tab))->setWidget(entry.page);
+        entry.page->setAutoFillBackground(false);
+        entry.page->show();
     }
     return entry.page;
 }

@@ -54,8 +54,7 @@ void CMainFrame::OnSideBySide()
     for (QMdiSubWindow* window : windows)
         window->showNormal();
     const QRect area(QPoint(), MdiArea().viewport()->size());
-    const int most = windows.isEmpty() ? area.width() : area.width() * 2 / 3;
-    const int width = windows.isEmpty() ? most : std::clamp(first->minimumSizeHint().width(), area.width() / 2, most);
+    const int width = windows.isEmpty() ? area.width() : area.width() * 3 / 5;
     first->setGeometry(0, 0, width, area.height());
     for (qsizetype i = 0; i < windows.size(); ++i) {
         const int top = int(area.height() * i / windows.size()), bottom = int(area.height() * (i + 1) / windows.size());

@@ -88,6 +88,27 @@ TEST_F(ViewTest, TheStatusBarShowsTheLineOfThePageInFront)
     EXPECT_EQ(status(), second);
 }
 
+TEST_F(ViewTest, APageIsNeverSmallerThanWhatItShows)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    auto* window = qobject_cast<QMdiSubWindow*>(view->parentWidget());
+    ASSERT_NE(window, nullptr);
+    window->showNormal();
+    window->resize(300, 200);
+    QTest::qWait(50); // every page is made
+    for (int tab = 0; tab < view->Sheet()->PageCount(); ++tab) {
+        SCOPED_TRACE(view->Sheet()->tabText(tab).toStdString());
+        ASSERT_TRUE(view->Sheet()->SetActivePage(tab));
+        const QWidget& page = *view->ActivePage();
+        EXPECT_TRUE(QTest::qWaitFor(
+            [&] { // layouts answer to new texts one after the other
+                return page.size() == page.size().expandedTo(page.minimumSizeHint());
+            },
+            1000));
+    }
+}
+
 TEST_F(ViewTest, AChangedLocationIsToldToTheProjectAndLeavingIsToo)
 {
     projectHandle = 5;

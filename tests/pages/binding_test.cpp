@@ -61,6 +61,23 @@ TEST_F(BindingTest, ControlsFollowValuesAndBack)
     EXPECT_EQ(page.list.currentIndex(), globals.G_wave);
 }
 
+TEST_F(BindingTest, TheWheelTurnsOnlyTheListThatHasTheFocus)
+{
+    auto& page = Open<BoundPage>();
+    const auto turn = [&page] {
+        QWheelEvent event({5, 5}, page.list.mapToGlobal(QPointF(5, 5)), {}, {0, -120}, {}, {}, Qt::NoScrollPhase,
+                          false);
+        QApplication::sendEvent(&page.list, &event);
+        return page.list.currentIndex();
+    };
+    page.number.setFocus();
+    const int before = page.list.currentIndex();
+    EXPECT_EQ(turn(), before);
+    EXPECT_FALSE(document.IsModified());
+    page.list.setFocus();
+    EXPECT_EQ(turn(), before + 1);
+}
+
 TEST_F(BindingTest, UnknownNumbersAreKept)
 {
     globals.G_wave = 17;

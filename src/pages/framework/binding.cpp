@@ -160,6 +160,7 @@ void CBindings::Add(QCheckBox* box, std::int32_t& flag)
 void CBindings::Add(QComboBox* box, std::int32_t& index)
 {
     const int entries = box->count();
+    box->setFocusPolicy(Qt::StrongFocus); // not by the wheel
     box->installEventFilter(this);
     m_show.push_back([box, entries, &index] {
         while (box->count() > entries)
@@ -196,6 +197,12 @@ void CBindings::AddUnbound(QComboBox* box)
 
 bool CBindings::eventFilter(QObject* object, QEvent* event)
 {
+    // A wheel that scrolls the page changes no list that it happens to pass.
+    const auto* list = qobject_cast<QComboBox*>(object);
+    if (event->type() == QEvent::Wheel && list && !list->hasFocus()) {
+        event->ignore();
+        return true;
+    }
     // A list, and a field with nothing typed, leave undo and redo to the document.
     if (event->type() == QEvent::ShortcutOverride || event->type() == QEvent::KeyPress) {
         const auto* key = static_cast<QKeyEvent*>(event);
