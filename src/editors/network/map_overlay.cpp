@@ -16,7 +16,17 @@ struct MapOverlay
     Q_DECLARE_TR_FUNCTIONS(MapOverlay)
 };
 
-constexpr int Margin = 12, Padding = 9;
+constexpr int Margin = 12, Padding = 9, LegendSymbol = 20;
+
+int LegendRow(const QFontMetrics& metrics)
+{
+    return metrics.height() + 3;
+}
+
+QString Elsewhere(const CLegend& legend)
+{
+    return legend.elsewhere > 0 ? MapOverlay::tr("%1 not in this network").arg(legend.elsewhere) : QString();
+}
 
 void PaintPanel(QPainter& painter, const CMapStyle& style, const QRectF& box)
 {
@@ -43,37 +53,41 @@ QString PlaceText(const QString& branch, double chainage)
     return QStringLiteral("%1 %2").arg(branch, style.UnitConvertFromBase_T(chainage, 1));
 }
 
-void PaintLegend(QPainter& painter, const CMapStyle& style, const QRect& window,
-                 const std::array<int, HDDataTypeCount>& counts, int elsewhere)
+QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend& legend)
 {
-    const QFontMetrics metrics = painter.fontMetrics();
-    const int row = metrics.height() + 3, symbol = 20, gap = 16;
+    constexpr int gap = 16;
     int names = 0, numbers = 0;
     for (int kind = 0; kind < HDDataTypeCount; ++kind) {
         names = std::max(names, metrics.horizontalAdvance(LocationKindName(kind)));
-        numbers = std::max(numbers, metrics.horizontalAdvance(QString::number(counts[std::size_t(kind)])));
+        numbers = std::max(numbers, metrics.horizontalAdvance(QString::number(legend.counts[std::size_t(kind)])));
     }
-    const QString rest = elsewhere > 0 ? MapOverlay::tr("%1 not in this network").arg(elsewhere) : QString();
-    const int inner = std::max(symbol + names + gap + numbers, metrics.horizontalAdvance(rest));
-    const int rows = HDDataTypeCount + (rest.isEmpty() ? 0 : 1);
-    const QRect box(window.right() - Margin - inner - 2 * Padding, window.top() + Margin, inner + 2 * Padding,
-                    rows * row + 2 * Padding - 3);
+    const int inner = std::max(LegendSymbol + names + gap + numbers, metrics.horizontalAdvance(Elsewhere(legend)));
+    const int rows = HDDataTypeCount + (legend.elsewhere > 0 ? 1 : 0);
+    return {window.right() - Margin - inner - 2 * Padding, window.top() + Margin, inner + 2 * Padding,
+            rows * LegendRow(metrics) + 2 * Padding - 3};
+}
+
+void PaintLegend(QPainter& painter, const CMapStyle& style, const QRect& window, const CLegend& legend)
+{
+    const QRect box = LegendBox(painter.fontMetrics(), window, legend);
     PaintPanel(painter, style, box);
     const double ratio = painter.device()->devicePixelRatioF();
-    QRect line(box.left() + Padding, box.top() + Padding, inner, row);
+    const int row = LegendRow(painter.fontMetrics());
+    QRect line(box.left() + Padding, box.top() + Padding, box.width() - 2 * Padding, row);
     for (int kind = 0; kind < HDDataTypeCount; ++kind, line.translate(0, row)) {
         QPixmap picture = LocationKindSymbol(kind, CMapScene::SymbolSize * ratio, style.outline);
         picture.setDevicePixelRatio(ratio);
         const QSizeF size = QSizeF(picture.size()) / ratio;
-        painter.setOpacity(counts[std::size_t(kind)] ? 1 : 0.5);
+        painter.setOpacity(legend.counts[std::size_t(kind)] ? 1 : 0.5);
         painter.drawPixmap(QPointF(line.left(), line.center().y() - size.height() / 2), picture);
         painter.setPen(style.text);
-        painter.drawText(line.adjusted(symbol, 0, 0, 0), Qt::AlignVCenter | Qt::AlignLeft, LocationKindName(kind));
-        painter.drawText(line, Qt::AlignVCenter | Qt::AlignRight, QString::number(counts[std::size_t(kind)]));
+        painter.drawText(line.adjusted(LegendSymbol, 0, 0, 0), Qt::AlignVCenter | Qt::AlignLeft,
+                         LocationKindName(kind));
+        painter.drawText(line, Qt::AlignVCenter | Qt::AlignRight, QString::number(legend.counts[std::size_t(kind)]));
     }
     painter.setOpacity(1);
     painter.setPen(style.mark);
-    painter.drawText(line, Qt::AlignVCenter | Qt::AlignLeft, rest);
+    painter.drawText(line, Qt::AlignVCenter | Qt::AlignLeft, Elsewhere(legend));
 }
 
 void PaintScaleBar(QPainter& painter, const CMapStyle& style, const QRect& window, double scale)

@@ -11,9 +11,15 @@
 /// A place as the user reads it: "BRANCH 1234.5", in the user's unit of chainages.
 QString PlaceText(const QString& branch, double chainage);
 
-/// Names the kinds of locations, with how many of each are drawn. `elsewhere`: locations that are not in the network.
-void PaintLegend(QPainter& painter, const CMapStyle& style, const QRect& window,
-                 const std::array<int, HDDataTypeCount>& counts, int elsewhere);
+/// The kinds of locations, with how many of each are drawn.
+struct CLegend
+{
+    std::array<int, HDDataTypeCount> counts{};
+    int elsewhere = 0; // locations that are not in the network
+};
+/// Where the legend stands: in the upper right corner.
+QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend& legend);
+void PaintLegend(QPainter& painter, const CMapStyle& style, const QRect& window, const CLegend& legend);
 /// `scale`: pixels a metre.
 void PaintScaleBar(QPainter& painter, const CMapStyle& style, const QRect& window, double scale);
 void PaintPicked(QPainter& painter, const CMapStyle& style, const QRect& window, const QPointF& at,

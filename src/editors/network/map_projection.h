@@ -32,18 +32,16 @@ struct CMapProjection
         scale = newScale;
         offset = (window - ToPlane(map)).toPoint();
     }
-    void CenterAt(const QPointF& map, const QSizeF& window)
-    {
-        offset = (QPointF(window.width() / 2, window.height() / 2) - ToPlane(map)).toPoint();
-    }
-    /// Shows all of `extent` with a margin of so many pixels.
-    void Fit(const QRectF& extent, const QSizeF& window, double margin)
+    void CenterAt(const QPointF& map, const QRectF& window) { offset = (window.center() - ToPlane(map)).toPoint(); }
+    /// Shows all of `extent` in a part of the window, with a margin of so many pixels and at most a scale.
+    void Fit(const QRectF& extent, const QRectF& window, double margin, double mostScale)
     {
         const double width = std::max(window.width() - 2 * margin, 1.0);
         const double height = std::max(window.height() - 2 * margin, 1.0);
         if (extent.width() > 0 || extent.height() > 0)
             scale = std::min(extent.width() > 0 ? width / extent.width() : HUGE_VAL,
                              extent.height() > 0 ? height / extent.height() : HUGE_VAL);
+        scale = std::min(scale, mostScale);
         CenterAt(extent.center(), window);
     }
 };

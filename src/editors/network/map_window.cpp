@@ -12,6 +12,14 @@ QString CNetworkMap::LocationText(const CMapLocation& location) const
            location.file.section(u'/', -1);
 }
 
+CLegend CNetworkMap::Legend() const
+{
+    CLegend legend{.elsewhere = static_cast<int>(m_locations.size() - m_placed.size())};
+    for (const CPlacedLocation& each : m_placed)
+        ++legend.counts.at(static_cast<std::size_t>(each.kind));
+    return legend;
+}
+
 /// Moves what is painted already, and paints the rest.
 void CNetworkMap::UpdateBuffer()
 {
@@ -55,10 +63,7 @@ void CNetworkMap::paintEvent(QPaintEvent*)
     const CMapStyle style(palette());
     PaintMarks(painter, style);
     PaintScaleBar(painter, style, rect(), m_projection.scale / devicePixelRatioF());
-    std::array<int, HDDataTypeCount> counts{};
-    for (const CPlacedLocation& each : m_placed)
-        ++counts.at(static_cast<std::size_t>(each.kind));
-    PaintLegend(painter, style, rect(), counts, static_cast<int>(m_locations.size() - m_placed.size()));
+    PaintLegend(painter, style, rect(), Legend());
     if (m_document.Network().branches.empty())
         PaintHint(painter, style, rect(), tr("This network has no branches yet."));
     if (hasFocus())

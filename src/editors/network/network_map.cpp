@@ -1,5 +1,6 @@
 #include "editors/network/network_map.h"
 
+#include "editors/network/map_overlay.h"
 #include "ks/units/edit_style.h"
 
 #include <cmath>
@@ -85,24 +86,59 @@ QRectF CNetworkMap::FullExtent() const
     return m_document.Network().Extent();
 }
 
+/// In the whole window, or, when the legend would cover branches, in the larger part beside it; but the legend rather
+/// covers something than that the network becomes small.
 void CNetworkMap::FitAll()
 {
-    const QRectF extent = FullExtent();
-    const double ratio = devicePixelRatioF();
-    m_projection.origin = extent.center();
-    m_projection.Fit(extent, QSizeF(size()) * ratio, FitMargin * ratio);
-    m_projection.scale = std::min(m_projection.scale, MaxScale * ratio);
-    m_projection.CenterAt(extent.center(), QSizeF(size()) * ratio);
+    constexpr double small = 0.6; // of the scale that the whole window allows
+    const QRectF window(rect()), legend(LegendBox(fontMetrics(), rect(), Legend()));
+    m_projection.origin = FullExtent().center();
+    FitInto(window);
+    if (IsUnder(legend.adjusted(-FitMargin, 0, 0, FitMargin))) { // symbols stand beside their branch
+        const double whole = m_projection.scale;
+        QRectF left = window, below = window;
+        left.setRight(legend.left());
+        below.setTop(legend.bottom());
+        FitInto(left);
+        const double beside = m_projection.scale;
+        FitInto(below);
+        if (beside > m_projection.scale)
+            FitInto(left);
+        if (m_projection.scale < small * whole)
+            FitInto(window);
+    }
     m_fitted = true;
     SceneChanged();
+}
+
+/// By pixels of the user.
+void CNetworkMap::FitInto(const QRectF& part)
+{
+    const double ratio = devicePixelRatioF();
+    m_projection.Fit(FullExtent(), QRectF(part.topLeft() * ratio, part.size() * ratio), FitMargin * ratio,
+                     MaxScale * ratio);
+}
+
+/// Whether a branch goes through a part of the window.
+bool CNetworkMap::IsUnder(const QRectF& box) const
+{
+    const QRectF map = QRectF(m_projection.ToMap(box.topLeft() * devicePixelRatioF()),
+                              m_projection.ToMap(box.bottomRight() * devicePixelRatioF()))
+                           .normalized();
+    const auto& branches = m_document.Network().branches;
+    return std::any_of(branches.begin(), branches.end(), [&map](const CNetworkBranch& branch) {
+        return std::any_of(branch.line.begin(), branch.line.end(),
+                           [&map](const QPointF& point) { return map.contains(point); });
+    });
 }
 
 void CNetworkMap::ZoomAt(const QPointF& window, double factor)
 {
     const double ratio = devicePixelRatioF();
     CMapProjection all = m_projection; // half of what shows everything is small enough
-    all.Fit(FullExtent(), QSizeF(size()) * ratio, FitMargin * ratio);
-    const double low = std::min(all.scale / 2, m_projection.scale), high = MaxScale * ratio;
+    const double high = MaxScale * ratio;
+    all.Fit(FullExtent(), QRectF(QPointF(), QSizeF(size()) * ratio), FitMargin * ratio, high);
+    const double low = std::min(all.scale / 2, m_projection.scale);
     m_projection.ZoomAt(window * ratio, std::clamp(m_projection.scale * factor, low, std::max(low, high)));
     m_fitted = false;
     SceneChanged();

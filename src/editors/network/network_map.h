@@ -8,6 +8,8 @@
 #include <QWidget>
 #include <optional>
 
+struct CLegend;
+
 class CNetworkMap : public QWidget
 {
     Q_OBJECT
@@ -91,6 +93,9 @@ private:
     void SelectLocation(int location);
     void Unmark();
     int LocationAt(const QPointF& window) const;
+    CLegend Legend() const;
+    void FitInto(const QRectF& part);
+    bool IsUnder(const QRectF& box) const;
     QString LocationText(const CMapLocation& location) const;
     void PaintMarks(QPainter& painter, const CMapStyle& style) const;
     void KeepInSight(const QPointF& window);

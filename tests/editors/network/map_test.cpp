@@ -1,6 +1,8 @@
 // The map under mouse and keys, and that what it paints while it moves is what it paints anew.
 #include "network_fixture.h"
 
+#include "editors/network/map_overlay.h"
+
 namespace {
 
 QImage Picture(CNetworkMap* map)
@@ -96,6 +98,30 @@ TEST_F(NetworkTest, KeysAndWheelMoveTheMap)
     EXPECT_LT((at() - under).manhattanLength(), 1.5); // the place under the pointer stays
     frame->resize(1000, 700);                         // only a fitted map follows the window
     EXPECT_NEAR(length() / fitted, 1.96, 1e-6);
+}
+
+TEST_F(NetworkTest, TheLegendCoversNoBranchWhenAllIsShown)
+{
+    CNetworkDoc document;
+    CNetworkBranch branch;
+    branch.name = "CREEK";
+    branch.line = {{0, 0}, {1000, 0}, {1000, 600}, {950, 600}}; // ends in the upper right corner
+    branch.end = branch.Length();
+    document.AppendBranches({branch}, {});
+    CNetworkMap map(document);
+    for (const QSize size : {QSize(1200, 500), QSize(420, 700), QSize(800, 600), QSize(260, 200)}) {
+        SCOPED_TRACE(size.width());
+        map.resize(size);
+        map.grab(); // resizes what is not shown
+        map.FitAll();
+        const QRectF legend = LegendBox(map.fontMetrics(), map.rect(), {});
+        const bool small = size.width() < 300; // the legend would leave no room
+        for (double chainage = 0; chainage <= branch.end; chainage += 50) {
+            const QPointF at = map.WindowPoint({"CREEK", chainage}).value();
+            EXPECT_TRUE(QRectF(map.rect()).contains(at)) << chainage;
+            EXPECT_FALSE(legend.contains(at) && !small) << chainage;
+        }
+    }
 }
 
 TEST_F(NetworkTest, WithoutAMousePlacesAndLocationsAreReached)
