@@ -19,17 +19,29 @@ function(kvr_library name)
   kvr_defaults(${name})
 endfunction()
 
+# Qt's headers take longer to read than most sources to compile, so they are read once for every target: kvr_pch is for
+# the product, kvr_test_pch for tests. A target that adds compile options of its own cannot share them.
+function(kvr_shared_pch name)
+  add_library(${name} OBJECT ${PROJECT_SOURCE_DIR}/cmake/pch.cpp)
+  kvr_defaults(${name})
+  target_link_libraries(${name} PRIVATE Qt6::Widgets)
+  target_precompile_headers(${name} PRIVATE <QtWidgets> <memory> <string> <vector> ${ARGN})
+endfunction()
+
 # A library on Qt Widgets: meta-object code, dialog files and a precompiled header.
 function(kvr_qt_library name kind)
   add_library(${name} ${kind} ${ARGN})
   kvr_qt(${name})
 endfunction()
 
+# kvr_qt(<target> [<precompiled header>])
 function(kvr_qt name)
+  set(pch ${ARGN} kvr_pch)
+  list(GET pch 0 pch)
   kvr_defaults(${name})
   set_target_properties(${name} PROPERTIES AUTOMOC ON AUTOUIC ON AUTORCC ON)
   target_link_libraries(${name} PUBLIC Qt6::Widgets)
-  target_precompile_headers(${name} PRIVATE <QtWidgets> <memory> <string> <vector>)
+  target_precompile_headers(${name} REUSE_FROM ${pch})
 endfunction()
 
 # One test program per room, its cases found by CTest. LABEL separates the rooms for ctest -L.
@@ -39,7 +51,7 @@ function(kvr_test name)
   add_executable(${name} ${T_SOURCES})
   if(T_QT)
     find_package(Qt6 REQUIRED COMPONENTS Test)
-    kvr_qt(${name})
+    kvr_qt(${name} kvr_test_pch)
     target_sources(${name} PRIVATE ${PROJECT_SOURCE_DIR}/tests/qt_main.cpp)
     target_link_libraries(${name} PRIVATE ${T_LIBS} GTest::gtest GTest::gmock Qt6::Test)
   else()

@@ -1,0 +1,1 @@
+// Nothing: what is compiled with this file is the precompiled header.
