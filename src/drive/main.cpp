@@ -9,7 +9,9 @@
 
 #include <QDir>
 #include <QFile>
+#include <QMdiSubWindow>
 #include <QStandardPaths>
+#include <QTest>
 #include <QTimer>
 #include <cstdio>
 #include <cstdlib>
@@ -68,6 +70,9 @@ int main(int argc, char** argv)
         QTimer::singleShot(0, &frame, [&] {
             frame.resize(1600, 1000); // whatever the size of the screen that is not there
             Robot robot(frame, out);
+            constexpr int members = 3; // the first one is there, the others follow
+            robot.Verify(QTest::qWaitFor([&] { return frame.findChildren<QMdiSubWindow*>().size() == members; }),
+                         "the project opens all its files");
             robot.Trigger("actionSideBySide");
             DriveMainJob(robot, work + "/river.hdkv");
             DriveProjectJob(robot);

@@ -9,6 +9,7 @@
 #include <QStyleOptionTab>
 #include <QStylePainter>
 #include <QTabBar>
+#include <QVBoxLayout>
 #include <algorithm>
 
 namespace {
@@ -63,12 +64,7 @@ void CDlgPropertySheet::AddPage(Str caption, MakePage make)
 {
     m_tabs.push_back({caption, std::move(make)});
     const QSignalBlocker quiet(this);
-    auto* place = new QScrollArea; // in a small window a page scrolls rather than being cut off
-    place->setWidgetResizable(true);
-    place->setFrameShape(QFrame::NoFrame);
-    place->setFocusPolicy(Qt::NoFocus);
-    place->viewport()->setAutoFillBackground(false);
-    addTab(place, LoadString(caption));
+    addTab(new QWidget, LoadString(caption));
     if (m_active < 0)
         m_active = 0;
 }
@@ -81,9 +77,16 @@ CGenPropertyPage* CDlgPropertySheet::PageAt(int tab) const
     if (!entry.page) {
         entry.page = entry.make().release();
         entry.page->installEventFilter(const_cast<CDlgPropertySheet*>(this));
-        static_cast<QScrollArea*>(widget(tab))->setWidget(entry.page);
+        auto* area = new QScrollArea; // in a small window a page scrolls rather than being cut off
+        area->setWidgetResizable(true);
+        area->setFrameShape(QFrame::NoFrame);
+        area->setFocusPolicy(Qt::NoFocus);
+        area->viewport()->setAutoFillBackground(false);
+        area->setWidget(entry.page);
         entry.page->setAutoFillBackground(false);
-        entry.page->show();
+        auto* layout = new QVBoxLayout(widget(tab));
+        layout->setContentsMargins(0, 0, 0, 0);
+        layout->addWidget(area);
     }
     return entry.page;
 }

@@ -1,5 +1,6 @@
 #include "module/view.h"
 
+#include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
@@ -74,7 +75,7 @@ void CKavo0_hdView::OnInitialUpdate()
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())
         page->OnSetActive();
-    QTimer::singleShot(0, this, &CKavo0_hdView::MakeOtherPages);
+    KsAfterPaint(this, this, [this] { MakeOtherPages(); });
 }
 
 void CKavo0_hdView::AddTabs()

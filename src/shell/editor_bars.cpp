@@ -21,30 +21,26 @@ void CEditorBars::Create(const std::vector<std::unique_ptr<CPlugin>>& plugins)
     m_plugins = &plugins;
     for (const auto& plugin : plugins) {
         if (plugin->IsUsable())
-            CreateBars(*plugin);
+            AddBars(*plugin);
     }
     Update();
 }
 
-void CEditorBars::CreateBars(const CPlugin& plugin)
+void CEditorBars::AddBars(const CPlugin& plugin)
 {
     const QStringList hidden = QSettings().value(Settings::HiddenBars).toStringList();
     for (int i = 0, count = plugin.KsGetNumToolbars(); i < count; ++i) {
-        CKsToolBarEx* bar = plugin.KsCreateToolbar(m_frame, 0, FirstBarId + unsigned(m_bars.size()), i);
-        if (!bar)
-            continue;
         CString name;
         plugin.KsGetToolbarString(&name, i);
-        bar->setObjectName(QStringLiteral("%1-%2").arg(QFileInfo(plugin.file).completeBaseName()).arg(i));
-        bar->setWindowTitle(name.trimmed());
         auto toggle = std::make_unique<QAction>(name.trimmed());
+        toggle->setObjectName(QStringLiteral("%1-%2").arg(QFileInfo(plugin.file).completeBaseName()).arg(i));
         toggle->setCheckable(true);
-        toggle->setChecked(!hidden.contains(bar->objectName()));
+        toggle->setChecked(!hidden.contains(toggle->objectName()));
         connect(toggle.get(), &QAction::toggled, this, [this] {
             Update();
             SaveHidden();
         });
-        m_bars.push_back({&plugin, bar, std::move(toggle)});
+        m_bars.push_back({&plugin, i, nullptr, std::move(toggle)});
     }
 }
 
@@ -71,9 +67,18 @@ std::vector<QAction*> CEditorBars::Toggles() const
 
 void CEditorBars::Update()
 {
-    for (const Bar& bar : m_bars) {
+    for (std::size_t i = 0; i < m_bars.size(); ++i) {
+        Bar& bar = m_bars[i];
+        const bool visible = bar.toggle->isChecked() && m_shown[bar.plugin];
+        if (visible && !bar.bar) {
+            bar.bar = bar.plugin->KsCreateToolbar(m_frame, 0, FirstBarId + unsigned(i), bar.index);
+            if (!bar.bar)
+                continue;
+            bar.bar->setObjectName(bar.toggle->objectName());
+            bar.bar->setWindowTitle(bar.toggle->text());
+        }
         if (bar.bar)
-            bar.bar->setVisible(bar.toggle->isChecked() && m_shown[bar.plugin]);
+            bar.bar->setVisible(visible);
     }
 }
 
@@ -81,8 +86,8 @@ void CEditorBars::SaveHidden() const
 {
     QStringList hidden;
     for (const Bar& bar : m_bars) {
-        if (bar.bar && !bar.toggle->isChecked())
-            hidden << bar.bar->objectName();
+        if (!bar.toggle->isChecked())
+            hidden << bar.toggle->objectName();
     }
     QSettings().setValue(Settings::HiddenBars, hidden);
 }

@@ -13,15 +13,15 @@ class CKsToolBarEx;
 class CView;
 struct CPlugin;
 
-/// Makes every editor's tool bars and shows those of the editor whose view asks for it. Which editor that is follows
-/// from the view's document template: the shell has it from one plug-in. A bar that the user has switched off stays
-/// hidden.
+/// Shows the tool bars of the editor whose view asks for it, and makes them when they are first shown. Which editor
+/// that is follows from the view's document template: the shell has it from one plug-in. A bar that the user has
+/// switched off stays hidden.
 class CEditorBars : public QObject
 {
     Q_OBJECT
 public:
     explicit CEditorBars(CKsMDIFrameWnd* frame);
-    /// Makes the bars of all usable plug-ins, hidden; those made before are removed.
+    /// Begins anew with the bars of all usable plug-ins; those made before are removed.
     void Create(const std::vector<std::unique_ptr<CPlugin>>& plugins);
     /// Shows or hides the bars of the editor that the view belongs to.
     void Show(const CView* view, bool show);
@@ -32,11 +32,12 @@ private:
     struct Bar
     {
         const CPlugin* plugin;
+        int index;
         QPointer<CKsToolBarEx> bar;
         std::unique_ptr<QAction> toggle;
     };
 
-    void CreateBars(const CPlugin& plugin);
+    void AddBars(const CPlugin& plugin);
     void Update();
     void SaveHidden() const;
 

@@ -32,12 +32,13 @@ public:
     const CProjects& Projects() const { return m_projects; }
     CRecentFiles& RecentFiles() { return m_recent; }
 
-    /// Opens a document or a project; false when the user has been told why not.
-    bool OpenFile(const QString& path);
+    /// Opens a document or a project; false when the user has been told why not. `othersLater`: the first file of a
+    /// project is there at once, the others when it has been painted.
+    bool OpenFile(const QString& path, bool othersLater = false);
     /// A new document of a template. Null when its editor could not make one.
     CKsDoc* NewDocument(CMultiDocTemplate& documents);
     /// Opens a project file with all its members; false when the user has been told why not.
-    bool OpenProject(const QString& path);
+    bool OpenProject(const QString& path, bool othersLater = false);
     /// Closes the project's windows, asking for each; false when one was kept, the project then stays open.
     bool CloseProject(CProjectHandle handle);
 
@@ -75,6 +76,7 @@ private:
     void OnCascade();
     void OnTile();
     void OnSideBySide();
+    QRect FirstPlace() const;
     void OnNextWindow();
     void OnPreviousWindow();
     void OnProjectTree();
@@ -115,7 +117,8 @@ private:
     void ShowMember(CProjectHandle handle, const QString& stored);
     CMemberState StateOf(const QString& stored) const;
     void Announce(WPARAM what, const CProject& project);
-    QString OpenMembers(const CProject& project);
+    QStringList OpenMembers(const CProject& project, const QStringList& members);
+    void OpenOtherMembers(CProjectHandle handle, QStringList missing);
     bool OpenMember(const CProject& project, const QString& member, bool show);
 
     // Edit commands go to what has the focus.

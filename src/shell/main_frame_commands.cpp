@@ -41,6 +41,13 @@ void CMainFrame::OnPreviousWindow()
     MdiArea().activatePreviousSubWindow();
 }
 
+/// Of the first of several windows that stand side by side.
+QRect CMainFrame::FirstPlace() const
+{
+    const QSize area = MdiArea().viewport()->size();
+    return {0, 0, area.width() * 3 / 5, area.height()};
+}
+
 /// The active window stands at the left, the others stand one below the other beside it.
 void CMainFrame::OnSideBySide()
 {
@@ -54,8 +61,9 @@ void CMainFrame::OnSideBySide()
     for (QMdiSubWindow* window : windows)
         window->showNormal();
     const QRect area(QPoint(), MdiArea().viewport()->size());
-    const int width = windows.isEmpty() ? area.width() : area.width() * 3 / 5;
-    first->setGeometry(0, 0, width, area.height());
+    const QRect place = windows.isEmpty() ? area : FirstPlace();
+    const int width = place.width();
+    first->setGeometry(place);
     for (qsizetype i = 0; i < windows.size(); ++i) {
         const int top = int(area.height() * i / windows.size()), bottom = int(area.height() * (i + 1) / windows.size());
         windows[i]->setGeometry(width, top, area.width() - width, bottom - top);

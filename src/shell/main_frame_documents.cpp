@@ -81,10 +81,10 @@ CKsDoc* CMainFrame::NewDocument(CMultiDocTemplate& documents)
     return OpenDocument(documents, {});
 }
 
-bool CMainFrame::OpenFile(const QString& path)
+bool CMainFrame::OpenFile(const QString& path, bool othersLater)
 {
     if (IsProject(path))
-        return OpenProject(path);
+        return OpenProject(path, othersLater);
     if (CMultiDocTemplate* documents = TemplateFor(path))
         return OpenDocument(*documents, path) != nullptr;
     QStringList known{QString::fromLatin1(ProjectExtension)};

@@ -1,4 +1,5 @@
 // Projects in the main frame.
+#include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
 #include "shell/main_frame.h"
 #include "shell/settings_keys.h"
@@ -23,9 +24,14 @@ CKsMDIChildWnd* WindowOf(const QMdiArea& area, const CView* view)
     return nullptr;
 }
 
+bool UsesTabs()
+{
+    return QSettings().value(Settings::Tabs, false).toBool();
+}
+
 } // namespace
 
-bool CMainFrame::OpenProject(const QString& path)
+bool CMainFrame::OpenProject(const QString& path, bool othersLater)
 {
     QString error;
     const CProject* opened = m_projects.Open(path, error);
@@ -36,20 +42,41 @@ bool CMainFrame::OpenProject(const QString& path)
     const CProject project = *opened; // its views change while the members open
     m_recent.Add(project.path);
     Announce(KsRequest::ProjectOpened, project);
-    const QString missing = OpenMembers(project);
-    if (!missing.isEmpty())
-        KsMessageBox(tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing));
     m_projectTree->show();
     resizeDocks({m_projectTree}, {ProjectTreeWidth}, Qt::Horizontal);
-    if (MdiArea().subWindowList().size() > 1 && !project.members.isEmpty() &&
-        !QSettings().value(Settings::Tabs, false).toBool()) {
-        layout()->activate();                                // the tree takes its room first
+    layout()->activate(); // the tree takes its room first
+    const bool waits = othersLater && project.members.size() > 1;
+    if (waits && !UsesTabs()) {
+        ShowTabs(false);
+        PlaceNewWindows(FirstPlace());
+    }
+    const QStringList missing = OpenMembers(project, project.members.mid(0, 1));
+    PlaceNewWindows({});
+    QWidget* first = MdiArea().currentSubWindow();
+    if (waits && first)
+        KsAfterPaint(first, this, [this, project, missing] { OpenOtherMembers(project.handle, missing); });
+    else
+        OpenOtherMembers(project.handle, missing);
+    return true;
+}
+
+/// `missing`: what could not be opened before.
+void CMainFrame::OpenOtherMembers(CProjectHandle handle, QStringList missing)
+{
+    const CProject* found = m_projects.Find(handle);
+    if (!found) // closed in the meantime
+        return;
+    const CProject project = *found;
+    missing += OpenMembers(project, project.members.mid(1));
+    if (!missing.isEmpty())
+        KsMessageBox(
+            tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing.join(u'\n')));
+    if (MdiArea().subWindowList().size() > 1 && !project.members.isEmpty() && !UsesTabs()) {
         ShowMember(project.handle, project.members.front()); // the first file is the main one
         OnSideBySide();
     }
     UpdateTitle();
     UpdateActions();
-    return true;
 }
 
 CMemberState CMainFrame::StateOf(const QString& stored) const
@@ -80,11 +107,11 @@ void CMainFrame::UpdateProjectTree()
         m_projectTree->hide();
 }
 
-/// Opens all members; what could not be opened, a line each.
-QString CMainFrame::OpenMembers(const CProject& project)
+/// Opens some members; what could not be opened, a line each.
+QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& members)
 {
     QStringList missing;
-    for (const QString& stored : project.members) {
+    for (const QString& stored : members) {
         const QString member = ExistingSpelling(stored);
         const QString name = QDir::toNativeSeparators(member);
         if (!QFileInfo::exists(member))
@@ -94,7 +121,7 @@ QString CMainFrame::OpenMembers(const CProject& project)
         else if (!OpenMember(project, member, false))
             missing << name;
     }
-    return missing.join(u'\n');
+    return missing;
 }
 
 void CMainFrame::ShowMember(CProjectHandle handle, const QString& stored)

@@ -58,7 +58,7 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
     frame.show();
     // Before control returns to the event loop: the first thing painted is the first page, not an empty frame.
     for (const QString& file : parser.positionalArguments())
-        frame.OpenFile(QDir::current().absoluteFilePath(file));
+        frame.OpenFile(QDir::current().absoluteFilePath(file), true);
     if (onStarted)
         QTimer::singleShot(0, &frame, [&] { onStarted(frame); });
     return QApplication::exec();

@@ -31,6 +31,32 @@ TEST_F(ShellTest, ProjectsDoNotMix)
     EXPECT_TRUE(asked.isEmpty());
 }
 
+TEST_F(ShellTest, AtTheStartTheFirstFileIsThereAtOnceAndTheOthersFollow)
+{
+    for (const char* name : {"a.tst", "b.tst", "c.tst"})
+        Write(name);
+    const QString path = WriteProject("p.kvrp", "File = <a.tst>\nFile = <b.tst>\nFile = <gone.tst>\nFile = <c.tst>\n");
+    EXPECT_TRUE(frame->OpenFile(path, true));
+    const auto opened = [this] {
+        QStringList open;
+        for (const auto& document : Texts().Documents())
+            open << QFileInfo(document->GetPathName()).fileName();
+        return open.join(' ').toStdString();
+    };
+    EXPECT_EQ(opened(), "a.tst");
+    const QRect before = ViewOf("a.tst")->parentWidget()->geometry();
+    ASSERT_TRUE(QTest::qWaitFor([&] { return opened() == "a.tst b.tst c.tst"; }));
+    EXPECT_EQ(ViewOf("a.tst")->parentWidget()->geometry(), before) << "it stands where it will stay";
+    EXPECT_EQ(frame->ActiveDocument(), ViewOf("a.tst")->GetDocument());
+    EXPECT_EQ(asked.size(), 1) << "gone.tst";
+
+    EXPECT_TRUE(frame->CloseProject(ProjectOf("a.tst")));
+    EXPECT_TRUE(frame->OpenFile(path, true));
+    EXPECT_TRUE(frame->CloseProject(ProjectOf("a.tst")));
+    QTest::qWait(600);
+    EXPECT_EQ(opened(), "") << "the others do not open in a project that was closed";
+}
+
 TEST_F(ShellTest, AClosedViewLeavesAndTheOthersHearOfIt)
 {
     Write("a.tst");

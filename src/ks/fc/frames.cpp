@@ -158,6 +158,12 @@ void CKsMDIFrameWnd::EnableMenuItem(int position, bool enable)
 
 void CKsMDIFrameWnd::ShowWindow(CKsMDIChildWnd* window)
 {
+    if (m_newPlace.isValid()) {
+        window->setGeometry(m_newPlace);
+        window->show();
+        m_area->setActiveSubWindow(window);
+        return;
+    }
     const QSize area = m_area->viewport()->size();
     window->resize(window->sizeHint().expandedTo(area * 2 / 3).boundedTo(area));
     window->show();

@@ -101,6 +101,8 @@ public:
     void EnableMenuItem(int position, bool enable);
     /// Shows a window of the area for the first time, large enough to work in, and activates it.
     void ShowWindow(CKsMDIChildWnd* window);
+    /// Where windows are shown from now on, in the area; an empty place: where there is room.
+    void PlaceNewWindows(const QRect& place) { m_newPlace = place; }
     /// Asks for every modified document first, then closes all windows; false, and nothing closed, when one was kept.
     bool CloseAllWindows();
     /// Sends a command to the active view; false when there is none or it cannot do it now.
@@ -119,6 +121,7 @@ private:
     void SubWindowActivated();
     CKsMDIArea* m_area;
     QPointer<CView> m_activeView;
+    QRect m_newPlace;
 };
 
 /// A button of a tool bar resource; command 0 is a separator.
