@@ -115,6 +115,7 @@ void DeleteOnTheMap(Robot& robot, Project& project)
     auto* grid = project.Page(InitTab, InitGrid);
     const int before = grid->model()->rowCount(), onMap = project.OnMap();
     project.Activate(".kvnw");
+    project.Map()->setFocus(); // in the table beside it Delete would delete a branch
     robot.Key(project.Map(), Qt::Key_Escape);
     robot.Key(project.Map(), Qt::Key_N);
     const QString selected = project.Marked();
