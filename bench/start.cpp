@@ -14,7 +14,7 @@
 
 namespace {
 
-constexpr int Rounds = 15, Tabs = 22;
+constexpr int Rounds = 31, Tabs = 22;
 
 int RunShell(int argc, char** argv)
 {

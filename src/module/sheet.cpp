@@ -3,6 +3,7 @@
 #include "module/view.h"
 #include "pages/framework/page.h"
 
+#include <QHash>
 #include <QKeyEvent>
 #include <QScrollArea>
 #include <QSignalBlocker>
@@ -22,12 +23,21 @@ public:
 
     QSize tabSizeHint(int index) const override
     {
-        const QSize text = fontMetrics().size(Qt::TextShowMnemonic, tabText(index));
+        // Every tab that is added has all of them asked for their size.
+        QSize& text = m_sizes[tabText(index)];
+        if (text.isEmpty())
+            text = fontMetrics().size(Qt::TextShowMnemonic, tabText(index));
         return {text.width() + 3 * fontMetrics().height(), text.height() + fontMetrics().height() * 2 / 3};
     }
     QSize minimumTabSizeHint(int index) const override { return tabSizeHint(index); }
 
 protected:
+    void changeEvent(QEvent* event) override
+    {
+        if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange)
+            m_sizes.clear();
+        QTabBar::changeEvent(event);
+    }
     void paintEvent(QPaintEvent*) override
     {
         QStylePainter painter(this);
@@ -47,6 +57,9 @@ protected:
             }
         }
     }
+
+private:
+    mutable QHash<QString, QSize> m_sizes; // of captions in the present font
 };
 
 } // namespace
