@@ -3,18 +3,11 @@
 
 #include "editors/cross_sections/module.h"
 #include "editors/cross_sections/view.h"
-#include "ks/fc/doc_template.h"
-#include "ks/fc/message_box.h"
+#include "editors/editor_fixture.h"
 
-#include <QFile>
 #include <QTableView>
-#include <QTemporaryDir>
-#include <QTest>
-#include <QUndoStack>
 #include <cmath>
 #include <functional>
-#include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 /// Not sorted. MAIN has a trapezoid 10 m deep and wide at its bottom, two surveys of one place, and a section without
 /// anything.
@@ -75,24 +68,10 @@ enum SmallRow
     SmallRows
 };
 
-class CrossSectionTest : public testing::Test, public CKsWindow
+class CrossSectionTest : public EditorTest
 {
 protected:
-    CrossSectionTest()
-    {
-        KsSetMainWindow(this);
-        KsSetMessageBoxHandler([this](const CString& text, QMessageBox::StandardButtons) {
-            boxes << text;
-            return QMessageBox::Ok;
-        });
-    }
-    ~CrossSectionTest() override
-    {
-        frame.reset();
-        KsSetMessageBoxHandler({});
-        KsSetMainWindow(nullptr);
-        KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
-    }
+    ~CrossSectionTest() override { frame.reset(); }
 
     LRESULT WindowProc(unsigned message, WPARAM request, LPARAM lParam) override
     {
@@ -117,47 +96,14 @@ protected:
         return request == KsRequest::JoinProject ? project : 0;
     }
 
-    QString Write(const QString& name, const QByteArray& text) const
-    {
-        QFile file(folder.filePath(name));
-        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-        file.write(text);
-        return file.fileName();
-    }
-    static QByteArray Read(const QString& path)
-    {
-        QFile file(path);
-        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
-    }
-
     /// Opens sections in a window.
     CCrossSectionView* Open(const QByteArray& text = SmallSections)
     {
-        frame = std::make_unique<CKsMDIFrameWnd>();
-        frame->resize(1000, 600);
-        frame->show();
-        documents.reset(CrossSectionModule::CreateTemplate());
-        auto* document = documents->OpenDocumentFile(frame.get(), Write("river.kvxs", text));
-        if (!document)
-            return nullptr;
-        EXPECT_TRUE(QTest::qWaitForWindowActive(frame.get()));
-        auto* view = static_cast<CCrossSectionView*>(document->Views().at(0));
-        view->Sections()->setFocus();
+        auto* view = static_cast<CCrossSectionView*>(
+            OpenIn({1000, 600}, CrossSectionModule::CreateTemplate(), Write("river.kvxs", text)));
+        if (view)
+            view->Sections()->setFocus();
         return view;
-    }
-    static LRESULT Ask(CCrossSectionView* view, WPARAM request, CObList* objects)
-    {
-        CKSComm_Package package;
-        package.objects = objects;
-        return KsSendMessage(view, KsMessage::BetweenEditors(), request, reinterpret_cast<LPARAM>(&package));
-    }
-    static std::unique_ptr<CKvrCBELocation> Location(const char* branch, double chainage, double radius = KsUnset)
-    {
-        auto item = std::make_unique<CKvrCBELocation>();
-        item->branch = branch;
-        item->chainage = chainage;
-        item->radius = radius;
-        return item;
     }
     static void Select(QTableView* table, int row) { table->setCurrentIndex(table->model()->index(row, 0)); }
     static QString Text(const QTableView* table, int row, int column, int role = Qt::DisplayRole)
@@ -174,11 +120,6 @@ protected:
             view->Document()->UndoStack().undo();
     }
 
-    QTemporaryDir folder;
-    QStringList boxes, log;
-    std::intptr_t project = 7;
     QString projectBranch;
     std::function<void()> answer; // what another editor does when it hears of a place
-    std::unique_ptr<CMultiDocTemplate> documents;
-    std::unique_ptr<CKsMDIFrameWnd> frame;
 };

@@ -1,44 +1,7 @@
 // The plug-in itself.
-#include "ks/fc/frames.h"
-#include "ks/fc/plugin.h"
 #include "network_fixture.h"
-
-#include <QLibrary>
-
-namespace {
 
 TEST_F(NetworkTest, ThePluginOffersItsTemplateNameAndToolBar)
 {
-    QLibrary library(KVR_PLUGIN);
-    ASSERT_TRUE(library.load()) << library.errorString().toStdString();
-#define RESOLVE(result, name, arguments)                                                                               \
-    const auto name = reinterpret_cast<result(*) arguments>(library.resolve(#name));                                   \
-    ASSERT_TRUE(name) << #name;
-    KS_PLUGIN_FUNCTIONS(RESOLVE)
-#undef RESOLVE
-    ASSERT_EQ(KsGetNumDocTemplates(), 1);
-    const std::unique_ptr<CMultiDocTemplate> first(KsGetDocTemplatePtr(0)), second(KsGetDocTemplatePtr(0));
-    EXPECT_NE(first, second);
-    EXPECT_EQ(KsGetDocTemplatePtr(1), nullptr);
-    EXPECT_TRUE(first->MatchesExtension("river.KVNW"));
-    EXPECT_EQ(first->FileDialogFilter(), "KVR River Network (*.kvnw *.KVNW)");
-    CString name;
-    EXPECT_TRUE(KsGetEditorString(&name));
-    EXPECT_EQ(name, "River Network");
-    EXPECT_FALSE(KsGetEditorString(nullptr));
-    EXPECT_FALSE(KsGetToolbarString(&name, 1));
-    EXPECT_TRUE(QFile::exists(KsBitmapPath(KsGetBitmapId())));
-
-    CKsMDIFrameWnd window;
-    EXPECT_EQ(KsCreateToolbar(&window, 0, 1, 1), nullptr);
-    EXPECT_EQ(KsCreateToolbar(nullptr, 0, 1, 0), nullptr);
-    CKsToolBarEx* bar = KsCreateToolbar(&window, 0, 1, 0);
-    ASSERT_NE(bar, nullptr);
-    for (const QAction* action : bar->actions()) {
-        EXPECT_FALSE(action->icon().isNull());
-        EXPECT_FALSE(action->text().isEmpty());
-        EXPECT_FALSE(action->isEnabled()); // no network is shown
-    }
+    CheckPlugin("river.KVNW", "KVR River Network (*.kvnw *.KVNW)", "River Network", "KVR Network Tools");
 }
-
-} // namespace

@@ -1,21 +1,12 @@
 // A small network, a shell that answers its requests, and a document of HD parameters that only looks like one.
 #pragma once
 
+#include "editors/editor_fixture.h"
 #include "editors/network/module.h"
 #include "editors/network/view.h"
-#include "ks/fc/doc_template.h"
 #include "ks/fc/exports.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/hd_messages.h"
-#include "ks/fc/message_box.h"
-#include "ks/units/edit_style.h"
-
-#include <QFile>
-#include <QTemporaryDir>
-#include <QTest>
-#include <QUndoStack>
-#include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 /// MAIN goes 3000 m to the east and 4000 m to the north, its chainages from 1000 to 8000; SIDE joins it from the south,
 /// digitised from its mouth up.
@@ -84,16 +75,11 @@ public:
     QStringList requests;
 };
 
-class NetworkTest : public testing::Test, public CKsWindow
+class NetworkTest : public EditorTest
 {
 protected:
     NetworkTest()
     {
-        KsSetMainWindow(this);
-        KsSetMessageBoxHandler([this](const CString& text, QMessageBox::StandardButtons) {
-            boxes << text;
-            return QMessageBox::Ok;
-        });
         hdDoc.SetPathName(folder.filePath("river.HDKV"));
         hdDoc.AddView(&hdView);
         current = this;
@@ -107,10 +93,7 @@ protected:
     {
         KsClearExports();
         frame.reset();
-        KsSetMessageBoxHandler({});
         KsSetFileDialogHandler({});
-        KsSetMainWindow(nullptr);
-        KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
     }
 
     LRESULT WindowProc(unsigned message, WPARAM request, LPARAM lParam) override
@@ -127,46 +110,14 @@ protected:
         return request == KsRequest::JoinProject ? project : 0;
     }
 
-    QString Write(const QString& name, const QByteArray& text) const
-    {
-        QFile file(folder.filePath(name));
-        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-        file.write(text);
-        return file.fileName();
-    }
-    static QByteArray Read(const QString& path)
-    {
-        QFile file(path);
-        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
-    }
-
     /// Opens the small network in a window.
     CNetworkView* Open(const QByteArray& text = SmallNetwork)
     {
-        frame = std::make_unique<CKsMDIFrameWnd>();
-        frame->resize(900, 600);
-        frame->show();
-        documents.reset(NetworkModule::CreateTemplate());
-        auto* document = documents->OpenDocumentFile(frame.get(), Write("river.kvnw", text));
-        if (!document)
-            return nullptr;
-        EXPECT_TRUE(QTest::qWaitForWindowActive(frame.get()));
-        auto* view = static_cast<CNetworkView*>(document->Views().at(0));
-        view->Map()->setFocus();
+        auto* view =
+            static_cast<CNetworkView*>(OpenIn({900, 600}, NetworkModule::CreateTemplate(), Write("river.kvnw", text)));
+        if (view)
+            view->Map()->setFocus();
         return view;
-    }
-    static LRESULT Ask(CNetworkView* view, WPARAM request, CObList* objects)
-    {
-        CKSComm_Package package;
-        package.objects = objects;
-        return KsSendMessage(view, KsMessage::BetweenEditors(), request, reinterpret_cast<LPARAM>(&package));
-    }
-    static std::unique_ptr<CKvrCBELocation> Location(const char* branch, double chainage)
-    {
-        auto item = std::make_unique<CKvrCBELocation>();
-        item->branch = branch;
-        item->chainage = chainage;
-        return item;
     }
     static void Click(CNetworkMap* map, const std::optional<QPointF>& at, const QPoint& off = {})
     {
@@ -201,9 +152,6 @@ protected:
     }
 
     inline static NetworkTest* current = nullptr;
-    QTemporaryDir folder;
-    QStringList boxes, log;
-    std::intptr_t project = 7;
     bool hdOpen = true;
     CNetworkView* storing = nullptr; // told of a change while data are fetched
     std::vector<CMapLocation> hdLocations{{"MAIN", 2000, HDInitialData, {}, KsUnset},
@@ -213,6 +161,4 @@ protected:
                                           {"SIDE", 250, HDDataTypeCount, {}, KsUnset}}; // no such kind
     FakeHDDoc hdDoc;
     FakeHDView hdView; // goes before its document
-    std::unique_ptr<CMultiDocTemplate> documents;
-    std::unique_ptr<CKsMDIFrameWnd> frame;
 };
