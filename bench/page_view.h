@@ -22,7 +22,7 @@ public:
         m_page.StoreToDocument();
         m_document.UpdateAllViews(nullptr, Hint::Reload);
     }
-    void CurrentLocationChanged(int) override {}
+    void CurrentLocationChanged() override {}
     void Execute(int) override {}
     QStringList BranchNames() override { return {}; }
     void EnableLinesMenu(bool) override {}

@@ -159,7 +159,7 @@ void CKavo0_hdView::EditedLineChanged(int column)
     GetDocument()->UpdateAllViews(nullptr, Hint::Reload);
 }
 
-void CKavo0_hdView::CurrentLocationChanged(int /*row*/)
+void CKavo0_hdView::CurrentLocationChanged()
 {
     ShowLine();
     if (MainFrame())

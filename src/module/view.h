@@ -39,7 +39,7 @@ public:
     // IPageHost
     CView* HostView() override { return this; }
     void EditedLineChanged(int column) override;
-    void CurrentLocationChanged(int row) override;
+    void CurrentLocationChanged() override;
     void Execute(int command) override { OnCommand(command); }
     QStringList BranchNames() override;
     void EnableLinesMenu(bool enable) override;

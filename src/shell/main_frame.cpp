@@ -38,7 +38,8 @@ CMainFrame::CMainFrame() : m_bars(this)
     m_projectTree = new CProjectTree(this);
     addDockWidget(Qt::LeftDockWidgetArea, m_projectTree);
     m_projectTree->hide(); // until there is a project
-    connect(m_projectTree, &CProjectTree::MemberChosen, this, &CMainFrame::ShowMember);
+    // Queued: what is chosen fills the tree anew, whose items are busy until then.
+    connect(m_projectTree, &CProjectTree::MemberChosen, this, &CMainFrame::ShowMember, Qt::QueuedConnection);
     connect(m_projectTree, &CProjectTree::CloseProjectChosen, this, &CMainFrame::CloseProject, Qt::QueuedConnection);
 
     CreateActions();
@@ -171,7 +172,6 @@ void CMainFrame::WriteSettings() const
     QSettings settings;
     settings.setValue(Settings::Geometry, saveGeometry());
     settings.setValue(Settings::State, saveState());
-    settings.setValue(Settings::Tabs, MdiArea().viewMode() == QMdiArea::TabbedView);
     settings.setValue(Settings::UsCustomary, KsUnits::Instance().System() == KsUnitSystem::UsCustomary);
     settings.setValue(Settings::Language, KsLanguage::Instance().Current());
 }

@@ -76,7 +76,6 @@ private:
     void OnCascade();
     void OnTile();
     void OnSideBySide();
-    QRect FirstPlace() const;
     void OnNextWindow();
     void OnPreviousWindow();
     void OnProjectTree();
@@ -102,6 +101,9 @@ private:
     void UpdatePluginLabel();
     QAction* Action(const char* name) const;
     void ShowTabs(bool tabs);
+    void ChooseTabs(bool tabs);
+    QRect FirstPlace() const;
+    void PlaceSideBySide();
     void ReadSettings();
     void WriteSettings() const;
     QString HelpFile() const;

@@ -2,12 +2,14 @@
 #include "ks/units/edit_style.h"
 #include "shell/main_frame.h"
 #include "shell/plugins_dialog.h"
+#include "shell/settings_keys.h"
 
 #include <QAction>
 #include <QCoreApplication>
 #include <QDesktopServices>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QSettings>
 #include <QUrl>
 #include <algorithm>
 
@@ -48,8 +50,14 @@ QRect CMainFrame::FirstPlace() const
     return {0, 0, area.width() * 3 / 5, area.height()};
 }
 
-/// The active window stands at the left, the others stand one below the other beside it.
 void CMainFrame::OnSideBySide()
+{
+    ChooseTabs(false);
+    PlaceSideBySide();
+}
+
+/// The active window stands at the left, the others stand one below the other beside it.
+void CMainFrame::PlaceSideBySide()
 {
     QMdiSubWindow* first = MdiArea().currentSubWindow();
     if (!first)
@@ -76,9 +84,16 @@ void CMainFrame::OnProjectTree()
     m_projectTree->setVisible(!m_projectTree->isVisible());
 }
 
+/// What the user chose is kept; a project that stands side by side by itself is no choice of tabs or windows.
+void CMainFrame::ChooseTabs(bool tabs)
+{
+    QSettings().setValue(Settings::Tabs, tabs);
+    ShowTabs(tabs);
+}
+
 void CMainFrame::OnTabs()
 {
-    ShowTabs(Action("actionTabs")->isChecked());
+    ChooseTabs(Action("actionTabs")->isChecked());
 }
 
 void CMainFrame::OnCloseAll()

@@ -24,6 +24,7 @@ CKsMDIChildWnd* WindowOf(const QMdiArea& area, const CView* view)
     return nullptr;
 }
 
+/// Whether the user chose tabs, which single documents have also when nobody chose.
 bool UsesTabs()
 {
     return QSettings().value(Settings::Tabs, false).toBool();
@@ -73,7 +74,7 @@ void CMainFrame::OpenOtherMembers(CProjectHandle handle, QStringList missing)
             tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing.join(u'\n')));
     if (MdiArea().subWindowList().size() > 1 && !project.members.isEmpty() && !UsesTabs()) {
         ShowMember(project.handle, project.members.front()); // the first file is the main one
-        OnSideBySide();
+        PlaceSideBySide();
     }
     UpdateTitle();
     UpdateActions();

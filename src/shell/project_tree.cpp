@@ -11,6 +11,11 @@ namespace {
 
 constexpr int HandleRole = Qt::UserRole, PathRole = Qt::UserRole + 1; // the path is that of a member
 
+CProjectHandle HandleOf(const QTreeWidgetItem& item)
+{
+    return CProjectHandle(item.data(0, HandleRole).toLongLong());
+}
+
 } // namespace
 
 CProjectTree::CProjectTree(QWidget* parent) : QDockWidget(parent), m_tree(new QTreeWidget(this))
@@ -20,7 +25,10 @@ CProjectTree::CProjectTree(QWidget* parent) : QDockWidget(parent), m_tree(new QT
     m_tree->setHeaderHidden(true);
     m_tree->setContextMenuPolicy(Qt::CustomContextMenu);
     m_tree->setUniformRowHeights(true);
-    connect(m_tree, &QTreeWidget::itemActivated, this, [this](QTreeWidgetItem* item) { Chosen(item); });
+    connect(m_tree, &QTreeWidget::itemActivated, this, [this](QTreeWidgetItem* item) {
+        if (item->parent())
+            emit MemberChosen(HandleOf(*item), item->data(0, PathRole).toString());
+    });
     connect(m_tree, &QTreeWidget::customContextMenuRequested, this, &CProjectTree::ShowMenu);
     QEvent translate(QEvent::LanguageChange);
     changeEvent(&translate);
@@ -65,22 +73,17 @@ void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, cons
         item->setForeground(0, palette().color(QPalette::Disabled, QPalette::Text));
 }
 
-void CProjectTree::Chosen(QTreeWidgetItem* item)
-{
-    const QString path = item->data(0, PathRole).toString();
-    if (!path.isEmpty())
-        emit MemberChosen(CProjectHandle(item->data(0, HandleRole).toLongLong()), path);
-}
-
 void CProjectTree::ShowMenu(const QPoint& position)
 {
-    QTreeWidgetItem* item = m_tree->itemAt(position);
+    const QTreeWidgetItem* item = m_tree->itemAt(position);
     if (!item)
         return;
-    const auto handle = CProjectHandle(item->data(0, HandleRole).toLongLong());
+    // The item may be gone when the menu is answered: the tree is filled anew whenever a document changes.
+    const CProjectHandle handle = HandleOf(*item);
+    const QString path = item->data(0, PathRole).toString();
     QMenu menu(this);
-    if (item->parent())
-        menu.addAction(tr("&Open"), this, [this, item] { Chosen(item); });
+    if (!path.isEmpty())
+        menu.addAction(tr("&Open"), this, [this, handle, path] { emit MemberChosen(handle, path); });
     menu.addAction(tr("&Close Project"), this, [this, handle] { emit CloseProjectChosen(handle); });
     menu.exec(m_tree->viewport()->mapToGlobal(position));
 }

@@ -43,7 +43,6 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
-    void Chosen(QTreeWidgetItem* item);
     void ShowMenu(const QPoint& position);
     void AddMember(QTreeWidgetItem& project, const QString& path, const CMemberState& state);
 

@@ -42,7 +42,7 @@ public:
         page->StoreToDocument();
         document.UpdateAllViews(nullptr, Hint::Reload);
     }
-    void CurrentLocationChanged(int row) override { locations << row; }
+    void CurrentLocationChanged() override { locations << page->GetGrid()->CurrentRow(); }
     void Execute(int command) override
     {
         commands << command;

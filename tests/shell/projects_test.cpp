@@ -49,12 +49,36 @@ TEST_F(ShellTest, AtTheStartTheFirstFileIsThereAtOnceAndTheOthersFollow)
     EXPECT_EQ(ViewOf("a.tst")->parentWidget()->geometry(), before) << "it stands where it will stay";
     EXPECT_EQ(frame->ActiveDocument(), ViewOf("a.tst")->GetDocument());
     EXPECT_EQ(asked.size(), 1) << "gone.tst";
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::SubWindowView);
 
     EXPECT_TRUE(frame->CloseProject(ProjectOf("a.tst")));
     EXPECT_TRUE(frame->OpenFile(path, true));
     EXPECT_TRUE(frame->CloseProject(ProjectOf("a.tst")));
     QTest::qWait(600);
     EXPECT_EQ(opened(), "") << "the others do not open in a project that was closed";
+}
+
+TEST_F(ShellTest, AProjectStandsSideBySideUnlessTheUserChoseTabs)
+{
+    Write("a.tst");
+    Write("b.tst");
+    const QString path = WriteProject("p.kvrp", "File = <a.tst>\nFile = <b.tst>\n");
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::TabbedView) << "single documents";
+    frame->close(); // a session in which nothing was chosen
+    Start();
+    frame->OpenFile(path);
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::SubWindowView);
+    frame->close();
+    Start();
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::TabbedView);
+    Action("actionTabs")->trigger();
+    Action("actionTabs")->trigger();
+    frame->OpenFile(path);
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::TabbedView) << "chosen";
+    Action("actionSideBySide")->trigger();
+    frame->close();
+    Start();
+    EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::SubWindowView) << "chosen";
 }
 
 TEST_F(ShellTest, AClosedViewLeavesAndTheOthersHearOfIt)
@@ -181,6 +205,7 @@ TEST_F(ShellTest, ATreeShowsTheProjectsFiles)
     tree->setCurrentItem(tree->topLevelItem(0)->child(0));
     tree->setFocus();
     QTest::keyClick(tree, Qt::Key_Return);
+    QCoreApplication::processEvents();
     EXPECT_NE(ProjectOf("a.tst"), 0);
     EXPECT_EQ(shown(), "a.tst open, b.tst open, gone.tst (missing), p.kvrp (no editor)");
     Action("actionProjectTree")->trigger();

@@ -24,11 +24,6 @@ const CLinearReference& CNetworkDoc::Reference() const
     return *m_reference;
 }
 
-BOOL CNetworkDoc::OnNewDocument()
-{
-    return CKsDoc::OnNewDocument();
-}
-
 BOOL CNetworkDoc::OnOpenDocument(const CString& path)
 {
     if (!CKsDoc::OnOpenDocument(path))

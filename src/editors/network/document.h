@@ -17,7 +17,6 @@ public:
     /// The lines, prepared when first asked for after a change.
     const CLinearReference& Reference() const;
 
-    BOOL OnNewDocument() override;
     /// A file that cannot be read is not opened, after a message that names the line.
     BOOL OnOpenDocument(const CString& path) override;
     BOOL OnSaveDocument(const CString& path) override;

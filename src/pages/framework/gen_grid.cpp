@@ -186,7 +186,7 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
         return;
     m_lastRow = row;
     if (row > m_model->FixedRows() && Host() && IsLocationGrid())
-        Host()->CurrentLocationChanged(row - m_model->FixedRows());
+        Host()->CurrentLocationChanged();
 }
 
 void CGenGrid::focusOutEvent(QFocusEvent* event)
