@@ -1,6 +1,10 @@
 #include "editors/common/project_doc.h"
 
 #include "ks/fc/exchange.h"
+#include "ks/fc/message_box.h"
+
+#include <QDir>
+#include <QUndoStack>
 
 namespace {
 
@@ -10,6 +14,34 @@ LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CKSComm_Packag
 }
 
 } // namespace
+
+CProjectDoc::CProjectDoc(int kind) : m_kind(kind)
+{
+    connect(&UndoStack(), &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
+}
+
+BOOL CProjectDoc::OnOpenDocument(const CString& path)
+{
+    if (!CKsDoc::OnOpenDocument(path))
+        return false;
+    const QString reason = ReadFile(path);
+    if (!reason.isEmpty())
+        KsMessageBox(reason);
+    return reason.isEmpty();
+}
+
+BOOL CProjectDoc::OnSaveDocument(const CString& path)
+{
+    UpdateAllViews(nullptr, StoreHint);
+    const QString reason = WriteFile(path);
+    if (!reason.isEmpty()) {
+        KsMessageBox(tr("%1 could not be saved.\n%2").arg(QDir::toNativeSeparators(path), reason));
+        return false;
+    }
+    UndoStack().setClean();
+    SetModifiedFlag(false);
+    return true;
+}
 
 CKSComm_Package CProjectDoc::Package(CView* view, CObList* objects) const
 {

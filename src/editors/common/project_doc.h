@@ -9,7 +9,12 @@ class CProjectDoc : public CKsDoc
     Q_OBJECT
 public:
     /// `kind`: what the editor's packages call themselves.
-    explicit CProjectDoc(int kind) : m_kind(kind) {}
+    explicit CProjectDoc(int kind);
+
+    /// A file that cannot be read is not opened, after a message that names the line.
+    BOOL OnOpenDocument(const CString& path) override;
+    /// When that fails, the document stays as it is, after a message that tells why.
+    BOOL OnSaveDocument(const CString& path) override;
 
     /// Joins the project that the document's file is a member of; false when there is none.
     bool JoinProject(CView* view);
@@ -26,6 +31,11 @@ public:
     LRESULT AskView(CView* receiver, WPARAM request, CView* sender, CObList* objects) const;
     /// The views of the project's other documents, for the duration of the present event.
     std::vector<CView*> ProjectViews(CView* view) const;
+
+protected:
+    /// Both return why not, for the user; nothing when it went well.
+    virtual QString ReadFile(const CString& path) = 0;
+    virtual QString WriteFile(const CString& path) const = 0;
 
 private:
     CKSComm_Package Package(CView* view, CObList* objects) const;

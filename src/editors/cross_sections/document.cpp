@@ -2,19 +2,14 @@
 
 #include "editors/cross_sections/commands.h"
 #include "editors/cross_sections/section_file.h"
-#include "ks/fc/message_box.h"
 
-#include <QDir>
 #include <QUndoStack>
 
 namespace {
 constexpr int CrossSectionPackageKind = 2; // what this editor's packages call themselves
 } // namespace
 
-CCrossSectionDoc::CCrossSectionDoc() : CProjectDoc(CrossSectionPackageKind)
-{
-    connect(&UndoStack(), &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
-}
+CCrossSectionDoc::CCrossSectionDoc() : CProjectDoc(CrossSectionPackageKind) {}
 
 const CCrossSection* CCrossSectionDoc::Section(int index) const
 {
@@ -22,27 +17,14 @@ const CCrossSection* CCrossSectionDoc::Section(int index) const
     return index >= 0 && std::size_t(index) < sections.size() ? &sections[std::size_t(index)] : nullptr;
 }
 
-BOOL CCrossSectionDoc::OnOpenDocument(const CString& path)
+QString CCrossSectionDoc::ReadFile(const CString& path)
 {
-    if (!CKsDoc::OnOpenDocument(path))
-        return false;
-    const QString error = ReadCrossSections(path, m_sections);
-    if (!error.isEmpty())
-        KsMessageBox(error);
-    return error.isEmpty();
+    return ReadCrossSections(path, m_sections);
 }
 
-BOOL CCrossSectionDoc::OnSaveDocument(const CString& path)
+QString CCrossSectionDoc::WriteFile(const CString& path) const
 {
-    UpdateAllViews(nullptr, StoreHint);
-    const QString reason = WriteCrossSections(path, m_sections);
-    if (!reason.isEmpty()) {
-        KsMessageBox(tr("%1 could not be saved.\n%2").arg(QDir::toNativeSeparators(path), reason));
-        return false;
-    }
-    UndoStack().setClean();
-    SetModifiedFlag(false);
-    return true;
+    return WriteCrossSections(path, m_sections);
 }
 
 void CCrossSectionDoc::DeleteContents()

@@ -14,9 +14,6 @@ public:
     /// Null for an index that there is none for.
     const CCrossSection* Section(int index) const;
 
-    /// A file that cannot be read is not opened, after a message that names the line.
-    BOOL OnOpenDocument(const CString& path) override;
-    BOOL OnSaveDocument(const CString& path) override;
     void DeleteContents() override;
 
     // Changes; each can be undone, marks the document modified and is told to the project.
@@ -31,6 +28,10 @@ public:
 signals:
     /// Something changed at the section `index`, which may be the one behind the last.
     void SectionsChanged(int index);
+
+protected:
+    QString ReadFile(const CString& path) override;
+    QString WriteFile(const CString& path) const override;
 
 private:
     friend class CSectionCommand;

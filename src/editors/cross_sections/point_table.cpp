@@ -26,7 +26,7 @@ const PointColumn& ColumnAt(int column)
 
 } // namespace
 
-CPointTable::CPointTable(CCrossSectionDoc& document, QObject* parent) : CLinesTable(document, parent) {}
+CPointTable::CPointTable(CCrossSectionDoc& document, QObject* parent) : CSectionLines(document, parent) {}
 
 int CPointTable::Lines() const
 {
@@ -47,7 +47,7 @@ int CPointTable::columnCount(const QModelIndex& parent) const
 QVariant CPointTable::headerData(int section, Qt::Orientation orientation, int role) const
 {
     if (orientation != Qt::Horizontal || role != Qt::DisplayRole)
-        return CLinesTable::headerData(section, orientation, role);
+        return CSectionLines::headerData(section, orientation, role);
     return WithUnit(tr(ColumnAt(section).name), ColumnAt(section).group);
 }
 

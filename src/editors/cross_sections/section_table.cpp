@@ -29,7 +29,7 @@ const SectionColumn& ColumnAt(int column)
 
 } // namespace
 
-CSectionTable::CSectionTable(CCrossSectionDoc& document, QObject* parent) : CLinesTable(document, parent)
+CSectionTable::CSectionTable(CCrossSectionDoc& document, QObject* parent) : CSectionLines(document, parent)
 {
     Reload();
 }
@@ -47,7 +47,7 @@ int CSectionTable::columnCount(const QModelIndex& parent) const
 QVariant CSectionTable::headerData(int section, Qt::Orientation orientation, int role) const
 {
     if (orientation != Qt::Horizontal || role != Qt::DisplayRole)
-        return CLinesTable::headerData(section, orientation, role);
+        return CSectionLines::headerData(section, orientation, role);
     const SectionColumn& column = ColumnAt(section);
     return column.value ? WithUnit(tr(column.name), column.group) : tr(column.name);
 }

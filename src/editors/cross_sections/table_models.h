@@ -1,41 +1,27 @@
 // The tables beside the plot: the cross sections, and the points of one of them.
 #pragma once
 
+#include "editors/common/lines_table.h"
 #include "editors/cross_sections/document.h"
 
-#include <QAbstractTableModel>
-
-/// What both tables do alike. Rows follow the document; a change that cannot be made is refused with a message.
-class CLinesTable : public QAbstractTableModel
+/// What both tables do alike.
+class CSectionLines : public CLinesTable
 {
     Q_OBJECT
 public:
-    int rowCount(const QModelIndex& parent = {}) const override;
     Qt::ItemFlags flags(const QModelIndex& index) const override;
-    /// Shows the document's present state.
-    void Reload();
-    virtual void RemoveLines(const std::vector<int>& rows) = 0;
     /// The lines as text for a spreadsheet, in the user's units with every digit: cells separated by tabs.
     QString TextOf(const std::vector<int>& rows) const;
 
-signals:
-    /// For the user: where, what was expected and what was typed.
-    void Refused(const QString& message);
-
 protected:
-    CLinesTable(CCrossSectionDoc& document, QObject* parent) : QAbstractTableModel(parent), m_document(document) {}
-    virtual int Lines() const = 0;
-    bool Refuse(const QModelIndex& index, const QString& message);
+    CSectionLines(CCrossSectionDoc& document, QObject* parent) : CLinesTable(parent), m_document(document) {}
     bool RefuseNumber(const QModelIndex& index, const QString& typed);
     /// Puts a changed section in its place, unless it may not stand there.
     bool Replace(const QModelIndex& index, int section, CCrossSection changed, const QString& text);
     CCrossSectionDoc& m_document;
-
-private:
-    int m_rows = 0;
 };
 
-class CSectionTable : public CLinesTable
+class CSectionTable : public CSectionLines
 {
     Q_OBJECT
 public:
@@ -62,7 +48,7 @@ protected:
     int Lines() const override;
 };
 
-class CPointTable : public CLinesTable
+class CPointTable : public CSectionLines
 {
     Q_OBJECT
 public:

@@ -70,7 +70,7 @@ void CCrossSectionView::MakeTables(QSplitter* splitter)
     splitter->addWidget(side);
 }
 
-QTableView* CCrossSectionView::MakeTable(CLinesTable* model, const char* name)
+QTableView* CCrossSectionView::MakeTable(CSectionLines* model, const char* name)
 {
     auto* table = new QTableView;
     table->setObjectName(QString::fromLatin1(name));
@@ -95,7 +95,7 @@ QTableView* CCrossSectionView::MakeTable(CLinesTable* model, const char* name)
             [this, table](const QPoint& at) { ShowContextMenu(table, at); });
     // The message waits until the cell's editor has closed: it takes the focus.
     connect(
-        model, &CLinesTable::Refused, this,
+        model, &CSectionLines::Refused, this,
         [this](const QString& message) { KsMessageBox(message, QMessageBox::Ok, this); }, Qt::QueuedConnection);
     return table;
 }

@@ -41,7 +41,7 @@ protected:
 
 private:
     void MakeTables(QSplitter* splitter);
-    QTableView* MakeTable(CLinesTable* model, const char* name);
+    QTableView* MakeTable(CSectionLines* model, const char* name);
     void ConnectTables();
     void CommandsChanged();
     void Retranslate();

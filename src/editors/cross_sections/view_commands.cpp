@@ -116,12 +116,12 @@ std::vector<int> CCrossSectionView::SelectedRows() const
 
 void CCrossSectionView::DeleteLines()
 {
-    static_cast<CLinesTable*>(m_lines->model())->RemoveLines(SelectedRows());
+    static_cast<CSectionLines*>(m_lines->model())->RemoveLines(SelectedRows());
 }
 
 void CCrossSectionView::CopyLines()
 {
-    if (const QString text = static_cast<CLinesTable*>(m_lines->model())->TextOf(SelectedRows()); !text.isEmpty())
+    if (const QString text = static_cast<CSectionLines*>(m_lines->model())->TextOf(SelectedRows()); !text.isEmpty())
         QGuiApplication::clipboard()->setText(text);
 }
 

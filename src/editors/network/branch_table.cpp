@@ -1,4 +1,4 @@
-// What both tables do alike, and the table of the branches.
+// The table of the branches.
 #include "editors/network/table_models.h"
 
 #include "editors/common/quantity.h"
@@ -29,31 +29,6 @@ bool IsNumberColumn(int column)
 }
 
 } // namespace
-
-int CNetworkTable::rowCount(const QModelIndex& parent) const
-{
-    return parent.isValid() ? 0 : m_rows;
-}
-
-void CNetworkTable::Reload()
-{
-    if (Lines() != m_rows) {
-        beginResetModel();
-        m_rows = Lines();
-        endResetModel();
-    } else if (m_rows > 0) {
-        emit dataChanged(index(0, 0), index(m_rows - 1, columnCount() - 1));
-    }
-    emit headerDataChanged(Qt::Horizontal, 0, columnCount() - 1);
-}
-
-bool CNetworkTable::Refuse(const QModelIndex& index, const QString& message)
-{
-    emit Refused(tr("Line %1, %2: %3")
-                     .arg(index.row() + 1)
-                     .arg(headerData(index.column(), Qt::Horizontal, Qt::DisplayRole).toString(), message));
-    return false;
-}
 
 CBranchTable::CBranchTable(CNetworkDoc& document, QObject* parent) : CNetworkTable(document, parent)
 {

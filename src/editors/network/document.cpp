@@ -2,9 +2,7 @@
 
 #include "editors/network/commands.h"
 #include "editors/network/network_file.h"
-#include "ks/fc/message_box.h"
 
-#include <QDir>
 #include <QUndoStack>
 #include <cmath>
 
@@ -12,10 +10,7 @@ namespace {
 constexpr int NetworkPackageKind = 1; // what this editor's packages call themselves
 } // namespace
 
-CNetworkDoc::CNetworkDoc() : CProjectDoc(NetworkPackageKind)
-{
-    connect(&UndoStack(), &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
-}
+CNetworkDoc::CNetworkDoc() : CProjectDoc(NetworkPackageKind) {}
 
 const CLinearReference& CNetworkDoc::Reference() const
 {
@@ -24,30 +19,15 @@ const CLinearReference& CNetworkDoc::Reference() const
     return *m_reference;
 }
 
-BOOL CNetworkDoc::OnOpenDocument(const CString& path)
+QString CNetworkDoc::ReadFile(const CString& path)
 {
-    if (!CKsDoc::OnOpenDocument(path))
-        return false;
-    const QString error = ReadNetwork(path, m_network);
-    if (!error.isEmpty()) {
-        KsMessageBox(error);
-        return false;
-    }
     m_reference.reset();
-    return true;
+    return ReadNetwork(path, m_network);
 }
 
-BOOL CNetworkDoc::OnSaveDocument(const CString& path)
+QString CNetworkDoc::WriteFile(const CString& path) const
 {
-    UpdateAllViews(nullptr, StoreHint);
-    const QString reason = WriteNetwork(path, m_network);
-    if (!reason.isEmpty()) {
-        KsMessageBox(tr("%1 could not be saved.\n%2").arg(QDir::toNativeSeparators(path), reason));
-        return false;
-    }
-    UndoStack().setClean();
-    SetModifiedFlag(false);
-    return true;
+    return WriteNetwork(path, m_network);
 }
 
 void CNetworkDoc::DeleteContents()

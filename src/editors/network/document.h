@@ -17,9 +17,6 @@ public:
     /// The lines, prepared when first asked for after a change.
     const CLinearReference& Reference() const;
 
-    /// A file that cannot be read is not opened, after a message that names the line.
-    BOOL OnOpenDocument(const CString& path) override;
-    BOOL OnSaveDocument(const CString& path) override;
     void DeleteContents() override;
 
     // Changes; each can be undone, marks the document modified and is told to the project.
@@ -34,6 +31,10 @@ public:
 signals:
     /// The network is another one, or a branch changed.
     void NetworkChanged();
+
+protected:
+    QString ReadFile(const CString& path) override;
+    QString WriteFile(const CString& path) const override;
 
 private:
     friend class CNetworkCommand;

@@ -1,36 +1,20 @@
 // The tables beside the map: the branches, and the channel of one of them.
 #pragma once
 
+#include "editors/common/lines_table.h"
 #include "editors/network/document.h"
 
-#include <QAbstractTableModel>
-
-/// What both tables do alike. Rows follow the document; a change that cannot be made is refused with a message.
-class CNetworkTable : public QAbstractTableModel
+/// What both tables do alike.
+class CNetworkTable : public CLinesTable
 {
     Q_OBJECT
-public:
-    int rowCount(const QModelIndex& parent = {}) const override;
-    /// Shows the document's present state.
-    void Reload();
-    virtual void RemoveLines(const std::vector<int>& rows) = 0;
-
 signals:
-    /// For the user: where, what was expected and what was typed.
-    void Refused(const QString& message);
     /// The line that was edited stands in another row now.
     void LineMoved(int row, int column);
 
 protected:
-    explicit CNetworkTable(CNetworkDoc& document, QObject* parent) : QAbstractTableModel(parent), m_document(document)
-    {
-    }
-    virtual int Lines() const = 0;
-    bool Refuse(const QModelIndex& index, const QString& message);
+    CNetworkTable(CNetworkDoc& document, QObject* parent) : CLinesTable(parent), m_document(document) {}
     CNetworkDoc& m_document;
-
-private:
-    int m_rows = 0;
 };
 
 class CBranchTable : public CNetworkTable

@@ -2,15 +2,6 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="en_GB" sourcelanguage="en_US">
     <context>
-        <name>CCrossSectionDoc</name>
-        <message>
-            <source>%1 could not be saved.
-%2</source>
-            <translation>%1 could not be saved.
-%2</translation>
-        </message>
-    </context>
-    <context>
         <name>CCrossSectionView</name>
         <message>
             <source>&amp;Points</source>
@@ -74,10 +65,6 @@
         <message>
             <source>Line %1, %2: %3</source>
             <translation>Line %1, %2: %3</translation>
-        </message>
-        <message>
-            <source>expected a number, found "%1".</source>
-            <translation>expected a number, found "%1".</translation>
         </message>
     </context>
     <context>
@@ -290,6 +277,22 @@ Delete Lines</translation>
         <message>
             <source>there is a cross section of branch "%1" at chainage %2 m with the topo ID "%3" already.</source>
             <translation>there is a cross section of branch "%1" at chainage %2 m with the topo ID "%3" already.</translation>
+        </message>
+    </context>
+    <context>
+        <name>CSectionLines</name>
+        <message>
+            <source>expected a number, found "%1".</source>
+            <translation>expected a number, found "%1".</translation>
+        </message>
+    </context>
+    <context>
+        <name>CProjectDoc</name>
+        <message>
+            <source>%1 could not be saved.
+%2</source>
+            <translation>%1 could not be saved.
+%2</translation>
         </message>
     </context>
 </TS>

@@ -145,12 +145,6 @@
     <context>
         <name>CNetworkDoc</name>
         <message>
-            <source>%1 could not be saved.
-%2</source>
-            <translation>%1 could not be saved.
-%2</translation>
-        </message>
-        <message>
             <source>A branch needs a name.</source>
             <translation>A branch needs a name.</translation>
         </message>
@@ -175,7 +169,7 @@
         </message>
     </context>
     <context>
-        <name>CNetworkTable</name>
+        <name>CLinesTable</name>
         <message>
             <source>Line %1, %2: %3</source>
             <translation>Line %1, %2: %3</translation>
@@ -439,6 +433,15 @@ Import Branches</translation>
         <message>
             <source>%1, line %2: %3</source>
             <translation>%1, line %2: %3</translation>
+        </message>
+    </context>
+    <context>
+        <name>CProjectDoc</name>
+        <message>
+            <source>%1 could not be saved.
+%2</source>
+            <translation>%1 could not be saved.
+%2</translation>
         </message>
     </context>
 </TS>

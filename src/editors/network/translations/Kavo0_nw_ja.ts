@@ -145,12 +145,6 @@
     <context>
         <name>CNetworkDoc</name>
         <message>
-            <source>%1 could not be saved.
-%2</source>
-            <translation>%1を保存できませんでした。
-%2</translation>
-        </message>
-        <message>
             <source>A branch needs a name.</source>
             <translation>河川名を入力してください。</translation>
         </message>
@@ -175,7 +169,7 @@
         </message>
     </context>
     <context>
-        <name>CNetworkTable</name>
+        <name>CLinesTable</name>
         <message>
             <source>Line %1, %2: %3</source>
             <translation>%1行目、%2: %3</translation>
@@ -439,6 +433,15 @@ Import Branches</source>
         <message>
             <source>%1, line %2: %3</source>
             <translation>%1、%2行目: %3</translation>
+        </message>
+    </context>
+    <context>
+        <name>CProjectDoc</name>
+        <message>
+            <source>%1 could not be saved.
+%2</source>
+            <translation>%1を保存できませんでした。
+%2</translation>
         </message>
     </context>
 </TS>
