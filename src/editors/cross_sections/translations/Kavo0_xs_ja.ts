@@ -295,4 +295,11 @@ Delete Lines</source>
 %2</translation>
         </message>
     </context>
+    <context>
+        <name>ParameterFile</name>
+        <message>
+            <source>%1, line %2: %3</source>
+            <translation>%1、%2行目: %3</translation>
+        </message>
+    </context>
 </TS>
