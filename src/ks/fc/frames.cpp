@@ -178,7 +178,11 @@ void CKsMDIFrameWnd::ShowWindow(CKsMDIChildWnd* window)
 
 bool CKsMDIFrameWnd::CloseAllWindows()
 {
-    const auto windows = m_area->subWindowList();
+    return CloseWindows(m_area->subWindowList());
+}
+
+bool CKsMDIFrameWnd::CloseWindows(const QList<QMdiSubWindow*>& windows)
+{
     std::set<CKsDoc*> asked;
     for (QMdiSubWindow* window : windows) {
         const auto* child = qobject_cast<CKsMDIChildWnd*>(window);

@@ -115,6 +115,9 @@ signals:
 protected:
     /// Another view, or none, became active. Called before the views hear of it.
     virtual void ActiveViewChanged(CView* view);
+    /// Asks for every modified document of these windows first, then closes them; false, and nothing closed, when one
+    /// was kept.
+    bool CloseWindows(const QList<QMdiSubWindow*>& windows);
     void DestroyWindows();
 
 private:
