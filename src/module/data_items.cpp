@@ -9,9 +9,15 @@
 namespace {
 
 /// The line that an empty table shows is no line of the document.
-bool IsShownOnly(const CKavo0_hdDoc& document, const HD_RiverPos& record)
+bool IsShownOnly(const HDContent& content, const HD_RiverPos& record)
 {
-    return record.IsBlank() && document.IsPlaceholder(record);
+    return content.document && record.IsBlank() && content.document->IsPlaceholder(record);
+}
+
+/// Likewise the row of an empty table without locations.
+bool IsShownOnly(const HDContent& content, const void* rows)
+{
+    return content.document && content.document->IsPlaceholderRow(rows);
 }
 
 CString TextOf(std::string_view name)
@@ -39,13 +45,13 @@ private:
     CString m_text = QStringLiteral("");
 };
 
-void AppendTable(const HDDataTable& table, int type, CKavo0_hdDoc& document, CObList& items)
+void AppendTable(const HDDataTable& table, int type, const HDContent& content, CObList& items)
 {
-    const CGenList& list = table.list(document.Parameters());
+    const CGenList& list = table.list(content.parameters);
     BranchTexts branches;
     for (std::size_t i = 0; i < list.GetCount(); ++i) {
         const HD_RiverPos& record = list.GetAt(i);
-        if (IsShownOnly(document, record))
+        if (IsShownOnly(content, record))
             continue;
         auto item = std::make_unique<CKvr_CBE_ModelDataItem>();
         item->branch = branches.Of(record.RiverName);
@@ -59,24 +65,23 @@ void AppendTable(const HDDataTable& table, int type, CKavo0_hdDoc& document, COb
 
 } // namespace
 
-std::unique_ptr<CObList> DataItems(CKavo0_hdDoc& document)
+std::unique_ptr<CObList> DataItems(const HDContent& content)
 {
     auto items = std::make_unique<CObList>();
     std::size_t count = 0;
     for (const HDDataTable& table : HDDataTables())
-        count += table.list(document.Parameters()).GetCount();
+        count += table.list(content.parameters).GetCount();
     items->reserve(count);
     int type = 0;
     for (const HDDataTable& table : HDDataTables())
-        AppendTable(table, type++, document, *items);
+        AppendTable(table, type++, content, *items);
     return items;
 }
 
-std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
+std::unique_ptr<CObList> MarkItems(const HDContent& content)
 {
-    const HD_Global_Var& globals = document.Parameters().Global;
-    const bool isShownOnly = document.IsPlaceholderRow(&globals.MarkTitles);
-    const std::size_t titles = isShownOnly ? 0 : globals.MarkTitles.size();
+    const HD_Global_Var& globals = content.parameters.Global;
+    const std::size_t titles = IsShownOnly(content, &globals.MarkTitles) ? 0 : globals.MarkTitles.size();
     auto items = std::make_unique<CObList>();
 
     auto head = std::make_unique<CKvrCBEUserDefMark>();
@@ -86,10 +91,10 @@ std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
     head->flags.resize(titles, 0);
     items->push_back(std::move(head));
 
-    const auto& list = document.Parameters().WaterLevelMarkList;
+    const auto& list = content.parameters.WaterLevelMarkList;
     for (std::size_t i = 0; i < list.GetCount(); ++i) {
         const HDWLMark& mark = list.GetAt(i);
-        if (IsShownOnly(document, mark))
+        if (IsShownOnly(content, mark))
             continue;
         auto item = std::make_unique<CKvrCBEUserDefMark>();
         item->branch = CString::fromStdString(mark.RiverName);
@@ -101,11 +106,11 @@ std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
     return items;
 }
 
-std::unique_ptr<CObList> MapItems(CKavo0_hdDoc& document)
+std::unique_ptr<CObList> MapItems(const HDContent& content)
 {
     auto items = std::make_unique<CObList>();
-    const auto& maps = document.Parameters().Global.MapOutput.MapOutputFiles;
-    if (document.IsPlaceholderRow(&maps)) // the row of an empty table
+    const auto& maps = content.parameters.Global.MapOutput.MapOutputFiles;
+    if (IsShownOnly(content, &maps))
         return items;
     for (const CMapsOutput& map : maps) {
         auto item = std::make_unique<CKvr_CBE_HDMaps>();

@@ -12,18 +12,13 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QPointer>
+#include <QTimer>
 #include <QUndoStack>
+#include <utility>
 
 namespace {
 
 constexpr int HDPackageKind = 8; // what this editor's packages call themselves
-
-bool HasHDExtension(const CString& path)
-{
-    // Mixed spellings are refused: the shell's file tables know these two.
-    const CString extension = QFileInfo(path).suffix();
-    return extension == QLatin1String("HDKV") || extension == QLatin1String("hdkv");
-}
 
 /// Takes the focus from the field or cell being edited, so that it commits its text, and gives it back afterwards.
 class FocusPause
@@ -46,7 +41,17 @@ private:
 
 } // namespace
 
-CKavo0_hdDoc::CKavo0_hdDoc() = default;
+CKavo0_hdDoc::CKavo0_hdDoc()
+{
+    connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKavo0_hdDoc::StepMade);
+}
+
+bool CKavo0_hdDoc::HasExtension(const CString& path)
+{
+    // Mixed spellings are refused: the shell's file tables know these two.
+    const CString extension = QFileInfo(path).suffix();
+    return extension == QLatin1String("HDKV") || extension == QLatin1String("hdkv");
+}
 
 BOOL CKavo0_hdDoc::OnNewDocument()
 {
@@ -58,7 +63,7 @@ BOOL CKavo0_hdDoc::OnOpenDocument(const CString& path)
     if (!CKsDoc::OnOpenDocument(path))
         return false;
     m_strFilePath = path;
-    if (!HasHDExtension(path)) {
+    if (!HasExtension(path)) {
         KsMessageBox(LoadString(Str::UnsupportedFormat));
         return false;
     }
@@ -227,6 +232,22 @@ void CKavo0_hdDoc::LeaveProject(CView* view, const CString& name)
 {
     if (m_hProject)
         SendToShell(KsMessage::SwitchBoard(), KsRequest::LeaveProject, view, name);
+}
+
+/// A step comes in the middle of things: the page that made it goes on storing, and whoever hears of it may ask at
+/// once.
+void CKavo0_hdDoc::StepMade()
+{
+    if (!m_hProject || UndoStack().count() == 0) // a cleared stack is no step
+        return;
+    if (m_untold++ == 0)
+        QTimer::singleShot(0, this, &CKavo0_hdDoc::TellChanges);
+}
+
+void CKavo0_hdDoc::TellChanges()
+{
+    for (int steps = std::exchange(m_untold, 0); steps > 0; --steps)
+        DataChange(GetPathName());
 }
 
 void CKavo0_hdDoc::DataChange(const CString& name)

@@ -24,7 +24,9 @@ public:
     const HD_Parameters& Parameters() const { return m_parameters; }
 
     BOOL OnNewDocument() override;
-    /// Accepts ".HDKV" and ".hdkv". A file that cannot be parsed opens with what the records hold, after a message.
+    /// Whether a path has an extension of these files: ".HDKV" or ".hdkv".
+    static bool HasExtension(const CString& path);
+    /// Accepts these extensions. A file that cannot be parsed opens with what the records hold, after a message.
     BOOL OnOpenDocument(const CString& path) override;
     /// Saves to the path with the extension ".HDKV"; see docs/architecture.md, "Saving".
     BOOL OnSaveDocument(const CString& path) override;
@@ -34,8 +36,11 @@ public:
     /// Joins the shell's project; true when the document belongs to one.
     BOOL GetProjectInfo(CView* view, const CString& name);
     void LeaveProject(CView* view, const CString& name);
-    /// Tells the other editors of the project that data changed.
+    /// Tells the other editors of the project that data changed. Every step on the undo stack, forth or back, is told
+    /// by itself, once, when the event that it belongs to is over.
     void DataChange(const CString& name);
+    /// Tells at once what waits to be told.
+    void TellChanges();
     /// Marks the document modified, updates all views but the sender, and gives the sender the focus back.
     void UpdateAll(CView* sender, int hint, CHint* object);
 
@@ -80,6 +85,7 @@ signals:
     void Reveal(CGenList* list, int row, int column);
 
 private:
+    void StepMade();
     void ReadData(const CString& path);
     /// Writes the whole content; on failure the user has been told and the file is what it was.
     bool WriteData(const CString& path);
@@ -92,6 +98,7 @@ private:
     HD_Parameters m_parameters;
     CString m_strFilePath; // of the file last opened
     std::intptr_t m_hProject = 0;
+    int m_untold = 0;          // steps that the project has not heard of
     bool m_unreadable = false; // the file at m_strFilePath could not be parsed
     std::unordered_set<const HD_RiverPos*> m_placeholders;
     std::unordered_set<const void*> m_placeholderRows;

@@ -149,13 +149,10 @@ LRESULT CKavo0_hdView::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam
 
 // ---- what a page tells -------------------------------------------------------------------------
 
-void CKavo0_hdView::EditedLineChanged(int column)
+void CKavo0_hdView::EditedLineChanged(int /*column*/)
 {
     if (auto* page = ActivePage())
         page->StoreToDocument();
-    const bool location = column == 1 || column == 2;
-    if (location)
-        GetDocument()->DataChange(GetDocument()->GetPathName());
     GetDocument()->UpdateAllViews(nullptr, Hint::Reload);
 }
 
@@ -163,7 +160,7 @@ void CKavo0_hdView::CurrentLocationChanged()
 {
     ShowLine();
     if (MainFrame())
-        TellLater(m_tellLocation);
+        TellLocationLater();
 }
 
 /// The line of the page in front, in the status bar; nothing for a page without a list.
@@ -192,7 +189,6 @@ void CKavo0_hdView::RevealChange(CGenList* list, int row, int /*column*/)
             continue;
         if (m_sheet->SetActivePage(tab) && row > 0)
             page->GotoLine(row);
-        TellLater(m_tellChange);
         return;
     }
 }
@@ -246,7 +242,7 @@ bool CKavo0_hdView::OnCommand(int id)
         page->AppendLine();
         return true;
     case Command::DeleteLine:
-        DeleteLines();
+        page->DeleteLines();
         return true;
     case Command::FetchLocation:
         FetchLocation();
@@ -263,15 +259,6 @@ bool CKavo0_hdView::OnCommand(int id)
     default:
         return false;
     }
-}
-
-void CKavo0_hdView::DeleteLines()
-{
-    const QUndoStack& steps = GetDocument()->UndoStack();
-    const int before = steps.index();
-    ActivePage()->DeleteLines();
-    if (steps.index() != before)
-        TellLater(m_tellChange);
 }
 
 void CKavo0_hdView::GotoLine()

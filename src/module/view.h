@@ -58,9 +58,8 @@ private:
     LRESULT AnswerEditor(WPARAM request, CKSComm_Package* package);
     void FetchLocation();
     void ShowLine();
-    void DeleteLines();
-    void TellLater(bool& news);
-    void Tell();
+    void TellLocationLater();
+    void TellLocation();
 
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
@@ -75,7 +74,7 @@ private:
     CDlgPropertySheet* m_sheet = nullptr;                      // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_inProject = false;
-    bool m_tellLocation = false, m_tellChange = false; // once the present event is over
+    bool m_tellLocation = false; // once the present event is over
     SearchState m_search;
     bool m_linesEnabled = true;
 };
