@@ -1,5 +1,7 @@
 #include "editors/network/import_branches.h"
 
+#include "ks/fc/branch_name.h"
+
 #include <QCoreApplication>
 #include <QFileInfo>
 #include <QLibrary>
@@ -53,7 +55,7 @@ std::optional<double> Number(const CGisLine& line, int field)
 QString FreeName(const QString& wanted, const QSet<QString>& taken)
 {
     QString name = wanted;
-    for (int number = 2; taken.contains(name.toCaseFolded()); ++number)
+    for (int number = 2; taken.contains(KsBranchKey(name)); ++number)
         name = QStringLiteral("%1 (%2)").arg(wanted).arg(number);
     return name;
 }
@@ -96,7 +98,7 @@ std::vector<CNetworkBranch> MakeBranches(const CGisLayer& layer, const CImportFi
 {
     QSet<QString> taken;
     for (const CNetworkBranch& branch : network.branches)
-        taken << branch.name.toCaseFolded();
+        taken << KsBranchKey(branch.name);
     std::vector<CNetworkBranch> branches;
     for (const CGisLine& line : layer.lines) {
         CNetworkBranch branch;
@@ -105,7 +107,7 @@ std::vector<CNetworkBranch> MakeBranches(const CGisLayer& layer, const CImportFi
         branch.name = FreeName(given.isEmpty() ? ImportBranches::tr("Branch") : given, taken);
         if (!given.isEmpty() && branch.name != given)
             notes << ImportBranches::tr("\"%1\" is taken and becomes \"%2\".").arg(given, branch.name);
-        taken << branch.name.toCaseFolded();
+        taken << KsBranchKey(branch.name);
         const auto start = Number(line, fields.start), end = Number(line, fields.end);
         const bool both = start && end && *start != *end;
         if (!both && fields.start >= 0)

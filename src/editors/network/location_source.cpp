@@ -1,6 +1,7 @@
 #include "editors/network/location_source.h"
 
 #include "ks/fc/exports.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/hd_messages.h"
 
 namespace {
@@ -32,7 +33,7 @@ std::vector<CView*> CLocationSource::HDViews() const
 CView* CLocationSource::FindView(const QString& file) const
 {
     for (CView* view : HDViews()) {
-        if (view->GetDocument()->GetPathName() == file)
+        if (KsSameFile(view->GetDocument()->GetPathName(), file)) // it may have been saved in another case
             return view;
     }
     qDebug("network: no open document %s", qPrintable(file));

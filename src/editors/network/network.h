@@ -39,7 +39,7 @@ struct CNetwork
     std::vector<CKeptSection> keptTargets;
     CKeptSection kept; // of the network's own target
 
-    /// -1 for none. Case does not matter: the HD parameters keep the names in capitals.
+    /// -1 for none.
     int FindBranch(const QString& name) const;
     /// Around all vertices; null without any.
     QRectF Extent() const;

@@ -78,5 +78,5 @@ private:
     QLabel *m_branchTitle = nullptr, *m_channelTitle = nullptr;
     std::unique_ptr<CLocationSource> m_source;
     QTimer m_refresh; // one fetch for changes that follow one another
-    bool m_stale = true, m_fetching = false;
+    bool m_stale = true;
 };
