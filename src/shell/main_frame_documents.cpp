@@ -61,24 +61,22 @@ void CMainFrame::AddTemplate(CMultiDocTemplate* documents)
                 m_recent.Add(newPath);
         });
     });
+    connect(documents, &CMultiDocTemplate::DocumentShown, this, &CMainFrame::DocumentShown);
 }
 
-CKsDoc* CMainFrame::OpenDocument(CMultiDocTemplate& documents, const QString& path)
+/// Whoever opened it: the user, a project, or an editor for another one.
+void CMainFrame::DocumentShown(const CKsDoc* document)
 {
-    CKsDoc* document = documents.OpenDocumentFile(this, path);
-    if (!document)
-        return nullptr;
     if (!document->GetPathName().isEmpty())
         m_recent.Add(document->GetPathName());
     SetWindowIcons();
     UpdateTitle(); // by now it may have joined a project
     UpdateActions();
-    return document;
 }
 
 CKsDoc* CMainFrame::NewDocument(CMultiDocTemplate& documents)
 {
-    return OpenDocument(documents, {});
+    return documents.OpenDocumentFile(this, {});
 }
 
 bool CMainFrame::OpenFile(const QString& path, bool othersLater)
@@ -86,7 +84,7 @@ bool CMainFrame::OpenFile(const QString& path, bool othersLater)
     if (IsProject(path))
         return OpenProject(path, othersLater);
     if (CMultiDocTemplate* documents = TemplateFor(path))
-        return OpenDocument(*documents, path) != nullptr;
+        return documents->OpenDocumentFile(this, path) != nullptr;
     QStringList known{QString::fromLatin1(ProjectExtension)};
     for (const CMultiDocTemplate* documents : Templates())
         known << documents->GetDocString(CMultiDocTemplate::filterExt);

@@ -98,12 +98,18 @@ std::span<const CFrameAction> CFrameAction::Table()
     return table;
 }
 
-/// The desktop's keys for a standard command, Tab spelled as on the keyboard.
+/// The desktop's keys for a standard command, Tab spelled as on the keyboard. Redo has both of its usual keys,
+/// whichever of them the desktop knows: the grids and the documentation name Ctrl+Y.
 static QList<QKeySequence> KeysFor(QKeySequence::StandardKey key)
 {
     auto keys = QKeySequence::keyBindings(key);
     if (key == QKeySequence::PreviousChild)
         keys.prepend(QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_Tab));
+    if (key == QKeySequence::Redo) {
+        const QList<QKeySequence> both{Qt::CTRL | Qt::Key_Y, Qt::CTRL | Qt::SHIFT | Qt::Key_Z};
+        keys.removeIf([&both](const QKeySequence& each) { return both.contains(each); });
+        keys = both + keys;
+    }
     return keys;
 }
 
