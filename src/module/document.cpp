@@ -20,25 +20,6 @@ namespace {
 
 constexpr int HDPackageKind = 8; // what this editor's packages call themselves
 
-/// Takes the focus from the field or cell being edited, so that it commits its text, and gives it back afterwards.
-class FocusPause
-{
-public:
-    FocusPause() : m_widget(QApplication::focusWidget())
-    {
-        if (m_widget)
-            m_widget->clearFocus();
-    }
-    ~FocusPause()
-    {
-        if (m_widget && !QApplication::focusWidget())
-            m_widget->setFocus(Qt::OtherFocusReason);
-    }
-
-private:
-    QPointer<QWidget> m_widget;
-};
-
 } // namespace
 
 CKavo0_hdDoc::CKavo0_hdDoc()
@@ -94,7 +75,8 @@ CString CKavo0_hdDoc::SavePathFor(const CString& path) const
 
 BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
 {
-    const FocusPause pause;
+    if (!MayLeave())
+        return false;
     const CString target = SavePathFor(path);
     UpdateAllViews(nullptr, Hint::Store);
     if (!MayReplace(target, path))

@@ -52,14 +52,6 @@ CKsMDIFrameWnd* CKavo0_hdView::MainFrame() const
     return qobject_cast<CKsMDIFrameWnd*>(window());
 }
 
-void CKavo0_hdView::CloseWindow()
-{
-    QTimer::singleShot(0, this, [this] {
-        if (auto* frame = qobject_cast<QMdiSubWindow*>(parentWidget()))
-            frame->close();
-    });
-}
-
 void CKavo0_hdView::OnInitialUpdate()
 {
     CView::OnInitialUpdate();
@@ -71,7 +63,7 @@ void CKavo0_hdView::OnInitialUpdate()
 
     AddTabs();
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
-    connect(m_sheet, &QTabWidget::currentChanged, this, &CKavo0_hdView::ShowLine);
+    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowLine);
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())
         page->OnSetActive();
@@ -121,6 +113,12 @@ void CKavo0_hdView::OnUpdate(CView*, int hint, CHint*)
         page->StoreToDocument();
     else if (hint == Hint::Reload)
         page->LoadFromDocument(GetDocument());
+}
+
+bool CKavo0_hdView::MayLeave(KsLeave what)
+{
+    auto* page = ActivePage();
+    return !page || (what == KsLeave::Field ? page->LeaveField() : page->OnKillActive());
 }
 
 void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deactivated)
@@ -215,11 +213,12 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
 bool CKavo0_hdView::IsCommandEnabled(int id) const
 {
     const auto* page = ActivePage();
-    const bool lines = m_linesEnabled && page && page->GetGrid();
+    const auto isUsable = [](const CGenGrid* grid) { return grid && grid->isEnabled(); };
+    const bool lines = m_linesEnabled && page && isUsable(page->GetGrid());
     switch (id) {
     case Command::InsertLine:
     case Command::DeleteLine:
-        return m_linesEnabled && page && page->LinesGrid();
+        return m_linesEnabled && page && isUsable(page->LinesGrid());
     case Command::GotoLine:
     case Command::Search:
         return lines;
@@ -235,7 +234,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
 bool CKavo0_hdView::OnCommand(int id)
 {
     auto* page = ActivePage();
-    if (!page || !IsCommandEnabled(id))
+    if (!page || !IsCommandEnabled(id) || !MayLeave(KsLeave::Field))
         return false;
     switch (id) {
     case Command::InsertLine:
@@ -275,6 +274,7 @@ void CKavo0_hdView::Search()
         return;
     m_search = {dialog.RiverName(), dialog.Chainage(), dialog.ChainageCriterion(), dialog.NameCriterion()};
     m_search.asked = true;
+    m_search.page = ActivePage();
     SearchAgain();
 }
 
@@ -283,6 +283,10 @@ void CKavo0_hdView::SearchAgain()
     auto* grid = ActivePage() ? ActivePage()->GetGrid() : nullptr;
     if (!grid)
         return;
+    if (std::exchange(m_search.page, ActivePage()) != ActivePage()) {
+        m_search.row = 0;
+        m_search.found = false;
+    }
     if (grid->SearchRows(m_search.row, m_search.name, m_search.chainage, m_search.chainageCriterion,
                          m_search.nameCriterion)) {
         m_search.found = true;

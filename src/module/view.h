@@ -22,13 +22,12 @@ public:
     /// The sheet; null before the first update.
     CDlgPropertySheet* Sheet() const { return m_sheet; }
     CGenPropertyPage* ActivePage() const;
-    /// Closes the document window, after this event.
-    void CloseWindow();
 
     // CView
     void OnInitialUpdate() override;
     void OnUpdate(CView* sender, int hint, CHint* object) override;
     void OnActivateView(bool activate, CView* activated, CView* deactivated) override;
+    bool MayLeave(KsLeave what) override;
     LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam) override;
 
     // CCommandTarget
@@ -51,7 +50,8 @@ private:
         QString name;
         double chainage = 0; // metres
         int chainageCriterion = 3, nameCriterion = 0;
-        int row = 0; // the next search starts here; 0 is the first row
+        int row = 0;                            // the next search starts here; 0 is the first row
+        const CGenPropertyPage* page = nullptr; // on which `row` is
         bool asked = false, found = false;
     };
 

@@ -9,6 +9,7 @@
 #include "shell/recent_files.h"
 
 #include <QUndoGroup>
+#include <functional>
 #include <map>
 #include <memory>
 #include <vector>
@@ -65,7 +66,6 @@ private:
     void OnFileSaveAs();
     void OnFileClose();
     void OnFileExit();
-    void StoreTyping();
     void OnUndo();
     void OnRedo();
     void OnCut();
@@ -87,6 +87,7 @@ private:
 
     // Menus and texts.
     void CreateActions();
+    void Connect(QAction* action, std::function<void()> run, bool whileTyping = false);
     void CreateMenus();
     void CreateLanguageMenu(QMenu* menu);
     void Retranslate();

@@ -194,6 +194,8 @@ void CMainFrame::dropEvent(QDropEvent* event)
 {
     const auto urls = event->mimeData()->urls();
     event->acceptProposedAction();
+    if (!MayLeave())
+        return;
     for (const QUrl& url : urls) {
         if (url.isLocalFile())
             OpenFile(url.toLocalFile());

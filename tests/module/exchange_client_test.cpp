@@ -161,7 +161,7 @@ TEST_F(ExchangeClientTest, DeletedLinesAndUndoAreToldWhenTheyAreDone)
     view->OnCommand(Command::DeleteLine); // no whole line is selected
     QTest::qWait(1);
     EXPECT_EQ(Told(KsRequest::DataChanged), 0);
-    view->ActivePage()->GetGrid()->selectRow(0);
+    view->ActivePage()->GetGrid()->SelectLines(1, 1);
     view->OnCommand(Command::DeleteLine);
     EXPECT_EQ(Told(KsRequest::DataChanged), 0) << "not in the middle of it";
     QTest::qWait(1);

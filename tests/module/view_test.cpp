@@ -138,7 +138,7 @@ TEST_F(ViewTest, AChangeIsToldToTheProjectAndLeavingIsToo)
     view->GetDocument()->SetModifiedFlag(false);
     QTest::qWait(1); // news of the current line
     messages.clear();
-    view->CloseWindow();
+    CKsMDIChildWnd::Of(view)->close();
     QTest::qWait(50);
     ASSERT_EQ(messages.size(), 2u);
     EXPECT_EQ(messages[0].request, KsRequest::LeaveProject);
@@ -161,15 +161,6 @@ TEST_F(ViewTest, ToolBarFollowsActivation)
     EXPECT_TRUE(ToolbarMessages().empty());
     view->OnActivateView(false, &other, view);
     EXPECT_EQ(ToolbarMessages(), std::vector{KsMessage::HideToolbar()});
-}
-
-TEST_F(ViewTest, CtrlF4ClosesTheWindowFromInsideTheGrid)
-{
-    auto* view = Open();
-    ASSERT_NE(view, nullptr);
-    QTest::keyClick(view->ActivePage()->GetGrid(), Qt::Key_F4, Qt::ControlModifier);
-    QTest::qWait(50);
-    EXPECT_TRUE(documents->Documents().empty());
 }
 
 TEST_F(ViewTest, SearchGoesOnFromTheLastFindAndSaysWhenThereIsNoMore)

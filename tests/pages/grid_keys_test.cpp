@@ -130,6 +130,16 @@ TEST_F(GridKeyTest, DeletesWholeLinesOfOneRange)
                       {5, grid->verticalHeader()->sectionViewportPosition(1) + 5});
     Press(Qt::Key_Delete);
     EXPECT_EQ(Stored(), "A 1 10 20, C 3 0 0");
+    // All cells of a line, one by one, are not the line.
+    grid->SetCurrentCell(1, 1);
+    for (int column = 2; column <= grid->ColumnCount(); ++column)
+        QTest::keyClick(grid, Qt::Key_Right, Qt::ShiftModifier);
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(init.GetCount(), 2u);
+    Press(Qt::Key_Space, Qt::ShiftModifier);
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(Stored(), "C 3 0 0");
+    document.UndoStack().undo();
     globals.G_discharge = 4;
     SelectRows(1, 2);
     Press(Qt::Key_Delete);

@@ -105,8 +105,10 @@ TEST_F(InitPageTest, GlobalFieldsAreStoredWhenLeft)
     EXPECT_EQ(discharge->text(), "0");
     discharge->selectAll();
     QTest::keyClicks(discharge, "x");
-    EXPECT_TRUE(view->page->OnKillActive()) << "leaving is never refused";
+    EXPECT_FALSE(view->page->OnKillActive()) << "nothing typed is lost";
     EXPECT_EQ(boxes, QStringList{"Invalid floating point number!"});
+    EXPECT_TRUE(discharge->hasFocus());
+    EXPECT_EQ(discharge->text(), "x");
 }
 
 TEST_F(InitPageTest, LocationsOfOtherEditors)

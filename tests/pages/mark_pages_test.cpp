@@ -56,7 +56,7 @@ TEST_F(MarkPagesTest, TitlesAndLevelsStayInStep)
 {
     g.MarkTitles = {"LOW", "HIGH"};
     g.MarkInterpolate = {true}; // one short
-    AddMark("A", 1, {3}); // a shorter list
+    AddMark("A", 1, {3});       // a shorter list
     AddMark("B", 2, {1, 2});
     CGenGrid& titles = OpenMarks();
     const QStringList before = Text();
@@ -66,7 +66,7 @@ TEST_F(MarkPagesTest, TitlesAndLevelsStayInStep)
 
     // Insert above the second title.
     titles.setFocus();
-    titles.selectRow(1);
+    titles.SelectLines(2, 2);
     QTest::keyClick(&titles, Qt::Key_Insert);
     EXPECT_EQ(Headers(), QStringList({"LOW", "", "HIGH"}));
     EXPECT_EQ(Levels(), "3 | 1 - 2") << "a list that ends before the column is left as it is";
@@ -92,11 +92,11 @@ TEST_F(MarkPagesTest, TitlesAndLevelsStayInStep)
 
     // Delete the first title, and bring it back.
     titles.setFocus();
-    titles.selectRow(0);
+    titles.SelectLines(1, 1);
     QTest::keyClick(&titles, Qt::Key_Delete);
     EXPECT_EQ(Headers(), QStringList("HIGH"));
     EXPECT_EQ(Levels(), " | 2");
-    titles.selectRow(0);
+    titles.SelectLines(1, 1);
     QTest::keyClick(&titles, Qt::Key_Delete);
     EXPECT_EQ(Headers(), QStringList("HIGH")) << "the only title stays";
     Undo();

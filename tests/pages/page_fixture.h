@@ -154,12 +154,7 @@ protected:
     }
     QWidget* Editor() const { return grid->Delegate()->Editor(); }
     std::pair<int, int> Current() const { return {grid->CurrentRow(), grid->CurrentColumn()}; }
-    void SelectRows(int first, int last)
-    {
-        grid->selectionModel()->select(
-            QItemSelection(grid->model()->index(first - 1, 0), grid->model()->index(last - 1, grid->ColumnCount() - 1)),
-            QItemSelectionModel::ClearAndSelect);
-    }
+    void SelectRows(int first, int last) { grid->SelectLines(first, last); }
 
     CKavo0_hdDoc document;
     CGenParamList<HD_Initial>& init = document.Parameters().InitList;

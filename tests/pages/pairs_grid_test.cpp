@@ -64,7 +64,7 @@ TEST_F(PairsGridTest, KeyboardAlone)
     EXPECT_EQ(list.GetCount(), 1u) << "the location grid got no line";
     for (int column : view->edited)
         EXPECT_EQ(column, 0) << "no location changed";
-    global->selectRow(2);
+    global->SelectLines(3, 3);
     QTest::keyClick(global, Qt::Key_Delete);
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "0.5 26, 1 29");
     global->selectAll();

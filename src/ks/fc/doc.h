@@ -81,6 +81,8 @@ public:
     /// Has the views take over what is being typed, then asks whether to save when the document is modified; false when
     /// the user cancelled or the save failed.
     BOOL SaveModified();
+    /// Asks every view whether what is being typed there can be taken; see CView::MayLeave.
+    bool MayLeave();
     bool IsExecuting() const { return m_executing; } // in the middle of an open or a save
 
     const CString& GetPathName() const { return m_path; } // empty until first saved

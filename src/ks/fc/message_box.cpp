@@ -1,6 +1,7 @@
 #include "ks/fc/message_box.h"
 
 #include <QApplication>
+#include <QLabel>
 #include <utility>
 
 namespace {
@@ -16,13 +17,17 @@ QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
 }
 } // namespace
 
-QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent)
+QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent,
+                                         const CString& details)
 {
     if (const auto handler = Handler())
         return handler(text, buttons);
     QMessageBox box(IconFor(buttons), QCoreApplication::applicationName(), text, buttons,
                     parent ? parent : QApplication::activeWindow());
     box.setTextFormat(Qt::PlainText); // file names may hold anything
+    box.setInformativeText(details);
+    if (auto* label = box.findChild<QLabel*>(QStringLiteral("qt_msgbox_informativelabel")))
+        label->setTextFormat(Qt::PlainText);
     return QMessageBox::StandardButton(box.exec());
 }
 

@@ -228,10 +228,12 @@ void CLocationPage::Store(BlankRule rule)
 
 bool CLocationPage::OnKillActive()
 {
+    if (!Bindings().Take() || !CommitGrids())
+        return false;
     // Only what is still blank: a cell that was left blank by a move is a stored number by now.
     Store(BlankRule::Fill);
     StoreToDocument();
-    return true; // leaving a table is never refused
+    return true;
 }
 
 void CLocationPage::BrowseInto(CGenGrid& grid, int row, int column, const FileKind& kind)
@@ -247,7 +249,7 @@ void CLocationPage::BrowseInto(CGenGrid& grid, int row, int column, const FileKi
 void CLocationPage::AppendLine()
 {
     CGenGrid* grid = LinesGrid();
-    if (grid && grid->CommitEditor())
+    if (grid && LeaveField())
         grid->InsertLine();
 }
 

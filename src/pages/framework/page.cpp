@@ -47,6 +47,11 @@ bool CGenPropertyPage::CommitGrids()
     return taken;
 }
 
+bool CGenPropertyPage::LeaveField()
+{
+    return m_bindings.TakeField() && CommitGrids();
+}
+
 CGenGrid* CGenPropertyPage::LinesGrid() const
 {
     const QWidget* focus = QApplication::focusWidget();
@@ -89,6 +94,8 @@ void CGenPropertyPage::OnGridButtonClicked(CGenGrid&, int, int) {}
 
 void CGenPropertyPage::UndoRedo(bool undo)
 {
+    if (!LeaveField())
+        return;
     StoreToDocument();
     if (undo)
         m_document->UndoStack().undo();
@@ -103,7 +110,7 @@ void CGenPropertyPage::OnSetActive()
 
 bool CGenPropertyPage::OnKillActive()
 {
-    if (!m_bindings.Take())
+    if (!m_bindings.Take() || !CommitGrids())
         return false;
     StoreToDocument();
     return true;

@@ -37,6 +37,8 @@ public:
     CGenGrid* LinesGrid() const;
     /// Takes the texts being typed into cells; false when one is refused (the user has been told).
     bool CommitGrids();
+    /// Takes what is being typed while the page stays in front; false when it is refused (the user has been told).
+    bool LeaveField();
     /// The list that the page's grid edits; null without one.
     virtual CGenList* GetList() const { return nullptr; }
 
@@ -58,7 +60,8 @@ public:
 
     /// The page comes to the front: menus, then LoadFromDocument.
     virtual void OnSetActive();
-    /// The page is about to be left; false keeps it (a field holds something wrong).
+    /// The page is about to be left, saved or closed: everything typed is taken. False keeps the page: a text is no
+    /// value (the user has been told, and the field or cell has the focus).
     virtual bool OnKillActive();
 
 protected:

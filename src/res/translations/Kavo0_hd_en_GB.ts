@@ -2088,5 +2088,33 @@ Left X-Y coordinates
 Right X-Y coordinates
 User defined marks</translation>
         </message>
-    </context>
+        <message>
+        <source>%1: &quot;%2&quot; was typed.</source>
+        <translation>%1: &quot;%2&quot; was typed.</translation>
+    </message>
+    <message>
+        <source>Allowed: %1</source>
+        <translation>Allowed: %1</translation>
+    </message>
+    <message>
+        <source>%1 to %2</source>
+        <translation>%1 to %2</translation>
+    </message>
+    <message>
+        <source>at least %1</source>
+        <translation>at least %1</translation>
+    </message>
+    <message>
+        <source>at most %1</source>
+        <translation>at most %1</translation>
+    </message>
+    <message>
+        <source>%1, line %2</source>
+        <translation>%1, line %2</translation>
+    </message>
+    <message>
+        <source>Select the line</source>
+        <translation>Select the line</translation>
+    </message>
+</context>
 </TS>

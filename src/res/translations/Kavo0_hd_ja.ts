@@ -2088,5 +2088,33 @@ User defined marks</source>
 右岸XY座標
 ユーザー定義マーク</translation>
         </message>
-    </context>
+        <message>
+        <source>%1: &quot;%2&quot; was typed.</source>
+        <translation>%1: 「%2」と入力されました。</translation>
+    </message>
+    <message>
+        <source>Allowed: %1</source>
+        <translation>許容範囲: %1</translation>
+    </message>
+    <message>
+        <source>%1 to %2</source>
+        <translation>%1 ～ %2</translation>
+    </message>
+    <message>
+        <source>at least %1</source>
+        <translation>%1 以上</translation>
+    </message>
+    <message>
+        <source>at most %1</source>
+        <translation>%1 以下</translation>
+    </message>
+    <message>
+        <source>%1, line %2</source>
+        <translation>%1、%2 行目</translation>
+    </message>
+    <message>
+        <source>Select the line</source>
+        <translation>行を選択</translation>
+    </message>
+</context>
 </TS>
