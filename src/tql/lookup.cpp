@@ -203,11 +203,17 @@ TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node)
 std::string_view tqlGetRawParams(tqlHandle handle)
 {
     const Keyword* const keyword = AsKeyword(handle);
-    if (!keyword || keyword->ParamCount() == 0)
+    const char* const begin = keyword && keyword->ParamCount() > 0 ? keyword->Params() : AsParam(handle);
+    if (!begin)
         return {};
-    const char* const begin = keyword->Params();
     const char* last = begin;
     while (const char* const next = NextParam(last))
         last = next;
     return {begin, static_cast<std::size_t>(SkipParam(last) - begin)};
+}
+
+std::string_view tqlGetRawParam(tqlHandle handle)
+{
+    const char* const param = AsParam(handle);
+    return param ? std::string_view(param, static_cast<std::size_t>(SkipParam(param) - param)) : std::string_view();
 }
