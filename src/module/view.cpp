@@ -2,6 +2,7 @@
 
 #include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
+#include "module/file_bar.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -66,8 +67,13 @@ void CKavo0_hdView::OnInitialUpdate()
     m_sheet = new CDlgPropertySheet(this);
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(m_sheet);
+    layout->setSpacing(0);
+    layout->addWidget(new CFileBar(*GetDocument(), this));
+    layout->addWidget(m_sheet, 1);
     setFocusProxy(m_sheet);
+    const auto allowEditing = [this] { m_sheet->setEnabled(!GetDocument()->IsReadOnly()); };
+    connect(GetDocument(), &CKavo0_hdDoc::FileStateChanged, m_sheet, allowEditing);
+    allowEditing();
 
     AddTabs();
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
