@@ -91,7 +91,7 @@ void ReadDateTime(ParamCursor& params, const Field& field, void* object)
                                 .field = std::string(field.name),
                                 .expected = field.kind,
                                 .type = tqlGetType(at),
-                                .found = std::string(tqlGetRawParams(first)),
+                                .found = std::string(tqlGetRawParamsFrom(first)),
                                 .used = ParamsText(FieldList(&field, 1), object)});
     };
     if (params.Left() < parts) {
@@ -170,7 +170,7 @@ void ReportCount(const ParamCursor& params, FieldList rest, const void* object)
                         .expected = FieldKind::Group,
                         .type = tqlGetType(params.param),
                         .behind = params.Left() - 1,
-                        .found = std::string(tqlGetRawParams(params.param)),
+                        .found = std::string(tqlGetRawParamsFrom(params.param)),
                         .used = ParamsText(rest, object)});
 }
 

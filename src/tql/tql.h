@@ -131,9 +131,10 @@ using TqlOut = std::variant<std::int32_t*, double*, bool*, std::string*>;
 bool tqlGetListParam(tqlHandle section, std::string_view name, int number, std::string_view signature,
                      const std::vector<TqlOut>& out);
 
-/// The parameters of a loaded keyword, or one parameter and those behind it, exactly as they stand in their line
-/// (without comment and surrounding blanks).
-std::string_view tqlGetRawParams(tqlHandle keywordOrParam);
+/// The parameters of a loaded keyword exactly as they stand in its line (without comment and surrounding blanks).
+std::string_view tqlGetRawParams(tqlHandle keyword);
+/// Likewise a parameter and those behind it.
+std::string_view tqlGetRawParamsFrom(tqlHandle param);
 /// Likewise a single parameter.
 std::string_view tqlGetRawParam(tqlHandle param);
 
