@@ -78,6 +78,7 @@ void CKavo0_hdView::OnInitialUpdate()
     AddTabs();
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
     connect(m_sheet, &QTabWidget::currentChanged, this, &CKavo0_hdView::ShowLine);
+    connect(GetDocument(), &CKavo0_hdDoc::Said, this, &CKavo0_hdView::Say);
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())
         page->OnSetActive();
@@ -178,6 +179,16 @@ void CKavo0_hdView::ShowLine()
     QStatusTipEvent tip(row > 0 ? LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()) : QString());
     if (MainFrame())
         QCoreApplication::sendEvent(MainFrame(), &tip);
+}
+
+/// In the status bar, when the present event is over: lines that become current in it are shown first.
+void CKavo0_hdView::Say(const QString& text)
+{
+    QTimer::singleShot(0, this, [this, text] {
+        QStatusTipEvent tip(text);
+        if (MainFrame())
+            QCoreApplication::sendEvent(MainFrame(), &tip);
+    });
 }
 
 void CKavo0_hdView::EnableLinesMenu(bool enable)
