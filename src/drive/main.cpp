@@ -74,7 +74,7 @@ int main(int argc, char** argv)
             robot.Verify(QTest::qWaitFor([&] { return frame.findChildren<QMdiSubWindow*>().size() == members; }),
                          "the project opens all its files");
             robot.Trigger("actionSideBySide");
-            DriveMainJob(robot, work + "/river.hdkv");
+            DriveMainJob(robot, work + "/river.HDKV");
             DriveProjectJob(robot);
             result = Report(robot);
             QCoreApplication::exit(result);

@@ -1,6 +1,5 @@
 #include "module/document.h"
 
-#include "data/hd_file.h"
 #include "data/safe_file.h"
 #include "ks/fc/message_box.h"
 #include "module/purged_lines.h"
@@ -9,7 +8,6 @@
 
 #include <QApplication>
 #include <QDir>
-#include <QFile>
 #include <QFileInfo>
 #include <QPointer>
 #include <QTimer>
@@ -43,34 +41,19 @@ BOOL CKavo0_hdDoc::OnOpenDocument(const CString& path)
 {
     if (!CKsDoc::OnOpenDocument(path))
         return false;
-    m_strFilePath = path;
     if (!HasExtension(path)) {
         KsMessageBox(LoadString(Str::UnsupportedFormat));
         return false;
     }
-    ReadData(path);
+    m_file.Read(path, m_parameters);
+    m_isReadOnly = m_file.IsUnreadable();
+    emit FileStateChanged();
     return true;
-}
-
-void CKavo0_hdDoc::ReadData(const CString& path)
-{
-    tqlHandle handle = tqlLoadFile(path.toStdString(), 1);
-    m_unreadable = tqlPeekErrorGlb() != 0;
-    if (m_unreadable) {
-        tqlGetErrorGlb();
-        TqlSyntaxError error;
-        tqlGetSyntaxErr(handle, &error);
-        KsMessageBox(QString::fromStdString(error.message));
-    } else {
-        m_parameters.Load(handle);
-    }
-    tqlClose(&handle);
 }
 
 CString CKavo0_hdDoc::SavePathFor(const CString& path) const
 {
-    const QFileInfo info(path);
-    return info.dir().filePath(info.completeBaseName() + QStringLiteral(".HDKV"));
+    return CDocumentFile::SavePathFor(path);
 }
 
 BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
@@ -79,13 +62,13 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
         return false;
     const CString target = SavePathFor(path);
     UpdateAllViews(nullptr, Hint::Store);
-    if (!MayReplace(target, path))
+    if (!MayReplace(target, path) || !m_file.MayReplace(target))
         return false;
 
     RemovePlaceholders();
     auto purged = std::make_unique<CPurgedLines>(*this);
     purged->Apply();
-    if (!WriteData(target)) {
+    if (!m_file.Write(m_parameters, target)) {
         purged->Revert(); // what is in memory stays as the user left it
         UpdateAllViews(nullptr, Hint::Reload);
         return false;
@@ -94,12 +77,13 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
         UndoStack().push(purged.release());
     UndoStack().setClean();
 
-    RemoveOldSpelling(target);
-    m_strFilePath = target;
-    m_unreadable = false;
+    m_isReadOnly = false;
     SetPathName(target);
     UpdateAllViews(nullptr, Hint::Reload);
     SetModifiedFlag(false);
+    emit FileStateChanged();
+    if (!m_file.Renamed().isEmpty())
+        emit Said(m_file.Renamed());
     return true;
 }
 
@@ -114,34 +98,10 @@ bool CKavo0_hdDoc::MayReplace(const CString& target, const CString& path)
     return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
-bool CKavo0_hdDoc::WriteData(const CString& path)
+void CKavo0_hdDoc::EditUnreadable()
 {
-    if (m_unreadable && SavePathFor(m_strFilePath) == path && !KeepUnreadableOriginal())
-        return false;
-    const auto saved = SaveHDFile(m_parameters, path.toStdString());
-    if (!saved)
-        KsMessageBox(QString::fromStdString(saved.error().message));
-    return bool(saved);
-}
-
-bool CKavo0_hdDoc::KeepUnreadableOriginal()
-{
-    if (!QFileInfo::exists(m_strFilePath))
-        return true;
-    const auto kept = KeepUnreadable(m_strFilePath.toStdString());
-    if (!kept)
-        KsMessageBox(QString::fromStdString(kept.error().message));
-    return bool(kept);
-}
-
-void CKavo0_hdDoc::RemoveOldSpelling(const CString& target)
-{
-    const CString& old = m_strFilePath;
-    if (old.isEmpty() || old == target || SavePathFor(old) != target || !QFileInfo::exists(old))
-        return;
-    // Where the file system ignores case both names are the file that was just written.
-    if (!SameFile(old.toStdString(), target.toStdString()))
-        QFile::remove(old);
+    m_isReadOnly = false;
+    emit FileStateChanged();
 }
 
 void CKavo0_hdDoc::AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record)

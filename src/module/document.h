@@ -4,6 +4,7 @@
 #include "data/hd_parameters.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/package.h"
+#include "module/document_file.h"
 
 #include <cstdint>
 #include <functional>
@@ -76,30 +77,32 @@ public:
     void TellShell(WPARAM news, CView* view, CObList* objects);
 
     std::intptr_t ProjectHandle() const { return m_hProject; }
-    const CString& FilePath() const { return m_strFilePath; }
-    /// The file at FilePath could not be parsed; the document holds nothing of it.
-    bool IsUnreadable() const { return m_unreadable; }
+    /// The file last opened or saved.
+    const CDocumentFile& File() const { return m_file; }
+    /// It could not be parsed, and nobody has asked to edit what is shown instead.
+    bool IsReadOnly() const { return m_isReadOnly; }
+    void EditUnreadable();
 
 signals:
     /// Undo or redo changed a list (or a global value: null list); the view brings its page forward.
     void Reveal(CGenList* list, int row, int column);
 
+    /// What is known of File(), or IsReadOnly(), is another.
+    void FileStateChanged();
+    /// What was done, for the status bar.
+    void Said(const QString& text);
+
 private:
     void StepMade();
-    void ReadData(const CString& path);
-    /// Writes the whole content; on failure the user has been told and the file is what it was.
-    bool WriteData(const CString& path);
-    bool KeepUnreadableOriginal();
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);
-    void RemoveOldSpelling(const CString& target);
     LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name, CObList* objects = nullptr);
 
     HD_Parameters m_parameters;
-    CString m_strFilePath; // of the file last opened
+    CDocumentFile m_file;
     std::intptr_t m_hProject = 0;
-    int m_untold = 0;          // steps that the project has not heard of
-    bool m_unreadable = false; // the file at m_strFilePath could not be parsed
+    int m_untold = 0; // steps that the project has not heard of
+    bool m_isReadOnly = false;
     std::unordered_set<const HD_RiverPos*> m_placeholders;
     std::unordered_set<const void*> m_placeholderRows;
     std::vector<CCleanedRows> m_cleanedRows;

@@ -2,6 +2,7 @@
 
 #include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
+#include "module/file_bar.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -58,12 +59,18 @@ void CKavo0_hdView::OnInitialUpdate()
     m_sheet = new CDlgPropertySheet(this);
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(m_sheet);
+    layout->setSpacing(0);
+    layout->addWidget(new CFileBar(*GetDocument(), this));
+    layout->addWidget(m_sheet, 1);
     setFocusProxy(m_sheet);
+    const auto allowEditing = [this] { m_sheet->setEnabled(!GetDocument()->IsReadOnly()); };
+    connect(GetDocument(), &CKavo0_hdDoc::FileStateChanged, m_sheet, allowEditing);
+    allowEditing();
 
     AddTabs();
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
     connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowLine);
+    connect(GetDocument(), &CKavo0_hdDoc::Said, this, &CKavo0_hdView::Say);
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())
         page->OnSetActive();
@@ -170,6 +177,16 @@ void CKavo0_hdView::ShowLine()
     QStatusTipEvent tip(row > 0 ? LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()) : QString());
     if (MainFrame())
         QCoreApplication::sendEvent(MainFrame(), &tip);
+}
+
+/// In the status bar, when the present event is over: lines that become current in it are shown first.
+void CKavo0_hdView::Say(const QString& text)
+{
+    QTimer::singleShot(0, this, [this, text] {
+        QStatusTipEvent tip(text);
+        if (MainFrame())
+            QCoreApplication::sendEvent(MainFrame(), &tip);
+    });
 }
 
 void CKavo0_hdView::EnableLinesMenu(bool enable)

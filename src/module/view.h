@@ -58,6 +58,7 @@ private:
     LRESULT AnswerEditor(WPARAM request, CKSComm_Package* package);
     void FetchLocation();
     void ShowLine();
+    void Say(const QString& text);
     void TellLocationLater();
     void TellLocation();
 

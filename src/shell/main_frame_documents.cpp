@@ -2,6 +2,7 @@
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
 #include "shell/main_frame.h"
+#include "shell/project_respell.h"
 #include "shell/settings_keys.h"
 
 #include <QDir>
@@ -57,6 +58,8 @@ void CMainFrame::AddTemplate(CMultiDocTemplate* documents)
         connect(document, &CKsDoc::TitleChanged, this, &CMainFrame::UpdateTitle);
         connect(document, &CKsDoc::PathNameChanged, this, [this](const CString& oldPath, const CString& newPath) {
             m_recent.Rename(oldPath, newPath);
+            for (const auto& project : m_projects.All())
+                RespellMember(project->path, oldPath, newPath);
             if (!newPath.isEmpty())
                 m_recent.Add(newPath);
         });

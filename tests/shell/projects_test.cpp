@@ -58,6 +58,26 @@ TEST_F(ShellTest, AtTheStartTheFirstFileIsThereAtOnceAndTheOthersFollow)
     EXPECT_EQ(opened(), "") << "the others do not open in a project that was closed";
 }
 
+// An editor that writes its extension in capitals renames a member; the project file follows, and nothing else in it.
+TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
+{
+    Write("one/r\u00FC.tst");
+    Write("b.tst");
+    const char* const members =
+        "  // main river\n  File = <one\\\\r\xC3\xBC.tst> // keep\nFile=<b.tst>\nFile = \"one/r\xC3\xBC.tst\"\n";
+    const QString path = WriteProject("p.kvrp", members);
+    ASSERT_TRUE(frame->OpenFile(path));
+    CKsDoc* document = ViewOf("one/r\u00FC.tst")->GetDocument();
+    document->SetPathName(Path("one/r\u00FC.TST"));
+    QFile file(path);
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    EXPECT_EQ(file.readAll(), "[KVR_PROJECT]\n[Members]\n  // main river\n  File = <one\\\\r\xC3\xBC.TST> // keep\n"
+                              "File=<b.tst>\nFile = \"one/r\xC3\xBC.TST\"\n[/Members]\n[/KVR_PROJECT]\n");
+    document->SetPathName(Path("one/other.TST"));
+    file.seek(0);
+    EXPECT_FALSE(file.readAll().contains("other")) << "another file is no other spelling";
+}
+
 TEST_F(ShellTest, AProjectStandsSideBySideUnlessTheUserChoseTabs)
 {
     Write("a.tst");

@@ -2,6 +2,7 @@
 
 #include "ks/fc/doc_template.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/system_reason.h"
 
 #include <QDir>
 #include <QFile>
@@ -32,7 +33,7 @@ BOOL CKsDoc::OnOpenDocument(const CString& path)
     const QFileInfo info(path);
     const CString reason = !info.exists()                    ? tr("The file does not exist.")
                            : !info.isFile()                  ? tr("This is not a file.")
-                           : !file.open(QIODevice::ReadOnly) ? file.errorString()
+                           : !file.open(QIODevice::ReadOnly) ? KsSystemReason(file)
                                                              : CString();
     if (!reason.isEmpty()) {
         KsMessageBox(tr("%1 could not be opened.\n%2").arg(QDir::toNativeSeparators(path), reason));

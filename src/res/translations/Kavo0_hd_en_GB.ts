@@ -1961,12 +1961,6 @@ The simulation will write over it. Use this name?</source>
 The simulation will write over it. Use this name?</translation>
         </message>
         <message>
-            <source>%1 already exists.
-The simulation will read it. Use this name?</source>
-            <translation>%1 already exists.
-The simulation will read it. Use this name?</translation>
-        </message>
-        <message>
             <source>Choose a File</source>
             <translation>Choose a File</translation>
         </message>
@@ -2116,5 +2110,125 @@ User defined marks</translation>
         <source>Select the line</source>
         <translation>Select the line</translation>
     </message>
+        <message>
+            <source>%1 does not exist.
+The simulation will look for it. Use this name?</source>
+            <translation>%1 does not exist.
+The simulation will look for it. Use this name?</translation>
+        </message>
+        <message>
+            <source>Could not write &quot;%1&quot;: %2.</source>
+            <translation>Could not write &quot;%1&quot;: %2.</translation>
+        </message>
+        <message>
+            <source>Could not read &quot;%1&quot;: %2.</source>
+            <translation>Could not read &quot;%1&quot;: %2.</translation>
+        </message>
+        <message>
+            <source>The new content is complete in &quot;%1&quot;.</source>
+            <translation>The new content is complete in &quot;%1&quot;.</translation>
+        </message>
+        <message>
+            <source>%1 is now %2</source>
+            <translation>%1 is now %2</translation>
+        </message>
+        <message>
+            <source>%1 could not be read when it was opened; what is shown is not its content.
+Saving replaces it. As it is now it stays in a copy beside it, %2.
+Save?</source>
+            <translation>%1 could not be read when it was opened; what is shown is not its content.
+Saving replaces it. As it is now it stays in a copy beside it, %2.
+Save?</translation>
+        </message>
+        <message>
+            <source>%1 holds values that were not taken as they stand (places: %2).
+Saving writes what is shown instead. As it is now the file stays in a copy beside it, %3.
+Save?</source>
+            <translation>%1 holds values that were not taken as they stand (places: %2).
+Saving writes what is shown instead. As it is now the file stays in a copy beside it, %3.
+Save?</translation>
+        </message>
+        <message>
+            <source>%1 could not be read. What is shown here are default values, not its content.
+%2</source>
+            <translation>%1 could not be read. What is shown here are default values, not its content.
+%2</translation>
+        </message>
+        <message>
+            <source>Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.</source>
+            <translation>Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.</translation>
+        </message>
+        <message>
+            <source>The file as it was before this save is kept in %1.</source>
+            <translation>The file as it was before this save is kept in %1.</translation>
+        </message>
+        <message>
+            <source>Show List...</source>
+            <translation>Show List...</translation>
+        </message>
+        <message>
+            <source>Edit Default Values</source>
+            <translation>Edit Default Values</translation>
+        </message>
+        <message>
+            <source>Close this bar</source>
+            <translation>Close this bar</translation>
+        </message>
+        <message>
+            <source>%1: Values Not Taken as They Stand</source>
+            <translation>%1: Values Not Taken as They Stand</translation>
+        </message>
+        <message>
+            <source>These places of %1 are not written as they should be. Each row says what stands there, what was expected, and what is used instead. Nothing is changed in the file unless you save; a save keeps the file as it is in a copy.</source>
+            <translation>These places of %1 are not written as they should be. Each row says what stands there, what was expected, and what is used instead. Nothing is changed in the file unless you save; a save keeps the file as it is in a copy.</translation>
+        </message>
+        <message>
+            <source>Line
+Column
+Section
+Keyword
+Parameter
+In the file
+Expected
+Used instead</source>
+            <translation>Line
+Column
+Section
+Keyword
+Parameter
+In the file
+Expected
+Used instead</translation>
+        </message>
+        <message>
+            <source>a number
+an integer
+true or false
+a text in quotes
+a file name in &lt; &gt;
+six integers
+a count that fits the %1 parameters behind it
+a flag for each of %1 titles
+a target [%1]
+more parameters, or a smaller count</source>
+            <translation>a number
+an integer
+true or false
+a text in quotes
+a file name in &lt; &gt;
+six integers
+a count that fits the %1 parameters behind it
+a flag for each of %1 titles
+a target [%1]
+more parameters, or a smaller count</translation>
+        </message>
+        <message>
+            <source>&amp;Copy</source>
+            <translation>&amp;Copy</translation>
+        </message>
+        <message>
+            <source>C&amp;lose</source>
+            <translation>C&amp;lose</translation>
+        </message>
 </context>
 </TS>
