@@ -286,7 +286,8 @@ void Checker::CheckDate(const Field& field, ParamCursor& params)
         whole = CheckType(field, params) && tqlGetInt(params.param, part) && whole;
         params.Next();
     }
-    if (whole && !date.IsValid())
+    const bool isSet = date != HDDateTime{};
+    if (whole && isSet && !date.IsValid())
         Add(first, std::string(m_owner) + ": the six integers of " + std::string(field.name) + " are no date and time");
 }
 

@@ -2,11 +2,15 @@
 
 #include "ks/fc/message_box.h"
 #include "pages/framework/column_spec.h"
+#include "pages/framework/digits_mark.h"
 #include "pages/framework/number_syntax.h"
 #include "res/strings.h"
 
 #include <QKeyEvent>
+#include <QPainter>
+#include <QStyle>
 #include <QTimer>
+#include <algorithm>
 
 CCtrlEdit::CCtrlEdit(QWidget* parent) : QLineEdit(parent)
 {
@@ -44,18 +48,25 @@ void CCtrlEdit::SetValue(double value)
 
 void CCtrlEdit::Show()
 {
-    setToolTip(UnitToolTip(UnitSymbol()));
     if (!hasFocus() || !IsTyped())
         ShowValue();
+    else
+        UpdateToolTip(); // the unit may be another one
 }
 
 void CCtrlEdit::ShowValue()
 {
-    setToolTip(UnitToolTip(UnitSymbol()));
-    m_shown = m_style.UnitConvertFromBase_T(*m_value, 1);
+    m_shown = m_style.ShownText(*m_value);
+    setMaxLength(std::max(m_textLimit, int(m_shown.size()))); // a number is never cut
     if (text() != m_shown)
         setText(m_shown);
     setModified(false);
+    UpdateToolTip();
+}
+
+void CCtrlEdit::UpdateToolTip()
+{
+    setToolTip(NumberToolTip(m_style, *m_value, m_shown, UnitSymbol()));
 }
 
 bool CCtrlEdit::Refuse(const QString& message)
@@ -94,6 +105,16 @@ bool CCtrlEdit::Commit()
     }
     ShowValue();
     return true;
+}
+
+void CCtrlEdit::paintEvent(QPaintEvent* event)
+{
+    QLineEdit::paintEvent(event);
+    if (!m_value || IsTyped() || !m_style.HidesDigits(*m_value, m_shown))
+        return;
+    QPainter painter(this);
+    const int frame = style()->pixelMetric(QStyle::PM_DefaultFrameWidth, nullptr, this) + 1;
+    PaintDigitsMark(painter, rect().adjusted(frame, frame, -frame, -frame), palette());
 }
 
 void CCtrlEdit::focusOutEvent(QFocusEvent* event)

@@ -39,11 +39,13 @@ public:
 protected:
     bool event(QEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
 
 private:
     bool IsTyped() const { return isModified() && text() != m_shown; }
     void ShowValue();
+    void UpdateToolTip();
     bool Refuse(const QString& message);
 
     CKsEditStyle m_style;

@@ -65,6 +65,7 @@ protected:
 private:
     void LostFocus(const QEvent* event);
     void PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
+    void PaintMark(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
     void PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
 
     CGenGrid* m_grid;
