@@ -20,7 +20,7 @@ protected:
         const QPoint corner = QPoint(cell.right(), cell.top()) * shot.devicePixelRatio();
         const QColor colour = shot.pixelColor(corner);
         const bool isSelected = grid->selectionModel()->isSelected(Cell(row, column));
-        return colour == grid->palette().color(isSelected ? QPalette::HighlightedText : QPalette::Link);
+        return colour == grid->palette().color(isSelected ? QPalette::HighlightedText : QPalette::Highlight);
     }
 };
 

@@ -11,8 +11,8 @@ void PaintDigitsMark(QPainter& painter, const QRect& box, const QPalette& palett
     painter.save();
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(Qt::NoPen);
-    // Colours that every theme keeps readable on the background.
-    painter.setBrush(palette.color(isSelected ? QPalette::HighlightedText : QPalette::Link));
+    // Seen on the background in every theme, as the selection has to be; a theme may have no colour for links.
+    painter.setBrush(palette.color(isSelected ? QPalette::HighlightedText : QPalette::Highlight));
     painter.drawConvexPolygon(triangle, 3);
     painter.restore();
 }
