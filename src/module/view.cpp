@@ -74,7 +74,7 @@ void CKavo0_hdView::OnInitialUpdate()
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
     connect(m_sheet, &QTabWidget::currentChanged, this, &CKavo0_hdView::ShowLine);
     for (auto switched : {&KsUnits::Changed, &KsUnits::DigitsChanged})
-        connect(&KsUnits::Instance(), switched, this, &CKavo0_hdView::ShowLine);
+        connect(&KsUnits::Instance(), switched, this, [this] { OnUpdate(nullptr, Hint::Reload, nullptr); });
     connect(&KsLanguage::Instance(), &KsLanguage::Changed, this, &CKavo0_hdView::ShowLine);
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())

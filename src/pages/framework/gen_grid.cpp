@@ -113,7 +113,7 @@ QString CGenGrid::LineText() const
 {
     const int fixed = m_model->FixedRows();
     const int row = CurrentRow() - fixed, column = CurrentColumn() - 1;
-    if (row <= 0 || column < 0)
+    if (row <= 0 || column < 0 || CurrentRow() > int(m_model->Rows()->Count())) // the rows may be about to be synced
         return {};
     const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
     const CellValue value = m_model->Value(row + fixed - 1, column);
@@ -209,7 +209,7 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
     if (!m_model->IsSyncing())
         StoreEditedLine();
     m_lastColumn = current.column() + 1;
-    if (Host())
+    if (Host() && !m_model->IsSyncing())
         Host()->CurrentCellChanged();
     const int row = current.row() + 1;
     if (row == m_lastRow)

@@ -15,10 +15,6 @@ CGenPropertyPage::CGenPropertyPage(CKavo0_hdDoc* document, QWidget* parent)
     : QWidget(parent), m_document(document), m_bindings(document), m_shownUnits(KsUnits::Instance().System())
 {
     connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CGenPropertyPage::UnitsChanged);
-    connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, [this] {
-        if (isVisible())
-            LoadFromDocument(m_document);
-    });
 }
 
 CGenPropertyPage::~CGenPropertyPage()
