@@ -15,9 +15,9 @@ QString Row(const QString& keys, const QString& description)
         .arg(keys.toHtmlEscaped(), description.toHtmlEscaped());
 }
 
-QString KeyName(const GridKey& key)
+QString KeyName(Qt::Key key, Qt::KeyboardModifiers held = Qt::NoModifier)
 {
-    return QKeySequence(QKeyCombination(key.held, key.key)).toString(QKeySequence::NativeText);
+    return QKeySequence(QKeyCombination(held, key)).toString(QKeySequence::NativeText);
 }
 
 } // namespace
@@ -25,8 +25,8 @@ QString KeyName(const GridKey& key)
 QString PageHelpText(bool hasTables)
 {
     QString text = QStringLiteral("<p><b>%1</b></p><table>").arg(LoadString(Str::HelpFields).toHtmlEscaped());
-    text += Row(KeyName({.key = Qt::Key_Return}), LoadString(Str::HelpFieldTake));
-    text += Row(KeyName({.key = Qt::Key_Escape}), LoadString(Str::HelpFieldRevert));
+    text += Row(KeyName(Qt::Key_Return), LoadString(Str::HelpFieldTake));
+    text += Row(KeyName(Qt::Key_Escape), LoadString(Str::HelpFieldRevert));
     text += QStringLiteral("</table>");
     if (!hasTables)
         return text;
@@ -36,7 +36,7 @@ QString PageHelpText(bool hasTables)
         if (rows.empty() || rows.back().first != key.description)
             rows.push_back({key.description, {}});
         if (key.key != Qt::Key_Backtab) // the same as Shift+Tab
-            rows.back().second << KeyName(key);
+            rows.back().second << KeyName(key.key, key.held);
     }
     text += QStringLiteral("<p><b>%1</b></p><table>").arg(LoadString(Str::HelpTables).toHtmlEscaped());
     for (const auto& [description, keys] : rows)
