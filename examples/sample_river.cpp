@@ -79,10 +79,10 @@ void FillFlow(HD_Parameters& p)
     }
     for (const Location& at : Locations(1100)) {
         auto bed = at.Record<HD_Resistfact>();
-        bed.Resistance = Rounded(noise.Between(26, 38), 0.5);
+        bed.Resistance = Rounded(noise.Between(0.024, 0.036), 0.0005);
         bed.ZoneResistance1 = bed.Resistance;
-        bed.ZoneResistance2 = Rounded(bed.Resistance * 0.8, 0.5);
-        bed.ZoneResistance3 = Rounded(bed.Resistance * 0.6, 0.5);
+        bed.ZoneResistance2 = Rounded(bed.Resistance * 1.25, 0.0005);
+        bed.ZoneResistance3 = Rounded(bed.Resistance * 1.65, 0.0005);
         p.BedList.Add(bed);
     }
     for (const Location& at : Locations(2800)) {
@@ -90,7 +90,7 @@ void FillFlow(HD_Parameters& p)
         wind.WindFactor = Rounded(noise.Between(0.6, 1.1), 0.01);
         p.WindList.Add(wind);
         auto flood = at.Record<HD_Flood_resist>();
-        flood.FloodPlainResistance = Rounded(noise.Between(8, 16), 0.5);
+        flood.FloodPlainResistance = Rounded(noise.Between(0.04, 0.06), 0.0005);
         p.FloodList.Add(flood);
         auto loss = at.Record<HD_Waterloss>();
         loss.WaterLoss1 = Rounded(noise.Between(0.002, 0.01), 0.0001);
@@ -156,23 +156,28 @@ void FillResistanceTools(HD_Parameters& p)
         mixing.MixCoef4 = 0.03;
         p.MixingCoefList.Add(mixing);
         auto tool = at.Record<HDBedResTool>();
-        tool.CoefA = Rounded(noise.Between(20, 26), 0.1);
-        tool.CoefB = Rounded(noise.Between(0.1, 0.3), 0.01);
-        tool.MinRes = 18;
-        tool.MaxRes = 42;
+        tool.CoefA = Rounded(noise.Between(0.032, 0.042), 0.0005);
+        tool.CoefB = -Rounded(noise.Between(0.1, 0.3), 0.01);
+        tool.MinRes = 0.02;
+        tool.MaxRes = 0.06;
         for (double velocity = 0.5; velocity <= 2; velocity += 0.5)
-            tool.VeloRes.push_back({velocity, Rounded(24 + 5 * velocity, 0.5)});
+            tool.VeloRes.push_back({velocity, Rounded(0.046 - 0.008 * velocity, 0.0005)});
         p.BedResistanceToolboxList.Add(tool);
     }
-    for (const double freeboard : {0.3, 0.5}) {
+    constexpr double freeboard = 0.3;
+    for (const bool isFixedWidth : {true, false}) {
         auto& set = p.EncroachList.Add();
         for (const Location& at : Locations(5200)) {
             auto location = at.Record<HDEncroach>();
-            location.EncOption1 = 2;
-            location.EncOption3 = 3;
-            for (int side = 0; side < 5; ++side) {
-                location.EncValues1[side] = Rounded(noise.Between(5, 30), 0.5);
-                location.EncValues2[side] = Rounded(freeboard * (side + 1) / 5, 0.01);
+            location.EncValues1[0] = Rounded(noise.Between(5, 15), 0.5); // offsets from the banks
+            location.EncValues1[1] = Rounded(noise.Between(5, 15), 0.5);
+            if (isFixedWidth) {
+                location.EncOption1 = 2;
+                location.EncValues1[4] = Rounded(noise.Between(80, 140), 0.5);
+            } else {
+                location.EncOption1 = 4;
+                location.EncOption3 = 2;
+                location.EncValues2[3] = Rounded(at.bed + at.depth + freeboard, 0.01); // target level
             }
             set.Add(location);
         }
@@ -211,18 +216,18 @@ void FillSettings(HD_Global_Var& g)
     g.G_waterlevel = 41.5;
     g.G_discharge = 45;
     g.G_wind_factor = 0.9;
-    g.G_resistance = 32;
+    g.G_resistance = 0.031;
     g.G_S_max = 0.35;
     g.G_f = 0.02;
     g.G_k_100 = 1.1;
     g.G_min_width = 4;
-    g.G_flood_plan_res = 12;
+    g.G_flood_plan_res = 0.05;
     g.ResisZone = 1;
-    g.ZoneResistance1 = 32;
-    g.ZoneResistance2 = 26;
-    g.ZoneResistance3 = 19.5;
+    g.ZoneResistance1 = 0.031;
+    g.ZoneResistance2 = 0.039;
+    g.ZoneResistance3 = 0.051;
     g.wind_shear_stress = true;
-    g.resist_num = 1;
+    g.resist_num = 1; // Manning's n
     g.struc_fac = 0.1;
     g.EnergyEquation = true;
     g.FrictionSlope = 1;
@@ -231,7 +236,7 @@ void FillSettings(HD_Global_Var& g)
     g.AddOutput.Velo_H = g.AddOutput.Discharge_H = g.AddOutput.FroudeNum_H = true;
     g.AddOutput.WaterSlope = g.AddOutput.BedShearStress = g.AddOutput.MassError_Total = true;
     g.Mixing.CoefPairs = {{20, 0.17}, {40, 0.19}};
-    g.BedResist = {1, true, false, true, {{0.5, 26}, {1, 29}, {1.5, 31.5}}, 22.5, 0.15, 18, 42};
+    g.BedResist = {1, true, false, true, {{0.5, 0.042}, {1, 0.038}, {1.5, 0.034}}, 0.037, -0.15, 0.02, 0.06};
     g.CurveIncrement = {true, false, true, false, false, 1, 45, 350, 1.1};
     g.SandBarIncrement = {true, 0, 0.0008, 28, 52, 0.15};
     g.Max_no_iter = 30;

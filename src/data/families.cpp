@@ -5,7 +5,7 @@ namespace {
 constexpr Field mixingPair[] = {Number<&CMixingWCCoef::First>("First"), Number<&CMixingWCCoef::Second>("Second")};
 constexpr Field velocityResistance[] = {Number<&CBRTVeloRes::Velocity>("Velocity", UnitGroup::Velocity),
                                         Number<&CBRTVeloRes::ResValue>("ResValue")};
-constexpr Field markLevel[] = {Plain(FieldKind::Number, "Level")};
+constexpr Field markLevel[] = {Plain(FieldKind::Number, "Level", UnitGroup::WaterLevel)};
 constexpr GroupAccess markLevels = GroupOf<std::vector<double>>(markLevel);
 
 } // namespace
@@ -40,13 +40,19 @@ FieldList HDEncroach::DeclaredFields()
 {
     using E = HDEncroach;
     static constexpr Field fields[] = {
-        Choice<&E::EncOption1>("EncOption1"),        Choice<&E::EncOption2>("EncOption2"),
-        NumberAt<0, &E::EncValues1>("EncValues1.1"), NumberAt<1, &E::EncValues1>("EncValues1.2"),
-        NumberAt<2, &E::EncValues1>("EncValues1.3"), NumberAt<3, &E::EncValues1>("EncValues1.4"),
-        NumberAt<4, &E::EncValues1>("EncValues1.5"), Choice<&E::EncOption3>("EncOption3"),
-        NumberAt<0, &E::EncValues2>("EncValues2.1"), NumberAt<1, &E::EncValues2>("EncValues2.2"),
-        NumberAt<2, &E::EncValues2>("EncValues2.3"), NumberAt<3, &E::EncValues2>("EncValues2.4"),
-        NumberAt<4, &E::EncValues2>("EncValues2.5"),
+        Choice<&E::EncOption1>("EncOption1"),
+        Choice<&E::EncOption2>("EncOption2"),
+        NumberAt<0, &E::EncValues1>("EncValues1.1", UnitGroup::Width),
+        NumberAt<1, &E::EncValues1>("EncValues1.2", UnitGroup::Width),
+        NumberAt<2, &E::EncValues1>("EncValues1.3", UnitGroup::Width),
+        NumberAt<3, &E::EncValues1>("EncValues1.4", UnitGroup::Width),
+        NumberAt<4, &E::EncValues1>("EncValues1.5", UnitGroup::Width),
+        Choice<&E::EncOption3>("EncOption3"),
+        NumberAt<0, &E::EncValues2>("EncValues2.1"),
+        NumberAt<1, &E::EncValues2>("EncValues2.2"),
+        NumberAt<2, &E::EncValues2>("EncValues2.3"),
+        NumberAt<3, &E::EncValues2>("EncValues2.4", UnitGroup::WaterLevel),
+        NumberAt<4, &E::EncValues2>("EncValues2.5", UnitGroup::WaterLevel),
     };
     return fields;
 }

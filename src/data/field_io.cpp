@@ -117,7 +117,7 @@ void ReadDateTime(ParamCursor& params, const Field& field, void* object)
     value = read;
     if (other)
         report(Finding::OtherType, other, otherNumber);
-    if (!value.IsValid())
+    if (value != HDDateTime{} && !value.IsValid()) // six zeros are "not set"
         report(Finding::NoDate, first, params.number - parts);
 }
 

@@ -3,6 +3,7 @@
 #include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
 #include "module/file_bar.h"
+#include "ks/language/language.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -71,6 +72,9 @@ void CKavo0_hdView::OnInitialUpdate()
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
     connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowLine);
     connect(GetDocument(), &CKavo0_hdDoc::Said, this, &CKavo0_hdView::Say);
+    for (auto switched : {&KsUnits::Changed, &KsUnits::DigitsChanged})
+        connect(&KsUnits::Instance(), switched, this, [this] { OnUpdate(nullptr, Hint::Reload, nullptr); });
+    connect(&KsLanguage::Instance(), &KsLanguage::Changed, this, &CKavo0_hdView::ShowLine);
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
     if (auto* page = ActivePage())
         page->OnSetActive();
@@ -120,6 +124,7 @@ void CKavo0_hdView::OnUpdate(CView*, int hint, CHint*)
         page->StoreToDocument();
     else if (hint == Hint::Reload)
         page->LoadFromDocument(GetDocument());
+    ShowLine(); // a paste or an undone step may have changed the list and the current cell
 }
 
 bool CKavo0_hdView::MayLeave(KsLeave what)
@@ -168,15 +173,16 @@ void CKavo0_hdView::CurrentLocationChanged()
         TellLocationLater();
 }
 
-/// The line of the page in front, in the status bar; nothing for a page without a list.
+/// In the status bar: the line of the table that is worked in, and the number of its current cell where the cell leaves
+/// digits out. Nothing for a page without a table.
 void CKavo0_hdView::ShowLine()
 {
+    if (!MainFrame() || MainFrame()->GetActiveView() != this)
+        return;
     const auto* page = ActivePage();
-    const auto* grid = page && page->GetList() ? page->GetGrid() : nullptr;
-    const int row = grid ? grid->CurrentRow() - grid->Model()->FixedRows() : 0;
-    QStatusTipEvent tip(row > 0 ? LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()) : QString());
-    if (MainFrame())
-        QCoreApplication::sendEvent(MainFrame(), &tip);
+    const auto* grid = page ? page->LinesGrid() : nullptr;
+    QStatusTipEvent tip(grid ? grid->LineText() : QString());
+    QCoreApplication::sendEvent(MainFrame(), &tip);
 }
 
 /// In the status bar, when the present event is over: lines that become current in it are shown first.
@@ -243,6 +249,8 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
         return lines && m_inProject;
     case Command::SearchAgain:
         return lines && m_search.asked;
+    case KsCommand::Help:
+        return true;
     default:
         return false;
     }
@@ -271,6 +279,9 @@ bool CKavo0_hdView::OnCommand(int id)
         return true;
     case Command::SearchAgain:
         SearchAgain();
+        return true;
+    case KsCommand::Help:
+        page->OnHelp();
         return true;
     default:
         return false;

@@ -39,6 +39,7 @@ public:
     CView* HostView() override { return this; }
     void EditedLineChanged(int column) override;
     void CurrentLocationChanged() override;
+    void CurrentCellChanged() override { ShowLine(); }
     void Execute(int command) override { OnCommand(command); }
     QStringList BranchNames() override;
     void EnableLinesMenu(bool enable) override;

@@ -1,6 +1,6 @@
 #include "pages/bed_page.h"
 
-#include "pages/resistance_unit.h"
+#include "pages/resistance_formula.h"
 #include "ui_bed_page.h"
 
 CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
@@ -13,7 +13,10 @@ CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
     const auto unit = [&globals] { return ResistanceUnit(globals.resist_num); };
 
     using G = HD_Global_Var;
-    Bind(m_ui->formula_1300, &G::resist_num);
+    Bindings().Add(m_ui->formula_1300, globals.resist_num, [this](std::int32_t chosen) {
+        StoreToDocument(); // what is typed is meant in the formula that stood there
+        SwitchResistanceFormula(*GetDocument(), chosen, *m_ui->formula_1300);
+    });
     Bind({m_ui->uniform_1301, m_ui->zones_1302}, &G::ResisZone);
     Bind(m_ui->resistance_1303, &G::G_resistance, {.unitText = unit, .unitLabel = m_ui->unit_1303});
     Bind(m_ui->zone_1304, &G::ZoneResistance1, {.unitText = unit, .unitLabel = m_ui->unit_1304});
@@ -27,6 +30,8 @@ CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
     // The values of the approach not in use are kept.
     const auto column = [&](Str caption, const double& global, bool ofZones) {
         return ColumnOptions{.caption = caption,
+                             .format = SignificantDigits,
+                             .asFormatted = true,
                              .fill = &global,
                              .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
                              .unitText = unit};

@@ -1,7 +1,19 @@
 #include "pages/bed_toolbox_page.h"
 
-#include "pages/resistance_unit.h"
+#include "pages/resistance_formula.h"
 #include "ui_bed_toolbox_page.h"
+
+namespace {
+
+enum Method
+{
+    NotUsed,
+    Coefficients,
+    Table,
+    MethodCount
+};
+
+} // namespace
 
 CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document, QWidget* parent)
     : CLocationPage(document, &HD_Parameters::BedResistanceToolboxList, parent),
@@ -14,22 +26,55 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document, QWidget* parent)
     Bindings().Add(m_ui->zone1_1311, tools.Option1);
     Bindings().Add(m_ui->zone2_1312, tools.Option2);
     Bindings().Add(m_ui->zone3_1313, tools.Option3);
+    // A method that nobody knows may use anything.
+    const auto uses = [&tools](Method method) { return tools.Method == method || tools.Method >= MethodCount; };
+    Bindings().EnableWhen([&tools] { return tools.Method != NotUsed; },
+                          {m_ui->zonesLabel, m_ui->zone1_1311, m_ui->zone2_1312, m_ui->zone3_1313});
+    Bindings().EnableWhen([uses] { return uses(Coefficients); },
+                          {m_ui->coefALabel, m_ui->coefA_1314, m_ui->coefBLabel, m_ui->coefB_1315, m_ui->minLabel,
+                           m_ui->minRes_1316, m_ui->unit_1316, m_ui->maxLabel, m_ui->maxRes_1317, m_ui->unit_1317,
+                           m_ui->formulaLabel});
     Bindings().Add(m_ui->coefA_1314, tools.CoefA);
     Bindings().Add(m_ui->coefB_1315, tools.CoefB);
     Bindings().Add(m_ui->minRes_1316, tools.MinRes, {.unitText = unit, .unitLabel = m_ui->unit_1316});
     Bindings().Add(m_ui->maxRes_1317, tools.MaxRes, {.unitText = unit, .unitLabel = m_ui->unit_1317});
 
+    const auto lockUnless = [uses](Method method) { return [uses, method](const void*) { return !uses(method); }; };
+    const auto coefficient = [&](Str caption, const double& global) {
+        return ColumnOptions{.caption = caption,
+                             .width = 60,
+                             .format = SignificantDigits,
+                             .asFormatted = true,
+                             .fill = &global,
+                             .locked = lockUnless(Coefficients)};
+    };
+    const auto explained = [&](ColumnOptions options) {
+        options.hint = [] { return LoadString(Str::CoefFormula); };
+        return options;
+    };
+    const auto bound = [&](Str caption, const double& global) {
+        ColumnOptions options = coefficient(caption, global);
+        options.unitText = unit;
+        return options;
+    };
     using R = HDBedResTool;
     Grid(m_ui->grid_1319)
         .BranchName({.width = 110})
         .Chainage({})
-        .Value(&R::CoefA, {.caption = Str::CoefA, .width = 60, .fill = &tools.CoefA})
-        .Value(&R::CoefB, {.caption = Str::CoefB, .width = 60, .fill = &tools.CoefB})
-        .Value(&R::MinRes, {.caption = Str::MinRes, .width = 60, .fill = &tools.MinRes, .unitText = unit})
-        .Value(&R::MaxRes, {.caption = Str::MaxRes, .width = 60, .fill = &tools.MaxRes, .unitText = unit});
+        .Value(&R::CoefA, explained(coefficient(Str::CoefA, tools.CoefA)))
+        .Value(&R::CoefB, explained(coefficient(Str::CoefB, tools.CoefB)))
+        .Value(&R::MinRes, bound(Str::MinRes, tools.MinRes))
+        .Value(&R::MaxRes, bound(Str::MaxRes, tools.MaxRes));
+    const auto step = [&](Str caption) {
+        return ColumnOptions{
+            .caption = caption, .format = SignificantDigits, .asFormatted = true, .locked = lockUnless(Table)};
+    };
+    ColumnOptions resistance = step(Str::Resistance);
+    resistance.unitText = unit;
     for (GridColumns pairs : {PairsGrid(m_ui->pairs_1318, tools.VeloRes), PairsGrid(m_ui->linePairs_1320, &R::VeloRes)})
-        pairs.Value(VelocityResistances.elements[0], {.caption = Str::Velocity})
-            .Value(VelocityResistances.elements[1], {.caption = Str::Resistance, .unitText = unit});
+        pairs.Value(VelocityResistances.elements[0], step(Str::Velocity))
+            .Value(VelocityResistances.elements[1], resistance);
+    m_ui->formulaLabel->setText(LoadString(Str::CoefFormula));
 }
 
 CBedToolboxPage::~CBedToolboxPage() = default;
@@ -37,4 +82,5 @@ CBedToolboxPage::~CBedToolboxPage() = default;
 void CBedToolboxPage::Retranslate()
 {
     m_ui->retranslateUi(this);
+    m_ui->formulaLabel->setText(LoadString(Str::CoefFormula));
 }

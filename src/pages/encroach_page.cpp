@@ -9,6 +9,41 @@ namespace {
 
 constexpr std::size_t NewSetupLines = 2; // a set-up is saved when its second line is filled
 
+enum Method
+{
+    FixedPositions = 1,
+    FixedWidth,
+    ConveyanceReduction,
+    TargetLevel,
+    TargetLevelAndEnergy
+};
+enum Reduction
+{
+    BankByBank = 3
+};
+
+/// Whether the method of a line uses the field. Choices that nobody knows may use anything.
+bool IsUsed(std::string_view field, const HDEncroach& line)
+{
+    const std::int32_t method = line.EncOption1;
+    const bool isKnown = method >= FixedPositions && method <= TargetLevelAndEnergy;
+    if (!isKnown || field == "EncOption1" || field == "EncOption2")
+        return true;
+    if (field == "EncValues1.1" || field == "EncValues1.2") // offsets
+        return method != FixedPositions;
+    if (field == "EncValues1.3" || field == "EncValues1.4") // positions
+        return method == FixedPositions;
+    if (field == "EncValues1.5") // width
+        return method == FixedWidth;
+    if (field == "EncOption3") // how a reduction is shared
+        return method >= ConveyanceReduction;
+    if (field == "EncValues2.1") // total reduction
+        return method == ConveyanceReduction && line.EncOption3 != BankByBank;
+    if (field == "EncValues2.2" || field == "EncValues2.3") // of the banks
+        return method == ConveyanceReduction && (line.EncOption3 < 1 || line.EncOption3 >= BankByBank);
+    return method == TargetLevelAndEnergy || (method == TargetLevel && field == "EncValues2.4");
+}
+
 } // namespace
 
 CEncroachPage::CEncroachPage(CKavo0_hdDoc* document, QWidget* parent)
@@ -55,6 +90,13 @@ void CEncroachPage::DeclareColumns()
     for (const Field& field : HDEncroach::DeclaredFields()) {
         ColumnOptions options{
             .header = [number] { return LoadString(Str::EncroachColumns).split(u'\n')[number]; },
+            .format = SignificantDigits,
+            .asFormatted = true,
+            .locked =
+                [name = field.name](const void* row) {
+                    const auto* record = static_cast<const HD_RiverPos*>(row);
+                    return !IsUsed(name, *static_cast<const HDEncroach*>(record));
+                },
             .hint =
                 [name = field.name] {
                     return LoadString(Str::StoredAs).arg(QString::fromLatin1(name.data(), name.size()));

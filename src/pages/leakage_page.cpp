@@ -18,7 +18,7 @@ CLeakagePage::CLeakagePage(CKavo0_hdDoc* document, QWidget* parent)
         .BranchName({.width = 100})
         .Chainage({.width = 72})
         .Value(&HDLeakage::LeakageCoefficient,
-               {.caption = Str::LeakageCoef, .width = 82, .format = "%.6lg", .asFormatted = true});
+               {.caption = Str::LeakageCoef, .width = 82, .format = SignificantDigits, .asFormatted = true});
 }
 
 CLeakagePage::~CLeakagePage() = default;

@@ -12,7 +12,7 @@ CLossPage::CLossPage(CKavo0_hdDoc* document, QWidget* parent)
     for (const Field& field : HD_Waterloss::DeclaredFields())
         columns.Value(field, {.header = [n = ++number] { return LoadString(Str::WaterLossNumber).arg(n); },
                               .width = 82,
-                              .format = "%.6lg",
+                              .format = SignificantDigits,
                               .asFormatted = true});
 }
 

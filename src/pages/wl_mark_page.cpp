@@ -96,7 +96,7 @@ void CWLMarkPage::ShowLevelColumns()
     model.RemoveColumnsFrom(LocationColumns + int(titles.size()));
     GridColumns columns(*GetGrid());
     for (auto title = std::size_t(model.columnCount() - LocationColumns); title < titles.size(); ++title)
-        columns.Value(LevelAccess(title), FieldKind::Number, UnitGroup::None,
+        columns.Value(LevelAccess(title), FieldKind::Number, UnitGroup::WaterLevel,
                       {.header = [&titles, title] { return QString::fromStdString(titles[title]); },
                        .width = 62,
                        .emptyIsNotGiven = true});

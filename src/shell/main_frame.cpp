@@ -156,6 +156,7 @@ void CMainFrame::ReadSettings()
     ShowTabs(settings.value(Settings::Tabs, true).toBool());
     const bool usCustomary = settings.value(Settings::UsCustomary, false).toBool();
     KsUnits::Instance().SetSystem(usCustomary ? KsUnitSystem::UsCustomary : KsUnitSystem::Metric);
+    KsUnits::Instance().SetAllDigits(settings.value(Settings::AllDigits, false).toBool());
 }
 
 /// Document windows as tabs, or as windows inside the frame.
@@ -173,5 +174,6 @@ void CMainFrame::WriteSettings() const
     settings.setValue(Settings::Geometry, saveGeometry());
     settings.setValue(Settings::State, saveState());
     settings.setValue(Settings::UsCustomary, KsUnits::Instance().System() == KsUnitSystem::UsCustomary);
+    settings.setValue(Settings::AllDigits, KsUnits::Instance().AllDigits());
     settings.setValue(Settings::Language, KsLanguage::Instance().Current());
 }

@@ -73,6 +73,7 @@ private:
     void OnPaste();
     void OnMetric();
     void OnUsCustomary();
+    void OnAllDigits();
     void OnCascade();
     void OnTile();
     void OnSideBySide();

@@ -23,6 +23,11 @@ void CMainFrame::OnUsCustomary()
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
 }
 
+void CMainFrame::OnAllDigits()
+{
+    KsUnits::Instance().SetAllDigits(Action("actionAllDigits")->isChecked());
+}
+
 void CMainFrame::OnCascade()
 {
     MdiArea().cascadeSubWindows();
@@ -115,7 +120,11 @@ QString CMainFrame::HelpFile() const
 
 void CMainFrame::OnContents()
 {
-    QDesktopServices::openUrl(QUrl::fromLocalFile(HelpFile()));
+    const QString file = HelpFile();
+    if (file.isEmpty())
+        SendCommand(KsCommand::Help); // an editor without a help file may have something to say
+    else
+        QDesktopServices::openUrl(QUrl::fromLocalFile(file));
 }
 
 void CMainFrame::OnPlugins()

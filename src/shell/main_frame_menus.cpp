@@ -79,6 +79,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {EditMenu, "actionCopy", QT_TR_NOOP("&Copy"), QT_TR_NOOP("Copies the selection to the clipboard"), &F::OnCopy, K::Copy, nullptr, ShownOnly},
         {EditMenu, "actionPaste", QT_TR_NOOP("&Paste"), QT_TR_NOOP("Puts in what is on the clipboard"), &F::OnPaste, K::Paste, nullptr, ShownOnly},
         {ViewMenu, "actionUnits", QT_TR_NOOP("&Units"), QT_TR_NOOP("Units in which values are shown; files are not affected")},
+        {ViewMenu, "actionAllDigits", QT_TR_NOOP("All &Digits"), QT_TR_NOOP("Shows every digit of the numbers in tables and fields"), &F::OnAllDigits},
         {ViewMenu, "actionLanguage", QT_TR_NOOP("&Language"), QT_TR_NOOP("Language of the program")},
         {ViewMenu, "actionToolBars", QT_TR_NOOP("&Tool Bars"), QT_TR_NOOP("Shows or hides tool bars")},
         {ViewMenu, "actionProjectTree", QT_TR_NOOP("&Project"), QT_TR_NOOP("Shows or hides the files of the project"), &F::OnProjectTree},
@@ -149,6 +150,7 @@ void CMainFrame::CreateActions()
     }
     Action("actionTabs")->setCheckable(true);
     Action("actionProjectTree")->setCheckable(true);
+    Action("actionAllDigits")->setCheckable(true);
     Action("actionExit")->setMenuRole(QAction::QuitRole);
     Action("actionAbout")->setMenuRole(QAction::AboutRole);
 }
@@ -255,10 +257,13 @@ void CMainFrame::UpdateActions()
     Action("actionProjectTree")->setEnabled(!m_projects.All().empty());
     Action("actionProjectTree")->setChecked(m_projectTree->isVisible());
     Action("actionOpenRecent")->setEnabled(!m_recent.Files().isEmpty());
+    Action("actionAllDigits")->setChecked(KsUnits::Instance().AllDigits());
     const bool usCustomary = KsUnits::Instance().System() == KsUnitSystem::UsCustomary;
     Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);
     m_actions.at(QStringLiteral("actionLanguage_") + KsLanguage::Instance().Current())->setChecked(true);
-    Action("actionContents")->setVisible(!HelpFile().isEmpty());
+    const auto* target = dynamic_cast<CCommandTarget*>(GetActiveView());
+    Action("actionContents")
+        ->setVisible(!HelpFile().isEmpty() || (target && target->IsCommandEnabled(KsCommand::Help)));
 }
 
 // ---- menus filled as they open -----------------------------------------------------------------

@@ -9,5 +9,6 @@ inline constexpr char HiddenBars[] = "window/hiddenToolBars";
 inline constexpr char RecentFiles[] = "files/recent";
 inline constexpr char LastFolder[] = "files/folder";
 inline constexpr char UsCustomary[] = "units/usCustomary";
+inline constexpr char AllDigits[] = "numbers/allDigits";
 inline constexpr char Language[] = "language";
 } // namespace Settings

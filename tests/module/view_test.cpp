@@ -8,7 +8,9 @@
 #include "module/sheet.h"
 #include "module/view.h"
 #include "pages/framework/gen_grid.h"
+#include "pages/framework/grid_keys.h"
 #include "pages/framework/page.h"
+#include "pages/framework/page_help.h"
 
 #include <QApplication>
 #include <QClipboard>
@@ -92,6 +94,47 @@ TEST_F(ViewTest, TheStatusBarShowsTheLineOfThePageInFront)
     EXPECT_EQ(status(), "");
     ASSERT_TRUE(view->Sheet()->SetActivePage(0));
     EXPECT_EQ(status(), second);
+}
+
+TEST_F(ViewTest, TheStatusBarFollowsPastesUndoAndTheCurrentCell)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    const auto status = [bar = frame.statusBar()] { return bar->currentMessage(); };
+    CGenGrid& grid = *view->ActivePage()->GetGrid();
+    grid.setFocus();
+    grid.SetCurrentCell(2, 1);
+    EXPECT_EQ(status(), "Line 2 of 3");
+    QApplication::clipboard()->setText("A\t1.25\t1\t1\nB\t2\t1\t1\nC\t3\t1\t1");
+    QTest::keyClick(&grid, Qt::Key_V, Qt::ControlModifier);
+    EXPECT_EQ(status(), "Line 2 of 4");
+    QTest::keyClick(&grid, Qt::Key_Tab);
+    EXPECT_EQ(status(), "Line 2 of 4, Chainage: 1.25 m");
+    KsUnits::Instance().SetAllDigits(true);
+    EXPECT_EQ(status(), "Line 2 of 4") << "the cell tells it all";
+    KsUnits::Instance().SetAllDigits(false);
+    QTest::keyClick(&grid, Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_TRUE(status().startsWith("Line 2 of 3")) << status().toStdString();
+    QTest::keyClick(&grid, Qt::Key_Y, Qt::ControlModifier);
+    EXPECT_TRUE(status().startsWith("Line 4 of 4")) << "where the last line came in again";
+}
+
+TEST_F(ViewTest, TheHelpCommandReachesThePage)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    EXPECT_TRUE(view->IsCommandEnabled(KsCommand::Help));
+    EXPECT_TRUE(frame.SendCommand(KsCommand::Help));
+    const auto windows = QApplication::topLevelWidgets();
+    const auto help = std::find_if(windows.begin(), windows.end(),
+                                   [](const QWidget* w) { return w->inherits("QWhatsThat") && w->isVisible(); });
+    ASSERT_NE(help, windows.end());
+    QTest::keyClick(*help, Qt::Key_Escape);
+    const QString tables = PageHelpText(true);
+    for (const GridKey& key : GridKeys())
+        EXPECT_TRUE(tables.contains(LoadString(key.description).toHtmlEscaped()));
+    EXPECT_TRUE(tables.contains("Ctrl+Ins")) << tables.toStdString();
+    EXPECT_FALSE(PageHelpText(false).contains("Ctrl+Ins"));
 }
 
 TEST_F(ViewTest, APageIsNeverSmallerThanWhatItShows)

@@ -63,8 +63,7 @@ TEST_F(EncroachPageTest, EveryFieldHasItsColumn)
     EXPECT_EQ(Headers().join('|'), "River Name|Chainage|Method|Banks|Left offset|Right offset|Left position|"
                                    "Right position|Width|Reduction|Total reduction|Left reduction|Right reduction|"
                                    "Target level|Target energy");
-    EXPECT_EQ(Texts(1), "A|1|2 Fixed width|6|0.000|1.000|2.000|3.000|4.000|1 Equal on both banks|10.000|11.000|"
-                        "12.000|13.000|14.000");
+    EXPECT_EQ(Texts(1), "A|1|2 Fixed width|6|0|1|2|3|4|1 Equal on both banks|10|11|12|13|14");
     int column = 2;
     for (const Field& field : HDEncroach::DeclaredFields())
         EXPECT_TRUE(grid->model()
@@ -73,9 +72,37 @@ TEST_F(EncroachPageTest, EveryFieldHasItsColumn)
                         .contains(QString::fromStdString(std::string(field.name))));
     Enter(1, 3, "5");
     EXPECT_EQ(line.EncOption1, 5) << "the numbers in front of the entries choose them";
-    Enter(1, 13, "0.5");
-    EXPECT_EQ(line.EncValues2[2], 0.5);
+    Enter(1, 14, "0.5");
+    EXPECT_EQ(line.EncValues2[3], 0.5);
     EXPECT_EQ(line.EncOption2, 6);
+}
+
+TEST_F(EncroachPageTest, TheMethodLocksWhatItDoesNotUse)
+{
+    AddSetup({"A", "B"});
+    HDEncroach& line = setups.GetAt(0).GetAt(0);
+    Open<CEncroachPage>();
+    const struct
+    {
+        int method, reduction;
+        const char* open; // of the thirteen columns after name and chainage
+    } cases[] = {{1, 1, "**--**-------"}, {2, 1, "****--*------"}, {3, 1, "****---**----"}, {3, 3, "****---*-**--"},
+                 {4, 1, "****---*---*-"}, {5, 3, "****---*---**"}, {9, 1, "*************"}};
+    for (const auto& c : cases) {
+        line.EncOption1 = c.method;
+        line.EncOption3 = c.reduction;
+        QString open;
+        for (int column = 2; column < 15; ++column)
+            open += grid->model()->index(0, column).flags() & Qt::ItemIsEditable ? '*' : '-';
+        EXPECT_EQ(open, c.open) << c.method << " " << c.reduction;
+    }
+    const auto tip = [this](int column) {
+        return grid->model()->headerData(column - 1, Qt::Horizontal, Qt::ToolTipRole).toString();
+    };
+    for (int column : {5, 6, 7, 8, 9, 14, 15})
+        EXPECT_TRUE(tip(column).endsWith("Unit: m")) << column;
+    for (int column : {11, 12, 13})
+        EXPECT_FALSE(tip(column).contains("Unit")) << column;
 }
 
 TEST_F(EncroachPageTest, StepAddDuplicateDelete)

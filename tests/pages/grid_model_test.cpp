@@ -117,7 +117,7 @@ TEST_F(ModelTest, StoringTouchesOnlyTheCell)
     EXPECT_EQ(Bits(init), before);
 }
 
-TEST_F(ModelTest, TwoStepTexts)
+TEST_F(ModelTest, TextsOfNumbers)
 {
     struct
     {
@@ -128,7 +128,9 @@ TEST_F(ModelTest, TwoStepTexts)
     } const cases[] = {
         {1234.5, "%-lf", Control::Chainage, "1234", "1234.5"}, // half to even, as the platform rounds
         {1500.6, "%-lf", Control::Chainage, "1501", "1500.6"},
-        {1234567.891, "%.6lg", Control::Number, "1234570.000", "1234567.891"},
+        {1234567.891, "%.6lg", Control::Number, "1234567.891", "1234567.891"},
+        {1211.6568, "%.6lg", Control::Number, "1211.657", "1211.6568"}, // no zeros that nobody typed
+        {0.0325, "%.6lg", Control::Formatted, "0.0325", "0.0325"},
         {0.1 + 0.2, "%.6lg", Control::Number, "0.300", "0.30000000000000004"},
         {1e-7, "%-lf", Control::Number, "0.000", "1e-07"},
         {NotGiven, "%-lf", Control::Number, "10000000000.000", "10000000000"},
@@ -179,9 +181,9 @@ TEST_F(ModelTest, LockedCells)
         {
             auto* table = new CGenGrid;
             (new QVBoxLayout(this))->addWidget(table);
-            Grid(table).BranchName({}).Chainage({}).Value(
-                &HD_Initial::InitialH,
-                {.locked = [](const void* row) { return static_cast<const HD_RiverPos*>(row)->RiverName == "FIXED"; }});
+            Grid(table).BranchName({}).Chainage({}).Value(&HD_Initial::InitialH, {.locked = [](const void* row) {
+                return static_cast<const HD_RiverPos*>(row)->RiverName == "FIXED";
+            }});
         }
     };
     Add("FIXED", 1, 2);

@@ -20,6 +20,7 @@ protected:
     }
     void OpenToolbox()
     {
+        globals.BedResist.Method = 2; // the table
         Open<CBedToolboxPage>();
         global = Find<CGenGrid>(1318);
         line = Find<CGenGrid>(1320);
@@ -94,7 +95,7 @@ TEST_F(PairsGridTest, FollowsTheCurrentLine)
     EXPECT_EQ(rows(), 2);
     grid->SetCurrentCell(2, 3);
     EXPECT_EQ(rows(), 1);
-    EXPECT_EQ(line->TextAt(1, 2), "30.000");
+    EXPECT_EQ(line->TextAt(1, 2), "30");
     line->SetCurrentCell(1, 2);
     TypeCells(line, {"31", "3"}); // the second line's first cell
     grid->setFocus();

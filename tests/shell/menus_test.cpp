@@ -12,6 +12,10 @@ TEST_F(ShellTest, MnemonicsAreUniqueInEveryMenuAndShortcutsInTheWindow)
         menus << action->menu();
     ASSERT_EQ(menus.size(), 6);
     EXPECT_EQ(menus.at(2)->title(), "&Lines") << "the third by position";
+    QString bar;
+    for (const QMenu* menu : menus)
+        bar += QKeySequence::mnemonic(menu->title()).toString().right(1);
+    EXPECT_EQ(bar, "FELVWH") << "the letters that the editors' pages leave free";
     for (QMenu* menu : menus) {
         std::set<QChar> letters;
         for (const QAction* action : menu->actions()) {

@@ -11,9 +11,9 @@
 #include <QToolBar>
 #include <vector>
 
-/// Numbers of the commands that the main frame's Edit menu hands to whatever has the focus (CCommandTarget).
+/// Numbers of the commands that the main frame's Edit and Help menus hand to whatever has the focus (CCommandTarget).
 namespace KsCommand {
-inline constexpr int Copy = 57634, Cut = 57635, Paste = 57637;
+inline constexpr int Copy = 57634, Cut = 57635, Paste = 57637, Help = 57670;
 } // namespace KsCommand
 
 /// A command of a view in the frame's "Lines" menu. Without a text it is a separator.

@@ -20,10 +20,17 @@ QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
 QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent,
                                          const CString& details)
 {
+    return KsMessageBox(text, buttons, QMessageBox::NoButton, parent);
+}
+
+QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons,
+                                         QMessageBox::StandardButton defaultButton, QWidget* parent)
+{
     if (const auto handler = Handler())
         return handler(text, buttons);
     QMessageBox box(IconFor(buttons), QCoreApplication::applicationName(), text, buttons,
                     parent ? parent : QApplication::activeWindow());
+    box.setDefaultButton(defaultButton);
     box.setTextFormat(Qt::PlainText); // file names may hold anything
     box.setInformativeText(details);
     if (auto* label = box.findChild<QLabel*>(QStringLiteral("qt_msgbox_informativelabel")))

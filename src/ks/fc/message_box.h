@@ -15,6 +15,10 @@ KS_API QMessageBox::StandardButton KsMessageBox(const CString& text,
                                                 QMessageBox::StandardButtons buttons = QMessageBox::Ok,
                                                 QWidget* parent = nullptr, const CString& details = {});
 
+/// Likewise; Enter presses `defaultButton`.
+KS_API QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons,
+                                                QMessageBox::StandardButton defaultButton, QWidget* parent);
+
 using KsMessageBoxHandler =
     std::function<QMessageBox::StandardButton(const CString& text, QMessageBox::StandardButtons buttons)>;
 /// Answers message boxes instead of the user; an empty handler gives them back to the user. Returns the old one.

@@ -3,6 +3,7 @@
 #include <QApplication>
 #include <QLibraryInfo>
 #include <QTranslator>
+#include <algorithm>
 #include <map>
 #include <memory>
 
@@ -78,6 +79,20 @@ void KsLangFreeResDll(KsResourceHandle handle)
 QFont KsLangGetUserFont()
 {
     return QApplication::font();
+}
+
+QLocale KsLangGetUserLocale()
+{
+    const QLocale system;
+    const QLocale program(KsLanguage::Instance().Current());
+    const auto languages = KsLanguage::Available();
+    // Who has German forms and reads the program in English wants the German forms; Japanese was chosen.
+    const bool isChosen = program.language() != QLocale::English ||
+                          std::any_of(languages.begin(), languages.end(), [&system](const QString& code) {
+                              return QLocale(code).language() == system.language();
+                          });
+    const bool isForeign = system.language() != program.language() && (isChosen || system.language() == QLocale::C);
+    return isForeign ? program : system;
 }
 
 KsLanguage::KsLanguage()

@@ -5,6 +5,7 @@
 #include "ks/ks_export.h"
 
 #include <QFont>
+#include <QLocale>
 #include <QObject>
 #include <QStringList>
 
@@ -18,6 +19,10 @@ KS_API KsResourceHandle KsLangLoadResDll(const char* name, KsResourceHandle* han
 KS_API void KsLangFreeResDll(KsResourceHandle handle);
 /// The user's interface font.
 KS_API QFont KsLangGetUserFont();
+
+/// How dates and times are written: the system's forms as long as they are in the program's language, or in one that
+/// the program has not; else those of the program's language.
+KS_API QLocale KsLangGetUserLocale();
 
 /// The language of the program: "en_US" (the texts in the sources), "en_GB" or "ja".
 class KS_API KsLanguage : public QObject

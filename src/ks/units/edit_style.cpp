@@ -3,7 +3,9 @@
 #include "ks/units/unit_groups.h"
 
 #include <QCoreApplication>
+#include <QLocale>
 #include <cmath>
+#include <limits>
 
 namespace {
 constexpr double NotGiven = 1e10; // a value that has not been entered, in whatever unit
@@ -21,6 +23,14 @@ void KsUnits::SetSystem(KsUnitSystem system)
         return;
     m_system = system;
     emit Changed();
+}
+
+void KsUnits::SetAllDigits(bool all)
+{
+    if (all == m_allDigits)
+        return;
+    m_allDigits = all;
+    emit DigitsChanged();
 }
 
 void CKsEditStyle::SetEumUnitBaseGroup(UnitGroup group, int unit)
@@ -45,6 +55,27 @@ double CKsEditStyle::UnitConvertFromBase(double value, int flag) const
 CString CKsEditStyle::UnitConvertFromBase_T(double value, int flag) const
 {
     return KsFormatNumber(m_format, UnitConvertFromBase(value, flag));
+}
+
+CString CKsEditStyle::FullText(double value) const
+{
+    return KsShortestNumber(UnitConvertFromBase(value, 1));
+}
+
+CString CKsEditStyle::ShownText(double value) const
+{
+    return KsUnits::Instance().AllDigits() ? FullText(value) : UnitConvertFromBase_T(value, 1);
+}
+
+bool CKsEditStyle::HidesDigits(double value, const CString& shown) const
+{
+    constexpr double LastPlaces = 4 * std::numeric_limits<double>::epsilon();
+    const double full = UnitConvertFromBase(value, 1);
+    bool isNumber = false;
+    const double read = QLocale::c().toDouble(shown, &isNumber);
+    if (!isNumber || !std::isfinite(full) || read == full)
+        return false;
+    return Conversion().IsIdentity() || std::fabs(read - full) > LastPlaces * std::fabs(full);
 }
 
 CString CKsEditStyle::UnitSymbol() const

@@ -13,7 +13,7 @@ enum class KsUnitSystem
     UsCustomary
 };
 
-/// The user's unit system, for the whole program; emits Changed when it is switched.
+/// How the user wants numbers shown, for the whole program.
 class KS_API KsUnits : public QObject
 {
     Q_OBJECT
@@ -21,12 +21,19 @@ public:
     static KsUnits& Instance();
     KsUnitSystem System() const { return m_system; }
     void SetSystem(KsUnitSystem system);
+    /// Cells and fields show every digit of their numbers instead of those that their format leaves.
+    bool AllDigits() const { return m_allDigits; }
+    void SetAllDigits(bool all);
 signals:
+    /// The unit system was switched.
     void Changed();
+    /// AllDigits was switched; no text that is being typed is concerned.
+    void DigitsChanged();
 
 private:
     KsUnits() = default;
     KsUnitSystem m_system = KsUnitSystem::Metric;
+    bool m_allDigits = false;
 };
 
 /// Between a group's base unit and a display unit: base = display * toBase. No quantity of a group has an offset.
@@ -53,6 +60,13 @@ public:
     double UnitConvertFromBase(double value, int flag) const;
     /// The converted value as text in the style's format.
     CString UnitConvertFromBase_T(double value, int flag) const;
+    /// A base value in display units with every digit: reads back to the same number.
+    CString FullText(double value) const;
+    /// A base value as the user wants to see it: as UnitConvertFromBase_T has it, or in full (KsUnits::AllDigits).
+    CString ShownText(double value) const;
+    /// Whether `shown`, a text of a base value, leaves out some of its digits. What a conversion of units adds in the
+    /// last place of a double is none.
+    bool HidesDigits(double value, const CString& shown) const;
     /// "Unit: m", or empty for a quantity without unit.
     CString GetEumToolTipText() const;
     /// Symbol of the display unit ("ft³/s"), empty without one.

@@ -141,19 +141,26 @@ void CBindings::Add(QCheckBox* box, std::int32_t& flag)
 
 void CBindings::Add(QComboBox* box, std::int32_t& index)
 {
+    Add(box, index, [this, &index](std::int32_t chosen) { Store(index, chosen); });
+}
+
+void CBindings::Add(QComboBox* box, std::int32_t& index, std::function<void(std::int32_t chosen)> choose)
+{
     const int entries = box->count();
     box->setFocusPolicy(Qt::StrongFocus); // not by the wheel
     box->installEventFilter(this);
-    Add(box, &index, [box, entries, &index] {
+    const auto show = [box, entries, &index] {
         while (box->count() > entries)
             box->removeItem(entries);
         if (index < 0 || index >= entries)
             box->addItem(QString::number(index));
         box->setCurrentIndex(index >= 0 && index < entries ? index : entries);
-    });
-    connect(box, &QComboBox::activated, this, [this, entries, &index](int chosen) {
+    };
+    Add(box, &index, show);
+    connect(box, &QComboBox::activated, this, [entries, show, choose = std::move(choose)](int chosen) {
         if (chosen < entries)
-            Store(index, std::int32_t(chosen));
+            choose(std::int32_t(chosen));
+        show();
     });
 }
 

@@ -53,6 +53,8 @@ public:
     void Add(QCheckBox* box, std::int32_t& flag);
     /// By index of the entry. An index without an entry is kept, and shown as its number.
     void Add(QComboBox* box, std::int32_t& index);
+    /// Likewise; `choose` is what the user's choice of an entry does. The list then shows what the document has.
+    void Add(QComboBox* box, std::int32_t& index, std::function<void(std::int32_t chosen)> choose);
     /// Button n stands for the value n. Another value is kept, with no button pressed.
     void Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& value);
     /// A list that stands for no value: whatever is chosen, it shows its first entry when the page is shown afresh.

@@ -24,13 +24,32 @@ QString ShownText(const ColumnSpec& column, const CellValue& value)
     const auto* number = std::get_if<double>(&value);
     if (!number || IsEmpty(column, value))
         return EditText(column, value);
-    // Two steps: the style's format says how much of the number the page shows at all, the editor how it looks.
-    const QString styled = column.style.UnitConvertFromBase_T(*number, 1);
+    // Decimals are those of the number itself; cut to significant digits first, it would end in zeros that it has not.
     const int decimals = FindControl(column.control).decimals;
-    const auto read = ReadNumber(styled.toStdString());
-    if (decimals == AsFormatted || !read) // or no finite number
-        return styled;
-    return KsFormatNumber(QStringLiteral("%-.%1lf").arg(decimals), *read);
+    if (decimals == AsFormatted || KsUnits::Instance().AllDigits())
+        return column.style.ShownText(*number);
+    return KsFormatNumber(QStringLiteral("%-.%1lf").arg(decimals), column.style.UnitConvertFromBase(*number, 1));
+}
+
+bool HidesDigits(const ColumnSpec& column, const CellValue& value, const QString& shown)
+{
+    const auto* number = std::get_if<double>(&value);
+    return number && !IsEmpty(column, value) && column.style.HidesDigits(*number, shown);
+}
+
+QString FullText(const ColumnSpec& column, const CellValue& value)
+{
+    return NumberText(EditText(column, value), column.UnitSymbol());
+}
+
+QString CellToolTip(const ColumnSpec& column, const CellValue& value)
+{
+    if (column.Kind() == CellKind::Text)
+        return ShownText(column, value); // may be longer than its cell, a path in particular
+    const auto* number = std::get_if<double>(&value);
+    if (!number || IsEmpty(column, value))
+        return column.ToolTip(false);
+    return NumberToolTip(column.style, *number, ShownText(column, value), column.UnitSymbol());
 }
 
 QString EditText(const ColumnSpec& column, const CellValue& value)

@@ -1,6 +1,7 @@
 #include "pages/framework/column_spec.h"
 
 #include "data/river_pos.h"
+#include "res/strings.h"
 
 #include <QCoreApplication>
 #include <algorithm>
@@ -90,6 +91,20 @@ QString UnitToolTip(const QString& unit)
     return unit.isEmpty() ? QString() : QCoreApplication::translate("CKsEditStyle", "Unit: %1").arg(unit);
 }
 
+QString NumberText(const QString& number, const QString& unit)
+{
+    return unit.isEmpty() ? number : number + u' ' + unit;
+}
+
+QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit)
+{
+    const QString unitTip = UnitToolTip(unit);
+    if (!style.HidesDigits(value, shown))
+        return unitTip;
+    const QString full = LoadString(Str::FullValue).arg(NumberText(style.FullText(value), unit));
+    return unitTip.isEmpty() ? full : full + u'\n' + unitTip;
+}
+
 CellValue ColumnSpec::FillValue() const
 {
     return style.UnitConvertFromBase(*fill, 0);
@@ -125,9 +140,14 @@ CellValue ColumnSpec::NewLineValue() const
     return emptyIsNotGiven ? CellValue(NotGiven) : CellValue();
 }
 
+QString ColumnSpec::UnitSymbol() const
+{
+    return unitText ? unitText() : style.UnitSymbol();
+}
+
 QString ColumnSpec::ToolTip(bool isHeader) const
 {
-    const QString unitTip = unitText ? UnitToolTip(unitText()) : style.GetEumToolTipText();
+    const QString unitTip = UnitToolTip(UnitSymbol());
     if (!isHeader || !hint)
         return unitTip;
     return unitTip.isEmpty() ? hint() : hint() + u'\n' + unitTip;

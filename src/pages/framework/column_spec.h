@@ -39,6 +39,8 @@ enum class CellKind
 
 /// A number that is not being edited stands as the column's format has it.
 inline constexpr int AsFormatted = -1;
+/// A format for numbers of any magnitude: six digits that count, and no zeros to fill them up.
+inline constexpr const char* SignificantDigits = "%.6lg";
 
 /// The cell editors by number, in one table.
 struct GridControl
@@ -82,6 +84,10 @@ struct Choices
 
 /// "Unit: m"; empty for a quantity without unit.
 QString UnitToolTip(const QString& unit);
+/// "1500.6 m".
+QString NumberText(const QString& number, const QString& unit);
+/// The unit of a number and, where `shown` leaves some of its digits out, the whole number.
+QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit);
 
 /// What a column holds of a place that another editor sends, beside its branch and chainage.
 enum class LocationValue
@@ -117,6 +123,7 @@ struct ColumnSpec
     CellValue EmptyValue() const;
     /// What a new line holds; nothing where the record's own default stands.
     CellValue NewLineValue() const;
+    QString UnitSymbol() const;
     /// Unit of the cells, and on a header also what the column is.
     QString ToolTip(bool header) const;
 };

@@ -1,8 +1,13 @@
 #include "pages/framework/ctrl_edit.h"
 
 #include "pages/framework/column_spec.h"
+#include "pages/framework/digits_mark.h"
 #include "pages/framework/number_syntax.h"
 #include "res/strings.h"
+
+#include <QPainter>
+#include <QStyle>
+#include <algorithm>
 
 CCtrlEdit::CCtrlEdit(QWidget* parent)
     : QLineEdit(parent),
@@ -46,20 +51,27 @@ void CCtrlEdit::SetValue(double value)
 
 void CCtrlEdit::Show()
 {
-    setToolTip(UnitToolTip(UnitSymbol()));
     if (!hasFocus() || !m_typing->IsTyped())
         ShowValue();
+    else
+        UpdateToolTip(); // the unit may be another one
 }
 
 void CCtrlEdit::ShowValue()
 {
-    setToolTip(UnitToolTip(UnitSymbol()));
     if (!m_value) // the page has gone
         return;
-    const QString shown = m_style.UnitConvertFromBase_T(*m_value, 1);
-    if (text() != shown)
-        setText(shown);
+    m_shown = m_style.ShownText(*m_value);
+    setMaxLength(std::max(m_textLimit, int(m_shown.size()))); // a number is never cut
+    if (text() != m_shown)
+        setText(m_shown);
     m_typing->Shown();
+    UpdateToolTip();
+}
+
+void CCtrlEdit::UpdateToolTip()
+{
+    setToolTip(NumberToolTip(m_style, *m_value, m_shown, UnitSymbol()));
 }
 
 std::optional<double> CCtrlEdit::Typed() const
@@ -103,4 +115,14 @@ void CCtrlEdit::Store()
             *m_value = *value;
     }
     ShowValue();
+}
+
+void CCtrlEdit::paintEvent(QPaintEvent* event)
+{
+    QLineEdit::paintEvent(event);
+    if (!m_value || m_typing->IsTyped() || !m_style.HidesDigits(*m_value, m_shown))
+        return;
+    QPainter painter(this);
+    const int frame = style()->pixelMetric(QStyle::PM_DefaultFrameWidth, nullptr, this) + 1;
+    PaintDigitsMark(painter, rect().adjusted(frame, frame, -frame, -frame), palette());
 }

@@ -39,8 +39,12 @@ public:
     bool Commit() { return m_typing->Take(); }
     CTyping& Typing() const { return *m_typing; }
 
+protected:
+    void paintEvent(QPaintEvent* event) override;
+
 private:
     void ShowValue();
+    void UpdateToolTip();
     void Store();
     std::optional<double> Typed() const; // in base units; nothing for a text that is no number
     bool InRange(double value) const;
@@ -57,5 +61,6 @@ private:
     double m_minimum = 0, m_maximum = 0;
     std::function<void(double&, double)> m_store;
     std::function<QString()> m_unitText;
+    QString m_shown;   // the value as text
     CTyping* m_typing; // child
 };

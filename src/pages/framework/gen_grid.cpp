@@ -2,6 +2,7 @@
 
 #include "ks/language/language.h"
 #include "module/document.h"
+#include "pages/framework/cell_text.h"
 #include "pages/framework/grid_editors.h"
 #include "pages/framework/grid_keys.h"
 #include "pages/framework/page.h"
@@ -69,6 +70,7 @@ CGenGrid::CGenGrid(QWidget* parent)
     connect(selectionModel(), &QItemSelectionModel::selectionChanged, this,
             [this] { m_linesChosen = m_choosingLines; });
     connect(m_model, &CGridModel::CellModified, this, &CGenGrid::CellModified);
+    connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGenGrid::MakeRoomForDigits);
 }
 
 CGenGrid::~CGenGrid()
@@ -110,6 +112,19 @@ QString CGenGrid::TextAt(int row, int column) const
     return m_model->index(row - 1, column - 1).data().toString();
 }
 
+QString CGenGrid::LineText() const
+{
+    const int fixed = m_model->FixedRows();
+    const int row = CurrentRow() - fixed, column = CurrentColumn() - 1;
+    if (row <= 0 || column < 0 || CurrentRow() > int(m_model->Rows()->Count())) // the rows may be about to be synced
+        return {};
+    const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
+    const CellValue value = m_model->Value(row + fixed - 1, column);
+    if (!HidesDigits(spec, value, ShownText(spec, value)))
+        return LoadString(Str::LineOfLines).arg(row).arg(RowCount() - fixed);
+    return LoadString(Str::LineOfLinesValue).arg(row).arg(RowCount() - fixed).arg(spec.header(), FullText(spec, value));
+}
+
 void CGenGrid::UpdateRowHeader()
 {
     const int height = fontMetrics().height() + 8;
@@ -126,11 +141,24 @@ void CGenGrid::SetColumnWidths(int first)
     m_widthsSet = ColumnCount();
     for (int column = first; column < ColumnCount(); ++column) {
         const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
-        int text = fontMetrics().horizontalAdvance(spec.header());
-        for (int row = 0; row < std::min(RowCount(), RowsMeasured); ++row)
-            text = std::max(text, fontMetrics().horizontalAdvance(TextAt(row + 1, column + 1)));
-        setColumnWidth(column, std::max(int(spec.width * FontScale(*this)), std::min(text + 16, MostOfAWindow)));
+        setColumnWidth(column, std::max(int(spec.width * FontScale(*this)), WidthOfTexts(column, 0)));
     }
+}
+
+/// What the header and the texts of some rows need.
+int CGenGrid::WidthOfTexts(int column, int firstRow) const
+{
+    int text = fontMetrics().horizontalAdvance(m_model->Columns()[std::size_t(column)].header());
+    for (int row = firstRow; row < std::min(RowCount(), firstRow + RowsMeasured); ++row)
+        text = std::max(text, fontMetrics().horizontalAdvance(TextAt(row + 1, column + 1)));
+    return std::min(text + 16, MostOfAWindow);
+}
+
+/// All digits are of no use when the column elides them; what the user has made wider stays.
+void CGenGrid::MakeRoomForDigits()
+{
+    for (int column = 0; column < m_widthsSet; ++column)
+        setColumnWidth(column, std::max(columnWidth(column), WidthOfTexts(column, std::max(0, rowAt(0)))));
 }
 
 void CGenGrid::Reload()
@@ -185,6 +213,8 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
     if (!m_model->IsSyncing())
         StoreEditedLine();
     m_lastColumn = current.column() + 1;
+    if (Host() && !m_model->IsSyncing())
+        Host()->CurrentCellChanged();
     const int row = current.row() + 1;
     if (row == m_lastRow)
         return;
@@ -200,6 +230,13 @@ void CGenGrid::focusOutEvent(QFocusEvent* event)
     if (event->reason() != Qt::PopupFocusReason && event->reason() != Qt::ActiveWindowFocusReason &&
         !isAncestorOf(QApplication::focusWidget()))
         StoreEditedLine();
+}
+
+void CGenGrid::focusInEvent(QFocusEvent* event)
+{
+    QTableView::focusInEvent(event);
+    if (Host())
+        Host()->CurrentCellChanged();
 }
 
 void CGenGrid::mousePressEvent(QMouseEvent* event)

@@ -37,6 +37,9 @@ public:
     /// Makes a cell current and shows it. A row past the end is the last row.
     void SetCurrentCell(int row, int column);
     QString TextAt(int row, int column) const;
+    /// "Line 3 of 120", with the whole number of the current cell where the cell leaves digits out; empty without a
+    /// current line.
+    QString LineText() const;
 
     /// Column whose cells offer the branch names of the network; 0 for none.
     void SetBranchNameColumn(int column) { m_branchNameColumn = column; }
@@ -82,6 +85,7 @@ protected:
     bool event(QEvent* event) override;
     bool eventFilter(QObject* object, QEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
+    void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void contextMenuEvent(QContextMenuEvent* event) override;
     void mouseDoubleClickEvent(QMouseEvent* event) override;
@@ -102,6 +106,8 @@ private:
     void CellModified(int row, int column);
     void UpdateRowHeader();
     void SetColumnWidths(int first);
+    int WidthOfTexts(int column, int firstRow) const;
+    void MakeRoomForDigits();
 
     CGridModel* m_model;       // child
     CGridDelegate* m_delegate; // child

@@ -1,5 +1,7 @@
 #include "pages/framework/grid_editors.h"
 
+#include "pages/framework/cell_text.h"
+#include "pages/framework/digits_mark.h"
 #include "pages/framework/gen_grid.h"
 #include "pages/framework/grid_keys.h"
 #include "pages/framework/grid_model.h"
@@ -220,14 +222,27 @@ void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cel
     painter->drawText(x, y, text);
 }
 
+void CGridDelegate::PaintMark(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
+{
+    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
+    if (column.Kind() != CellKind::Number)
+        return;
+    const CellValue value = m_grid->Model()->Value(index.row(), index.column());
+    if (HidesDigits(column, value, ShownText(column, value)))
+        PaintDigitsMark(*painter, cell.rect, cell.palette, cell.state.testFlag(QStyle::State_Selected));
+}
+
 void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const
 {
     constexpr QStyle::State special = QStyle::State_Selected | QStyle::State_HasFocus | QStyle::State_MouseOver;
     const bool isText = !m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce();
-    if (isText && !(option.state & special) && option.direction == Qt::LeftToRight)
-        return PaintText(painter, option, index);
-    if (isText)
-        return QStyledItemDelegate::paint(painter, option, index);
+    if (isText) {
+        if (!(option.state & special) && option.direction == Qt::LeftToRight)
+            PaintText(painter, option, index);
+        else
+            QStyledItemDelegate::paint(painter, option, index);
+        return PaintMark(painter, option, index);
+    }
     QStyleOptionViewItem cell = option;
     initStyleOption(&cell, index);
     cell.features &= ~QStyleOptionViewItem::HasCheckIndicator; // drawn centred below

@@ -143,9 +143,7 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
     case Qt::AccessibleTextRole:
         return EditText(column, Value(index.row(), index.column()));
     case Qt::ToolTipRole:
-        // A text may be longer than its cell, a path in particular.
-        return column.Kind() == CellKind::Text ? ShownText(column, Value(index.row(), index.column()))
-                                               : column.ToolTip(false);
+        return CellToolTip(column, Value(index.row(), index.column()));
     case Qt::BackgroundRole:
         return IsLocked(index.row(), index.column()) ? QVariant(QGuiApplication::palette().brush(QPalette::Button))
                                                      : QVariant();

@@ -14,7 +14,7 @@ struct ColumnOptions
     Str caption = Str::RiverName;
     int width = 72;
     const char* format = "%-lf";
-    bool asFormatted = false;     // numbers stand in `format`, not with three decimals
+    bool asFormatted = false;     // numbers stand in `format`, not with the control's decimals
     const double* fill = nullptr; // see ColumnSpec
     bool emptyIsNotGiven = false;
     std::function<bool(const void* row)> locked = {}; // see ColumnSpec

@@ -3,10 +3,12 @@
 #include "module/document.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/gen_grid.h"
+#include "pages/framework/page_help.h"
 
 #include <QApplication>
 #include <QKeyEvent>
 #include <QUndoStack>
+#include <QWhatsThis>
 #include <algorithm>
 
 CGenPropertyPage::CGenPropertyPage(CKavo0_hdDoc* document, QWidget* parent)
@@ -91,6 +93,12 @@ std::unique_ptr<HD_RiverPos> CGenPropertyPage::GetRecordAt(int) const
 void CGenPropertyPage::OnGridCellModified(int, int) {}
 
 void CGenPropertyPage::OnGridButtonClicked(CGenGrid&, int, int) {}
+
+void CGenPropertyPage::OnHelp()
+{
+    const QPoint middle(width() / 3, height() / 4);
+    QWhatsThis::showText(mapToGlobal(middle), PageHelpText(m_grid || !m_partGrids.empty()), this);
+}
 
 void CGenPropertyPage::UndoRedo(bool undo)
 {

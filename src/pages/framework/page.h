@@ -55,6 +55,9 @@ public:
     /// A push button of `grid`, one of the page's.
     virtual void OnGridButtonClicked(CGenGrid& grid, int row, int column);
 
+    /// The help command: what the keys do on this page.
+    virtual void OnHelp();
+
     /// Takes what is being typed, then undoes or redoes one step of the document.
     void UndoRedo(bool undo);
 

@@ -23,6 +23,8 @@ public:
     /// The line just left was edited. `column` is the cell's column, or 1 for a page whose every column is a location.
     /// The active page is stored, a change of location is told to the project, and all views reload.
     virtual void EditedLineChanged(int column) = 0;
+    /// Another cell, or another grid, of the active page became the current one.
+    virtual void CurrentCellChanged() {}
     /// Another row of the active page's list became current.
     virtual void CurrentLocationChanged() = 0;
     /// Carries out one of the view's commands.

@@ -12,10 +12,6 @@
             <translation>Formula</translation>
         </message>
         <message>
-            <source>Resistance &amp;formula:</source>
-            <translation>Resistance &amp;formula:</translation>
-        </message>
-        <message>
             <source>Manning's M</source>
             <translation>Manning's M</translation>
         </message>
@@ -58,6 +54,10 @@
         <message>
             <source>Local Values</source>
             <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Re&amp;sistance formula:</source>
+            <translation>Re&amp;sistance formula:</translation>
         </message>
     </context>
     <context>
@@ -154,10 +154,6 @@
             <translation>&amp;Alpha:</translation>
         </message>
         <message>
-            <source>T&amp;heta:</source>
-            <translation>T&amp;heta:</translation>
-        </message>
-        <message>
             <source>E&amp;ps:</source>
             <translation>E&amp;ps:</translation>
         </message>
@@ -208,6 +204,10 @@
         <message>
             <source>(Energy - Not Avail.)</source>
             <translation>(Energy - Not Avail.)</translation>
+        </message>
+        <message>
+            <source>Theta:</source>
+            <translation>Theta:</translation>
         </message>
     </context>
     <context>
@@ -268,16 +268,16 @@
             <translation>&amp;Add</translation>
         </message>
         <message>
-            <source>Dup&amp;licate</source>
-            <translation>Dup&amp;licate</translation>
-        </message>
-        <message>
-            <source>D&amp;elete</source>
-            <translation>D&amp;elete</translation>
-        </message>
-        <message>
             <source>Lines of the set-up</source>
             <translation>Lines of the set-up</translation>
+        </message>
+        <message>
+            <source>&amp;Duplicate</source>
+            <translation>&amp;Duplicate</translation>
+        </message>
+        <message>
+            <source>Dele&amp;te</source>
+            <translation>Dele&amp;te</translation>
         </message>
     </context>
     <context>
@@ -388,28 +388,28 @@
             <translation>Global Values</translation>
         </message>
         <message>
-            <source>Water &amp;Level</source>
-            <translation>Water &amp;Level</translation>
-        </message>
-        <message>
             <source>Water &amp;Depth</source>
             <translation>Water &amp;Depth</translation>
         </message>
         <message>
-            <source>&amp;Water Level</source>
-            <translation>&amp;Water Level</translation>
-        </message>
-        <message>
-            <source>&amp;Water Depth</source>
-            <translation>&amp;Water Depth</translation>
-        </message>
-        <message>
-            <source>Disc&amp;harge:</source>
-            <translation>Disc&amp;harge:</translation>
-        </message>
-        <message>
             <source>Local Values</source>
             <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Wa&amp;ter Level</source>
+            <translation>Wa&amp;ter Level</translation>
+        </message>
+        <message>
+            <source>Wate&amp;r Level</source>
+            <translation>Wate&amp;r Level</translation>
+        </message>
+        <message>
+            <source>Water De&amp;pth</source>
+            <translation>Water De&amp;pth</translation>
+        </message>
+        <message>
+            <source>Di&amp;scharge:</source>
+            <translation>Di&amp;scharge:</translation>
         </message>
     </context>
     <context>
@@ -421,10 +421,6 @@
         <message>
             <source>Global values</source>
             <translation>Global values</translation>
-        </message>
-        <message>
-            <source>&amp;Water level (h1)</source>
-            <translation>&amp;Water level (h1)</translation>
         </message>
         <message>
             <source>&amp;Interface level (h0)</source>
@@ -442,6 +438,10 @@
             <source>Local values</source>
             <translation>Local values</translation>
         </message>
+        <message>
+            <source>Wate&amp;r level (h1)</source>
+            <translation>Wate&amp;r level (h1)</translation>
+        </message>
     </context>
     <context>
         <name>CKlrParamPage</name>
@@ -452,14 +452,6 @@
         <message>
             <source>&amp;Interface Friction Factor</source>
             <translation>&amp;Interface Friction Factor</translation>
-        </message>
-        <message>
-            <source>Maximum &amp;volume of entrainment</source>
-            <translation>Maximum &amp;volume of entrainment</translation>
-        </message>
-        <message>
-            <source>Maximum &amp;entrainment velocity</source>
-            <translation>Maximum &amp;entrainment velocity</translation>
         </message>
         <message>
             <source>Minimum layer &amp;thickness for entrainment cutoff</source>
@@ -508,6 +500,14 @@
         <message>
             <source>Local values</source>
             <translation>Local values</translation>
+        </message>
+        <message>
+            <source>&amp;Maximum volume of entrainment</source>
+            <translation>&amp;Maximum volume of entrainment</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum entrainment velocity</source>
+            <translation>Ma&amp;ximum entrainment velocity</translation>
         </message>
     </context>
     <context>
@@ -558,10 +558,6 @@
             <translation>Map output files</translation>
         </message>
         <message>
-            <source>Apply DEM input data for ground &amp;elevations</source>
-            <translation>Apply DEM input data for ground &amp;elevations</translation>
-        </message>
-        <message>
             <source>Input topography</source>
             <translation>Input topography</translation>
         </message>
@@ -578,8 +574,12 @@
             <translation>&amp;Map additional flooded areas using help grid from KVR GIS</translation>
         </message>
         <message>
-            <source>&amp;Help grid</source>
-            <translation>&amp;Help grid</translation>
+            <source>&amp;Apply DEM input data for ground elevations</source>
+            <translation>&amp;Apply DEM input data for ground elevations</translation>
+        </message>
+        <message>
+            <source>Hel&amp;p grid</source>
+            <translation>Hel&amp;p grid</translation>
         </message>
     </context>
     <context>
@@ -731,16 +731,8 @@
             <translation>&amp;Beta_Limit:</translation>
         </message>
         <message>
-            <source>&amp;Fac_0:</source>
-            <translation>&amp;Fac_0:</translation>
-        </message>
-        <message>
             <source>&amp;Qconv_Factor:</source>
             <translation>&amp;Qconv_Factor:</translation>
-        </message>
-        <message>
-            <source>&amp;Hconv_Factor:</source>
-            <translation>&amp;Hconv_Factor:</translation>
         </message>
         <message>
             <source>&amp;Min_Hconv_In_Branch:</source>
@@ -763,24 +755,12 @@
             <translation>&amp;Use energy equation</translation>
         </message>
         <message>
-            <source>Model contraction and expansion &amp;losses</source>
-            <translation>Model contraction and expansion &amp;losses</translation>
-        </message>
-        <message>
             <source>&amp;Allow upstream slope</source>
             <translation>&amp;Allow upstream slope</translation>
         </message>
         <message>
-            <source>&amp;Velocity distribution coefficient based on conveyance</source>
-            <translation>&amp;Velocity distribution coefficient based on conveyance</translation>
-        </message>
-        <message>
             <source>&amp;No suppression of convective terms</source>
             <translation>&amp;No suppression of convective terms</translation>
-        </message>
-        <message>
-            <source>Friction slope &amp;evaluation</source>
-            <translation>Friction slope &amp;evaluation</translation>
         </message>
         <message>
             <source>Default</source>
@@ -818,6 +798,26 @@
             <source>Load branch an&amp;d chainages</source>
             <translation>Load branch an&amp;d chainages</translation>
         </message>
+        <message>
+            <source>Fac_&amp;0:</source>
+            <translation>Fac_&amp;0:</translation>
+        </message>
+        <message>
+            <source>Hc&amp;onv_Factor:</source>
+            <translation>Hc&amp;onv_Factor:</translation>
+        </message>
+        <message>
+            <source>Model contraction and ex&amp;pansion losses</source>
+            <translation>Model contraction and ex&amp;pansion losses</translation>
+        </message>
+        <message>
+            <source>Velocit&amp;y distribution coefficient based on conveyance</source>
+            <translation>Velocit&amp;y distribution coefficient based on conveyance</translation>
+        </message>
+        <message>
+            <source>Fr&amp;iction slope evaluation</source>
+            <translation>Fr&amp;iction slope evaluation</translation>
+        </message>
     </context>
     <context>
         <name>CReachLengthPage</name>
@@ -830,8 +830,8 @@
             <translation>&amp;Use energy equation</translation>
         </message>
         <message>
-            <source>&amp;Load branch and chainages</source>
-            <translation>&amp;Load branch and chainages</translation>
+            <source>Load &amp;branch and chainages</source>
+            <translation>Load &amp;branch and chainages</translation>
         </message>
     </context>
     <context>
@@ -1007,10 +1007,6 @@
             <translation>&amp;Delimiter in output file</translation>
         </message>
         <message>
-            <source>&amp;Width of columns</source>
-            <translation>&amp;Width of columns</translation>
-        </message>
-        <message>
             <source>&amp;Minimum</source>
             <translation>&amp;Minimum</translation>
         </message>
@@ -1031,16 +1027,8 @@
             <translation>Time period in output</translation>
         </message>
         <message>
-            <source>&amp;Limited output period</source>
-            <translation>&amp;Limited output period</translation>
-        </message>
-        <message>
             <source>&amp;Start</source>
             <translation>&amp;Start</translation>
-        </message>
-        <message>
-            <source>&amp;End</source>
-            <translation>&amp;End</translation>
         </message>
         <message>
             <source>Items in output</source>
@@ -1066,13 +1054,21 @@
             <source>All ex&amp;cepted those from the list</source>
             <translation>All ex&amp;cepted those from the list</translation>
         </message>
+        <message>
+            <source>Width of col&amp;umns</source>
+            <translation>Width of col&amp;umns</translation>
+        </message>
+        <message>
+            <source>Limited output &amp;period</source>
+            <translation>Limited output &amp;period</translation>
+        </message>
+        <message>
+            <source>E&amp;nd</source>
+            <translation>E&amp;nd</translation>
+        </message>
     </context>
     <context>
         <name>CWLCurvePage</name>
-        <message>
-            <source>&amp;Enabling water level increment due to curve</source>
-            <translation>&amp;Enabling water level increment due to curve</translation>
-        </message>
         <message>
             <source>System Definition</source>
             <translation>System Definition</translation>
@@ -1082,28 +1078,32 @@
             <translation>Average &amp;Range</translation>
         </message>
         <message>
-            <source>&amp;Water Surface width</source>
-            <translation>&amp;Water Surface width</translation>
-        </message>
-        <message>
             <source>&amp;Curvature Radius</source>
             <translation>&amp;Curvature Radius</translation>
-        </message>
-        <message>
-            <source>&amp;Velocity</source>
-            <translation>&amp;Velocity</translation>
         </message>
         <message>
             <source>Values</source>
             <translation>Values</translation>
         </message>
         <message>
-            <source>&amp;Load Branch &amp;&amp; Chainage</source>
-            <translation>&amp;Load Branch &amp;&amp; Chainage</translation>
-        </message>
-        <message>
             <source>Water level increment due to curve</source>
             <translation>Water level increment due to curve</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to curve</source>
+            <translation>Enabling water level &amp;increment due to curve</translation>
+        </message>
+        <message>
+            <source>Water &amp;Surface width</source>
+            <translation>Water &amp;Surface width</translation>
+        </message>
+        <message>
+            <source>Veloci&amp;ty</source>
+            <translation>Veloci&amp;ty</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>Load &amp;Branch &amp;&amp; Chainage</translation>
         </message>
     </context>
     <context>
@@ -1119,10 +1119,6 @@
     </context>
     <context>
         <name>CWLSandBarsPage</name>
-        <message>
-            <source>&amp;Enabling water level increment due to sand bars</source>
-            <translation>&amp;Enabling water level increment due to sand bars</translation>
-        </message>
         <message>
             <source>Method</source>
             <translation>Method</translation>
@@ -1140,12 +1136,16 @@
             <translation>Values</translation>
         </message>
         <message>
-            <source>&amp;Load Branch &amp;&amp; Chainage</source>
-            <translation>&amp;Load Branch &amp;&amp; Chainage</translation>
-        </message>
-        <message>
             <source>Water level increment due to sand bars</source>
             <translation>Water level increment due to sand bars</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to sand bars</source>
+            <translation>Enabling water level &amp;increment due to sand bars</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>Load &amp;Branch &amp;&amp; Chainage</translation>
         </message>
     </context>
     <context>
@@ -1157,10 +1157,6 @@
         <message>
             <source>Global Value</source>
             <translation>Global Value</translation>
-        </message>
-        <message>
-            <source>&amp;Wave Approximation:</source>
-            <translation>&amp;Wave Approximation:</translation>
         </message>
         <message>
             <source>High Order Fully Dynamic</source>
@@ -1181,6 +1177,10 @@
         <message>
             <source>Local Values</source>
             <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Wave &amp;Approximation:</source>
+            <translation>Wave &amp;Approximation:</translation>
         </message>
     </context>
     <context>
@@ -1807,8 +1807,6 @@ Nothing was loaded.</translation>
         <message>
             <source>Reach Lengths</source>
             <translation>Reach Lengths</translation>
-            <source>%1 locations added, %2 were there already.</source>
-            <translation>%1 locations added, %2 were there already.</translation>
         </message>
         <message>
             <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
@@ -2229,6 +2227,56 @@ more parameters, or a smaller count</translation>
         <message>
             <source>C&amp;lose</source>
             <translation>C&amp;lose</translation>
+        </message>
+        <message>
+            <source>Full value: %1</source>
+            <translation>Full value: %1</translation>
+        </message>
+        <message>
+            <source>Line %1 of %2, %3: %4</source>
+            <translation>Line %1 of %2, %3: %4</translation>
+        </message>
+        <message>
+            <source>Resistance = a·(V·R)^b, between minimum and maximum. V is the velocity in m/s, R the hydraulic radius in m.</source>
+            <translation>Resistance = a·(V·R)^b, between minimum and maximum. V is the velocity in m/s, R the hydraulic radius in m.</translation>
+        </message>
+        <message>
+            <source>The formula changes from %1 to %2. Convert the values too (M = 1/n)?
+
+Yes changes %3 values, for example %4 to %5: the global values, all lines, and the coefficients, bounds and tables of the toolbox.
+No leaves every value as it is. Flood plain resistances stay as they are in any case.</source>
+            <translation>The formula changes from %1 to %2. Convert the values too (M = 1/n)?
+
+Yes changes %3 values, for example %4 to %5: the global values, all lines, and the coefficients, bounds and tables of the toolbox.
+No leaves every value as it is. Flood plain resistances stay as they are in any case.</translation>
+        </message>
+        <message>
+            <source>The formula changes from %1 to %2.
+
+Between the two no value can be converted without a hydraulic radius, so all %3 values stay as they are.</source>
+            <translation>The formula changes from %1 to %2.
+
+Between the two no value can be converted without a hydraulic radius, so all %3 values stay as they are.</translation>
+        </message>
+        <message>
+            <source>Conversion of resistances</source>
+            <translation>Conversion of resistances</translation>
+        </message>
+        <message>
+            <source>In a field</source>
+            <translation>In a field</translation>
+        </message>
+        <message>
+            <source>Takes what is typed</source>
+            <translation>Takes what is typed</translation>
+        </message>
+        <message>
+            <source>Takes back what is typed</source>
+            <translation>Takes back what is typed</translation>
+        </message>
+        <message>
+            <source>In a table</source>
+            <translation>In a table</translation>
         </message>
 </context>
 </TS>

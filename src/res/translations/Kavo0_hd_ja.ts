@@ -12,10 +12,6 @@
             <translation>抵抗則</translation>
         </message>
         <message>
-            <source>Resistance &amp;formula:</source>
-            <translation>抵抗則(&amp;F):</translation>
-        </message>
-        <message>
             <source>Manning's M</source>
             <translation>マニングのM(粗度係数の逆数)</translation>
         </message>
@@ -58,6 +54,10 @@
         <message>
             <source>Local Values</source>
             <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Re&amp;sistance formula:</source>
+            <translation>抵抗則(&amp;S):</translation>
         </message>
     </context>
     <context>
@@ -154,10 +154,6 @@
             <translation>Alpha(&amp;A):</translation>
         </message>
         <message>
-            <source>T&amp;heta:</source>
-            <translation>Theta(&amp;H):</translation>
-        </message>
-        <message>
             <source>E&amp;ps:</source>
             <translation>Eps(&amp;P):</translation>
         </message>
@@ -208,6 +204,10 @@
         <message>
             <source>(Energy - Not Avail.)</source>
             <translation>(エネルギー - 利用不可)</translation>
+        </message>
+        <message>
+            <source>Theta:</source>
+            <translation>Theta:</translation>
         </message>
     </context>
     <context>
@@ -268,16 +268,16 @@
             <translation>追加(&amp;A)</translation>
         </message>
         <message>
-            <source>Dup&amp;licate</source>
-            <translation>複製(&amp;L)</translation>
-        </message>
-        <message>
-            <source>D&amp;elete</source>
-            <translation>削除(&amp;E)</translation>
-        </message>
-        <message>
             <source>Lines of the set-up</source>
             <translation>設定の行</translation>
+        </message>
+        <message>
+            <source>&amp;Duplicate</source>
+            <translation>複製(&amp;D)</translation>
+        </message>
+        <message>
+            <source>Dele&amp;te</source>
+            <translation>削除(&amp;T)</translation>
         </message>
     </context>
     <context>
@@ -388,28 +388,28 @@
             <translation>全体値</translation>
         </message>
         <message>
-            <source>Water &amp;Level</source>
-            <translation>水位(&amp;L)</translation>
-        </message>
-        <message>
             <source>Water &amp;Depth</source>
             <translation>水深(&amp;D)</translation>
         </message>
         <message>
-            <source>&amp;Water Level</source>
-            <translation>水位(&amp;W)</translation>
-        </message>
-        <message>
-            <source>&amp;Water Depth</source>
-            <translation>水深(&amp;W)</translation>
-        </message>
-        <message>
-            <source>Disc&amp;harge:</source>
-            <translation>流量(&amp;H):</translation>
-        </message>
-        <message>
             <source>Local Values</source>
             <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Wa&amp;ter Level</source>
+            <translation>水位(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Wate&amp;r Level</source>
+            <translation>水位(&amp;R)</translation>
+        </message>
+        <message>
+            <source>Water De&amp;pth</source>
+            <translation>水深(&amp;P)</translation>
+        </message>
+        <message>
+            <source>Di&amp;scharge:</source>
+            <translation>流量(&amp;S):</translation>
         </message>
     </context>
     <context>
@@ -421,10 +421,6 @@
         <message>
             <source>Global values</source>
             <translation>全体値</translation>
-        </message>
-        <message>
-            <source>&amp;Water level (h1)</source>
-            <translation>水位(h1)(&amp;W)</translation>
         </message>
         <message>
             <source>&amp;Interface level (h0)</source>
@@ -442,6 +438,10 @@
             <source>Local values</source>
             <translation>地点別の値</translation>
         </message>
+        <message>
+            <source>Wate&amp;r level (h1)</source>
+            <translation>水位(h1)(&amp;R)</translation>
+        </message>
     </context>
     <context>
         <name>CKlrParamPage</name>
@@ -452,14 +452,6 @@
         <message>
             <source>&amp;Interface Friction Factor</source>
             <translation>界面摩擦係数(&amp;I)</translation>
-        </message>
-        <message>
-            <source>Maximum &amp;volume of entrainment</source>
-            <translation>最大連行量(&amp;V)</translation>
-        </message>
-        <message>
-            <source>Maximum &amp;entrainment velocity</source>
-            <translation>最大連行速度(&amp;E)</translation>
         </message>
         <message>
             <source>Minimum layer &amp;thickness for entrainment cutoff</source>
@@ -508,6 +500,14 @@
         <message>
             <source>Local values</source>
             <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>&amp;Maximum volume of entrainment</source>
+            <translation>最大連行量(&amp;M)</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum entrainment velocity</source>
+            <translation>最大連行速度(&amp;X)</translation>
         </message>
     </context>
     <context>
@@ -558,10 +558,6 @@
             <translation>マップ出力ファイル</translation>
         </message>
         <message>
-            <source>Apply DEM input data for ground &amp;elevations</source>
-            <translation>地盤高にDEM入力データを使用する(&amp;E)</translation>
-        </message>
-        <message>
             <source>Input topography</source>
             <translation>入力地形</translation>
         </message>
@@ -578,8 +574,12 @@
             <translation>KVR GISの補助グリッドで追加の浸水域を表示する(&amp;M)</translation>
         </message>
         <message>
-            <source>&amp;Help grid</source>
-            <translation>補助グリッド(&amp;H)</translation>
+            <source>&amp;Apply DEM input data for ground elevations</source>
+            <translation>地盤高にDEM入力データを使用する(&amp;A)</translation>
+        </message>
+        <message>
+            <source>Hel&amp;p grid</source>
+            <translation>補助グリッド(&amp;P)</translation>
         </message>
     </context>
     <context>
@@ -731,16 +731,8 @@
             <translation>Beta_Limit(&amp;B):</translation>
         </message>
         <message>
-            <source>&amp;Fac_0:</source>
-            <translation>Fac_0(&amp;F):</translation>
-        </message>
-        <message>
             <source>&amp;Qconv_Factor:</source>
             <translation>Qconv_Factor(&amp;Q):</translation>
-        </message>
-        <message>
-            <source>&amp;Hconv_Factor:</source>
-            <translation>Hconv_Factor(&amp;H):</translation>
         </message>
         <message>
             <source>&amp;Min_Hconv_In_Branch:</source>
@@ -763,24 +755,12 @@
             <translation>エネルギー式を用いる(&amp;U)</translation>
         </message>
         <message>
-            <source>Model contraction and expansion &amp;losses</source>
-            <translation>急縮・急拡損失を考慮する(&amp;L)</translation>
-        </message>
-        <message>
             <source>&amp;Allow upstream slope</source>
             <translation>上流向きの水面勾配を許す(&amp;A)</translation>
         </message>
         <message>
-            <source>&amp;Velocity distribution coefficient based on conveyance</source>
-            <translation>通水能から流速分布係数を求める(&amp;V)</translation>
-        </message>
-        <message>
             <source>&amp;No suppression of convective terms</source>
             <translation>移流項を抑制しない(&amp;N)</translation>
-        </message>
-        <message>
-            <source>Friction slope &amp;evaluation</source>
-            <translation>摩擦勾配の評価(&amp;E)</translation>
         </message>
         <message>
             <source>Default</source>
@@ -818,6 +798,26 @@
             <source>Load branch an&amp;d chainages</source>
             <translation>河川名と追加距離の読み込み(&amp;D)</translation>
         </message>
+        <message>
+            <source>Fac_&amp;0:</source>
+            <translation>Fac_0(&amp;0):</translation>
+        </message>
+        <message>
+            <source>Hc&amp;onv_Factor:</source>
+            <translation>Hconv_Factor(&amp;O):</translation>
+        </message>
+        <message>
+            <source>Model contraction and ex&amp;pansion losses</source>
+            <translation>急縮・急拡損失を考慮する(&amp;P)</translation>
+        </message>
+        <message>
+            <source>Velocit&amp;y distribution coefficient based on conveyance</source>
+            <translation>通水能から流速分布係数を求める(&amp;Y)</translation>
+        </message>
+        <message>
+            <source>Fr&amp;iction slope evaluation</source>
+            <translation>摩擦勾配の評価(&amp;I)</translation>
+        </message>
     </context>
     <context>
         <name>CReachLengthPage</name>
@@ -830,8 +830,8 @@
             <translation>エネルギー式を用いる(&amp;U)</translation>
         </message>
         <message>
-            <source>&amp;Load branch and chainages</source>
-            <translation>河川名と追加距離の読み込み(&amp;L)</translation>
+            <source>Load &amp;branch and chainages</source>
+            <translation>河川名と追加距離の読み込み(&amp;B)</translation>
         </message>
     </context>
     <context>
@@ -1007,10 +1007,6 @@
             <translation>区切り文字(&amp;D)</translation>
         </message>
         <message>
-            <source>&amp;Width of columns</source>
-            <translation>列幅(&amp;W)</translation>
-        </message>
-        <message>
             <source>&amp;Minimum</source>
             <translation>最小値(&amp;M)</translation>
         </message>
@@ -1031,16 +1027,8 @@
             <translation>出力期間</translation>
         </message>
         <message>
-            <source>&amp;Limited output period</source>
-            <translation>出力期間を限定する(&amp;L)</translation>
-        </message>
-        <message>
             <source>&amp;Start</source>
             <translation>開始(&amp;S)</translation>
-        </message>
-        <message>
-            <source>&amp;End</source>
-            <translation>終了(&amp;E)</translation>
         </message>
         <message>
             <source>Items in output</source>
@@ -1066,13 +1054,21 @@
             <source>All ex&amp;cepted those from the list</source>
             <translation>一覧のものを除くすべて(&amp;C)</translation>
         </message>
+        <message>
+            <source>Width of col&amp;umns</source>
+            <translation>列幅(&amp;U)</translation>
+        </message>
+        <message>
+            <source>Limited output &amp;period</source>
+            <translation>出力期間を限定する(&amp;P)</translation>
+        </message>
+        <message>
+            <source>E&amp;nd</source>
+            <translation>終了(&amp;N)</translation>
+        </message>
     </context>
     <context>
         <name>CWLCurvePage</name>
-        <message>
-            <source>&amp;Enabling water level increment due to curve</source>
-            <translation>湾曲による水位上昇を考慮する(&amp;E)</translation>
-        </message>
         <message>
             <source>System Definition</source>
             <translation>システムで決定</translation>
@@ -1082,28 +1078,32 @@
             <translation>平均範囲(&amp;R)</translation>
         </message>
         <message>
-            <source>&amp;Water Surface width</source>
-            <translation>水面幅(&amp;W)</translation>
-        </message>
-        <message>
             <source>&amp;Curvature Radius</source>
             <translation>曲率半径(&amp;C)</translation>
-        </message>
-        <message>
-            <source>&amp;Velocity</source>
-            <translation>流速(&amp;V)</translation>
         </message>
         <message>
             <source>Values</source>
             <translation>値</translation>
         </message>
         <message>
-            <source>&amp;Load Branch &amp;&amp; Chainage</source>
-            <translation>河道と距離標を読み込む(&amp;L)</translation>
-        </message>
-        <message>
             <source>Water level increment due to curve</source>
             <translation>湾曲による水位上昇</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to curve</source>
+            <translation>湾曲による水位上昇を考慮する(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Water &amp;Surface width</source>
+            <translation>水面幅(&amp;S)</translation>
+        </message>
+        <message>
+            <source>Veloci&amp;ty</source>
+            <translation>流速(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>河道と距離標を読み込む(&amp;B)</translation>
         </message>
     </context>
     <context>
@@ -1119,10 +1119,6 @@
     </context>
     <context>
         <name>CWLSandBarsPage</name>
-        <message>
-            <source>&amp;Enabling water level increment due to sand bars</source>
-            <translation>砂州による水位上昇を考慮する(&amp;E)</translation>
-        </message>
         <message>
             <source>Method</source>
             <translation>方法</translation>
@@ -1140,12 +1136,16 @@
             <translation>値</translation>
         </message>
         <message>
-            <source>&amp;Load Branch &amp;&amp; Chainage</source>
-            <translation>河道と距離標を読み込む(&amp;L)</translation>
-        </message>
-        <message>
             <source>Water level increment due to sand bars</source>
             <translation>砂州による水位上昇</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to sand bars</source>
+            <translation>砂州による水位上昇を考慮する(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>河道と距離標を読み込む(&amp;B)</translation>
         </message>
     </context>
     <context>
@@ -1157,10 +1157,6 @@
         <message>
             <source>Global Value</source>
             <translation>全体値</translation>
-        </message>
-        <message>
-            <source>&amp;Wave Approximation:</source>
-            <translation>波動近似(&amp;W):</translation>
         </message>
         <message>
             <source>High Order Fully Dynamic</source>
@@ -1181,6 +1177,10 @@
         <message>
             <source>Local Values</source>
             <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Wave &amp;Approximation:</source>
+            <translation>波動近似(&amp;A):</translation>
         </message>
     </context>
     <context>
@@ -1807,8 +1807,6 @@ Nothing was loaded.</source>
         <message>
             <source>Reach Lengths</source>
             <translation>区間長</translation>
-            <source>%1 locations added, %2 were there already.</source>
-            <translation>%1地点を追加しました。%2地点は既にありました。</translation>
         </message>
         <message>
             <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
@@ -2229,6 +2227,56 @@ true または false
         <message>
             <source>C&amp;lose</source>
             <translation>閉じる(&amp;L)</translation>
+        </message>
+        <message>
+            <source>Full value: %1</source>
+            <translation>全桁の値: %1</translation>
+        </message>
+        <message>
+            <source>Line %1 of %2, %3: %4</source>
+            <translation>%1 行目 / 全 %2 行、%3: %4</translation>
+        </message>
+        <message>
+            <source>Resistance = a·(V·R)^b, between minimum and maximum. V is the velocity in m/s, R the hydraulic radius in m.</source>
+            <translation>抵抗値 = a·(V·R)^b(最小値と最大値の間)。Vは流速(m/s)、Rは径深(m)です。</translation>
+        </message>
+        <message>
+            <source>The formula changes from %1 to %2. Convert the values too (M = 1/n)?
+
+Yes changes %3 values, for example %4 to %5: the global values, all lines, and the coefficients, bounds and tables of the toolbox.
+No leaves every value as it is. Flood plain resistances stay as they are in any case.</source>
+            <translation>抵抗則が「%1」から「%2」に変わります。値も換算しますか(M = 1/n)?
+
+「はい」では%3個の値が変わります(例: %4 → %5)。全体値、すべての行、ツールの係数・上下限・表が対象です。
+「いいえ」では値はすべてそのままです。高水敷の抵抗はどちらの場合も変わりません。</translation>
+        </message>
+        <message>
+            <source>The formula changes from %1 to %2.
+
+Between the two no value can be converted without a hydraulic radius, so all %3 values stay as they are.</source>
+            <translation>抵抗則が「%1」から「%2」に変わります。
+
+両者の間の換算には径深が必要なため、%3個の値はすべてそのままです。</translation>
+        </message>
+        <message>
+            <source>Conversion of resistances</source>
+            <translation>抵抗値の換算</translation>
+        </message>
+        <message>
+            <source>In a field</source>
+            <translation>入力欄</translation>
+        </message>
+        <message>
+            <source>Takes what is typed</source>
+            <translation>入力を確定する</translation>
+        </message>
+        <message>
+            <source>Takes back what is typed</source>
+            <translation>入力を取り消す</translation>
+        </message>
+        <message>
+            <source>In a table</source>
+            <translation>表</translation>
         </message>
 </context>
 </TS>

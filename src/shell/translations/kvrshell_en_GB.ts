@@ -227,6 +227,14 @@
             <source>Puts the other windows beside the active one</source>
             <translation>Puts the other windows beside the active one</translation>
         </message>
+        <message>
+            <source>All &amp;Digits</source>
+            <translation>All &amp;Digits</translation>
+        </message>
+        <message>
+            <source>Shows every digit of the numbers in tables and fields</source>
+            <translation>Shows every digit of the numbers in tables and fields</translation>
+        </message>
     </context>
     <context>
         <name>CMainFrame</name>

@@ -227,6 +227,14 @@
             <source>Puts the other windows beside the active one</source>
             <translation>作業中のウィンドウの横にほかのウィンドウを並べます</translation>
         </message>
+        <message>
+            <source>All &amp;Digits</source>
+            <translation>全桁表示(&amp;D)</translation>
+        </message>
+        <message>
+            <source>Shows every digit of the numbers in tables and fields</source>
+            <translation>表と入力欄の数値を全桁で表示します</translation>
+        </message>
     </context>
     <context>
         <name>CMainFrame</name>

@@ -1,0 +1,153 @@
+#include "pages/resistance_formula.h"
+
+#include "ks/fc/message_box.h"
+#include "ks/units/edit_style.h"
+#include "module/document.h"
+#include "res/strings.h"
+
+#include <QComboBox>
+#include <QUndoStack>
+
+namespace {
+
+enum Formula
+{
+    ManningM,
+    ManningN,
+    Chezy,
+    FormulaCount
+};
+
+bool IsKnown(std::int32_t formula)
+{
+    return formula >= 0 && formula < FormulaCount;
+}
+
+/// M = 1/n. What is not above 0 is no resistance but stands for "none" or "not set", and stays.
+double Inverse(double resistance)
+{
+    return resistance > 0 ? 1 / resistance : resistance;
+}
+
+} // namespace
+
+// Units as in V. T. Chow, Open-Channel Hydraulics (1959), sections 5-4 and 5-6, in SI; M = 1/n is Strickler's form.
+QString ResistanceUnit(std::int32_t formula)
+{
+    switch (formula) {
+    case ManningM:
+        return QStringLiteral("m^(1/3)/s");
+    case ManningN:
+        return QStringLiteral("s/m^(1/3)");
+    case Chezy:
+        return QStringLiteral("m^(1/2)/s");
+    default:
+        return {};
+    }
+}
+
+double& CSwitchFormula::Change::Target() const
+{
+    return table ? (*table)[row].ResValue : *value;
+}
+
+void CSwitchFormula::Put(double& value, double after)
+{
+    if (value != after)
+        m_changes.push_back({&value, nullptr, 0, value, after});
+}
+
+void CSwitchFormula::Invert(double& value)
+{
+    Put(value, Inverse(value));
+}
+
+template <typename Tools>
+void CSwitchFormula::ConvertTools(Tools& tools)
+{
+    // Where M = a (VR)^b, n = 1/a (VR)^-b; and what was the smallest M is the largest n.
+    Invert(tools.CoefA);
+    Put(tools.CoefB, tools.CoefB == 0 ? 0 : -tools.CoefB);
+    const double smallest = tools.MinRes, largest = tools.MaxRes;
+    Put(tools.MinRes, Inverse(largest));
+    Put(tools.MaxRes, Inverse(smallest));
+    for (std::size_t row = 0; row < tools.VeloRes.size(); ++row) {
+        const double before = tools.VeloRes[row].ResValue;
+        if (before > 0)
+            m_changes.push_back({nullptr, &tools.VeloRes, row, before, Inverse(before)});
+    }
+}
+
+CSwitchFormula::CSwitchFormula(CKavo0_hdDoc& document, std::int32_t formula, bool convert)
+    : CDocumentCommand(document, LoadString(convert ? Str::UndoConvert : Str::UndoValue)),
+      m_before(document.Parameters().Global.resist_num),
+      m_after(formula)
+{
+    if (!convert)
+        return;
+    HD_Parameters& parameters = document.Parameters();
+    HD_Global_Var& globals = parameters.Global;
+    for (double* value :
+         {&globals.G_resistance, &globals.ZoneResistance1, &globals.ZoneResistance2, &globals.ZoneResistance3})
+        Invert(*value);
+    ConvertTools(globals.BedResist);
+    for (std::size_t line = 0; line < parameters.BedList.GetCount(); ++line) {
+        HD_Resistfact& record = parameters.BedList.GetAt(line);
+        if (document.IsPlaceholder(record))
+            continue;
+        for (double* value :
+             {&record.Resistance, &record.ZoneResistance1, &record.ZoneResistance2, &record.ZoneResistance3})
+            Invert(*value);
+    }
+    for (std::size_t line = 0; line < parameters.BedResistanceToolboxList.GetCount(); ++line) {
+        HDBedResTool& record = parameters.BedResistanceToolboxList.GetAt(line);
+        if (!document.IsPlaceholder(record))
+            ConvertTools(record);
+    }
+}
+
+ChangePlace CSwitchFormula::Apply()
+{
+    Document().Parameters().Global.resist_num = m_after;
+    for (const Change& change : m_changes)
+        change.Target() = change.after;
+    return {};
+}
+
+ChangePlace CSwitchFormula::Revert()
+{
+    Document().Parameters().Global.resist_num = m_before;
+    for (const Change& change : m_changes)
+        change.Target() = change.before;
+    return {};
+}
+
+void SwitchResistanceFormula(CKavo0_hdDoc& document, std::int32_t formula, QComboBox& box)
+{
+    using Button = QMessageBox::StandardButton;
+    const HD_Global_Var& globals = document.Parameters().Global;
+    const std::int32_t before = globals.resist_num;
+    if (formula == before)
+        return;
+    auto converted = std::make_unique<CSwitchFormula>(document, formula, true);
+    Button answer = Button::No;
+    if (before == Chezy || formula == Chezy) {
+        if (IsKnown(before))
+            answer = KsMessageBox(LoadString(Str::CannotConvert)
+                                      .arg(box.itemText(before), box.itemText(formula))
+                                      .arg(converted->ChangeCount()),
+                                  Button::Ok | Button::Cancel, Button::Ok, &box);
+    } else if (IsKnown(before) && converted->ChangeCount() > 0) {
+        answer = KsMessageBox(LoadString(Str::OfferConversion)
+                                  .arg(box.itemText(before), box.itemText(formula))
+                                  .arg(converted->ChangeCount())
+                                  .arg(KsShortestNumber(globals.G_resistance),
+                                       KsFormatNumber(QStringLiteral("%.6lg"), Inverse(globals.G_resistance))),
+                              Button::Yes | Button::No | Button::Cancel, Button::No, &box);
+    }
+    if (answer == Button::Cancel)
+        return;
+    document.UndoStack().push(
+        (answer == Button::Yes ? std::move(converted) : std::make_unique<CSwitchFormula>(document, formula, false))
+            .release());
+}
