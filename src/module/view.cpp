@@ -2,6 +2,7 @@
 
 #include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/status.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -10,7 +11,6 @@
 #include "pages/framework/search_dlg.h"
 #include "res/strings.h"
 
-#include <QStatusTipEvent>
 #include <QTimer>
 #include <QUndoStack>
 #include <QVBoxLayout>
@@ -73,6 +73,7 @@ void CKavo0_hdView::OnInitialUpdate()
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
     connect(m_sheet, &QTabWidget::currentChanged, this, &CKavo0_hdView::ShowLine);
     connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
+    connect(GetDocument(), &CKavo0_hdDoc::Said, this, &CKavo0_hdView::Say);
     if (auto* page = ActivePage())
         page->OnSetActive();
     KsAfterPaint(this, this, [this] { MakeOtherPages(); });
@@ -163,15 +164,28 @@ void CKavo0_hdView::CurrentLocationChanged()
         TellLocationLater();
 }
 
-/// The line of the page in front, in the status bar; nothing for a page without a list.
+/// The line of the page in front, in the status bar, and what has just been done.
 void CKavo0_hdView::ShowLine()
 {
     const auto* page = ActivePage();
     const auto* grid = page && page->GetList() ? page->GetGrid() : nullptr;
-    const int row = grid ? grid->CurrentRow() - grid->Model()->FixedRows() : 0;
-    QStatusTipEvent tip(row > 0 ? LoadString(Str::LineOfLines).arg(row).arg(page->GetList()->GetCount()) : QString());
+    const int fixed = grid ? grid->Model()->FixedRows() : 0, row = grid ? grid->CurrentRow() - fixed : 0;
+    QStringList parts;
+    if (row > 0)
+        parts << LoadString(Str::LineOfLines).arg(row).arg(grid->RowCount() - fixed);
+    if (const QString said = std::exchange(m_said, {}); !said.isEmpty())
+        parts << said;
     if (MainFrame())
-        QCoreApplication::sendEvent(MainFrame(), &tip);
+        KsTellStatus(*this, parts.join(QStringLiteral("   ")));
+}
+
+/// When the present event is over: lines that become current in it are shown first, and would hide what is said.
+void CKavo0_hdView::Say(const QString& text)
+{
+    QTimer::singleShot(0, this, [this, text] {
+        m_said = text;
+        ShowLine();
+    });
 }
 
 void CKavo0_hdView::EnableLinesMenu(bool enable)
@@ -181,16 +195,17 @@ void CKavo0_hdView::EnableLinesMenu(bool enable)
         frame->EnableMenuItem(LinesMenuPosition, enable);
 }
 
-void CKavo0_hdView::RevealChange(CGenList* list, int row, int /*column*/)
+void CKavo0_hdView::RevealChange(const ChangePlace& place)
 {
-    for (int tab = 0; list && tab < m_sheet->PageCount(); ++tab) {
-        auto* page = m_sheet->PageAt(tab);
-        if (page->GetList() != list)
-            continue;
-        if (m_sheet->SetActivePage(tab) && row > 0)
-            page->GotoLine(row);
+    int tab = m_sheet->currentIndex();
+    if (!ActivePage() || !ActivePage()->Shows(place))
+        for (tab = 0; tab < m_sheet->PageCount() && !m_sheet->PageAt(tab)->Shows(place);)
+            ++tab;
+    if (tab == m_sheet->PageCount() || !m_sheet->SetActivePage(tab))
         return;
-    }
+    // A window in the background stays there.
+    const bool isActive = !MainFrame() || MainFrame()->GetActiveView() == this;
+    m_sheet->PageAt(tab)->Reveal(place, isActive);
 }
 
 // ---- commands ----------------------------------------------------------------------------------

@@ -44,8 +44,21 @@ void CBindings::ApplyRules()
         rule();
 }
 
+QWidget* CBindings::ControlFor(const void* value) const
+{
+    QWidget* found = nullptr;
+    for (const auto& [address, control] : m_controls) {
+        const auto* button = qobject_cast<const QRadioButton*>(control);
+        const bool isBest = control->isEnabled() && (!button || button->isChecked());
+        if (address == value && (isBest || !found))
+            found = control;
+    }
+    return found;
+}
+
 void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
 {
+    m_controls.emplace_back(&value, field);
     field->Setup(&value, options.textLimit, options.decimals, options.generalNotation,
                  options.unit ? *options.unit : DeclaredUnit(m_document->Parameters().Global, value));
     field->SetRange(options.minimum.has_value(), options.minimum.value_or(0), options.maximum.has_value(),
@@ -62,6 +75,7 @@ void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options
 
 void CBindings::Add(CKsEditLong* field, std::int32_t& value)
 {
+    m_controls.emplace_back(&value, field);
     m_show.push_back([field, &value] {
         if (!field->isModified()) // a text that has not been taken yet stays
             field->SetValue(value);
@@ -84,6 +98,7 @@ void CBindings::Add(CKsEditLong* field, std::int32_t& value)
 
 void CBindings::Add(QLineEdit* field, std::string& value)
 {
+    m_controls.emplace_back(&value, field);
     m_show.push_back([field, &value] {
         const QString text = QString::fromStdString(value);
         if (!field->isModified() && field->text() != text)
@@ -113,6 +128,7 @@ void CBindings::Add(CGeoFileEdit* field, std::string& value, const FileKind& kin
 
 void CBindings::Add(CDateTimeEdit* field, HDDateTime& value)
 {
+    m_controls.emplace_back(&value, field);
     m_show.push_back([field, &value] {
         if (!field->isModified())
             field->SetValue(value);
@@ -135,6 +151,7 @@ void CBindings::Add(CDateTimeEdit* field, HDDateTime& value)
 template <typename T>
 void CBindings::AddFlag(QCheckBox* box, T& value, std::function<void(bool checked)> consequences)
 {
+    m_controls.emplace_back(&value, box);
     m_show.push_back([box, &value] { box->setChecked(value != T(0)); });
     connect(box, &QCheckBox::clicked, this, [this, &value, consequences](bool checked) {
         if (!consequences)
@@ -159,6 +176,7 @@ void CBindings::Add(QCheckBox* box, std::int32_t& flag)
 
 void CBindings::Add(QComboBox* box, std::int32_t& index)
 {
+    m_controls.emplace_back(&index, box);
     const int entries = box->count();
     box->setFocusPolicy(Qt::StrongFocus); // not by the wheel
     box->installEventFilter(this);
@@ -179,8 +197,10 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
 {
     auto* group = new QButtonGroup(this);
     int id = 0;
-    for (QRadioButton* button : buttons)
+    for (QRadioButton* button : buttons) {
+        m_controls.emplace_back(&value, button);
         group->addButton(button, id++);
+    }
     m_show.push_back([group, &value] {
         group->setExclusive(false); // else a pressed button could not be released
         for (QAbstractButton* button : group->buttons())

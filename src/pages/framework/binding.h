@@ -66,6 +66,8 @@ public:
     void Show();
     /// Takes what is being typed; false when a field refuses it (the user has been told).
     bool Take();
+    /// The control of the value at this address, of several one that can be used now; null for a value of other pages.
+    QWidget* ControlFor(const void* value) const;
 
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;
@@ -82,4 +84,5 @@ private:
     std::vector<std::function<void()>> m_show;
     std::vector<std::function<bool()>> m_take;
     std::vector<std::function<void()>> m_rules;
+    std::vector<std::pair<const void*, QWidget*>> m_controls; // by the address of the value
 };
