@@ -180,15 +180,14 @@ void Insert(Exchange& exchange)
         return Log("the item has no branch or no chainage");
     const bool shown = exchange.Show(exchange.table.inserted);
 
-    const auto rows = MakeListRows(exchange.document, exchange.list);
+    const auto rows = MakeListRows(exchange.list);
     auto lines = rows->NewRows(1);
     auto& record = *static_cast<HD_RiverPos*>(lines->At(0));
     record.RiverName = exchange.item.branch.toStdString();
     record.Chainage = exchange.item.chainage;
     if (exchange.table.fill)
         exchange.table.fill(record, exchange.document.Parameters().Global, exchange.item);
-    exchange.document.UndoStack().push(
-        new CInsertLines(exchange.document, rows, rows->Count(), std::move(lines), FirstLine::Goes));
+    exchange.document.UndoStack().push(new CInsertLines(exchange.document, rows, rows->Count(), std::move(lines)));
     if (auto* page = shown ? exchange.ListPage() : nullptr)
         page->GotoLine(int(exchange.list.GetCount()));
 }
@@ -202,7 +201,7 @@ void Delete(Exchange& exchange)
     if (row == exchange.list.GetCount())
         return;
     exchange.Show(exchange.table.deleted);
-    const auto rows = MakeListRows(exchange.document, exchange.list);
+    const auto rows = MakeListRows(exchange.list);
     exchange.document.UndoStack().push(new CDeleteLines(exchange.document, rows, row, 1));
 }
 
@@ -251,9 +250,9 @@ void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(
 std::unique_ptr<CObList> ItemsOf(const CString& path, CKsDoc* document, MakeItems make)
 {
     if (auto* open = qobject_cast<CKavo0_hdDoc*>(document))
-        return IsReady(*open) ? make({open->Parameters(), open}) : nullptr;
+        return IsReady(*open) ? make(open->Parameters()) : nullptr;
     auto content = ReadFile(path);
-    return content ? make({*content}) : nullptr;
+    return content ? make(*content) : nullptr;
 }
 
 CObList* CKavo0_hd::GetData(const CString& path, CView* view)

@@ -7,7 +7,7 @@
 
 class CKsDoc;
 
-using MakeItems = std::unique_ptr<CObList> (*)(const HDContent& content);
+using MakeItems = std::unique_ptr<CObList> (*)(HD_Parameters& parameters);
 
 /// Items of `document` when it is one of this editor's, as it is stored there: what is being typed goes on undisturbed
 /// and is told when it is stored. Otherwise those of the file `path`, as it was last saved. Null, with a line in the

@@ -1,24 +1,11 @@
 #include "module/data_items.h"
 
 #include "module/data_tables.h"
-#include "module/document.h"
 
 #include <algorithm>
 #include <string_view>
 
 namespace {
-
-/// The line that an empty table shows is no line of the document.
-bool IsShownOnly(const HDContent& content, const HD_RiverPos& record)
-{
-    return content.document && record.IsBlank() && content.document->IsPlaceholder(record);
-}
-
-/// Likewise the row of an empty table without locations.
-bool IsShownOnly(const HDContent& content, const void* rows)
-{
-    return content.document && content.document->IsPlaceholderRow(rows);
-}
 
 CString TextOf(std::string_view name)
 {
@@ -45,14 +32,12 @@ private:
     CString m_text = QStringLiteral("");
 };
 
-void AppendTable(const HDDataTable& table, int type, const HDContent& content, CObList& items)
+void AppendTable(const HDDataTable& table, int type, HD_Parameters& parameters, CObList& items)
 {
-    const CGenList& list = table.list(content.parameters);
+    const CGenList& list = table.list(parameters);
     BranchTexts branches;
     for (std::size_t i = 0; i < list.GetCount(); ++i) {
         const HD_RiverPos& record = list.GetAt(i);
-        if (IsShownOnly(content, record))
-            continue;
         auto item = std::make_unique<CKvr_CBE_ModelDataItem>();
         item->branch = branches.Of(record.RiverName);
         item->chainage = record.Chainage;
@@ -65,23 +50,23 @@ void AppendTable(const HDDataTable& table, int type, const HDContent& content, C
 
 } // namespace
 
-std::unique_ptr<CObList> DataItems(const HDContent& content)
+std::unique_ptr<CObList> DataItems(HD_Parameters& parameters)
 {
     auto items = std::make_unique<CObList>();
     std::size_t count = 0;
     for (const HDDataTable& table : HDDataTables())
-        count += table.list(content.parameters).GetCount();
+        count += table.list(parameters).GetCount();
     items->reserve(count);
     int type = 0;
     for (const HDDataTable& table : HDDataTables())
-        AppendTable(table, type++, content, *items);
+        AppendTable(table, type++, parameters, *items);
     return items;
 }
 
-std::unique_ptr<CObList> MarkItems(const HDContent& content)
+std::unique_ptr<CObList> MarkItems(HD_Parameters& parameters)
 {
-    const HD_Global_Var& globals = content.parameters.Global;
-    const std::size_t titles = IsShownOnly(content, &globals.MarkTitles) ? 0 : globals.MarkTitles.size();
+    const HD_Global_Var& globals = parameters.Global;
+    const std::size_t titles = globals.MarkTitles.size();
     auto items = std::make_unique<CObList>();
 
     auto head = std::make_unique<CKvrCBEUserDefMark>();
@@ -91,11 +76,9 @@ std::unique_ptr<CObList> MarkItems(const HDContent& content)
     head->flags.resize(titles, 0);
     items->push_back(std::move(head));
 
-    const auto& list = content.parameters.WaterLevelMarkList;
+    const auto& list = parameters.WaterLevelMarkList;
     for (std::size_t i = 0; i < list.GetCount(); ++i) {
         const HDWLMark& mark = list.GetAt(i);
-        if (IsShownOnly(content, mark))
-            continue;
         auto item = std::make_unique<CKvrCBEUserDefMark>();
         item->branch = CString::fromStdString(mark.RiverName);
         item->values.push_back(mark.Chainage);
@@ -106,12 +89,10 @@ std::unique_ptr<CObList> MarkItems(const HDContent& content)
     return items;
 }
 
-std::unique_ptr<CObList> MapItems(const HDContent& content)
+std::unique_ptr<CObList> MapItems(HD_Parameters& parameters)
 {
     auto items = std::make_unique<CObList>();
-    const auto& maps = content.parameters.Global.MapOutput.MapOutputFiles;
-    if (IsShownOnly(content, &maps))
-        return items;
+    const auto& maps = parameters.Global.MapOutput.MapOutputFiles;
     for (const CMapsOutput& map : maps) {
         auto item = std::make_unique<CKvr_CBE_HDMaps>();
         item->xOrigin = map.XOrigin;

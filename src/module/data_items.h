@@ -6,19 +6,9 @@
 
 #include <memory>
 
-class CKavo0_hdDoc;
-
-/// What is told, and the document that it belongs to: the lines which its pages only show are left out. The content of
-/// a file belongs to none.
-struct HDContent
-{
-    HD_Parameters& parameters;
-    const CKavo0_hdDoc* document = nullptr;
-};
-
 /// The lines of the exchanged tables, incomplete ones included, in the order of the type codes and of the lists.
-std::unique_ptr<CObList> DataItems(const HDContent& content);
+std::unique_ptr<CObList> DataItems(HD_Parameters& parameters);
 /// Titles and locations of the user-defined marks.
-std::unique_ptr<CObList> MarkItems(const HDContent& content);
+std::unique_ptr<CObList> MarkItems(HD_Parameters& parameters);
 /// The maps to be written.
-std::unique_ptr<CObList> MapItems(const HDContent& content);
+std::unique_ptr<CObList> MapItems(HD_Parameters& parameters);

@@ -12,11 +12,36 @@
 #include <QPointer>
 #include <QTimer>
 #include <QUndoStack>
+#include <algorithm>
 #include <utility>
 
 namespace {
 
 constexpr int HDPackageKind = 8; // what this editor's packages call themselves
+
+/// The rows of defaults that are written although nobody has edited them, in their tables during a save only.
+class FirstRows
+{
+public:
+    explicit FirstRows(const std::vector<CKavo0_hdDoc::ShownRows>& shown)
+    {
+        for (const auto& table : shown)
+            if (table.writesFirstRow && table.rows->IsEmpty())
+                m_filled.push_back(table.rows);
+        for (const auto& rows : m_filled)
+            rows->Put(0, rows->NewRows(1));
+    }
+    ~FirstRows()
+    {
+        for (const auto& rows : m_filled)
+            rows->Take(0, 1);
+    }
+    FirstRows(const FirstRows&) = delete;
+    FirstRows& operator=(const FirstRows&) = delete;
+
+private:
+    std::vector<std::shared_ptr<IRowSource>> m_filled;
+};
 
 } // namespace
 
@@ -65,14 +90,14 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
     if (!MayReplace(target, path) || !m_file.MayReplace(target))
         return false;
 
-    RemovePlaceholders();
     auto purged = std::make_unique<CPurgedLines>(*this);
-    purged->Apply();
-    if (!m_file.Write(m_parameters, target)) {
-        purged->Revert(); // what is in memory stays as the user left it
+    purged->TakeOut();
+    if (!WriteData(target)) {
+        purged->PutBack(); // what is in memory stays as the user left it
         UpdateAllViews(nullptr, Hint::Reload);
         return false;
     }
+    const QString dropped = purged->Summary();
     if (!purged->IsEmpty())
         UndoStack().push(purged.release());
     UndoStack().setClean();
@@ -82,8 +107,8 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
     UpdateAllViews(nullptr, Hint::Reload);
     SetModifiedFlag(false);
     emit FileStateChanged();
-    if (!m_file.Renamed().isEmpty())
-        emit Said(m_file.Renamed());
+    const QString saved = dropped.isEmpty() ? LoadString(Str::Saved) : LoadString(Str::SavedDropping).arg(dropped);
+    Say(m_file.Renamed().isEmpty() ? saved : saved + QStringLiteral("   ") + m_file.Renamed());
     return true;
 }
 
@@ -98,45 +123,30 @@ bool CKavo0_hdDoc::MayReplace(const CString& target, const CString& path)
     return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
+/// Writes the whole content; on failure the user has been told and the file is what it was.
+bool CKavo0_hdDoc::WriteData(const CString& path)
+{
+    const FirstRows defaults(m_rowsShown);
+    return m_file.Write(m_parameters, path);
+}
+
 void CKavo0_hdDoc::EditUnreadable()
 {
     m_isReadOnly = false;
     emit FileStateChanged();
 }
 
-void CKavo0_hdDoc::AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record)
+void CKavo0_hdDoc::AtSave(ShownRows shown)
 {
-    m_placeholders.insert(record.get());
-    list.InsertAt(0, std::move(record));
-}
-
-void CKavo0_hdDoc::CleanAtSave(std::shared_ptr<IRowSource> rows, std::function<bool(const void* row)> isIncomplete)
-{
-    m_cleanedRows.push_back({std::move(rows), std::move(isIncomplete)});
-}
-
-void CKavo0_hdDoc::RemovePlaceholders()
-{
-    for (const CCleanedRows& cleaned : m_cleanedRows)
-        cleaned.rows->TakeFirstRow();
-    for (const ListEntry& entry : HDLists())
-        if (entry.purgedAtSave)
-            RemovePlaceholder(*entry.list(m_parameters));
-    for (std::size_t setup = 0; setup < m_parameters.EncroachList.GetCount(); ++setup)
-        RemovePlaceholder(m_parameters.EncroachList.GetAt(setup));
-}
-
-void CKavo0_hdDoc::RemovePlaceholder(CGenList& list)
-{
-    if (list.GetCount() == 1 && list.GetAt(0).IsBlank() && m_placeholders.erase(&list.GetAt(0)))
-        list.RemoveAt(0);
+    const auto sameTable = [&](const ShownRows& known) { return known.rows->Data() == shown.rows->Data(); };
+    if (std::ranges::none_of(m_rowsShown, sameTable))
+        m_rowsShown.push_back(std::move(shown));
 }
 
 void CKavo0_hdDoc::DeleteContents()
 {
     UndoStack().clear();
-    m_placeholders.clear();
-    m_placeholderRows.clear();
+    m_rowsShown.clear();
     m_parameters.RemoveAllRecords();
     CKsDoc::DeleteContents();
 }
@@ -176,9 +186,24 @@ void CKavo0_hdDoc::LeaveProject(CView* view, const CString& name)
         SendToShell(KsMessage::SwitchBoard(), KsRequest::LeaveProject, view, name);
 }
 
+void CKavo0_hdDoc::StepMade(int index)
+{
+    ShowStep(index < std::exchange(m_steps, index));
+    TellStep();
+}
+
+/// What a complete step that was undone or redone has changed.
+void CKavo0_hdDoc::ShowStep(bool isUndo)
+{
+    if (!m_stepShows)
+        return; // a new step
+    emit Reveal(*std::exchange(m_stepShows, std::nullopt));
+    Say(LoadString(isUndo ? Str::Undone : Str::Redone).arg(isUndo ? UndoStack().redoText() : UndoStack().undoText()));
+}
+
 /// A step comes in the middle of things: the page that made it goes on storing, and whoever hears of it may ask at
 /// once.
-void CKavo0_hdDoc::StepMade()
+void CKavo0_hdDoc::TellStep()
 {
     if (!m_hProject || UndoStack().count() == 0) // a cleared stack is no step
         return;

@@ -4,12 +4,14 @@
 #include "data/hd_parameters.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/package.h"
+#include "module/change_place.h"
 #include "module/document_file.h"
+#include "res/strings.h"
 
 #include <cstdint>
 #include <functional>
 #include <memory>
-#include <unordered_set>
+#include <optional>
 #include <vector>
 
 class CPurgedLines;
@@ -45,30 +47,24 @@ public:
     /// Marks the document modified, updates all views but the sender, and gives the sender the focus back.
     void UpdateAll(CView* sender, int hint, CHint* object);
 
-    /// Gives an empty list the one line that its page shows. The line is no change of the document: neither the
-    /// modified flag nor undo sees it, and a save removes it again while it is untouched.
-    void AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record);
-    void RemovePlaceholders();
-    /// Takes the placeholder out of a list that holds nothing else.
-    void RemovePlaceholder(CGenList& list);
-    bool IsPlaceholder(const HD_RiverPos& record) const { return m_placeholders.contains(&record); }
-    /// Whatever edits or removes a record says so: a placeholder becomes an ordinary line.
-    void PlaceholderTouched(const HD_RiverPos& record) { m_placeholders.erase(&record); }
-
-    // Likewise for a list without locations, named by its address.
-    void AddPlaceholderRow(const void* rows) { m_placeholderRows.insert(rows); }
-    bool IsPlaceholderRow(const void* rows) const { return m_placeholderRows.contains(rows); }
-    void PlaceholderRowTouched(const void* rows) { m_placeholderRows.erase(rows); }
-
-    /// From now on a save leaves out the rows that are incomplete, as one step to undo. For lists without locations:
-    /// a page says so when it shows one, and tells the user on the page.
-    void CleanAtSave(std::shared_ptr<IRowSource> rows, std::function<bool(const void* row)> isIncomplete);
-    struct CCleanedRows
+    /// What a save makes of a table without locations that the user has seen. A page says so whenever it shows one;
+    /// what no page has shown is written as it is.
+    struct ShownRows
     {
         std::shared_ptr<IRowSource> rows;
-        std::function<bool(const void* row)> isIncomplete;
+        /// These rows are left out, as one step to undo; the page tells the user beforehand. May be empty.
+        std::function<bool(const void* row)> isIncomplete = {};
+        Str oneDropped = {}, manyDropped = {}; // said after the save
+        /// The row of defaults that the page shows of an empty table is written.
+        bool writesFirstRow = false;
     };
-    const std::vector<CCleanedRows>& CleanedRows() const { return m_cleanedRows; }
+    void AtSave(ShownRows shown);
+    const std::vector<ShownRows>& RowsShown() const { return m_rowsShown; }
+
+    /// A step that is being undone or redone shows here; told (Reveal) when the step is complete.
+    void StepShows(const ChangePlace& place) { m_stepShows = place; }
+    /// Tells the user in passing.
+    void Say(const QString& text) { emit Said(text); }
 
     /// Sends a request to the shell's switchboard; its answer, 0 outside a project. What the other editors have to say
     /// is appended to `objects`, which stays the caller's.
@@ -84,16 +80,18 @@ public:
     void EditUnreadable();
 
 signals:
-    /// Undo or redo changed a list (or a global value: null list); the view brings its page forward.
-    void Reveal(CGenList* list, int row, int column);
-
-    /// What is known of File(), or IsReadOnly(), is another.
-    void FileStateChanged();
+    /// A step was undone or redone; the view brings what it changed into view.
+    void Reveal(const ChangePlace& place);
     /// What was done, for the status bar.
     void Said(const QString& text);
+    /// What is known of File(), or IsReadOnly(), is another.
+    void FileStateChanged();
 
 private:
-    void StepMade();
+    void StepMade(int index);
+    void ShowStep(bool isUndo);
+    void TellStep();
+    bool WriteData(const CString& path);
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);
     LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name, CObList* objects = nullptr);
@@ -103,9 +101,9 @@ private:
     std::intptr_t m_hProject = 0;
     int m_untold = 0; // steps that the project has not heard of
     bool m_isReadOnly = false;
-    std::unordered_set<const HD_RiverPos*> m_placeholders;
-    std::unordered_set<const void*> m_placeholderRows;
-    std::vector<CCleanedRows> m_cleanedRows;
+    std::vector<ShownRows> m_rowsShown;
+    std::optional<ChangePlace> m_stepShows;
+    int m_steps = 0; // the undo stack's index, as last heard
 };
 
 /// Update hints of the document.

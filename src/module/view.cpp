@@ -2,8 +2,9 @@
 
 #include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
-#include "module/file_bar.h"
+#include "ks/fc/status.h"
 #include "ks/language/language.h"
+#include "module/file_bar.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -12,7 +13,6 @@
 #include "pages/framework/search_dlg.h"
 #include "res/strings.h"
 
-#include <QStatusTipEvent>
 #include <QTimer>
 #include <QUndoStack>
 #include <QVBoxLayout>
@@ -173,25 +173,28 @@ void CKavo0_hdView::CurrentLocationChanged()
         TellLocationLater();
 }
 
-/// In the status bar: the line of the table that is worked in, and the number of its current cell where the cell leaves
-/// digits out. Nothing for a page without a table.
+/// In the status bar: the line of the table that is worked in, the number of its current cell where the cell leaves digits
+/// out, and what has just been done.
 void CKavo0_hdView::ShowLine()
 {
     if (!MainFrame() || MainFrame()->GetActiveView() != this)
         return;
     const auto* page = ActivePage();
     const auto* grid = page ? page->LinesGrid() : nullptr;
-    QStatusTipEvent tip(grid ? grid->LineText() : QString());
-    QCoreApplication::sendEvent(MainFrame(), &tip);
+    QStringList parts;
+    if (const QString line = grid ? grid->LineText() : QString(); !line.isEmpty())
+        parts << line;
+    if (const QString said = std::exchange(m_said, {}); !said.isEmpty())
+        parts << said;
+    KsTellStatus(*this, parts.join(QStringLiteral("   ")));
 }
 
-/// In the status bar, when the present event is over: lines that become current in it are shown first.
+/// When the present event is over: lines that become current in it are shown first, and would hide what is said.
 void CKavo0_hdView::Say(const QString& text)
 {
     QTimer::singleShot(0, this, [this, text] {
-        QStatusTipEvent tip(text);
-        if (MainFrame())
-            QCoreApplication::sendEvent(MainFrame(), &tip);
+        m_said = text;
+        ShowLine();
     });
 }
 
@@ -202,16 +205,17 @@ void CKavo0_hdView::EnableLinesMenu(bool enable)
         frame->EnableMenuItem(LinesMenuPosition, enable);
 }
 
-void CKavo0_hdView::RevealChange(CGenList* list, int row, int /*column*/)
+void CKavo0_hdView::RevealChange(const ChangePlace& place)
 {
-    for (int tab = 0; list && tab < m_sheet->PageCount(); ++tab) {
-        auto* page = m_sheet->PageAt(tab);
-        if (page->GetList() != list)
-            continue;
-        if (m_sheet->SetActivePage(tab) && row > 0)
-            page->GotoLine(row);
+    int tab = m_sheet->currentIndex();
+    if (!ActivePage() || !ActivePage()->Shows(place))
+        for (tab = 0; tab < m_sheet->PageCount() && !m_sheet->PageAt(tab)->Shows(place);)
+            ++tab;
+    if (tab == m_sheet->PageCount() || !m_sheet->SetActivePage(tab))
         return;
-    }
+    // A window in the background stays there.
+    const bool isActive = !MainFrame() || MainFrame()->GetActiveView() == this;
+    m_sheet->PageAt(tab)->Reveal(place, isActive);
 }
 
 // ---- commands ----------------------------------------------------------------------------------

@@ -69,7 +69,8 @@ private:
     void Search();
     void SearchAgain();
     void GotoLine();
-    void RevealChange(CGenList* list, int row, int column);
+    void RevealChange(const ChangePlace& place);
+    void Say(const QString& text);
     void SendToolbarMessage(unsigned message);
     CKsMDIFrameWnd* MainFrame() const;
 
@@ -77,6 +78,7 @@ private:
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_inProject = false;
     bool m_tellLocation = false; // once the present event is over
+    QString m_said;              // in the status bar, behind the line
     SearchState m_search;
     bool m_linesEnabled = true;
 };

@@ -112,7 +112,7 @@ private:
         if (!m_changes.empty())
             document.UndoStack().push(new CSetCells(document, m_rows, std::move(m_changes), m_firstChanged));
         if (!m_new.empty())
-            document.UndoStack().push(new CInsertLines(document, m_rows, m_rows->Count(), NewLines(), FirstLine::Goes));
+            document.UndoStack().push(new CInsertLines(document, m_rows, m_rows->Count(), NewLines()));
         document.UndoStack().endMacro();
     }
 

@@ -195,15 +195,6 @@ TEST_F(DocumentTest, DeleteContentsKeepsTheGlobalValues)
     EXPECT_EQ(document.Parameters().Global.G_waterlevel, 1.5);
 }
 
-TEST_F(DocumentTest, APlaceholderIsNeverSavedAndNoChange)
-{
-    document.AddPlaceholder(document.Parameters().InitList, std::make_unique<HD_Initial>());
-    EXPECT_FALSE(document.IsModified());
-    ASSERT_TRUE(document.OnSaveDocument(Path("new.HDKV")));
-    EXPECT_TRUE(document.Parameters().InitList.IsEmpty());
-    EXPECT_EQ(document.UndoStack().count(), 0);
-}
-
 TEST_F(DocumentTest, TalksToTheShellOnlyInsideAProject)
 {
     CView view;

@@ -237,8 +237,8 @@ TEST_F(FlowPagesTest, LeakageShowsItsTableWhenIncluded)
     EXPECT_FALSE(grid->isVisible());
     EXPECT_FALSE(view->linesMenu);
     EXPECT_FALSE(Find(1238)->isEnabled());
-    ASSERT_EQ(list.GetCount(), 1u) << "opening puts a blank line in";
-    EXPECT_TRUE(list.GetAt(0).IsBlank());
+    EXPECT_EQ(Texts(1), "||0") << "a blank line to type into";
+    EXPECT_TRUE(list.IsEmpty());
     EXPECT_FALSE(document.IsModified());
 
     Find<QCheckBox>(1228)->click();
@@ -304,8 +304,12 @@ TEST_F(FlowPagesTest, WhatBlankCellsBecome)
     EXPECT_EQ(Texts(1), "||0.750") << "an empty list shows a line with the global factor";
     Type(1, 3, "");
     EXPECT_TRUE(view->page->OnKillActive());
+    EXPECT_TRUE(all.WindList.IsEmpty()) << "it holds what it held";
+    Enter(1, 2, "5");
+    Type(1, 3, "");
+    EXPECT_TRUE(view->page->OnKillActive());
     EXPECT_EQ(all.WindList.GetAt(0).WindFactor, 0.75);
-    EXPECT_EQ(all.WindList.GetAt(0).Chainage, NotGiven);
+    EXPECT_EQ(all.WindList.GetAt(0).RiverName, "");
     Enter(1, 3, "2");
     TypeInto(1004, "1.");
     EXPECT_FALSE(view->page->OnKillActive()) << "the field keeps what was typed, and the focus";

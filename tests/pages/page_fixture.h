@@ -21,7 +21,11 @@ public:
         layout()->addWidget(other);
         page->SetHost(this);
         document.AddView(this);
-        QObject::connect(&document, &CKavo0_hdDoc::Reveal, this, [this](CGenList*, int row, int) { revealed << row; });
+        QObject::connect(&document, &CKavo0_hdDoc::Reveal, this, [this](const ChangePlace& place) {
+            revealed << (place.list ? place.listRow : place.row);
+            if (page->Shows(place))
+                page->Reveal(place, true);
+        });
         resize(500, 500);
         show();
         activateWindow();

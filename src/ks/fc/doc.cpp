@@ -11,7 +11,11 @@
 #include <algorithm>
 #include <utility>
 
-CKsDoc::CKsDoc() : m_undo(new QUndoStack(this)) {}
+CKsDoc::CKsDoc() : m_undo(new QUndoStack(this))
+{
+    // Undoing back to what was saved leaves nothing to save.
+    connect(m_undo, &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
+}
 
 CKsDoc::~CKsDoc()
 {

@@ -60,8 +60,21 @@ void CBindings::AddTyped(QLineEdit* field, const void* value, TypedField what)
     });
 }
 
+QWidget* CBindings::ControlFor(const void* value) const
+{
+    QWidget* found = nullptr;
+    for (const Control& control : m_controls) {
+        const auto* button = qobject_cast<const QRadioButton*>(control.widget);
+        const bool isBest = control.widget->isEnabled() && (!button || button->isChecked());
+        if (control.value == value && (isBest || !found))
+            found = control.widget;
+    }
+    return found;
+}
+
 void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
 {
+    m_controls.emplace_back(&value, field);
     field->Setup(&value, options.textLimit, options.decimals, options.generalNotation,
                  options.unit ? *options.unit : DeclaredUnit(m_document->Parameters().Global, value));
     field->SetRange(options.minimum.has_value(), options.minimum.value_or(0), options.maximum.has_value(),
@@ -168,9 +181,11 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
 {
     auto* group = new QButtonGroup(this);
     int id = 0;
-    for (QRadioButton* button : buttons)
+    for (QRadioButton* button : buttons) {
+        Add(button, &value, [] {}); // shown by its group
         group->addButton(button, id++);
-    Add(*buttons.begin(), &value, [group, &value] {
+    }
+    Add(*buttons.begin(), nullptr, [group, &value] {
         group->setExclusive(false); // else a pressed button could not be released
         for (QAbstractButton* button : group->buttons())
             button->setChecked(group->id(button) == value);
@@ -238,11 +253,4 @@ bool CBindings::Take()
 bool CBindings::TakeField()
 {
     return std::all_of(m_typed.begin(), m_typed.end(), [](CTyping* typing) { return typing->TakeField(); });
-}
-
-QWidget* CBindings::ControlOf(const void* value) const
-{
-    const auto found = std::find_if(m_controls.begin(), m_controls.end(),
-                                    [value](const Control& control) { return control.value == value; });
-    return found != m_controls.end() ? found->widget : nullptr;
 }

@@ -71,8 +71,8 @@ public:
     bool Take();
     /// Likewise while the page stays: a text that may wait for the page is let be.
     bool TakeField();
-    /// The control that shows a value of the document; null when none does.
-    QWidget* ControlOf(const void* value) const;
+    /// The control of the value at this address, of several one that can be used now; null for a value of other pages.
+    QWidget* ControlFor(const void* value) const;
 
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;

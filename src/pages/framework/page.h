@@ -3,6 +3,7 @@
 
 #include "data/global_var.h"
 #include "ks/units/edit_style.h"
+#include "module/change_place.h"
 #include "pages/framework/binding.h"
 #include "pages/framework/page_host.h"
 
@@ -57,6 +58,10 @@ public:
 
     /// The help command: what the keys do on this page.
     virtual void OnHelp();
+    /// Whether what changed is edited on this page.
+    virtual bool Shows(const ChangePlace& place) const;
+    /// Brings it into view: the line, the cell, the control. With `focus` it is what is edited next.
+    virtual void Reveal(const ChangePlace& place, bool focus);
 
     /// Takes what is being typed, then undoes or redoes one step of the document.
     void UndoRedo(bool undo);
@@ -94,6 +99,7 @@ protected:
 
 private:
     void UnitsChanged();
+    CGenGrid* GridOf(const void* table) const;
 
     CKavo0_hdDoc* m_document;
     IPageHost* m_host = nullptr;

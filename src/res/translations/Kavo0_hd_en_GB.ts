@@ -2278,5 +2278,77 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
             <source>In a table</source>
             <translation>In a table</translation>
         </message>
+        <message>
+            <source>Undone: %1</source>
+            <translation>Undone: %1</translation>
+        </message>
+        <message>
+            <source>Redone: %1</source>
+            <translation>Redone: %1</translation>
+        </message>
+        <message>
+            <source>Line inserted</source>
+            <translation>Line inserted</translation>
+        </message>
+        <message>
+            <source>%1 lines inserted</source>
+            <translation>%1 lines inserted</translation>
+        </message>
+        <message>
+            <source>Line deleted</source>
+            <translation>Line deleted</translation>
+        </message>
+        <message>
+            <source>%1 lines deleted</source>
+            <translation>%1 lines deleted</translation>
+        </message>
+        <message>
+            <source>1 cell pasted</source>
+            <translation>1 cell pasted</translation>
+        </message>
+        <message>
+            <source>%1 cells pasted</source>
+            <translation>%1 cells pasted</translation>
+        </message>
+        <message>
+            <source>Saved</source>
+            <translation>Saved</translation>
+        </message>
+        <message>
+            <source>Saved; %1 (undo brings back what was dropped)</source>
+            <translation>Saved; %1 (undo brings back what was dropped)</translation>
+        </message>
+        <message>
+            <source>, </source>
+            <translation>, </translation>
+        </message>
+        <message>
+            <source>1 line without location dropped</source>
+            <translation>1 line without location dropped</translation>
+        </message>
+        <message>
+            <source>%1 lines without location dropped</source>
+            <translation>%1 lines without location dropped</translation>
+        </message>
+        <message>
+            <source>1 mark without title dropped</source>
+            <translation>1 mark without title dropped</translation>
+        </message>
+        <message>
+            <source>%1 marks without title dropped</source>
+            <translation>%1 marks without title dropped</translation>
+        </message>
+        <message>
+            <source>1 row without file name dropped</source>
+            <translation>1 row without file name dropped</translation>
+        </message>
+        <message>
+            <source>%1 rows without file name dropped</source>
+            <translation>%1 rows without file name dropped</translation>
+        </message>
+        <message>
+            <source>Marks without a title (%1) and the levels below them are left out when the file is saved.</source>
+            <translation>Marks without a title (%1) and the levels below them are left out when the file is saved.</translation>
+        </message>
 </context>
 </TS>

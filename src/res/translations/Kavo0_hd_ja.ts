@@ -2278,5 +2278,77 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
             <source>In a table</source>
             <translation>表</translation>
         </message>
+        <message>
+            <source>Undone: %1</source>
+            <translation>元に戻しました: %1</translation>
+        </message>
+        <message>
+            <source>Redone: %1</source>
+            <translation>やり直しました: %1</translation>
+        </message>
+        <message>
+            <source>Line inserted</source>
+            <translation>行を挿入しました</translation>
+        </message>
+        <message>
+            <source>%1 lines inserted</source>
+            <translation>%1 行を挿入しました</translation>
+        </message>
+        <message>
+            <source>Line deleted</source>
+            <translation>行を削除しました</translation>
+        </message>
+        <message>
+            <source>%1 lines deleted</source>
+            <translation>%1 行を削除しました</translation>
+        </message>
+        <message>
+            <source>1 cell pasted</source>
+            <translation>1 個のセルに貼り付けました</translation>
+        </message>
+        <message>
+            <source>%1 cells pasted</source>
+            <translation>%1 個のセルに貼り付けました</translation>
+        </message>
+        <message>
+            <source>Saved</source>
+            <translation>保存しました</translation>
+        </message>
+        <message>
+            <source>Saved; %1 (undo brings back what was dropped)</source>
+            <translation>保存しました。%1(「元に戻す」で復元できます)</translation>
+        </message>
+        <message>
+            <source>, </source>
+            <translation>、</translation>
+        </message>
+        <message>
+            <source>1 line without location dropped</source>
+            <translation>位置のない 1 行を除きました</translation>
+        </message>
+        <message>
+            <source>%1 lines without location dropped</source>
+            <translation>位置のない %1 行を除きました</translation>
+        </message>
+        <message>
+            <source>1 mark without title dropped</source>
+            <translation>名称のないマーク 1 件を除きました</translation>
+        </message>
+        <message>
+            <source>%1 marks without title dropped</source>
+            <translation>名称のないマーク %1 件を除きました</translation>
+        </message>
+        <message>
+            <source>1 row without file name dropped</source>
+            <translation>ファイル名のない 1 行を除きました</translation>
+        </message>
+        <message>
+            <source>%1 rows without file name dropped</source>
+            <translation>ファイル名のない %1 行を除きました</translation>
+        </message>
+        <message>
+            <source>Marks without a title (%1) and the levels below them are left out when the file is saved.</source>
+            <translation>名称のないマーク(%1 件)とその水位は、ファイルの保存時に除かれます。</translation>
+        </message>
 </context>
 </TS>
