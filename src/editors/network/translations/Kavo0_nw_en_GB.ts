@@ -178,12 +178,12 @@
     <context>
         <name>CNetworkView</name>
         <message>
-            <source>C&amp;hannel of %1</source>
-            <translation>C&amp;hannel of %1</translation>
+            <source>&amp;Channel of %1</source>
+            <translation>&amp;Channel of %1</translation>
         </message>
         <message>
-            <source>C&amp;hannel</source>
-            <translation>C&amp;hannel</translation>
+            <source>&amp;Channel</source>
+            <translation>&amp;Channel</translation>
         </message>
         <message>
             <source>&amp;Branches</source>

@@ -178,12 +178,12 @@
     <context>
         <name>CNetworkView</name>
         <message>
-            <source>C&amp;hannel of %1</source>
-            <translation>%1の河道(&amp;H)</translation>
+            <source>&amp;Channel of %1</source>
+            <translation>%1の河道(&amp;C)</translation>
         </message>
         <message>
-            <source>C&amp;hannel</source>
-            <translation>河道(&amp;H)</translation>
+            <source>&amp;Channel</source>
+            <translation>河道(&amp;C)</translation>
         </message>
         <message>
             <source>&amp;Branches</source>
