@@ -70,7 +70,6 @@ private:
     void SearchAgain();
     void GotoLine();
     void RevealChange(const ChangePlace& place);
-    void Say(const QString& text);
     void SendToolbarMessage(unsigned message);
     CKsMDIFrameWnd* MainFrame() const;
 

@@ -286,14 +286,6 @@
     <context>
         <name>CNetworkView</name>
         <message>
-            <source>C&amp;hannel of %1</source>
-            <translation>C&amp;hannel of %1</translation>
-        </message>
-        <message>
-            <source>C&amp;hannel</source>
-            <translation>C&amp;hannel</translation>
-        </message>
-        <message>
             <source>&amp;Branches</source>
             <translation>&amp;Branches</translation>
         </message>
@@ -380,6 +372,14 @@
         <message>
             <source>%1 holds no lines. Its layers, with their geometry and the number of features:</source>
             <translation>%1 holds no lines. Its layers, with their geometry and the number of features:</translation>
+        </message>
+        <message>
+            <source>&amp;Channel of %1</source>
+            <translation>&amp;Channel of %1</translation>
+        </message>
+        <message>
+            <source>&amp;Channel</source>
+            <translation>&amp;Channel</translation>
         </message>
     </context>
     <context>

@@ -286,14 +286,6 @@
     <context>
         <name>CNetworkView</name>
         <message>
-            <source>C&amp;hannel of %1</source>
-            <translation>%1の河道(&amp;H)</translation>
-        </message>
-        <message>
-            <source>C&amp;hannel</source>
-            <translation>河道(&amp;H)</translation>
-        </message>
-        <message>
             <source>&amp;Branches</source>
             <translation>河川(&amp;B)</translation>
         </message>
@@ -380,6 +372,14 @@
         <message>
             <source>%1 holds no lines. Its layers, with their geometry and the number of features:</source>
             <translation>%1 には線がありません。レイヤーとその図形、地物の数:</translation>
+        </message>
+        <message>
+            <source>&amp;Channel of %1</source>
+            <translation>%1の河道(&amp;C)</translation>
+        </message>
+        <message>
+            <source>&amp;Channel</source>
+            <translation>河道(&amp;C)</translation>
         </message>
     </context>
     <context>
