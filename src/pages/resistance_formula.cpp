@@ -93,17 +93,12 @@ CSwitchFormula::CSwitchFormula(CKavo0_hdDoc& document, std::int32_t formula, boo
     ConvertTools(globals.BedResist);
     for (std::size_t line = 0; line < parameters.BedList.GetCount(); ++line) {
         HD_Resistfact& record = parameters.BedList.GetAt(line);
-        if (document.IsPlaceholder(record))
-            continue;
         for (double* value :
              {&record.Resistance, &record.ZoneResistance1, &record.ZoneResistance2, &record.ZoneResistance3})
             Invert(*value);
     }
-    for (std::size_t line = 0; line < parameters.BedResistanceToolboxList.GetCount(); ++line) {
-        HDBedResTool& record = parameters.BedResistanceToolboxList.GetAt(line);
-        if (!document.IsPlaceholder(record))
-            ConvertTools(record);
-    }
+    for (std::size_t line = 0; line < parameters.BedResistanceToolboxList.GetCount(); ++line)
+        ConvertTools(parameters.BedResistanceToolboxList.GetAt(line));
 }
 
 ChangePlace CSwitchFormula::Apply()
@@ -136,14 +131,14 @@ void SwitchResistanceFormula(CKavo0_hdDoc& document, std::int32_t formula, QComb
             answer = KsMessageBox(LoadString(Str::CannotConvert)
                                       .arg(box.itemText(before), box.itemText(formula))
                                       .arg(converted->ChangeCount()),
-                                  Button::Ok | Button::Cancel, Button::Ok, &box);
+                                  Button::Ok | Button::Cancel, &box, {}, Button::Ok);
     } else if (IsKnown(before) && converted->ChangeCount() > 0) {
         answer = KsMessageBox(LoadString(Str::OfferConversion)
                                   .arg(box.itemText(before), box.itemText(formula))
                                   .arg(converted->ChangeCount())
                                   .arg(KsShortestNumber(globals.G_resistance),
                                        KsFormatNumber(QStringLiteral("%.6lg"), Inverse(globals.G_resistance))),
-                              Button::Yes | Button::No | Button::Cancel, Button::No, &box);
+                              Button::Yes | Button::No | Button::Cancel, &box, {}, Button::No);
     }
     if (answer == Button::Cancel)
         return;

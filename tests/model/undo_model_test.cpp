@@ -232,7 +232,7 @@ void UndoModelTest::OneUser(unsigned seed)
         document->UndoStack().redo();
     EXPECT_EQ(FirstDifference(Text(), last), "") << "seed " << seed;
     document->SetModifiedFlag(false);
-    view->CloseWindow();
+    CKsMDIChildWnd::Of(view)->close();
     QTest::qWait(5);
 }
 
