@@ -5,7 +5,6 @@
 #include "ks/fc/branch_name.h"
 
 #include <QScopedValueRollback>
-#include <QTableView>
 #include <cmath>
 #include <map>
 
@@ -82,7 +81,8 @@ LRESULT CCrossSectionView::BranchNames(CObList& objects) const
 LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
 {
     const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
-    if (!item || m_telling) // an answer to what this view tells would move its user away
+    // An answer to what this view tells would move its user away, and so would any place while a cell is being typed.
+    if (!item || m_telling || m_sections->IsEditing() || m_points->IsEditing())
         return 0;
     const int nearest = Document()->Sections().Nearest(item->branch, item->chainage);
     const CCrossSection *there = Document()->Section(nearest), *here = Document()->Section(CurrentSection());

@@ -6,7 +6,6 @@
 #include <QFileInfo>
 #include <QHash>
 #include <QMenu>
-#include <QTableView>
 #include <cmath>
 
 // ---- requests ----------------------------------------------------------------------------------
@@ -141,7 +140,7 @@ void CNetworkView::PickedChanged()
     const auto picked = m_map->Picked();
     const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
     if (branch >= 0 && branch != m_branches->currentIndex().row())
-        m_branches->setCurrentIndex(m_branchTable->index(branch, 0));
+        m_branches->GoTo(branch, CBranchTable::Name);
 }
 
 std::unique_ptr<QMenu> CNetworkView::MapMenu()

@@ -151,11 +151,12 @@ protected:
 
     inline static NetworkTest* current = nullptr;
     bool hdOpen = true;
-    std::vector<CMapLocation> hdLocations{{"MAIN", 2000, HDInitialData, {}, KsUnset},
-                                          {"MAIN", 5000, HDBedData, {}, KsUnset},
-                                          {"MAIN", 9000, HDBedData, {}, KsUnset}, // behind the end
-                                          {"LOST", 100, HDWindData, {}, KsUnset},
-                                          {"SIDE", 250, HDDataTypeCount, {}, KsUnset}}; // no such kind
+    std::vector<CMapLocation> hdLocations{
+        {"MAIN", 2000, HDInitialData, {}, KsUnset}, {"MAIN", 5000, HDBedData, {}, KsUnset},
+        {"MAIN", 9000, HDBedData, {}, KsUnset},                                                  // behind the end
+        {"LOST", 100, HDWindData, {}, KsUnset},     {"SIDE", 250, HDDataTypeCount, {}, KsUnset}, // no such kind
+        {"", 100, HDInitialData, {}, KsUnset}, // lines that are not complete
+        {"MAIN", 1e10, HDInitialData, {}, KsUnset}};
     FakeHDDoc hdDoc;
     FakeHDView hdView; // goes before its document
 };
