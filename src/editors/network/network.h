@@ -36,6 +36,7 @@ struct CNetworkBranch
 struct CNetwork
 {
     std::vector<CNetworkBranch> branches;
+    QString system; // that the coordinates lie in, as "EPSG:25832" or in WKT; empty when the file names none
     std::vector<CKeptSection> keptTargets;
     CKeptSection kept; // of the network's own target
 
