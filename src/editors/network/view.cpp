@@ -5,6 +5,7 @@
 #include <QLabel>
 #include <QSplitter>
 #include <QVBoxLayout>
+#include <algorithm>
 
 namespace {
 constexpr int RefreshDelay = 60; // milliseconds: shorter than a blink, longer than a burst of changes
@@ -75,7 +76,7 @@ void CNetworkView::MakeTables(QSplitter* splitter)
     splitter->addWidget(side);
     connect(m_branches->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
             &CNetworkView::CurrentBranchChanged);
-    connect(Document(), &CNetworkDoc::NetworkChanged, this, &CNetworkView::CurrentBranchChanged);
+    connect(Document(), &CNetworkDoc::NetworkChanged, this, &CNetworkView::NetworkChanged);
     if (m_branchTable->rowCount() > 0)
         m_branches->GoTo(0, CBranchTable::Name);
     CurrentBranchChanged();
@@ -95,6 +96,15 @@ CLinesView* CNetworkView::MakeTable(CNetworkTable* model, const char* name)
     // It waits until the cell's editor has closed: that would commit once more to where its line stood before.
     connect(model, &CNetworkTable::LineMoved, table, &CLinesView::GoTo, Qt::QueuedConnection);
     return table;
+}
+
+/// A table that was filled anew has no current line: it goes on with the one that stands there now.
+void CNetworkView::NetworkChanged()
+{
+    const int lines = m_branchTable->rowCount();
+    if (!m_branches->currentIndex().isValid() && lines > 0)
+        m_branches->GoTo(std::clamp(m_channelTable->Branch(), 0, lines - 1), CBranchTable::Name);
+    CurrentBranchChanged();
 }
 
 void CNetworkView::CurrentBranchChanged()

@@ -408,6 +408,10 @@
             <translation>&quot;%1&quot; (feature %2)</translation>
         </message>
         <message>
+            <source>&quot;%1&quot; (%2)</source>
+            <translation>&quot;%1&quot; (%2)</translation>
+        </message>
+        <message>
             <source>could not be read: %1</source>
             <translation>could not be read: %1</translation>
         </message>

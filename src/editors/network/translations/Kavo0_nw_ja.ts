@@ -408,6 +408,10 @@
             <translation>「%1」(地物 %2)</translation>
         </message>
         <message>
+            <source>&quot;%1&quot; (%2)</source>
+            <translation>「%1」(%2)</translation>
+        </message>
+        <message>
             <source>could not be read: %1</source>
             <translation>読み取れません: %1</translation>
         </message>
