@@ -85,8 +85,9 @@ public:
     void Add(const CGisFeature& feature, std::vector<CGisLine> parts)
     {
         m_name = m_options.fields.name >= 0 ? feature.values.value(m_options.fields.name).trimmed() : QString();
-        m_who = m_name.isEmpty() ? ImportBranches::tr("feature %1").arg(feature.number)
-                                 : ImportBranches::tr("\"%1\" (feature %2)").arg(m_name, QString::number(feature.number));
+        m_who = m_name.isEmpty()
+                    ? ImportBranches::tr("feature %1").arg(feature.number)
+                    : ImportBranches::tr("\"%1\" (feature %2)").arg(m_name, QString::number(feature.number));
         if (const QString reason = WhyNot(feature); !reason.isEmpty())
             return LeaveOut(reason);
         if (!feature.error.isEmpty())
@@ -246,7 +247,7 @@ private:
                 branch.end = std::lerp(chainages->first, chainages->second, after / whole);
             }
             before = after;
-            names << QStringLiteral("\"%1\" (%2)").arg(branch.name, Metres(LengthOf(each.line)));
+            names << ImportBranches::tr("\"%1\" (%2)").arg(branch.name, Metres(LengthOf(each.line)));
         }
         const QString how = chainages ? ImportBranches::tr("The chainages of the line are shared out among them.")
                                       : ImportBranches::tr("Each goes from 0 to its length.");
@@ -294,7 +295,7 @@ QString GeometryText(const QString& geometry)
                                                          QT_TRANSLATE_NOOP("GisGeometry", "Compound Curve"),
                                                          QT_TRANSLATE_NOOP("GisGeometry", "Multi Curve"),
                                                          QT_TRANSLATE_NOOP("GisGeometry", "Geometry Collection")};
-    return QCoreApplication::translate("GisGeometry", geometry.toUtf8().constData());
+    return geometry.isEmpty() ? QString() : QCoreApplication::translate("GisGeometry", geometry.toUtf8().constData());
 }
 
 CImportFields ProposeFields(const CGisLayer& layer)

@@ -42,6 +42,17 @@ QString LayerRemarkText(const CGisLayer& layer)
     return layer.IsComplete() ? QString() : CImportDialog::tr("incomplete or damaged");
 }
 
+/// What the features of a layer are; of a layer without any what it is meant for.
+QString GeometriesOf(const CGisLayer& layer)
+{
+    QStringList kinds;
+    for (const CGisFeature& feature : layer.features) {
+        if (const QString kind = GeometryText(feature.geometry); !kind.isEmpty() && !kinds.contains(kind))
+            kinds << kind;
+    }
+    return kinds.isEmpty() ? GeometryText(layer.geometry) : kinds.join(QStringLiteral(", "));
+}
+
 } // namespace
 
 CImportDialog::CImportDialog(const QString& name, const CGisFile& file, const CGisLibrary& library,
@@ -89,10 +100,11 @@ void CImportDialog::MakeLayers(const CGisFile& file)
     m_layers->setSelectionMode(QAbstractItemView::SingleSelection);
     m_layers->setEditTriggers(QAbstractItemView::NoEditTriggers);
     m_layers->setTabKeyNavigation(false);
+    m_layers->setWordWrap(false);
     m_layers->setAccessibleName(tr("Layers of the file"));
     for (int row = 0; row < m_layers->rowCount(); ++row) {
         const CGisLayer& layer = file.layers[std::size_t(row)];
-        const QString texts[] = {layer.name, GeometryText(layer.geometry), QString::number(layer.Lines()),
+        const QString texts[] = {layer.name, GeometriesOf(layer), QString::number(layer.Lines()),
                                  layer.system.IsKnown() ? layer.system.name : tr("none named"), LayerRemarkText(layer)};
         for (int column = 0; column < LayerColumns; ++column) {
             auto* item = new QTableWidgetItem(texts[column]);
@@ -111,7 +123,8 @@ void CImportDialog::MakeFields(QFormLayout* form)
 {
     auto* layers = new QLabel(tr("&Layers:"));
     layers->setBuddy(m_layers);
-    form->addRow(layers, m_layers);
+    form->addRow(layers);
+    form->addRow(m_layers);
     form->addRow(tr("Field with the &name:"), m_name);
     form->addRow(tr("Field with the &first chainage [m]:"), m_start);
     form->addRow(tr("Field with the la&st chainage [m]:"), m_end);

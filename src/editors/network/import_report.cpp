@@ -98,7 +98,7 @@ void AddDistance(const CImport& import, const CNetwork& network, std::vector<CIm
         remarks.push_back(
             {Text::tr("These lines lie %1 away from the branches of the network: they may be in different "
                       "coordinate systems.")
-                 .arg(Length(gap)),
+                 .arg(Length(std::round(gap))),
              true});
 }
 

@@ -5,6 +5,7 @@
 #include <QLabel>
 #include <QSplitter>
 #include <QVBoxLayout>
+#include <algorithm>
 
 namespace {
 constexpr int RefreshDelay = 60; // milliseconds: shorter than a blink, longer than a burst of changes
@@ -75,7 +76,7 @@ void CNetworkView::MakeTables(QSplitter* splitter)
     splitter->addWidget(side);
     connect(m_branches->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
             &CNetworkView::CurrentBranchChanged);
-    connect(Document(), &CNetworkDoc::NetworkChanged, this, &CNetworkView::CurrentBranchChanged);
+    connect(Document(), &CNetworkDoc::NetworkChanged, this, &CNetworkView::NetworkChanged);
     if (m_branchTable->rowCount() > 0)
         m_branches->GoTo(0, CBranchTable::Name);
     CurrentBranchChanged();
@@ -97,6 +98,15 @@ CLinesView* CNetworkView::MakeTable(CNetworkTable* model, const char* name)
     return table;
 }
 
+/// A table that was filled anew has no current line: it goes on with the one that stands there now.
+void CNetworkView::NetworkChanged()
+{
+    const int lines = m_branchTable->rowCount();
+    if (!m_branches->currentIndex().isValid() && lines > 0)
+        m_branches->GoTo(std::clamp(m_channelTable->Branch(), 0, lines - 1), CBranchTable::Name);
+    CurrentBranchChanged();
+}
+
 void CNetworkView::CurrentBranchChanged()
 {
     const int branch = m_branches->currentIndex().row();
@@ -105,8 +115,8 @@ void CNetworkView::CurrentBranchChanged()
     const auto& branches = Document()->Network().branches;
     const bool some = branch >= 0 && std::size_t(branch) < branches.size();
     m_channelTitle->setText(
-        some ? tr("&Channel of %1").arg(QString(branches[std::size_t(branch)].name).replace(u'&', QStringLiteral("&&")))
-             : tr("&Channel"));
+        some ? tr("C&hannel of %1").arg(QString(branches[std::size_t(branch)].name).replace(u'&', QStringLiteral("&&")))
+             : tr("C&hannel"));
 }
 
 CLinesView* CNetworkView::FocusTable() const

@@ -55,6 +55,7 @@ private:
     CLinesView* FocusTable() const;
     void Retranslate();
     void UnitsChanged();
+    void NetworkChanged();
     void CurrentBranchChanged();
     void PickedChanged();
     void LocationsChanged();

@@ -16,8 +16,8 @@ QString WhyNoLines(const QString& name, const CGisFile& file)
     for (const CGisLayer& layer : file.layers) {
         if (layer.Lines() > 0)
             return {};
-        QString text = QStringLiteral("%1: %2 (%3)").arg(layer.name, GeometryText(layer.geometry),
-                                                         QString::number(layer.features.size()));
+        QString text = QStringLiteral("%1: %2 (%3)")
+                           .arg(layer.name, GeometryText(layer.geometry), QString::number(layer.features.size()));
         for (const CGisFeature& feature : layer.features) {
             if (!feature.error.isEmpty()) {
                 text += QStringLiteral(" - ") + feature.error;

@@ -279,6 +279,7 @@ TEST_F(ImportTest, TheDialogShowsWhatItGivesAndDoesNothingBeforeItIsAccepted)
         EXPECT_EQ(layers->item(0, 4)->text(), "cannot be taken: no lines among 1 features");
         EXPECT_FALSE(layers->item(0, 0)->flags().testFlag(Qt::ItemIsSelectable));
         EXPECT_EQ(layers->item(2, 3)->text(), "WGS 84 (EPSG:4326)");
+        EXPECT_EQ(layers->item(1, 1)->text(), "Line String, Point");
         EXPECT_EQ(layers->currentRow(), 1);
         EXPECT_EQ(dialog->findChild<QComboBox*>("nameField")->currentText(), "River");
         EXPECT_EQ(dialog->findChild<QComboBox*>("endField")->currentText(), "to");
@@ -318,6 +319,7 @@ TEST_F(ImportTest, TheDialogShowsWhatItGivesAndDoesNothingBeforeItIsAccepted)
     EXPECT_EQ(view->Document()->UndoStack().count(), 1);
     view->Document()->UndoStack().undo();
     EXPECT_EQ(view->Document()->Network().branches.size(), 2u);
+    EXPECT_EQ(view->Branches()->currentIndex().row(), 1) << "the last one that is left";
     EXPECT_FALSE(view->Document()->IsModified());
 }
 

@@ -495,6 +495,10 @@
             <source>The library that reads GIS files could not be loaded: %1</source>
             <translation>The library that reads GIS files could not be loaded: %1</translation>
         </message>
+        <message>
+            <source>&quot;%1&quot; (%2)</source>
+            <translation>&quot;%1&quot; (%2)</translation>
+        </message>
     </context>
     <context>
         <name>LocationKinds</name>

@@ -495,6 +495,10 @@
             <source>The library that reads GIS files could not be loaded: %1</source>
             <translation>GISファイルを読み込むライブラリをロードできませんでした: %1</translation>
         </message>
+        <message>
+            <source>&quot;%1&quot; (%2)</source>
+            <translation>「%1」(%2)</translation>
+        </message>
     </context>
     <context>
         <name>LocationKinds</name>
