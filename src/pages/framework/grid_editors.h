@@ -65,7 +65,6 @@ protected:
 private:
     void LostFocus(const QEvent* event);
     void PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
-    void PaintMark(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
     void PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
 
     CGenGrid* m_grid;

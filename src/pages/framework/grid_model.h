@@ -53,6 +53,8 @@ public:
     /// Why the cell would not take the text; empty when it would.
     QString Refusal(int row, int column, const QString& text) const;
     bool IsLocked(int row, int column) const;
+    /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
+    bool HidesDigits(int row, int column) const;
 
     /// Writes what the row's cells hold into an object of the source's kind.
     void CopyRow(int row, void* target) const;
