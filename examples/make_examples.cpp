@@ -36,12 +36,12 @@ int WriteProject(const std::string& folder)
 {
     std::error_code error;
     std::filesystem::create_directories(PathFromUtf8(folder), error);
-    int failed = Outcome(SaveHDFile(SampleRiver(), folder + "/river.hdkv"));
+    int failed = Outcome(SaveHDFile(SampleRiver(), folder + "/river.HDKV"));
     failed = failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvnw", SampleNetworkText()));
     failed = failed ? failed : Outcome(WriteFileSafely(folder + "/river.kvxs", SampleSectionsText()));
     return failed ? failed
                   : Outcome(WriteFileSafely(folder + "/river.kvrp",
-                                            ProjectText({"river.hdkv", "river.kvnw", "river.kvxs"})));
+                                            ProjectText({"river.HDKV", "river.kvnw", "river.kvxs"})));
 }
 
 int WriteLongRiver(std::string_view locations, const std::string& file)

@@ -11,7 +11,7 @@ int Complain(std::string_view message, int code)
 
 void PrintFinding(std::ostream& stream, const std::string& path, const Finding& finding)
 {
-    stream << path << ':' << finding.line << ':' << finding.column << ": " << finding.text << '\n';
+    stream << path << ':' << finding.line << ':' << finding.column << ": " << FindingText(finding) << '\n';
 }
 
 int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters)
@@ -22,15 +22,16 @@ int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters
     const tqlHandle handle = structure.value().Get();
     if (!tqlTargetByNameNum(handle, HDTargetName, 1))
         return Complain(path + " is no HD parameter file: it has no target [" + HDTargetName + "].", Exit::Unreadable);
-    if (purpose == Purpose::Rewrite) {
-        auto findings = CheckHDStructure(handle);
-        std::erase_if(findings, [](const Finding& finding) { return !finding.losesContent; });
-        for (const Finding& finding : findings)
-            PrintFinding(std::cerr, path, finding);
-        if (!findings.empty())
-            return Complain("Nothing was written, because what is listed above would be lost.", Exit::Findings);
-    }
-    parameters.Load(handle);
+    LoadReport report(handle);
+    parameters.Load(handle, &report);
+    if (purpose == Purpose::Read)
+        return Exit::Fine;
+    const auto findings = report.Take();
+    for (const Finding& finding : findings)
+        PrintFinding(std::cerr, path, finding);
+    if (std::ranges::any_of(findings, &Finding::LosesContent))
+        return Complain("Nothing was written, because something of what is listed above would be lost.",
+                        Exit::Findings);
     return Exit::Fine;
 }
 

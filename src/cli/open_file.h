@@ -17,8 +17,8 @@ enum class Purpose
     Rewrite
 };
 
-/// Reads an HD parameter file; Exit::Fine, or a code after a message. For a rewrite a file with content that reading
-/// does not keep is refused with its findings.
+/// Reads an HD parameter file; Exit::Fine, or a code after a message. For a rewrite it is told what is not taken as it
+/// stands, and a file with content that reading does not keep is refused.
 int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters);
 
 /// Saves with everything in it, incomplete lines and encroachment sets included.

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "data/field.h"
+#include "data/finding.h"
 #include "tql/tql.h"
 
 /// Number of file parameters of one element of a group (elements hold no groups).
@@ -13,11 +14,16 @@ bool CountFits(const GroupAccess& group, std::int32_t count, int paramsLeft);
 /// Walks the parameters of one keyword.
 struct ParamCursor
 {
+    tqlHandle keyword;
     tqlHandle param; // null behind the last
     int number = 1;
     int count;
+    LoadReport* report; // may be null
 
-    explicit ParamCursor(tqlHandle keyword) : param(tqlParamByNum(keyword, 1)), count(tqlGetNoParams(keyword)) {}
+    explicit ParamCursor(tqlHandle itsKeyword, LoadReport* itsReport = nullptr)
+        : keyword(itsKeyword), param(tqlParamByNum(keyword, 1)), count(tqlGetNoParams(keyword)), report(itsReport)
+    {
+    }
     int Left() const { return count - number + 1; }
     /// Reads the parameter and goes to the next; false, and the value untouched, when it is of another type.
     template <typename Value>
@@ -43,10 +49,16 @@ struct ParamCursor
     }
 };
 
-/// Reads parameters into the object and leaves the cursor behind them. What is missing or of another type keeps its
+/// Reads parameters into the object and leaves the cursor behind them. A value of another type whose meaning is beyond
+/// doubt is taken: 2.0 where an integer is expected, 1 for true. What is missing or of another type otherwise keeps its
 /// value. A group whose count does not fit the parameters that are there keeps its elements, and nothing behind it can
-/// be told apart, so reading ends.
-void ReadFields(ParamCursor& params, FieldList fields, void* object);
+/// be told apart, so reading ends. All of this is reported. False when parameters were missing.
+bool ReadFields(ParamCursor& params, FieldList fields, void* object);
+/// Parameters behind those that were read stay with their object; that is reported, too.
+void ReadExtra(ParamCursor& params, ExtraParams& extra);
+
+/// The object's parameters in file notation.
+std::string ParamsText(FieldList fields, const void* object);
 
 /// Appends the object's parameters to the keyword being written.
 void WriteFields(tqlHandle structure, FieldList fields, const void* object);

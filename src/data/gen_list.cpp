@@ -92,20 +92,41 @@ void CGenParamListBase::Save(tqlHandle structure) const
     tqlEndSection(structure);
 }
 
-void CGenParamListBase::Load(tqlHandle parent, int number)
+namespace {
+
+void ReportIncomplete(LoadReport& report, tqlHandle keyword)
+{
+    // A name or chainage that is missing or no name or number has been reported as such.
+    std::string name;
+    double chainage = 0;
+    const tqlHandle first = tqlParamByNum(keyword, 1), second = tqlParamByNum(keyword, 2);
+    if (tqlGetString(first, &name) && name.empty())
+        report.Add(keyword, keyword, {.kind = Finding::IncompleteLine, .parameter = 1});
+    else if (tqlGetDouble(second, &chainage) && chainage == NotGiven)
+        report.Add(keyword, keyword, {.kind = Finding::IncompleteLine, .parameter = 2});
+}
+
+} // namespace
+
+void CGenParamListBase::Load(tqlHandle parent, int number, LoadReport* report)
 {
     const tqlHandle section = tqlSectionByNameNum(parent, m_sectionName, number);
     if (!section)
         return;
+    if (report)
+        report->InSection(m_sectionName);
     const int records = tqlGetNoKeywords(section, "DATA");
     Reserve(GetCount() + static_cast<std::size_t>(records));
     for (int occurrence = 1; occurrence <= records; ++occurrence) {
         auto record = NewRecord();
-        record->Load(tqlKeywordByNameNum(section, "DATA", occurrence));
+        const tqlHandle keyword = tqlKeywordByNameNum(section, "DATA", occurrence);
+        record->Load(keyword, report);
+        if (report && record->IsBlank() && (occurrence > 1 || !report->firstLineMayBeBlank))
+            ReportIncomplete(*report, keyword);
         AddTail(std::move(record));
     }
     if (tqlGetNoKeywords(section) != records || tqlGetNoSections(section) != 0)
-        CollectUnknown(section, &KnownName, m_unknown);
+        CollectUnknown(section, &KnownName, m_unknown, report);
 }
 
 Known CGenParamListBase::KnownName(std::string_view name, bool isSection)

@@ -2,6 +2,7 @@
 // in constant time.
 #pragma once
 
+#include "data/finding.h"
 #include "data/river_pos.h"
 #include "data/unknown_content.h"
 
@@ -73,7 +74,7 @@ public:
     /// Writes the section with every record, blank ones too.
     virtual void Save(tqlHandle structure) const;
     /// Appends the records of occurrence `number` of the section; a missing section leaves the list as it is.
-    virtual void Load(tqlHandle parent, int number);
+    virtual void Load(tqlHandle parent, int number, LoadReport* report = nullptr);
 
     /// What the section held beside its records. It stays when the records are removed.
     const UnknownNodes& Unknown() const { return m_unknown; }
@@ -151,15 +152,21 @@ public:
         tqlEndSection(structure);
     }
     /// Appends one sub-list for each sub-section of their name.
-    void Load(tqlHandle parent, int number = 1)
+    void Load(tqlHandle parent, int number = 1, LoadReport* report = nullptr)
     {
         const tqlHandle outer = tqlSectionByNameNum(parent, m_outerSection, number);
         if (!outer)
             return;
+        // The first line of a set does not count as a location: a set with that one only is not kept.
+        if (report)
+            report->firstLineMayBeBlank = true;
         for (int inner = 1; tqlSectionByNameNum(outer, m_innerSection, inner); ++inner)
-            Add().Load(outer, inner);
+            Add().Load(outer, inner, report);
+        if (report)
+            report->firstLineMayBeBlank = false;
         CollectUnknown(
-            outer, [this](std::string_view name, bool isSection) { return KnownName(name, isSection); }, m_unknown);
+            outer, [this](std::string_view name, bool isSection) { return KnownName(name, isSection); }, m_unknown,
+            report);
     }
     Known KnownName(std::string_view name, bool isSection) const
     {

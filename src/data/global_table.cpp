@@ -113,9 +113,11 @@ constexpr GlobalKeyword mixingCoefficients[] = {{"MixingCoef", mixingCoef}};
 constexpr Field title[] = {Plain(FieldKind::Text, "Title")};
 constexpr Field interpolate[] = {Plain(FieldKind::Boolean, "Interpolate")};
 constexpr GroupAccess titles = GroupOf<std::vector<std::string>>(title, true);
-constexpr GroupAccess interpolates = GroupOf<std::deque<bool>>(interpolate, true);
+} // namespace
+constexpr GroupAccess HDMarkFlags = GroupOf<std::deque<bool>>(interpolate, true);
+namespace {
 constexpr GlobalKeyword markTitles[] = {Group<&G::MarkTitles>("MarkTitles", titles),
-                                        Group<&G::MarkInterpolate>("MarkInterpolate", interpolates)};
+                                        Group<&G::MarkInterpolate>("MarkInterpolate", HDMarkFlags)};
 
 using B = HDBedResistTools;
 constexpr Field bedResist[] = {Integer<&G::BedResist, &B::Method>("Method"),

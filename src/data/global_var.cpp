@@ -6,16 +6,16 @@
 
 namespace {
 
-void LoadItems(tqlHandle section, const GroupAccess& group, void* container)
+void LoadItems(tqlHandle section, const GroupAccess& group, void* container, LoadReport* report)
 {
     const int count = tqlGetNoKeywords(section, HDItemKeyword);
     group.resize(container, 0); // new elements start with their defaults
     group.resize(container, static_cast<std::size_t>(count));
     for (int number = 1; number <= count; ++number) {
         void* const element = group.at(container, static_cast<std::size_t>(number - 1));
-        ParamCursor params(tqlKeywordByNameNum(section, HDItemKeyword, number));
+        ParamCursor params(tqlKeywordByNameNum(section, HDItemKeyword, number), report);
         ReadFields(params, group.elements, element);
-        group.extra(element)->Read(params.param);
+        ReadExtra(params, *group.extra(element));
     }
 }
 
@@ -28,48 +28,84 @@ void SaveItems(tqlHandle structure, const GroupAccess& group, void* container)
     }
 }
 
+const GlobalKeyword* FindRow(const GlobalSection& table, std::string_view name)
+{
+    const auto found = std::ranges::find(table.keywords, name, &GlobalKeyword::name);
+    return found == table.keywords.end() ? nullptr : &*found;
+}
+
 } // namespace
 
-void HD_Global_Var::Load(tqlHandle target)
+void HD_Global_Var::Load(tqlHandle target, LoadReport* report)
 {
     const tqlHandle global = tqlSectionByNameNum(target, HDGlobalSectionName, 1);
     if (!global)
         return;
     for (const GlobalSection& table : HDGlobalSections())
         if (const tqlHandle section = tqlSectionByNameNum(global, table.name, 1))
-            LoadSection(section, table);
-    CollectUnknown(global, &HDKnownGlobalSection, m_unknown[HDGlobalSectionName]);
+            LoadSection(section, table, report);
+    CollectUnknown(global, &HDKnownGlobalSection, m_unknown[HDGlobalSectionName], report);
 }
 
-void HD_Global_Var::LoadSection(tqlHandle section, const GlobalSection& table)
+void HD_Global_Var::LoadSection(tqlHandle section, const GlobalSection& table, LoadReport* report)
 {
+    if (report)
+        report->InSection(table.name);
     for (const GlobalKeyword& row : table.keywords) {
         const tqlHandle keyword = tqlKeywordByNameNum(section, row.name, 1);
-        if (!keyword || (!row.onlyWith.empty() && !tqlKeywordByNameNum(section, row.onlyWith, 1)))
+        if (!keyword)
             continue;
-        ParamCursor params(keyword);
-        ReadFields(params, row.Fields(), this);
-        ExtraParams extra;
-        extra.Read(params.param);
-        if (extra.IsEmpty())
-            m_extra.erase(&row);
-        else
-            m_extra[&row] = std::move(extra);
+        if (row.onlyWith.empty() || tqlKeywordByNameNum(section, row.onlyWith, 1)) {
+            LoadKeyword(keyword, row, report);
+            continue;
+        }
+        m_unread[&row] = tqlGetRawParams(keyword);
+        if (report)
+            report->Add(keyword, keyword, {.kind = Finding::NotRead, .field = std::string(row.onlyWith)});
     }
     for (const Field& items : table.items) {
         const tqlHandle inner = tqlSectionByNameNum(section, items.name, 1);
         if (!inner)
             continue;
-        LoadItems(inner, *items.group, items.address(this));
-        CollectUnknown(inner, &HDKnownItem, m_unknown[items.name]);
+        if (report)
+            report->InSection(items.name);
+        LoadItems(inner, *items.group, items.address(this), report);
+        CollectUnknown(inner, &HDKnownItem, m_unknown[items.name], report);
     }
+    if (report)
+        report->InSection(table.name);
     CollectUnknown(
         section, [&table](std::string_view name, bool isSection) { return HDKnownInSection(table, name, isSection); },
-        m_unknown[table.name]);
+        m_unknown[table.name], report);
+}
+
+void HD_Global_Var::LoadKeyword(tqlHandle keyword, const GlobalKeyword& row, LoadReport* report)
+{
+    ParamCursor params(keyword, report);
+    ReadFields(params, row.Fields(), this);
+    ExtraParams extra;
+    ReadExtra(params, extra);
+    if (extra.IsEmpty())
+        m_extra.erase(&row);
+    else
+        m_extra[&row] = std::move(extra);
+    // The titles stand before their flags in the table, and so are read by now.
+    if (report && row.Fields().front().group == &HDMarkFlags && MarkInterpolate.size() > MarkTitles.size())
+        report->Add(keyword, keyword,
+                    {.kind = Finding::SurplusFlags,
+                     .behind = static_cast<int>(MarkTitles.size()),
+                     .found = std::string(tqlGetRawParams(keyword)),
+                     .used = std::to_string(MarkTitles.size())});
 }
 
 void HD_Global_Var::Save(tqlHandle structure) const
 {
+    if (MarkInterpolate.size() != MarkTitles.size()) {
+        HD_Global_Var even(*this);
+        even.MarkInterpolate.resize(MarkTitles.size());
+        even.Save(structure);
+        return;
+    }
     tqlAddSection(structure, HDGlobalSectionName);
     for (const GlobalSection& table : HDGlobalSections())
         SaveSection(structure, table);
@@ -81,6 +117,10 @@ void HD_Global_Var::SaveSection(tqlHandle structure, const GlobalSection& table)
 {
     tqlAddSection(structure, table.name);
     for (const GlobalKeyword& row : table.keywords) {
+        if (const std::string* const unread = Unread(table, row)) {
+            tqlAddRawKeyword(structure, row.name, *unread);
+            continue;
+        }
         tqlAddKeyword(structure, row.name);
         WriteFields(structure, row.Fields(), this);
         if (const auto extra = m_extra.find(&row); extra != m_extra.end())
@@ -96,6 +136,20 @@ void HD_Global_Var::SaveSection(tqlHandle structure, const GlobalSection& table)
     tqlEndSection(structure);
 }
 
+/// What stood in the file for a keyword that was not read; null when there is nothing such, or when its value or the
+/// one that opens it have been set since.
+const std::string* HD_Global_Var::Unread(const GlobalSection& table, const GlobalKeyword& row) const
+{
+    const auto found = m_unread.find(&row);
+    if (found == m_unread.end())
+        return nullptr;
+    static const HD_Global_Var defaults;
+    const GlobalKeyword* const opener = FindRow(table, row.onlyWith);
+    const bool untouched =
+        SameFields(row.Fields(), this, &defaults) && opener && SameFields(opener->Fields(), this, &defaults);
+    return untouched ? &found->second : nullptr;
+}
+
 void HD_Global_Var::SaveUnknown(tqlHandle structure, std::string_view section) const
 {
     if (const auto found = m_unknown.find(section); found != m_unknown.end())
@@ -106,6 +160,7 @@ void HD_Global_Var::ClearUnknown()
 {
     m_unknown.clear();
     m_extra.clear();
+    m_unread.clear();
 }
 
 Known HDKnownGlobalSection(std::string_view name, bool isSection)
@@ -117,9 +172,8 @@ Known HDKnownGlobalSection(std::string_view name, bool isSection)
 
 Known HDKnownInSection(const GlobalSection& table, std::string_view name, bool isSection)
 {
-    const bool known = isSection
-                           ? std::ranges::find(table.items, name, &Field::name) != table.items.end()
-                           : std::ranges::find(table.keywords, name, &GlobalKeyword::name) != table.keywords.end();
+    const bool known = isSection ? std::ranges::find(table.items, name, &Field::name) != table.items.end()
+                                 : FindRow(table, name) != nullptr;
     return known ? Known::First : Known::No;
 }
 

@@ -210,22 +210,26 @@ public:
 
     /// Reads section "Global_Variables" of the target. Sections, keywords and parameters that are missing keep their
     /// values.
-    void Load(tqlHandle target);
-    /// Writes the section, every keyword of the table, then what the table does not know.
+    void Load(tqlHandle target, LoadReport* report = nullptr);
+    /// Writes the section, every keyword of the table, then what the table does not know. There is one flag a mark
+    /// title, whatever was read.
     void Save(tqlHandle structure) const;
     void ClearUnknown();
 
 private:
-    void LoadSection(tqlHandle section, const GlobalSection& table);
+    void LoadSection(tqlHandle section, const GlobalSection& table, LoadReport* report);
+    void LoadKeyword(tqlHandle keyword, const GlobalKeyword& row, LoadReport* report);
+    const std::string* Unread(const GlobalSection& table, const GlobalKeyword& row) const;
     void SaveSection(tqlHandle structure, const GlobalSection& table) const;
     void SaveUnknown(tqlHandle structure, std::string_view section) const;
 
     std::map<std::string_view, UnknownNodes> m_unknown; // by the name of the known section it stood in
     std::map<const GlobalKeyword*, ExtraParams> m_extra;
+    std::map<const GlobalKeyword*, std::string> m_unread; // parameters of keywords that another one's absence closed
 };
 
 // The elements of the lists without locations.
-extern const GroupAccess TextOutItems, TextAutoFiles, MapsOutputs, MapsInputs;
+extern const GroupAccess HDMarkFlags, TextOutItems, TextAutoFiles, MapsOutputs, MapsInputs;
 
 /// The section of a file that holds the global values.
 inline constexpr std::string_view HDGlobalSectionName = "Global_Variables";

@@ -53,18 +53,22 @@ Known HDKnownTarget(std::string_view name, bool isSection)
     return isSection && name == HDTargetName ? Known::First : Known::No;
 }
 
-void HD_Parameters::Load(tqlHandle structure)
+void HD_Parameters::Load(tqlHandle structure, LoadReport* report)
 {
     const tqlHandle target = tqlTargetByNameNum(structure, HDTargetName, 1);
-    Global.Load(target);
+    if (!target && report) {
+        report->Add(nullptr, nullptr, {.kind = Finding::NoTarget, .section = HDTargetName});
+        report = nullptr; // that says it all
+    }
+    Global.Load(target, report);
     for (const ListEntry& entry : lists) {
         if (entry.list)
-            entry.list(*this)->Load(target, 1);
+            entry.list(*this)->Load(target, 1, report);
         else
-            EncroachList.Load(target);
+            EncroachList.Load(target, 1, report);
     }
-    CollectUnknown(target, &HDKnownSection, Unknown.InTarget);
-    CollectUnknown(structure, &HDKnownTarget, Unknown.Targets);
+    CollectUnknown(target, &HDKnownSection, Unknown.InTarget, report);
+    CollectUnknown(structure, &HDKnownTarget, Unknown.Targets, report);
 }
 
 void HD_Parameters::Save(tqlHandle structure, bool everySet) const

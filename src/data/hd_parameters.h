@@ -34,7 +34,7 @@ struct HD_Parameters
 
     /// Reads the target "KAVO0_HD" of a loaded structure; what is missing keeps its value. Lists are appended to, so
     /// a reader of a second file calls RemoveAllRecords first.
-    void Load(tqlHandle structure);
+    void Load(tqlHandle structure, LoadReport* report = nullptr);
     /// Writes the target with everything in file order, then unknown targets. Encroachment sets without a filled line
     /// from the second on are left out unless `everySet`.
     void Save(tqlHandle structure, bool everySet = false) const;

@@ -11,13 +11,12 @@ void WriteRecord(tqlHandle structure, const HD_RiverPos& record, FieldList field
     record.Extra.Write(structure);
 }
 
-void ReadRecord(tqlHandle keyword, HD_RiverPos& record, FieldList fields)
+void ReadRecord(tqlHandle keyword, LoadReport* report, HD_RiverPos& record, FieldList fields)
 {
-    ParamCursor params(keyword);
-    params.Take(&record.RiverName);
-    params.Take(&record.Chainage);
-    ReadFields(params, fields, &record);
-    record.Extra.Read(params.param);
+    ParamCursor params(keyword, report);
+    if (ReadFields(params, LocationFields(), &record))
+        ReadFields(params, fields, &record);
+    ReadExtra(params, record.Extra);
 }
 
 FieldList LocationFields()

@@ -19,7 +19,7 @@ std::error_code Outcome(BOOL succeeded)
 class WindowsFile final : public PlatformFile
 {
 public:
-    std::error_code Create(const std::filesystem::path& path, Handle& file) override
+    std::error_code Create(const std::filesystem::path& path, Access, Handle& file) override
     {
         const HANDLE handle =
             ::CreateFileW(path.c_str(), GENERIC_WRITE, 0, nullptr, CREATE_NEW, FILE_ATTRIBUTE_NORMAL, nullptr);
@@ -58,11 +58,24 @@ public:
 
     std::error_code Replace(const std::filesystem::path& from, const std::filesystem::path& to) override
     {
-        if (::ReplaceFileW(to.c_str(), from.c_str(), nullptr, REPLACEFILE_IGNORE_MERGE_ERRORS, nullptr, nullptr))
+        // Without a backup's name a replacement that fails half way deletes the old file.
+        const std::filesystem::path backup = from.native() + L".old";
+        if (::ReplaceFileW(to.c_str(), from.c_str(), backup.c_str(), REPLACEFILE_IGNORE_MERGE_ERRORS, nullptr,
+                           nullptr)) {
+            ::DeleteFileW(backup.c_str());
             return {};
-        if (::GetLastError() != ERROR_FILE_NOT_FOUND)
-            return LastError();
+        }
+        const std::error_code error = LastError();
+        if (error.value() == ERROR_UNABLE_TO_MOVE_REPLACEMENT_2)
+            ::MoveFileExW(backup.c_str(), to.c_str(), MOVEFILE_WRITE_THROUGH);
+        if (error.value() != ERROR_FILE_NOT_FOUND)
+            return error;
         return Outcome(::MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_WRITE_THROUGH));
+    }
+
+    std::error_code Rename(const std::filesystem::path& from, const std::filesystem::path& to) override
+    {
+        return Outcome(::MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH));
     }
 
     std::error_code SyncFolder(const std::filesystem::path&) override { return {}; } // the journal sees to it

@@ -3,12 +3,18 @@
 
 #include <cstddef>
 #include <string>
+#include <system_error>
 #include <utility>
 #include <variant>
 
 struct Error
 {
-    std::string message; // one sentence for the user: what, where and why
+    std::string message{}; // one sentence in English: what, where and why
+    // What a program that speaks other languages needs to say it itself. Set when a file could not be read or written.
+    std::error_code code{};
+    std::string path{};
+    bool reading = false;
+    std::string kept{}; // the file that holds the new content, when there is no other any more
 };
 
 template <typename T>

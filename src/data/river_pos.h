@@ -8,6 +8,8 @@
 #include <memory>
 #include <string>
 
+class LoadReport;
+
 /// Marks a chainage (or another number of a table) that has not been given; compared exactly.
 inline constexpr double NotGiven = 1.0e10;
 
@@ -26,7 +28,7 @@ public:
     /// Appends this record to the file being written, as one keyword "DATA" in the current section.
     virtual void Save(tqlHandle /*structure*/) const {}
     /// Reads this record from one keyword "DATA" by parameter number; what is not there keeps its value.
-    virtual void Load(tqlHandle /*keyword*/) {}
+    virtual void Load(tqlHandle /*keyword*/, LoadReport* /*report*/ = nullptr) {}
     /// The fields after RiverName and Chainage, in file order.
     virtual FieldList Fields() const { return {}; }
 

@@ -2,6 +2,7 @@
 
 #include "data/utf8_path.h"
 
+#include <cerrno>
 #include <fstream>
 #include <random>
 
@@ -9,9 +10,26 @@ namespace fs = std::filesystem;
 
 namespace {
 
-Error Failed(const char* what, const std::string& path, const std::string& reason)
+std::string ReasonText(std::error_code reason)
 {
-    return {std::string("Could not ") + what + " \"" + path + "\": " + reason + "."};
+    if (reason == std::errc::is_a_directory)
+        return "it is a folder";
+    if (reason == std::errc::operation_not_supported)
+        return "it is not an ordinary file";
+    return reason.message();
+}
+
+Error NotWritten(const std::string& path, std::error_code reason)
+{
+    return {.message = "Could not write \"" + path + "\": " + ReasonText(reason) + ".", .code = reason, .path = path};
+}
+
+Error NotRead(const std::string& path, std::error_code reason)
+{
+    return {.message = "Could not read \"" + path + "\": " + ReasonText(reason) + ".",
+            .code = reason,
+            .path = path,
+            .reading = true};
 }
 
 /// The file that a chain of symbolic links ends at, whether it exists or not.
@@ -31,14 +49,14 @@ std::error_code FollowLinks(fs::path& path)
 }
 
 /// Creates a file of a name that nobody has. The name does not contain the target's, which may be as long as names get.
-std::error_code CreateTemporary(PlatformFile& platform, const fs::path& folder, fs::path& path,
-                                PlatformFile::Handle& file)
+std::error_code CreateTemporary(PlatformFile& platform, const fs::path& folder, PlatformFile::Access access,
+                                fs::path& path, PlatformFile::Handle& file)
 {
     std::random_device random;
     std::error_code error;
     for (int attempt = 0; attempt < 100; ++attempt) {
         path = folder / (".kvr-" + std::to_string(random()) + ".tmp");
-        error = platform.Create(path, file);
+        error = platform.Create(path, access, file);
         if (error != std::errc::file_exists)
             break;
     }
@@ -70,19 +88,37 @@ std::error_code Fill(PlatformFile& platform, PlatformFile::Handle file, std::str
 }
 
 /// What stands in the way of replacing an existing target.
-std::string Obstacle(PlatformFile& platform, const fs::path& target, bool& exists)
+std::error_code Obstacle(PlatformFile& platform, const fs::path& target, bool& exists)
 {
-    std::error_code error;
-    const fs::file_status status = fs::status(target, error);
+    std::error_code ignored;
+    const fs::file_status status = fs::status(target, ignored);
     exists = fs::exists(status);
     if (!exists)
         return {};
     if (fs::is_directory(status))
-        return "it is a folder";
+        return std::make_error_code(std::errc::is_a_directory);
     if (!fs::is_regular_file(status))
-        return "it is not an ordinary file";
-    error = platform.CheckWritable(target);
-    return error ? error.message() : std::string();
+        return std::make_error_code(std::errc::operation_not_supported);
+    return platform.CheckWritable(target);
+}
+
+/// Puts the finished temporary file in the place of the target. A replacement that fails half way may have cost the
+/// target; then the temporary file is all there is, and stays.
+Result<void> PutInPlace(PlatformFile& platform, const fs::path& temporary, const fs::path& target, bool existed,
+                        const std::string& path)
+{
+    const std::error_code error = platform.Replace(temporary, target);
+    if (!error)
+        return {};
+    Error failure = NotWritten(path, error);
+    std::error_code ignored;
+    if (existed && !fs::exists(target, ignored)) {
+        failure.kept = Utf8FromPath(temporary);
+        failure.message += " The new content is complete in \"" + failure.kept + "\".";
+    } else {
+        fs::remove(temporary, ignored);
+    }
+    return failure;
 }
 
 } // namespace
@@ -91,27 +127,25 @@ Result<void> WriteFileSafely(const std::string& path, std::string_view text, con
 {
     PlatformFile& platform = options.platform ? *options.platform : PlatformFile::Native();
     fs::path target = PathFromUtf8(path);
-    std::error_code error = FollowLinks(target);
-    if (error)
-        return Failed("write", path, error.message());
+    if (const std::error_code error = FollowLinks(target))
+        return NotWritten(path, error);
     bool exists = false;
-    if (const std::string obstacle = Obstacle(platform, target, exists); !obstacle.empty())
-        return Failed("write", path, obstacle);
+    if (const std::error_code obstacle = Obstacle(platform, target, exists))
+        return NotWritten(path, obstacle);
 
     const fs::path folder = target.has_parent_path() ? target.parent_path() : fs::path(".");
+    const auto access = exists ? PlatformFile::Access::OwnerOnly : PlatformFile::Access::New;
     fs::path temporary;
     PlatformFile::Handle file = 0;
-    error = CreateTemporary(platform, folder, temporary, file);
-    if (error)
-        return Failed("write", path, error.message());
-    error = Fill(platform, file, text, options.sync, exists ? &target : nullptr);
-    if (!error)
-        error = platform.Replace(temporary, target);
-    if (error) {
+    if (const std::error_code error = CreateTemporary(platform, folder, access, temporary, file))
+        return NotWritten(path, error);
+    if (const std::error_code error = Fill(platform, file, text, options.sync, exists ? &target : nullptr)) {
         std::error_code ignored;
         fs::remove(temporary, ignored);
-        return Failed("write", path, error.message());
+        return NotWritten(path, error);
     }
+    if (Result<void> put = PutInPlace(platform, temporary, target, exists, path); !put)
+        return put;
     // The new content is in place and whole. Should the folder not reach the medium before the power fails, the old
     // content is found whole instead: nothing that calling this a failure could still undo.
     if (options.sync)
@@ -119,7 +153,24 @@ Result<void> WriteFileSafely(const std::string& path, std::string_view text, con
     return {};
 }
 
-Result<std::string> KeepUnreadable(const std::string& path, PlatformFile* platformOrNull)
+Result<void> RenameFile(const std::string& from, const std::string& to, PlatformFile* platformOrNull)
+{
+    PlatformFile& platform = platformOrNull ? *platformOrNull : PlatformFile::Native();
+    const std::error_code error = platform.Rename(PathFromUtf8(from), PathFromUtf8(to));
+    return error ? NotWritten(to, error) : Result<void>();
+}
+
+std::string FreeCopyName(const std::string& path, std::string_view why)
+{
+    std::error_code ignored;
+    for (int number = 1;; ++number) {
+        std::string copy = path + '.' + std::string(why) + '-' + std::to_string(number);
+        if (!fs::exists(fs::symlink_status(PathFromUtf8(copy), ignored)))
+            return copy;
+    }
+}
+
+Result<std::string> KeepOriginal(const std::string& path, std::string_view why, PlatformFile* platformOrNull)
 {
     PlatformFile& platform = platformOrNull ? *platformOrNull : PlatformFile::Native();
     const Result<std::string> content = ReadWholeFile(path);
@@ -128,20 +179,18 @@ Result<std::string> KeepUnreadable(const std::string& path, PlatformFile* platfo
     std::string copy;
     PlatformFile::Handle file = 0;
     std::error_code error;
-    for (int number = 1;; ++number) {
-        copy = path + ".unreadable-" + std::to_string(number);
-        error = platform.Create(PathFromUtf8(copy), file);
-        if (error != std::errc::file_exists)
-            break;
-    }
+    do { // again when somebody else took the name meanwhile
+        copy = FreeCopyName(path, why);
+        error = platform.Create(PathFromUtf8(copy), PlatformFile::Access::OwnerOnly, file);
+    } while (error == std::errc::file_exists);
     if (error)
-        return Failed("write", copy, error.message());
+        return NotWritten(copy, error);
     const fs::path original = PathFromUtf8(path);
     error = Fill(platform, file, content.value(), true, &original);
     if (error) {
         std::error_code ignored;
         fs::remove(PathFromUtf8(copy), ignored);
-        return Failed("write", copy, error.message());
+        return NotWritten(copy, error);
     }
     return copy;
 }
@@ -152,11 +201,13 @@ Result<std::string> ReadWholeFile(const std::string& path)
     const fs::path file = PathFromUtf8(path);
     const auto size = fs::file_size(file, error);
     if (error)
-        return Failed("read", path, error.message());
+        return NotRead(path, error);
+    errno = 0;
     std::ifstream stream(file, std::ios::binary);
     std::string content(static_cast<std::size_t>(size), '\0');
     if (!stream.read(content.data(), static_cast<std::streamsize>(content.size())))
-        return Failed("read", path, "the file could not be opened or ended early");
+        return NotRead(path,
+                       std::make_error_code(errno == EACCES ? std::errc::permission_denied : std::errc::io_error));
     return content;
 }
 

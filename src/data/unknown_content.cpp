@@ -1,5 +1,7 @@
 #include "data/unknown_content.h"
 
+#include "data/finding.h"
+
 #include <unordered_set>
 
 namespace {
@@ -60,10 +62,16 @@ void ForEachUnknown(tqlHandle section, const KnownNames& known, const std::funct
     }
 }
 
-void CollectUnknown(tqlHandle section, const KnownNames& known, UnknownNodes& nodes)
+void CollectUnknown(tqlHandle section, const KnownNames& known, UnknownNodes& nodes, LoadReport* report)
 {
-    ForEachUnknown(section, known,
-                   [&nodes](tqlHandle node, bool isSection) { nodes.push_back(CopyNode(node, isSection)); });
+    ForEachUnknown(section, known, [&](tqlHandle node, bool isSection) {
+        const std::string_view name = tqlName(node);
+        if (report)
+            report->Add(node, isSection ? nullptr : node,
+                        {.kind = known(name, isSection) == Known::No ? Finding::Unknown : Finding::Repeated,
+                         .section = std::string(isSection ? name : std::string_view())});
+        nodes.push_back(CopyNode(node, isSection));
+    });
 }
 
 void WriteUnknown(tqlHandle structure, const UnknownNodes& nodes)

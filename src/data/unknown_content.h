@@ -9,6 +9,8 @@
 #include <string_view>
 #include <vector>
 
+class LoadReport;
+
 struct UnknownNode
 {
     std::string Name;
@@ -31,8 +33,8 @@ using KnownNames = std::function<Known(std::string_view name, bool isSection)>;
 void ForEachUnknown(tqlHandle section, const KnownNames& known,
                     const std::function<void(tqlHandle node, bool isSection)>& visit);
 
-/// Appends copies of those children, with everything in them.
-void CollectUnknown(tqlHandle section, const KnownNames& known, UnknownNodes& nodes);
+/// Appends copies of those children, with everything in them, and reports them.
+void CollectUnknown(tqlHandle section, const KnownNames& known, UnknownNodes& nodes, LoadReport* report = nullptr);
 /// Writes the nodes into the section being written, or as targets.
 void WriteUnknown(tqlHandle structure, const UnknownNodes& nodes);
 void WriteUnknownTargets(tqlHandle structure, const UnknownNodes& nodes);

@@ -73,8 +73,8 @@ int main(int argc, char** argv)
             constexpr int members = 3; // the first one is there, the others follow
             robot.Verify(QTest::qWaitFor([&] { return frame.findChildren<QMdiSubWindow*>().size() == members; }),
                          "the project opens all its files");
-            robot.Trigger("actionSideBySide");
-            DriveMainJob(robot, work + "/river.hdkv");
+            robot.Choose("actionSideBySide");
+            DriveMainJob(robot, work + "/river.HDKV");
             DriveProjectJob(robot);
             result = Report(robot);
             QCoreApplication::exit(result);

@@ -44,8 +44,8 @@ void ChangeGlobals(Robot& robot)
     auto* level = robot.Control<QLineEdit>(GlobalLevel);
     if (!level)
         return;
-    level->setFocus();
-    level->selectAll();
+    robot.ClickMiddle(level);
+    robot.Key(level, Qt::Key_A, Qt::ControlModifier);
     robot.Type(level, "3.125");
     robot.Key(level, Qt::Key_Tab);
     robot.Verify(level->text() == "3.125", "the field shows 3.125");
@@ -111,19 +111,19 @@ void SwitchUnits(Robot& robot, int row)
 {
     auto* grid = InitialGrid(robot);
     robot.Did("Switch to US customary units and back");
-    robot.Trigger("actionUsCustomary");
+    robot.Choose("actionUsCustomary");
     robot.Verify(CellText(grid, row, 1) == "4050", "the chainage 1234.5 m shows as 4050 ft");
     robot.Picture("initial-us-units");
-    robot.Trigger("actionMetric");
+    robot.Choose("actionMetric");
     robot.Verify(CellText(grid, row, 2) == "2.750", "the level shows 2.750 m again");
 }
 
 void ShowInJapanese(Robot& robot)
 {
     robot.Did("Switch to Japanese and back");
-    robot.Trigger("actionLanguage_ja");
+    robot.Choose("actionLanguage_ja");
     robot.Picture("initial-japanese");
-    robot.Trigger("actionLanguage_en_US");
+    robot.Choose("actionLanguage_en_US");
 }
 
 bool HoldsNewLine(const HD_Parameters& parameters, int row)
@@ -135,15 +135,10 @@ bool HoldsNewLine(const HD_Parameters& parameters, int row)
            line.InitialH == 2.75 && line.InitialQ == 18.25;
 }
 
-QAction* RecentFile(Robot& robot, const QString& path)
+bool OpenRecent(Robot& robot, const QString& path)
 {
-    auto* menu = robot.Frame().findChild<QAction*>("actionOpenRecent")->menu();
-    emit menu->aboutToShow();
-    for (QAction* action : menu->actions()) {
-        if (action->text().endsWith(QFileInfo(path).fileName()))
-            return action;
-    }
-    return nullptr;
+    QMenu* menu = robot.Frame().findChild<QAction*>("actionOpenRecent")->menu();
+    return robot.ChooseFrom(menu, [&](const QString& text) { return text.endsWith(QFileInfo(path).fileName()); });
 }
 
 void SaveCloseReopen(Robot& robot, const QString& file, int row)
@@ -154,12 +149,11 @@ void SaveCloseReopen(Robot& robot, const QString& file, int row)
     if (otherPages) {
         robot.Did("Visit every page and change a global and a local value on each");
         changes = ChangeEveryPage(robot);
-        sheet->setCurrentIndex(0);
-        robot.Settle();
+        GoToTab(robot, sheet, 0);
     }
     const double level = robot.Control<QLineEdit>(GlobalLevel)->text().toDouble();
     robot.Did("Save with Ctrl+S");
-    robot.Trigger("actionSave");
+    robot.KeyToFocus(Qt::Key_S, Qt::ControlModifier);
     const QString saved = robot.Frame().GetActiveView()->GetDocument()->GetPathName();
     robot.Verify(saved.endsWith(".HDKV") && QFileInfo::exists(saved), "the file is " + QFileInfo(saved).fileName());
     robot.Verify(!robot.Frame().GetActiveView()->GetDocument()->IsModified(), "the document is no longer modified");
@@ -167,17 +161,15 @@ void SaveCloseReopen(Robot& robot, const QString& file, int row)
                  "no second spelling of the file stands beside it");
 
     robot.Did("Close the document and open it again from the recent files");
-    robot.Trigger("actionClose");
+    robot.Choose("actionClose");
     const auto windows = robot.Frame().MdiArea().subWindowList();
     robot.Verify(std::none_of(windows.begin(), windows.end(),
                               [&](QMdiSubWindow* window) { return window->windowTitle().contains(".HDKV"); }),
                  "the document is closed");
-    auto* recent = RecentFile(robot, saved);
-    robot.Verify(recent != nullptr, "the saved file is among the recent files");
-    if (!recent)
+    const bool reopened = OpenRecent(robot, saved);
+    robot.Verify(reopened, "the saved file is among the recent files");
+    if (!reopened)
         return;
-    recent->trigger();
-    robot.Settle();
     robot.Verify(robot.Frame().GetActiveView() != nullptr, "the document is open again");
     auto* grid = InitialGrid(robot);
     if (!grid)

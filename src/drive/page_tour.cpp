@@ -20,15 +20,6 @@ QTabWidget* Sheet(Robot& robot)
     return view ? view->findChild<QTabWidget*>("sheet") : nullptr;
 }
 
-QWidget* GoToTab(Robot& robot, int tab)
-{
-    auto* sheet = Sheet(robot);
-    const QPoint middle = sheet->tabBar()->tabRect(tab).center();
-    robot.Click(sheet->tabBar(), middle);
-    robot.Verify(sheet->currentIndex() == tab, QStringLiteral("the page \"%1\" is in front").arg(sheet->tabText(tab)));
-    return sheet->currentWidget();
-}
-
 /// The controls of a page that stand for values, numbered as in its dialog, those that can be changed now.
 template <typename Widget>
 Widget* FirstControl(QWidget* page, const char* className)
@@ -63,20 +54,20 @@ QWidget* ChangeControl(Robot& robot, QWidget* page)
     QLineEdit* edit = FirstControl<QLineEdit>(page, "CCtrlEdit");
     const bool integer = !edit && (edit = FirstControl<QLineEdit>(page, "CKsEditLong"));
     if (edit) {
-        edit->setFocus();
-        edit->selectAll();
+        robot.ClickMiddle(edit);
+        robot.Key(edit, Qt::Key_A, Qt::ControlModifier);
         robot.Type(edit, integer ? "17" : edit->text() == "0.75" ? "0.85" : "0.75");
         robot.Key(edit, Qt::Key_Tab);
         return edit;
     }
     if (auto* box = FirstControl<QComboBox>(page, "QComboBox")) {
-        box->setFocus();
-        robot.Key(box, box->currentIndex() + 1 < box->count() ? Qt::Key_Down : Qt::Key_Up);
+        robot.ClickMiddle(box); // opens the list
+        robot.Key(box->view(), box->currentIndex() + 1 < box->count() ? Qt::Key_Down : Qt::Key_Up);
+        robot.Key(box->view(), Qt::Key_Return);
         return box;
     }
     if (auto* box = FirstControl<QAbstractButton>(page, "QCheckBox"); box && !FirstGrid(page)) {
-        box->setFocus();
-        robot.Key(box, Qt::Key_Space);
+        robot.Click(box, QPoint(8, box->height() / 2));
         return box;
     }
     return nullptr;
@@ -106,6 +97,14 @@ void ChangeCell(Robot& robot, QWidget* page, PageChange& change)
 
 } // namespace
 
+QWidget* GoToTab(Robot& robot, QTabWidget* sheet, int tab)
+{
+    const QPoint middle = sheet->tabBar()->tabRect(tab).center();
+    robot.Click(sheet->tabBar(), middle);
+    robot.Verify(sheet->currentIndex() == tab, QStringLiteral("the page \"%1\" is in front").arg(sheet->tabText(tab)));
+    return sheet->currentWidget();
+}
+
 std::vector<PageChange> ChangeEveryPage(Robot& robot)
 {
     std::vector<PageChange> changes;
@@ -115,7 +114,7 @@ std::vector<PageChange> ChangeEveryPage(Robot& robot)
         PageChange change;
         change.tab = tab;
         change.page = sheet->tabText(tab);
-        QWidget* page = GoToTab(robot, tab);
+        QWidget* page = GoToTab(robot, sheet, tab);
         if (QWidget* control = ChangeControl(robot, page)) {
             change.control = control->objectName();
             change.controlText = TextOf(control);
@@ -134,7 +133,7 @@ std::vector<PageChange> ChangeEveryPage(Robot& robot)
 void VerifyEveryPage(Robot& robot, const std::vector<PageChange>& changes)
 {
     for (const PageChange& change : changes) {
-        QWidget* page = GoToTab(robot, change.tab);
+        QWidget* page = GoToTab(robot, Sheet(robot), change.tab);
         if (!change.control.isEmpty()) {
             auto* control = page->findChild<QWidget*>(change.control);
             robot.Verify(control && TextOf(control) == change.controlText,

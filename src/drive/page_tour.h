@@ -1,9 +1,12 @@
-// A visit to every page of the sheet: a picture of each, one global and one local value changed, and both found again later.
+// A visit to every page of the sheet: a picture of each, one global and one local value changed, and both found again
+// later.
 #pragma once
 
 #include <QString>
 #include <vector>
 
+class QTabWidget;
+class QWidget;
 class Robot;
 
 /// What was changed on one page, as it is shown there.
@@ -16,7 +19,9 @@ struct PageChange
     QString cellText;
 };
 
-/// Visits every tab with the keyboard, changes values and takes a picture of each page.
+/// Clicks the tab of a page and returns the page.
+QWidget* GoToTab(Robot& robot, QTabWidget* sheet, int tab);
+/// Visits every tab, changes values and takes a picture of each page.
 std::vector<PageChange> ChangeEveryPage(Robot& robot);
 /// Visits the changed pages again and compares what they show.
 void VerifyEveryPage(Robot& robot, const std::vector<PageChange>& changes);

@@ -1,5 +1,6 @@
 #include "drive/project_job.h"
 
+#include "drive/page_tour.h"
 #include "drive/robot.h"
 #include "ks/fc/doc.h"
 #include "shell/main_frame.h"
@@ -21,6 +22,7 @@ namespace {
 constexpr int InitGrid = 1003, CurveEnable = 1098, SystemWidth = 1100, CurveGrid = 1103, LoadButton = 1104,
               WithWidth = 1107;
 constexpr int InitTab = 0, CurveTab = 20;
+constexpr int TitleMiddle = 10; // pixels below the top of a window
 
 /// The windows of the project, by the extension of their documents.
 class Project
@@ -43,16 +45,14 @@ public:
         for (QMdiSubWindow* window : m_robot.Frame().MdiArea().subWindowList()) {
             const auto* child = qobject_cast<CKsMDIChildWnd*>(window);
             if (child && child->GetActiveView() == View(extension))
-                m_robot.Frame().MdiArea().setActiveSubWindow(window);
+                m_robot.Click(window, QPoint(window->width() / 3, TitleMiddle));
         }
-        m_robot.Settle();
     }
     QTableView* Page(int tab, int grid)
     {
         Activate(".hdkv");
         if (auto* sheet = View(".hdkv")->findChild<QTabWidget*>("sheet"))
-            sheet->setCurrentIndex(tab);
-        m_robot.Settle();
+            GoToTab(m_robot, sheet, tab);
         return m_robot.Control<QTableView>(grid);
     }
     QWidget* Map() const { return View(".kvnw")->findChild<QWidget*>("networkMap"); }
@@ -77,17 +77,12 @@ QString Place(QTableView* grid, int row)
     return cell(0) + u' ' + QString::number(cell(1).toDouble(), 'f', 1);
 }
 
-void TriggerLinesMenu(Robot& robot, const QString& text)
+void ChooseLinesCommand(Robot& robot, const QString& text)
 {
-    for (QAction* top : robot.Frame().menuBar()->actions()) {
-        emit top->menu()->aboutToShow();
-        for (QAction* action : top->menu()->actions())
-            if (action->text().remove(u'&').startsWith(text)) {
-                action->trigger();
-                emit top->menu()->aboutToHide();
-                return robot.Settle();
-            }
-        emit top->menu()->aboutToHide();
+    for (const QAction* top : robot.Frame().menuBar()->actions()) {
+        if (top->isEnabled() &&
+            robot.ChooseFrom(top->menu(), [&](const QString& entry) { return entry.startsWith(text); }))
+            return;
     }
     robot.Verify(false, "there is a command " + text);
 }
@@ -102,7 +97,7 @@ void PickAndInsert(Robot& robot, Project& project)
     robot.Verify(!picked.isEmpty(), "the map marks " + picked);
     auto* grid = project.Page(InitTab, InitGrid);
     const int before = grid->model()->rowCount(), onMap = project.OnMap();
-    TriggerLinesMenu(robot, "Insert Location");
+    ChooseLinesCommand(robot, "Insert Location");
     robot.Verify(grid->model()->rowCount() == before + 1, "the page has a line more");
     robot.Verify(Place(grid, before) == picked, "the line is at " + Place(grid, before));
     robot.Verify(project.Soon([&] { return project.OnMap() == onMap + 1; }), "the map has a location more");
@@ -115,7 +110,7 @@ void DeleteOnTheMap(Robot& robot, Project& project)
     auto* grid = project.Page(InitTab, InitGrid);
     const int before = grid->model()->rowCount(), onMap = project.OnMap();
     project.Activate(".kvnw");
-    project.Map()->setFocus(); // in the table beside it Delete would delete a branch
+    robot.Click(project.Map(), QPoint(3, 3)); // in the table beside it Delete would delete a branch
     robot.Key(project.Map(), Qt::Key_Escape);
     robot.Key(project.Map(), Qt::Key_N);
     const QString selected = project.Marked();
@@ -186,8 +181,7 @@ void DriveProjectJob(Robot& robot)
     robot.Verify(open, "parameters, network and cross sections are open");
     if (!open)
         return;
-    robot.Frame().findChild<QAction*>("actionSideBySide")->trigger();
-    robot.Settle();
+    robot.Choose("actionSideBySide");
     robot.Verify(project.Soon([&] { return project.OnMap() > 0; }),
                  QStringLiteral("the map shows %1 locations").arg(project.OnMap()));
     PickAndInsert(robot, project);

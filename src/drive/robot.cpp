@@ -7,9 +7,12 @@
 #include <QDialog>
 #include <QDir>
 #include <QHeaderView>
+#include <QMenu>
+#include <QMenuBar>
 #include <QTableView>
 #include <QTest>
 #include <QTimer>
+#include <algorithm>
 #include <cstdio>
 
 Robot::Robot(CMainFrame& frame, QString pictureFolder) : m_frame(frame), m_folder(std::move(pictureFolder))
@@ -88,13 +91,69 @@ void Robot::ClickRowHeader(QTableView* table, int row)
     Settle();
 }
 
-void Robot::Trigger(const char* action)
+void Robot::ClickMiddle(QWidget* widget)
 {
-    auto* found = m_frame.findChild<QAction*>(QString::fromLatin1(action));
-    Verify(found && found->isEnabled(), QStringLiteral("the command %1 is offered").arg(action));
-    if (found)
-        found->trigger();
-    Settle();
+    if (widget)
+        Click(widget, widget->rect().center());
+}
+
+/// The menu that holds an entry, or null.
+static QMenu* MenuOf(const CMainFrame& frame, const QAction* entry)
+{
+    const auto menus = frame.findChildren<QMenu*>();
+    const auto found =
+        std::find_if(menus.begin(), menus.end(), [&](const QMenu* menu) { return menu->actions().contains(entry); });
+    return found == menus.end() ? nullptr : *found;
+}
+
+bool Robot::ClickEntry(QMenu* menu, QAction* entry)
+{
+    if (!menu || !menu->isVisible() || !entry->isVisible() || !entry->isEnabled())
+        return false;
+    const QPoint place = menu->actionGeometry(entry).center();
+    QTest::mouseMove(menu, place);
+    Click(menu, place);
+    return true;
+}
+
+bool Robot::OpenMenu(QMenu* menu)
+{
+    QMenuBar* bar = m_frame.menuBar();
+    if (bar->actions().contains(menu->menuAction()))
+        Click(bar, bar->actionGeometry(menu->menuAction()).center());
+    else if (QMenu* outer = MenuOf(m_frame, menu->menuAction()); !outer || !OpenMenu(outer))
+        return false;
+    else
+        ClickEntry(outer, menu->menuAction());
+    return QTest::qWaitFor([menu] { return menu->isVisible(); });
+}
+
+void Robot::CloseMenus()
+{
+    while (QWidget* menu = QApplication::activePopupWidget())
+        Key(menu, Qt::Key_Escape);
+}
+
+void Robot::Choose(const char* action)
+{
+    auto* entry = m_frame.findChild<QAction*>(QString::fromLatin1(action));
+    QMenu* menu = entry ? MenuOf(m_frame, entry) : nullptr;
+    const bool chosen = menu && OpenMenu(menu) && ClickEntry(menu, entry);
+    Verify(chosen, QStringLiteral("the command %1 is offered").arg(action));
+    if (!chosen)
+        CloseMenus();
+}
+
+bool Robot::ChooseFrom(QMenu* menu, const std::function<bool(const QString& text)>& matches)
+{
+    if (OpenMenu(menu)) {
+        for (QAction* entry : menu->actions()) {
+            if (matches(entry->text().remove(u'&')) && ClickEntry(menu, entry))
+                return true;
+        }
+    }
+    CloseMenus();
+    return false;
 }
 
 void Robot::WithDialog(const std::function<void()>& open, const std::function<void(QDialog&)>& answer)

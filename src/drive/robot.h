@@ -7,7 +7,9 @@
 #include <functional>
 
 class CMainFrame;
+class QAction;
 class QDialog;
+class QMenu;
 class QTableView;
 class QWidget;
 
@@ -22,7 +24,10 @@ public:
     /// The visible control whose object name ends with "_<number>"; the failure is recorded when there is none.
     QWidget* Control(int number);
     template <typename T>
-    T* Control(int number) { return qobject_cast<T*>(Control(number)); }
+    T* Control(int number)
+    {
+        return qobject_cast<T*>(Control(number));
+    }
 
     void Key(QWidget* target, int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void Type(QWidget* target, const QString& text);
@@ -32,8 +37,11 @@ public:
     void Click(QWidget* widget, const QPoint& place);
     void ClickCell(QTableView* table, int row, int column);
     void ClickRowHeader(QTableView* table, int row);
-    /// Triggers a menu action by object name, as its menu entry would.
-    void Trigger(const char* action);
+    void ClickMiddle(QWidget* widget);
+    /// Chooses a menu entry with the mouse, opening the menus on the way to it; by object name.
+    void Choose(const char* action);
+    /// The same for an entry of a menu that is filled as it opens; whether one was there.
+    bool ChooseFrom(QMenu* menu, const std::function<bool(const QString& text)>& matches);
     /// Carries out `open`, which shows a modal dialog, and hands the dialog to `answer`.
     void WithDialog(const std::function<void()>& open, const std::function<void(QDialog&)>& answer);
     void Settle();
@@ -48,6 +56,9 @@ public:
 
 private:
     QWidget* Focus();
+    bool ClickEntry(QMenu* menu, QAction* entry);
+    bool OpenMenu(QMenu* menu);
+    void CloseMenus();
 
     CMainFrame& m_frame;
     QString m_folder;

@@ -1,5 +1,7 @@
 #include "module/data_exchange.h"
 
+#include "data/hd_file.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "module/data_tables.h"
 #include "module/kavo0_hd.h"
@@ -12,6 +14,7 @@
 #include <QPointer>
 #include <QUndoStack>
 #include <cmath>
+#include <optional>
 
 namespace {
 
@@ -20,7 +23,8 @@ void Log(const char* why)
     qDebug("HD data exchange: %s; nothing is done", why);
 }
 
-/// One request is met at a time: what it changes makes others ask again, and they would meet a table half changed.
+/// One change is made at a time: who hears of it, or of a window that comes to the front, might ask for another one
+/// while the table of the first is half changed.
 class OneRequest
 {
 public:
@@ -44,33 +48,18 @@ private:
     bool m_entered;
 };
 
-/// Messages of a file that is only looked at go to the debug log.
-class NoMessageBoxes
+/// The content of a file that is only looked at.
+std::optional<HD_Parameters> ReadFile(const CString& path)
 {
-public:
-    NoMessageBoxes()
-        : m_old(KsSetMessageBoxHandler([](const CString& text, QMessageBox::StandardButtons) {
-              qDebug("HD data exchange: %s", qPrintable(text));
-              return QMessageBox::Ok;
-          }))
-    {
+    if (!CKavo0_hdDoc::HasExtension(path)) {
+        Log("the file is none of this editor's");
+        return {};
     }
-    ~NoMessageBoxes() { KsSetMessageBoxHandler(std::move(m_old)); }
-    NoMessageBoxes(const NoMessageBoxes&) = delete;
-    NoMessageBoxes& operator=(const NoMessageBoxes&) = delete;
-
-private:
-    KsMessageBoxHandler m_old;
-};
-
-std::unique_ptr<CKavo0_hdDoc> ReadFile(const CString& path)
-{
-    const NoMessageBoxes quiet;
-    auto document = std::make_unique<CKavo0_hdDoc>();
-    if (document->OnOpenDocument(path) && !document->IsUnreadable())
-        return document;
-    Log("the file cannot be read");
-    return nullptr;
+    auto content = LoadHDFile(KsExistingSpelling(path).toStdString());
+    if (content)
+        return std::move(content.value());
+    Log(content.error().message.c_str());
+    return {};
 }
 
 bool IsReady(const CKavo0_hdDoc& document)
@@ -151,16 +140,16 @@ struct Exchange
     CKavo0_hdView& view;
     CKavo0_hdDoc& document;
     CGenList& list;
-    CString message{}; // for the user, when all is done
-    bool changed = false;
+    bool mayLeave = true; // the page in front has stored what was being typed there, and lets go
+    CString message{};    // for the user, when all is done
 
     /// Shows the window and the table's tab; otherwise leaves the message.
     bool Show(Str refusal)
     {
         if (auto* window = CKsMDIChildWnd::Of(&view))
             window->BringToFront();
-        if (view.Sheet()->SetActivePage(table.tab))
-            return true;
+        if (IsShown() || (mayLeave && view.Sheet()->SetActivePage(table.tab)))
+            return mayLeave;
         message = LoadString(refusal);
         return false;
     }
@@ -177,48 +166,47 @@ struct Exchange
         return row;
     }
     bool IsShown() const { return view.Sheet()->currentIndex() == table.tab; }
+    /// The page in front when it shows the list.
+    CGenPropertyPage* ListPage() const
+    {
+        auto* page = view.ActivePage();
+        return page->GetList() == &list ? page : nullptr;
+    }
 };
 
 void Insert(Exchange& exchange)
 {
     if (exchange.item.branch.isEmpty() || !std::isfinite(exchange.item.chainage))
         return Log("the item has no branch or no chainage");
-    // What is being typed is taken first: by the switch, which may be refused, or where no switch is needed.
-    if (exchange.IsShown())
-        exchange.view.ActivePage()->StoreToDocument();
-    exchange.Show(exchange.table.inserted);
+    const bool shown = exchange.Show(exchange.table.inserted);
 
-    const auto rows = MakeListRows(exchange.document, exchange.list);
+    const auto rows = MakeListRows(exchange.list);
     auto lines = rows->NewRows(1);
     auto& record = *static_cast<HD_RiverPos*>(lines->At(0));
     record.RiverName = exchange.item.branch.toStdString();
     record.Chainage = exchange.item.chainage;
     if (exchange.table.fill)
         exchange.table.fill(record, exchange.document.Parameters().Global, exchange.item);
-    exchange.document.UndoStack().push(
-        new CInsertLines(exchange.document, rows, rows->Count(), std::move(lines), FirstLine::Goes));
-    exchange.changed = true;
-    if (auto* page = exchange.view.ActivePage(); exchange.IsShown() && page->GetList() == &exchange.list)
+    exchange.document.UndoStack().push(new CInsertLines(exchange.document, rows, rows->Count(), std::move(lines)));
+    if (auto* page = shown ? exchange.ListPage() : nullptr)
         page->GotoLine(int(exchange.list.GetCount()));
 }
 
 void Delete(Exchange& exchange)
 {
-    exchange.view.ActivePage()->StoreToDocument();
-    if (exchange.Find() == exchange.list.GetCount())
-        return;
-    exchange.Show(exchange.table.deleted);
-    const std::size_t row = exchange.Find(); // the page that was left may have stored
+    // A line is not taken away under what somebody cannot finish typing into that table.
+    if (!exchange.mayLeave && exchange.ListPage())
+        return Log("what is being typed in the table can neither be stored nor left");
+    const std::size_t row = exchange.Find();
     if (row == exchange.list.GetCount())
         return;
-    const auto rows = MakeListRows(exchange.document, exchange.list);
+    exchange.Show(exchange.table.deleted);
+    const auto rows = MakeListRows(exchange.list);
     exchange.document.UndoStack().push(new CDeleteLines(exchange.document, rows, row, 1));
-    exchange.changed = true;
 }
 
 void Select(Exchange& exchange)
 {
-    exchange.view.ActivePage()->StoreToDocument();
     const std::size_t row = exchange.Find();
     if (row == exchange.list.GetCount() || !exchange.Show(exchange.table.selected))
         return;
@@ -226,11 +214,12 @@ void Select(Exchange& exchange)
         page->GotoLine(int(row) + 1);
 }
 
+/// Whoever is editing is asked before anything changes. The page in front may refuse to be left; what the request then
+/// does is its own matter.
 void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(Exchange& exchange))
 {
     QPointer<CKavo0_hdView> served;
     CString message;
-    bool changed = false;
     {
         const OneRequest request;
         const auto* item = request ? FirstItem(items) : nullptr;
@@ -239,16 +228,19 @@ void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(
         served = view ? Ready(view) : ViewOfFile(path);
         if (!served)
             return;
+        const bool mayLeave = served->MayLeave(KsLeave::Page);
+        if (!served || !Ready(served)) // the question may have taken its time
+            return;
+        served->ActivePage()->StoreToDocument();
         CKavo0_hdDoc& document = *served->GetDocument();
         const HDDataTable& table = *FindDataTable(item->type);
-        Exchange exchange{*item, table, *served, document, table.list(document.Parameters())};
+        Exchange exchange{*item, table, *served, document, table.list(document.Parameters()), mayLeave};
         meet(exchange);
         message = exchange.message;
-        changed = exchange.changed;
     }
     // By now others may ask again: those that hear of the change do so at once.
-    if (changed && served && served->GetDocument())
-        served->GetDocument()->DataChange(served->GetDocument()->GetPathName());
+    if (served && served->GetDocument())
+        served->GetDocument()->TellChanges();
     if (!message.isEmpty())
         KsMessageBox(message, QMessageBox::Ok, served);
 }
@@ -257,25 +249,21 @@ void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(
 
 std::unique_ptr<CObList> ItemsOf(const CString& path, CKsDoc* document, MakeItems make)
 {
-    const OneRequest request;
-    if (!request)
-        return nullptr;
-    if (auto* open = qobject_cast<CKavo0_hdDoc*>(document)) {
-        if (!IsReady(*open))
-            return nullptr;
-        open->UpdateAllViews(nullptr, Hint::Store);
-        return make(*open);
-    }
-    const auto file = ReadFile(path);
-    return file ? make(*file) : nullptr;
+    if (auto* open = qobject_cast<CKavo0_hdDoc*>(document))
+        return IsReady(*open) ? make(open->Parameters()) : nullptr;
+    auto content = ReadFile(path);
+    return content ? make(*content) : nullptr;
 }
 
 CObList* CKavo0_hd::GetData(const CString& path, CView* view)
 {
     if (!view)
         return ItemsOf(path, nullptr, &DataItems).release();
-    const auto* served = Ready(view);
-    return served ? ItemsOf({}, served->GetDocument(), &DataItems).release() : nullptr;
+    const auto* served = qobject_cast<CKavo0_hdView*>(view);
+    if (served && served->GetDocument())
+        return ItemsOf({}, served->GetDocument(), &DataItems).release();
+    Log("the view is none of this editor's, or has no document");
+    return nullptr;
 }
 
 void CKavo0_hd::InsertData(const CString& path, CView* view, CObList* items)

@@ -1,18 +1,11 @@
 #include "module/data_items.h"
 
 #include "module/data_tables.h"
-#include "module/document.h"
 
 #include <algorithm>
 #include <string_view>
 
 namespace {
-
-/// The line that an empty table shows is no line of the document.
-bool IsShownOnly(const CKavo0_hdDoc& document, const HD_RiverPos& record)
-{
-    return record.IsBlank() && document.IsPlaceholder(record);
-}
 
 CString TextOf(std::string_view name)
 {
@@ -39,14 +32,12 @@ private:
     CString m_text = QStringLiteral("");
 };
 
-void AppendTable(const HDDataTable& table, int type, CKavo0_hdDoc& document, CObList& items)
+void AppendTable(const HDDataTable& table, int type, HD_Parameters& parameters, CObList& items)
 {
-    const CGenList& list = table.list(document.Parameters());
+    const CGenList& list = table.list(parameters);
     BranchTexts branches;
     for (std::size_t i = 0; i < list.GetCount(); ++i) {
         const HD_RiverPos& record = list.GetAt(i);
-        if (IsShownOnly(document, record))
-            continue;
         auto item = std::make_unique<CKvr_CBE_ModelDataItem>();
         item->branch = branches.Of(record.RiverName);
         item->chainage = record.Chainage;
@@ -59,24 +50,23 @@ void AppendTable(const HDDataTable& table, int type, CKavo0_hdDoc& document, COb
 
 } // namespace
 
-std::unique_ptr<CObList> DataItems(CKavo0_hdDoc& document)
+std::unique_ptr<CObList> DataItems(HD_Parameters& parameters)
 {
     auto items = std::make_unique<CObList>();
     std::size_t count = 0;
     for (const HDDataTable& table : HDDataTables())
-        count += table.list(document.Parameters()).GetCount();
+        count += table.list(parameters).GetCount();
     items->reserve(count);
     int type = 0;
     for (const HDDataTable& table : HDDataTables())
-        AppendTable(table, type++, document, *items);
+        AppendTable(table, type++, parameters, *items);
     return items;
 }
 
-std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
+std::unique_ptr<CObList> MarkItems(HD_Parameters& parameters)
 {
-    const HD_Global_Var& globals = document.Parameters().Global;
-    const bool isShownOnly = document.IsPlaceholderRow(&globals.MarkTitles);
-    const std::size_t titles = isShownOnly ? 0 : globals.MarkTitles.size();
+    const HD_Global_Var& globals = parameters.Global;
+    const std::size_t titles = globals.MarkTitles.size();
     auto items = std::make_unique<CObList>();
 
     auto head = std::make_unique<CKvrCBEUserDefMark>();
@@ -86,11 +76,9 @@ std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
     head->flags.resize(titles, 0);
     items->push_back(std::move(head));
 
-    const auto& list = document.Parameters().WaterLevelMarkList;
+    const auto& list = parameters.WaterLevelMarkList;
     for (std::size_t i = 0; i < list.GetCount(); ++i) {
         const HDWLMark& mark = list.GetAt(i);
-        if (IsShownOnly(document, mark))
-            continue;
         auto item = std::make_unique<CKvrCBEUserDefMark>();
         item->branch = CString::fromStdString(mark.RiverName);
         item->values.push_back(mark.Chainage);
@@ -101,12 +89,10 @@ std::unique_ptr<CObList> MarkItems(CKavo0_hdDoc& document)
     return items;
 }
 
-std::unique_ptr<CObList> MapItems(CKavo0_hdDoc& document)
+std::unique_ptr<CObList> MapItems(HD_Parameters& parameters)
 {
     auto items = std::make_unique<CObList>();
-    const auto& maps = document.Parameters().Global.MapOutput.MapOutputFiles;
-    if (document.IsPlaceholderRow(&maps)) // the row of an empty table
-        return items;
+    const auto& maps = parameters.Global.MapOutput.MapOutputFiles;
     for (const CMapsOutput& map : maps) {
         auto item = std::make_unique<CKvr_CBE_HDMaps>();
         item->xOrigin = map.XOrigin;

@@ -1,6 +1,5 @@
 #include "module/document.h"
 
-#include "data/hd_file.h"
 #include "data/safe_file.h"
 #include "ks/fc/message_box.h"
 #include "module/purged_lines.h"
@@ -9,44 +8,54 @@
 
 #include <QApplication>
 #include <QDir>
-#include <QFile>
 #include <QFileInfo>
 #include <QPointer>
+#include <QTimer>
 #include <QUndoStack>
+#include <algorithm>
+#include <utility>
 
 namespace {
 
 constexpr int HDPackageKind = 8; // what this editor's packages call themselves
 
-bool HasHDExtension(const CString& path)
+/// The rows of defaults that are written although nobody has edited them, in their tables during a save only.
+class FirstRows
+{
+public:
+    explicit FirstRows(const std::vector<CKavo0_hdDoc::ShownRows>& shown)
+    {
+        for (const auto& table : shown)
+            if (table.writesFirstRow && table.rows->IsEmpty())
+                m_filled.push_back(table.rows);
+        for (const auto& rows : m_filled)
+            rows->Put(0, rows->NewRows(1));
+    }
+    ~FirstRows()
+    {
+        for (const auto& rows : m_filled)
+            rows->Take(0, 1);
+    }
+    FirstRows(const FirstRows&) = delete;
+    FirstRows& operator=(const FirstRows&) = delete;
+
+private:
+    std::vector<std::shared_ptr<IRowSource>> m_filled;
+};
+
+} // namespace
+
+CKavo0_hdDoc::CKavo0_hdDoc()
+{
+    connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKavo0_hdDoc::StepMade);
+}
+
+bool CKavo0_hdDoc::HasExtension(const CString& path)
 {
     // Mixed spellings are refused: the shell's file tables know these two.
     const CString extension = QFileInfo(path).suffix();
     return extension == QLatin1String("HDKV") || extension == QLatin1String("hdkv");
 }
-
-/// Takes the focus from the field or cell being edited, so that it commits its text, and gives it back afterwards.
-class FocusPause
-{
-public:
-    FocusPause() : m_widget(QApplication::focusWidget())
-    {
-        if (m_widget)
-            m_widget->clearFocus();
-    }
-    ~FocusPause()
-    {
-        if (m_widget && !QApplication::focusWidget())
-            m_widget->setFocus(Qt::OtherFocusReason);
-    }
-
-private:
-    QPointer<QWidget> m_widget;
-};
-
-} // namespace
-
-CKavo0_hdDoc::CKavo0_hdDoc() = default;
 
 BOOL CKavo0_hdDoc::OnNewDocument()
 {
@@ -57,62 +66,49 @@ BOOL CKavo0_hdDoc::OnOpenDocument(const CString& path)
 {
     if (!CKsDoc::OnOpenDocument(path))
         return false;
-    m_strFilePath = path;
-    if (!HasHDExtension(path)) {
+    if (!HasExtension(path)) {
         KsMessageBox(LoadString(Str::UnsupportedFormat));
         return false;
     }
-    ReadData(path);
+    m_file.Read(path, m_parameters);
+    m_isReadOnly = m_file.IsUnreadable();
+    emit FileStateChanged();
     return true;
-}
-
-void CKavo0_hdDoc::ReadData(const CString& path)
-{
-    tqlHandle handle = tqlLoadFile(path.toStdString(), 1);
-    m_unreadable = tqlPeekErrorGlb() != 0;
-    if (m_unreadable) {
-        tqlGetErrorGlb();
-        TqlSyntaxError error;
-        tqlGetSyntaxErr(handle, &error);
-        KsMessageBox(QString::fromStdString(error.message));
-    } else {
-        m_parameters.Load(handle);
-    }
-    tqlClose(&handle);
 }
 
 CString CKavo0_hdDoc::SavePathFor(const CString& path) const
 {
-    const QFileInfo info(path);
-    return info.dir().filePath(info.completeBaseName() + QStringLiteral(".HDKV"));
+    return CDocumentFile::SavePathFor(path);
 }
 
 BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
 {
-    const FocusPause pause;
+    if (!MayLeave())
+        return false;
     const CString target = SavePathFor(path);
     UpdateAllViews(nullptr, Hint::Store);
-    if (!MayReplace(target, path))
+    if (!MayReplace(target, path) || !m_file.MayReplace(target))
         return false;
 
-    RemovePlaceholders();
     auto purged = std::make_unique<CPurgedLines>(*this);
-    purged->Apply();
+    purged->TakeOut();
     if (!WriteData(target)) {
-        purged->Revert(); // what is in memory stays as the user left it
+        purged->PutBack(); // what is in memory stays as the user left it
         UpdateAllViews(nullptr, Hint::Reload);
         return false;
     }
+    const QString dropped = purged->Summary();
     if (!purged->IsEmpty())
         UndoStack().push(purged.release());
     UndoStack().setClean();
 
-    RemoveOldSpelling(target);
-    m_strFilePath = target;
-    m_unreadable = false;
+    m_isReadOnly = false;
     SetPathName(target);
     UpdateAllViews(nullptr, Hint::Reload);
     SetModifiedFlag(false);
+    emit FileStateChanged();
+    const QString saved = dropped.isEmpty() ? LoadString(Str::Saved) : LoadString(Str::SavedDropping).arg(dropped);
+    Say(m_file.Renamed().isEmpty() ? saved : saved + QStringLiteral("   ") + m_file.Renamed());
     return true;
 }
 
@@ -127,69 +123,30 @@ bool CKavo0_hdDoc::MayReplace(const CString& target, const CString& path)
     return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
+/// Writes the whole content; on failure the user has been told and the file is what it was.
 bool CKavo0_hdDoc::WriteData(const CString& path)
 {
-    if (m_unreadable && SavePathFor(m_strFilePath) == path && !KeepUnreadableOriginal())
-        return false;
-    const auto saved = SaveHDFile(m_parameters, path.toStdString());
-    if (!saved)
-        KsMessageBox(QString::fromStdString(saved.error().message));
-    return bool(saved);
+    const FirstRows defaults(m_rowsShown);
+    return m_file.Write(m_parameters, path);
 }
 
-bool CKavo0_hdDoc::KeepUnreadableOriginal()
+void CKavo0_hdDoc::EditUnreadable()
 {
-    if (!QFileInfo::exists(m_strFilePath))
-        return true;
-    const auto kept = KeepUnreadable(m_strFilePath.toStdString());
-    if (!kept)
-        KsMessageBox(QString::fromStdString(kept.error().message));
-    return bool(kept);
+    m_isReadOnly = false;
+    emit FileStateChanged();
 }
 
-void CKavo0_hdDoc::RemoveOldSpelling(const CString& target)
+void CKavo0_hdDoc::AtSave(ShownRows shown)
 {
-    const CString& old = m_strFilePath;
-    if (old.isEmpty() || old == target || SavePathFor(old) != target || !QFileInfo::exists(old))
-        return;
-    // Where the file system ignores case both names are the file that was just written.
-    if (!SameFile(old.toStdString(), target.toStdString()))
-        QFile::remove(old);
-}
-
-void CKavo0_hdDoc::AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record)
-{
-    m_placeholders.insert(record.get());
-    list.InsertAt(0, std::move(record));
-}
-
-void CKavo0_hdDoc::CleanAtSave(std::shared_ptr<IRowSource> rows, std::function<bool(const void* row)> isIncomplete)
-{
-    m_cleanedRows.push_back({std::move(rows), std::move(isIncomplete)});
-}
-
-void CKavo0_hdDoc::RemovePlaceholders()
-{
-    for (const CCleanedRows& cleaned : m_cleanedRows)
-        cleaned.rows->TakeFirstRow();
-    for (const ListEntry& entry : HDLists())
-        if (entry.purgedAtSave)
-            RemovePlaceholder(*entry.list(m_parameters));
-    for (std::size_t setup = 0; setup < m_parameters.EncroachList.GetCount(); ++setup)
-        RemovePlaceholder(m_parameters.EncroachList.GetAt(setup));
-}
-
-void CKavo0_hdDoc::RemovePlaceholder(CGenList& list)
-{
-    if (list.GetCount() == 1 && list.GetAt(0).IsBlank() && m_placeholders.erase(&list.GetAt(0)))
-        list.RemoveAt(0);
+    const auto sameTable = [&](const ShownRows& known) { return known.rows->Data() == shown.rows->Data(); };
+    if (std::ranges::none_of(m_rowsShown, sameTable))
+        m_rowsShown.push_back(std::move(shown));
 }
 
 void CKavo0_hdDoc::DeleteContents()
 {
     UndoStack().clear();
-    m_placeholders.clear();
-    m_placeholderRows.clear();
+    m_rowsShown.clear();
     m_parameters.RemoveAllRecords();
     CKsDoc::DeleteContents();
 }
@@ -227,6 +184,37 @@ void CKavo0_hdDoc::LeaveProject(CView* view, const CString& name)
 {
     if (m_hProject)
         SendToShell(KsMessage::SwitchBoard(), KsRequest::LeaveProject, view, name);
+}
+
+void CKavo0_hdDoc::StepMade(int index)
+{
+    ShowStep(index < std::exchange(m_steps, index));
+    TellStep();
+}
+
+/// What a complete step that was undone or redone has changed.
+void CKavo0_hdDoc::ShowStep(bool isUndo)
+{
+    if (!m_stepShows)
+        return; // a new step
+    emit Reveal(*std::exchange(m_stepShows, std::nullopt));
+    Say(LoadString(isUndo ? Str::Undone : Str::Redone).arg(isUndo ? UndoStack().redoText() : UndoStack().undoText()));
+}
+
+/// A step comes in the middle of things: the page that made it goes on storing, and whoever hears of it may ask at
+/// once.
+void CKavo0_hdDoc::TellStep()
+{
+    if (!m_hProject || UndoStack().count() == 0) // a cleared stack is no step
+        return;
+    if (m_untold++ == 0)
+        QTimer::singleShot(0, this, &CKavo0_hdDoc::TellChanges);
+}
+
+void CKavo0_hdDoc::TellChanges()
+{
+    for (int steps = std::exchange(m_untold, 0); steps > 0; --steps)
+        DataChange(GetPathName());
 }
 
 void CKavo0_hdDoc::DataChange(const CString& name)

@@ -4,11 +4,14 @@
 #include "data/hd_parameters.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/package.h"
+#include "module/change_place.h"
+#include "module/document_file.h"
+#include "res/strings.h"
 
 #include <cstdint>
 #include <functional>
 #include <memory>
-#include <unordered_set>
+#include <optional>
 #include <vector>
 
 class CPurgedLines;
@@ -24,7 +27,9 @@ public:
     const HD_Parameters& Parameters() const { return m_parameters; }
 
     BOOL OnNewDocument() override;
-    /// Accepts ".HDKV" and ".hdkv". A file that cannot be parsed opens with what the records hold, after a message.
+    /// Whether a path has an extension of these files: ".HDKV" or ".hdkv".
+    static bool HasExtension(const CString& path);
+    /// Accepts these extensions. A file that cannot be parsed opens with what the records hold, after a message.
     BOOL OnOpenDocument(const CString& path) override;
     /// Saves to the path with the extension ".HDKV"; see docs/architecture.md, "Saving".
     BOOL OnSaveDocument(const CString& path) override;
@@ -34,35 +39,32 @@ public:
     /// Joins the shell's project; true when the document belongs to one.
     BOOL GetProjectInfo(CView* view, const CString& name);
     void LeaveProject(CView* view, const CString& name);
-    /// Tells the other editors of the project that data changed.
+    /// Tells the other editors of the project that data changed. Every step on the undo stack, forth or back, is told
+    /// by itself, once, when the event that it belongs to is over.
     void DataChange(const CString& name);
+    /// Tells at once what waits to be told.
+    void TellChanges();
     /// Marks the document modified, updates all views but the sender, and gives the sender the focus back.
     void UpdateAll(CView* sender, int hint, CHint* object);
 
-    /// Gives an empty list the one line that its page shows. The line is no change of the document: neither the
-    /// modified flag nor undo sees it, and a save removes it again while it is untouched.
-    void AddPlaceholder(CGenList& list, std::unique_ptr<HD_RiverPos> record);
-    void RemovePlaceholders();
-    /// Takes the placeholder out of a list that holds nothing else.
-    void RemovePlaceholder(CGenList& list);
-    bool IsPlaceholder(const HD_RiverPos& record) const { return m_placeholders.contains(&record); }
-    /// Whatever edits or removes a record says so: a placeholder becomes an ordinary line.
-    void PlaceholderTouched(const HD_RiverPos& record) { m_placeholders.erase(&record); }
-
-    // Likewise for a list without locations, named by its address.
-    void AddPlaceholderRow(const void* rows) { m_placeholderRows.insert(rows); }
-    bool IsPlaceholderRow(const void* rows) const { return m_placeholderRows.contains(rows); }
-    void PlaceholderRowTouched(const void* rows) { m_placeholderRows.erase(rows); }
-
-    /// From now on a save leaves out the rows that are incomplete, as one step to undo. For lists without locations:
-    /// a page says so when it shows one, and tells the user on the page.
-    void CleanAtSave(std::shared_ptr<IRowSource> rows, std::function<bool(const void* row)> isIncomplete);
-    struct CCleanedRows
+    /// What a save makes of a table without locations that the user has seen. A page says so whenever it shows one;
+    /// what no page has shown is written as it is.
+    struct ShownRows
     {
         std::shared_ptr<IRowSource> rows;
-        std::function<bool(const void* row)> isIncomplete;
+        /// These rows are left out, as one step to undo; the page tells the user beforehand. May be empty.
+        std::function<bool(const void* row)> isIncomplete = {};
+        Str oneDropped = {}, manyDropped = {}; // said after the save
+        /// The row of defaults that the page shows of an empty table is written.
+        bool writesFirstRow = false;
     };
-    const std::vector<CCleanedRows>& CleanedRows() const { return m_cleanedRows; }
+    void AtSave(ShownRows shown);
+    const std::vector<ShownRows>& RowsShown() const { return m_rowsShown; }
+
+    /// A step that is being undone or redone shows here; told (Reveal) when the step is complete.
+    void StepShows(const ChangePlace& place) { m_stepShows = place; }
+    /// Tells the user in passing.
+    void Say(const QString& text) { emit Said(text); }
 
     /// Sends a request to the shell's switchboard; its answer, 0 outside a project. What the other editors have to say
     /// is appended to `objects`, which stays the caller's.
@@ -71,31 +73,37 @@ public:
     void TellShell(WPARAM news, CView* view, CObList* objects);
 
     std::intptr_t ProjectHandle() const { return m_hProject; }
-    const CString& FilePath() const { return m_strFilePath; }
-    /// The file at FilePath could not be parsed; the document holds nothing of it.
-    bool IsUnreadable() const { return m_unreadable; }
+    /// The file last opened or saved.
+    const CDocumentFile& File() const { return m_file; }
+    /// It could not be parsed, and nobody has asked to edit what is shown instead.
+    bool IsReadOnly() const { return m_isReadOnly; }
+    void EditUnreadable();
 
 signals:
-    /// Undo or redo changed a list (or a global value: null list); the view brings its page forward.
-    void Reveal(CGenList* list, int row, int column);
+    /// A step was undone or redone; the view brings what it changed into view.
+    void Reveal(const ChangePlace& place);
+    /// What was done, for the status bar.
+    void Said(const QString& text);
+    /// What is known of File(), or IsReadOnly(), is another.
+    void FileStateChanged();
 
 private:
-    void ReadData(const CString& path);
-    /// Writes the whole content; on failure the user has been told and the file is what it was.
+    void StepMade(int index);
+    void ShowStep(bool isUndo);
+    void TellStep();
     bool WriteData(const CString& path);
-    bool KeepUnreadableOriginal();
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);
-    void RemoveOldSpelling(const CString& target);
     LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name, CObList* objects = nullptr);
 
     HD_Parameters m_parameters;
-    CString m_strFilePath; // of the file last opened
+    CDocumentFile m_file;
     std::intptr_t m_hProject = 0;
-    bool m_unreadable = false; // the file at m_strFilePath could not be parsed
-    std::unordered_set<const HD_RiverPos*> m_placeholders;
-    std::unordered_set<const void*> m_placeholderRows;
-    std::vector<CCleanedRows> m_cleanedRows;
+    int m_untold = 0; // steps that the project has not heard of
+    bool m_isReadOnly = false;
+    std::vector<ShownRows> m_rowsShown;
+    std::optional<ChangePlace> m_stepShows;
+    int m_steps = 0; // the undo stack's index, as last heard
 };
 
 /// Update hints of the document.

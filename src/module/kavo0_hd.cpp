@@ -43,7 +43,7 @@ void FreeModuleResources()
 
 CMultiDocTemplate* CKavo0_hd::CreateMainDlg()
 {
-    auto* documents = new CMultiDocTemplate(Resource::Document, LoadString(Str::DocumentTemplate),
+    auto* documents = new CMultiDocTemplate(Resource::Document, [] { return LoadString(Str::DocumentTemplate); },
                                             {[]() -> CKsDoc* { return new CKavo0_hdDoc; },
                                              []() -> CKsMDIChildWnd* { return new CDlgFrame; },
                                              []() -> CView* { return new CKavo0_hdView; }});

@@ -1,19 +1,13 @@
 // Undo commands that change a document: their common base, and the insertion and removal of lines.
 #pragma once
 
+#include "module/change_place.h"
 #include "module/row_source.h"
 
 #include <QString>
 #include <QUndoCommand>
 
 class CKavo0_hdDoc;
-
-/// Where a change shows: row and column count from 1; no list for a global value.
-struct ChangePlace
-{
-    CGenList* list = nullptr;
-    int row = 0, column = 0;
-};
 
 /// The place of a row of the source; of the last one for a row past the end.
 ChangePlace PlaceOf(const IRowSource& rows, std::size_t row, int column);
@@ -39,19 +33,13 @@ private:
     bool m_repeated = false;
 };
 
-/// What becomes of the line that an empty list shows, when others come.
-enum class FirstLine
-{
-    Stays,
-    Goes // while nobody has touched it
-};
-
 /// Puts new lines into a list.
 class CInsertLines : public CDocumentCommand
 {
 public:
+    /// The text is that of an insertion unless one is given.
     CInsertLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row,
-                 std::unique_ptr<IRowBlock> lines, FirstLine first = FirstLine::Stays);
+                 std::unique_ptr<IRowBlock> lines, const QString& text = {});
 
 protected:
     ChangePlace Apply() override;
@@ -61,15 +49,13 @@ private:
     std::shared_ptr<IRowSource> m_rows;
     std::size_t m_row, m_count;
     std::unique_ptr<IRowBlock> m_lines; // while they are not in the list
-    FirstLine m_first;
 };
 
-/// Removes lines from a list. A list that would be left empty gets `replacement`, when there is one.
+/// Removes lines from a list.
 class CDeleteLines : public CDocumentCommand
 {
 public:
-    CDeleteLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count,
-                 std::unique_ptr<IRowBlock> replacement = nullptr);
+    CDeleteLines(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count);
 
 protected:
     ChangePlace Apply() override;
@@ -78,7 +64,5 @@ protected:
 private:
     std::shared_ptr<IRowSource> m_rows;
     std::size_t m_row, m_count;
-    std::unique_ptr<IRowBlock> m_lines;       // while they are out of the list
-    std::unique_ptr<IRowBlock> m_replacement; // while it is not in the list
-    bool m_replaced = false;
+    std::unique_ptr<IRowBlock> m_lines; // while they are out of the list
 };

@@ -1,6 +1,6 @@
 #include "module/list_rows.h"
 
-#include "module/document.h"
+#include "data/gen_list.h"
 
 #include <algorithm>
 
@@ -26,7 +26,7 @@ Records RecordsOf(std::unique_ptr<IRowBlock> block)
 class CListRows : public IRowSource
 {
 public:
-    CListRows(CKavo0_hdDoc& document, CGenList& list) : m_document(document), m_list(list) {}
+    explicit CListRows(CGenList& list) : m_list(list) {}
 
     std::size_t Count() const override { return m_list.GetCount(); }
     void* At(std::size_t row) override { return &m_list.GetAt(row); }
@@ -44,7 +44,6 @@ public:
                 return row;
         return Count();
     }
-    void Touch(RowKey key) override { m_document.PlaceholderTouched(*Record(key)); }
 
     std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override
     {
@@ -62,17 +61,12 @@ public:
     {
         return std::make_unique<CRecordBlock>(m_list.RemoveAt(row, count));
     }
-    void AddFirstRow(std::unique_ptr<IRowBlock> block) override
-    {
-        for (auto& record : RecordsOf(std::move(block)))
-            m_document.AddPlaceholder(m_list, std::move(record));
-    }
+    const void* Data() const override { return &m_list; }
     CGenList* List() const override { return &m_list; }
 
 private:
     static HD_RiverPos* Record(RowKey key) { return reinterpret_cast<HD_RiverPos*>(key); }
 
-    CKavo0_hdDoc& m_document;
     CGenList& m_list;
 };
 
@@ -95,11 +89,6 @@ public:
     {
         return key == GlobalKey() ? 0 : 1 + m_lines->RowOf(key, hint > 0 ? hint - 1 : 0);
     }
-    void Touch(RowKey key) override
-    {
-        if (key != GlobalKey())
-            m_lines->Touch(key);
-    }
 
     std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override { return m_lines->NewRows(count); }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
@@ -110,7 +99,7 @@ public:
     {
         return m_lines->Take(row - 1, count);
     }
-    void AddFirstRow(std::unique_ptr<IRowBlock> block) override { m_lines->AddFirstRow(std::move(block)); }
+    const void* Data() const override { return m_lines->Data(); }
     CGenList* List() const override { return m_lines->List(); }
 
 private:
@@ -122,12 +111,12 @@ private:
 
 } // namespace
 
-std::shared_ptr<IRowSource> MakeGlobalAndListRows(CKavo0_hdDoc& document, CGenList& list, void* globals)
+std::shared_ptr<IRowSource> MakeGlobalAndListRows(CGenList& list, void* globals)
 {
-    return std::make_shared<CGlobalAndListRows>(MakeListRows(document, list), globals);
+    return std::make_shared<CGlobalAndListRows>(MakeListRows(list), globals);
 }
 
-std::shared_ptr<IRowSource> MakeListRows(CKavo0_hdDoc& document, CGenList& list)
+std::shared_ptr<IRowSource> MakeListRows(CGenList& list)
 {
-    return std::make_shared<CListRows>(document, list);
+    return std::make_shared<CListRows>(list);
 }

@@ -3,10 +3,8 @@
 
 #include "module/row_source.h"
 
-class CKavo0_hdDoc;
-
-/// `list` is one of the document's lists.
-std::shared_ptr<IRowSource> MakeListRows(CKavo0_hdDoc& document, CGenList& list);
+/// `list` is one of a document's lists.
+std::shared_ptr<IRowSource> MakeListRows(CGenList& list);
 
 /// The same behind one fixed row, whose object is `globals`: something else than a record, which the columns know.
-std::shared_ptr<IRowSource> MakeGlobalAndListRows(CKavo0_hdDoc& document, CGenList& list, void* globals);
+std::shared_ptr<IRowSource> MakeGlobalAndListRows(CGenList& list, void* globals);

@@ -1,89 +1,114 @@
 #include "module/purged_lines.h"
 
-#include "module/document.h"
 #include "res/strings.h"
 
-CPurgedLines::CPurgedLines(CKavo0_hdDoc& document) : m_document(document)
-{
-    setText(LoadString(Str::UndoPurge));
-}
+#include <QStringList>
 
-void CPurgedLines::Apply()
+CPurgedLines::CPurgedLines(CKavo0_hdDoc& document) : CDocumentCommand(document, LoadString(Str::UndoPurge))
 {
-    PurgeLists();
-    PurgeRows();
-    m_applied = true;
-}
-
-void CPurgedLines::PurgeRows()
-{
-    m_rows.clear();
-    for (const auto& cleaned : m_document.CleanedRows()) {
-        for (std::size_t index = cleaned.rows->Count(); index-- > 0;) {
-            if (cleaned.isIncomplete(cleaned.rows->At(index)))
-                m_rows.push_back({cleaned.rows, index, cleaned.rows->Take(index, 1)});
-        }
-    }
-}
-
-void CPurgedLines::PurgeLists()
-{
-    m_lists.clear();
     for (const ListEntry& entry : HDLists()) {
         if (!entry.purgedAtSave)
             continue;
-        CGenList& list = *entry.list(m_document.Parameters());
-        List purged{&list, {}};
-        bool any = false;
-        for (std::size_t i = 0; i < list.GetCount() && !any; ++i)
-            any = list.GetAt(i).IsBlank();
-        if (!any)
-            continue;
-        auto records = list.RemoveAt(0, list.GetCount());
-        std::vector<std::unique_ptr<HD_RiverPos>> kept;
-        kept.reserve(records.size());
-        for (std::size_t i = 0; i < records.size(); ++i) {
-            if (records[i]->IsBlank())
-                purged.lines.push_back({i, std::move(records[i])});
-            else
-                kept.push_back(std::move(records[i]));
-        }
-        list.InsertAt(0, std::move(kept));
-        m_lists.push_back(std::move(purged));
+        Lines lines{entry.list(document.Parameters()), {}, {}};
+        for (std::size_t row = 0; row < lines.list->GetCount(); ++row)
+            if (lines.list->GetAt(row).IsBlank())
+                lines.rows.push_back(row);
+        if (!lines.rows.empty())
+            m_lists.push_back(std::move(lines));
+    }
+    for (const auto& shown : document.RowsShown()) {
+        Rows table{shown.rows, {}, {}, shown.oneDropped, shown.manyDropped};
+        for (std::size_t row = 0; shown.isIncomplete && row < shown.rows->Count(); ++row)
+            if (shown.isIncomplete(shown.rows->At(row)))
+                table.rows.push_back(row);
+        if (!table.rows.empty())
+            m_tables.push_back(std::move(table));
     }
 }
 
-void CPurgedLines::Revert()
+QString CPurgedLines::Summary() const
 {
-    m_document.RemovePlaceholders(); // an emptied list may show one by now
-    for (List& purged : m_lists) {
-        auto kept = purged.list->RemoveAt(0, purged.list->GetCount());
-        std::vector<std::unique_ptr<HD_RiverPos>> all;
-        all.reserve(kept.size() + purged.lines.size());
-        auto next = kept.begin();
-        for (Line& line : purged.lines) {
-            while (all.size() < line.index && next != kept.end())
-                all.push_back(std::move(*next++));
-            all.push_back(std::move(line.record));
-        }
-        std::move(next, kept.end(), std::back_inserter(all));
-        purged.list->InsertAt(0, std::move(all));
+    std::size_t count = 0;
+    for (const Lines& lines : m_lists)
+        count += lines.rows.size();
+    QStringList parts;
+    if (count > 0)
+        parts << LoadCounted(count, Str::DroppedLine, Str::DroppedLines);
+    for (const Rows& table : m_tables)
+        parts << LoadCounted(table.rows.size(), table.oneDropped, table.manyDropped);
+    return parts.join(LoadString(Str::DroppedSeparator));
+}
+
+void CPurgedLines::TakeOut(Lines& lines)
+{
+    auto all = lines.list->RemoveAt(0, lines.list->GetCount());
+    std::vector<std::unique_ptr<HD_RiverPos>> kept;
+    kept.reserve(all.size() - lines.rows.size());
+    auto next = lines.rows.begin();
+    for (std::size_t row = 0; row < all.size(); ++row) {
+        const bool goes = next != lines.rows.end() && *next == row;
+        next += goes;
+        (goes ? lines.records : kept).push_back(std::move(all[row]));
     }
-    for (auto taken = m_rows.rbegin(); taken != m_rows.rend(); ++taken)
-        taken->source->Put(taken->index, std::move(taken->row));
-    m_applied = false;
+    lines.list->InsertAt(0, std::move(kept));
 }
 
-void CPurgedLines::undo()
+void CPurgedLines::PutBack(Lines& lines)
 {
-    Revert();
-    m_document.UpdateAll(nullptr, Hint::Reload, nullptr);
+    auto kept = lines.list->RemoveAt(0, lines.list->GetCount());
+    std::vector<std::unique_ptr<HD_RiverPos>> all;
+    all.reserve(kept.size() + lines.rows.size());
+    auto next = kept.begin();
+    for (std::size_t i = 0; i < lines.rows.size(); ++i) {
+        while (all.size() < lines.rows[i])
+            all.push_back(std::move(*next++));
+        all.push_back(std::move(lines.records[i]));
+    }
+    std::move(next, kept.end(), std::back_inserter(all));
+    lines.records.clear();
+    lines.list->InsertAt(0, std::move(all));
 }
 
-void CPurgedLines::redo()
+void CPurgedLines::TakeOut()
 {
-    if (m_applied)
-        return;
-    Apply();
-    m_document.UpdateAll(nullptr, Hint::Reload, nullptr);
+    m_isOut = true;
+    for (Lines& lines : m_lists)
+        TakeOut(lines);
+    for (Rows& table : m_tables)
+        for (auto row = table.rows.rbegin(); row != table.rows.rend(); ++row)
+            table.taken.push_back(table.source->Take(*row, 1));
+}
+
+void CPurgedLines::PutBack()
+{
+    m_isOut = false;
+    for (Lines& lines : m_lists)
+        PutBack(lines);
+    for (Rows& table : m_tables)
+        for (const std::size_t row : table.rows) {
+            table.source->Put(row, std::move(table.taken.back()));
+            table.taken.pop_back();
+        }
+}
+
+ChangePlace CPurgedLines::Apply()
+{
+    if (!m_isOut) // the save itself has done it before
+        TakeOut();
+    return Place();
+}
+
+ChangePlace CPurgedLines::Revert()
+{
+    PutBack();
+    return Place();
+}
+
+/// The first of the lines, or where it was.
+ChangePlace CPurgedLines::Place() const
+{
+    if (m_lists.empty())
+        return PlaceOf(*m_tables.front().source, m_tables.front().rows.front(), 1);
+    const Lines& first = m_lists.front();
+    return {first.list, int(first.rows.front()) + 1, 1, first.list, int(first.rows.front()) + 1};
 }

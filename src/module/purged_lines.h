@@ -2,48 +2,49 @@
 #pragma once
 
 #include "data/hd_parameters.h"
-#include "module/row_source.h"
+#include "module/document.h"
+#include "module/list_commands.h"
 
-#include <QUndoCommand>
 #include <vector>
 
-class CKavo0_hdDoc;
-
-class CPurgedLines : public QUndoCommand
+class CPurgedLines : public CDocumentCommand
 {
 public:
+    /// Finds the incomplete lines, and the rows that a save leaves out of the tables shown. From then on they are known
+    /// by their places: the command never looks at what they hold again.
     explicit CPurgedLines(CKavo0_hdDoc& document);
 
-    /// Takes the incomplete lines out of the lists that are cleaned at save, in one pass a list.
-    void Apply();
-    void Revert();
-    bool IsEmpty() const { return m_lists.empty() && m_rows.empty(); }
+    bool IsEmpty() const { return m_lists.empty() && m_tables.empty(); }
+    /// What is taken out, in the user's language; empty for nothing.
+    QString Summary() const;
 
-    void undo() override;
-    void redo() override;
+    // For a save, which pushes the command when the file is written. Taking out costs one pass a list.
+    void TakeOut();
+    void PutBack();
+
+protected:
+    ChangePlace Apply() override;
+    ChangePlace Revert() override;
 
 private:
-    struct Line
-    {
-        std::size_t index; // in the list as it was
-        std::unique_ptr<HD_RiverPos> record;
-    };
-    struct List
+    struct Lines
     {
         CGenList* list;
-        std::vector<Line> lines; // ascending
+        std::vector<std::size_t> rows;                     // ascending, in the list as it is with them
+        std::vector<std::unique_ptr<HD_RiverPos>> records; // while they are out of it
     };
-    struct Row // of a list without locations
+    struct Rows // of a table without locations
     {
         std::shared_ptr<IRowSource> source;
-        std::size_t index; // when it was taken
-        std::unique_ptr<IRowBlock> row;
+        std::vector<std::size_t> rows;                 // ascending, in the table as it is with them
+        std::vector<std::unique_ptr<IRowBlock>> taken; // while they are out of it
+        Str oneDropped, manyDropped;
     };
-    void PurgeLists();
-    void PurgeRows();
+    static void TakeOut(Lines& lines);
+    static void PutBack(Lines& lines);
+    ChangePlace Place() const;
 
-    CKavo0_hdDoc& m_document;
-    std::vector<List> m_lists;
-    std::vector<Row> m_rows; // in the order of taking
-    bool m_applied = false;  // by the save itself, before the command came onto the stack
+    std::vector<Lines> m_lists;
+    std::vector<Rows> m_tables;
+    bool m_isOut = false;
 };

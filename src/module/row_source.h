@@ -34,26 +34,24 @@ public:
     virtual void* Object(RowKey key) = 0;
     /// Row of the key, looked for at `hint` first; Count() when it is not in the source.
     virtual std::size_t RowOf(RowKey key, std::size_t hint) = 0;
-    /// The row is about to be changed or removed by the user.
-    virtual void Touch(RowKey /*key*/) {}
 
     /// Rows with their defaults, not in the source.
     virtual std::unique_ptr<IRowBlock> NewRows(std::size_t count) const = 0;
     /// Puts the rows in at `row` (at the end when there are fewer) and returns the row where they went.
     virtual std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) = 0;
     virtual std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) = 0;
-    /// The one row that an empty source shows: no change of the document, if the source has a way to say so.
-    virtual void AddFirstRow(std::unique_ptr<IRowBlock> block) { Put(0, std::move(block)); }
-    /// Removes that row again, silently, if it is untouched.
-    virtual void TakeFirstRow() {}
+    /// Takes rows out that Put has put in: all is as it was before.
+    virtual std::unique_ptr<IRowBlock> TakeBack(std::size_t row, std::size_t count) { return Take(row, count); }
 
     /// The first rows that belong to the source itself: none of them comes, goes or moves.
     virtual std::size_t FixedRows() const { return 0; }
     bool IsEmpty() const { return Count() == FixedRows(); }
-    /// Whether the source may be left without rows; otherwise it always shows one.
+    /// Whether a grid may show the source without rows; otherwise it offers one to type into.
     virtual bool MayBeEmpty() const { return false; }
 
-    /// The list behind the rows; null when they are kept otherwise.
+    /// The list or table of the document that the rows are kept in.
+    virtual const void* Data() const = 0;
+    /// That list, or the list that the table belongs to; null for neither.
     virtual CGenList* List() const { return nullptr; }
     /// Where the list shows the row: a row kept inside a record is shown at the record.
     virtual std::size_t ListRow(std::size_t row) const { return row; }

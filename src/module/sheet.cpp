@@ -1,11 +1,12 @@
 #include "module/sheet.h"
 
-#include "module/view.h"
 #include "pages/framework/page.h"
 
+#include <QApplication>
 #include <QHash>
 #include <QKeyEvent>
 #include <QScrollArea>
+#include <QShortcut>
 #include <QSignalBlocker>
 #include <QStyleOptionTab>
 #include <QStylePainter>
@@ -15,11 +16,12 @@
 
 namespace {
 
-/// A tab column whose captions read from left to right.
+/// A tab column whose captions read from left to right. It chooses nothing itself: whoever is being edited is asked
+/// before another tab comes to the front.
 class SideTabBar : public QTabBar
 {
 public:
-    using QTabBar::QTabBar;
+    SideTabBar(CDlgPropertySheet* sheet) : QTabBar(sheet), m_sheet(sheet) {}
 
     QSize tabSizeHint(int index) const override
     {
@@ -32,6 +34,32 @@ public:
     QSize minimumTabSizeHint(int index) const override { return tabSizeHint(index); }
 
 protected:
+    void mousePressEvent(QMouseEvent* event) override
+    {
+        const int tab = tabAt(event->position().toPoint());
+        if (tab >= 0 && event->button() == Qt::LeftButton)
+            m_sheet->SetActivePage(tab);
+        else
+            QTabBar::mousePressEvent(event); // the buttons that scroll
+    }
+    void wheelEvent(QWheelEvent* event) override
+    {
+        m_wheel += event->angleDelta().y();
+        const int steps = m_wheel / QWheelEvent::DefaultDeltasPerStep;
+        m_wheel -= steps * QWheelEvent::DefaultDeltasPerStep;
+        if (steps != 0)
+            m_sheet->SetActivePage(std::clamp(currentIndex() - steps, 0, count() - 1));
+    }
+    void keyPressEvent(QKeyEvent* event) override
+    {
+        const int key = event->key();
+        const int step = key == Qt::Key_Up || key == Qt::Key_Left ? -1 : key == Qt::Key_Down || key == Qt::Key_Right;
+        const int tab = key == Qt::Key_Home ? 0 : key == Qt::Key_End ? count() - 1 : currentIndex() + step;
+        if (tab == currentIndex())
+            QTabBar::keyPressEvent(event);
+        else if (m_sheet->SetActivePage(tab))
+            setFocus();
+    }
     void changeEvent(QEvent* event) override
     {
         if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange)
@@ -59,18 +87,27 @@ protected:
     }
 
 private:
+    CDlgPropertySheet* m_sheet;
+    int m_wheel = 0;                       // turned since the last step
     mutable QHash<QString, QSize> m_sizes; // of captions in the present font
 };
 
 } // namespace
 
-CDlgPropertySheet::CDlgPropertySheet(CKavo0_hdView* view) : QTabWidget(view), m_view(view)
+CDlgPropertySheet::CDlgPropertySheet(QWidget* parent) : QTabWidget(parent)
 {
     setObjectName("sheet");
     setTabBar(new SideTabBar(this));
     setTabPosition(QTabWidget::West);
     setUsesScrollButtons(true);
     connect(this, &QTabWidget::currentChanged, this, &CDlgPropertySheet::TabChanged);
+    const auto addKey = [this](Qt::Key key, int step) {
+        const auto* shortcut =
+            new QShortcut(QKeySequence(Qt::CTRL | key), this, nullptr, nullptr, Qt::WidgetWithChildrenShortcut);
+        connect(shortcut, &QShortcut::activated, this, [this, step] { SetActivePage(m_active + step); });
+    };
+    addKey(Qt::Key_PageUp, -1);
+    addKey(Qt::Key_PageDown, 1);
 }
 
 void CDlgPropertySheet::AddPage(Str caption, MakePage make)
@@ -89,7 +126,6 @@ CGenPropertyPage* CDlgPropertySheet::PageAt(int tab) const
     Tab& entry = m_tabs[std::size_t(tab)];
     if (!entry.page) {
         entry.page = entry.make().release();
-        entry.page->installEventFilter(const_cast<CDlgPropertySheet*>(this));
         auto* area = new QScrollArea; // in a small window a page scrolls rather than being cut off
         area->setWidgetResizable(true);
         area->setFrameShape(QFrame::NoFrame);
@@ -115,39 +151,30 @@ CGenPropertyPage* CDlgPropertySheet::ActivePage() const
     return PageAt(m_active);
 }
 
+/// Tools for people who do not see the screen press a tab directly. The page in front comes back before it is asked.
 void CDlgPropertySheet::TabChanged(int tab)
 {
     if (tab == m_active)
         return;
-    // The tab bar has switched already; a page that may not be left comes back before anything was painted.
-    if (auto* left = ActivePage(); left && !left->OnKillActive()) {
+    {
         const QSignalBlocker quiet(this);
         setCurrentIndex(m_active);
-        return;
     }
-    m_active = tab;
-    if (auto* entered = ActivePage())
-        entered->OnSetActive();
+    SetActivePage(tab);
 }
 
 bool CDlgPropertySheet::SetActivePage(int tab)
 {
-    if (tab >= 0 && tab < count())
-        setCurrentIndex(tab);
-    return m_active == tab;
-}
-
-bool CDlgPropertySheet::eventFilter(QObject* watched, QEvent* event)
-{
-    // Ctrl+F4 belongs to the document window even while the focus is in a page.
-    if (event->type() == QEvent::KeyPress) {
-        const auto* key = static_cast<QKeyEvent*>(event);
-        if (key->key() == Qt::Key_F4 && key->modifiers() & Qt::ControlModifier) {
-            m_view->CloseWindow();
-            return true;
-        }
-    }
-    return QTabWidget::eventFilter(watched, event);
+    if (tab < 0 || tab >= count() || tab == m_active)
+        return tab == m_active;
+    if (CGenPropertyPage* left = ActivePage(); left && !left->OnKillActive())
+        return false;
+    m_active = tab;
+    setCurrentIndex(tab);
+    if (CGenPropertyPage* entered = ActivePage())
+        entered->OnSetActive();
+    emit PageChanged();
+    return true;
 }
 
 void CDlgPropertySheet::changeEvent(QEvent* event)

@@ -8,7 +8,6 @@
 #include <vector>
 
 class CGenPropertyPage;
-class CKavo0_hdView;
 
 class CDlgPropertySheet : public QTabWidget
 {
@@ -16,7 +15,7 @@ class CDlgPropertySheet : public QTabWidget
 public:
     using MakePage = std::function<std::unique_ptr<CGenPropertyPage>()>;
 
-    explicit CDlgPropertySheet(CKavo0_hdView* view);
+    explicit CDlgPropertySheet(QWidget* parent);
 
     /// Adds a tab. Its page is made when it is first asked for, and belongs to the widget tree.
     void AddPage(Str caption, MakePage make);
@@ -25,11 +24,14 @@ public:
     /// Makes the next page that has not been made; false when all have.
     bool MakeNextPage() const;
     int PageCount() const { return count(); }
-    /// Switches to a tab; false when the active page refuses to be left.
+    /// Switches to a tab: the active page is asked, and only then anything changes. False when it refuses to be left.
     bool SetActivePage(int tab);
 
+signals:
+    /// Another page is in front.
+    void PageChanged();
+
 protected:
-    bool eventFilter(QObject* watched, QEvent* event) override;
     void changeEvent(QEvent* event) override;
 
 private:
@@ -41,7 +43,6 @@ private:
     };
     void TabChanged(int tab);
 
-    CKavo0_hdView* m_view;
     mutable std::vector<Tab> m_tabs; // in the order of the tab bar
     int m_active = -1;
 };

@@ -2,7 +2,9 @@
 
 #include "ks/fc/after_paint.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/status.h"
 #include "ks/language/language.h"
+#include "module/file_bar.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "pages/framework/gen_grid.h"
@@ -11,7 +13,6 @@
 #include "pages/framework/search_dlg.h"
 #include "res/strings.h"
 
-#include <QStatusTipEvent>
 #include <QTimer>
 #include <QUndoStack>
 #include <QVBoxLayout>
@@ -53,26 +54,24 @@ CKsMDIFrameWnd* CKavo0_hdView::MainFrame() const
     return qobject_cast<CKsMDIFrameWnd*>(window());
 }
 
-void CKavo0_hdView::CloseWindow()
-{
-    QTimer::singleShot(0, this, [this] {
-        if (auto* frame = qobject_cast<QMdiSubWindow*>(parentWidget()))
-            frame->close();
-    });
-}
-
 void CKavo0_hdView::OnInitialUpdate()
 {
     CView::OnInitialUpdate();
     m_sheet = new CDlgPropertySheet(this);
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(m_sheet);
+    layout->setSpacing(0);
+    layout->addWidget(new CFileBar(*GetDocument(), this));
+    layout->addWidget(m_sheet, 1);
     setFocusProxy(m_sheet);
+    const auto allowEditing = [this] { m_sheet->setEnabled(!GetDocument()->IsReadOnly()); };
+    connect(GetDocument(), &CKavo0_hdDoc::FileStateChanged, m_sheet, allowEditing);
+    allowEditing();
 
     AddTabs();
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
-    connect(m_sheet, &QTabWidget::currentChanged, this, &CKavo0_hdView::ShowLine);
+    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowLine);
+    connect(GetDocument(), &CKavo0_hdDoc::Said, this, &CKavo0_hdView::Say);
     for (auto switched : {&KsUnits::Changed, &KsUnits::DigitsChanged})
         connect(&KsUnits::Instance(), switched, this, [this] { OnUpdate(nullptr, Hint::Reload, nullptr); });
     connect(&KsLanguage::Instance(), &KsLanguage::Changed, this, &CKavo0_hdView::ShowLine);
@@ -128,6 +127,12 @@ void CKavo0_hdView::OnUpdate(CView*, int hint, CHint*)
     ShowLine(); // a paste or an undone step may have changed the list and the current cell
 }
 
+bool CKavo0_hdView::MayLeave(KsLeave what)
+{
+    auto* page = ActivePage();
+    return !page || (what == KsLeave::Field ? page->LeaveField() : page->OnKillActive());
+}
+
 void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deactivated)
 {
     if (activate) {
@@ -154,13 +159,10 @@ LRESULT CKavo0_hdView::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam
 
 // ---- what a page tells -------------------------------------------------------------------------
 
-void CKavo0_hdView::EditedLineChanged(int column)
+void CKavo0_hdView::EditedLineChanged(int /*column*/)
 {
     if (auto* page = ActivePage())
         page->StoreToDocument();
-    const bool location = column == 1 || column == 2;
-    if (location)
-        GetDocument()->DataChange(GetDocument()->GetPathName());
     GetDocument()->UpdateAllViews(nullptr, Hint::Reload);
 }
 
@@ -168,19 +170,32 @@ void CKavo0_hdView::CurrentLocationChanged()
 {
     ShowLine();
     if (MainFrame())
-        TellLater(m_tellLocation);
+        TellLocationLater();
 }
 
-/// In the status bar: the line of the table that is worked in, and the number of its current cell where the cell leaves
-/// digits out. Nothing for a page without a table.
+/// In the status bar: the line of the table that is worked in, the number of its current cell where the cell leaves digits
+/// out, and what has just been done.
 void CKavo0_hdView::ShowLine()
 {
     if (!MainFrame() || MainFrame()->GetActiveView() != this)
         return;
     const auto* page = ActivePage();
     const auto* grid = page ? page->LinesGrid() : nullptr;
-    QStatusTipEvent tip(grid ? grid->LineText() : QString());
-    QCoreApplication::sendEvent(MainFrame(), &tip);
+    QStringList parts;
+    if (const QString line = grid ? grid->LineText() : QString(); !line.isEmpty())
+        parts << line;
+    if (const QString said = std::exchange(m_said, {}); !said.isEmpty())
+        parts << said;
+    KsTellStatus(*this, parts.join(QStringLiteral("   ")));
+}
+
+/// When the present event is over: lines that become current in it are shown first, and would hide what is said.
+void CKavo0_hdView::Say(const QString& text)
+{
+    QTimer::singleShot(0, this, [this, text] {
+        m_said = text;
+        ShowLine();
+    });
 }
 
 void CKavo0_hdView::EnableLinesMenu(bool enable)
@@ -190,17 +205,17 @@ void CKavo0_hdView::EnableLinesMenu(bool enable)
         frame->EnableMenuItem(LinesMenuPosition, enable);
 }
 
-void CKavo0_hdView::RevealChange(CGenList* list, int row, int /*column*/)
+void CKavo0_hdView::RevealChange(const ChangePlace& place)
 {
-    for (int tab = 0; list && tab < m_sheet->PageCount(); ++tab) {
-        auto* page = m_sheet->PageAt(tab);
-        if (page->GetList() != list)
-            continue;
-        if (m_sheet->SetActivePage(tab) && row > 0)
-            page->GotoLine(row);
-        TellLater(m_tellChange);
+    int tab = m_sheet->currentIndex();
+    if (!ActivePage() || !ActivePage()->Shows(place))
+        for (tab = 0; tab < m_sheet->PageCount() && !m_sheet->PageAt(tab)->Shows(place);)
+            ++tab;
+    if (tab == m_sheet->PageCount() || !m_sheet->SetActivePage(tab))
         return;
-    }
+    // A window in the background stays there.
+    const bool isActive = !MainFrame() || MainFrame()->GetActiveView() == this;
+    m_sheet->PageAt(tab)->Reveal(place, isActive);
 }
 
 // ---- commands ----------------------------------------------------------------------------------
@@ -225,11 +240,12 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
 bool CKavo0_hdView::IsCommandEnabled(int id) const
 {
     const auto* page = ActivePage();
-    const bool lines = m_linesEnabled && page && page->GetGrid();
+    const auto isUsable = [](const CGenGrid* grid) { return grid && grid->isEnabled(); };
+    const bool lines = m_linesEnabled && page && isUsable(page->GetGrid());
     switch (id) {
     case Command::InsertLine:
     case Command::DeleteLine:
-        return m_linesEnabled && page && page->LinesGrid();
+        return m_linesEnabled && page && isUsable(page->LinesGrid());
     case Command::GotoLine:
     case Command::Search:
         return lines;
@@ -247,14 +263,14 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
 bool CKavo0_hdView::OnCommand(int id)
 {
     auto* page = ActivePage();
-    if (!page || !IsCommandEnabled(id))
+    if (!page || !IsCommandEnabled(id) || !MayLeave(KsLeave::Field))
         return false;
     switch (id) {
     case Command::InsertLine:
         page->AppendLine();
         return true;
     case Command::DeleteLine:
-        DeleteLines();
+        page->DeleteLines();
         return true;
     case Command::FetchLocation:
         FetchLocation();
@@ -276,15 +292,6 @@ bool CKavo0_hdView::OnCommand(int id)
     }
 }
 
-void CKavo0_hdView::DeleteLines()
-{
-    const QUndoStack& steps = GetDocument()->UndoStack();
-    const int before = steps.index();
-    ActivePage()->DeleteLines();
-    if (steps.index() != before)
-        TellLater(m_tellChange);
-}
-
 void CKavo0_hdView::GotoLine()
 {
     CGotoDlg dialog(this);
@@ -299,6 +306,7 @@ void CKavo0_hdView::Search()
         return;
     m_search = {dialog.RiverName(), dialog.Chainage(), dialog.ChainageCriterion(), dialog.NameCriterion()};
     m_search.asked = true;
+    m_search.page = ActivePage();
     SearchAgain();
 }
 
@@ -307,6 +315,10 @@ void CKavo0_hdView::SearchAgain()
     auto* grid = ActivePage() ? ActivePage()->GetGrid() : nullptr;
     if (!grid)
         return;
+    if (std::exchange(m_search.page, ActivePage()) != ActivePage()) {
+        m_search.row = 0;
+        m_search.found = false;
+    }
     if (grid->SearchRows(m_search.row, m_search.name, m_search.chainage, m_search.chainageCriterion,
                          m_search.nameCriterion)) {
         m_search.found = true;

@@ -22,13 +22,12 @@ public:
     /// The sheet; null before the first update.
     CDlgPropertySheet* Sheet() const { return m_sheet; }
     CGenPropertyPage* ActivePage() const;
-    /// Closes the document window, after this event.
-    void CloseWindow();
 
     // CView
     void OnInitialUpdate() override;
     void OnUpdate(CView* sender, int hint, CHint* object) override;
     void OnActivateView(bool activate, CView* activated, CView* deactivated) override;
+    bool MayLeave(KsLeave what) override;
     LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam) override;
 
     // CCommandTarget
@@ -52,16 +51,17 @@ private:
         QString name;
         double chainage = 0; // metres
         int chainageCriterion = 3, nameCriterion = 0;
-        int row = 0; // the next search starts here; 0 is the first row
+        int row = 0;                            // the next search starts here; 0 is the first row
+        const CGenPropertyPage* page = nullptr; // on which `row` is
         bool asked = false, found = false;
     };
 
     LRESULT AnswerEditor(WPARAM request, CKSComm_Package* package);
     void FetchLocation();
     void ShowLine();
-    void DeleteLines();
-    void TellLater(bool& news);
-    void Tell();
+    void Say(const QString& text);
+    void TellLocationLater();
+    void TellLocation();
 
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
@@ -69,14 +69,15 @@ private:
     void Search();
     void SearchAgain();
     void GotoLine();
-    void RevealChange(CGenList* list, int row, int column);
+    void RevealChange(const ChangePlace& place);
     void SendToolbarMessage(unsigned message);
     CKsMDIFrameWnd* MainFrame() const;
 
     CDlgPropertySheet* m_sheet = nullptr;                      // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_inProject = false;
-    bool m_tellLocation = false, m_tellChange = false; // once the present event is over
+    bool m_tellLocation = false; // once the present event is over
+    QString m_said;              // in the status bar, behind the line
     SearchState m_search;
     bool m_linesEnabled = true;
 };

@@ -1,6 +1,7 @@
 // The view and the other editors of the project: what it answers, what it asks and what it tells.
 #include "module/view.h"
 
+#include "ks/fc/branch_name.h"
 #include "ks/fc/exchange.h"
 #include "ks/fc/message_box.h"
 #include "module/kavo0_hd.h"
@@ -39,27 +40,21 @@ LRESULT CKavo0_hdView::AnswerEditor(WPARAM request, CKSComm_Package* package)
     return 0;
 }
 
-/// News wait until the present event is over: a row becomes current, or a step is undone, in the middle of changes, and
-/// who hears of it asks at once. Many moves in one event are told once.
-void CKavo0_hdView::TellLater(bool& news)
+/// The news waits until the present event is over: a row becomes current in the middle of changes, and who hears of it
+/// asks at once. Many moves in one event are told once.
+void CKavo0_hdView::TellLocationLater()
 {
-    if (!m_inProject)
-        return;
-    if (!m_tellLocation && !m_tellChange)
-        QTimer::singleShot(0, this, &CKavo0_hdView::Tell);
-    news = true;
+    if (m_inProject && !std::exchange(m_tellLocation, true))
+        QTimer::singleShot(0, this, &CKavo0_hdView::TellLocation);
 }
 
-void CKavo0_hdView::Tell()
+void CKavo0_hdView::TellLocation()
 {
-    const bool location = std::exchange(m_tellLocation, false), change = std::exchange(m_tellChange, false);
+    m_tellLocation = false;
     if (!GetDocument())
         return;
-    if (change)
-        GetDocument()->DataChange(GetDocument()->GetPathName());
     const auto* page = ActivePage();
-    const auto record =
-        location && page && page->GetGrid() ? page->GetRecordAt(page->GetGrid()->CurrentRow()) : nullptr;
+    const auto record = page && page->GetGrid() ? page->GetRecordAt(page->GetGrid()->CurrentRow()) : nullptr;
     if (!record || record->IsBlank())
         return;
     auto shown = std::make_unique<CKvrCBELocation>();
@@ -78,7 +73,7 @@ QStringList CKavo0_hdView::BranchNames()
     for (const auto& item : names) {
         const auto* name = dynamic_cast<const CKvrCBEText*>(item.get());
         if (name && !name->text.isEmpty())
-            branches << name->text.toUpper(); // as the column stores them
+            branches << KsBranchKey(name->text); // as the column stores them
     }
     branches.removeDuplicates();
     return branches;

@@ -74,7 +74,6 @@ CEncroachPage::CEncroachPage(CKavo0_hdDoc* document, QWidget* parent)
         Insert(std::move(setup));
     });
     connect(m_ui->delete_1346, &QPushButton::clicked, this, &CEncroachPage::Delete);
-    connect(document, &CKavo0_hdDoc::Reveal, this, [this](const CGenList* list) { Reveal(list); });
     DeclareColumns();
 }
 
@@ -175,14 +174,28 @@ void CEncroachPage::Delete()
     GetDocument()->UndoStack().push(new CSetupCommand(*GetDocument(), m_current, nullptr));
 }
 
-void CEncroachPage::Reveal(const CGenList* list)
+/// Number of the set-up that the list is; GetCount() for none.
+std::size_t CEncroachPage::SetupOf(const void* list) const
 {
-    for (std::size_t setup = 0; setup < Setups().GetCount(); ++setup) {
-        if (&Setups().GetAt(setup) != list || setup == m_current)
-            continue;
+    std::size_t setup = 0;
+    while (setup < Setups().GetCount() && static_cast<const CGenList*>(&Setups().GetAt(setup)) != list)
+        ++setup;
+    return setup;
+}
+
+bool CEncroachPage::Shows(const ChangePlace& place) const
+{
+    return place.data == &Setups() || SetupOf(place.data) < Setups().GetCount() || CLocationPage::Shows(place);
+}
+
+void CEncroachPage::Reveal(const ChangePlace& place, bool focus)
+{
+    const std::size_t setup = SetupOf(place.data);
+    if (setup < Setups().GetCount() && setup != m_current) {
         m_current = setup;
         LoadFromDocument(GetDocument());
     }
+    CLocationPage::Reveal(place, focus);
 }
 
 void CEncroachPage::Retranslate()

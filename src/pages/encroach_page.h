@@ -16,6 +16,8 @@ public:
     explicit CEncroachPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CEncroachPage() override;
     void LoadFromDocument(CKavo0_hdDoc* document) override;
+    bool Shows(const ChangePlace& place) const override;
+    void Reveal(const ChangePlace& place, bool focus) override;
 
 protected:
     void Retranslate() override;
@@ -23,6 +25,7 @@ protected:
 private:
     using Setup = CGenParamList<HDEncroach>;
     CGenMetaList<HDEncroach>& Setups() const;
+    std::size_t SetupOf(const void* list) const;
     bool HasSetup() const { return m_current < Setups().GetCount(); }
 
     void DeclareColumns();
@@ -33,7 +36,6 @@ private:
     std::unique_ptr<Setup> NewSetup() const;
     void Delete();
     void ShowSetups();
-    void Reveal(const CGenList* list);
 
     std::unique_ptr<Ui::CEncroachPage> m_ui;
     std::size_t m_current = 0; // the set-up in the grid

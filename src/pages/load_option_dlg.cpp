@@ -7,8 +7,6 @@
 #include "res/strings.h"
 #include "ui_load_option_dlg.h"
 
-#include <QStatusTipEvent>
-
 CEditorsLoadOptionDlg::CEditorsLoadOptionDlg(QWidget* parent)
     : QDialog(parent), m_ui(std::make_unique<Ui::CEditorsLoadOptionDlg>())
 {
@@ -41,8 +39,7 @@ void AskForLocations(CGenPropertyPage& page)
         return;
     }
     const LoadedLocations loaded = LoadLocations(page, places, {dialog.Option() >= 1, dialog.Option() == 2});
-    QStatusTipEvent told(
-        loaded.changed ? LoadString(Str::LocationsLoadedChanged).arg(loaded.added).arg(loaded.known).arg(loaded.changed)
-                       : LoadString(Str::LocationsLoaded).arg(loaded.added).arg(loaded.known));
-    QCoreApplication::sendEvent(page.window(), &told);
+    document.Say(loaded.changed
+                     ? LoadString(Str::LocationsLoadedChanged).arg(loaded.added).arg(loaded.known).arg(loaded.changed)
+                     : LoadString(Str::LocationsLoaded).arg(loaded.added).arg(loaded.known));
 }

@@ -1,5 +1,6 @@
 #include "pages/location_loader.h"
 
+#include "ks/fc/branch_name.h"
 #include "module/document.h"
 #include "pages/framework/commands.h"
 #include "pages/framework/gen_grid.h"
@@ -26,7 +27,7 @@ public:
         for (std::size_t row = head; row < m_rows->Count(); ++row) {
             const HD_RiverPos& record = list.GetAt(row - head);
             if (!record.IsBlank() && std::isfinite(record.Chainage))
-                m_known.emplace(Place(QString::fromStdString(record.RiverName).toUpper(), record.Chainage), row);
+                m_known.emplace(Place(KsBranchKey(QString::fromStdString(record.RiverName)), record.Chainage), row);
         }
     }
 
@@ -44,7 +45,7 @@ public:
 private:
     void Take(const CKvrCBELocation& place)
     {
-        const Place key(place.branch.toUpper(), place.chainage);
+        const Place key(KsBranchKey(place.branch), place.chainage);
         if (!m_taken.insert(key).second)
             return; // it came already
         const auto line = m_known.find(key);
@@ -90,7 +91,7 @@ private:
         auto lines = model.NewLines(int(m_new.size()));
         for (std::size_t i = 0; i < m_new.size(); ++i) {
             auto& record = *static_cast<HD_RiverPos*>(lines->At(i));
-            record.RiverName = m_new[i]->branch.toUpper().toStdString();
+            record.RiverName = KsBranchKey(m_new[i]->branch).toStdString();
             record.Chainage = m_new[i]->chainage;
             for (const ColumnSpec& column : model.Columns()) {
                 const double value = ValueFor(column, *m_new[i]);
@@ -111,9 +112,8 @@ private:
         if (!m_changes.empty())
             document.UndoStack().push(new CSetCells(document, m_rows, std::move(m_changes), m_firstChanged));
         if (!m_new.empty())
-            document.UndoStack().push(new CInsertLines(document, m_rows, m_rows->Count(), NewLines(), FirstLine::Goes));
+            document.UndoStack().push(new CInsertLines(document, m_rows, m_rows->Count(), NewLines()));
         document.UndoStack().endMacro();
-        document.DataChange(document.GetPathName());
     }
 
     CGenPropertyPage& m_page;

@@ -94,10 +94,14 @@ void CMapsPage::DeclareMaps()
 
 void CMapsPage::LoadFromDocument(CKavo0_hdDoc* document)
 {
-    if (!std::exchange(m_cleaned, true)) {
-        document->CleanAtSave(m_ui->maps_1226->Model()->Rows(), &HasNoFile<CMapsOutput>);
-        document->CleanAtSave(m_ui->dem_1227->Model()->Rows(), &HasNoFile<CMapsInput>);
-    }
+    document->AtSave({.rows = m_ui->maps_1226->Model()->Rows(),
+                      .isIncomplete = &HasNoFile<CMapsOutput>,
+                      .oneDropped = Str::DroppedFile,
+                      .manyDropped = Str::DroppedFiles});
+    document->AtSave({.rows = m_ui->dem_1227->Model()->Rows(),
+                      .isIncomplete = &HasNoFile<CMapsInput>,
+                      .oneDropped = Str::DroppedFile,
+                      .manyDropped = Str::DroppedFiles});
     CLocationPage::LoadFromDocument(document);
     ShowStatus();
 }

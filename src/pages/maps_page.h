@@ -26,6 +26,5 @@ private:
     void DeclareMaps();
     void ShowStatus();
 
-    bool m_cleaned = false; // the document knows which rows a save leaves out
     std::unique_ptr<Ui::CMapsPage> m_ui;
 };

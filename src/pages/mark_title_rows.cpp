@@ -70,7 +70,6 @@ public:
     RowKey KeyAt(std::size_t row) override { return row; }
     void* Object(RowKey key) override { return At(key); }
     std::size_t RowOf(RowKey key, std::size_t) override { return std::min(std::size_t(key), Count()); }
-    void Touch(RowKey) override { m_document.PlaceholderRowTouched(&Titles()); }
 
     std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override
     {
@@ -80,7 +79,6 @@ public:
     }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {
-        Touch(row);
         row = std::min(row, Count());
         std::size_t at = row;
         for (auto& entry : static_cast<CTitleBlock&>(*block).entries)
@@ -89,26 +87,14 @@ public:
     }
     std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
     {
-        Touch(row);
-        auto block = std::make_unique<CTitleBlock>();
-        for (std::size_t i = 0; i < count; ++i)
-            block->entries.push_back(TakeTitle(row));
-        return block;
+        return Block(row, count, Count() + 1);
     }
-    // The empty title of a document without titles is no column yet: levels that the file may hold stay where they are.
-    void AddFirstRow(std::unique_ptr<IRowBlock>) override
+    std::unique_ptr<IRowBlock> TakeBack(std::size_t row, std::size_t count) override
     {
-        Globals().MarkTitles.emplace_back();
-        m_document.AddPlaceholderRow(&Titles());
-    }
-    void TakeFirstRow() override
-    {
-        if (!m_document.IsPlaceholderRow(&Titles()))
-            return;
-        Globals().MarkTitles.clear();
-        m_document.PlaceholderRowTouched(&Titles());
+        return Block(row, count, count == Count() ? 0 : Count() + 1);
     }
 
+    const void* Data() const override { return &Titles(); }
     CGenList* List() const override { return &m_document.Parameters().WaterLevelMarkList; }
     std::size_t ListRow(std::size_t) const override { return std::size_t(-1); } // no line of the list
 
@@ -123,16 +109,29 @@ private:
         for (std::size_t i = 0; i < records.GetCount(); ++i)
             visit(records.GetAt(i));
     }
+    /// Takes titles out; the levels below the title `adopted` stay where they are.
+    std::unique_ptr<IRowBlock> Block(std::size_t row, std::size_t count, std::size_t adopted)
+    {
+        auto block = std::make_unique<CTitleBlock>();
+        block->entries.resize(count);
+        for (std::size_t i = count; i-- > 0;)
+            block->entries[i] = TakeTitle(row + i, row + i != adopted);
+        return block;
+    }
+    /// The first of all titles becomes the one of the levels that stand there without: those of a document without
+    /// titles, which the page shows below the row it offers.
     void PutTitle(std::size_t row, const CTitleBlock::Entry& entry)
     {
         HD_Global_Var& globals = Globals();
+        const bool adopts = entry.isNew && globals.MarkTitles.empty();
         globals.MarkTitles.insert(globals.MarkTitles.begin() + std::ptrdiff_t(row), entry.title.title);
-        if (entry.hasFlag) {
+        // Missing flags are off: a list of flags that ends before the title is lengthened only for one that is on.
+        if (entry.hasFlag && (entry.title.interpolate || row <= globals.MarkInterpolate.size())) {
             globals.MarkInterpolate.resize(std::max(globals.MarkInterpolate.size(), row));
             globals.MarkInterpolate.insert(globals.MarkInterpolate.begin() + std::ptrdiff_t(row),
                                            entry.title.interpolate);
         }
-        if (entry.isNew)
+        if (entry.isNew && !adopts)
             EveryRecord([row](HDWLMark& record) {
                 if (record.MarkLevels.size() > row)
                     record.MarkLevels.insert(record.MarkLevels.begin() + std::ptrdiff_t(row), NotGiven);
@@ -140,11 +139,11 @@ private:
         for (const Level& level : entry.levels)
             level.record->MarkLevels.insert(level.record->MarkLevels.begin() + std::ptrdiff_t(row), level.value);
     }
-    CTitleBlock::Entry TakeTitle(std::size_t row)
+    CTitleBlock::Entry TakeTitle(std::size_t row, bool withLevels)
     {
         HD_Global_Var& globals = Globals();
         CTitleBlock::Entry entry;
-        entry.isNew = false;
+        entry.isNew = !withLevels;
         entry.title.title = globals.MarkTitles[row];
         globals.MarkTitles.erase(globals.MarkTitles.begin() + std::ptrdiff_t(row));
         entry.hasFlag = row < globals.MarkInterpolate.size();
@@ -152,8 +151,8 @@ private:
             entry.title.interpolate = globals.MarkInterpolate[row];
             globals.MarkInterpolate.erase(globals.MarkInterpolate.begin() + std::ptrdiff_t(row));
         }
-        EveryRecord([row, &entry](HDWLMark& record) {
-            if (record.MarkLevels.size() <= row)
+        EveryRecord([row, withLevels, &entry](HDWLMark& record) {
+            if (!withLevels || record.MarkLevels.size() <= row)
                 return;
             const auto level = record.MarkLevels.begin() + std::ptrdiff_t(row);
             entry.levels.push_back({&record, *level});

@@ -19,6 +19,7 @@ ChangePlace CSetupCommand::Exchange()
     else
         m_setup = m_setups.RemoveAt(m_index);
     if (m_setups.IsEmpty())
-        return {};
-    return {&m_setups.GetAt(std::min(m_index, m_setups.GetCount() - 1)), 1, 1};
+        return {&m_setups};
+    CGenList& shown = m_setups.GetAt(std::min(m_index, m_setups.GetCount() - 1));
+    return {&shown, 1, 1, &shown, 1};
 }

@@ -48,6 +48,14 @@ CTextOutputPage::CTextOutputPage(CKavo0_hdDoc* document, QWidget* parent)
 
 CTextOutputPage::~CTextOutputPage() = default;
 
+void CTextOutputPage::LoadFromDocument(CKavo0_hdDoc* document)
+{
+    // What the empty tables show is what a new file gets.
+    for (const CGenGrid* grid : {m_ui->items_1216, m_ui->files_1226})
+        document->AtSave({.rows = grid->Model()->Rows(), .writesFirstRow = true});
+    CLocationPage::LoadFromDocument(document);
+}
+
 void CTextOutputPage::OnGridButtonClicked(CGenGrid& grid, int row, int /*column*/)
 {
     const bool isBridge = grid.TextAt(row, FileFormatColumn) == LineOf(Str::OutputFormats, 0)();

@@ -16,6 +16,7 @@ public:
     explicit CTextOutputPage(CKavo0_hdDoc* document, QWidget* parent = nullptr);
     ~CTextOutputPage() override;
 
+    void LoadFromDocument(CKavo0_hdDoc* document) override;
     void OnGridButtonClicked(CGenGrid& grid, int row, int column) override;
 
 protected:

@@ -3,6 +3,8 @@
 #include "pages/mark_title_rows.h"
 #include "ui_wl_mark_page.h"
 
+#include <algorithm>
+
 namespace {
 
 constexpr int LocationColumns = 2; // the columns of levels follow
@@ -33,6 +35,11 @@ CellAccess InterpolateAccess()
                     changed->globals->MarkInterpolate.resize(flags);
             };
         }};
+}
+
+bool IsUntitled(const void* row)
+{
+    return static_cast<const MarkTitle*>(row)->Title().empty();
 }
 
 const HDWLMark& Mark(const void* row)
@@ -82,8 +89,6 @@ CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document, QWidget* parent)
                {.caption = Str::MarkTitle, .width = 300, .upperCase = true})
         .Value(InterpolateAccess(), FieldKind::Boolean, UnitGroup::None,
                {.caption = Str::MarkInterpolate, .width = 50});
-    document->CleanAtSave(m_ui->titles_1075->Model()->Rows(),
-                          [](const void* row) { return static_cast<const MarkTitle*>(row)->Title().empty(); });
 }
 
 CWLMarkPage::~CWLMarkPage() = default;
@@ -92,21 +97,36 @@ CWLMarkPage::~CWLMarkPage() = default;
 void CWLMarkPage::ShowLevelColumns()
 {
     const std::vector<std::string>& titles = Globals().MarkTitles;
+    const std::size_t shown = std::max<std::size_t>(titles.size(), 1); // the row that stands for no titles, too
     CGridModel& model = *GetGrid()->Model();
-    model.RemoveColumnsFrom(LocationColumns + int(titles.size()));
+    model.RemoveColumnsFrom(LocationColumns + int(shown));
     GridColumns columns(*GetGrid());
-    for (auto title = std::size_t(model.columnCount() - LocationColumns); title < titles.size(); ++title)
-        columns.Value(LevelAccess(title), FieldKind::Number, UnitGroup::WaterLevel,
-                      {.header = [&titles, title] { return QString::fromStdString(titles[title]); },
-                       .width = 62,
-                       .emptyIsNotGiven = true});
+    for (auto title = std::size_t(model.columnCount() - LocationColumns); title < shown; ++title)
+        columns.Value(
+            LevelAccess(title), FieldKind::Number, UnitGroup::WaterLevel,
+            {.header = [&titles,
+                        title] { return title < titles.size() ? QString::fromStdString(titles[title]) : QString(); },
+             .width = 62,
+             .emptyIsNotGiven = true});
 }
 
 void CWLMarkPage::LoadFromDocument(CKavo0_hdDoc* document)
 {
-    m_ui->titles_1075->Model()->EnsureFirstRow();
+    document->AtSave({.rows = m_ui->titles_1075->Model()->Rows(),
+                      .isIncomplete = &IsUntitled,
+                      .oneDropped = Str::DroppedTitle,
+                      .manyDropped = Str::DroppedTitles});
     ShowLevelColumns();
     CLocationPage::LoadFromDocument(document);
+    ShowStatus();
+}
+
+/// An untitled column means nothing to the simulation: a save leaves it out with its levels, and says so beforehand.
+void CWLMarkPage::ShowStatus()
+{
+    const auto& titles = Globals().MarkTitles;
+    const auto count = std::count(titles.begin(), titles.end(), std::string());
+    m_ui->status_1076->setText(count > 0 ? LoadString(Str::MarksWithoutTitle).arg(count) : QString());
 }
 
 void CWLMarkPage::AppendLine()

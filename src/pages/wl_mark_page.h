@@ -25,6 +25,7 @@ protected:
 
 private:
     void ShowLevelColumns();
+    void ShowStatus();
 
     std::unique_ptr<Ui::CWLMarkPage> m_ui;
 };

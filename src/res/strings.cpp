@@ -31,3 +31,8 @@ QString LoadString(Str id)
 {
     return LoadString(static_cast<int>(id));
 }
+
+QString LoadCounted(std::size_t count, Str one, Str many)
+{
+    return count == 1 ? LoadString(one) : LoadString(many).arg(count);
+}

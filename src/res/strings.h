@@ -2,8 +2,10 @@
 #pragma once
 
 #include <QString>
+#include <cstddef>
 
-enum class Str : int {
+enum class Str : int
+{
 #define KVR_STRING(number, name, text) name = number,
 #include "res/string_table.inc"
 #undef KVR_STRING
@@ -11,5 +13,7 @@ enum class Str : int {
 
 /// The text in the user's language.
 QString LoadString(Str id);
+/// The text for one, or the one for many with their number.
+QString LoadCounted(std::size_t count, Str one, Str many);
 /// By number, as resources are addressed; empty for a number that is not in the table.
 QString LoadString(int number);

@@ -9,6 +9,7 @@
 #include "shell/recent_files.h"
 
 #include <QUndoGroup>
+#include <functional>
 #include <map>
 #include <memory>
 #include <vector>
@@ -39,7 +40,7 @@ public:
     CKsDoc* NewDocument(CMultiDocTemplate& documents);
     /// Opens a project file with all its members; false when the user has been told why not.
     bool OpenProject(const QString& path, bool othersLater = false);
-    /// Closes the project's windows, asking for each; false when one was kept, the project then stays open.
+    /// Closes the project's windows; all questions come first. False, and everything as it was, when one was kept.
     bool CloseProject(CProjectHandle handle);
 
     CKsDoc* ActiveDocument() const;
@@ -65,7 +66,6 @@ private:
     void OnFileSaveAs();
     void OnFileClose();
     void OnFileExit();
-    void StoreTyping();
     void OnUndo();
     void OnRedo();
     void OnCut();
@@ -88,6 +88,7 @@ private:
 
     // Menus and texts.
     void CreateActions();
+    void Connect(QAction* action, std::function<void()> run, bool whileTyping = false);
     void CreateMenus();
     void CreateLanguageMenu(QMenu* menu);
     void Retranslate();
@@ -114,11 +115,13 @@ private:
     CMultiDocTemplate* TemplateFor(const QString& path) const;
     void AddTemplate(CMultiDocTemplate* documents);
     QString AskOpen(const QString& title, const QString& filters);
-    CKsDoc* OpenDocument(CMultiDocTemplate& documents, const QString& path);
+    void DocumentShown(const CKsDoc* document);
     void SetWindowIcons();
     void UpdateProjectTree();
     void ShowMember(CProjectHandle handle, const QString& stored);
-    CMemberState StateOf(const QString& stored) const;
+    CMemberState StateOf(const CProject& project, const QString& stored) const;
+    const CProject* OwnerOf(const QString& member) const;
+    void TellOfSharedMembers(const CProject& project) const;
     void Announce(WPARAM what, const CProject& project);
     QStringList OpenMembers(const CProject& project, const QStringList& members);
     void OpenOtherMembers(CProjectHandle handle, QStringList missing);

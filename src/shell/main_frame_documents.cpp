@@ -2,6 +2,7 @@
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
 #include "shell/main_frame.h"
+#include "shell/project_respell.h"
 #include "shell/settings_keys.h"
 
 #include <QDir>
@@ -57,28 +58,28 @@ void CMainFrame::AddTemplate(CMultiDocTemplate* documents)
         connect(document, &CKsDoc::TitleChanged, this, &CMainFrame::UpdateTitle);
         connect(document, &CKsDoc::PathNameChanged, this, [this](const CString& oldPath, const CString& newPath) {
             m_recent.Rename(oldPath, newPath);
+            for (const auto& project : m_projects.All())
+                RespellMember(project->path, oldPath, newPath);
             if (!newPath.isEmpty())
                 m_recent.Add(newPath);
         });
     });
+    connect(documents, &CMultiDocTemplate::DocumentShown, this, &CMainFrame::DocumentShown);
 }
 
-CKsDoc* CMainFrame::OpenDocument(CMultiDocTemplate& documents, const QString& path)
+/// Whoever opened it: the user, a project, or an editor for another one.
+void CMainFrame::DocumentShown(const CKsDoc* document)
 {
-    CKsDoc* document = documents.OpenDocumentFile(this, path);
-    if (!document)
-        return nullptr;
     if (!document->GetPathName().isEmpty())
         m_recent.Add(document->GetPathName());
     SetWindowIcons();
     UpdateTitle(); // by now it may have joined a project
     UpdateActions();
-    return document;
 }
 
 CKsDoc* CMainFrame::NewDocument(CMultiDocTemplate& documents)
 {
-    return OpenDocument(documents, {});
+    return documents.OpenDocumentFile(this, {});
 }
 
 bool CMainFrame::OpenFile(const QString& path, bool othersLater)
@@ -86,7 +87,7 @@ bool CMainFrame::OpenFile(const QString& path, bool othersLater)
     if (IsProject(path))
         return OpenProject(path, othersLater);
     if (CMultiDocTemplate* documents = TemplateFor(path))
-        return OpenDocument(*documents, path) != nullptr;
+        return documents->OpenDocumentFile(this, path) != nullptr;
     QStringList known{QString::fromLatin1(ProjectExtension)};
     for (const CMultiDocTemplate* documents : Templates())
         known << documents->GetDocString(CMultiDocTemplate::filterExt);
@@ -196,6 +197,8 @@ void CMainFrame::dropEvent(QDropEvent* event)
 {
     const auto urls = event->mimeData()->urls();
     event->acceptProposedAction();
+    if (!MayLeave())
+        return;
     for (const QUrl& url : urls) {
         if (url.isLocalFile())
             OpenFile(url.toLocalFile());

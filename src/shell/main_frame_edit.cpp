@@ -22,22 +22,13 @@ CCommandTarget* FocusTarget(int command)
 
 } // namespace
 
-/// What is being typed is a change of its own, and the last one.
-void CMainFrame::StoreTyping()
-{
-    if (const auto* view = GetActiveView())
-        view->GetDocument()->UpdateAllViews(nullptr, CKsDoc::StoreHint);
-}
-
 void CMainFrame::OnUndo()
 {
-    StoreTyping();
     m_undo.undo();
 }
 
 void CMainFrame::OnRedo()
 {
-    StoreTyping();
     m_undo.redo();
 }
 

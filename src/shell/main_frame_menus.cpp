@@ -33,7 +33,7 @@ constexpr std::array<const char*, MenuCount> MenuTitles{
     QT_TRANSLATE_NOOP("CMainFrame", "&Window"), QT_TRANSLATE_NOOP("CMainFrame", "&Help"),
 };
 
-/// The key belongs to whatever has the focus; the menu only shows it.
+/// The key belongs to whatever has the focus; the menu only shows it. Such a command is part of the typing.
 constexpr bool ShownOnly = true;
 
 } // namespace
@@ -99,18 +99,37 @@ std::span<const CFrameAction> CFrameAction::Table()
     return table;
 }
 
-/// The desktop's keys for a standard command, Tab spelled as on the keyboard.
+/// The desktop's keys for a standard command, Tab spelled as on the keyboard. Redo has both of its usual keys,
+/// whichever of them the desktop knows: the grids and the documentation name Ctrl+Y.
 static QList<QKeySequence> KeysFor(QKeySequence::StandardKey key)
 {
     auto keys = QKeySequence::keyBindings(key);
+    if (key == QKeySequence::Close)
+        return {QKeySequence(Qt::CTRL | Qt::Key_W), QKeySequence(Qt::CTRL | Qt::Key_F4)};
     if (key == QKeySequence::PreviousChild)
         keys.prepend(QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_Tab));
+    if (key == QKeySequence::Redo) {
+        const QList<QKeySequence> both{Qt::CTRL | Qt::Key_Y, Qt::CTRL | Qt::SHIFT | Qt::Key_Z};
+        keys.removeIf([&both](const QKeySequence& each) { return both.contains(each); });
+        keys = both + keys;
+    }
     return keys;
 }
 
 QAction* CMainFrame::Action(const char* name) const
 {
     return m_actions.at(QString::fromLatin1(name));
+}
+
+/// Every command first asks the active view, so that what is being typed is part of what the command finds.
+void CMainFrame::Connect(QAction* action, std::function<void()> run, bool whileTyping)
+{
+    connect(action, &QAction::triggered, this, [this, run = std::move(run), whileTyping] {
+        if (whileTyping || MayLeave())
+            run();
+        else
+            UpdateActions(); // a check mark may have changed already
+    });
 }
 
 void CMainFrame::CreateActions()
@@ -125,7 +144,8 @@ void CMainFrame::CreateActions()
         if (row.key != QKeySequence::UnknownKey && !row.shownOnly)
             action->setShortcuts(KeysFor(row.key));
         if (row.run)
-            connect(action, &QAction::triggered, this, row.run);
+            Connect(
+                action, [this, run = row.run] { (this->*run)(); }, row.shownOnly);
         m_actions.emplace(action->objectName(), action);
     }
     Action("actionTabs")->setCheckable(true);
@@ -170,7 +190,7 @@ void CMainFrame::CreateMenus()
         action->setObjectName(QString::fromLatin1(name));
         action->setCheckable(true);
         units->addAction(action);
-        connect(action, &QAction::triggered, this, run);
+        Connect(action, [this, command = run] { (this->*command)(); });
         m_actions.emplace(action->objectName(), action);
     }
     CreateLanguageMenu(m_languageMenu);
@@ -198,7 +218,7 @@ void CMainFrame::CreateLanguageMenu(QMenu* menu)
         action->setObjectName(QStringLiteral("actionLanguage_") + code);
         action->setCheckable(true);
         group->addAction(action);
-        connect(action, &QAction::triggered, this, [code] { KsLanguage::Instance().SetCurrent(code); });
+        Connect(action, [code] { KsLanguage::Instance().SetCurrent(code); });
         m_actions.emplace(action->objectName(), action);
     }
 }
@@ -256,7 +276,7 @@ void CMainFrame::FillRecentMenu()
         QString text = QDir::toNativeSeparators(file).replace(u'&', QStringLiteral("&&"));
         if (++number < 10)
             text.prepend(QStringLiteral("&%1  ").arg(number));
-        connect(m_recentMenu->addAction(text), &QAction::triggered, this, [this, file] { OpenFile(file); });
+        Connect(m_recentMenu->addAction(text), [this, file] { OpenFile(file); });
     }
     m_recentMenu->addSeparator();
     connect(m_recentMenu->addAction(tr("&Clear List")), &QAction::triggered, this, [this] {
@@ -342,6 +362,6 @@ void CMainFrame::FillWindowMenu()
         QAction* action = menu->addAction(title.replace(QStringLiteral("[*]"), window->isWindowModified() ? "*" : ""));
         action->setCheckable(true);
         action->setChecked(window == MdiArea().currentSubWindow());
-        connect(action, &QAction::triggered, window, [this, window] { MdiArea().setActiveSubWindow(window); });
+        Connect(action, [this, window = QPointer(window)] { MdiArea().setActiveSubWindow(window); });
     }
 }

@@ -1,5 +1,6 @@
 // Projects in the main frame.
 #include "ks/fc/after_paint.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "shell/main_frame.h"
 #include "shell/settings_keys.h"
@@ -72,6 +73,7 @@ void CMainFrame::OpenOtherMembers(CProjectHandle handle, QStringList missing)
     if (!missing.isEmpty())
         KsMessageBox(
             tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing.join(u'\n')));
+    TellOfSharedMembers(project);
     if (MdiArea().subWindowList().size() > 1 && !project.members.isEmpty() && !UsesTabs()) {
         ShowMember(project.handle, project.members.front()); // the first file is the main one
         PlaceSideBySide();
@@ -80,10 +82,34 @@ void CMainFrame::OpenOtherMembers(CProjectHandle handle, QStringList missing)
     UpdateActions();
 }
 
-CMemberState CMainFrame::StateOf(const QString& stored) const
+/// A file hears one project. Those of this one that are open in another stay there, and the user is told.
+void CMainFrame::TellOfSharedMembers(const CProject& project) const
 {
-    const QString member = ExistingSpelling(stored);
+    QStringList shared;
+    for (const QString& member : project.members) {
+        if (const CProject* owner = OwnerOf(member); owner && owner->handle != project.handle)
+            shared << tr("%1: open in the project %2").arg(QDir::toNativeSeparators(member), owner->name);
+    }
+    if (!shared.isEmpty())
+        KsMessageBox(tr("These files of the project %1 are open in another project and stay there:\n%2\n"
+                        "To have one of them in %1, close its window and open it from the list of %1.")
+                         .arg(project.name, shared.join(u'\n')));
+}
+
+/// The project that an open file has joined; null for none.
+const CProject* CMainFrame::OwnerOf(const QString& member) const
+{
+    const CMultiDocTemplate* documents = TemplateFor(member);
+    const CKsDoc* open = documents ? documents->FindDocument(member) : nullptr;
+    return open && !open->Views().empty() ? m_projects.FindByView(open->Views().front()) : nullptr;
+}
+
+CMemberState CMainFrame::StateOf(const CProject& project, const QString& stored) const
+{
+    const QString member = KsExistingSpelling(stored);
     CMemberState state;
+    if (const CProject* owner = OwnerOf(member); owner && owner->handle != project.handle)
+        state.elsewhere = owner->name;
     for (const auto& plugin : m_plugins) {
         for (const auto& documents : plugin->templates) {
             if (!documents->MatchesExtension(member))
@@ -103,7 +129,8 @@ CMemberState CMainFrame::StateOf(const QString& stored) const
 
 void CMainFrame::UpdateProjectTree()
 {
-    m_projectTree->Show(m_projects, [this](const QString& member) { return StateOf(member); });
+    m_projectTree->Show(m_projects,
+                        [this](const CProject& project, const QString& member) { return StateOf(project, member); });
     if (m_projects.All().empty())
         m_projectTree->hide();
 }
@@ -113,7 +140,7 @@ QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& 
 {
     QStringList missing;
     for (const QString& stored : members) {
-        const QString member = ExistingSpelling(stored);
+        const QString member = KsExistingSpelling(stored);
         const QString name = QDir::toNativeSeparators(member);
         if (!QFileInfo::exists(member))
             missing << tr("%1: the file does not exist").arg(name);
@@ -128,7 +155,7 @@ QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& 
 void CMainFrame::ShowMember(CProjectHandle handle, const QString& stored)
 {
     const CProject* project = m_projects.Find(handle);
-    const QString member = ExistingSpelling(stored);
+    const QString member = KsExistingSpelling(stored);
     if (project && TemplateFor(member) && QFileInfo::exists(member))
         OpenMember(CProject(*project), member, true);
 }
@@ -148,7 +175,10 @@ bool CMainFrame::OpenMember(const CProject& project, const QString& member, bool
         if (!window->close())
             return m_projects.FindByView(view) == &project; // kept by the user: not in this project
     }
-    return OpenDocument(documents, member) != nullptr;
+    m_projects.Prefer(project.handle);
+    const bool opened = documents.OpenDocumentFile(this, member) != nullptr;
+    m_projects.Prefer(0);
+    return opened;
 }
 
 bool CMainFrame::CloseProject(CProjectHandle handle)
@@ -157,10 +187,13 @@ bool CMainFrame::CloseProject(CProjectHandle handle)
     if (!found)
         return false;
     const CProject project = *found;
+    QList<QMdiSubWindow*> windows;
     for (const QPointer<CView>& view : project.views) {
-        if (auto* window = WindowOf(MdiArea(), view); window && !window->IsClosing() && !window->close())
-            return false;
+        if (auto* window = WindowOf(MdiArea(), view); window && !window->IsClosing())
+            windows << window;
     }
+    if (!CloseWindows(windows))
+        return false;
     Announce(KsRequest::ProjectClosing, project);
     m_projects.Close(handle);
     UpdateTitle();

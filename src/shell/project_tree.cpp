@@ -34,7 +34,7 @@ CProjectTree::CProjectTree(QWidget* parent) : QDockWidget(parent), m_tree(new QT
     changeEvent(&translate);
 }
 
-void CProjectTree::Show(const CProjects& projects, const std::function<CMemberState(const QString&)>& state)
+void CProjectTree::Show(const CProjects& projects, const State& state)
 {
     const QTreeWidgetItem* current = m_tree->currentItem();
     const QString path = current ? current->data(0, PathRole).toString() : QString();
@@ -44,7 +44,7 @@ void CProjectTree::Show(const CProjects& projects, const std::function<CMemberSt
         root->setData(0, HandleRole, qlonglong(project->handle));
         root->setToolTip(0, QDir::toNativeSeparators(project->path));
         for (const QString& member : project->members)
-            AddMember(*root, member, state(member));
+            AddMember(*root, member, state(*project, member));
         root->setExpanded(true);
         for (int i = 0; i < root->childCount(); ++i)
             if (root->child(i)->data(0, PathRole).toString() == path)
@@ -61,13 +61,15 @@ void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, cons
         text = tr("%1 (missing)").arg(text);
     else if (state.kind == CMemberState::Unknown)
         text = tr("%1 (no editor)").arg(text);
+    else if (!state.elsewhere.isEmpty())
+        text = tr("%1 (in the project %2)").arg(text, state.elsewhere);
     auto* item = new QTreeWidgetItem(&project, {text});
     item->setData(0, HandleRole, project.data(0, HandleRole));
     item->setData(0, PathRole, path);
     item->setIcon(0, state.icon);
     item->setToolTip(0, QDir::toNativeSeparators(path));
     QFont font = m_tree->font();
-    font.setBold(state.kind == CMemberState::Open);
+    font.setBold(state.kind == CMemberState::Open && state.elsewhere.isEmpty());
     item->setFont(0, font);
     if (state.kind == CMemberState::Missing || state.kind == CMemberState::Unknown)
         item->setForeground(0, palette().color(QPalette::Disabled, QPalette::Text));

@@ -22,6 +22,7 @@ struct CMemberState
     };
     Kind kind = Closed;
     bool modified = false;
+    QString elsewhere{}; // the other project that the open file belongs to
     QIcon icon;
 };
 
@@ -32,7 +33,8 @@ public:
     explicit CProjectTree(QWidget* parent);
 
     /// Shows the projects as they are now; `state` is asked for each file.
-    void Show(const CProjects& projects, const std::function<CMemberState(const QString& path)>& state);
+    using State = std::function<CMemberState(const CProject& project, const QString& path)>;
+    void Show(const CProjects& projects, const State& state);
 
 signals:
     /// The user wants to see a file: double click or Enter.

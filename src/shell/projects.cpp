@@ -1,6 +1,7 @@
 #include "shell/projects.h"
 
 #include "ks/fc/exchange.h"
+#include "ks/fc/file_name.h"
 #include "tql/tql.h"
 
 #include <QCoreApplication>
@@ -10,13 +11,6 @@
 #include <iterator>
 
 namespace {
-
-/// Two spellings of one file are one member, whether it exists or not.
-QString FileKey(const QString& path)
-{
-    const QString canonical = QFileInfo(path).canonicalFilePath();
-    return canonical.isEmpty() ? QDir::cleanPath(path) : canonical;
-}
 
 /// A parameter file under reading; closes itself.
 class ParameterFile
@@ -72,27 +66,16 @@ bool ReadMembers(CProject& project, QString& error)
 
 } // namespace
 
-QString ExistingSpelling(const QString& path)
-{
-    const QFileInfo file(path);
-    if (file.exists())
-        return path;
-    for (const QString& name : file.dir().entryList(QDir::Files, QDir::Name))
-        if (name.compare(file.fileName(), Qt::CaseInsensitive) == 0)
-            return file.dir().filePath(name);
-    return path;
-}
-
 const CProject* CProjects::Open(const QString& path, QString& error)
 {
-    const QString key = FileKey(QFileInfo(path).absoluteFilePath());
+    const QString absolute = KsExistingSpelling(QFileInfo(path).absoluteFilePath());
     for (const auto& project : m_projects) {
-        if (FileKey(project->path) == key)
+        if (KsSameFile(project->path, absolute))
             return project.get();
     }
     auto project = std::make_unique<CProject>();
-    project->path = QFileInfo(path).absoluteFilePath();
-    project->name = QFileInfo(path).completeBaseName();
+    project->path = absolute;
+    project->name = QFileInfo(absolute).completeBaseName();
     if (!ReadMembers(*project, error))
         return nullptr;
     project->handle = ++m_last;
@@ -128,14 +111,16 @@ const CProject* CProjects::FindByView(const CView* view) const
 
 const CProject* CProjects::FindByMember(const QString& path) const
 {
-    const QString key = FileKey(path);
-    for (auto project = m_projects.rbegin(); project != m_projects.rend(); ++project) {
-        const QStringList& members = (*project)->members;
-        if (std::any_of(members.begin(), members.end(),
-                        [&](const QString& member) { return FileKey(ExistingSpelling(member)) == key; }))
-            return project->get();
-    }
-    return nullptr;
+    const QString key = KsFileKey(path);
+    const auto has = [&key](const CProject& project) {
+        return std::any_of(project.members.begin(), project.members.end(),
+                           [&key](const QString& member) { return KsFileKey(member) == key; });
+    };
+    const CProject* preferred = Find(m_preferred);
+    if (preferred && has(*preferred))
+        return preferred;
+    const auto found = std::find_if(m_projects.rbegin(), m_projects.rend(), [&](const auto& p) { return has(*p); });
+    return found == m_projects.rend() ? nullptr : found->get();
 }
 
 /// Views of the project's documents but the sender's.
@@ -146,10 +131,10 @@ std::vector<QPointer<CView>> CProjects::Others(const CKSComm_Package& package) c
     if (!project)
         return others;
     // The sender's package may name no view, so its document is known by its path.
-    const QString sender = FileKey(package.text);
+    const QString sender = KsFileKey(package.text);
     std::copy_if(project->views.begin(), project->views.end(), std::back_inserter(others), [&](const auto& view) {
         return view && view != package.view && view->GetDocument() &&
-               FileKey(view->GetDocument()->GetPathName()) != sender;
+               KsFileKey(view->GetDocument()->GetPathName()) != sender;
     });
     return others;
 }

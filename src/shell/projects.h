@@ -19,13 +19,9 @@ struct CProject
     CProjectHandle handle = 0;
     QString path;                       // absolute
     QString name;                       // the file's base name
-    QStringList members;                // absolute paths, in file order; see ExistingSpelling
+    QStringList members;                // absolute paths as they are spelt there, in file order
     std::vector<QPointer<CView>> views; // those that joined
 };
-
-/// The path as the file is spelt now: an editor may have saved a member with its extension in capitals. The path itself
-/// when there is no such file.
-QString ExistingSpelling(const QString& path);
 
 class CProjects
 {
@@ -37,8 +33,11 @@ public:
     const CProject* Find(CProjectHandle handle) const;
     /// The project that a view has joined; null for none.
     const CProject* FindByView(const CView* view) const;
-    /// The project opened last that a file is a member of; null for none.
+    /// The project that a file joins: of those that it is a member of the preferred one, otherwise the one opened last;
+    /// null for none.
     const CProject* FindByMember(const QString& path) const;
+    /// The project that files join when several have them, 0 for none; the one from which they are opened.
+    void Prefer(CProjectHandle handle) { m_preferred = handle; }
     const std::vector<std::unique_ptr<CProject>>& All() const { return m_projects; }
 
     /// Answers the switchboard (KsRequest). The package is not kept.
@@ -51,5 +50,5 @@ private:
     LRESULT Ask(WPARAM request, CKSComm_Package& package, bool all);
     CProject* FindForChange(CProjectHandle handle);
     std::vector<std::unique_ptr<CProject>> m_projects; // in the order of opening
-    CProjectHandle m_last = 0;
+    CProjectHandle m_last = 0, m_preferred = 0;
 };

@@ -200,14 +200,32 @@ TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node)
     return {static_cast<std::size_t>(next - starts.begin()), ColumnOf(whole->text.begin() + next[-1], at)};
 }
 
-std::string_view tqlGetRawParams(tqlHandle handle)
+namespace {
+
+std::string_view RawFrom(const char* begin)
 {
-    const Keyword* const keyword = AsKeyword(handle);
-    if (!keyword || keyword->ParamCount() == 0)
-        return {};
-    const char* const begin = keyword->Params();
     const char* last = begin;
     while (const char* const next = NextParam(last))
         last = next;
     return {begin, static_cast<std::size_t>(SkipParam(last) - begin)};
+}
+
+} // namespace
+
+std::string_view tqlGetRawParams(tqlHandle handle)
+{
+    const Keyword* const keyword = AsKeyword(handle);
+    return keyword && keyword->ParamCount() > 0 ? RawFrom(keyword->Params()) : std::string_view();
+}
+
+std::string_view tqlGetRawParamsFrom(tqlHandle handle)
+{
+    const char* const param = AsParam(handle);
+    return param ? RawFrom(param) : std::string_view();
+}
+
+std::string_view tqlGetRawParam(tqlHandle handle)
+{
+    const char* const param = AsParam(handle);
+    return param ? std::string_view(param, static_cast<std::size_t>(SkipParam(param) - param)) : std::string_view();
 }

@@ -133,6 +133,10 @@ bool tqlGetListParam(tqlHandle section, std::string_view name, int number, std::
 
 /// The parameters of a loaded keyword exactly as they stand in its line (without comment and surrounding blanks).
 std::string_view tqlGetRawParams(tqlHandle keyword);
+/// Likewise a parameter and those behind it.
+std::string_view tqlGetRawParamsFrom(tqlHandle param);
+/// Likewise a single parameter.
+std::string_view tqlGetRawParam(tqlHandle param);
 
 // ---- building ----------------------------------------------------------------------------------
 // A created structure is a growing text. Sections and targets open one another; keywords go into the section opened

@@ -119,6 +119,17 @@ TEST_F(Hdkv, ExitCodesAndMessages)
     EXPECT_EQ(Text("a.hdkv") + Text("loses.hdkv") + Text("found.hdkv"), before);
 }
 
+// What is beyond doubt is taken, and told.
+TEST_F(Hdkv, ValuesOfAnotherTypeAreTakenWhenTheirMeaningIsBeyondDoubt)
+{
+    Write("taken.hdkv", "[KAVO0_HD]\n[WaveList]\nDATA = \"R\", 1, 2, 2.0\n[/WaveList]\n[/KAVO0_HD]\n");
+    EXPECT_EQ(Run("set taken.hdkv G_f 1"), 0) << err;
+    EXPECT_EQ(err, "taken.hdkv:3:19: WaveList: parameter 4 (WaveApproximation) should be an integer, found a number; "
+                   "taken as 2\n");
+    EXPECT_NE(Text("taken.hdkv").find("DATA = \"R\", 1, 2, 2\n"), std::string::npos);
+    EXPECT_EQ(Run("check taken.hdkv"), 0) << out;
+}
+
 TEST_F(Hdkv, SetThenGet)
 {
     const struct
@@ -191,8 +202,8 @@ TEST_F(Hdkv, FmtAndNewWriteCanonicalFiles)
     EXPECT_EQ(Run("check n.hdkv"), 0) << out;
     EXPECT_EQ(out, "n.hdkv: 0 findings\n");
     EXPECT_EQ(Run("fmt --check n.hdkv"), 0);
-    EXPECT_EQ(Run("check \"" KVR_SOURCE_DIR "/examples/river/river.hdkv\""), 0) << out;
-    EXPECT_EQ(Run("fmt --check \"" KVR_SOURCE_DIR "/examples/river/river.hdkv\""), 0) << err;
+    EXPECT_EQ(Run("check \"" KVR_SOURCE_DIR "/examples/river/river.HDKV\""), 0) << out;
+    EXPECT_EQ(Run("fmt --check \"" KVR_SOURCE_DIR "/examples/river/river.HDKV\""), 0) << err;
 }
 
 #ifndef _WIN32

@@ -10,8 +10,8 @@ std::vector<std::string> Texts(const std::string& text)
 {
     std::vector<std::string> texts;
     for (const Finding& finding : CheckHDStructure(Parsed(text).Get()))
-        texts.push_back(std::to_string(finding.line) + ':' + std::to_string(finding.column) + ": " + finding.text +
-                        (finding.losesContent ? " (loses)" : ""));
+        texts.push_back(std::to_string(finding.line) + ':' + std::to_string(finding.column) + ": " +
+                        FindingText(finding) + (finding.LosesContent() ? " (loses)" : ""));
     return texts;
 }
 
@@ -39,6 +39,8 @@ TEST(Check, FindsWhatIsNotInOrder)
         {InSection("Global_Values", "G_f = \"x\""),
          "4:7: G_f: parameter 1 (G_f) should be a number, found a text (loses)"},
         {InSection("Global_Values", "G_wave = 1.0"),
+         "4:10: G_wave: parameter 1 (G_wave) should be an integer, found a number; taken as 1"},
+        {InSection("Global_Values", "G_wave = 1.5"),
          "4:10: G_wave: parameter 1 (G_wave) should be an integer, found a number (loses)"},
         {InSection("Global_Values", "G_f ="), "4:1: G_f: parameter 1 (G_f) is missing"},
         {InSection("Global_Values", "ResisZone = 1, 2"),
@@ -54,20 +56,24 @@ TEST(Check, FindsWhatIsNotInOrder)
          "4:21: MarkTitles: unknown parameters from number 3 on"},
         {InSection("WaterLevelMarkTitles", "MarkTitles = 2, \"A\""),
          "4:14: MarkTitles: the count 2 of MarkTitles does not fit the 1 parameters behind it (loses)"},
-        {InSection("WaterLevelMarkTitles", "MarkInterpolate = 1, 0"),
-         "4:22: MarkInterpolate: parameter 2 (Interpolate) should be true or false, found an integer (loses)"},
+        {InSection("WaterLevelMarkTitles", "MarkTitles = 1, \"A\"\nMarkInterpolate = 1, 2"),
+         "5:22: MarkInterpolate: parameter 2 (Interpolate) should be true or false, found an integer (loses)"},
+        {InSection("WaterLevelMarkTitles", "MarkTitles = 1, \"A\"\nMarkInterpolate = 2, true, false"),
+         "5:1: MarkInterpolate: there are more flags than the 1 titles (loses)"},
         {InSection("MixingCoefficients", "MixingCoef = -1, 1, 1, 1, 1"),
          "4:14: MixingCoef: the count -1 of CoefPairs does not fit the 4 parameters behind it (loses)"},
         {InSection("TextOutput", "LimitedPeriodEnd = 2023, 2, 29, 0, 0, 0"),
          "4:20: LimitedPeriodEnd: the six integers of LimitedPeriodEnd are no date and time"},
         {InSection("TextOutput", "LimitedPeriodEnd = 2023, 2"),
          "4:20: LimitedPeriodEnd: LimitedPeriodEnd needs six integers (loses)"},
+        {InSection("TextOutput", "LimitedPeriodEnd = 2023, 2, 1, 0, 0.0, 0"),
+         "4:35: LimitedPeriodEnd: parameter 5 (LimitedPeriodEnd) should be an integer, found a number; taken as 2023, "
+         "2, 1, 0, 0, 0"},
         {InSection("TextOutput", "Delimiter = <;>"),
-         "4:13: Delimiter: parameter 1 (Delimiter) should be a text in quotes, found a file name"},
+         "4:13: Delimiter: parameter 1 (Delimiter) should be a text in quotes, found a file name; taken as \";\""},
         {InSection("TextOutput", "[OutputItems]\ndata = 1\n[/OutputItems]"),
          "5:1: OutputItems: parameter 2 (UserName) and those behind it are missing"},
-        {InSection("MapOutput", "GeoDb = <a>"),
-         "4:1: GeoDb is not read, because ApplyDemGroundElevation is missing (loses)"},
+        {InSection("MapOutput", "GeoDb = <a>"), "4:1: GeoDb is not read, because ApplyDemGroundElevation is missing"},
         {InList("InitList", "DATA = \"R\", 1, 2, 3"), nullptr},
         {InList("InitList", "DATA = \"\", 1, 2, 3"), "3:1: InitList: incomplete line, the branch name is empty"},
         {InList("LeakageList", "DATA = \"R\", 1e10, 2"),
@@ -98,4 +104,60 @@ TEST(Check, FindingsComeInFileOrderAndQuickly)
     ASSERT_EQ(findings.size(), 10'000u);
     EXPECT_EQ(findings.back().line, 210'002u);
     EXPECT_TRUE(std::ranges::is_sorted(findings, {}, &Finding::line));
+}
+
+// What opening a file tells: only what must be known, with what stands there and what is used instead.
+TEST(Check, OpeningTellsWhatWasNotTakenAsItStands)
+{
+    const std::string text = "[KAVO0_HD]\n[Global_Variables]\n[Global_Values]\nG_wave = 2.0\nG_f = \"x\"\nodd = 1\n"
+                             "[/Global_Values]\n[Quasi_steady]\nEnergyEquation = 1, 3.0\n[/Quasi_steady]\n"
+                             "[/Global_Variables]\n[MixingCoefList]\n"
+                             "DATA = \"R\", 5, 1.0, 7, 8, 1, 2, 3, 4\n"
+                             "DATA = \"R\", 6, 5, 7, 8, 1, 2, 3, 4\n"
+                             "DATA = \"R\", 7, 2, 7, 8, 1, 2, 3, 4\n"
+                             "DATA = \"R\", 8, 0.5, 1, 2, 3, 4\n[/MixingCoefList]\n"
+                             "[WaveList]\nDATA = \"R\", 1, 2, 2.0\nDATA = \"\", 1, 2, 2\n[/WaveList]\n[/KAVO0_HD]\n";
+    const TqlStructure structure = Parsed(text);
+    LoadReport report(structure.Get());
+    HD_Parameters read;
+    read.Load(structure.Get(), &report);
+    EXPECT_EQ(read.Global.G_wave, 2);
+    EXPECT_TRUE(read.Global.EnergyEquation);
+    EXPECT_EQ(read.Global.FrictionSlope, 3);
+    EXPECT_EQ(read.MixingCoefList.GetAt(0).CoefPairs.size(), 1u);
+    EXPECT_EQ(read.MixingCoefList.GetAt(0).MixCoef4, 4);
+    EXPECT_TRUE(read.MixingCoefList.GetAt(1).CoefPairs.empty());
+    EXPECT_EQ(read.WaveList.GetAt(0).WaveApproximation, 2);
+
+    const struct
+    {
+        Finding::Kind kind;
+        std::size_t line;
+        const char *section, *keyword;
+        int parameter;
+        const char *found, *used;
+    } expected[] = {
+        {Finding::OtherType, 4, "Global_Values", "G_wave", 1, "2.0", "2"},
+        {Finding::WrongType, 5, "Global_Values", "G_f", 1, "\"x\"", "0"},
+        {Finding::OtherType, 9, "Quasi_steady", "EnergyEquation", 1, "1", "true"},
+        {Finding::OtherType, 9, "Quasi_steady", "EnergyEquation", 2, "3.0", "3"},
+        {Finding::OtherType, 13, "MixingCoefList", "DATA", 3, "1.0", "1"},
+        {Finding::CountDoesNotFit, 14, "MixingCoefList", "DATA", 3, "5, 7, 8, 1, 2, 3, 4", "0, 0, 0, 0, 0"},
+        // The count leaves nothing for the last two coefficients: perhaps it was meant to be 1.
+        {Finding::Missing, 15, "MixingCoefList", "DATA", 10, "\"R\", 7, 2, 7, 8, 1, 2, 3, 4", "0, 0"},
+        {Finding::WrongType, 16, "MixingCoefList", "DATA", 3, "0.5, 1, 2, 3, 4", "0, 0, 0, 0, 0"},
+        {Finding::OtherType, 19, "WaveList", "DATA", 4, "2.0", "2"},
+    };
+    const auto findings = report.Take();
+    ASSERT_EQ(findings.size(), std::size(expected));
+    for (std::size_t i = 0; i < findings.size(); ++i) {
+        const Finding& finding = findings[i];
+        EXPECT_EQ(finding.kind, expected[i].kind) << i;
+        EXPECT_EQ(finding.line, expected[i].line) << i;
+        EXPECT_EQ(finding.section, expected[i].section) << i;
+        EXPECT_EQ(finding.keyword, expected[i].keyword) << i;
+        EXPECT_EQ(finding.parameter, expected[i].parameter) << i;
+        EXPECT_EQ(finding.found, expected[i].found) << i;
+        EXPECT_EQ(finding.used, expected[i].used) << i;
+    }
 }

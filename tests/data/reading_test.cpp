@@ -53,10 +53,11 @@ TEST(Reading, CountsAreCheckedAgainstTheParameters)
         const char* params;
         std::size_t pairs; // 1 pair is there before
         double first;      // MixCoef1, 0.17 before
-    } cases[] = {{"0, 1, 2, 3, 4", 0, 1},       {"1, 8, 9, 1, 2, 3, 4", 1, 1},
-                 {"2, 1, 2, 3, 4", 2, 0.17},    {"3, 1, 2, 3, 4", 1, 0.17},
-                 {"2147483647, 1, 2", 1, 0.17}, {"-1, 1, 2, 3, 4", 1, 0.17},
-                 {"1.5, 1, 2, 3, 4", 1, 0.17},  {"", 1, 0.17}};
+    } cases[] = {{"0, 1, 2, 3, 4", 0, 1},        {"1, 8, 9, 1, 2, 3, 4", 1, 1},
+                 {"2, 1, 2, 3, 4", 2, 0.17},     {"3, 1, 2, 3, 4", 1, 0.17},
+                 {"2147483647, 1, 2", 1, 0.17},  {"-1, 1, 2, 3, 4", 1, 0.17},
+                 {"1.5, 1, 2, 3, 4", 1, 0.17},   {"", 1, 0.17},
+                 {"1.0, 8, 9, 1, 2, 3, 4", 1, 1}};
     for (const auto& c : cases) {
         HD_Parameters parameters;
         parameters.Global.Mixing.CoefPairs.resize(1);
@@ -97,6 +98,30 @@ TEST(Reading, GroundElevationOpensTheKeywordsThatRefineIt)
     const HD_Parameters with = FromSection("MapOutput", std::string(lines) + "ApplyDemGroundElevation = false");
     EXPECT_TRUE(with.Global.MapOutput.MapAreaGeoDb && with.Global.MapOutput.AddToCalculation);
     EXPECT_EQ(with.Global.MapOutput.GeoDb, "a");
+}
+
+// What is not read is kept as it stands, until somebody sets it or the keyword that opens it.
+TEST(Reading, WhatGroundElevationClosesIsKept)
+{
+    HD_Parameters read = FromSection("MapOutput", "MapAreaGeoDb = true\nGeoDb = <a>\nAddToCalculation = true");
+    const auto holds = [&](const char* line) { return HDFileText(read).find(line) != std::string::npos; };
+    EXPECT_TRUE(holds("MapAreaGeoDb = true\n") && holds("GeoDb = <a>\n") && holds("AddToCalculation = true\n"));
+    read.Global.MapOutput.GeoDb = "b";
+    EXPECT_TRUE(holds("MapAreaGeoDb = true\n") && holds("GeoDb = <b>\n"));
+    read.Global.MapOutput.ApplyDemGroundElevation = true;
+    EXPECT_TRUE(holds("MapAreaGeoDb = false\n") && holds("AddToCalculation = false\n"));
+}
+
+TEST(Reading, ThereIsOneFlagATitle)
+{
+    const std::pair<const char*, const char*> cases[] = {
+        {"1, true", "2, true, false"}, {"3, true, true, true", "2, true, true"}, {"0, false", "2, false, false"}};
+    for (const auto& [flags, written] : cases) {
+        const HD_Parameters read = FromSection("WaterLevelMarkTitles",
+                                               std::string("MarkTitles = 2, \"A\", \"B\"\nMarkInterpolate = ") + flags);
+        EXPECT_NE(HDFileText(read).find(std::string("MarkInterpolate = ") + written + '\n'), std::string::npos)
+            << flags;
+    }
 }
 
 TEST(Reading, ItemListsFollowTheirKeywordsAndMissingOnesStay)

@@ -168,7 +168,7 @@ TEST(Layout, EverySectionAndKeywordIsDocumented)
 TEST(Example, TheCommittedFilesAreWhatTheGeneratorMakes)
 {
     const std::string text = HDFileText(SampleRiver());
-    EXPECT_EQ(text, ReadText(KVR_SOURCE_DIR "/examples/river/river.hdkv"));
+    EXPECT_EQ(text, ReadText(KVR_SOURCE_DIR "/examples/river/river.HDKV"));
     HD_Parameters sample = SampleRiver();
     ForEachList(sample, sample, [](const std::string& name, CGenParamListBase& list, CGenParamListBase&) {
         EXPECT_GE(list.GetCount(), 12u) << name;

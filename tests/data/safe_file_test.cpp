@@ -2,14 +2,19 @@
 
 #include "data/utf8_path.h"
 
+#include <cstring>
 #include <functional>
+#ifdef __linux__
+#include <sys/stat.h>
+#include <sys/xattr.h>
+#endif
 
 namespace fs = std::filesystem;
 
 namespace {
 
 /// The system's calls, with one of them failing or writing short.
-class FaultyPlatform final : public PlatformFile
+class FaultyPlatform : public PlatformFile
 {
 public:
     std::string failing;        // name of the call that fails
@@ -17,9 +22,11 @@ public:
     std::size_t failAfter = 0;  // bytes after which writing fails, when it is to fail
     std::vector<std::string> calls;
 
-    std::error_code Create(const fs::path& path, Handle& file) override
+    bool losesTarget = false; // a replacement that fails has removed the target
+
+    std::error_code Create(const fs::path& path, Access access, Handle& file) override
     {
-        return Do("Create", [&] { return Native().Create(path, file); });
+        return Do("Create", [&] { return Native().Create(path, access, file); });
     }
     std::error_code Write(Handle file, std::string_view text, std::size_t& written) override
     {
@@ -51,7 +58,13 @@ public:
     }
     std::error_code Replace(const fs::path& from, const fs::path& to) override
     {
+        if (losesTarget)
+            fs::remove(to);
         return Do("Replace", [&] { return Native().Replace(from, to); });
+    }
+    std::error_code Rename(const fs::path& from, const fs::path& to) override
+    {
+        return Do("Rename", [&] { return Native().Rename(from, to); });
     }
     std::error_code SyncFolder(const fs::path& folder) override
     {
@@ -134,6 +147,85 @@ TEST_F(SafeFile, PermissionsAndLinksStay)
     EXPECT_FALSE(WriteFileSafely(Path("loop"), "x"));
 }
 
+// Where a replacement can fail half way, the finished temporary file may be the only copy there is.
+TEST_F(SafeFile, WhatIsLeftWhenTheTargetIsLostStaysAndIsNamed)
+{
+    Write("a.hdkv", "old content");
+    FaultyPlatform platform;
+    platform.failing = "Replace";
+    platform.losesTarget = true;
+    const auto result = WriteFileSafely(Path("a.hdkv"), "new content", {.platform = &platform});
+    ASSERT_FALSE(result);
+    EXPECT_EQ(FileCount(), 1u);
+    EXPECT_EQ(ReadWholeFile(result.error().kept).value(), "new content");
+    EXPECT_NE(result.error().message.find(result.error().kept), std::string::npos) << result.error().message;
+    EXPECT_EQ(result.error().code, std::errc::no_space_on_device);
+}
+
+#ifdef __linux__
+// Until it has the permissions of the file it replaces, nobody else may read the new content.
+TEST_F(SafeFile, TheNewContentIsNeverOpenToOthers)
+{
+    class Watcher final : public FaultyPlatform
+    {
+    public:
+        std::error_code Write(Handle file, std::string_view text, std::size_t& written) override
+        {
+            struct stat status;
+            ::fstat(static_cast<int>(file), &status);
+            mode = status.st_mode & 07777;
+            return FaultyPlatform::Write(file, text, written);
+        }
+        unsigned mode = 0;
+    };
+    const mode_t before = ::umask(022);
+    Write("a.hdkv", "secret");
+    fs::permissions(m_folder / "a.hdkv", fs::perms(0640));
+    Watcher platform;
+    ASSERT_TRUE(WriteFileSafely(Path("a.hdkv"), "more secrets", {.platform = &platform}));
+    EXPECT_EQ(platform.mode, 0600u);
+    EXPECT_EQ(fs::status(m_folder / "a.hdkv").permissions(), fs::perms(0640));
+    ASSERT_TRUE(WriteFileSafely(Path("new.hdkv"), "x", {.platform = &platform}));
+    EXPECT_EQ(fs::status(m_folder / "new.hdkv").permissions(), fs::perms(0644));
+    ::umask(before);
+}
+
+TEST_F(SafeFile, ExtendedAttributesAndTheAccessListStay)
+{
+    // In the binary form of the kernel: owner rw-, user 1 r--, group r--, mask r--, other ---.
+    const unsigned char list[] = {2, 0, 0,    0,    1,    0,    6,    0, 0xff, 0xff, 0xff, 0xff, 2,    0,    4,
+                                  0, 1, 0,    0,    0,    4,    0,    4, 0,    0xff, 0xff, 0xff, 0xff, 0x10, 0,
+                                  4, 0, 0xff, 0xff, 0xff, 0xff, 0x20, 0, 0,    0,    0xff, 0xff, 0xff, 0xff};
+    Write("a.hdkv", "old");
+    const std::string path = Path("a.hdkv");
+    if (::setxattr(path.c_str(), "user.origin", "survey", 6, 0) != 0)
+        GTEST_SKIP() << "the file system keeps no attributes";
+    const bool lists = ::setxattr(path.c_str(), "system.posix_acl_access", list, sizeof list, 0) == 0;
+    ASSERT_TRUE(WriteFileSafely(path, "new"));
+    char value[64] = {};
+    EXPECT_EQ(::getxattr(path.c_str(), "user.origin", value, sizeof value), 6);
+    EXPECT_EQ(std::string(value, 6), "survey");
+    if (lists) {
+        ASSERT_EQ(::getxattr(path.c_str(), "system.posix_acl_access", value, sizeof value), ssize_t(sizeof list));
+        EXPECT_EQ(std::memcmp(value, list, sizeof list), 0);
+    }
+}
+#endif
+
+TEST_F(SafeFile, ALinkIsRenamedAndItsTargetWritten)
+{
+    fs::create_directory(m_folder / "shared");
+    Write("shared/a.hdkv", "old");
+    fs::create_symlink("shared/a.hdkv", m_folder / "a.hdkv");
+    ASSERT_TRUE(WriteFileSafely(Path("a.hdkv"), "new"));
+    ASSERT_TRUE(RenameFile(Path("a.hdkv"), Path("a.HDKV")));
+    EXPECT_TRUE(fs::is_symlink(m_folder / "a.HDKV"));
+    EXPECT_EQ(Text("shared/a.hdkv"), "new");
+    const auto failed = RenameFile(Path("missing"), Path("b"));
+    ASSERT_FALSE(failed);
+    EXPECT_EQ(failed.error().code, std::errc::no_such_file_or_directory);
+}
+
 TEST_F(SafeFile, RefusesWhatIsNoFileToReplace)
 {
     fs::create_directory(m_folder / "folder");
@@ -151,18 +243,18 @@ TEST_F(SafeFile, RefusesWhatIsNoFileToReplace)
     }
 }
 
-TEST_F(SafeFile, UnreadableOriginalsAreKeptUnderFreeNames)
+TEST_F(SafeFile, OriginalsAreKeptUnderFreeNames)
 {
     Write("x.HDKV", "broken");
     Write("x.HDKV.unreadable-1", "older");
-    const auto kept = KeepUnreadable(Path("x.HDKV"));
+    const auto kept = KeepOriginal(Path("x.HDKV"), "unreadable");
     ASSERT_TRUE(kept);
     EXPECT_EQ(kept.value(), Path("x.HDKV.unreadable-2"));
     EXPECT_EQ(Text("x.HDKV.unreadable-1") + Text("x.HDKV.unreadable-2") + Text("x.HDKV"), "olderbrokenbroken");
     FaultyPlatform platform;
     platform.failing = "Sync";
-    EXPECT_FALSE(KeepUnreadable(Path("x.HDKV"), &platform));
-    EXPECT_FALSE(KeepUnreadable(Path("missing")));
+    EXPECT_FALSE(KeepOriginal(Path("x.HDKV"), "unreadable", &platform));
+    EXPECT_FALSE(KeepOriginal(Path("missing"), "unreadable"));
     EXPECT_EQ(FileCount(), 3u);
 }
 

@@ -1,5 +1,6 @@
 #include "editors/editor_fixture.h"
 #include "ks/fc/plugin.h"
+#include "ks/language/language.h"
 
 #include <QLibrary>
 
@@ -17,6 +18,12 @@ void EditorTest::CheckPlugin(const char* file, const char* filter, const char* e
     EXPECT_NE(first, second);
     EXPECT_EQ(KsGetDocTemplatePtr(1), nullptr);
     EXPECT_TRUE(first->MatchesExtension(file));
+    EXPECT_EQ(first->FileDialogFilter(), filter);
+    const CString english = first->GetDocString(CMultiDocTemplate::fileNewName);
+    KsLanguage::Instance().SetCurrent("ja");
+    EXPECT_NE(first->FileDialogFilter(), filter) << "in the language of the moment";
+    EXPECT_NE(first->GetDocString(CMultiDocTemplate::fileNewName), english);
+    KsLanguage::Instance().SetCurrent("en_US");
     EXPECT_EQ(first->FileDialogFilter(), filter);
     CString name;
     EXPECT_TRUE(KsGetEditorString(&name));

@@ -65,15 +65,20 @@ public:
     {
         auto* layout = new QVBoxLayout(this);
         layout->addWidget(edit = new QLineEdit);
-        connect(edit, &QLineEdit::editingFinished, this, [this] {
-            if (!edit->isModified())
-                return;
-            edit->setModified(false);
-            static_cast<TextDoc*>(GetDocument())->text = edit->text();
-            GetDocument()->SetModifiedFlag();
-        });
     }
     ~LogView() override { log << name + " gone " + (GetDocument() ? GetDocument()->GetTitle() : QString("?")); }
+    bool MayLeave(KsLeave what) override
+    {
+        log << name + (what == KsLeave::Page ? " leaves" : " leaves field");
+        if (edit->text() == "wrong")
+            return false;
+        if (!edit->isModified())
+            return true;
+        edit->setModified(false);
+        static_cast<TextDoc*>(GetDocument())->text = edit->text();
+        GetDocument()->SetModifiedFlag();
+        return true;
+    }
     void OnInitialUpdate() override { log << name + " initial " + GetDocument()->GetTitle(); }
     void OnUpdate(CView* sender, int hint, CHint* object) override
     {

@@ -1,3 +1,4 @@
+#include "ks/fc/system_reason.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 
@@ -8,6 +9,7 @@
 #include <QRegularExpression>
 #include <QSignalSpy>
 #include <QXmlStreamReader>
+#include <cerrno>
 #include <gtest/gtest.h>
 
 namespace {
@@ -70,6 +72,26 @@ TEST_F(Language, ModulesFollowTheLanguageAndWindowsHearOfIt)
     KsLangFreeResDll(nullptr);
     KsLanguage::Instance().SetCurrent("xx");
     EXPECT_EQ(KsLanguage::Instance().Current(), "ja") << "an unknown language changes nothing";
+}
+
+TEST_F(Language, WhyTheSystemRefusesIsSaidInTheUsersLanguage)
+{
+    const auto full = std::make_error_code(std::errc::no_space_on_device);
+    const std::error_code quota(EDQUOT, std::generic_category());
+    QFile missing(QDir::tempPath() + "/no such folder/x");
+    EXPECT_FALSE(missing.open(QIODevice::WriteOnly));
+    EXPECT_EQ(KsSystemReason(full), "no space is left on the device");
+    EXPECT_EQ(KsSystemReason(missing), "There is no such file or folder.");
+
+    KsLanguage::Instance().SetCurrent("ja");
+    KsResourceHandle handle = nullptr;
+    KsLangLoadResDll("ks", &handle, 0);
+    EXPECT_EQ(KsSystemReason(full), "デバイスに空き領域がありません");
+    EXPECT_EQ(KsSystemReason(quota), "ディスクの割り当て容量を使い切りました");
+    EXPECT_FALSE(missing.open(QIODevice::WriteOnly));
+    EXPECT_EQ(KsSystemReason(missing), "ファイルまたはフォルダがありません。");
+    EXPECT_FALSE(KsSystemReason(std::make_error_code(std::errc::owner_dead)).isEmpty()) << "the system's own text";
+    KsLangFreeResDll(handle);
 }
 
 TEST_F(Language, EveryTextIsTranslatedWithItsPlaceholdersAndMnemonics)

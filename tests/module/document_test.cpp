@@ -75,12 +75,85 @@ TEST_F(DocumentTest, AFileThatCannotBeParsedOpensEmptyAndIsKeptWhenSavedOver)
     EXPECT_EQ(boxes[0], "river.HDKV, line 4, column 3: expected [/InitList], found [/WindList]");
     EXPECT_TRUE(document.Parameters().InitList.IsEmpty());
 
+    EXPECT_TRUE(document.IsReadOnly());
+
+    answer = QMessageBox::No;
+    EXPECT_FALSE(document.OnSaveDocument(Path("river.HDKV")));
+    ASSERT_EQ(boxes.size(), 2);
+    EXPECT_TRUE(boxes[1].contains("river.HDKV.unreadable-1")) << qPrintable(boxes[1]);
+    EXPECT_EQ(Read(Path("river.HDKV")), broken);
+    answer = QMessageBox::Yes;
     ASSERT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(boxes.size(), 3);
     EXPECT_EQ(Read(Path("river.HDKV.unreadable-1")), broken);
+    EXPECT_FALSE(document.IsReadOnly());
+    ASSERT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
     CKavo0_hdDoc again;
     EXPECT_TRUE(again.OnOpenDocument(Path("river.HDKV")));
-    EXPECT_EQ(boxes.size(), 1);
+    EXPECT_EQ(boxes.size(), 3) << "nothing is left to ask";
+    EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files), (QStringList{"river.HDKV", "river.HDKV.unreadable-1"}));
 }
+
+TEST_F(DocumentTest, ValuesThatWereNotTakenAreListedAskedAboutOnceAndKeptInACopy)
+{
+    const QByteArray text = "[KAVO0_HD]\n[Global_Variables]\n[Global_Values]\nG_wave = 2.0\nG_f = \"x\"\n"
+                            "[/Global_Values]\n[/Global_Variables]\n[/KAVO0_HD]\n";
+    Write(Path("river.HDKV"), text);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+    document.SetPathName(Path("river.HDKV"));
+    EXPECT_TRUE(boxes.isEmpty());
+    EXPECT_FALSE(document.IsReadOnly() || document.IsModified());
+    ASSERT_EQ(document.File().Findings().size(), 2u);
+    EXPECT_EQ(document.Parameters().Global.G_wave, 2);
+
+    answer = QMessageBox::No;
+    EXPECT_FALSE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(Read(Path("river.HDKV")), text);
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(boxes[0].contains("river.HDKV.original-1")) << qPrintable(boxes[0]);
+    answer = QMessageBox::Yes;
+    ASSERT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(Read(Path("river.HDKV.original-1")), text);
+    EXPECT_TRUE(Read(Path("river.HDKV")).contains("G_wave = 2\n"));
+    EXPECT_TRUE(document.File().Findings().empty());
+    EXPECT_EQ(document.File().KeptCopy(), Path("river.HDKV.original-1"));
+    ASSERT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(boxes.size(), 2) << "asked once";
+
+    Write(Path("river.HDKV"), text);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+    ASSERT_TRUE(document.OnSaveDocument(Path("other.HDKV")));
+    EXPECT_EQ(boxes.size(), 2) << "a save elsewhere leaves the file alone";
+    EXPECT_EQ(Read(Path("river.HDKV")), text);
+}
+
+#ifndef _WIN32
+// The extension in capitals is another name of the same entry.
+TEST_F(DocumentTest, ALinkStaysALinkAndAFileKeepsItsMode)
+{
+    QDir(folder.path()).mkdir("shared");
+    Write(Path("shared/a.hdkv"), SmallFile);
+    ASSERT_TRUE(QFile::link("shared/a.hdkv", Path("a.hdkv")));
+    ASSERT_TRUE(document.OnOpenDocument(Path("a.hdkv")));
+    document.SetPathName(Path("a.hdkv"));
+    ASSERT_TRUE(document.OnSaveDocument(Path("a.hdkv")));
+    EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files), QStringList("a.HDKV"));
+    EXPECT_EQ(QFile::symLinkTarget(Path("a.HDKV")), Path("shared/a.hdkv"));
+    EXPECT_TRUE(Read(Path("shared/a.hdkv")).startsWith("// KVR")) << "the target is written";
+    EXPECT_EQ(document.File().Renamed(), "a.hdkv is now a.HDKV");
+    ASSERT_TRUE(document.OnSaveDocument(Path("a.HDKV")));
+    EXPECT_EQ(document.File().Renamed(), "") << "done once";
+
+    Write(Path("b.hdkv"), SmallFile);
+    const auto mode = QFile::ReadOwner | QFile::WriteOwner | QFile::ReadGroup;
+    ASSERT_TRUE(QFile::setPermissions(Path("b.hdkv"), mode));
+    ASSERT_TRUE(document.OnOpenDocument(Path("b.hdkv")));
+    ASSERT_TRUE(document.OnSaveDocument(Path("b.hdkv")));
+    const auto every = QFile::Permissions(0x7077);
+    EXPECT_EQ(QFile::permissions(Path("b.HDKV")) & every, (mode & every)) << "0640";
+    EXPECT_FALSE(QFile::exists(Path("b.hdkv")));
+}
+#endif
 
 TEST_F(DocumentTest, AFailedSaveLeavesFileAndMemoryAsTheyWere)
 {
@@ -120,15 +193,6 @@ TEST_F(DocumentTest, DeleteContentsKeepsTheGlobalValues)
     document.DeleteContents();
     EXPECT_TRUE(document.Parameters().InitList.IsEmpty());
     EXPECT_EQ(document.Parameters().Global.G_waterlevel, 1.5);
-}
-
-TEST_F(DocumentTest, APlaceholderIsNeverSavedAndNoChange)
-{
-    document.AddPlaceholder(document.Parameters().InitList, std::make_unique<HD_Initial>());
-    EXPECT_FALSE(document.IsModified());
-    ASSERT_TRUE(document.OnSaveDocument(Path("new.HDKV")));
-    EXPECT_TRUE(document.Parameters().InitList.IsEmpty());
-    EXPECT_EQ(document.UndoStack().count(), 0);
 }
 
 TEST_F(DocumentTest, TalksToTheShellOnlyInsideAProject)

@@ -2,8 +2,10 @@
 #include "exchange_fixture.h"
 
 #include "ks/fc/exchange.h"
+#include "pages/framework/commands.h"
 #include "pages/load_option_dlg.h"
 
+#include <QCheckBox>
 #include <QComboBox>
 #include <QRadioButton>
 #include <QTimer>
@@ -99,9 +101,9 @@ TEST_F(ExchangeClientTest, TheBranchListIsAskedForWhenACellOpens)
     projectHandle = 5;
     auto* view = Open(WriteFile("river.hdkv"));
     Answer(KsRequest::BranchNames, [](CObList& objects) {
-        for (const char* name : {"Main", "SIDE", "", "MAIN"}) {
+        for (const char* name : {"Main", "SIDE", "", "MAIN", "K\u0131z\u0131l\u0131rmak", "KIZILIRMAK"}) {
             auto item = std::make_unique<CKvrCBEText>();
-            item->text = name;
+            item->text = QString::fromUtf8(name);
             objects.push_back(std::move(item));
         }
         objects.push_back(nullptr);
@@ -113,8 +115,8 @@ TEST_F(ExchangeClientTest, TheBranchListIsAskedForWhenACellOpens)
     QTest::keyClick(grid, Qt::Key_F2);
     auto* list = grid->findChild<QComboBox*>();
     ASSERT_NE(list, nullptr);
-    EXPECT_EQ(list->count(), 2);
-    EXPECT_EQ(list->itemText(0) + list->itemText(1), "MAINSIDE");
+    EXPECT_EQ(list->count(), 3);
+    EXPECT_EQ(list->itemText(0) + list->itemText(1) + list->itemText(2), "MAINSIDEKIZILIRMAK");
     EXPECT_EQ(requests, 1);
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
     grid->SetCurrentCell(1, 3);
@@ -159,7 +161,7 @@ TEST_F(ExchangeClientTest, DeletedLinesAndUndoAreToldWhenTheyAreDone)
     view->OnCommand(Command::DeleteLine); // no whole line is selected
     QTest::qWait(1);
     EXPECT_EQ(Told(KsRequest::DataChanged), 0);
-    view->ActivePage()->GetGrid()->selectRow(0);
+    view->ActivePage()->GetGrid()->SelectLines(1, 1);
     view->OnCommand(Command::DeleteLine);
     EXPECT_EQ(Told(KsRequest::DataChanged), 0) << "not in the middle of it";
     QTest::qWait(1);
@@ -167,6 +169,64 @@ TEST_F(ExchangeClientTest, DeletedLinesAndUndoAreToldWhenTheyAreDone)
     view->GetDocument()->UndoStack().undo();
     QTest::qWait(1);
     EXPECT_EQ(Told(KsRequest::DataChanged), 2);
+}
+
+TEST_F(ExchangeClientTest, EveryChangeOfDataIsToldOnceAStepAndNotInTheMiddleOfIt)
+{
+    projectHandle = 5;
+    auto* view = Open(WriteFile("river.hdkv"));
+    auto& document = *view->GetDocument();
+    auto& globals = document.Parameters().Global;
+    QUndoStack& steps = document.UndoStack();
+    QTest::qWait(1);
+    std::vector<double> heard; // what is stored when the others are told
+    answerShell = [&](unsigned message, WPARAM request, CKSComm_Package&, LRESULT joined) {
+        if (message == KsMessage::BetweenEditors() && request == KsRequest::DataChanged)
+            heard.push_back(globals.G_waterlevel);
+        return joined;
+    };
+    const auto told = [&](const std::function<void()>& change) {
+        heard.clear();
+        change();
+        EXPECT_TRUE(heard.empty()) << "in the middle";
+        QTest::qWait(1);
+        return heard;
+    };
+    const auto once = [&](double level) { return std::vector<double>{level}; };
+    EXPECT_EQ(told([&] { StoreValue(document, globals.G_waterlevel, 2.5); }), once(2.5)) << "a global field";
+    EXPECT_EQ(told([&] { StoreValue(document, globals.G_waterlevel, 2.5); }).size(), 0u) << "no change";
+    EXPECT_EQ(told([&] {
+                  steps.beginMacro("two");
+                  StoreValue(document, globals.G_waterlevel, 3.5);
+                  StoreValue(document, globals.G_discharge, 1.0);
+                  steps.endMacro();
+              }),
+              once(3.5));
+    EXPECT_EQ(told([&] { steps.undo(); }), once(2.5));
+    EXPECT_EQ(told([&] { steps.redo(); }), once(3.5));
+    EXPECT_EQ(told([&] { steps.setIndex(0), steps.redo(); }).size(), 2u) << "two steps";
+
+    const auto type = [](CGenGrid* grid, int row, int column, const char* text) {
+        grid->setFocus();
+        grid->SetCurrentCell(row, column);
+        for (const char* c = text; *c; ++c)
+            QTest::keyClick(QApplication::focusWidget(), *c);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+    };
+    constexpr int MarkPage = 10, MapPage = 15;
+    ASSERT_TRUE(view->Sheet()->SetActivePage(MarkPage));
+    for (auto* grid : view->ActivePage()->findChildren<CGenGrid*>())
+        EXPECT_EQ(told([&] { type(grid, 1, 1, "BANK"); }).size(), 1u) << qPrintable(grid->objectName());
+    EXPECT_EQ(globals.MarkTitles, std::vector<std::string>{"BANK"});
+    EXPECT_EQ(document.Parameters().WaterLevelMarkList.GetAt(0).RiverName, "BANK");
+    ASSERT_TRUE(view->Sheet()->SetActivePage(MapPage));
+    QCoreApplication::processEvents(); // the page that was just made is shown
+    auto* box = view->ActivePage()->findChild<QCheckBox*>();
+    EXPECT_EQ(told([&] { box->click(); }).size(), 1u) << qPrintable(box->text());
+    EXPECT_EQ(told([&] { type(view->ActivePage()->findChild<CGenGrid*>(), 1, 1, "7"); }).size(), 1u) << "a map";
+    EXPECT_EQ(globals.MapOutput.MapOutputFiles.size(), 1u);
+    view->Sheet()->SetActivePage(0);
+    EXPECT_EQ(told([&] { document.DoSave(document.GetPathName()); }).size(), 1u) << "the save dropped incomplete lines";
 }
 
 TEST_F(ExchangeClientTest, LocationsAreLoadedIntoThePage)
@@ -202,7 +262,8 @@ TEST_F(ExchangeClientTest, LocationsAreLoadedIntoThePage)
     EXPECT_EQ(list.GetAt(0).RiverName, "MAIN");
     EXPECT_EQ(list.GetAt(1).Chainage, 20);
     EXPECT_EQ(list.GetAt(1).Contraction, 0.25) << "as new lines have it";
-    EXPECT_GE(Told(KsRequest::DataChanged), 1);
+    QTest::qWait(1);
+    EXPECT_EQ(Told(KsRequest::DataChanged), 1);
     load("branch_1105");
     EXPECT_EQ(list.GetCount(), 2u) << "they are there already";
     EXPECT_TRUE(boxes.isEmpty());

@@ -54,7 +54,7 @@ TEST_F(ExchangeTest, WhatCannotBeMetDoesNothing)
     nothing("change", 0);
 }
 
-TEST_F(ExchangeTest, NoRequestIsMetInsideAnotherOrWhileTheDocumentSavesOrCloses)
+TEST_F(ExchangeTest, NoChangeIsMadeInsideAnotherAndNothingIsMetWhileTheDocumentSavesOrCloses)
 {
     auto* view = Open(WriteFile("river.hdkv"));
     Open({});
@@ -64,14 +64,14 @@ TEST_F(ExchangeTest, NoRequestIsMetInsideAnotherOrWhileTheDocumentSavesOrCloses)
     answerShell = [&](unsigned message, WPARAM, CKSComm_Package&, LRESULT joined) {
         if (message == KsMessage::ShowToolbar() && ++calls) { // the window comes to the front
             KvrMSGInsertData({}, view, &inner);
-            EXPECT_EQ(KvrMSGGetData({}, view->GetDocument()), nullptr);
+            EXPECT_EQ(Summary(Owned(KvrMSGGetData({}, view->GetDocument())).get()), AllItems) << "reading may go on";
         }
         return joined;
     };
     KvrMSGInsertData({}, view, &items);
     answerShell = {};
     EXPECT_EQ(calls, 1);
-    EXPECT_EQ(log.Take(), 2);
+    EXPECT_EQ(log.Take(), 1);
     EXPECT_EQ(List(*view, 1).GetCount(), 3u);
     EXPECT_EQ(List(*view, 0).GetCount(), 2u);
 

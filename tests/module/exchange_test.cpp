@@ -34,17 +34,81 @@ TEST_F(ExchangeTest, DataComeFromTheFileTheDocumentOrTheView)
     EXPECT_TRUE(boxes.isEmpty());
 }
 
-TEST_F(ExchangeTest, DataHoldWhatIsBeingTypedAndIncompleteLinesButNoLineThatIsOnlyShown)
+TEST_F(ExchangeTest, DataHoldIncompleteLinesButNoLineThatIsOnlyShown)
 {
     Write(Path("small.hdkv"), SmallFile);
     auto* view = Open(Path("small.hdkv"));
     EXPECT_EQ(Summary(Owned(KvrMSGGetData({}, view->GetDocument())).get()), "0 MAIN 100, 0  200, 0 MAIN 1e+10");
+    auto* empty = Open({});
+    for (int tab = 0; tab < empty->Sheet()->count(); ++tab)
+        empty->Sheet()->SetActivePage(tab);
+    EXPECT_EQ(Summary(Owned(KvrMSGGetData({}, empty->GetDocument())).get()), "");
+    EXPECT_EQ(Owned(KvrMSGGetHDUserDefMark({}, empty->GetDocument()))->size(), 1u)
+        << "the titles, of which there are none";
+    EXPECT_EQ(Owned(KvrMSGGetHDMaps({}, empty->GetDocument()))->size(), 0u);
+}
+
+TEST_F(ExchangeTest, ReadingDisturbsNobodyWhoTypes)
+{
+    constexpr int DefaultPage = 5;
+    projectHandle = 5;
+    auto* view = Open(WriteFile("river.hdkv"));
+    QUndoStack& steps = view->GetDocument()->UndoStack();
+    const auto readAll = [&] {
+        const int step = steps.index();
+        CObList objects;
+        Send(view, KsRequest::GetData, &objects);
+        for (CKsDoc* document : {static_cast<CKsDoc*>(view->GetDocument()), static_cast<CKsDoc*>(nullptr)})
+            for (auto* get : {&KvrMSGGetData, &KvrMSGGetHDUserDefMark, &KvrMSGGetHDMaps})
+                EXPECT_NE(Owned(get(Path("river.hdkv"), document)), nullptr);
+        EXPECT_EQ(steps.index(), step);
+        return Summary(&objects);
+    };
     auto* grid = view->ActivePage()->GetGrid();
     grid->setFocus();
     grid->SetCurrentCell(1, 2);
-    QTest::keyClicks(grid, "7");
-    EXPECT_TRUE(Summary(Owned(KvrMSGGetData({}, view->GetDocument())).get()).starts_with("0 MAIN 7,"));
-    EXPECT_EQ(Summary(Owned(KvrMSGGetData({}, Open({})->GetDocument())).get()), "");
+    for (const char digit : {'1', '2', '3', '4'}) {
+        QTest::keyClick(QApplication::focusWidget(), digit);
+        EXPECT_EQ(readAll(), AllItems) << "what is stored, not what is being typed";
+    }
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+    EXPECT_TRUE(readAll().starts_with("0 MAIN 1234,"));
+
+    // Not even something that cannot be stored: no message, and the text and the focus stay.
+    auto* field = TypeWrongInto(*view, DefaultPage);
+    const std::string stored = readAll();
+    EXPECT_TRUE(stored.starts_with("0 MAIN 1234,"));
+    EXPECT_EQ(field->text(), "1e");
+    EXPECT_EQ(QApplication::focusWidget(), field);
+    EXPECT_EQ(view->Sheet()->currentIndex(), DefaultPage);
+    EXPECT_TRUE(boxes.isEmpty());
+    QTest::keyClick(field, Qt::Key_Escape);
+}
+
+TEST_F(ExchangeTest, AFileIsFoundInWhateverCaseItIsSpelt)
+{
+    const CString path = WriteFile("River.HDKV");
+    const CString spelt = folder.filePath("river.hdkv");
+    EXPECT_EQ(Summary(Owned(KvrMSGGetData(spelt, nullptr)).get()), AllItems) << "read";
+    auto* view = Open(path);
+    CObList items = Items(0, "MAIN", 5);
+    KvrMSGInsertData(spelt, nullptr, &items);
+    EXPECT_EQ(documents->Documents().size(), 1u);
+    EXPECT_EQ(List(*view, 0).GetCount(), 3u) << "into the open document";
+    EXPECT_EQ(Open(spelt), view);
+}
+
+TEST_F(ExchangeTest, AChangeAsksWhoIsTypingOnceAndTakesNoLineFromUnderIt)
+{
+    auto* view = Open(WriteFile("river.hdkv"));
+    auto* grid = view->ActivePage()->GetGrid();
+    grid->setFocus();
+    grid->SetCurrentCell(1, 2);
+    for (int digit = 0; digit < 2; ++digit)
+        QTest::keyClick(QApplication::focusWidget(), '7');
+    CObList items = Items(0, "MAIN", 77); // as it is typed
+    KvrMSGDeleteData({}, view, &items);
+    EXPECT_EQ(Summary(Owned(KvrMSGGetData({}, view->GetDocument())).get()).substr(0, 10), "0 SIDE 0.1");
 }
 
 TEST_F(ExchangeTest, MarksAndMaps)
@@ -105,6 +169,7 @@ TEST_F(ExchangeTest, InsertingAddsOneLineToTheTableAndShowsItsTab)
         SCOPED_TRACE(row.type);
         const auto before = FileText(*view);
         const int step = steps.index();
+        QTest::qWait(1); // the steps of the row before are told
         messages.clear();
         CObList items = Items(row.type, "Main", 7.125);
         items.push_back(Item(row.type, "SECOND", 8));
@@ -138,18 +203,19 @@ TEST_F(ExchangeTest, AnEmptyTableShowsTheInsertedLineAlone)
 {
     auto* view = Open({});
     auto& list = Parameters(*view).InitList;
-    ASSERT_EQ(list.GetCount(), 1u) << "the line that is only shown";
+    EXPECT_EQ(view->ActivePage()->GetGrid()->RowCount(), 1) << "a line that is only shown";
     CObList items = Items(0, "MAIN", 5);
     QUndoStack& steps = view->GetDocument()->UndoStack();
     const auto texts = [&] { return view->ActivePage()->GetGrid()->TextAt(1, 1) + QString::number(list.GetCount()); };
+    EXPECT_EQ(texts(), "0");
     KvrMSGInsertData({}, view, &items);
     EXPECT_EQ(texts(), "MAIN1");
     steps.undo();
-    EXPECT_EQ(texts(), "1");
+    EXPECT_EQ(texts(), "0");
     steps.redo();
     EXPECT_EQ(texts(), "MAIN1");
     KvrMSGDeleteData({}, view, &items);
-    EXPECT_EQ(texts(), "1");
+    EXPECT_EQ(texts(), "0");
     steps.undo();
     EXPECT_EQ(texts(), "MAIN1");
 }
@@ -171,6 +237,7 @@ TEST_F(ExchangeTest, DeletingTakesTheFirstLineAtExactlyThePlace)
             EXPECT_TRUE(FileText(*view) == before) << branch << chainage;
             EXPECT_EQ(log.Take(), 1);
         }
+        QTest::qWait(1);
         messages.clear();
         CObList items = Items(row.type, "SIDE", place);
         Send(view, KsRequest::DeleteData, &items);

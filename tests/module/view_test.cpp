@@ -2,6 +2,8 @@
 #include "module_fixture.h"
 
 #include "ks/fc/doc_template.h"
+#include "module/file_bar.h"
+#include "module/findings_dialog.h"
 #include "module/kavo0_hd.h"
 #include "module/sheet.h"
 #include "module/view.h"
@@ -13,8 +15,11 @@
 #include <QApplication>
 #include <QClipboard>
 #include <QDialog>
+#include <QLabel>
 #include <QLineEdit>
+#include <QPushButton>
 #include <QStatusBar>
+#include <QTableView>
 #include <QTest>
 #include <QTimer>
 #include <QUndoStack>
@@ -153,7 +158,7 @@ TEST_F(ViewTest, APageIsNeverSmallerThanWhatItShows)
     }
 }
 
-TEST_F(ViewTest, AChangedLocationIsToldToTheProjectAndLeavingIsToo)
+TEST_F(ViewTest, AChangeIsToldToTheProjectAndLeavingIsToo)
 {
     projectHandle = 5;
     auto* view = Open();
@@ -171,16 +176,18 @@ TEST_F(ViewTest, AChangedLocationIsToldToTheProjectAndLeavingIsToo)
     };
     grid->setFocus();
     edit(3, "7.5");
-    EXPECT_EQ(changes(), 0);
+    QTest::qWait(1);
+    EXPECT_EQ(changes(), 1);
     EXPECT_EQ(view->GetDocument()->Parameters().InitList.GetAt(0).InitialH, 7.5);
     edit(2, "150");
-    EXPECT_EQ(changes(), 1);
+    QTest::qWait(1);
+    EXPECT_EQ(changes(), 2);
     EXPECT_EQ(view->GetDocument()->Parameters().InitList.GetAt(0).Chainage, 150);
 
     view->GetDocument()->SetModifiedFlag(false);
     QTest::qWait(1); // news of the current line
     messages.clear();
-    view->CloseWindow();
+    CKsMDIChildWnd::Of(view)->close();
     QTest::qWait(50);
     ASSERT_EQ(messages.size(), 2u);
     EXPECT_EQ(messages[0].request, KsRequest::LeaveProject);
@@ -203,15 +210,6 @@ TEST_F(ViewTest, ToolBarFollowsActivation)
     EXPECT_TRUE(ToolbarMessages().empty());
     view->OnActivateView(false, &other, view);
     EXPECT_EQ(ToolbarMessages(), std::vector{KsMessage::HideToolbar()});
-}
-
-TEST_F(ViewTest, CtrlF4ClosesTheWindowFromInsideTheGrid)
-{
-    auto* view = Open();
-    ASSERT_NE(view, nullptr);
-    QTest::keyClick(view->ActivePage()->GetGrid(), Qt::Key_F4, Qt::ControlModifier);
-    QTest::qWait(50);
-    EXPECT_TRUE(documents->Documents().empty());
 }
 
 TEST_F(ViewTest, SearchGoesOnFromTheLastFindAndSaysWhenThereIsNoMore)
@@ -251,6 +249,59 @@ TEST_F(ViewTest, AnswersNothingToMessagesItDoesNotKnow)
         EXPECT_EQ(view.WindowProc(KsMessage::BetweenEditors(), request, 0), 0);
         EXPECT_EQ(view.WindowProc(KsMessage::ProjectManagement(), request, 0), 0);
     }
+}
+
+TEST_F(ViewTest, AnUnreadableFileNeverLooksLikeAnEmptyModel)
+{
+    Write(Path("river.hdkv"), "[KAVO0_HD]\n[InitList]\n[/WindList]\n");
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    auto* text = view->findChild<QLabel*>("fileBarText");
+    ASSERT_TRUE(text && text->isVisible());
+    EXPECT_TRUE(text->text().contains("river.hdkv, line 3, column 1")) << qPrintable(text->text());
+    EXPECT_FALSE(view->Sheet()->isEnabled());
+    view->GetDocument()->EditUnreadable();
+    EXPECT_TRUE(view->Sheet()->isEnabled());
+    EXPECT_TRUE(text->isVisible()) << "as long as the file is not replaced";
+    answer = QMessageBox::Yes;
+    EXPECT_TRUE(view->GetDocument()->DoSave(view->GetDocument()->GetPathName()));
+    EXPECT_TRUE(text->text().contains("river.hdkv.unreadable-1")) << qPrintable(text->text());
+}
+
+TEST_F(ViewTest, WhatWasNotTakenIsListedOnceTheWindowIsThere)
+{
+    Write(Path("river.hdkv"), "[KAVO0_HD]\n[WaveList]\nDATA = \"R\", 1, 2, 2.0\nDATA = \"R\", 1, 2, \"x\"\n"
+                              "[/WaveList]\n[/KAVO0_HD]\n");
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    EXPECT_EQ(view->findChild<CFindingsDialog*>(), nullptr) << "not before the first paint";
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->findChild<CFindingsDialog*>() != nullptr; }));
+    auto* dialog = view->findChild<CFindingsDialog*>();
+    EXPECT_FALSE(dialog->isModal());
+    auto* table = dialog->findChild<QTableView*>();
+    ASSERT_EQ(table->model()->rowCount(), 2);
+    QTest::keyClick(table, Qt::Key_A, Qt::ControlModifier);
+    QTest::keyClick(dialog, Qt::Key_C, Qt::ControlModifier);
+    EXPECT_EQ(QGuiApplication::clipboard()->text(),
+              "Line\tColumn\tSection\tKeyword\tParameter\tIn the file\tExpected\tUsed instead\n"
+              "3\t19\tWaveList\tDATA\t4 WaveApproximation\t2.0\tan integer\t2\n"
+              "4\t19\tWaveList\tDATA\t4 WaveApproximation\t\"x\"\tan integer\t0\n");
+    auto* bar = view->findChild<CFileBar*>();
+    EXPECT_TRUE(bar->isVisible());
+    dialog->close();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    bar->findChild<QPushButton*>()->click();
+    EXPECT_NE(view->findChild<CFindingsDialog*>(), nullptr) << "reachable again";
+    EXPECT_TRUE(boxes.isEmpty());
+}
+
+TEST_F(ViewTest, ACleanFileHasNoBar)
+{
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    EXPECT_FALSE(view->findChild<CFileBar*>()->isVisible());
+    QTest::qWait(50);
+    EXPECT_EQ(view->findChild<CFindingsDialog*>(), nullptr);
 }
 
 } // namespace

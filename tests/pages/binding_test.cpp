@@ -117,3 +117,25 @@ TEST_F(BindingTest, IntegersAreTakenWhenLeftOrStored)
     page.StoreToDocument();
     EXPECT_EQ(globals.no_iter, 42);
 }
+
+TEST_F(BindingTest, EscapeAndDisablingTakeBackWhatWasTyped)
+{
+    auto& page = Open<BoundPage>();
+    if (!page.box.isChecked())
+        page.box.click();
+    const QString integer = page.integer.text(), number = page.number.text();
+    page.integer.setFocus();
+    page.integer.selectAll();
+    QTest::keyClicks(&page.integer, "abc");
+    QTest::keyClick(&page.integer, Qt::Key_Escape);
+    EXPECT_EQ(page.integer.text(), integer);
+    page.number.setFocus();
+    page.number.selectAll();
+    QTest::keyClicks(&page.number, "-7"); // below its minimum
+    page.box.setFocus(Qt::MouseFocusReason);
+    page.box.click();
+    QTest::qWait(1);
+    EXPECT_EQ(page.number.text(), number);
+    EXPECT_TRUE(page.OnKillActive());
+    EXPECT_EQ(boxes, QStringList());
+}

@@ -73,7 +73,7 @@ class CorePagesTest : public PageTest
 protected:
     CorePagesTest()
     {
-        QFile::copy(KVR_SOURCE_DIR "/examples/river/river.hdkv", folder.filePath("river.hdkv"));
+        QFile::copy(KVR_SOURCE_DIR "/examples/river/river.HDKV", folder.filePath("river.hdkv"));
         EXPECT_TRUE(document.OnOpenDocument(folder.filePath("river.hdkv")));
     }
     template <typename Check>
@@ -123,7 +123,7 @@ TEST_F(CorePagesTest, VisitingChangesNothing)
 {
     const std::string before = Text();
     CKavo0_hdDoc unvisited;
-    ASSERT_TRUE(unvisited.OnOpenDocument(KVR_SOURCE_DIR "/examples/river/river.hdkv"));
+    ASSERT_TRUE(unvisited.OnOpenDocument(KVR_SOURCE_DIR "/examples/river/river.HDKV"));
     OnEveryPage([&](CGenPropertyPage& page) {
         // In the other units everything shows, and would be stored, differently.
         for (const auto system : {KsUnitSystem::UsCustomary, KsUnitSystem::Metric}) {

@@ -24,8 +24,8 @@ protected:
     }
     void Leave()
     {
-        QTest::qWait(1); // the warning of an earlier event is over
-        other.setFocus(Qt::TabFocusReason);
+        other.setFocus(Qt::OtherFocusReason); // nobody asked the field
+        QTest::qWait(1);
     }
 
     double value = 1.23456789;
@@ -54,7 +54,10 @@ TEST_F(CtrlEditTest, AnUntouchedTextChangesNothing)
     const double before = value;
     field.setFocus();
     Leave();
-    Type("1.23457"); // the very text that stood there
+    field.setFocus();
+    QTest::keyClick(&field, Qt::Key_End);
+    QTest::keyClicks(&field, "9");
+    QTest::keyClick(&field, Qt::Key_Backspace); // every character shown still stands
     Leave();
     EXPECT_EQ(value, before);
     Type("");
@@ -62,6 +65,64 @@ TEST_F(CtrlEditTest, AnUntouchedTextChangesNothing)
     EXPECT_EQ(value, before);
     EXPECT_EQ(field.text(), "1.23457");
     EXPECT_EQ(boxes, QStringList());
+}
+
+TEST_F(CtrlEditTest, TypingWhatIsShownIsTyping)
+{
+    const auto retype = [&](const char* what, const std::function<void()>& type) {
+        value = 1.23456789;
+        field.Show();
+        field.setFocus();
+        type();
+        EXPECT_EQ(field.text(), "1.23457") << what;
+        Leave();
+        EXPECT_EQ(value, 1.23457) << what;
+    };
+    retype("all anew", [&] { Type("1.23457"); });
+    retype("over the selection", [&] {
+        field.selectAll();
+        QTest::keyClicks(&field, "1.23457");
+    });
+    retype("the last digit", [&] {
+        QTest::keyClick(&field, Qt::Key_End);
+        QTest::keyClick(&field, Qt::Key_Backspace);
+        QTest::keyClicks(&field, "7");
+    });
+    retype("a digit in the middle, marked", [&] {
+        field.setSelection(3, 1);
+        QTest::keyClicks(&field, "3");
+    });
+    // One single character, whose replacement looks like itself.
+    field.Setup(&value, 20, 1, true, UnitGroup::WaterLevel);
+    value = 2.4;
+    field.Show();
+    field.setFocus();
+    field.selectAll();
+    QTest::keyClicks(&field, "2");
+    Leave();
+    EXPECT_EQ(value, 2);
+}
+
+TEST_F(CtrlEditTest, ARefusedTextGoesWithItsField)
+{
+    for (const bool hides : {false, true}) {
+        Type("abc");
+        other.setFocus(Qt::OtherFocusReason);
+        if (hides)
+            field.hide();
+        else
+            field.setEnabled(false);
+        QTest::qWait(1);
+        EXPECT_EQ(boxes, QStringList()) << hides;
+        EXPECT_EQ(field.text(), "1.23457") << hides;
+        EXPECT_TRUE(field.Commit());
+        field.setEnabled(true);
+        field.show();
+    }
+    Type("abc");
+    QTest::keyClick(&field, Qt::Key_Tab);
+    EXPECT_EQ(boxes.size(), 1) << "asked before the focus goes";
+    EXPECT_TRUE(field.hasFocus());
 }
 
 TEST_F(CtrlEditTest, RefusesAndKeepsTheFocus)

@@ -130,10 +130,23 @@ TEST_F(GridKeyTest, DeletesWholeLinesOfOneRange)
                       {5, grid->verticalHeader()->sectionViewportPosition(1) + 5});
     Press(Qt::Key_Delete);
     EXPECT_EQ(Stored(), "A 1 10 20, C 3 0 0");
+    // All cells of a line, one by one, are not the line.
+    grid->SetCurrentCell(1, 1);
+    for (int column = 2; column <= grid->ColumnCount(); ++column)
+        QTest::keyClick(grid, Qt::Key_Right, Qt::ShiftModifier);
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(init.GetCount(), 2u);
+    Press(Qt::Key_Space, Qt::ShiftModifier);
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(Stored(), "C 3 0 0");
+    document.UndoStack().undo();
     globals.G_discharge = 4;
     SelectRows(1, 2);
     Press(Qt::Key_Delete);
-    EXPECT_EQ(Stored(), " 10000000000 0 4") << "a table without lines gets one";
+    EXPECT_EQ(Stored(), "");
+    EXPECT_EQ(Texts(1), "||0.000|4.000") << "a table without lines shows one";
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(document.UndoStack().count(), 2) << "which cannot be deleted";
     document.UndoStack().undo();
     EXPECT_EQ(Stored(), "A 1 10 20, C 3 0 0");
 }

@@ -42,7 +42,8 @@ TEST_F(ModelTest, EveryFamily)
         auto& page = Open<FamilyPage>(list);
         CGridModel& model = *grid->Model();
         QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::Fatal);
-        ASSERT_EQ(list.GetCount(), 1u); // the page shows a line
+        ASSERT_EQ(list.GetCount(), 0u);
+        ASSERT_EQ(model.rowCount(), 1); // the page shows a line
         EXPECT_FALSE(document.IsModified());
 
         // Every cell takes a value and gives it back; a line's cells do not touch each other.
@@ -64,7 +65,7 @@ TEST_F(ModelTest, EveryFamily)
         while (document.UndoStack().canUndo())
             document.UndoStack().undo();
         EXPECT_EQ(model.rowCount(), 1);
-        EXPECT_TRUE(list.GetAt(0).IsBlank());
+        EXPECT_TRUE(list.IsEmpty());
         EXPECT_EQ(boxes, QStringList());
     }
 }

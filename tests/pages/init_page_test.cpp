@@ -29,14 +29,38 @@ TEST_F(InitPageTest, EmptyListShowsTheGlobalValues)
     EXPECT_TRUE(view->linesMenu);
     EXPECT_EQ(Texts(1), "||1.500|30.000");
     EXPECT_EQ(Current(), std::pair(1, 1));
-    EXPECT_EQ(init.GetCount(), 1u);
-    EXPECT_TRUE(init.GetAt(0).IsBlank());
+    EXPECT_EQ(init.GetCount(), 0u) << "it is no line of the document";
     EXPECT_FALSE(document.IsModified());
     // New lines take them as plain numbers, whatever the unit.
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     view->page->AppendLine();
+    EXPECT_EQ(Texts(1), "||1.500|30.000") << "what was shown is a line by now";
     EXPECT_EQ(Texts(2), "||1.500|30.000");
     EXPECT_NEAR(init.GetAt(1).InitialH, 1.5 * 0.3048, 1e-5);
+    document.UndoStack().undo();
+    EXPECT_EQ(grid->RowCount(), 1);
+    EXPECT_EQ(init.GetCount(), 0u);
+}
+
+TEST_F(InitPageTest, TheLineOfAnEmptyListFollowsTheGlobalValuesUntilItIsTouched)
+{
+    globals.G_waterlevel = 3.5;
+    Open<CInitPage>();
+    auto* level = Find<CCtrlEdit>("levelOrDepth_1001");
+    level->setFocus();
+    level->selectAll();
+    QTest::keyClicks(level, "5");
+    QTest::keyClick(level, Qt::Key_Tab);
+    EXPECT_EQ(Texts(1), "||5.000|0.000");
+    Enter(1, 1, "main");
+    EXPECT_EQ(Stored(), "MAIN 10000000000 5 0");
+    document.UndoStack().undo();
+    EXPECT_EQ(Stored(), "");
+    document.UndoStack().undo();
+    EXPECT_EQ(Texts(1), "||3.500|0.000");
+    EXPECT_FALSE(document.IsModified());
+    Enter(1, 3, "3.5"); // what is there already
+    EXPECT_EQ(init.GetCount(), 0u);
 }
 
 TEST_F(InitPageTest, LevelOrDepth)
@@ -105,8 +129,10 @@ TEST_F(InitPageTest, GlobalFieldsAreStoredWhenLeft)
     EXPECT_EQ(discharge->text(), "0");
     discharge->selectAll();
     QTest::keyClicks(discharge, "x");
-    EXPECT_TRUE(view->page->OnKillActive()) << "leaving is never refused";
+    EXPECT_FALSE(view->page->OnKillActive()) << "nothing typed is lost";
     EXPECT_EQ(boxes, QStringList{"Invalid floating point number!"});
+    EXPECT_TRUE(discharge->hasFocus());
+    EXPECT_EQ(discharge->text(), "x");
 }
 
 TEST_F(InitPageTest, LocationsOfOtherEditors)

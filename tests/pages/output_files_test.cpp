@@ -120,10 +120,11 @@ TEST_F(OutputFilesTest, BrowsingStartsAtTheFileNamed)
     EXPECT_TRUE(document.IsModified());
 }
 
-TEST_F(OutputFilesTest, AFileThatExistsIsAskedAbout)
+// A file that the simulation writes is asked about when it is there, one that it reads when it is not.
+TEST_F(OutputFilesTest, DoubtfulFilesAreAskedAbout)
 {
-    chosen = folder.filePath("there.kvt2");
-    QFile(chosen).open(QIODevice::WriteOnly);
+    const QString there = folder.filePath("there.kvt2"), missing = folder.filePath("missing.kvt2");
+    QFile(there).open(QIODevice::WriteOnly);
     maps.GenerateOutput = maps.ApplyDemGroundElevation = maps.MapAreaGeoDb = true;
     Open<CMapsPage>();
     auto* help = view->page->findChild<CGeoFileEdit*>("helpGrid_1241");
@@ -131,24 +132,36 @@ TEST_F(OutputFilesTest, AFileThatExistsIsAskedAbout)
     {
         std::function<void()> browse;
         std::function<QString()> name;
+        QString doubtful, plain;
         const char* says;
-    } cases[] = {
-        {[&] { Click(Part("maps_1226"), 1, 8); }, [&] { return Part("maps_1226").TextAt(1, 7); }, "write over it"},
-        {[&] { Click(Part("dem_1227"), 1, 2); }, [&] { return Part("dem_1227").TextAt(1, 1); }, "read it"},
-        {[&] { help->findChild<QToolButton*>()->click(); }, [&] { return help->Field()->text(); }, "read it"}};
+    } cases[] = {{[&] { Click(Part("maps_1226"), 1, 8); }, [&] { return Part("maps_1226").TextAt(1, 7); }, there,
+                  missing, "write over it"},
+                 {[&] { Click(Part("dem_1227"), 1, 2); }, [&] { return Part("dem_1227").TextAt(1, 1); }, missing, there,
+                  "does not exist"},
+                 {[&] { help->findChild<QToolButton*>()->click(); }, [&] { return help->Field()->text(); }, missing,
+                  there, "does not exist"}};
     for (const auto& c : cases) {
         SCOPED_TRACE(&c - cases);
         boxes.clear();
+        chosen = c.doubtful;
         answer = QMessageBox::No;
         c.browse();
         EXPECT_EQ(c.name(), "");
         answer = QMessageBox::Yes;
         c.browse();
         EXPECT_EQ(c.name(), chosen);
-        c.browse();
-        ASSERT_EQ(boxes.size(), 2) << "not when it is the one named already";
+        ASSERT_EQ(boxes.size(), 2);
         EXPECT_TRUE(boxes[0].contains(c.says)) << boxes[0].toStdString();
+        chosen = c.plain;
+        c.browse();
+        c.browse();
+        EXPECT_EQ(c.name(), chosen);
+        EXPECT_EQ(boxes.size(), 2) << "nothing to ask";
     }
+    chosen = there;
+    Click(Part("maps_1226"), 1, 8);
+    Click(Part("maps_1226"), 1, 8);
+    EXPECT_EQ(boxes.size(), 3) << "not when it is the one named already";
 }
 
 TEST_F(OutputFilesTest, DatesAreKeptUnlessTheyAreTyped)
@@ -285,12 +298,13 @@ TEST_F(OutputFilesTest, RowsWithoutAFileAreAnnouncedAndLeftOut)
     ASSERT_TRUE(document.OnSaveDocument(folder.filePath("maps.HDKV")));
     EXPECT_EQ(document.UndoStack().count(), 0) << "the rows to type into are nothing to bring back";
     EXPECT_EQ(cells.RowCount(), 1) << "and stand there again";
+    EXPECT_EQ(status->text(), "");
     Put(cells, 1, 1, "1000.5");
     cells.setFocus();
     QTest::keyClick(&cells, Qt::Key_Insert);
     Put(cells, 2, 7, "depth.kvt2");
     EXPECT_TRUE(status->isVisible());
-    EXPECT_TRUE(status->text().contains("(2)")) << status->text().toStdString(); // one map, one DEM
+    EXPECT_TRUE(status->text().contains("(1)")) << status->text().toStdString();
     ASSERT_TRUE(document.OnSaveDocument(folder.filePath("maps.HDKV")));
     ASSERT_EQ(maps.MapOutputFiles.size(), 1U);
     EXPECT_EQ(maps.MapOutputFiles[0].FileName, "depth.kvt2");

@@ -21,7 +21,11 @@ public:
         layout()->addWidget(other);
         page->SetHost(this);
         document.AddView(this);
-        QObject::connect(&document, &CKavo0_hdDoc::Reveal, this, [this](CGenList*, int row, int) { revealed << row; });
+        QObject::connect(&document, &CKavo0_hdDoc::Reveal, this, [this](const ChangePlace& place) {
+            revealed << (place.list ? place.listRow : place.row);
+            if (page->Shows(place))
+                page->Reveal(place, true);
+        });
         resize(500, 500);
         show();
         activateWindow();
@@ -154,12 +158,7 @@ protected:
     }
     QWidget* Editor() const { return grid->Delegate()->Editor(); }
     std::pair<int, int> Current() const { return {grid->CurrentRow(), grid->CurrentColumn()}; }
-    void SelectRows(int first, int last)
-    {
-        grid->selectionModel()->select(
-            QItemSelection(grid->model()->index(first - 1, 0), grid->model()->index(last - 1, grid->ColumnCount() - 1)),
-            QItemSelectionModel::ClearAndSelect);
-    }
+    void SelectRows(int first, int last) { grid->SelectLines(first, last); }
 
     CKavo0_hdDoc document;
     CGenParamList<HD_Initial>& init = document.Parameters().InitList;

@@ -62,10 +62,10 @@ TEST_F(PairsGridTest, KeyboardAlone)
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "0 0");
     TypeCells(global, {"0.5", "26", "1", "29"}); // Tab behind the last cell appends
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "0.5 26, 1 29, 0 0");
-    EXPECT_EQ(list.GetCount(), 1u) << "the location grid got no line";
+    EXPECT_EQ(list.GetCount(), 0u) << "the location grid got no line";
     for (int column : view->edited)
         EXPECT_EQ(column, 0) << "no location changed";
-    global->selectRow(2);
+    global->SelectLines(3, 3);
     QTest::keyClick(global, Qt::Key_Delete);
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "0.5 26, 1 29");
     global->selectAll();
@@ -81,6 +81,9 @@ TEST_F(PairsGridTest, KeyboardAlone)
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "");
     EXPECT_TRUE(global->Paste()) << "also into an empty table";
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "2 3, 4 5");
+    EXPECT_FALSE(line->isEnabled()) << "there is no line yet";
+    Enter(1, 1, "main");
+    EXPECT_TRUE(line->isEnabled());
     QTest::mouseDClick(line->viewport(), Qt::LeftButton, {}, QPoint(20, 20));
     EXPECT_EQ(Pairs(list.GetAt(0).VeloRes), "0 0") << "a double click makes the first line";
 }
@@ -148,18 +151,22 @@ TEST_F(PairsGridTest, AWrongNumberKeepsTheLine)
     EXPECT_EQ(Pairs(list.GetAt(1).VeloRes), "2 30");
 }
 
-TEST_F(PairsGridTest, PairsOfALineThatWasNotThereYet)
+TEST_F(PairsGridTest, PairsNeedALine)
 {
     OpenToolbox();
+    EXPECT_FALSE(line->isEnabled()) << "the line that an empty table shows is none yet";
+    Enter(1, 3, "0.5");
+    ASSERT_TRUE(line->isEnabled());
     line->setFocus();
     QTest::keyClick(line, Qt::Key_Insert);
     TypeCells(line, {"1", "2"});
     QTemporaryDir folder;
     EXPECT_TRUE(document.OnSaveDocument(folder.filePath("a.HDKV")));
+    EXPECT_FALSE(line->isEnabled());
     document.UndoStack().undo(); // of the removal of incomplete lines
     EXPECT_EQ(Pairs(list.GetAt(0).VeloRes), "1 2, 0 0") << "the user's line is not lost";
     UndoAll();
-    EXPECT_EQ(Pairs(list.GetAt(0).VeloRes), "");
+    EXPECT_TRUE(list.IsEmpty());
 }
 
 TEST_F(PairsGridTest, MixingPairs)

@@ -51,7 +51,7 @@ TEST_F(SearchTest, Criteria)
     } cases[] = {
         {"", 0, NotUsed, Partial, {1, 2, 3, 4}}, {"RIV", 0, NotUsed, Partial, {1, 3, 4}},
         {"RIV", 0, NotUsed, Full, {4}},          {"RIV", 0, NotUsed, Neither, {1, 2, 3, 4}},
-        {"river1", 0, NotUsed, Full, {}},        {"", 200.5, Equal, Partial, {2}},
+        {"river1", 0, NotUsed, Full, {1}},       {"", 200.5, Equal, Partial, {2}},
         {"", 200, Equal, Partial, {}},           {"", 200.5, Less, Partial, {1, 4}}, // an empty cell reads as 0
         {"", 200.5, Greater, Partial, {3}},      {"", 0, Equal, Partial, {4}},
         {"RIVER", 100, Greater, Partial, {3}},   {"", 0, 7, Partial, {}},

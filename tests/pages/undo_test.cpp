@@ -4,6 +4,7 @@
 #include "pages/init_page.h"
 
 #include <QClipboard>
+#include <QTemporaryDir>
 #include <random>
 
 class UndoTest : public PageTest
@@ -80,17 +81,56 @@ TEST_F(UndoTest, RandomSequences)
 TEST_F(UndoTest, TheLineOfAnEmptyListIsNoChange)
 {
     Open<CInitPage>();
-    EXPECT_EQ(init.GetCount(), 1u);
+    EXPECT_EQ(grid->RowCount(), 1);
+    EXPECT_EQ(init.GetCount(), 0u);
     EXPECT_FALSE(document.IsModified());
     EXPECT_EQ(document.UndoStack().count(), 0);
-    // Steps on top of it survive its removal by a save.
-    view->page->AppendLine();
-    Enter(2, 3, "5");
-    document.UndoStack().setIndex(0);
-    EXPECT_EQ(init.GetCount(), 1u);
-    init.RemoveAll();
-    document.UndoStack().setIndex(2);
-    EXPECT_EQ(init.GetAt(0).InitialH, 5);
-    document.UndoStack().setIndex(0);
-    EXPECT_EQ(grid->RowCount(), int(init.GetCount()));
+    Enter(1, 1, "a"); // touched, and taken back: as if it had never been
+    document.UndoStack().undo();
+    EXPECT_EQ(init.GetCount(), 0u);
+    EXPECT_FALSE(document.IsModified());
+    // The pages of the sheet come and go between the steps.
+    Open<CInitPage>();
+    document.UndoStack().redo();
+    EXPECT_EQ(Stored(), "A 10000000000 0 0");
+    EXPECT_EQ(grid->RowCount(), 1);
+}
+
+TEST_F(UndoTest, ASaveThatDroppedLinesIsRedoneAsItWas)
+{
+    QTemporaryDir folder;
+    Open<CInitPage>();
+    Add("A", 1);
+    Add("", 2, 7);
+    Add("B", 3);
+    Add("C", NotGiven);
+    view->page->LoadFromDocument(&document);
+    ASSERT_TRUE(document.OnSaveDocument(folder.filePath("new.HDKV")));
+    EXPECT_EQ(Stored(), "A 1 0 0, B 3 0 0");
+    const QString dropped = "A 1 0 0,  2 7 0, B 3 0 0, C 10000000000 0 0";
+    document.UndoStack().undo();
+    EXPECT_EQ(Stored(), dropped);
+    EXPECT_EQ(view->revealed.back(), 2);
+    // What the lines hold by then does not count: the step is what it was.
+    init.GetAt(1).RiverName = "NAMED";
+    init.GetAt(2).RiverName.clear();
+    document.UndoStack().redo();
+    EXPECT_EQ(Stored(), "A 1 0 0,  3 0 0");
+}
+
+TEST_F(UndoTest, TheSavedStateIsUnmodifiedFromBothSides)
+{
+    QTemporaryDir folder;
+    Open<CInitPage>();
+    Enter(1, 1, "a");
+    ASSERT_TRUE(document.OnSaveDocument(folder.filePath("new.HDKV"))); // the line has no chainage: dropped
+    EXPECT_FALSE(document.IsModified());
+    document.UndoStack().undo();
+    EXPECT_TRUE(document.IsModified()) << "the line is back";
+    document.UndoStack().redo();
+    EXPECT_FALSE(document.IsModified());
+    Enter(1, 1, "b");
+    EXPECT_TRUE(document.IsModified());
+    document.UndoStack().undo();
+    EXPECT_FALSE(document.IsModified());
 }

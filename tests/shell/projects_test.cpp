@@ -58,6 +58,26 @@ TEST_F(ShellTest, AtTheStartTheFirstFileIsThereAtOnceAndTheOthersFollow)
     EXPECT_EQ(opened(), "") << "the others do not open in a project that was closed";
 }
 
+// An editor that writes its extension in capitals renames a member; the project file follows, and nothing else in it.
+TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
+{
+    Write("one/r\u00FC.tst");
+    Write("b.tst");
+    const char* const members =
+        "  // main river\n  File = <one\\\\r\xC3\xBC.tst> // keep\nFile=<b.tst>\nFile = \"one/r\xC3\xBC.tst\"\n";
+    const QString path = WriteProject("p.kvrp", members);
+    ASSERT_TRUE(frame->OpenFile(path));
+    CKsDoc* document = ViewOf("one/r\u00FC.tst")->GetDocument();
+    document->SetPathName(Path("one/r\u00FC.TST"));
+    QFile file(path);
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    EXPECT_EQ(file.readAll(), "[KVR_PROJECT]\n[Members]\n  // main river\n  File = <one\\\\r\xC3\xBC.TST> // keep\n"
+                              "File=<b.tst>\nFile = \"one/r\xC3\xBC.TST\"\n[/Members]\n[/KVR_PROJECT]\n");
+    document->SetPathName(Path("one/other.TST"));
+    file.seek(0);
+    EXPECT_FALSE(file.readAll().contains("other")) << "another file is no other spelling";
+}
+
 TEST_F(ShellTest, AProjectStandsSideBySideUnlessTheUserChoseTabs)
 {
     Write("a.tst");
@@ -221,4 +241,77 @@ TEST_F(ShellTest, AMemberIsFoundInWhateverCaseItWasSaved)
     EXPECT_EQ(asked, QStringList());
     ASSERT_TRUE(ViewOf("a.TST"));
     EXPECT_NE(ProjectOf("a.TST"), 0);
+    EXPECT_EQ(ViewOf("A.tst"), ViewOf("a.TST"));
+    EXPECT_TRUE(frame->OpenFile(Path("A.tst")));
+    EXPECT_EQ(Texts().Documents().size(), 1u) << "it is open already";
+    EXPECT_TRUE(frame->OpenFile(Path("P.KVRP")));
+    EXPECT_EQ(frame->Projects().All().size(), 1u) << "so is the project";
+}
+
+TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
+{
+    for (const char* name : {"a.tst", "b.tst", "c.tst"})
+        Write(name);
+    frame->OpenFile(WriteProject("p.kvrp", "File = <a.tst>\nFile = <b.tst>\nFile = <c.tst>\n"));
+    const auto handle = ProjectOf("a.tst");
+    for (const char* name : {"b.tst", "c.tst"})
+        ViewOf(name)->GetDocument()->SetModifiedFlag();
+    const CView* const front = frame->GetActiveView();
+    for (const char* name : {"a.tst", "b.tst", "c.tst"})
+        TakeLog(ViewOf(name));
+    answers << QMessageBox::Discard << QMessageBox::Cancel;
+    Action("actionCloseProject")->trigger();
+    Settle();
+    EXPECT_EQ(asked.size(), 2);
+    EXPECT_EQ(Texts().Documents().size(), 3u);
+    ASSERT_TRUE(frame->Projects().Find(handle));
+    EXPECT_EQ(frame->Projects().Find(handle)->views.size(), 3u);
+    EXPECT_EQ(frame->GetActiveView(), front);
+    for (const char* name : {"a.tst", "b.tst", "c.tst"})
+        EXPECT_THAT(TakeLog(ViewOf(name)), ElementsAre()) << name;
+    EXPECT_TRUE(ViewOf("b.tst")->GetDocument()->IsModified());
+
+    asked.clear();
+    answers << QMessageBox::Discard << QMessageBox::Discard;
+    Action("actionCloseProject")->trigger();
+    Settle();
+    EXPECT_EQ(asked.size(), 2) << "each question once";
+    EXPECT_TRUE(Texts().Documents().empty());
+    EXPECT_TRUE(frame->Projects().All().empty());
+}
+
+TEST_F(ShellTest, AFileOfTwoProjectsBelongsToOneAndTheUserIsTold)
+{
+    for (const char* name : {"both.tst", "a.tst", "b.tst"})
+        Write(name);
+    const auto* tree = frame->findChild<CProjectTree*>()->findChild<QTreeWidget*>();
+    const auto shown = [&](int project, int file) { return tree->topLevelItem(project)->child(file)->text(0); };
+    EXPECT_TRUE(frame->OpenFile(WriteProject("one.kvrp", "File = <both.tst>\nFile = <a.tst>\n")));
+    const auto one = ProjectOf("both.tst");
+    EXPECT_TRUE(asked.isEmpty());
+    EXPECT_TRUE(frame->OpenFile(WriteProject("two.kvrp", "File = <BOTH.tst>\nFile = <b.tst>\n")));
+    const auto two = ProjectOf("b.tst");
+    ASSERT_EQ(asked.size(), 1);
+    EXPECT_TRUE(asked[0].contains("BOTH.tst: open in the project one")) << qPrintable(asked[0]);
+    EXPECT_FALSE(asked[0].contains("b.tst: "));
+    EXPECT_EQ(ProjectOf("both.tst"), one);
+    EXPECT_EQ(shown(0, 0), "both.tst");
+    EXPECT_EQ(shown(1, 0), "BOTH.tst (in the project one)");
+
+    // Where it is opened from, there it belongs.
+    for (const auto& [from, project] : {std::pair(1, two), std::pair(0, one)}) {
+        CKsMDIChildWnd::Of(ViewOf("both.tst"))->close();
+        Settle();
+        QCoreApplication::processEvents();
+        EXPECT_EQ(shown(1 - from, 0).length(), 8) << "in neither";
+        emit frame->findChild<CProjectTree*>()->MemberChosen(project, Path("both.tst"));
+        QCoreApplication::processEvents();
+        ASSERT_TRUE(ViewOf("both.tst"));
+        EXPECT_EQ(ProjectOf("both.tst"), project);
+        EXPECT_TRUE(shown(1 - from, 0).endsWith(from == 0 ? "(in the project one)" : "(in the project two)"));
+    }
+    EXPECT_TRUE(frame->CloseProject(one));
+    Settle();
+    EXPECT_TRUE(ViewOf("b.tst"));
+    EXPECT_FALSE(ViewOf("both.tst"));
 }

@@ -22,6 +22,12 @@ TEST_F(ShellTest, RecentFilesAreTheNewestThatExist)
     EXPECT_FALSE(recent.Files().contains(Path("0.tst")));
 }
 
+TEST_F(ShellTest, AFileThatAnEditorOpensForAnotherIsRemembered)
+{
+    Texts().OpenDocumentFile(frame.get(), Write("a.tst"));
+    EXPECT_EQ(frame->RecentFiles().Files(), QStringList(Path("a.tst")));
+}
+
 TEST_F(ShellTest, TheMenuOpensARecentFile)
 {
     frame->OpenFile(Write("a.tst"));

@@ -56,6 +56,9 @@ TEST(LookUp, HandlesOfAnotherKindAreNotFound)
         EXPECT_EQ(tqlGetNoParams(handle), handle == x ? 2 : 0);
         EXPECT_EQ(tqlParamByNum(handle, 1) != nullptr, handle == x);
         EXPECT_EQ(tqlGetRawParams(handle), handle == x ? "1, \"s\"" : "");
+        const bool first = handle && handle == tqlParamByNum(x, 1), second = handle && handle == tqlParamByNum(x, 2);
+        EXPECT_EQ(tqlGetRawParamsFrom(handle), first ? "1, \"s\"" : second ? "\"s\"" : "");
+        EXPECT_EQ(tqlGetRawParam(handle), first ? "1" : second ? "\"s\"" : "");
         EXPECT_EQ(tqlName(handle), handle == a ? "A" : handle == x ? "x" : "");
         EXPECT_EQ(tqlGetInt(handle, &integer), handle == tqlParamByNum(x, 1) && handle);
         EXPECT_FALSE(tqlGetSyntaxErr(handle, &error));

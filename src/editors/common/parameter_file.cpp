@@ -1,5 +1,7 @@
 #include "editors/common/parameter_file.h"
 
+#include "ks/fc/system_reason.h"
+
 #include <QCoreApplication>
 #include <QFileInfo>
 #include <QSaveFile>
@@ -40,7 +42,7 @@ CString WriteParameterFile(const CString& path, tqlHandle built)
     if (file.open(QIODevice::WriteOnly) && file.write(text.data(), size) == size && file.flush() &&
         file.size() == size && file.commit())
         return {};
-    const CString reason = file.errorString();
+    const CString reason = KsSystemReason(file);
     file.cancelWriting();
     return reason;
 }

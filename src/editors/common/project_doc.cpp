@@ -15,10 +15,7 @@ LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CKSComm_Packag
 
 } // namespace
 
-CProjectDoc::CProjectDoc(int kind) : m_kind(kind)
-{
-    connect(&UndoStack(), &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
-}
+CProjectDoc::CProjectDoc(int kind) : m_kind(kind) {}
 
 BOOL CProjectDoc::OnOpenDocument(const CString& path)
 {

@@ -15,6 +15,19 @@ struct CrossSectionTexts
 
 KsResourceHandle g_texts = nullptr;
 
+/// In the user's language of the moment.
+CString TemplateStrings()
+{
+    const QStringList strings{QStringLiteral("Kvr_Help.chm"),
+                              CrossSectionTexts::tr("Sections"),
+                              CrossSectionTexts::tr("KVR Cross Sections"),
+                              CrossSectionTexts::tr("KVR Cross Sections (*.kvxs)"),
+                              QStringLiteral(".kvxs"),
+                              QStringLiteral("CrossSections.Document"),
+                              QStringLiteral("CrossSections Document")};
+    return strings.join(u'\n');
+}
+
 } // namespace
 
 static void InitResources()
@@ -36,14 +49,7 @@ void CrossSectionModule::FreeResources()
 
 CMultiDocTemplate* CrossSectionModule::CreateTemplate()
 {
-    const QStringList strings{QStringLiteral("Kvr_Help.chm"),
-                              CrossSectionTexts::tr("Sections"),
-                              CrossSectionTexts::tr("KVR Cross Sections"),
-                              CrossSectionTexts::tr("KVR Cross Sections (*.kvxs)"),
-                              QStringLiteral(".kvxs"),
-                              QStringLiteral("CrossSections.Document"),
-                              QStringLiteral("CrossSections Document")};
-    return new CMultiDocTemplate(DocumentResource, strings.join(u'\n'),
+    return new CMultiDocTemplate(DocumentResource, &TemplateStrings,
                                  {[]() -> CKsDoc* { return new CCrossSectionDoc; }, [] { return new CKsMDIChildWnd; },
                                   []() -> CView* { return new CCrossSectionView; }});
 }

@@ -1,7 +1,11 @@
 #include "editors/cross_sections/section.h"
 
+#include "ks/fc/branch_name.h"
+
+#include <QSet>
 #include <algorithm>
 #include <cmath>
+#include <map>
 #include <numeric>
 
 double PlaceOf(double chainage)
@@ -12,7 +16,7 @@ double PlaceOf(double chainage)
 
 std::tuple<QString, QString, double> CCrossSection::Key() const
 {
-    return {branch, topoId, PlaceOf(chainage)};
+    return {KsBranchKey(branch), topoId, PlaceOf(chainage)};
 }
 
 bool CCrossSections::IsTaken(const CCrossSection& section, int except) const
@@ -30,7 +34,7 @@ int CCrossSections::Nearest(const QString& branch, double chainage) const
     double least = HUGE_VAL;
     for (std::size_t i = 0; i < sections.size(); ++i) {
         const double distance = std::abs(sections[i].chainage - chainage);
-        if (distance < least && sections[i].branch.compare(branch, Qt::CaseInsensitive) == 0) {
+        if (distance < least && KsSameBranch(sections[i].branch, branch)) {
             least = distance;
             nearest = static_cast<int>(i);
         }
@@ -41,18 +45,24 @@ int CCrossSections::Nearest(const QString& branch, double chainage) const
 QStringList CCrossSections::Branches() const
 {
     QStringList branches;
-    for (const CCrossSection& section : sections)
-        branches << section.branch;
-    branches.removeDuplicates();
+    QSet<QString> known;
+    for (const CCrossSection& section : sections) {
+        if (const QString key = KsBranchKey(section.branch); !known.contains(key)) {
+            known << key;
+            branches << section.branch;
+        }
+    }
     return branches;
 }
 
 std::vector<int> CCrossSections::ByPlace() const
 {
-    const QStringList branches = Branches();
-    std::vector<std::pair<qsizetype, double>> places;
-    for (const CCrossSection& section : sections)
-        places.emplace_back(branches.indexOf(section.branch), section.chainage);
+    std::map<QString, std::size_t> branches; // by key: the place in Branches()
+    std::vector<std::pair<std::size_t, double>> places;
+    for (const CCrossSection& section : sections) {
+        const std::size_t next = branches.size();
+        places.emplace_back(branches.emplace(KsBranchKey(section.branch), next).first->second, section.chainage);
+    }
     std::vector<int> order(sections.size());
     std::iota(order.begin(), order.end(), 0);
     std::stable_sort(order.begin(), order.end(),

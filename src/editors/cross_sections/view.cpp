@@ -1,13 +1,10 @@
 #include "editors/cross_sections/view.h"
 
-#include "ks/fc/message_box.h"
-
 #include <QAction>
 #include <QApplication>
 #include <QHeaderView>
 #include <QLabel>
 #include <QSplitter>
-#include <QTableView>
 #include <QVBoxLayout>
 
 CCrossSectionView::CCrossSectionView(QWidget* parent) : CProjectView(parent)
@@ -39,7 +36,7 @@ void CCrossSectionView::OnInitialUpdate()
 
     m_showing = true; // the user has not asked for the first one
     if (m_sectionTable->rowCount() > 0)
-        m_sections->setCurrentIndex(m_sectionTable->index(0, 0));
+        m_sections->GoTo(0, CSectionTable::Branch);
     m_showing = false;
     Retranslate();
 }
@@ -70,17 +67,10 @@ void CCrossSectionView::MakeTables(QSplitter* splitter)
     splitter->addWidget(side);
 }
 
-QTableView* CCrossSectionView::MakeTable(CSectionLines* model, const char* name)
+CLinesView* CCrossSectionView::MakeTable(CSectionLines* model, const char* name)
 {
-    auto* table = new QTableView;
-    table->setObjectName(QString::fromLatin1(name));
-    table->setModel(model);
-    table->setAlternatingRowColors(true);
-    table->setSelectionBehavior(QAbstractItemView::SelectRows);
+    auto* table = new CLinesView(model, QString::fromLatin1(name));
     table->setContextMenuPolicy(Qt::CustomContextMenu);
-    table->horizontalHeader()->setHighlightSections(false);
-    table->horizontalHeader()->setStretchLastSection(true);
-    table->verticalHeader()->setDefaultSectionSize(table->fontMetrics().height() + 8);
     for (const auto& [key, run] : {std::pair(QKeySequence(Qt::Key_Delete), &CCrossSectionView::DeleteLines),
                                    std::pair(QKeySequence(Qt::Key_Insert), &CCrossSectionView::InsertLine),
                                    std::pair(QKeySequence(QKeySequence::Copy), &CCrossSectionView::CopyLines),
@@ -93,10 +83,6 @@ QTableView* CCrossSectionView::MakeTable(CSectionLines* model, const char* name)
     }
     connect(table, &QWidget::customContextMenuRequested, this,
             [this, table](const QPoint& at) { ShowContextMenu(table, at); });
-    // The message waits until the cell's editor has closed: it takes the focus.
-    connect(
-        model, &CSectionLines::Refused, this,
-        [this](const QString& message) { KsMessageBox(message, QMessageBox::Ok, this); }, Qt::QueuedConnection);
     return table;
 }
 
@@ -106,7 +92,7 @@ void CCrossSectionView::ConnectTables()
             &CCrossSectionView::CurrentSectionChanged);
     connect(m_points->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
             [this](const QModelIndex& now) { m_plot->SetCurrentPoint(now.row()); });
-    for (const QTableView* table : {m_sections, m_points})
+    for (const CLinesView* table : {m_sections, m_points})
         connect(table->selectionModel(), &QItemSelectionModel::selectionChanged, this,
                 &CCrossSectionView::CommandsChanged);
     connect(Document(), &CCrossSectionDoc::SectionsChanged, this, &CCrossSectionView::SectionsChanged);
@@ -114,7 +100,7 @@ void CCrossSectionView::ConnectTables()
     connect(m_plot, &CSectionPlot::SectionStep, this, &CCrossSectionView::StepSection);
     connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CCrossSectionView::UnitsChanged);
     connect(qApp, &QApplication::focusChanged, this, [this](QWidget*, QWidget* now) {
-        for (QTableView* table : {m_sections, m_points}) {
+        for (CLinesView* table : {m_sections, m_points}) {
             if (now && (table == now || table->isAncestorOf(now)))
                 m_lines = table;
         }
@@ -139,11 +125,9 @@ bool CCrossSectionView::HasFocusWithin() const
     return focus && isAncestorOf(focus);
 }
 
-void CCrossSectionView::GoToRow(QTableView* table, int row) const
+void CCrossSectionView::GoToRow(CLinesView* table, int row)
 {
-    const QModelIndex at = table->model()->index(row, std::max(table->currentIndex().column(), 0));
-    table->setCurrentIndex(at);
-    table->scrollTo(at);
+    table->GoTo(row, std::max(table->currentIndex().column(), 0));
 }
 
 /// The tables follow the document. The view that the user works in goes to what changed, so that undo shows its work.
@@ -163,7 +147,7 @@ void CCrossSectionView::SectionsChanged(int index)
 
 void CCrossSectionView::CurrentSectionChanged()
 {
-    m_points->setCurrentIndex({});
+    m_points->GoTo(-1, -1);
     ShowSection();
     TellLocation();
 }
@@ -181,6 +165,7 @@ void CCrossSectionView::UnitsChanged()
 {
     m_sectionTable->Reload();
     ShowSection();
+    m_sections->FitColumns();
 }
 
 void CCrossSectionView::Retranslate()
@@ -189,7 +174,6 @@ void CCrossSectionView::Retranslate()
     m_sections->setAccessibleName(tr("Cross sections by branch and chainage"));
     m_points->setAccessibleName(tr("Points of the current cross section"));
     UnitsChanged();
-    m_sections->resizeColumnsToContents();
 }
 
 void CCrossSectionView::changeEvent(QEvent* event)
@@ -202,7 +186,11 @@ void CCrossSectionView::changeEvent(QEvent* event)
 /// Hint 1 of the shell: what is being typed moves into the document.
 void CCrossSectionView::OnUpdate(CView*, int hint, CHint*)
 {
-    const QWidget* focus = QApplication::focusWidget();
-    if (hint == CKsDoc::StoreHint && m_lines && m_lines != focus && m_lines->isAncestorOf(focus))
-        m_lines->setFocus(); // the cell's editor commits as it loses the focus
+    if (hint == CKsDoc::StoreHint)
+        MayLeave(KsLeave::Field);
+}
+
+bool CCrossSectionView::MayLeave(KsLeave)
+{
+    return !m_plot || (m_sections->Store() && m_points->Store());
 }

@@ -1,13 +1,13 @@
 // The view of a cross-section document: the plot, the tables beside it, and what other editors ask.
 #pragma once
 
+#include "editors/common/lines_view.h"
 #include "editors/common/project_view.h"
 #include "editors/cross_sections/section_plot.h"
 #include "editors/cross_sections/table_models.h"
 
 class QLabel;
 class QSplitter;
-class QTableView;
 
 /// Commands of the "Lines" menu, the context menu and the tool bar.
 namespace CrossSectionCommand {
@@ -23,13 +23,14 @@ public:
 
     CCrossSectionDoc* Document() const { return static_cast<CCrossSectionDoc*>(GetDocument()); }
     CSectionPlot* Plot() const { return m_plot; }
-    QTableView* Sections() const { return m_sections; }
-    QTableView* Points() const { return m_points; }
+    CLinesView* Sections() const { return m_sections; }
+    CLinesView* Points() const { return m_points; }
     /// Index of the section that is shown; -1 for none.
     int CurrentSection() const;
 
     void OnInitialUpdate() override;
     void OnUpdate(CView* sender, int hint, CHint* object) override;
+    bool MayLeave(KsLeave what) override;
     bool OnCommand(int id) override;
     bool IsCommandEnabled(int id) const override;
     std::vector<CKsMenuCommand> LinesMenu() const override;
@@ -41,7 +42,7 @@ protected:
 
 private:
     void MakeTables(QSplitter* splitter);
-    QTableView* MakeTable(CSectionLines* model, const char* name);
+    CLinesView* MakeTable(CSectionLines* model, const char* name);
     void ConnectTables();
     void CommandsChanged();
     void Retranslate();
@@ -50,13 +51,13 @@ private:
     void CurrentSectionChanged();
     void ShowSection();
     void TellLocation();
-    void ShowContextMenu(QTableView* table, const QPoint& at);
+    void ShowContextMenu(CLinesView* table, const QPoint& at);
     void InsertLine();
     void DeleteLines();
     void CopyLines();
     void PasteLines();
     std::vector<int> SelectedRows() const;
-    void GoToRow(QTableView* table, int row) const;
+    static void GoToRow(CLinesView* table, int row);
     void StepSection(int step);
     bool HasFocusWithin() const;
     QString NewBranch();
@@ -70,8 +71,8 @@ private:
     CSectionPlot* m_plot = nullptr;
     CSectionTable* m_sectionTable = nullptr;
     CPointTable* m_pointTable = nullptr;
-    QTableView *m_sections = nullptr, *m_points = nullptr;
-    QTableView* m_lines = nullptr; // the one of them that had the focus last: commands are about its lines
+    CLinesView *m_sections = nullptr, *m_points = nullptr;
+    CLinesView* m_lines = nullptr; // the one of them that had the focus last: commands are about its lines
     QLabel *m_sectionTitle = nullptr, *m_pointTitle = nullptr;
     QString m_toldBranch; // the place that the project was told of last, or was shown
     double m_toldChainage = KsUnset;

@@ -4,7 +4,6 @@
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QMenu>
-#include <QTableView>
 #include <algorithm>
 
 std::vector<CKsMenuCommand> CCrossSectionView::LinesMenu() const
@@ -49,6 +48,8 @@ bool CCrossSectionView::OnCommand(int id)
 {
     if (!IsCommandEnabled(id))
         return false;
+    if (id != KsCommand::Copy && !MayLeave(KsLeave::Field))
+        return true; // the user has been told
     switch (id) {
     case CrossSectionCommand::InsertLine:
         InsertLine();
@@ -68,7 +69,7 @@ bool CCrossSectionView::OnCommand(int id)
     return true;
 }
 
-void CCrossSectionView::ShowContextMenu(QTableView* table, const QPoint& at)
+void CCrossSectionView::ShowContextMenu(CLinesView* table, const QPoint& at)
 {
     m_lines = table;
     QMenu menu(this);
@@ -96,7 +97,7 @@ void CCrossSectionView::InsertLine()
 {
     if (!IsCommandEnabled(CrossSectionCommand::InsertLine))
         return;
-    QTableView* table = m_lines;
+    CLinesView* table = m_lines;
     const int row = table->currentIndex().row();
     const int line = table == m_sections ? m_sectionTable->InsertLine(row, NewBranch()) : m_pointTable->InsertLine(row);
     GoToRow(table, line);

@@ -1,8 +1,10 @@
 // The cross sections' view among other editors: what it answers them, and the place it shows them.
 #include "editors/cross_sections/view.h"
 
+#include "editors/common/branch_names.h"
+#include "ks/fc/branch_name.h"
+
 #include <QScopedValueRollback>
-#include <QTableView>
 #include <cmath>
 #include <map>
 
@@ -43,19 +45,18 @@ LRESULT CCrossSectionView::LoadLocations(CObList& objects) const
     return !all.sections.empty();
 }
 
-/// Radius and width where the list lacks them and a section at the place has them. The case of names does not matter:
-/// the HD parameters keep them in capitals.
+/// Radius and width where the list lacks them and a section at the place has them.
 LRESULT CCrossSectionView::FillChannel(const CObList& objects) const
 {
     std::multimap<std::pair<QString, double>, const CCrossSection*> places;
     for (const CCrossSection& section : Document()->Sections().sections)
-        places.emplace(std::pair(section.branch.toCaseFolded(), PlaceOf(section.chainage)), &section);
+        places.emplace(std::pair(KsBranchKey(section.branch), PlaceOf(section.chainage)), &section);
     bool filled = false;
     for (const auto& object : objects) {
         auto* item = dynamic_cast<CKvrCBELocation*>(object.get());
         if (!item)
             continue;
-        const auto [first, last] = places.equal_range({item->branch.toCaseFolded(), PlaceOf(item->chainage)});
+        const auto [first, last] = places.equal_range({KsBranchKey(item->branch), PlaceOf(item->chainage)});
         for (auto place = first; place != last; ++place) {
             for (const auto& [to, from] : {std::pair(&CKvrCBELocation::radius, &CCrossSection::radius),
                                            std::pair(&CKvrCBELocation::width, &CCrossSection::width)}) {
@@ -71,19 +72,8 @@ LRESULT CCrossSectionView::FillChannel(const CObList& objects) const
 
 LRESULT CCrossSectionView::BranchNames(CObList& objects) const
 {
-    QStringList known;
-    for (const auto& object : objects) {
-        if (const auto* item = dynamic_cast<const CKvrCBEText*>(object.get()))
-            known << item->text;
-    }
     const QStringList branches = Document()->Sections().Branches();
-    for (const QString& branch : branches) {
-        if (known.contains(branch))
-            continue;
-        auto item = std::make_unique<CKvrCBEText>();
-        item->text = branch;
-        objects.push_back(std::move(item));
-    }
+    AppendBranchNames(branches, objects);
     return !branches.isEmpty();
 }
 
@@ -91,11 +81,12 @@ LRESULT CCrossSectionView::BranchNames(CObList& objects) const
 LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
 {
     const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
-    if (!item || m_telling) // an answer to what this view tells would move its user away
+    // An answer to what this view tells would move its user away, and so would any place while a cell is being typed.
+    if (!item || m_telling || m_sections->IsEditing() || m_points->IsEditing())
         return 0;
     const int nearest = Document()->Sections().Nearest(item->branch, item->chainage);
     const CCrossSection *there = Document()->Section(nearest), *here = Document()->Section(CurrentSection());
-    if (!there || (here && here->branch == there->branch &&
+    if (!there || (here && KsSameBranch(here->branch, there->branch) &&
                    std::abs(here->chainage - item->chainage) <= std::abs(there->chainage - item->chainage)))
         return 0;
     const QScopedValueRollback showing(m_showing, true);

@@ -14,8 +14,8 @@ public:
     void redo() final;
 
 protected:
-    virtual void Apply(std::vector<CNetworkBranch>& branches) = 0;
-    virtual void Revert(std::vector<CNetworkBranch>& branches) = 0;
+    virtual void Apply(CNetwork& network) = 0;
+    virtual void Revert(CNetwork& network) = 0;
 
 private:
     CNetworkDoc& m_document;
@@ -27,8 +27,8 @@ public:
     CReplaceBranch(CNetworkDoc& document, int index, CNetworkBranch branch, const QString& text);
 
 protected:
-    void Apply(std::vector<CNetworkBranch>& branches) override;
-    void Revert(std::vector<CNetworkBranch>& branches) override { Apply(branches); }
+    void Apply(CNetwork& network) override;
+    void Revert(CNetwork& network) override { Apply(network); }
 
 private:
     std::size_t m_index;
@@ -38,15 +38,18 @@ private:
 class CAppendBranches : public CNetworkCommand
 {
 public:
-    CAppendBranches(CNetworkDoc& document, std::vector<CNetworkBranch> branches, const QString& text);
+    /// `system`: the coordinate system that the network names from then on.
+    CAppendBranches(CNetworkDoc& document, std::vector<CNetworkBranch> branches, const QString& system,
+                    const QString& text);
 
 protected:
-    void Apply(std::vector<CNetworkBranch>& branches) override;
-    void Revert(std::vector<CNetworkBranch>& branches) override;
+    void Apply(CNetwork& network) override;
+    void Revert(CNetwork& network) override;
 
 private:
     std::vector<CNetworkBranch> m_added; // empty while they are in the document
     std::size_t m_count;
+    QString m_system; // the one that is not in the document
 };
 
 class CRemoveBranches : public CNetworkCommand
@@ -55,8 +58,8 @@ public:
     CRemoveBranches(CNetworkDoc& document, std::vector<int> indexes, const QString& text);
 
 protected:
-    void Apply(std::vector<CNetworkBranch>& branches) override;
-    void Revert(std::vector<CNetworkBranch>& branches) override;
+    void Apply(CNetwork& network) override;
+    void Revert(CNetwork& network) override;
 
 private:
     std::vector<int> m_indexes;            // increasing

@@ -52,8 +52,13 @@ void CNetworkDoc::ReplaceBranch(int index, CNetworkBranch branch, const QString&
 
 void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QString& text)
 {
+    AppendBranches(std::move(branches), m_network.system, text);
+}
+
+void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QString& system, const QString& text)
+{
     if (!branches.empty())
-        UndoStack().push(new CAppendBranches(*this, std::move(branches), text));
+        UndoStack().push(new CAppendBranches(*this, std::move(branches), system, text));
 }
 
 void CNetworkDoc::RemoveBranches(std::vector<int> indexes, const QString& text)

@@ -23,6 +23,8 @@ public:
     /// `text` names the change in the Edit menu.
     void ReplaceBranch(int index, CNetworkBranch branch, const QString& text);
     void AppendBranches(std::vector<CNetworkBranch> branches, const QString& text);
+    /// And the network names a coordinate system from then on.
+    void AppendBranches(std::vector<CNetworkBranch> branches, const QString& system, const QString& text);
     /// `indexes` in any order.
     void RemoveBranches(std::vector<int> indexes, const QString& text);
     /// Why a branch may not stand at `index` (-1 for a new one); empty when it may.

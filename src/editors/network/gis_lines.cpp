@@ -1,12 +1,15 @@
-// The one source that uses GDAL/OGR.
+// Reads the lines of GIS files with GDAL/OGR.
 #include "editors/network/gis_lines.h"
+
+#include "editors/network/gis_errors.h"
+#include "editors/network/gis_systems.h"
 
 #include <QCoreApplication>
 #include <QFileInfo>
+#include <algorithm>
 #include <cmath>
 #include <memory>
 
-#include <cpl_conv.h>
 #include <ogr_spatialref.h>
 #include <ogrsf_frmts.h>
 
@@ -17,53 +20,35 @@ struct GisLines
     Q_DECLARE_TR_FUNCTIONS(GisLines)
 };
 
-/// Keeps the library's messages to itself; the last one is asked for when something failed.
-struct QuietErrors
+QString GeometryName(OGRwkbGeometryType type)
 {
-    QuietErrors() { CPLPushErrorHandler(CPLQuietErrorHandler); }
-    ~QuietErrors() { CPLPopErrorHandler(); }
-};
-
-QString LastReason()
-{
-    const QString reason = QString::fromUtf8(CPLGetLastErrorMsg()).simplified();
-    return reason.isEmpty() ? GisLines::tr("the format is not known.") : reason;
+    return QString::fromUtf8(OGRGeometryTypeToName(wkbFlatten(type)));
 }
 
-/// Metres a unit of the layer's coordinates.
-double MetresPerUnit(const OGRSpatialReference* reference)
+CGisLine LineOf(const OGRLineString& geometry, bool swapped)
 {
-    return reference && reference->IsProjected() ? reference->GetLinearUnits() : 1.0;
-}
-
-void AddLine(const OGRLineString& geometry, double toMetres, const QStringList& values, CGisLayer& layer)
-{
-    CGisLine line{{}, values};
+    CGisLine line;
+    line.reserve(static_cast<std::size_t>(geometry.getNumPoints()));
     for (int i = 0; i < geometry.getNumPoints(); ++i) {
-        const QPointF at(geometry.getX(i) * toMetres, geometry.getY(i) * toMetres);
-        if (std::isfinite(at.x()) && std::isfinite(at.y()) && (line.points.empty() || line.points.back() != at))
-            line.points.push_back(at);
+        const QPointF at(geometry.getX(i), geometry.getY(i));
+        line.push_back(swapped ? at.transposed() : at);
     }
-    if (line.points.size() > 1)
-        layer.lines.push_back(std::move(line));
+    return line;
 }
 
-/// False when the geometry holds no line.
-bool AddGeometry(const OGRGeometry* geometry, double toMetres, const QStringList& values, CGisLayer& layer)
+/// Curves as short segments.
+std::vector<CGisLine> PartsOf(const OGRGeometry& geometry, bool swapped)
 {
-    if (!geometry)
-        return false;
-    const std::unique_ptr<OGRGeometry> straight(geometry->getLinearGeometry()); // curves as short segments
+    std::vector<CGisLine> parts;
+    const std::unique_ptr<OGRGeometry> straight(geometry.getLinearGeometry());
     const OGRwkbGeometryType type = straight ? wkbFlatten(straight->getGeometryType()) : wkbUnknown;
-    if (type == wkbLineString) {
-        AddLine(*straight->toLineString(), toMetres, values, layer);
-        return true;
+    if (type == wkbLineString)
+        parts.push_back(LineOf(*straight->toLineString(), swapped));
+    if (type == wkbMultiLineString) {
+        for (const OGRLineString* part : *straight->toMultiLineString())
+            parts.push_back(LineOf(*part, swapped));
     }
-    if (type != wkbMultiLineString)
-        return false;
-    for (const OGRLineString* part : *straight->toMultiLineString())
-        AddLine(*part, toMetres, values, layer);
-    return true;
+    return parts;
 }
 
 QStringList FieldValues(OGRFeature& feature)
@@ -74,70 +59,92 @@ QStringList FieldValues(OGRFeature& feature)
     return values;
 }
 
-CGisLayer ReadLayer(OGRLayer& source)
+/// Whether the layer's coordinates stand north first.
+bool IsSwapped(const OGRSpatialReference* reference)
+{
+    if (!reference)
+        return false;
+    OGRSpatialReference usual(*reference);
+    usual.SetAxisMappingStrategy(OAMS_TRADITIONAL_GIS_ORDER);
+    return usual.GetDataAxisToSRSAxisMapping() != reference->GetDataAxisToSRSAxisMapping();
+}
+
+/// Some formats take a file that names no coordinate system for one in degrees; its numbers may tell otherwise.
+bool AreBeyondDegrees(const CGisLayer& layer)
+{
+    const auto isBeyond = [](const QPointF& at) { return std::abs(at.x()) > 360 || std::abs(at.y()) > 90; };
+    return std::any_of(layer.features.begin(), layer.features.end(), [&](const CGisFeature& feature) {
+        return std::any_of(feature.parts.begin(), feature.parts.end(),
+                           [&](const CGisLine& line) { return std::any_of(line.begin(), line.end(), isBeyond); });
+    });
+}
+
+CGisFeature ReadFeature(OGRFeature& source, bool swapped, CGisErrors& errors)
+{
+    CGisFeature feature{source.GetFID(), FieldValues(source), {}, {}, {}};
+    if (const OGRGeometry* geometry = source.GetGeometryRef()) {
+        feature.geometry = GeometryName(geometry->getGeometryType());
+        feature.parts = PartsOf(*geometry, swapped);
+    }
+    feature.error = errors.Take().join(u' ');
+    return feature;
+}
+
+CGisLayer ReadLayer(OGRLayer& source, CGisErrors& errors)
 {
     CGisLayer layer;
     layer.name = QString::fromUtf8(source.GetName());
+    layer.geometry = GeometryName(source.GetGeomType());
+    layer.system = DescribeSystem(source.GetSpatialRef());
     const OGRFeatureDefn* definition = source.GetLayerDefn();
     for (int i = 0; i < definition->GetFieldCount(); ++i)
         layer.fields << QString::fromUtf8(definition->GetFieldDefn(i)->GetNameRef());
-    const double toMetres = MetresPerUnit(source.GetSpatialRef());
-    for (const auto& feature : source) {
-        if (!AddGeometry(feature->GetGeometryRef(), toMetres, FieldValues(*feature), layer))
-            ++layer.others;
-    }
+    layer.announced = source.GetFeatureCount();
+    const bool swapped = IsSwapped(source.GetSpatialRef());
+    errors.Take();
+    for (const auto& feature : source)
+        layer.features.push_back(ReadFeature(*feature, swapped, errors));
+    layer.errors = errors.Take(); // of a feature that did not come any more
+    if (layer.system.degrees && AreBeyondDegrees(layer))
+        layer.system = {};
     return layer;
 }
 
-/// A file that names no coordinate system is taken for degrees by some formats, so its numbers decide.
-bool IsGeographic(const OGRLayer& source, const CGisLayer& layer)
+class CGdalLibrary : public CGisLibrary
 {
-    const OGRSpatialReference* reference = const_cast<OGRLayer&>(source).GetSpatialRef();
-    if (!reference || !reference->IsGeographic())
-        return false;
-    for (const CGisLine& line : layer.lines) {
-        for (const QPointF& at : line.points) {
-            if (std::abs(at.x()) > 360 || std::abs(at.y()) > 90)
-                return false;
+public:
+    CGisFile Read(const QString& path) const override
+    {
+        GDALAllRegister();
+        CGisErrors errors;
+        CGisFile file;
+        const std::unique_ptr<GDALDataset> data(
+            GDALDataset::Open(path.toUtf8().constData(), GDAL_OF_VECTOR | GDAL_OF_READONLY));
+        if (!data) {
+            const QString reason = errors.Take().join(u' ');
+            file.error = GisLines::tr("%1 could not be read as a GIS file: %2")
+                             .arg(QFileInfo(path).fileName(),
+                                  reason.isEmpty() ? GisLines::tr("the format is not known.") : reason);
+            return file;
         }
+        for (OGRLayer* source : data->GetLayers())
+            file.layers.push_back(ReadLayer(*source, errors));
+        if (file.layers.empty())
+            file.error = GisLines::tr("%1 has no layers.").arg(QFileInfo(path).fileName());
+        return file;
     }
-    return true;
-}
-
-void ReadFile(const QString& path, CGisFile& file)
-{
-    const QString name = QFileInfo(path).fileName();
-    GDALAllRegister();
-    const QuietErrors quiet;
-    CPLErrorReset();
-    const std::unique_ptr<GDALDataset> data(
-        GDALDataset::Open(path.toUtf8().constData(), GDAL_OF_VECTOR | GDAL_OF_READONLY));
-    if (!data) {
-        file.error = GisLines::tr("%1 could not be read as a GIS file: %2").arg(name, LastReason());
-        return;
+    CGisSystem FindSystem(const QString& definition) const override { return FindGisSystem(definition); }
+    CGisSystem UtmZone(const CGisLayer& layer) const override { return FindUtmZone(layer); }
+    CGisMap MapOf(const CGisLayer& layer, const CGisSystem& target) const override
+    {
+        return ProjectLayer(layer, target);
     }
-    int others = 0;
-    for (OGRLayer* source : data->GetLayers()) {
-        CGisLayer layer = ReadLayer(*source);
-        others += layer.others;
-        if (layer.lines.empty())
-            continue;
-        if (IsGeographic(*source, layer)) {
-            file.layers.clear();
-            file.error = GisLines::tr("%1: the layer \"%2\" is in degrees of longitude and latitude. Distances along "
-                                      "a branch need map coordinates in meters: project the file first.")
-                             .arg(name, layer.name);
-            return;
-        }
-        file.layers.push_back(std::move(layer));
-    }
-    if (file.layers.empty())
-        file.error = GisLines::tr("%1 holds no lines (%2 features of other kinds).").arg(name).arg(others);
-}
+};
 
 } // namespace
 
-extern "C" Q_DECL_EXPORT void KvrReadGisLines(const QString& path, CGisFile& file)
+extern "C" Q_DECL_EXPORT const CGisLibrary* KvrGisLibrary()
 {
-    ReadFile(path, file);
+    static const CGdalLibrary library;
+    return &library;
 }

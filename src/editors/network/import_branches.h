@@ -1,4 +1,4 @@
-// Branches made of the lines of a GIS file.
+// Branches made of the lines of a GIS file, and what became of each line.
 #pragma once
 
 #include "editors/network/gis_lines.h"
@@ -8,16 +8,46 @@
 struct CImportFields
 {
     int name = -1;
-    int start = -1, end = -1; // chainages in metres; without them from 0 to the length of the line
+    int start = -1, end = -1; // chainages in metres; without them from 0, and on by the length of the line
+};
+
+/// What becomes of a line whose parts do not meet.
+enum class CImportParts
+{
+    Branches,       // a branch each, from 0 to its length
+    ShareChainages, // a branch each, with its share of the line's chainages in proportion to the lengths
+    LeaveOut
+};
+
+struct CImportOptions
+{
+    CImportFields fields{};
+    CImportParts parts = CImportParts::Branches;
+    bool unnamed = true; // lines without a name are taken, and numbered
+};
+
+/// What happened to one line of the file, for the user.
+struct CImportNote
+{
+    QString line; // its name and its number in the file
+    QString what;
+};
+
+struct CImportPlan
+{
+    std::vector<CNetworkBranch> branches;
+    std::vector<CImportNote> leftOut, changed;
 };
 
 /// Whether this build can import.
 bool CanImport();
-/// Reads a file with the library for it; a missing library is an error like any other.
-CGisFile ReadGisFile(const QString& path);
+/// The library that reads GIS files; null, with the reason, when it could not be loaded.
+const CGisLibrary* GisLibrary(QString& reason);
+/// What a geometry is, in the words of the user.
+QString GeometryText(const QString& geometry);
 /// Fields that look as if they had a branch's name and chainages.
 CImportFields ProposeFields(const CGisLayer& layer);
-/// A branch a line. Names that are missing or taken, in `network` or before in the layer, get a number; chainages that
-/// are no two different numbers count as missing. `notes` says so, a line each.
-std::vector<CNetworkBranch> MakeBranches(const CGisLayer& layer, const CImportFields& fields, const CNetwork& network,
-                                         QStringList& notes);
+/// The branches that the lines of `layer` become, where `map` has them. Names that are missing or taken, in `network`
+/// or before in the layer, get a number. Whatever is not as in the file is noted.
+CImportPlan PlanImport(const CGisLayer& layer, const CGisMap& map, const CImportOptions& options,
+                       const CNetwork& network);

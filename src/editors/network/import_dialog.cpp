@@ -1,57 +1,196 @@
 #include "editors/network/import_dialog.h"
 
+#include <QCheckBox>
+#include <QClipboard>
 #include <QComboBox>
 #include <QDialogButtonBox>
 #include <QFormLayout>
+#include <QGuiApplication>
+#include <QHBoxLayout>
+#include <QHeaderView>
 #include <QLabel>
+#include <QLineEdit>
+#include <QPlainTextEdit>
 #include <QPushButton>
+#include <QScopedValueRollback>
+#include <QTableWidget>
+#include <cmath>
 
-CImportDialog::CImportDialog(const QString& name, const CGisFile& file, QWidget* parent)
+namespace {
+
+enum LayerColumn
+{
+    LayerName,
+    LayerGeometry,
+    LayerLines,
+    LayerSystem,
+    LayerRemark,
+    LayerColumns
+};
+
+template <typename Box>
+Box* Named(Box* widget, const char* name)
+{
+    widget->setObjectName(QString::fromLatin1(name));
+    return widget;
+}
+
+QString LayerRemarkText(const CGisLayer& layer)
+{
+    if (layer.Lines() == 0)
+        return CImportDialog::tr("cannot be taken: no lines among %1 features").arg(layer.features.size());
+    return layer.IsComplete() ? QString() : CImportDialog::tr("incomplete or damaged");
+}
+
+} // namespace
+
+CImportDialog::CImportDialog(const QString& name, const CGisFile& file, const CGisLibrary& library,
+                             const CNetwork& network, QWidget* parent)
     : QDialog(parent),
       m_file(file),
-      m_layer(new QComboBox),
-      m_name(new QComboBox),
-      m_start(new QComboBox),
-      m_end(new QComboBox),
-      m_summary(new QLabel)
+      m_library(library),
+      m_network(network),
+      m_own(library.FindSystem(network.system)),
+      m_layers(Named(new QTableWidget, "layers")),
+      m_name(Named(new QComboBox, "nameField")),
+      m_start(Named(new QComboBox, "startField")),
+      m_end(Named(new QComboBox, "endField")),
+      m_parts(Named(new QComboBox, "parts")),
+      m_target(Named(new QComboBox, "target")),
+      m_code(Named(new QLineEdit, "code")),
+      m_unnamed(Named(new QCheckBox(tr("Take lines &without a name, too")), "unnamed")),
+      m_damaged(Named(new QCheckBox(tr("&Take what could be read of the damaged file")), "damaged")),
+      m_declare(Named(new QCheckBox(tr("The branches of the network are in this coordinate s&ystem, too")), "declare")),
+      m_warning(Named(new QLabel, "warning")),
+      m_report(MakeReportField())
 {
     setObjectName(QStringLiteral("importDialog"));
     setWindowTitle(tr("Import Branches from %1").arg(name));
+    m_import.file = name;
     auto* form = new QFormLayout(this);
-    form->addRow(tr("&Layer:"), m_layer);
+    form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
+    MakeLayers(file);
+    MakeFields(form);
+    MakeButtons(form);
+    resize(760, 720);
+    m_layers->selectRow(FirstLayer());
+}
+
+void CImportDialog::MakeLayers(const CGisFile& file)
+{
+    m_layers->setColumnCount(LayerColumns);
+    m_layers->setRowCount(static_cast<int>(file.layers.size()));
+    m_layers->setHorizontalHeaderLabels(
+        {tr("Layer"), tr("Geometry"), tr("Lines"), tr("Coordinate system"), tr("Remark")});
+    m_layers->verticalHeader()->hide();
+    m_layers->horizontalHeader()->setStretchLastSection(true);
+    m_layers->horizontalHeader()->setHighlightSections(false);
+    m_layers->setSelectionBehavior(QAbstractItemView::SelectRows);
+    m_layers->setSelectionMode(QAbstractItemView::SingleSelection);
+    m_layers->setEditTriggers(QAbstractItemView::NoEditTriggers);
+    m_layers->setTabKeyNavigation(false);
+    m_layers->setAccessibleName(tr("Layers of the file"));
+    for (int row = 0; row < m_layers->rowCount(); ++row) {
+        const CGisLayer& layer = file.layers[std::size_t(row)];
+        const QString texts[] = {layer.name, GeometryText(layer.geometry), QString::number(layer.Lines()),
+                                 layer.system.IsKnown() ? layer.system.name : tr("none named"), LayerRemarkText(layer)};
+        for (int column = 0; column < LayerColumns; ++column) {
+            auto* item = new QTableWidgetItem(texts[column]);
+            item->setFlags(layer.Lines() > 0 ? Qt::ItemIsEnabled | Qt::ItemIsSelectable : Qt::NoItemFlags);
+            m_layers->setItem(row, column, item);
+        }
+    }
+    m_layers->resizeColumnsToContents();
+    const int rows = std::min(m_layers->rowCount(), 5);
+    m_layers->setFixedHeight(m_layers->horizontalHeader()->sizeHint().height() + 2 * m_layers->frameWidth() +
+                             rows * m_layers->rowHeight(0) + m_layers->fontMetrics().height());
+    connect(m_layers, &QTableWidget::itemSelectionChanged, this, &CImportDialog::LayerChanged);
+}
+
+void CImportDialog::MakeFields(QFormLayout* form)
+{
+    auto* layers = new QLabel(tr("&Layers:"));
+    layers->setBuddy(m_layers);
+    form->addRow(layers, m_layers);
     form->addRow(tr("Field with the &name:"), m_name);
     form->addRow(tr("Field with the &first chainage [m]:"), m_start);
     form->addRow(tr("Field with the la&st chainage [m]:"), m_end);
-    form->addRow(m_summary);
+    m_parts->addItem(tr("become branches NAME-1, NAME-2, each from 0 to its length"), int(CImportParts::Branches));
+    m_parts->addItem(tr("become branches that share the chainages of the line"), int(CImportParts::ShareChainages));
+    m_parts->addItem(tr("are left out"), int(CImportParts::LeaveOut));
+    form->addRow(tr("Lines whose &parts do not meet:"), m_parts);
+    auto* systems = new QHBoxLayout;
+    systems->addWidget(m_target, 1);
+    systems->addWidget(m_code);
+    m_code->setPlaceholderText(QStringLiteral("EPSG"));
+    m_code->setAccessibleName(tr("EPSG code of the coordinate system"));
+    m_code->setMaximumWidth(9 * fontMetrics().averageCharWidth() + 24);
+    auto* target = new QLabel(tr("&Coordinates in the network:"));
+    target->setBuddy(m_target);
+    form->addRow(target, systems);
+    m_unnamed->setChecked(true);
+    for (QCheckBox* box : {m_unnamed, m_declare, m_damaged})
+        form->addRow(box);
+    for (QComboBox* box : {m_name, m_start, m_end, m_parts})
+        connect(box, &QComboBox::currentIndexChanged, this, &CImportDialog::Plan);
+    connect(m_target, &QComboBox::currentIndexChanged, this, &CImportDialog::TargetChanged);
+    connect(m_code, &QLineEdit::textChanged, this, &CImportDialog::TargetChanged);
+    connect(m_unnamed, &QCheckBox::toggled, this, &CImportDialog::Plan);
+    connect(m_damaged, &QCheckBox::toggled, this, &CImportDialog::ShowPlan);
+}
+
+void CImportDialog::MakeButtons(QFormLayout* form)
+{
+    m_warning->setTextFormat(Qt::PlainText); // names of files, systems and lines
+    m_warning->setWordWrap(true);
+    QFont bold = font();
+    bold.setBold(true);
+    m_warning->setFont(bold);
+    form->addRow(m_warning);
+    auto* report = new QLabel(tr("What the import &gives:"));
+    report->setBuddy(m_report);
+    form->addRow(report);
+    form->addRow(m_report);
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
-    buttons->button(QDialogButtonBox::Ok)->setText(tr("&Import"));
-    form->addRow(buttons);
-    m_layer->setObjectName(QStringLiteral("layer"));
-    m_name->setObjectName(QStringLiteral("nameField"));
-    m_start->setObjectName(QStringLiteral("startField"));
-    m_end->setObjectName(QStringLiteral("endField"));
+    m_ok = buttons->button(QDialogButtonBox::Ok);
+    m_ok->setText(tr("&Import"));
+    QPushButton* copy = buttons->addButton(tr("C&opy"), QDialogButtonBox::ActionRole);
+    connect(copy, &QPushButton::clicked, this,
+            [this] { QGuiApplication::clipboard()->setText(m_report->toPlainText()); });
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
-    for (const CGisLayer& layer : file.layers)
-        m_layer->addItem(layer.name);
-    connect(m_layer, &QComboBox::currentIndexChanged, this, &CImportDialog::LayerChanged);
-    connect(m_name, &QComboBox::currentIndexChanged, this, &CImportDialog::UpdateSummary);
-    LayerChanged();
+    form->addRow(buttons);
 }
 
-int CImportDialog::Layer() const
+/// The first one that has lines; the first of all when none has.
+int CImportDialog::FirstLayer() const
 {
-    return m_layer->currentIndex();
+    for (std::size_t i = 0; i < m_file.layers.size(); ++i) {
+        if (m_file.layers[i].Lines() > 0)
+            return static_cast<int>(i);
+    }
+    return 0;
 }
 
-CImportFields CImportDialog::Fields() const
-{
-    return {m_name->currentData().toInt(), m_start->currentData().toInt(), m_end->currentData().toInt()};
-}
+// ---- choices -----------------------------------------------------------------------------------
 
 void CImportDialog::LayerChanged()
 {
-    const CGisLayer& layer = m_file.layers[std::size_t(Layer())];
+    const auto rows = m_layers->selectionModel()->selectedRows();
+    m_import.layer = rows.isEmpty() ? nullptr : &m_file.layers[std::size_t(rows.front().row())];
+    if (m_import.layer) {
+        const QScopedValueRollback filling(m_filling, true);
+        OfferFields();
+        OfferTargets();
+        m_damaged->setVisible(!m_import.layer->IsComplete());
+        m_damaged->setChecked(false);
+    }
+    TargetChanged();
+}
+
+void CImportDialog::OfferFields()
+{
+    const CGisLayer& layer = *m_import.layer;
     const CImportFields proposed = ProposeFields(layer);
     const auto fill = [&](QComboBox* box, const QString& none, int current) {
         box->clear();
@@ -62,18 +201,121 @@ void CImportDialog::LayerChanged()
     };
     fill(m_name, tr("(none: numbered)"), proposed.name);
     fill(m_start, tr("(none: 0)"), proposed.start);
-    fill(m_end, tr("(none: length of the line)"), proposed.end);
-    UpdateSummary();
+    fill(m_end, tr("(none: by the length of the line)"), proposed.end);
 }
 
-void CImportDialog::UpdateSummary()
+/// Behind those offered, a system may be named by its code.
+void CImportDialog::OfferTargets()
 {
-    const CGisLayer& layer = m_file.layers[std::size_t(Layer())];
-    QString text = tr("Lines: %1").arg(layer.lines.size());
-    const QString first = layer.lines.front().values.value(m_name->currentData().toInt());
-    if (m_name->currentData().toInt() >= 0)
-        text += tr(", the first is named \"%1\"").arg(first);
-    if (layer.others > 0)
-        text += u'\n' + tr("Left out, because they are no lines: %1").arg(layer.others);
-    m_summary->setText(text);
+    const std::vector<Target> targets = Targets();
+    m_target->clear();
+    for (const Target& each : targets)
+        m_target->addItem(each.text, each.system.definition);
+    if (!m_own.IsKnown() && m_import.layer->system.IsKnown())
+        m_target->addItem(tr("another one, by its EPSG code:"), QVariant());
+    m_target->setCurrentIndex(ProposedTarget(targets));
+    m_target->setEnabled(m_target->count() > 1);
+}
+
+/// Branches that are to lie in one network lie in its coordinate system.
+std::vector<CImportDialog::Target> CImportDialog::Targets() const
+{
+    const CGisLayer& layer = *m_import.layer;
+    if (!layer.system.IsKnown())
+        return {
+            {m_own.IsKnown() ? tr("taken as the network's: %1").arg(m_own.name) : tr("as in the file, taken as meters"),
+             {}}};
+    if (m_own.IsKnown())
+        return {{tr("the network's: %1").arg(m_own.name), m_own}};
+    std::vector<Target> targets;
+    if (!layer.system.degrees)
+        targets.push_back({tr("as in the file: %1").arg(layer.system.name), layer.system});
+    const CGisSystem zone = m_library.UtmZone(layer);
+    if (zone.IsKnown() && zone.definition != layer.system.definition)
+        targets.push_back({tr("projected to %1").arg(zone.name), zone});
+    return targets;
+}
+
+/// The file's own system, unless its lengths are wrong and there is nothing that the lines have to fit.
+int CImportDialog::ProposedTarget(const std::vector<Target>& targets) const
+{
+    constexpr double tolerable = 0.01;
+    if (targets.size() < 2 || !m_network.branches.empty())
+        return 0;
+    const CGisMap map = m_library.MapOf(*m_import.layer, targets[0].system);
+    return std::abs(map.scale - 1) > tolerable ? 1 : 0;
+}
+
+CGisSystem CImportDialog::ChosenTarget() const
+{
+    const QVariant chosen = m_target->currentData();
+    return m_library.FindSystem(chosen.isValid() ? chosen.toString() : m_code->text());
+}
+
+void CImportDialog::TargetChanged()
+{
+    if (m_filling)
+        return;
+    const bool byCode = !m_target->currentData().isValid();
+    m_code->setVisible(byCode && m_import.layer);
+    m_import.target = ChosenTarget();
+    m_import.map = {};
+    if (m_import.layer && byCode && !m_import.target.IsKnown())
+        m_import.map.error = tr("\"%1\" is no EPSG code of a coordinate system. Expected a number, for example 25832.")
+                                 .arg(m_code->text());
+    else if (m_import.layer)
+        m_import.map = m_library.MapOf(*m_import.layer, m_import.target);
+    m_declare->setVisible(m_network.system.isEmpty() && !m_network.branches.empty() && m_import.target.IsKnown());
+    Plan();
+}
+
+QString CImportDialog::NetworkSystem() const
+{
+    const bool take = m_network.branches.empty() || m_declare->isChecked();
+    return m_network.system.isEmpty() && take ? m_import.target.definition : m_network.system;
+}
+
+// ---- preview -----------------------------------------------------------------------------------
+
+void CImportDialog::Plan()
+{
+    if (m_filling)
+        return;
+    const CImportOptions options{
+        {m_name->currentData().toInt(), m_start->currentData().toInt(), m_end->currentData().toInt()},
+        CImportParts(m_parts->currentData().toInt()),
+        m_unnamed->isChecked()};
+    m_import.plan = m_import.layer ? PlanImport(*m_import.layer, m_import.map, options, m_network) : CImportPlan();
+    ShowPlan();
+}
+
+/// Why nothing can be imported now; empty when it can.
+QString CImportDialog::WhyNot() const
+{
+    if (!m_import.layer)
+        return tr("Choose a layer.");
+    if (!m_import.map.error.isEmpty())
+        return m_import.map.error;
+    return m_import.plan.branches.empty() ? tr("No line of this layer becomes a branch.") : QString();
+}
+
+void CImportDialog::ShowPlan()
+{
+    QStringList warnings;
+    if (const QString reason = WhyNot(); !reason.isEmpty())
+        warnings << reason;
+    if (!m_network.system.isEmpty() && !m_own.IsKnown())
+        warnings
+            << tr("The network names the coordinate system \"%1\", which is not known here.").arg(m_network.system);
+    if (m_import.layer) {
+        for (const CImportRemark& remark : ImportRemarks(m_import, m_network)) {
+            if (remark.warning && !warnings.contains(remark.text))
+                warnings << remark.text;
+        }
+    }
+    m_warning->setText(warnings.join(u'\n'));
+    m_warning->setVisible(!warnings.isEmpty());
+    m_report->setPlainText(m_import.layer ? ImportReport(m_import, m_network) : QString());
+    const bool whole = m_import.layer && (m_import.layer->IsComplete() || m_damaged->isChecked());
+    m_ok->setEnabled(WhyNot().isEmpty() && whole);
 }

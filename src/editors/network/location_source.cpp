@@ -1,13 +1,23 @@
 #include "editors/network/location_source.h"
 
 #include "ks/fc/exports.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/hd_messages.h"
+
+#include <cmath>
 
 namespace {
 
 bool IsHDView(const CView* view)
 {
     return view->GetDocument()->GetPathName().endsWith(QStringLiteral(".hdkv"), Qt::CaseInsensitive);
+}
+
+/// A line that the user has not completed is no location.
+bool IsComplete(const CKvr_CBE_ModelDataItem& item)
+{
+    constexpr double notGiven = 1e10; // as HD documents say it
+    return !item.branch.trimmed().isEmpty() && std::isfinite(item.chainage) && item.chainage != notGiven;
 }
 
 std::unique_ptr<CKvr_CBE_ModelDataItem> ItemOf(const CMapLocation& location)
@@ -32,7 +42,7 @@ std::vector<CView*> CLocationSource::HDViews() const
 CView* CLocationSource::FindView(const QString& file) const
 {
     for (CView* view : HDViews()) {
-        if (view->GetDocument()->GetPathName() == file)
+        if (KsSameFile(view->GetDocument()->GetPathName(), file)) // it may have been saved in another case
             return view;
     }
     qDebug("network: no open document %s", qPrintable(file));
@@ -65,7 +75,7 @@ std::vector<CMapLocation> CLocationSource::Fetch() const
             continue;
         for (const auto& each : *items) {
             const auto* item = dynamic_cast<const CKvr_CBE_ModelDataItem*>(each.get());
-            if (item && item->type >= 0 && item->type < HDDataTypeCount)
+            if (item && item->type >= 0 && item->type < HDDataTypeCount && IsComplete(*item))
                 locations.push_back({item->branch, item->chainage, item->type, file, item->second});
         }
     }

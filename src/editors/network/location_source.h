@@ -11,7 +11,8 @@ public:
     /// `view` asks in the name of `document`; both outlive this.
     CLocationSource(const CNetworkDoc& document, CView& view) : m_document(document), m_view(view) {}
 
-    /// Copies the locations of every open HD document of the project; of none when their editor is not there.
+    /// Copies the locations of every open HD document of the project, without lines that lack a branch or a chainage;
+    /// of none when their editor is not there.
     std::vector<CMapLocation> Fetch() const;
     /// Paths of the open HD documents.
     QStringList Files() const;

@@ -50,7 +50,7 @@ double Round125(double value)
 QString PlaceText(const QString& branch, double chainage)
 {
     const CKsEditStyle style(UnitGroup::Chainage, "%.1lf");
-    return QStringLiteral("%1 %2").arg(branch, style.UnitConvertFromBase_T(chainage, 1));
+    return QStringLiteral("%1 %2 %3").arg(branch, style.UnitConvertFromBase_T(chainage, 1), style.UnitSymbol());
 }
 
 QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend& legend)

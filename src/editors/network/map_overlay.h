@@ -8,7 +8,7 @@
 #include <QString>
 #include <array>
 
-/// A place as the user reads it: "BRANCH 1234.5", in the user's unit of chainages.
+/// A place as the user reads it: "BRANCH 1234.5 m", in the user's unit of chainages.
 QString PlaceText(const QString& branch, double chainage);
 
 /// The kinds of locations, with how many of each are drawn.

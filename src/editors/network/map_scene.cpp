@@ -1,5 +1,7 @@
 #include "editors/network/map_scene.h"
 
+#include "ks/fc/branch_name.h"
+
 #include <QFontMetricsF>
 #include <QHash>
 #include <algorithm>
@@ -21,7 +23,7 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
     const CNetwork& network = document.Network();
     QHash<QString, int> branches;
     for (std::size_t i = 0; i < network.branches.size(); ++i)
-        branches.insert(network.branches[i].name.toCaseFolded(), static_cast<int>(i));
+        branches.insert(KsBranchKey(network.branches[i].name), static_cast<int>(i));
     std::vector<CPlacedLocation> placed;
     placed.reserve(locations.size());
     QString name; // of the location before: most follow one of the same branch
@@ -30,7 +32,7 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
         const CMapLocation& location = locations[i];
         if (name != location.branch || i == 0) {
             name = location.branch;
-            branch = branches.value(name.toCaseFolded(), -1);
+            branch = branches.value(KsBranchKey(name), -1);
         }
         const auto point = document.Reference().PointAt(branch, location.chainage);
         if (!point)

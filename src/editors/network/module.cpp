@@ -16,6 +16,19 @@ struct NetworkTexts
 
 KsResourceHandle g_texts = nullptr;
 
+/// In the user's language of the moment.
+CString TemplateStrings()
+{
+    const QStringList strings{QStringLiteral("Kvr_Help.chm"),
+                              NetworkTexts::tr("Network"),
+                              NetworkTexts::tr("KVR River Network"),
+                              NetworkTexts::tr("KVR River Network (*.kvnw)"),
+                              QStringLiteral(".kvnw"),
+                              QStringLiteral("Network.Document"),
+                              QStringLiteral("Network Document")};
+    return strings.join(u'\n');
+}
+
 } // namespace
 
 static void InitResources()
@@ -37,14 +50,7 @@ void NetworkModule::FreeResources()
 
 CMultiDocTemplate* NetworkModule::CreateTemplate()
 {
-    const QStringList strings{QStringLiteral("Kvr_Help.chm"),
-                              NetworkTexts::tr("Network"),
-                              NetworkTexts::tr("KVR River Network"),
-                              NetworkTexts::tr("KVR River Network (*.kvnw)"),
-                              QStringLiteral(".kvnw"),
-                              QStringLiteral("Network.Document"),
-                              QStringLiteral("Network Document")};
-    return new CMultiDocTemplate(DocumentResource, strings.join(u'\n'),
+    return new CMultiDocTemplate(DocumentResource, &TemplateStrings,
                                  {[]() -> CKsDoc* { return new CNetworkDoc; }, [] { return new CKsMDIChildWnd; },
                                   []() -> CView* { return new CNetworkView; }});
 }

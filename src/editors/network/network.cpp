@@ -1,5 +1,7 @@
 #include "editors/network/network.h"
 
+#include "ks/fc/branch_name.h"
+
 #include <algorithm>
 #include <cmath>
 
@@ -19,9 +21,8 @@ void CNetworkBranch::SortChannel()
 
 int CNetwork::FindBranch(const QString& name) const
 {
-    const auto found = std::find_if(branches.begin(), branches.end(), [&](const CNetworkBranch& each) {
-        return each.name.compare(name, Qt::CaseInsensitive) == 0;
-    });
+    const auto found = std::find_if(branches.begin(), branches.end(),
+                                    [&](const CNetworkBranch& each) { return KsSameBranch(each.name, name); });
     return found == branches.end() ? -1 : static_cast<int>(found - branches.begin());
 }
 

@@ -36,10 +36,11 @@ struct CNetworkBranch
 struct CNetwork
 {
     std::vector<CNetworkBranch> branches;
+    QString system; // that the coordinates lie in, as "EPSG:25832" or in WKT; empty when the file names none
     std::vector<CKeptSection> keptTargets;
     CKeptSection kept; // of the network's own target
 
-    /// -1 for none. Case does not matter: the HD parameters keep the names in capitals.
+    /// -1 for none.
     int FindBranch(const QString& name) const;
     /// Around all vertices; null without any.
     QRectF Extent() const;

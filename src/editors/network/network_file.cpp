@@ -13,6 +13,7 @@ struct NetworkFile
 
 // Names of the file.
 constexpr const char* Target = "KVR_NETWORK";
+constexpr const char* System = "CoordinateSystem";
 constexpr const char* Branch = "Branch";
 constexpr const char* Name = "Name";
 constexpr const char* Chainage = "Chainage";
@@ -31,7 +32,12 @@ public:
 
     void ReadTarget(tqlHandle target, CNetwork& network)
     {
-        network.kept = KeepUnknown(target, {Branch});
+        network.kept = KeepUnknown(target, {System, Branch});
+        std::string system;
+        if (tqlGetNoKeywords(target, System) && !tqlGetParam(target, System, &system))
+            Fail(Place(target, System),
+                 NetworkFile::tr("expected the name of a coordinate system, CoordinateSystem = \"EPSG:...\"."));
+        network.system = QString::fromStdString(system);
         const int count = tqlGetNoSections(target);
         for (int i = 1; i <= count && m_error.isEmpty(); ++i) {
             const tqlHandle section = tqlSectionByNum(target, i);
@@ -160,6 +166,8 @@ QString WriteNetwork(const QString& path, const CNetwork& network)
 {
     const CParameterFile file(tqlCreate());
     tqlAddTarget(file.Get(), Target);
+    if (!network.system.isEmpty())
+        tqlPutParam(file.Get(), System, std::string_view(network.system.toStdString()));
     for (const CNetworkBranch& branch : network.branches)
         WriteBranch(file.Get(), branch);
     WriteKept(file.Get(), network.kept);

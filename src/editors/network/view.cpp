@@ -1,12 +1,9 @@
 #include "editors/network/view.h"
 
 #include "editors/common/quantity.h"
-#include "ks/fc/message_box.h"
 
-#include <QHeaderView>
 #include <QLabel>
 #include <QSplitter>
-#include <QTableView>
 #include <QVBoxLayout>
 
 namespace {
@@ -80,20 +77,13 @@ void CNetworkView::MakeTables(QSplitter* splitter)
             &CNetworkView::CurrentBranchChanged);
     connect(Document(), &CNetworkDoc::NetworkChanged, this, &CNetworkView::CurrentBranchChanged);
     if (m_branchTable->rowCount() > 0)
-        m_branches->setCurrentIndex(m_branchTable->index(0, 0));
+        m_branches->GoTo(0, CBranchTable::Name);
     CurrentBranchChanged();
 }
 
-QTableView* CNetworkView::MakeTable(CNetworkTable* model, const char* name)
+CLinesView* CNetworkView::MakeTable(CNetworkTable* model, const char* name)
 {
-    auto* table = new QTableView;
-    table->setObjectName(QString::fromLatin1(name));
-    table->setModel(model);
-    table->setAlternatingRowColors(true);
-    table->setSelectionBehavior(QAbstractItemView::SelectRows);
-    table->horizontalHeader()->setHighlightSections(false);
-    table->horizontalHeader()->setStretchLastSection(true);
-    table->verticalHeader()->setDefaultSectionSize(table->fontMetrics().height() + 8);
+    auto* table = new CLinesView(model, QString::fromLatin1(name));
     for (const auto& [key, run] : {std::pair(Qt::Key_Delete, &CNetworkView::DeleteLines),
                                    std::pair(Qt::Key_Insert, &CNetworkView::InsertLine)}) {
         auto* action = new QAction(table);
@@ -102,24 +92,9 @@ QTableView* CNetworkView::MakeTable(CNetworkTable* model, const char* name)
         connect(action, &QAction::triggered, this, run);
         table->addAction(action);
     }
-    // Both wait until the cell's editor has closed: it would commit once more to where its line stood before.
-    connect(model, &CNetworkTable::Refused, this, &CNetworkView::Refused, Qt::QueuedConnection);
-    connect(
-        model, &CNetworkTable::LineMoved, this, [this, table](int row, int column) { GoToCell(table, row, column); },
-        Qt::QueuedConnection);
+    // It waits until the cell's editor has closed: that would commit once more to where its line stood before.
+    connect(model, &CNetworkTable::LineMoved, table, &CLinesView::GoTo, Qt::QueuedConnection);
     return table;
-}
-
-void CNetworkView::GoToCell(QTableView* table, int row, int column) const
-{
-    const QModelIndex at = table->model()->index(row, column);
-    table->setCurrentIndex(at);
-    table->scrollTo(at);
-}
-
-void CNetworkView::Refused(const QString& message)
-{
-    KsMessageBox(message, QMessageBox::Ok, this);
 }
 
 void CNetworkView::CurrentBranchChanged()
@@ -130,13 +105,13 @@ void CNetworkView::CurrentBranchChanged()
     const auto& branches = Document()->Network().branches;
     const bool some = branch >= 0 && std::size_t(branch) < branches.size();
     m_channelTitle->setText(
-        some ? tr("C&hannel of %1").arg(QString(branches[std::size_t(branch)].name).replace(u'&', QStringLiteral("&&")))
-             : tr("C&hannel"));
+        some ? tr("&Channel of %1").arg(QString(branches[std::size_t(branch)].name).replace(u'&', QStringLiteral("&&")))
+             : tr("&Channel"));
 }
 
-QTableView* CNetworkView::FocusTable() const
+CLinesView* CNetworkView::FocusTable() const
 {
-    for (QTableView* table : {m_branches, m_channel}) {
+    for (CLinesView* table : {m_branches, m_channel}) {
         const QWidget* focus = QApplication::focusWidget();
         if (table && (table == focus || table->isAncestorOf(focus)))
             return table;
@@ -149,13 +124,13 @@ void CNetworkView::InsertLine()
     const int row = m_channelTable->InsertLine(m_channel->currentIndex().row());
     if (row < 0)
         return;
-    GoToCell(m_channel, row, CChannelTable::Chainage);
+    m_channel->GoTo(row, CChannelTable::Chainage);
     m_channel->setFocus();
 }
 
 void CNetworkView::DeleteLines()
 {
-    const QTableView* table = FocusTable();
+    const CLinesView* table = FocusTable();
     if (!table)
         return;
     std::vector<int> rows;
@@ -169,6 +144,8 @@ void CNetworkView::UnitsChanged()
 {
     m_branchTable->Reload();
     m_channelTable->Reload();
+    m_branches->FitColumns();
+    m_channel->FitColumns();
 }
 
 void CNetworkView::Retranslate()
@@ -179,8 +156,8 @@ void CNetworkView::Retranslate()
     CurrentBranchChanged();
     m_branchTable->Reload();
     m_channelTable->Reload();
-    m_branches->resizeColumnsToContents();
-    m_channel->resizeColumnsToContents();
+    m_branches->FitColumns();
+    m_channel->FitColumns();
 }
 
 void CNetworkView::changeEvent(QEvent* event)
@@ -193,8 +170,11 @@ void CNetworkView::changeEvent(QEvent* event)
 /// Hint 1 of the shell: what is being typed moves into the document.
 void CNetworkView::OnUpdate(CView*, int hint, CHint*)
 {
-    QTableView* table = FocusTable();
-    QWidget* focus = QApplication::focusWidget();
-    if (hint == CKsDoc::StoreHint && table && focus != table)
-        table->setFocus(); // the cell's editor commits as it loses the focus
+    if (hint == CKsDoc::StoreHint)
+        MayLeave(KsLeave::Field);
+}
+
+bool CNetworkView::MayLeave(KsLeave)
+{
+    return !m_map || (m_branches->Store() && m_channel->Store());
 }

@@ -1,6 +1,7 @@
 // The view of a network document: the map, the tables beside it, and what other editors ask.
 #pragma once
 
+#include "editors/common/lines_view.h"
 #include "editors/common/project_view.h"
 #include "editors/network/location_source.h"
 #include "editors/network/network_map.h"
@@ -12,7 +13,6 @@ class QAction;
 class QLabel;
 class QMenu;
 class QSplitter;
-class QTableView;
 
 /// Commands of the "Lines" menu and of the tool bar.
 namespace NetworkCommand {
@@ -29,15 +29,16 @@ public:
 
     CNetworkDoc* Document() const { return static_cast<CNetworkDoc*>(GetDocument()); }
     CNetworkMap* Map() const { return m_map; }
-    QTableView* Branches() const { return m_branches; }
-    QTableView* Channel() const { return m_channel; }
+    CLinesView* Branches() const { return m_branches; }
+    CLinesView* Channel() const { return m_channel; }
     /// The menu for what is picked or selected on the map.
     std::unique_ptr<QMenu> MapMenu();
-    /// Reads a GIS file, asks for its layer and fields, and appends its lines.
+    /// Reads a GIS file, asks what to take of it and how, appends its lines as branches and tells what it did.
     void Import(const QString& path);
 
     void OnInitialUpdate() override;
     void OnUpdate(CView* sender, int hint, CHint* object) override;
+    bool MayLeave(KsLeave what) override;
     bool OnCommand(int id) override;
     bool IsCommandEnabled(int id) const override;
     std::vector<CKsMenuCommand> LinesMenu() const override;
@@ -50,8 +51,8 @@ protected:
 
 private:
     void MakeTables(QSplitter* splitter);
-    QTableView* MakeTable(CNetworkTable* model, const char* name);
-    QTableView* FocusTable() const;
+    CLinesView* MakeTable(CNetworkTable* model, const char* name);
+    CLinesView* FocusTable() const;
     void Retranslate();
     void UnitsChanged();
     void CurrentBranchChanged();
@@ -61,9 +62,7 @@ private:
     void DeleteLocation();
     void InsertLine();
     void DeleteLines();
-    void GoToCell(QTableView* table, int row, int column) const;
     void AskForImport();
-    void Refused(const QString& message);
 
     // What other editors ask; each answers whether there was something.
     LRESULT FetchLocation(CObList& objects) const;
@@ -74,9 +73,9 @@ private:
     CNetworkMap* m_map = nullptr;
     CBranchTable* m_branchTable = nullptr;
     CChannelTable* m_channelTable = nullptr;
-    QTableView *m_branches = nullptr, *m_channel = nullptr;
+    CLinesView *m_branches = nullptr, *m_channel = nullptr;
     QLabel *m_branchTitle = nullptr, *m_channelTitle = nullptr;
     std::unique_ptr<CLocationSource> m_source;
     QTimer m_refresh; // one fetch for changes that follow one another
-    bool m_stale = true, m_fetching = false;
+    bool m_stale = true;
 };

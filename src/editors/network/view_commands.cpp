@@ -1,15 +1,35 @@
 // The commands of the network's view, and the import.
-#include "editors/network/import_branches.h"
 #include "editors/network/import_dialog.h"
 #include "editors/network/view.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
 
 #include <QFileInfo>
-#include <QTableView>
 
 namespace {
 constexpr double ZoomStep = 1.4;
+
+/// What a file holds instead of lines; empty when it has some.
+QString WhyNoLines(const QString& name, const CGisFile& file)
+{
+    QStringList layers;
+    for (const CGisLayer& layer : file.layers) {
+        if (layer.Lines() > 0)
+            return {};
+        QString text = QStringLiteral("%1: %2 (%3)").arg(layer.name, GeometryText(layer.geometry),
+                                                         QString::number(layer.features.size()));
+        for (const CGisFeature& feature : layer.features) {
+            if (!feature.error.isEmpty()) {
+                text += QStringLiteral(" - ") + feature.error;
+                break;
+            }
+        }
+        layers << (text + u' ' + layer.errors.join(u' ')).trimmed();
+    }
+    return CNetworkView::tr("%1 holds no lines. Its layers, with their geometry and the number of features:")
+               .arg(name) +
+           u'\n' + layers.join(u'\n');
+}
 } // namespace
 
 std::vector<CKsMenuCommand> CNetworkView::LinesMenu() const
@@ -55,6 +75,10 @@ bool CNetworkView::OnCommand(int id)
 {
     if (!IsCommandEnabled(id))
         return false;
+    const bool changes =
+        id == NetworkCommand::Import || id == NetworkCommand::InsertLine || id == NetworkCommand::DeleteLine;
+    if (changes && !MayLeave(KsLeave::Field))
+        return true; // the user has been told
     switch (id) {
     case NetworkCommand::Import:
         AskForImport();
@@ -93,24 +117,21 @@ void CNetworkView::AskForImport()
 
 void CNetworkView::Import(const QString& path)
 {
-    const CGisFile file = ReadGisFile(path);
-    if (!file.error.isEmpty()) {
-        KsMessageBox(file.error, QMessageBox::Ok, this);
+    QString reason;
+    const CGisLibrary* library = GisLibrary(reason);
+    const CGisFile file = library ? library->Read(path) : CGisFile{{}, reason};
+    const QString name = QFileInfo(path).fileName();
+    if (const QString error = file.error.isEmpty() ? WhyNoLines(name, file) : file.error; !error.isEmpty()) {
+        KsMessageBox(error, QMessageBox::Ok, this);
         return;
     }
-    CImportDialog dialog(QFileInfo(path).fileName(), file, this);
+    CImportDialog dialog(name, file, *library, Document()->Network(), this);
     if (dialog.exec() != QDialog::Accepted)
         return;
-    QStringList notes;
-    auto branches =
-        MakeBranches(file.layers[std::size_t(dialog.Layer())], dialog.Fields(), Document()->Network(), notes);
+    const QString report = ImportReport(dialog.Import(), Document()->Network());
     const auto first = static_cast<int>(Document()->Network().branches.size());
-    Document()->AppendBranches(std::move(branches), tr("Import Branches"));
-    m_branches->setCurrentIndex(m_branchTable->index(first, 0));
+    Document()->AppendBranches(dialog.Import().plan.branches, dialog.NetworkSystem(), tr("Import Branches"));
+    m_branches->GoTo(first, CBranchTable::Name);
     m_map->FitAll();
-    constexpr qsizetype most = 12; // lines of a message
-    if (notes.size() > most)
-        notes = notes.mid(0, most) << tr("... and %1 more.").arg(notes.size() - most);
-    if (!notes.isEmpty())
-        KsMessageBox(tr("The branches were imported:") + u'\n' + notes.join(u'\n'), QMessageBox::Ok, this);
+    CImportReportDialog(report, this).exec();
 }

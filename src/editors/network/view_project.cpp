@@ -1,9 +1,11 @@
 // The network's view among other editors: what it answers them, and the locations it gets from the HD documents.
+#include "editors/common/branch_names.h"
 #include "editors/network/view.h"
+#include "ks/fc/branch_name.h"
 
 #include <QFileInfo>
+#include <QHash>
 #include <QMenu>
-#include <QTableView>
 #include <cmath>
 
 // ---- requests ----------------------------------------------------------------------------------
@@ -13,8 +15,7 @@ LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
     if (!m_map) // before the first update
         return 0;
     if (request == KsRequest::DataChanged) {
-        if (!m_fetching) // an HD document that is asked may store what is being typed, and says so
-            LocationsChanged();
+        LocationsChanged();
         return 0;
     }
     if (request == KsRequest::LoadLocations)
@@ -53,25 +54,26 @@ LRESULT CNetworkView::FetchLocation(CObList& objects) const
 
 LRESULT CNetworkView::BranchNames(CObList& objects) const
 {
-    for (const CNetworkBranch& branch : Document()->Network().branches) {
-        auto item = std::make_unique<CKvrCBEText>();
-        item->text = branch.name;
-        objects.push_back(std::move(item));
-    }
-    return !Document()->Network().branches.empty();
+    QStringList branches;
+    for (const CNetworkBranch& branch : Document()->Network().branches)
+        branches << branch.name;
+    AppendBranchNames(branches, objects);
+    return !branches.isEmpty();
 }
 
 /// Radius and width where the list lacks them and the tables have them.
 LRESULT CNetworkView::FillChannel(const CObList& objects) const
 {
-    const CNetwork& network = Document()->Network();
+    QHash<QString, const CNetworkBranch*> branches;
+    for (const CNetworkBranch& branch : Document()->Network().branches)
+        branches.insert(KsBranchKey(branch.name), &branch);
     bool filled = false;
     for (const auto& object : objects) {
         auto* item = dynamic_cast<CKvrCBELocation*>(object.get());
-        const int branch = item ? network.FindBranch(item->branch) : -1;
-        if (branch < 0)
+        const CNetworkBranch* branch = item ? branches.value(KsBranchKey(item->branch)) : nullptr;
+        if (!branch)
             continue;
-        const auto& channel = network.branches[std::size_t(branch)].channel;
+        const auto& channel = branch->channel;
         for (const auto& [to, from] : {std::pair(&CKvrCBELocation::radius, &CChannelRow::radius),
                                        std::pair(&CKvrCBELocation::width, &CChannelRow::width)}) {
             if (!std::isnan(item->*to))
@@ -119,10 +121,8 @@ void CNetworkView::showEvent(QShowEvent* event)
 
 void CNetworkView::RefreshLocations()
 {
-    m_fetching = true;
-    auto locations = m_source->Fetch();
-    m_fetching = m_stale = false;
-    m_map->SetLocations(std::move(locations));
+    m_stale = false;
+    m_map->SetLocations(m_source->Fetch());
 }
 
 void CNetworkView::DeleteLocation()
@@ -140,7 +140,7 @@ void CNetworkView::PickedChanged()
     const auto picked = m_map->Picked();
     const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
     if (branch >= 0 && branch != m_branches->currentIndex().row())
-        m_branches->setCurrentIndex(m_branchTable->index(branch, 0));
+        m_branches->GoTo(branch, CBranchTable::Name);
 }
 
 std::unique_ptr<QMenu> CNetworkView::MapMenu()

@@ -2,6 +2,7 @@
 
 #include "ks/fc/doc_template.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/system_reason.h"
 
 #include <QDir>
 #include <QFile>
@@ -10,7 +11,11 @@
 #include <algorithm>
 #include <utility>
 
-CKsDoc::CKsDoc() : m_undo(new QUndoStack(this)) {}
+CKsDoc::CKsDoc() : m_undo(new QUndoStack(this))
+{
+    // Undoing back to what was saved leaves nothing to save.
+    connect(m_undo, &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
+}
 
 CKsDoc::~CKsDoc()
 {
@@ -32,7 +37,7 @@ BOOL CKsDoc::OnOpenDocument(const CString& path)
     const QFileInfo info(path);
     const CString reason = !info.exists()                    ? tr("The file does not exist.")
                            : !info.isFile()                  ? tr("This is not a file.")
-                           : !file.open(QIODevice::ReadOnly) ? file.errorString()
+                           : !file.open(QIODevice::ReadOnly) ? KsSystemReason(file)
                                                              : CString();
     if (!reason.isEmpty()) {
         KsMessageBox(tr("%1 could not be opened.\n%2").arg(QDir::toNativeSeparators(path), reason));

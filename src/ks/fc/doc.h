@@ -19,6 +19,13 @@ public:
     virtual ~CHint();
 };
 
+/// How much of what is being edited is about to be left.
+enum class KsLeave
+{
+    Field, // the field or cell; its page stays in front
+    Page   // the page with all that is on it
+};
+
 /// A window on a document. Owned by its frame.
 class KS_API CView : public QWidget, public CKsWindow
 {
@@ -35,6 +42,10 @@ public:
     virtual void OnUpdate(CView* sender, int hint, CHint* object);
     /// A view's window became active or stopped being active. Either view may be null.
     virtual void OnActivateView(bool activate, CView* activated, CView* deactivated);
+    /// Asked before anything changes the page, the window, the document or the program: what is being edited stores,
+    /// refuses (the user has been told once; the field is in sight and has the focus) or reverts. False: nothing may
+    /// change. Requests that only read never ask.
+    virtual bool MayLeave(KsLeave what);
 
 private:
     friend class CKsDoc;
@@ -70,6 +81,8 @@ public:
     /// Has the views take over what is being typed, then asks whether to save when the document is modified; false when
     /// the user cancelled or the save failed.
     BOOL SaveModified();
+    /// Asks every view whether what is being typed there can be taken; see CView::MayLeave.
+    bool MayLeave();
     bool IsExecuting() const { return m_executing; } // in the middle of an open or a save
 
     const CString& GetPathName() const { return m_path; } // empty until first saved

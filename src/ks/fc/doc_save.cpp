@@ -4,11 +4,9 @@
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
 
-#include <QApplication>
 #include <QDir>
 #include <QFileInfo>
-#include <QPointer>
-#include <utility>
+#include <algorithm>
 
 namespace {
 
@@ -20,25 +18,6 @@ bool SameFile(const CString& a, const CString& b)
     return first.isEmpty() || second.isEmpty() ? QDir::cleanPath(a) == QDir::cleanPath(b) : first == second;
 }
 
-/// Takes the focus from the field being edited, so that it commits its text, and gives it back.
-void CommitFocus(const std::vector<CView*>& views)
-{
-    const QPointer<QWidget> focus = QApplication::focusWidget();
-    const bool inside =
-        focus && std::any_of(views.begin(), views.end(), [&](const CView* view) { return view->isAncestorOf(focus); });
-    if (!inside)
-        return;
-    std::vector<QPointer<QWidget>> candidates;
-    for (QWidget* widget = focus; widget; widget = widget->parentWidget())
-        candidates.emplace_back(widget);
-    focus->clearFocus();
-    // A grid has taken its cell editor away by now; then the grid itself goes on.
-    for (const QPointer<QWidget>& widget : candidates) {
-        if (widget && !QApplication::focusWidget() && widget->isVisible() && widget->focusPolicy() != Qt::NoFocus)
-            widget->setFocus(Qt::OtherFocusReason);
-    }
-}
-
 } // namespace
 
 CString CKsDoc::SavePathFor(const CString& path) const
@@ -48,6 +27,8 @@ CString CKsDoc::SavePathFor(const CString& path) const
 
 BOOL CKsDoc::DoSave(const CString& path)
 {
+    if (!MayLeave())
+        return false;
     const CString target = path.isEmpty() ? AskSavePath() : path;
     if (target.isEmpty())
         return false;
@@ -60,9 +41,16 @@ BOOL CKsDoc::DoSave(const CString& path)
     return saved;
 }
 
+bool CKsDoc::MayLeave()
+{
+    const auto views = m_views; // a message may close one
+    return std::all_of(views.begin(), views.end(), [](CView* view) { return view->MayLeave(KsLeave::Page); });
+}
+
 BOOL CKsDoc::SaveModified()
 {
-    CommitFocus(m_views);
+    if (!MayLeave())
+        return false;
     UpdateAllViews(nullptr, StoreHint);
     if (!m_modified)
         return true;

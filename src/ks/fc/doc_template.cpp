@@ -1,20 +1,13 @@
 #include "ks/fc/doc_template.h"
 
+#include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
 
-#include <QDir>
 #include <QFileInfo>
 #include <QUndoStack>
 #include <algorithm>
 
 namespace {
-
-/// Two spellings of one existing file are one file.
-CString FileKey(const CString& path)
-{
-    const CString canonical = QFileInfo(path).canonicalFilePath();
-    return canonical.isEmpty() ? QDir::cleanPath(QFileInfo(path).absoluteFilePath()) : canonical;
-}
 
 bool IsClosing(const CKsDoc* document)
 {
@@ -27,8 +20,14 @@ bool IsClosing(const CKsDoc* document)
 
 } // namespace
 
-CMultiDocTemplate::CMultiDocTemplate(int resourceId, CString strings, Classes classes)
-    : m_resourceId(resourceId), m_strings(strings.split(u'\n')), m_classes(std::move(classes))
+CMultiDocTemplate::CMultiDocTemplate(int resourceId, Strings strings, Classes classes)
+    : m_resourceId(resourceId), m_strings(std::move(strings)), m_classes(std::move(classes))
+{
+}
+
+CMultiDocTemplate::CMultiDocTemplate(int resourceId, const CString& strings, Classes classes)
+    : CMultiDocTemplate(
+          resourceId, [strings] { return strings; }, std::move(classes))
 {
 }
 
@@ -40,7 +39,7 @@ CMultiDocTemplate::~CMultiDocTemplate()
 
 CString CMultiDocTemplate::GetDocString(DocStringIndex index) const
 {
-    return m_strings.value(index);
+    return m_strings().section(u'\n', index, index);
 }
 
 bool CMultiDocTemplate::MatchesExtension(const CString& path) const
@@ -58,9 +57,9 @@ CString CMultiDocTemplate::FileDialogFilter() const
 
 CKsDoc* CMultiDocTemplate::FindDocument(const CString& path) const
 {
-    const CString key = FileKey(path);
+    const CString key = KsFileKey(path);
     const auto found = std::find_if(m_documents.begin(), m_documents.end(), [&](const CKsDoc* document) {
-        return !document->GetPathName().isEmpty() && FileKey(document->GetPathName()) == key && !IsClosing(document);
+        return !key.isEmpty() && KsFileKey(document->GetPathName()) == key && !IsClosing(document);
     });
     return found == m_documents.end() ? nullptr : *found;
 }
@@ -103,10 +102,11 @@ bool CMultiDocTemplate::ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame)
 
 CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)
 {
-    const CString absolute = path.isEmpty() ? path : QFileInfo(path).absoluteFilePath();
+    const CString absolute = path.isEmpty() ? path : KsExistingSpelling(QFileInfo(path).absoluteFilePath());
     if (CKsDoc* open = absolute.isEmpty() ? nullptr : FindDocument(absolute)) {
         if (auto* window = open->Views().empty() ? nullptr : CKsMDIChildWnd::Of(open->Views().front()))
             window->BringToFront();
+        emit DocumentShown(open);
         return open;
     }
     auto loaded = LoadDocument(absolute);
@@ -115,10 +115,12 @@ CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString
     CKsDoc* document = loaded.release();
     m_documents.push_back(document);
     emit DocumentOpened(document);
-    if (ShowDocument(document, frame))
-        return document;
-    CloseDocument(document);
-    return nullptr;
+    if (!ShowDocument(document, frame)) {
+        CloseDocument(document);
+        return nullptr;
+    }
+    emit DocumentShown(document);
+    return document;
 }
 
 void CMultiDocTemplate::CloseDocument(CKsDoc* document)

@@ -36,8 +36,12 @@ public:
         std::function<CView*()> view;
     };
 
-    /// `strings`: the seven fields, separated by line breaks.
-    CMultiDocTemplate(int resourceId, CString strings, Classes classes);
+    /// The seven fields, separated by line breaks. They are asked for whenever one is needed, so that names and file
+    /// filters are in the user's language, which may change.
+    using Strings = std::function<CString()>;
+    CMultiDocTemplate(int resourceId, Strings strings, Classes classes);
+    /// For an editor that has one language.
+    CMultiDocTemplate(int resourceId, const CString& strings, Classes classes);
     ~CMultiDocTemplate() override;
 
     int ResourceId() const { return m_resourceId; }
@@ -57,7 +61,8 @@ public:
     CKsDoc* FindDocument(const CString& path) const;
 
 signals:
-    void DocumentOpened(CKsDoc* document);
+    void DocumentOpened(CKsDoc* document); // loaded or new; it has no window yet
+    void DocumentShown(CKsDoc* document);  // in its window, which may have been there before
     void DocumentClosing(CKsDoc* document);
 
 private:
@@ -67,7 +72,7 @@ private:
     void CloseDocument(CKsDoc* document);
 
     int m_resourceId;
-    QStringList m_strings;
+    Strings m_strings;
     Classes m_classes;
     std::vector<CKsDoc*> m_documents;
     int m_untitled = 0;

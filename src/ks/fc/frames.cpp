@@ -5,6 +5,7 @@
 #include <QAction>
 #include <QApplication>
 #include <QCloseEvent>
+#include <QMenu>
 #include <QMenuBar>
 #include <QPainter>
 #include <QStyle>
@@ -35,6 +36,10 @@ std::vector<CKsMenuCommand> CCommandTarget::LinesMenu() const
 CKsMDIChildWnd::CKsMDIChildWnd(QWidget* parent) : QMdiSubWindow(parent)
 {
     setAttribute(Qt::WA_DeleteOnClose);
+    // The frame closes windows by its own keys; a second owner would make them ambiguous, and then nobody acts.
+    if (QMenu* menu = systemMenu())
+        for (QAction* action : menu->actions())
+            action->setShortcuts({});
 }
 
 CKsMDIChildWnd::~CKsMDIChildWnd()
@@ -130,6 +135,7 @@ CKsMDIFrameWnd::CKsMDIFrameWnd(QWidget* parent) : QMainWindow(parent), m_area(ne
     setCentralWidget(m_area);
     connect(m_area, &QMdiArea::subWindowActivated, this, &CKsMDIFrameWnd::SubWindowActivated);
     connect(qApp, &QApplication::focusChanged, this, &CKsMDIFrameWnd::CommandStateChanged);
+    qApp->installEventFilter(this);
 }
 
 CKsMDIFrameWnd::~CKsMDIFrameWnd()
@@ -143,6 +149,7 @@ void CKsMDIFrameWnd::DestroyWindows()
 {
     disconnect(m_area, nullptr, this, nullptr);
     disconnect(qApp, nullptr, this, nullptr);
+    qApp->removeEventFilter(this);
     // Also those that are closed and wait for their deletion, which the area no longer lists.
     const auto windows = m_area->findChildren<CKsMDIChildWnd*>();
     for (CKsMDIChildWnd* window : windows)
@@ -178,7 +185,11 @@ void CKsMDIFrameWnd::ShowWindow(CKsMDIChildWnd* window)
 
 bool CKsMDIFrameWnd::CloseAllWindows()
 {
-    const auto windows = m_area->subWindowList();
+    return CloseWindows(m_area->subWindowList());
+}
+
+bool CKsMDIFrameWnd::CloseWindows(const QList<QMdiSubWindow*>& windows)
+{
     std::set<CKsDoc*> asked;
     for (QMdiSubWindow* window : windows) {
         const auto* child = qobject_cast<CKsMDIChildWnd*>(window);
@@ -194,10 +205,34 @@ bool CKsMDIFrameWnd::CloseAllWindows()
     return true;
 }
 
+bool CKsMDIFrameWnd::MayLeave()
+{
+    return !m_activeView || m_activeView->MayLeave(KsLeave::Page);
+}
+
+/// Menus, other dialogs and what floats above the frame do not leave a view: what is chosen there asks.
+bool CKsMDIFrameWnd::LeavesView(const QWidget* clicked) const
+{
+    return m_activeView && clicked->window() == this && !m_activeView->isAncestorOf(clicked) &&
+           clicked != m_activeView && !qobject_cast<const QMenuBar*>(clicked) && !QApplication::activePopupWidget() &&
+           !QApplication::activeModalWidget();
+}
+
+bool CKsMDIFrameWnd::eventFilter(QObject* object, QEvent* event)
+{
+    if (event->type() == QEvent::MouseButtonPress && object->isWidgetType()) {
+        const QPointer<QWidget> clicked = static_cast<QWidget*>(object);
+        // What the question changes may take the clicked widget away.
+        if (LeavesView(clicked) && (!MayLeave() || !clicked))
+            return true;
+    }
+    return QMainWindow::eventFilter(object, event);
+}
+
 bool CKsMDIFrameWnd::SendCommand(int id)
 {
     auto* target = dynamic_cast<CCommandTarget*>(m_activeView.data());
-    return target && target->IsCommandEnabled(id) && target->OnCommand(id);
+    return target && target->IsCommandEnabled(id) && m_activeView->MayLeave(KsLeave::Field) && target->OnCommand(id);
 }
 
 void CKsMDIFrameWnd::ActiveViewChanged(CView*) {}

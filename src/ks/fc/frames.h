@@ -105,6 +105,8 @@ public:
     void PlaceNewWindows(const QRect& place) { m_newPlace = place; }
     /// Asks for every modified document first, then closes all windows; false, and nothing closed, when one was kept.
     bool CloseAllWindows();
+    /// Asks the active view before another window, a dialog or a command takes over; see CView::MayLeave.
+    bool MayLeave();
     /// Sends a command to the active view; false when there is none or it cannot do it now.
     bool SendCommand(int id);
 
@@ -113,11 +115,17 @@ signals:
     void CommandStateChanged();
 
 protected:
+    /// A click outside the active view leaves it, so the view is asked before the click arrives.
+    bool eventFilter(QObject* object, QEvent* event) override;
     /// Another view, or none, became active. Called before the views hear of it.
     virtual void ActiveViewChanged(CView* view);
+    /// Asks for every modified document of these windows first, then closes them; false, and nothing closed, when one
+    /// was kept.
+    bool CloseWindows(const QList<QMdiSubWindow*>& windows);
     void DestroyWindows();
 
 private:
+    bool LeavesView(const QWidget* clicked) const;
     void SubWindowActivated();
     CKsMDIArea* m_area;
     QPointer<CView> m_activeView;

@@ -13,7 +13,7 @@ class CView;
 /// HD_EXPORTED_FUNCTION(result, name, arguments), a row each.
 #define KVR_HD_FUNCTIONS(HD_EXPORTED_FUNCTION)                                                                         \
     /* Locations of seven tables, as CKvr_CBE_ModelDataItem in the order of the type codes and of the lists. Of */     \
-    /* `document` when it is one of this editor's, with what is being typed; otherwise of the file `path`. */          \
+    /* `document` when it is one of this editor's, as it is stored there; otherwise of the file `path`. */             \
     HD_EXPORTED_FUNCTION(CObList*, KvrMSGGetData, (const CString& path, CKsDoc* document))                             \
     /* Titles and locations of the user-defined marks, as CKvrCBEUserDefMark. */                                       \
     HD_EXPORTED_FUNCTION(CObList*, KvrMSGGetHDUserDefMark, (const CString& path, CKsDoc* document))                    \

@@ -1,6 +1,7 @@
 #include "ks/fc/message_box.h"
 
 #include <QApplication>
+#include <QLabel>
 #include <utility>
 
 namespace {
@@ -16,7 +17,8 @@ QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
 }
 } // namespace
 
-QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent)
+QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent,
+                                         const CString& details)
 {
     return KsMessageBox(text, buttons, QMessageBox::NoButton, parent);
 }
@@ -30,6 +32,9 @@ QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::Stand
                     parent ? parent : QApplication::activeWindow());
     box.setDefaultButton(defaultButton);
     box.setTextFormat(Qt::PlainText); // file names may hold anything
+    box.setInformativeText(details);
+    if (auto* label = box.findChild<QLabel*>(QStringLiteral("qt_msgbox_informativelabel")))
+        label->setTextFormat(Qt::PlainText);
     return QMessageBox::StandardButton(box.exec());
 }
 

@@ -9,9 +9,11 @@
 
 class QWidget;
 
-/// Shows a modal message with the given buttons and returns the one pressed. The title is the application's name.
-KS_API QMessageBox::StandardButton
-KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons = QMessageBox::Ok, QWidget* parent = nullptr);
+/// Shows a modal message with the given buttons and returns the one pressed. The title is the application's name;
+/// `details` stand below the text.
+KS_API QMessageBox::StandardButton KsMessageBox(const CString& text,
+                                                QMessageBox::StandardButtons buttons = QMessageBox::Ok,
+                                                QWidget* parent = nullptr, const CString& details = {});
 
 /// Likewise; Enter presses `defaultButton`.
 KS_API QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons,

@@ -15,3 +15,8 @@ void CView::OnInitialUpdate() {}
 void CView::OnUpdate(CView*, int, CHint*) {}
 
 void CView::OnActivateView(bool, CView*, CView*) {}
+
+bool CView::MayLeave(KsLeave)
+{
+    return true;
+}

@@ -56,4 +56,71 @@
             <translation>Unit: %1</translation>
         </message>
     </context>
+    <context>
+        <name>SystemReason</name>
+        <message>
+            <source>no space is left on the device</source>
+            <translation>no space is left on the device</translation>
+        </message>
+        <message>
+            <source>the file system is read-only</source>
+            <translation>the file system is read-only</translation>
+        </message>
+        <message>
+            <source>permission denied</source>
+            <translation>permission denied</translation>
+        </message>
+        <message>
+            <source>the operation is not permitted</source>
+            <translation>the operation is not permitted</translation>
+        </message>
+        <message>
+            <source>there is no such file or folder</source>
+            <translation>there is no such file or folder</translation>
+        </message>
+        <message>
+            <source>a part of the path is no folder</source>
+            <translation>a part of the path is no folder</translation>
+        </message>
+        <message>
+            <source>it is a folder</source>
+            <translation>it is a folder</translation>
+        </message>
+        <message>
+            <source>it is not an ordinary file</source>
+            <translation>it is not an ordinary file</translation>
+        </message>
+        <message>
+            <source>the device reports an input or output error</source>
+            <translation>the device reports an input or output error</translation>
+        </message>
+        <message>
+            <source>the file would be too large</source>
+            <translation>the file would be too large</translation>
+        </message>
+        <message>
+            <source>the name is too long</source>
+            <translation>the name is too long</translation>
+        </message>
+        <message>
+            <source>the link leads in a circle</source>
+            <translation>the link leads in a circle</translation>
+        </message>
+        <message>
+            <source>too many files are open</source>
+            <translation>too many files are open</translation>
+        </message>
+        <message>
+            <source>another program is using it</source>
+            <translation>another program is using it</translation>
+        </message>
+        <message>
+            <source>your disk quota is used up</source>
+            <translation>your disk quota is used up</translation>
+        </message>
+        <message>
+            <source>%1.</source>
+            <translation>%1.</translation>
+        </message>
+    </context>
 </TS>

@@ -56,4 +56,71 @@
             <translation>単位: %1</translation>
         </message>
     </context>
+    <context>
+        <name>SystemReason</name>
+        <message>
+            <source>no space is left on the device</source>
+            <translation>デバイスに空き領域がありません</translation>
+        </message>
+        <message>
+            <source>the file system is read-only</source>
+            <translation>ファイルシステムは読み取り専用です</translation>
+        </message>
+        <message>
+            <source>permission denied</source>
+            <translation>アクセスが許可されていません</translation>
+        </message>
+        <message>
+            <source>the operation is not permitted</source>
+            <translation>この操作は許可されていません</translation>
+        </message>
+        <message>
+            <source>there is no such file or folder</source>
+            <translation>ファイルまたはフォルダがありません</translation>
+        </message>
+        <message>
+            <source>a part of the path is no folder</source>
+            <translation>パスの途中がフォルダではありません</translation>
+        </message>
+        <message>
+            <source>it is a folder</source>
+            <translation>フォルダです</translation>
+        </message>
+        <message>
+            <source>it is not an ordinary file</source>
+            <translation>通常のファイルではありません</translation>
+        </message>
+        <message>
+            <source>the device reports an input or output error</source>
+            <translation>デバイスの入出力エラーです</translation>
+        </message>
+        <message>
+            <source>the file would be too large</source>
+            <translation>ファイルが大きくなりすぎます</translation>
+        </message>
+        <message>
+            <source>the name is too long</source>
+            <translation>名前が長すぎます</translation>
+        </message>
+        <message>
+            <source>the link leads in a circle</source>
+            <translation>リンクが循環しています</translation>
+        </message>
+        <message>
+            <source>too many files are open</source>
+            <translation>開いているファイルが多すぎます</translation>
+        </message>
+        <message>
+            <source>another program is using it</source>
+            <translation>別のプログラムが使用しています</translation>
+        </message>
+        <message>
+            <source>your disk quota is used up</source>
+            <translation>ディスクの割り当て容量を使い切りました</translation>
+        </message>
+        <message>
+            <source>%1.</source>
+            <translation>%1。</translation>
+        </message>
+    </context>
 </TS>

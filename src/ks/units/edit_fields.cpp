@@ -33,15 +33,22 @@ std::optional<std::int32_t> CKsEditLong::Value() const
     return isInteger && m_range.Contains(value) ? std::optional<std::int32_t>(value) : std::nullopt;
 }
 
-std::optional<std::int32_t> CKsEditLong::CheckedValue()
+CString CKsEditLong::Complaint() const
 {
-    if (const auto value = Value())
-        return value;
+    if (Value())
+        return {};
     bool isInteger = false;
     text().trimmed().toInt(&isInteger);
-    Refuse(*this, isInteger ? tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high)
-                            : tr("Enter an integer."));
-    return std::nullopt;
+    return isInteger ? tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high)
+                     : tr("Enter an integer.");
+}
+
+std::optional<std::int32_t> CKsEditLong::CheckedValue()
+{
+    const auto value = Value();
+    if (!value)
+        Refuse(*this, Complaint());
+    return value;
 }
 
 bool DDX_KSedit(bool save, QLineEdit& edit, double& value, const CKsEditStyle& style)

@@ -30,6 +30,8 @@ public:
     std::optional<std::int32_t> Value() const;
     /// As Value, but first tells the user what is wrong and puts the focus back into the field.
     std::optional<std::int32_t> CheckedValue();
+    /// Why the text is no integer of the range; empty when it is one.
+    CString Complaint() const;
 
 private:
     CKSinterval<std::int32_t> m_range;

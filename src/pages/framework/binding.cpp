@@ -15,6 +15,7 @@
 #include <QLabel>
 #include <QRadioButton>
 #include <QUndoStack>
+#include <algorithm>
 
 namespace {
 
@@ -44,63 +45,70 @@ void CBindings::ApplyRules()
         rule();
 }
 
+void CBindings::Add(QWidget* control, const void* value, std::function<void()> show)
+{
+    m_controls.push_back({control, value, std::move(show)});
+}
+
+void CBindings::AddTyped(QLineEdit* field, const void* value, TypedField what)
+{
+    auto* typing = new CTyping(field, std::move(what));
+    m_typed.push_back(typing);
+    Add(field, value, [typing] {
+        if (!typing->IsTyped()) // a text that has not been taken yet stays
+            typing->Revert();
+    });
+}
+
+QWidget* CBindings::ControlFor(const void* value) const
+{
+    QWidget* found = nullptr;
+    for (const Control& control : m_controls) {
+        const auto* button = qobject_cast<const QRadioButton*>(control.widget);
+        const bool isBest = control.widget->isEnabled() && (!button || button->isChecked());
+        if (control.value == value && (isBest || !found))
+            found = control.widget;
+    }
+    return found;
+}
+
 void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
 {
+    m_controls.emplace_back(&value, field);
     field->Setup(&value, options.textLimit, options.decimals, options.generalNotation,
                  options.unit ? *options.unit : DeclaredUnit(m_document->Parameters().Global, value));
     field->SetRange(options.minimum.has_value(), options.minimum.value_or(0), options.maximum.has_value(),
                     options.maximum.value_or(0));
     field->SetUnitText(options.unitText);
     field->SetStore([this](double& target, double number) { Store(target, number); });
-    m_show.push_back([field, label = options.unitLabel] {
+    m_typed.push_back(&field->Typing());
+    Add(field, &value, [field, label = options.unitLabel] {
         field->Show();
         if (label)
             label->setText(field->UnitSymbol());
     });
-    m_take.push_back([field] { return field->Commit(); });
 }
 
 void CBindings::Add(CKsEditLong* field, std::int32_t& value)
 {
-    m_show.push_back([field, &value] {
-        if (!field->isModified()) // a text that has not been taken yet stays
-            field->SetValue(value);
-    });
     field->setAlignment(Qt::AlignRight); // as the other numbers
-    field->installEventFilter(this);
-    const auto take = [this, field, &value](std::optional<std::int32_t> typed) {
-        if (!typed)
-            return false;
-        field->setModified(false);
-        Store(value, *typed);
-        return true;
-    };
-    connect(field, &QLineEdit::editingFinished, this, [field, take] {
-        if (field->isModified())
-            take(field->Value()); // what is no integer waits until the page is stored
-    });
-    m_take.push_back([field, take] { return !field->isModified() || take(field->CheckedValue()); });
+    AddTyped(field, &value,
+             {.complaint = [field] { return field->Complaint(); },
+              .store = [this, field, &value] { Store(value, *field->Value()); },
+              .show = [field, &value] { field->SetValue(value); },
+              .waitsForPage = true});
 }
 
 void CBindings::Add(QLineEdit* field, std::string& value)
 {
-    m_show.push_back([field, &value] {
-        const QString text = QString::fromStdString(value);
-        if (!field->isModified() && field->text() != text)
-            field->setText(text);
-    });
-    field->installEventFilter(this);
-    const auto take = [this, field, &value] {
-        if (!field->isModified())
-            return;
-        field->setModified(false);
-        Store(value, field->text().toStdString());
-    };
-    connect(field, &QLineEdit::editingFinished, this, take);
-    m_take.push_back([take] {
-        take();
-        return true;
-    });
+    AddTyped(field, &value,
+             {.store = [this, field, &value] { Store(value, field->text().toStdString()); },
+              .show =
+                  [field, &value] {
+                      const QString text = QString::fromStdString(value);
+                      if (field->text() != text)
+                          field->setText(text);
+                  }});
 }
 
 void CBindings::Add(CGeoFileEdit* field, std::string& value, const FileKind& kind)
@@ -113,29 +121,16 @@ void CBindings::Add(CGeoFileEdit* field, std::string& value, const FileKind& kin
 
 void CBindings::Add(CDateTimeEdit* field, HDDateTime& value)
 {
-    m_show.push_back([field, &value] {
-        if (!field->isModified())
-            field->SetValue(value);
-    });
-    field->installEventFilter(this);
-    const auto take = [this, field, &value](std::optional<HDDateTime> typed) {
-        if (!typed)
-            return false;
-        field->SetValue(*typed);
-        Store(value, *typed);
-        return true;
-    };
-    connect(field, &QLineEdit::editingFinished, this, [field, take] {
-        if (field->isModified())
-            take(field->Value()); // what is no date stays, and the field says so
-    });
-    m_take.push_back([field, take] { return !field->isModified() || take(field->CheckedValue()); });
+    AddTyped(field, &value,
+             {.complaint = [field] { return field->Complaint(); },
+              .store = [this, field, &value] { Store(value, *field->Value()); },
+              .show = [field, &value] { field->SetValue(value); }});
 }
 
 template <typename T>
 void CBindings::AddFlag(QCheckBox* box, T& value, std::function<void(bool checked)> consequences)
 {
-    m_show.push_back([box, &value] { box->setChecked(value != T(0)); });
+    Add(box, &value, [box, &value] { box->setChecked(value != T(0)); });
     connect(box, &QCheckBox::clicked, this, [this, &value, consequences](bool checked) {
         if (!consequences)
             return Store(value, T(checked));
@@ -174,7 +169,7 @@ void CBindings::Add(QComboBox* box, std::int32_t& index, std::function<void(std:
             box->addItem(QString::number(index));
         box->setCurrentIndex(index >= 0 && index < entries ? index : entries);
     };
-    m_show.push_back(show);
+    Add(box, &index, show);
     connect(box, &QComboBox::activated, this, [entries, show, choose = std::move(choose)](int chosen) {
         if (chosen < entries)
             choose(std::int32_t(chosen));
@@ -186,9 +181,11 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
 {
     auto* group = new QButtonGroup(this);
     int id = 0;
-    for (QRadioButton* button : buttons)
+    for (QRadioButton* button : buttons) {
+        Add(button, &value, [] {}); // shown by its group
         group->addButton(button, id++);
-    m_show.push_back([group, &value] {
+    }
+    Add(*buttons.begin(), nullptr, [group, &value] {
         group->setExclusive(false); // else a pressed button could not be released
         for (QAbstractButton* button : group->buttons())
             button->setChecked(group->id(button) == value);
@@ -199,7 +196,7 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
 
 void CBindings::AddUnbound(QComboBox* box)
 {
-    m_show.push_back([box] { box->setCurrentIndex(0); });
+    Add(box, nullptr, [box] { box->setCurrentIndex(0); });
 }
 
 bool CBindings::eventFilter(QObject* object, QEvent* event)
@@ -210,12 +207,10 @@ bool CBindings::eventFilter(QObject* object, QEvent* event)
         event->ignore();
         return true;
     }
-    // A list, and a field with nothing typed, leave undo and redo to the document.
+    // A list leaves undo and redo to the document.
     if (event->type() == QEvent::ShortcutOverride || event->type() == QEvent::KeyPress) {
         const auto* key = static_cast<QKeyEvent*>(event);
-        const bool undoRedo = key->matches(QKeySequence::Undo) || key->matches(QKeySequence::Redo);
-        const auto* field = qobject_cast<QLineEdit*>(object);
-        if (undoRedo && !(field && field->isModified())) {
+        if (key->matches(QKeySequence::Undo) || key->matches(QKeySequence::Redo)) {
             event->ignore();
             return true;
         }
@@ -245,15 +240,17 @@ void CBindings::ShowWhen(std::function<bool()> rule, std::initializer_list<QWidg
 
 void CBindings::Show()
 {
-    for (const auto& show : m_show)
-        show();
+    for (const Control& control : m_controls)
+        control.show();
     ApplyRules();
 }
 
 bool CBindings::Take()
 {
-    for (const auto& take : m_take)
-        if (!take())
-            return false;
-    return true;
+    return std::all_of(m_typed.begin(), m_typed.end(), [](CTyping* typing) { return typing->Take(); });
+}
+
+bool CBindings::TakeField()
+{
+    return std::all_of(m_typed.begin(), m_typed.end(), [](CTyping* typing) { return typing->TakeField(); });
 }

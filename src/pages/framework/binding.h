@@ -4,6 +4,7 @@
 
 #include "data/field.h"
 #include "pages/framework/file_browse.h"
+#include "pages/framework/typing.h"
 
 #include <QObject>
 #include <cstdint>
@@ -66,13 +67,25 @@ public:
 
     /// Controls show the document's values, and the rules apply.
     void Show();
-    /// Takes what is being typed; false when a field refuses it (the user has been told).
+    /// Takes what was typed; false when a field refuses it (the user has been told).
     bool Take();
+    /// Likewise while the page stays: a text that may wait for the page is let be.
+    bool TakeField();
+    /// The control of the value at this address, of several one that can be used now; null for a value of other pages.
+    QWidget* ControlFor(const void* value) const;
 
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;
 
 private:
+    struct Control
+    {
+        QWidget* widget;
+        const void* value; // null for none
+        std::function<void()> show;
+    };
+    void Add(QWidget* control, const void* value, std::function<void()> show);
+    void AddTyped(QLineEdit* field, const void* value, TypedField what);
     template <typename T>
     void Store(T& target, T value);
     void ApplyRules();
@@ -81,7 +94,7 @@ private:
     void AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets, void (QWidget::*apply)(bool));
 
     CKavo0_hdDoc* m_document;
-    std::vector<std::function<void()>> m_show;
-    std::vector<std::function<bool()>> m_take;
+    std::vector<Control> m_controls;
+    std::vector<CTyping*> m_typed; // children of their fields
     std::vector<std::function<void()>> m_rules;
 };

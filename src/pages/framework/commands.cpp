@@ -17,7 +17,6 @@ CSetCells::CSetCells(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows, s
 ChangePlace CSetCells::Apply()
 {
     for (CellChange& change : m_changes) {
-        m_rows->Touch(change.row);
         void* row = m_rows->Object(change.row);
         if (change.access->restore)
             change.restore = change.access->restore(row);

@@ -50,12 +50,12 @@ protected:
     ChangePlace Apply() override
     {
         m_target = m_after;
-        return {};
+        return {&m_target};
     }
     ChangePlace Revert() override
     {
         m_target = m_before;
-        return {};
+        return {&m_target};
     }
 
 private:

@@ -2,9 +2,11 @@
 #pragma once
 
 #include "ks/units/edit_style.h"
+#include "pages/framework/typing.h"
 
 #include <QLineEdit>
 #include <functional>
+#include <optional>
 
 class CCtrlEdit : public QLineEdit
 {
@@ -34,19 +36,20 @@ public:
 
     /// Leaving the field: takes the text. False when it is no number or out of range; the user has been told, the field
     /// has the focus and the value is what it was. A text that nobody changed changes nothing.
-    bool Commit();
+    bool Commit() { return m_typing->Take(); }
+    CTyping& Typing() const { return *m_typing; }
 
 protected:
-    bool event(QEvent* event) override;
-    void focusOutEvent(QFocusEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
-    void keyPressEvent(QKeyEvent* event) override;
 
 private:
-    bool IsTyped() const { return isModified() && text() != m_shown; }
     void ShowValue();
     void UpdateToolTip();
-    bool Refuse(const QString& message);
+    void Store();
+    std::optional<double> Typed() const; // in base units; nothing for a text that is no number
+    bool InRange(double value) const;
+    QString Complaint() const;
+    QString Allowed() const;
 
     CKsEditStyle m_style;
     UnitGroup m_group = UnitGroup(999);
@@ -58,6 +61,6 @@ private:
     double m_minimum = 0, m_maximum = 0;
     std::function<void(double&, double)> m_store;
     std::function<QString()> m_unitText;
-    QString m_shown;       // the text as last shown
-    bool m_warned = false; // during the present event
+    QString m_shown;   // the value as text
+    CTyping* m_typing; // child
 };

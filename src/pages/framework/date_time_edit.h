@@ -16,14 +16,9 @@ public:
     /// What the text means; nothing for a text that is no date and time. A text that nobody changed is the value set,
     /// be it a date or not.
     std::optional<HDDateTime> Value() const;
-    /// Likewise, and tells the user when there is none.
-    std::optional<HDDateTime> CheckedValue();
-
-protected:
-    void focusOutEvent(QFocusEvent* event) override;
-    void keyPressEvent(QKeyEvent* event) override;
+    /// Why the text is no date and time; empty when it is one.
+    QString Complaint() const;
 
 private:
     HDDateTime m_value;
-    bool m_telling = false;
 };

@@ -28,13 +28,14 @@ std::optional<QString> BrowseForFile(const CKavo0_hdDoc& document, const QString
     const QString chosen = KsAskFileName(question, parent);
     if (chosen.isEmpty())
         return std::nullopt;
+    const QString name = QDir::toNativeSeparators(chosen);
     const bool isOther = !isReadable || QFileInfo(chosen) != named;
-    const Str existsText = kind.isWritten ? Str::FileIsWritten : Str::FileIsRead;
-    if (isOther && QFileInfo::exists(chosen) &&
-        KsMessageBox(LoadString(existsText).arg(QDir::toNativeSeparators(chosen)), QMessageBox::Yes | QMessageBox::No,
-                     parent) != QMessageBox::Yes)
+    const bool isDoubtful = isOther && QFileInfo::exists(chosen) == kind.isWritten;
+    const Str doubt = kind.isWritten ? Str::FileIsWritten : Str::FileIsMissing;
+    if (isDoubtful &&
+        KsMessageBox(LoadString(doubt).arg(name), QMessageBox::Yes | QMessageBox::No, parent) != QMessageBox::Yes)
         return std::nullopt;
-    return QDir::toNativeSeparators(chosen);
+    return name;
 }
 
 CGeoFileEdit::CGeoFileEdit(QWidget* parent)

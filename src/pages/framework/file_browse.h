@@ -12,12 +12,12 @@ class QToolButton;
 struct FileKind
 {
     QString extension;      // without its point
-    bool isWritten = false; // by the simulation, which otherwise reads it: the question about a file that exists says so
+    bool isWritten = false; // by the simulation, which otherwise reads it
 };
 
 /// Asks for a file name, starting in the folder of the file named, or in the document's. Names in a document are
-/// relative to its folder, or absolute. Asks before the name of another existing file is taken. Nothing
-/// when the user cancelled or declined.
+/// relative to its folder, or absolute. Asks before the name of another file is taken that would be written over, or
+/// that is to be read and is not there. Nothing when the user cancelled or declined.
 std::optional<QString> BrowseForFile(const CKavo0_hdDoc& document, const QString& current, const FileKind& kind,
                                      QWidget* parent);
 

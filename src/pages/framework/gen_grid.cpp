@@ -12,6 +12,7 @@
 #include <QHeaderView>
 #include <QMenu>
 #include <QPainter>
+#include <QScopedValueRollback>
 #include <QScrollBar>
 #include <QUndoStack>
 #include <algorithm>
@@ -66,6 +67,8 @@ CGenGrid::CGenGrid(QWidget* parent)
     // A click on a header moves the current cell as one on a cell does.
     for (QWidget* part : {verticalHeader()->viewport(), horizontalHeader()->viewport()})
         part->installEventFilter(this);
+    connect(selectionModel(), &QItemSelectionModel::selectionChanged, this,
+            [this] { m_linesChosen = m_choosingLines; });
     connect(m_model, &CGridModel::CellModified, this, &CGenGrid::CellModified);
     connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGenGrid::MakeRoomForDigits);
 }
@@ -163,13 +166,14 @@ void CGenGrid::Reload()
     UpdateRowHeader();
     SetColumnWidths(std::min(m_widthsSet, ColumnCount()));
     if (!currentIndex().isValid() && RowCount() > 0)
-        setCurrentIndex(m_model->index(0, 0));
+        SetCurrentCell(1, 1);
 }
 
 void CGenGrid::SetCurrentCell(int row, int column)
 {
     const QModelIndex index = m_model->index(std::clamp(row, 1, std::max(1, RowCount())) - 1, std::max(1, column) - 1);
-    setCurrentIndex(index);
+    // Not setCurrentIndex, which would extend the selection while the user happens to hold Ctrl or Shift.
+    selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect);
     scrollTo(index);
 }
 
@@ -236,7 +240,7 @@ void CGenGrid::focusInEvent(QFocusEvent* event)
 
 void CGenGrid::mousePressEvent(QMouseEvent* event)
 {
-    if (m_page ? m_page->CommitGrids() : CommitEditor())
+    if (m_page ? m_page->LeaveField() : CommitEditor())
         QTableView::mousePressEvent(event);
 }
 
@@ -263,7 +267,28 @@ bool CGenGrid::eventFilter(QObject* object, QEvent* event)
 {
     if (event->type() == QEvent::MouseButtonPress && object != viewport() && !CommitEditor())
         return true;
+    if (object == verticalHeader()->viewport()) {
+        if (event->type() == QEvent::MouseButtonPress)
+            m_choosingLines = m_linesChosen = true;
+        else if (event->type() == QEvent::MouseButtonRelease)
+            m_choosingLines = false;
+    }
     return QTableView::eventFilter(object, event);
+}
+
+void CGenGrid::SelectLines(int first, int last)
+{
+    const QScopedValueRollback choosing(m_choosingLines, true);
+    const QItemSelection lines(m_model->index(first - 1, 0), m_model->index(last - 1, ColumnCount() - 1));
+    selectionModel()->select(lines, QItemSelectionModel::ClearAndSelect);
+    m_linesChosen = true;
+}
+
+void CGenGrid::selectAll()
+{
+    const QScopedValueRollback choosing(m_choosingLines, true);
+    QTableView::selectAll();
+    m_linesChosen = true;
 }
 
 void CGenGrid::changeEvent(QEvent* event)
@@ -323,6 +348,8 @@ void CGenGrid::Run(GridAction action)
         return Execute(Command::SearchAgain);
     case GridAction::Search:
         return Execute(Command::Search);
+    case GridAction::SelectLine:
+        return SelectLines(CurrentRow(), CurrentRow());
     case GridAction::Undo:
     case GridAction::Redo:
         if (m_page)
@@ -425,6 +452,8 @@ std::optional<QItemSelectionRange> CGenGrid::LinesToDelete() const
     auto lines = SelectedBlock();
     if (!lines && m_deletesCurrentLine && currentIndex().isValid())
         lines.emplace(currentIndex().siblingAtColumn(0), currentIndex().siblingAtColumn(ColumnCount() - 1));
+    else if (!m_linesChosen)
+        return std::nullopt;
     if (!lines || lines->width() != ColumnCount() || lines->bottom() < m_model->FixedRows())
         return std::nullopt;
     const int top = std::max(lines->top(), m_model->FixedRows());

@@ -54,8 +54,12 @@ public:
     void Reload();
     /// Inserts a line above the first selected range, or behind the last line; returns its row.
     int InsertLine();
-    /// Deletes the selected lines when whole lines are selected, in one range; the current line without a selection in
-    /// a grid that says so. A grid left empty gets a new line, unless its rows may be none.
+    /// Selects whole lines, as clicks on their numbers do.
+    void SelectLines(int first, int last);
+    void selectAll() override;
+    /// Deletes the selected lines when whole lines are selected - by their numbers, not cell by cell - in one range;
+    /// the current line without a selection in a grid that says so. A grid left empty gets a new line, unless its rows
+    /// may be none.
     bool DeleteSelectedLines();
     void SetDeletesCurrentLine(bool deletes) { m_deletesCurrentLine = deletes; }
     /// A click or the space bar on a cell that acts at once.
@@ -115,5 +119,7 @@ private:
     int m_branchNameColumn = 0;
     bool m_locationOnAnyColumn = false;
     bool m_deletesCurrentLine = false;
-    int m_widthsSet = 0; // of so many columns; from then on they are the user's
+    bool m_choosingLines = false; // the selection is being made by line numbers
+    bool m_linesChosen = false;   // the selection was made so
+    int m_widthsSet = 0;          // of so many columns; from then on they are the user's
 };

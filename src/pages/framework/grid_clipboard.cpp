@@ -1,14 +1,17 @@
 #include "pages/framework/grid_clipboard.h"
 
 #include "ks/fc/message_box.h"
+#include "module/document.h"
 #include "pages/framework/cell_text.h"
 #include "pages/framework/gen_grid.h"
+#include "pages/framework/page.h"
 #include "res/strings.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QMimeData>
 #include <algorithm>
+#include <numeric>
 
 QString WriteTable(const std::vector<QStringList>& rows)
 {
@@ -70,6 +73,16 @@ std::vector<QStringList> ReadTable(const QString& text)
     return rows;
 }
 
+namespace {
+
+std::size_t CountOf(const std::vector<QStringList>& cells)
+{
+    return std::accumulate(cells.begin(), cells.end(), std::size_t(0),
+                           [](std::size_t count, const QStringList& row) { return count + std::size_t(row.size()); });
+}
+
+} // namespace
+
 bool CGenGrid::CanCopy() const
 {
     return selectionModel()->hasSelection() || currentIndex().isValid();
@@ -126,7 +139,9 @@ bool CGenGrid::Paste()
         }
     }
     StoreEditedLine();
-    m_model->Paste(top, left, cells);
+    m_model->Paste(top, left, cells, LoadString(Str::UndoPaste));
+    if (m_page)
+        m_page->GetDocument()->Say(LoadCounted(CountOf(cells), Str::CellPasted, Str::CellsPasted));
     m_modified = true; // the view tells the project when locations came in
     m_modifiedColumn = left + 1;
     StoreEditedLine();

@@ -1,14 +1,18 @@
 #include "pages/framework/grid_editors.h"
 
-#include "ks/fc/message_box.h"
 #include "pages/framework/digits_mark.h"
 #include "pages/framework/gen_grid.h"
 #include "pages/framework/grid_keys.h"
 #include "pages/framework/grid_model.h"
+#include "pages/framework/typing.h"
+#include "res/strings.h"
 
+#include <QAbstractItemView>
 #include <QApplication>
+#include <QCompleter>
 #include <QKeyEvent>
 #include <QPainter>
+#include <QScopedValueRollback>
 #include <QTimer>
 
 namespace {
@@ -21,6 +25,29 @@ QString TextOf(const QWidget* editor)
     return list ? list->currentText() : static_cast<const QLineEdit*>(editor)->text();
 }
 
+/// Keys that leave the cell do so also while names are offered; the list of offers would keep them.
+class OfferKeys : public QObject
+{
+public:
+    explicit OfferKeys(QComboBox* list) : QObject(list), m_list(list) {}
+
+protected:
+    bool eventFilter(QObject* object, QEvent* event) override
+    {
+        if (event->type() != QEvent::KeyPress)
+            return QObject::eventFilter(object, event);
+        const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
+        if (!key || !key->whileEditing)
+            return QObject::eventFilter(object, event);
+        m_list->completer()->popup()->hide();
+        QCoreApplication::sendEvent(m_list, event);
+        return true;
+    }
+
+private:
+    QComboBox* m_list;
+};
+
 /// The branch names of the network, to choose from; another name can still be typed.
 QWidget* MakeBranchList(const QStringList& names, QWidget* parent)
 {
@@ -29,6 +56,11 @@ QWidget* MakeBranchList(const QStringList& names, QWidget* parent)
     list->setLineEdit(new CGridStringEdit(list));
     list->setInsertPolicy(QComboBox::NoInsert);
     list->addItems(names);
+    // Names are offered below what is typed, and taken only when they are chosen: completed in the cell, a name that is
+    // the start of another could not be typed.
+    list->completer()->setCompletionMode(QCompleter::PopupCompletion);
+    list->completer()->setCaseSensitivity(Qt::CaseInsensitive);
+    list->completer()->popup()->installEventFilter(new OfferKeys(list));
     list->setMaxVisibleItems(DropDownHeight / list->fontMetrics().lineSpacing());
     return list;
 }
@@ -232,28 +264,35 @@ bool CGridDelegate::editorEvent(QEvent* event, QAbstractItemModel*, const QStyle
     return true;
 }
 
+QString CGridDelegate::Refusal() const
+{
+    return m_grid->Model()->Refusal(m_index.row(), m_index.column(), TextOf(m_editor));
+}
+
 bool CGridDelegate::Commit()
 {
     if (!m_editor || !m_index.isValid())
         return true;
+    if (m_telling)
+        return false;
     QWidget* editor = m_editor;
-    const QString refusal = m_grid->Model()->Refusal(m_index.row(), m_index.column(), TextOf(editor));
+    const QString refusal = Refusal();
     if (refusal.isEmpty()) {
         m_editor = nullptr; // closing takes the focus, which would commit again
         emit commitData(editor);
         emit closeEditor(editor);
         return true;
     }
-    if (!m_warned) {
-        m_warned = true; // one click may ask several times
-        QTimer::singleShot(0, this, [this] { m_warned = false; });
-        KsMessageBox(refusal, QMessageBox::Ok, m_grid);
-    }
-    if (m_editor)
-        m_editor->setFocus(Qt::OtherFocusReason);
+    const QScopedValueRollback telling(m_telling, true);
+    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(m_index.column())];
+    const QString place = LoadString(Str::CellPlace).arg(column.header()).arg(m_index.row() + 1);
+    const QString unit = column.unitText ? column.unitText() : column.style.UnitSymbol();
+    TellRefusal(*editor, refusal, RefusalDetails(place, TextOf(editor), {}, unit));
     return false;
 }
 
+/// Nobody asked before the focus went. A value is taken at once; a text that is none is told when the focus has
+/// arrived.
 void CGridDelegate::LostFocus(const QEvent* event)
 {
     const auto reason = static_cast<const QFocusEvent*>(event)->reason();
@@ -261,10 +300,20 @@ void CGridDelegate::LostFocus(const QEvent* event)
     // The editor stays while another window or its own pop-up is in front, and a click into the grid is the grid's to
     // judge: it commits before the current cell moves.
     const bool inGrid = focus && (focus == m_grid || m_grid->isAncestorOf(focus));
-    if (reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || inGrid || !m_grid->HasPage())
+    if (reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || inGrid || !m_grid->HasPage() ||
+        m_telling || !m_editor || !m_index.isValid())
         return;
-    if (Commit())
+    if (Refusal().isEmpty()) {
+        Commit();
         m_grid->StoreEditedLine();
+        return;
+    }
+    QTimer::singleShot(0, m_editor, [this] {
+        if (!m_grid->isVisible() || !m_grid->isEnabled())
+            emit closeEditor(m_editor); // what took the focus took the table away: the cell keeps its value
+        else if (!m_editor->hasFocus())
+            Commit();
+    });
 }
 
 bool CGridDelegate::eventFilter(QObject* object, QEvent* event)

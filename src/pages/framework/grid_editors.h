@@ -64,11 +64,12 @@ protected:
 
 private:
     void LostFocus(const QEvent* event);
+    QString Refusal() const; // of the open editor's text
     void PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
     void PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
 
     CGenGrid* m_grid;
     mutable QPointer<QWidget> m_editor;
     mutable QPersistentModelIndex m_index;
-    bool m_warned = false; // about this text, during the present event
+    bool m_telling = false;
 };

@@ -24,6 +24,7 @@ constexpr GridKey Keys[] = {
     {Qt::Key_Delete, None, None, GridAction::DeleteLine, false, Str::KeyDeleteLine},
     {Qt::Key_C, Ctrl, All, GridAction::Copy, false, Str::KeyCopy},
     {Qt::Key_V, Ctrl, All, GridAction::Paste, false, Str::KeyPaste},
+    {Qt::Key_Space, Shift, All, GridAction::SelectLine, false, Str::KeySelectLine},
     {Qt::Key_F3, None, None, GridAction::SearchAgain, true, Str::KeySearchAgain},
     {Qt::Key_F7, None, None, GridAction::Search, true, Str::KeySearch},
     {Qt::Key_Z, Ctrl, All, GridAction::Undo, false, Str::KeyUndo},

@@ -16,6 +16,7 @@ enum class GridAction
     CopyAndAppend,
     PasteAndAppend,
     DeleteLine,
+    SelectLine,
     Copy,
     Paste,
     SearchAgain,

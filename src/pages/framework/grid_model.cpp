@@ -11,6 +11,7 @@
 #include <QUndoStack>
 #include <algorithm>
 #include <bit>
+#include <utility>
 
 namespace {
 
@@ -22,6 +23,8 @@ bool Same(const CellValue& a, const CellValue& b)
     return x && y ? std::bit_cast<std::uint64_t>(*x) == std::bit_cast<std::uint64_t>(*y) : a == b;
 }
 
+constexpr RowKey OfferedKey = RowKey(-1); // no place and no address
+
 } // namespace
 
 CGridModel::CGridModel(QObject* parent) : QAbstractTableModel(parent) {}
@@ -31,6 +34,7 @@ void CGridModel::AddColumn(ColumnSpec column)
     const int at = int(m_columns.size());
     beginInsertColumns({}, at, at);
     m_columns.push_back(std::move(column));
+    m_offered.reset();
     endInsertColumns();
 }
 
@@ -49,7 +53,8 @@ void CGridModel::SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> r
     m_document = &document;
     m_rows = std::move(rows);
     m_pending.clear();
-    m_rowCount = m_rows ? int(m_rows->Count()) : 0;
+    m_offered.reset();
+    m_rowCount = ShownRows();
     m_revision = m_rows ? m_rows->Revision() : 0;
     endResetModel();
 }
@@ -59,12 +64,13 @@ void CGridModel::Sync()
     if (!m_rows || m_syncing)
         return;
     const QScopedValueRollback syncing(m_syncing, true);
+    m_offered.reset(); // what fills a new line may have changed
     if (m_revision != m_rows->Revision()) {
         m_revision = m_rows->Revision();
         PruneOverlay();
     }
     // Views keep their current cell, selection and scroll position by row number, so only the length matters to them.
-    const int count = int(m_rows->Count());
+    const int count = ShownRows();
     if (count > m_rowCount) {
         beginInsertRows({}, m_rowCount, count - 1);
         m_rowCount = count;
@@ -83,9 +89,27 @@ void CGridModel::Sync()
 void CGridModel::PruneOverlay()
 {
     for (auto cell = m_pending.begin(); cell != m_pending.end();) {
-        const bool gone = m_rows->RowOf(cell->first.first, cell->second.row) == m_rows->Count();
-        cell = gone ? m_pending.erase(cell) : std::next(cell);
+        cell = IsGone(cell->first, cell->second.row) ? m_pending.erase(cell) : std::next(cell);
     }
+}
+
+bool CGridModel::IsGone(const CellKey& cell, std::size_t row) const
+{
+    return cell.first == OfferedKey ? !OffersRow() : m_rows->RowOf(cell.first, row) == m_rows->Count();
+}
+
+void* CGridModel::RowObject(int row) const
+{
+    if (!IsOffered(row))
+        return m_rows->At(std::size_t(row));
+    if (!m_offered)
+        m_offered = NewLines(1);
+    return m_offered->At(0);
+}
+
+RowKey CGridModel::KeyOf(int row) const
+{
+    return IsOffered(row) ? OfferedKey : m_rows->KeyAt(std::size_t(row));
 }
 
 int CGridModel::rowCount(const QModelIndex& parent) const
@@ -101,11 +125,11 @@ int CGridModel::columnCount(const QModelIndex& parent) const
 CellValue CGridModel::Value(int row, int column) const
 {
     if (!m_pending.empty()) {
-        const auto typed = m_pending.find({m_rows->KeyAt(std::size_t(row)), column});
+        const auto typed = m_pending.find({KeyOf(row), column});
         if (typed != m_pending.end())
             return typed->second.value;
     }
-    return m_columns[std::size_t(column)].access->get(m_rows->At(std::size_t(row)));
+    return m_columns[std::size_t(column)].access->get(RowObject(row));
 }
 
 bool CGridModel::IsLocked(int row, int column) const
@@ -113,11 +137,11 @@ bool CGridModel::IsLocked(int row, int column) const
     const ColumnSpec& spec = m_columns[std::size_t(column)];
     if (!spec.locked)
         return false;
-    const RowKey key = m_rows->KeyAt(std::size_t(row));
+    const RowKey key = KeyOf(row);
     const auto typed = m_pending.lower_bound({key, 0});
     const bool edited = typed != m_pending.end() && typed->first.first == key;
     if (!edited || row < FixedRows())
-        return spec.locked(m_rows->At(std::size_t(row)));
+        return spec.locked(RowObject(row));
     // A lock follows the cells as the user sees them.
     const auto shown = m_rows->NewRows(1);
     CopyRow(row, shown->At(0));
@@ -205,8 +229,7 @@ bool CGridModel::setData(const QModelIndex& index, const QVariant& value, int ro
     const ColumnSpec& column = m_columns[std::size_t(index.column())];
     if (text == EditText(column, Value(index.row(), index.column())))
         return true;
-    const auto row = std::size_t(index.row());
-    m_pending[{m_rows->KeyAt(row), index.column()}] = {ReadCell(column, text).value, row};
+    m_pending[{KeyOf(index.row()), index.column()}] = {ReadCell(column, text).value, std::size_t(index.row())};
     emit dataChanged(index, index);
     emit CellModified(index.row() + 1, index.column() + 1);
     return true;
@@ -228,10 +251,46 @@ void CGridModel::CopyRow(int row, void* target) const
 
 bool CGridModel::Store(BlankRule rule)
 {
+    if (m_pending.empty())
+        return false;
+    const Overlay typed = std::exchange(m_pending, {});
+    const bool rows = StoreRows(typed, rule);
+    return StoreOffered(typed, rule) || rows;
+}
+
+/// The offered row enters the source, unless what was typed is what it shows anyway.
+bool CGridModel::StoreOffered(const Overlay& typed, BlankRule rule)
+{
+    const auto first = typed.lower_bound({OfferedKey, 0});
+    if (first == typed.end() || !OffersRow())
+        return false;
+    void* row = RowObject(StoredRows());
+    bool changed = false;
+    for (auto cell = first; cell != typed.end(); ++cell) {
+        const int column = cell->first.second;
+        const CellAccess& access = *m_columns[std::size_t(column)].access;
+        const CellValue value = Resolved(column, cell->second.value, rule);
+        if (Same(access.get(row), value))
+            continue;
+        access.set(row, value);
+        changed = true;
+    }
+    if (!changed)
+        return false;
+    m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, std::size_t(StoredRows()), std::move(m_offered),
+                                                  LoadString(Str::UndoEditCells)));
+    Sync();
+    return true;
+}
+
+bool CGridModel::StoreRows(const Overlay& overlay, BlankRule rule)
+{
     std::vector<CellChange> changes;
     std::size_t place = 0;
-    for (const auto& [cell, typed] : m_pending) {
+    for (const auto& [cell, typed] : overlay) {
         const auto& [row, column] = cell;
+        if (row == OfferedKey)
+            continue;
         const auto& access = m_columns[std::size_t(column)].access;
         CellValue before = access->get(m_rows->Object(row));
         CellValue after = Resolved(column, typed.value, rule);
@@ -241,17 +300,17 @@ bool CGridModel::Store(BlankRule rule)
             place = typed.row;
         changes.push_back({row, column + 1, access, std::move(before), std::move(after)});
     }
-    m_pending.clear();
     if (changes.empty())
         return false;
     m_document->UndoStack().push(new CSetCells(*m_document, m_rows, std::move(changes), place));
     return true;
 }
 
-void CGridModel::Paste(int row, int column, const std::vector<QStringList>& texts)
+void CGridModel::Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step)
 {
     Store();
-    const int last = m_rowCount;
+    const int last = StoredRows();
+    row = std::min(row, last);
     std::vector<CellChange> changes;
     auto added = row + int(texts.size()) > last ? NewLines(row + int(texts.size()) - last) : nullptr;
     for (int r = 0; r < int(texts.size()); ++r) {
@@ -270,7 +329,7 @@ void CGridModel::Paste(int row, int column, const std::vector<QStringList>& text
     }
     if (changes.empty() && !added)
         return;
-    m_document->UndoStack().beginMacro(LoadString(Str::UndoPaste));
+    m_document->UndoStack().beginMacro(step);
     if (!changes.empty())
         m_document->UndoStack().push(new CSetCells(*m_document, m_rows, std::move(changes), std::size_t(row)));
     if (added)
@@ -296,20 +355,18 @@ void CGridModel::InsertRows(int row, int count)
         return;
     Store();
     const auto at = std::size_t(std::max(row, FixedRows()));
-    m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, at, NewLines(count)));
+    m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, at, NewLines(count + OffersRow())));
+    m_document->Say(LoadCounted(std::size_t(count), Str::LineInserted, Str::LinesInserted));
     Sync();
 }
 
 void CGridModel::RemoveRows(int row, int count)
 {
     Store();
-    m_document->UndoStack().push(new CDeleteLines(*m_document, m_rows, std::size_t(row), std::size_t(count),
-                                                  m_rows->MayBeEmpty() ? nullptr : NewLines(1)));
+    count = std::min(count, StoredRows() - row);
+    if (count <= 0)
+        return;
+    m_document->UndoStack().push(new CDeleteLines(*m_document, m_rows, std::size_t(row), std::size_t(count)));
+    m_document->Say(LoadCounted(std::size_t(count), Str::LineDeleted, Str::LinesDeleted));
     Sync();
-}
-
-void CGridModel::EnsureFirstRow()
-{
-    if (m_rows && m_rows->IsEmpty())
-        m_rows->AddFirstRow(NewLines(1));
 }

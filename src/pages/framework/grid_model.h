@@ -1,5 +1,9 @@
 // The model of a grid: a window on a row source. It holds no copy of the rows; texts are made for the cells that a view
 // asks for, and what the user typed since the last store lies over the rows as a small overlay.
+//
+// A source without rows is shown with one to type into, the offered row. It is the model's own and no part of the
+// document: it shows what a new line would hold now, and enters the source, as a step to undo, when something typed
+// into it is stored.
 #pragma once
 
 #include "module/row_source.h"
@@ -56,27 +60,27 @@ public:
     /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
     bool HidesDigits(int row, int column) const;
 
+    /// Rows of the source, without the offered one.
+    int StoredRows() const { return m_rows ? int(m_rows->Count()) : 0; }
     /// Writes what the row's cells hold into an object of the source's kind.
     void CopyRow(int row, void* target) const;
 
     bool HasPending() const { return !m_pending.empty(); }
     /// Moves what was typed into the rows, as one undo step; no other cell is touched. False when nothing changed.
+    /// An offered row into which something was typed enters the source.
     bool Store(BlankRule rule = BlankRule::Zero);
-    /// Puts `texts` into the cells from (row, column) on, rows past the last one being added: one undo step.
-    /// Every text must have passed Refusal.
-    void Paste(int row, int column, const std::vector<QStringList>& texts);
+    /// Puts `texts` into the cells from (row, column) on, rows past the last one being added: one undo step with the
+    /// text `step`. Every text must have passed Refusal.
+    void Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step);
 
     /// New lines with the columns' fill values, not in the source.
     std::unique_ptr<IRowBlock> NewLines(int count) const;
-    /// New lines before `row`, with the columns' fill values: an undo step.
+    /// New lines before `row`, with the columns' fill values: an undo step. The offered row becomes a line before them.
     void InsertRows(int row, int count = 1);
     /// Rows at the top that are no lines of the table.
     int FixedRows() const { return m_rows ? int(m_rows->FixedRows()) : 0; }
-    /// An undo step; a table left without lines gets a new one, unless its source may be empty. No fixed row is among
-    /// the rows.
+    /// An undo step; the offered row stays. No fixed row is among the rows.
     void RemoveRows(int row, int count);
-    /// Gives a source without rows its one line, silently.
-    void EnsureFirstRow();
 
 signals:
     /// The user changed a cell (rows and columns from 1).
@@ -89,10 +93,19 @@ private:
         CellValue value;
         std::size_t row; // where the row was
     };
+    using Overlay = std::map<CellKey, Typed>;
 
     CellValue Resolved(int column, const CellValue& value, BlankRule rule) const;
     void PruneOverlay();
-    bool IsRow(int row) const { return m_rows && row >= 0 && std::size_t(row) < m_rows->Count(); }
+    bool OffersRow() const { return m_rows && m_rows->IsEmpty() && !m_rows->MayBeEmpty(); }
+    bool IsOffered(int row) const { return OffersRow() && row == StoredRows(); }
+    int ShownRows() const { return StoredRows() + OffersRow(); }
+    bool IsRow(int row) const { return row >= 0 && row < ShownRows(); }
+    void* RowObject(int row) const;
+    RowKey KeyOf(int row) const;
+    bool IsGone(const CellKey& cell, std::size_t row) const;
+    bool StoreOffered(const Overlay& typed, BlankRule rule);
+    bool StoreRows(const Overlay& overlay, BlankRule rule);
 
     std::vector<ColumnSpec> m_columns;
     CKavo0_hdDoc* m_document = nullptr;
@@ -100,5 +113,6 @@ private:
     int m_rowCount = 0; // as the views know it
     std::uint64_t m_revision = 0;
     bool m_syncing = false;
-    std::map<CellKey, Typed> m_pending;
+    Overlay m_pending;
+    mutable std::unique_ptr<IRowBlock> m_offered; // made when it is asked for
 };

@@ -4,6 +4,8 @@
 #include "pages/framework/gen_grid.h"
 #include "pages/framework/number_syntax.h"
 
+#include <algorithm>
+
 namespace {
 
 enum ChainageCriterion
@@ -25,6 +27,14 @@ double AsShown(const ColumnSpec& column, double chainage)
     if (chainage == NotGiven)
         return 0;
     return ReadNumber(column.style.UnitConvertFromBase_T(chainage, 1).toStdString()).value_or(chainage);
+}
+
+/// A name of a file that was not written by this editor may have small letters.
+std::string InCapitals(const std::string& name)
+{
+    const bool plain =
+        std::none_of(name.begin(), name.end(), [](char c) { return (c >= 'a' && c <= 'z') || (c & 0x80); });
+    return plain ? name : QString::fromStdString(name).toUpper().toStdString();
 }
 
 bool NamePasses(const std::string& name, const std::string& wanted, int criterion)
@@ -53,12 +63,12 @@ bool ChainagePasses(double shown, double wanted, int criterion)
 bool CGenGrid::SearchRows(int& row, const QString& name, double chainage, int chainageCriterion, int nameCriterion)
 {
     constexpr int NameColumn = 0, ChainageColumn = 1;
-    const std::string wantedName = name.toStdString();
+    const std::string wantedName = name.toUpper().toStdString(); // as the column stores them
     const ColumnSpec& chainageColumn = m_model->Columns()[ChainageColumn];
     const double wanted = AsShown(chainageColumn, chainage);
     for (row = std::max(row, m_model->FixedRows() + 1); row <= RowCount();) {
         const int line = row++ - 1;
-        if (!NamePasses(std::get<std::string>(m_model->Value(line, NameColumn)), wantedName, nameCriterion))
+        if (!NamePasses(InCapitals(std::get<std::string>(m_model->Value(line, NameColumn))), wantedName, nameCriterion))
             continue;
         if (chainageCriterion != NotUsed) {
             const CellValue value = m_model->Value(line, ChainageColumn);

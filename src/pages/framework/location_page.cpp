@@ -156,10 +156,9 @@ GridColumns CLocationPage::Grid(CGenGrid* grid)
 void CLocationPage::ShowList(CGenList* list)
 {
     m_list = list;
-    CKavo0_hdDoc& document = *GetDocument();
-    GetGrid()->Model()->SetSource(document, !list       ? nullptr
-                                            : m_globals ? MakeGlobalAndListRows(document, *list, m_globals)
-                                                        : MakeListRows(document, *list));
+    GetGrid()->Model()->SetSource(*GetDocument(), !list       ? nullptr
+                                                  : m_globals ? MakeGlobalAndListRows(*list, m_globals)
+                                                              : MakeListRows(*list));
     GetGrid()->setEnabled(list != nullptr);
 }
 
@@ -199,15 +198,8 @@ void CLocationPage::ShowParts()
 void CLocationPage::LoadFromDocument(CKavo0_hdDoc* document)
 {
     CGenPropertyPage::LoadFromDocument(document);
-    if (auto* grid = GetGrid()) {
-        grid->Model()->EnsureFirstRow();
+    if (auto* grid = GetGrid())
         grid->Reload();
-    }
-    for (const Part& part : m_parts) {
-        const auto& rows = part.grid->Model()->Rows();
-        if (rows && !rows->MayBeEmpty())
-            part.grid->Model()->EnsureFirstRow();
-    }
     ShowParts();
 }
 
@@ -228,10 +220,12 @@ void CLocationPage::Store(BlankRule rule)
 
 bool CLocationPage::OnKillActive()
 {
+    if (!Bindings().Take() || !CommitGrids())
+        return false;
     // Only what is still blank: a cell that was left blank by a move is a stored number by now.
     Store(BlankRule::Fill);
     StoreToDocument();
-    return true; // leaving a table is never refused
+    return true;
 }
 
 void CLocationPage::BrowseInto(CGenGrid& grid, int row, int column, const FileKind& kind)
@@ -247,7 +241,7 @@ void CLocationPage::BrowseInto(CGenGrid& grid, int row, int column, const FileKi
 void CLocationPage::AppendLine()
 {
     CGenGrid* grid = LinesGrid();
-    if (grid && grid->CommitEditor())
+    if (grid && LeaveField())
         grid->InsertLine();
 }
 
@@ -262,13 +256,9 @@ void CLocationPage::InsertLocation(const QString& riverName, const QString& chai
         return;
     }
     StoreToDocument();
-    GetDocument()->UndoStack().beginMacro(LoadString(Str::UndoInsert));
-    const int row = model.rowCount();
-    model.InsertRows(row);
-    model.setData(model.index(row, 0), riverName, Qt::EditRole);
-    model.setData(model.index(row, 1), chainageText, Qt::EditRole);
-    model.Store();
-    GetDocument()->UndoStack().endMacro();
+    const int row = model.StoredRows();
+    model.Paste(row, 0, {{riverName, chainageText}}, LoadString(Str::UndoInsert));
+    GetDocument()->Say(LoadString(Str::LineInserted));
     GetGrid()->SetCurrentCell(row + 1, 1);
 }
 

@@ -101,14 +101,13 @@ protected:
     template <typename T>
     GridColumns PairsGrid(CGenGrid* grid, std::vector<T>& pairs)
     {
-        return AddPart(grid, std::make_shared<VectorRows<T>>(*GetDocument(), pairs), {});
+        return AddPart(grid, std::make_shared<VectorRows<T>>(pairs), {});
     }
     /// Likewise, for a list that always shows a row: one with the defaults when it is empty.
     template <typename T>
     GridColumns ItemsGrid(CGenGrid* grid, std::vector<T>& items)
     {
-        return AddPart(grid, std::make_shared<VectorRows<T>>(*GetDocument(), items, VectorOwner{}, WhenEmpty::OneRow),
-                       {});
+        return AddPart(grid, std::make_shared<VectorRows<T>>(items, VectorOwner{}, WhenEmpty::OneRow), {});
     }
     GridColumns RowsGrid(CGenGrid* grid, std::shared_ptr<IRowSource> rows)
     {
@@ -119,8 +118,7 @@ protected:
     GridColumns PairsGrid(CGenGrid* grid, std::vector<T> Record::*pairs)
     {
         return AddPart(grid, nullptr, [this, pairs](HD_RiverPos& record) {
-            return std::make_shared<VectorRows<T>>(*GetDocument(), static_cast<Record&>(record).*pairs,
-                                                   VectorOwner{m_list, &record});
+            return std::make_shared<VectorRows<T>>(static_cast<Record&>(record).*pairs, VectorOwner{m_list, &record});
         });
     }
     /// Has the user choose the file that a cell names.

@@ -7,6 +7,7 @@
 
 #include <QApplication>
 #include <QKeyEvent>
+#include <QScrollArea>
 #include <QUndoStack>
 #include <QWhatsThis>
 #include <algorithm>
@@ -49,6 +50,11 @@ bool CGenPropertyPage::CommitGrids()
     return taken;
 }
 
+bool CGenPropertyPage::LeaveField()
+{
+    return m_bindings.TakeField() && CommitGrids();
+}
+
 CGenGrid* CGenPropertyPage::LinesGrid() const
 {
     const QWidget* focus = QApplication::focusWidget();
@@ -62,6 +68,43 @@ void CGenPropertyPage::GotoLine(int row)
 {
     if (m_grid)
         m_grid->GotoLine(row);
+}
+
+/// The grid over that list or table; null for none.
+CGenGrid* CGenPropertyPage::GridOf(const void* table) const
+{
+    const auto isOver = [table](const CGenGrid* grid) {
+        return grid && table && grid->Model()->Rows() && grid->Model()->Rows()->Data() == table;
+    };
+    if (isOver(m_grid))
+        return m_grid;
+    const auto part = std::find_if(m_partGrids.begin(), m_partGrids.end(), isOver);
+    return part == m_partGrids.end() ? nullptr : *part;
+}
+
+bool CGenPropertyPage::Shows(const ChangePlace& place) const
+{
+    return GridOf(place.data) || m_bindings.ControlFor(place.data) || (place.list && place.list == GetList());
+}
+
+void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
+{
+    QWidget* shown = m_bindings.ControlFor(place.data);
+    // A table of a line is shown once the line is current.
+    if (m_grid && place.list && place.list == GetList() && place.data != place.list && place.listRow > 0)
+        m_grid->GotoLine(place.listRow + m_grid->Model()->FixedRows());
+    if (CGenGrid* grid = GridOf(place.data)) {
+        if (place.row > 0)
+            grid->SetCurrentCell(place.row, std::min(std::max(place.column, 1), grid->ColumnCount()));
+        shown = grid;
+    }
+    if (!shown)
+        return;
+    for (QWidget* parent = shown->parentWidget(); parent; parent = parent->parentWidget())
+        if (auto* area = qobject_cast<QScrollArea*>(parent))
+            area->ensureWidgetVisible(shown);
+    if (focus && shown->isEnabled() && shown->isVisible())
+        shown->setFocus(Qt::OtherFocusReason);
 }
 
 void CGenPropertyPage::LoadFromDocument(CKavo0_hdDoc*)
@@ -97,6 +140,8 @@ void CGenPropertyPage::OnHelp()
 
 void CGenPropertyPage::UndoRedo(bool undo)
 {
+    if (!LeaveField())
+        return;
     StoreToDocument();
     if (undo)
         m_document->UndoStack().undo();
@@ -111,7 +156,7 @@ void CGenPropertyPage::OnSetActive()
 
 bool CGenPropertyPage::OnKillActive()
 {
-    if (!m_bindings.Take())
+    if (!m_bindings.Take() || !CommitGrids())
         return false;
     StoreToDocument();
     return true;

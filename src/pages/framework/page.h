@@ -3,6 +3,7 @@
 
 #include "data/global_var.h"
 #include "ks/units/edit_style.h"
+#include "module/change_place.h"
 #include "pages/framework/binding.h"
 #include "pages/framework/page_host.h"
 
@@ -37,6 +38,8 @@ public:
     CGenGrid* LinesGrid() const;
     /// Takes the texts being typed into cells; false when one is refused (the user has been told).
     bool CommitGrids();
+    /// Takes what is being typed while the page stays in front; false when it is refused (the user has been told).
+    bool LeaveField();
     /// The list that the page's grid edits; null without one.
     virtual CGenList* GetList() const { return nullptr; }
 
@@ -55,13 +58,18 @@ public:
 
     /// The help command: what the keys do on this page.
     virtual void OnHelp();
+    /// Whether what changed is edited on this page.
+    virtual bool Shows(const ChangePlace& place) const;
+    /// Brings it into view: the line, the cell, the control. With `focus` it is what is edited next.
+    virtual void Reveal(const ChangePlace& place, bool focus);
 
     /// Takes what is being typed, then undoes or redoes one step of the document.
     void UndoRedo(bool undo);
 
     /// The page comes to the front: menus, then LoadFromDocument.
     virtual void OnSetActive();
-    /// The page is about to be left; false keeps it (a field holds something wrong).
+    /// The page is about to be left, saved or closed: everything typed is taken. False keeps the page: a text is no
+    /// value (the user has been told, and the field or cell has the focus).
     virtual bool OnKillActive();
 
 protected:
@@ -91,6 +99,7 @@ protected:
 
 private:
     void UnitsChanged();
+    CGenGrid* GridOf(const void* table) const;
 
     CKavo0_hdDoc* m_document;
     IPageHost* m_host = nullptr;

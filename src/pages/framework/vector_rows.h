@@ -1,7 +1,7 @@
 // The elements of a vector as the rows of a grid: the pairs of a table, the entries of a list without locations.
 #pragma once
 
-#include "module/document.h"
+#include "data/gen_list.h"
 #include "module/row_source.h"
 
 #include <algorithm>
@@ -15,11 +15,11 @@ struct VectorOwner
     HD_RiverPos* record = nullptr;
 };
 
-/// What a source of rows shows that has none.
+/// What a grid shows of a source without rows.
 enum class WhenEmpty
 {
     Nothing,
-    OneRow
+    OneRow // to type into
 };
 
 /// A vector of the document, which exists as long as the document, or as long as the record that owns it.
@@ -29,9 +29,8 @@ template <typename T>
 class VectorRows : public IRowSource
 {
 public:
-    VectorRows(CKavo0_hdDoc& document, std::vector<T>& rows, VectorOwner owner = {},
-               WhenEmpty whenEmpty = WhenEmpty::Nothing)
-        : m_document(document), m_rows(rows), m_owner(owner), m_whenEmpty(whenEmpty)
+    explicit VectorRows(std::vector<T>& rows, VectorOwner owner = {}, WhenEmpty whenEmpty = WhenEmpty::Nothing)
+        : m_rows(rows), m_owner(owner), m_whenEmpty(whenEmpty)
     {
     }
 
@@ -43,7 +42,6 @@ public:
     RowKey KeyAt(std::size_t row) override { return row; }
     void* Object(RowKey key) override { return At(key); }
     std::size_t RowOf(RowKey key, std::size_t) override { return std::min(std::size_t(key), Count()); }
-    void Touch(RowKey) override { TouchOwner(); }
 
     std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override
     {
@@ -51,7 +49,6 @@ public:
     }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {
-        TouchOwner();
         row = std::min(row, Count());
         auto& rows = static_cast<Block&>(*block).rows;
         m_rows.insert(m_rows.begin() + std::ptrdiff_t(row), std::make_move_iterator(rows.begin()),
@@ -60,23 +57,13 @@ public:
     }
     std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
     {
-        TouchOwner();
         const auto first = m_rows.begin() + std::ptrdiff_t(row), last = first + std::ptrdiff_t(count);
         std::vector<T> taken(std::make_move_iterator(first), std::make_move_iterator(last));
         m_rows.erase(first, last);
         return std::make_unique<Block>(std::move(taken));
     }
 
-    void AddFirstRow(std::unique_ptr<IRowBlock> block) override
-    {
-        Put(0, std::move(block));
-        m_document.AddPlaceholderRow(&m_rows);
-    }
-    void TakeFirstRow() override
-    {
-        if (m_document.IsPlaceholderRow(&m_rows))
-            Take(0, 1);
-    }
+    const void* Data() const override { return &m_rows; }
     bool MayBeEmpty() const override { return m_whenEmpty == WhenEmpty::Nothing; }
     CGenList* List() const override { return m_owner.list; }
     std::size_t ListRow(std::size_t row) const override
@@ -98,14 +85,6 @@ private:
         std::vector<T> rows;
     };
 
-    void TouchOwner()
-    {
-        m_document.PlaceholderRowTouched(&m_rows);
-        if (m_owner.record)
-            m_document.PlaceholderTouched(*m_owner.record);
-    }
-
-    CKavo0_hdDoc& m_document;
     std::vector<T>& m_rows;
     VectorOwner m_owner;
     WhenEmpty m_whenEmpty;

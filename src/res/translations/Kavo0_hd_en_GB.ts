@@ -12,10 +12,6 @@
             <translation>Formula</translation>
         </message>
         <message>
-            <source>Re&amp;sistance formula:</source>
-            <translation>Re&amp;sistance formula:</translation>
-        </message>
-        <message>
             <source>Manning's M</source>
             <translation>Manning's M</translation>
         </message>
@@ -58,6 +54,10 @@
         <message>
             <source>Local Values</source>
             <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Re&amp;sistance formula:</source>
+            <translation>Re&amp;sistance formula:</translation>
         </message>
     </context>
     <context>
@@ -154,10 +154,6 @@
             <translation>&amp;Alpha:</translation>
         </message>
         <message>
-            <source>Theta:</source>
-            <translation>Theta:</translation>
-        </message>
-        <message>
             <source>E&amp;ps:</source>
             <translation>E&amp;ps:</translation>
         </message>
@@ -208,6 +204,10 @@
         <message>
             <source>(Energy - Not Avail.)</source>
             <translation>(Energy - Not Avail.)</translation>
+        </message>
+        <message>
+            <source>Theta:</source>
+            <translation>Theta:</translation>
         </message>
     </context>
     <context>
@@ -268,16 +268,16 @@
             <translation>&amp;Add</translation>
         </message>
         <message>
+            <source>Lines of the set-up</source>
+            <translation>Lines of the set-up</translation>
+        </message>
+        <message>
             <source>&amp;Duplicate</source>
             <translation>&amp;Duplicate</translation>
         </message>
         <message>
             <source>Dele&amp;te</source>
             <translation>Dele&amp;te</translation>
-        </message>
-        <message>
-            <source>Lines of the set-up</source>
-            <translation>Lines of the set-up</translation>
         </message>
     </context>
     <context>
@@ -388,12 +388,16 @@
             <translation>Global Values</translation>
         </message>
         <message>
-            <source>Wa&amp;ter Level</source>
-            <translation>Wa&amp;ter Level</translation>
-        </message>
-        <message>
             <source>Water &amp;Depth</source>
             <translation>Water &amp;Depth</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Wa&amp;ter Level</source>
+            <translation>Wa&amp;ter Level</translation>
         </message>
         <message>
             <source>Wate&amp;r Level</source>
@@ -407,10 +411,6 @@
             <source>Di&amp;scharge:</source>
             <translation>Di&amp;scharge:</translation>
         </message>
-        <message>
-            <source>Local Values</source>
-            <translation>Local Values</translation>
-        </message>
     </context>
     <context>
         <name>CKlrInitPage</name>
@@ -421,10 +421,6 @@
         <message>
             <source>Global values</source>
             <translation>Global values</translation>
-        </message>
-        <message>
-            <source>Wate&amp;r level (h1)</source>
-            <translation>Wate&amp;r level (h1)</translation>
         </message>
         <message>
             <source>&amp;Interface level (h0)</source>
@@ -442,6 +438,10 @@
             <source>Local values</source>
             <translation>Local values</translation>
         </message>
+        <message>
+            <source>Wate&amp;r level (h1)</source>
+            <translation>Wate&amp;r level (h1)</translation>
+        </message>
     </context>
     <context>
         <name>CKlrParamPage</name>
@@ -452,14 +452,6 @@
         <message>
             <source>&amp;Interface Friction Factor</source>
             <translation>&amp;Interface Friction Factor</translation>
-        </message>
-        <message>
-            <source>&amp;Maximum volume of entrainment</source>
-            <translation>&amp;Maximum volume of entrainment</translation>
-        </message>
-        <message>
-            <source>Ma&amp;ximum entrainment velocity</source>
-            <translation>Ma&amp;ximum entrainment velocity</translation>
         </message>
         <message>
             <source>Minimum layer &amp;thickness for entrainment cutoff</source>
@@ -508,6 +500,14 @@
         <message>
             <source>Local values</source>
             <translation>Local values</translation>
+        </message>
+        <message>
+            <source>&amp;Maximum volume of entrainment</source>
+            <translation>&amp;Maximum volume of entrainment</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum entrainment velocity</source>
+            <translation>Ma&amp;ximum entrainment velocity</translation>
         </message>
     </context>
     <context>
@@ -558,10 +558,6 @@
             <translation>Map output files</translation>
         </message>
         <message>
-            <source>&amp;Apply DEM input data for ground elevations</source>
-            <translation>&amp;Apply DEM input data for ground elevations</translation>
-        </message>
-        <message>
             <source>Input topography</source>
             <translation>Input topography</translation>
         </message>
@@ -576,6 +572,10 @@
         <message>
             <source>&amp;Map additional flooded areas using help grid from KVR GIS</source>
             <translation>&amp;Map additional flooded areas using help grid from KVR GIS</translation>
+        </message>
+        <message>
+            <source>&amp;Apply DEM input data for ground elevations</source>
+            <translation>&amp;Apply DEM input data for ground elevations</translation>
         </message>
         <message>
             <source>Hel&amp;p grid</source>
@@ -731,16 +731,8 @@
             <translation>&amp;Beta_Limit:</translation>
         </message>
         <message>
-            <source>Fac_&amp;0:</source>
-            <translation>Fac_&amp;0:</translation>
-        </message>
-        <message>
             <source>&amp;Qconv_Factor:</source>
             <translation>&amp;Qconv_Factor:</translation>
-        </message>
-        <message>
-            <source>Hc&amp;onv_Factor:</source>
-            <translation>Hc&amp;onv_Factor:</translation>
         </message>
         <message>
             <source>&amp;Min_Hconv_In_Branch:</source>
@@ -763,24 +755,12 @@
             <translation>&amp;Use energy equation</translation>
         </message>
         <message>
-            <source>Model contraction and ex&amp;pansion losses</source>
-            <translation>Model contraction and ex&amp;pansion losses</translation>
-        </message>
-        <message>
             <source>&amp;Allow upstream slope</source>
             <translation>&amp;Allow upstream slope</translation>
         </message>
         <message>
-            <source>Velocit&amp;y distribution coefficient based on conveyance</source>
-            <translation>Velocit&amp;y distribution coefficient based on conveyance</translation>
-        </message>
-        <message>
             <source>&amp;No suppression of convective terms</source>
             <translation>&amp;No suppression of convective terms</translation>
-        </message>
-        <message>
-            <source>Fr&amp;iction slope evaluation</source>
-            <translation>Fr&amp;iction slope evaluation</translation>
         </message>
         <message>
             <source>Default</source>
@@ -817,6 +797,26 @@
         <message>
             <source>Load branch an&amp;d chainages</source>
             <translation>Load branch an&amp;d chainages</translation>
+        </message>
+        <message>
+            <source>Fac_&amp;0:</source>
+            <translation>Fac_&amp;0:</translation>
+        </message>
+        <message>
+            <source>Hc&amp;onv_Factor:</source>
+            <translation>Hc&amp;onv_Factor:</translation>
+        </message>
+        <message>
+            <source>Model contraction and ex&amp;pansion losses</source>
+            <translation>Model contraction and ex&amp;pansion losses</translation>
+        </message>
+        <message>
+            <source>Velocit&amp;y distribution coefficient based on conveyance</source>
+            <translation>Velocit&amp;y distribution coefficient based on conveyance</translation>
+        </message>
+        <message>
+            <source>Fr&amp;iction slope evaluation</source>
+            <translation>Fr&amp;iction slope evaluation</translation>
         </message>
     </context>
     <context>
@@ -1007,10 +1007,6 @@
             <translation>&amp;Delimiter in output file</translation>
         </message>
         <message>
-            <source>Width of col&amp;umns</source>
-            <translation>Width of col&amp;umns</translation>
-        </message>
-        <message>
             <source>&amp;Minimum</source>
             <translation>&amp;Minimum</translation>
         </message>
@@ -1031,16 +1027,8 @@
             <translation>Time period in output</translation>
         </message>
         <message>
-            <source>Limited output &amp;period</source>
-            <translation>Limited output &amp;period</translation>
-        </message>
-        <message>
             <source>&amp;Start</source>
             <translation>&amp;Start</translation>
-        </message>
-        <message>
-            <source>E&amp;nd</source>
-            <translation>E&amp;nd</translation>
         </message>
         <message>
             <source>Items in output</source>
@@ -1066,13 +1054,21 @@
             <source>All ex&amp;cepted those from the list</source>
             <translation>All ex&amp;cepted those from the list</translation>
         </message>
+        <message>
+            <source>Width of col&amp;umns</source>
+            <translation>Width of col&amp;umns</translation>
+        </message>
+        <message>
+            <source>Limited output &amp;period</source>
+            <translation>Limited output &amp;period</translation>
+        </message>
+        <message>
+            <source>E&amp;nd</source>
+            <translation>E&amp;nd</translation>
+        </message>
     </context>
     <context>
         <name>CWLCurvePage</name>
-        <message>
-            <source>Enabling water level &amp;increment due to curve</source>
-            <translation>Enabling water level &amp;increment due to curve</translation>
-        </message>
         <message>
             <source>System Definition</source>
             <translation>System Definition</translation>
@@ -1082,28 +1078,32 @@
             <translation>Average &amp;Range</translation>
         </message>
         <message>
-            <source>Water &amp;Surface width</source>
-            <translation>Water &amp;Surface width</translation>
-        </message>
-        <message>
             <source>&amp;Curvature Radius</source>
             <translation>&amp;Curvature Radius</translation>
-        </message>
-        <message>
-            <source>Veloci&amp;ty</source>
-            <translation>Veloci&amp;ty</translation>
         </message>
         <message>
             <source>Values</source>
             <translation>Values</translation>
         </message>
         <message>
-            <source>Load &amp;Branch &amp;&amp; Chainage</source>
-            <translation>Load &amp;Branch &amp;&amp; Chainage</translation>
-        </message>
-        <message>
             <source>Water level increment due to curve</source>
             <translation>Water level increment due to curve</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to curve</source>
+            <translation>Enabling water level &amp;increment due to curve</translation>
+        </message>
+        <message>
+            <source>Water &amp;Surface width</source>
+            <translation>Water &amp;Surface width</translation>
+        </message>
+        <message>
+            <source>Veloci&amp;ty</source>
+            <translation>Veloci&amp;ty</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>Load &amp;Branch &amp;&amp; Chainage</translation>
         </message>
     </context>
     <context>
@@ -1119,10 +1119,6 @@
     </context>
     <context>
         <name>CWLSandBarsPage</name>
-        <message>
-            <source>Enabling water level &amp;increment due to sand bars</source>
-            <translation>Enabling water level &amp;increment due to sand bars</translation>
-        </message>
         <message>
             <source>Method</source>
             <translation>Method</translation>
@@ -1140,12 +1136,16 @@
             <translation>Values</translation>
         </message>
         <message>
-            <source>Load &amp;Branch &amp;&amp; Chainage</source>
-            <translation>Load &amp;Branch &amp;&amp; Chainage</translation>
-        </message>
-        <message>
             <source>Water level increment due to sand bars</source>
             <translation>Water level increment due to sand bars</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to sand bars</source>
+            <translation>Enabling water level &amp;increment due to sand bars</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>Load &amp;Branch &amp;&amp; Chainage</translation>
         </message>
     </context>
     <context>
@@ -1157,10 +1157,6 @@
         <message>
             <source>Global Value</source>
             <translation>Global Value</translation>
-        </message>
-        <message>
-            <source>Wave &amp;Approximation:</source>
-            <translation>Wave &amp;Approximation:</translation>
         </message>
         <message>
             <source>High Order Fully Dynamic</source>
@@ -1181,6 +1177,10 @@
         <message>
             <source>Local Values</source>
             <translation>Local Values</translation>
+        </message>
+        <message>
+            <source>Wave &amp;Approximation:</source>
+            <translation>Wave &amp;Approximation:</translation>
         </message>
     </context>
     <context>
@@ -1809,10 +1809,6 @@ Nothing was loaded.</translation>
             <translation>Reach Lengths</translation>
         </message>
         <message>
-            <source>%1 locations added, %2 were there already.</source>
-            <translation>%1 locations added, %2 were there already.</translation>
-        </message>
-        <message>
             <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
             <translation>%1 locations added, %2 were there already; %3 of these have new values.</translation>
         </message>
@@ -1941,6 +1937,10 @@ DEM
 (h,p,q)</translation>
         </message>
         <message>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1 locations added, %2 were there already.</translation>
+        </message>
+        <message>
             <source>Invalid DateTime</source>
             <translation>Invalid DateTime</translation>
         </message>
@@ -1957,12 +1957,6 @@ DEM
 The simulation will write over it. Use this name?</source>
             <translation>%1 already exists.
 The simulation will write over it. Use this name?</translation>
-        </message>
-        <message>
-            <source>%1 already exists.
-The simulation will read it. Use this name?</source>
-            <translation>%1 already exists.
-The simulation will read it. Use this name?</translation>
         </message>
         <message>
             <source>Choose a File</source>
@@ -2087,6 +2081,154 @@ Right X-Y coordinates
 User defined marks</translation>
         </message>
         <message>
+        <source>%1: &quot;%2&quot; was typed.</source>
+        <translation>%1: &quot;%2&quot; was typed.</translation>
+    </message>
+    <message>
+        <source>Allowed: %1</source>
+        <translation>Allowed: %1</translation>
+    </message>
+    <message>
+        <source>%1 to %2</source>
+        <translation>%1 to %2</translation>
+    </message>
+    <message>
+        <source>at least %1</source>
+        <translation>at least %1</translation>
+    </message>
+    <message>
+        <source>at most %1</source>
+        <translation>at most %1</translation>
+    </message>
+    <message>
+        <source>%1, line %2</source>
+        <translation>%1, line %2</translation>
+    </message>
+    <message>
+        <source>Select the line</source>
+        <translation>Select the line</translation>
+    </message>
+        <message>
+            <source>%1 does not exist.
+The simulation will look for it. Use this name?</source>
+            <translation>%1 does not exist.
+The simulation will look for it. Use this name?</translation>
+        </message>
+        <message>
+            <source>Could not write &quot;%1&quot;: %2.</source>
+            <translation>Could not write &quot;%1&quot;: %2.</translation>
+        </message>
+        <message>
+            <source>Could not read &quot;%1&quot;: %2.</source>
+            <translation>Could not read &quot;%1&quot;: %2.</translation>
+        </message>
+        <message>
+            <source>The new content is complete in &quot;%1&quot;.</source>
+            <translation>The new content is complete in &quot;%1&quot;.</translation>
+        </message>
+        <message>
+            <source>%1 is now %2</source>
+            <translation>%1 is now %2</translation>
+        </message>
+        <message>
+            <source>%1 could not be read when it was opened; what is shown is not its content.
+Saving replaces it. As it is now it stays in a copy beside it, %2.
+Save?</source>
+            <translation>%1 could not be read when it was opened; what is shown is not its content.
+Saving replaces it. As it is now it stays in a copy beside it, %2.
+Save?</translation>
+        </message>
+        <message>
+            <source>%1 holds values that were not taken as they stand (places: %2).
+Saving writes what is shown instead. As it is now the file stays in a copy beside it, %3.
+Save?</source>
+            <translation>%1 holds values that were not taken as they stand (places: %2).
+Saving writes what is shown instead. As it is now the file stays in a copy beside it, %3.
+Save?</translation>
+        </message>
+        <message>
+            <source>%1 could not be read. What is shown here are default values, not its content.
+%2</source>
+            <translation>%1 could not be read. What is shown here are default values, not its content.
+%2</translation>
+        </message>
+        <message>
+            <source>Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.</source>
+            <translation>Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.</translation>
+        </message>
+        <message>
+            <source>The file as it was before this save is kept in %1.</source>
+            <translation>The file as it was before this save is kept in %1.</translation>
+        </message>
+        <message>
+            <source>Show List...</source>
+            <translation>Show List...</translation>
+        </message>
+        <message>
+            <source>Edit Default Values</source>
+            <translation>Edit Default Values</translation>
+        </message>
+        <message>
+            <source>Close this bar</source>
+            <translation>Close this bar</translation>
+        </message>
+        <message>
+            <source>%1: Values Not Taken as They Stand</source>
+            <translation>%1: Values Not Taken as They Stand</translation>
+        </message>
+        <message>
+            <source>These places of %1 are not written as they should be. Each row says what stands there, what was expected, and what is used instead. Nothing is changed in the file unless you save; a save keeps the file as it is in a copy.</source>
+            <translation>These places of %1 are not written as they should be. Each row says what stands there, what was expected, and what is used instead. Nothing is changed in the file unless you save; a save keeps the file as it is in a copy.</translation>
+        </message>
+        <message>
+            <source>Line
+Column
+Section
+Keyword
+Parameter
+In the file
+Expected
+Used instead</source>
+            <translation>Line
+Column
+Section
+Keyword
+Parameter
+In the file
+Expected
+Used instead</translation>
+        </message>
+        <message>
+            <source>a number
+an integer
+true or false
+a text in quotes
+a file name in &lt; &gt;
+six integers
+a count that fits the %1 parameters behind it
+a flag for each of %1 titles
+a target [%1]
+more parameters, or a smaller count</source>
+            <translation>a number
+an integer
+true or false
+a text in quotes
+a file name in &lt; &gt;
+six integers
+a count that fits the %1 parameters behind it
+a flag for each of %1 titles
+a target [%1]
+more parameters, or a smaller count</translation>
+        </message>
+        <message>
+            <source>&amp;Copy</source>
+            <translation>&amp;Copy</translation>
+        </message>
+        <message>
+            <source>C&amp;lose</source>
+            <translation>C&amp;lose</translation>
+        </message>
+        <message>
             <source>Full value: %1</source>
             <translation>Full value: %1</translation>
         </message>
@@ -2136,5 +2278,77 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
             <source>In a table</source>
             <translation>In a table</translation>
         </message>
-    </context>
+        <message>
+            <source>Undone: %1</source>
+            <translation>Undone: %1</translation>
+        </message>
+        <message>
+            <source>Redone: %1</source>
+            <translation>Redone: %1</translation>
+        </message>
+        <message>
+            <source>Line inserted</source>
+            <translation>Line inserted</translation>
+        </message>
+        <message>
+            <source>%1 lines inserted</source>
+            <translation>%1 lines inserted</translation>
+        </message>
+        <message>
+            <source>Line deleted</source>
+            <translation>Line deleted</translation>
+        </message>
+        <message>
+            <source>%1 lines deleted</source>
+            <translation>%1 lines deleted</translation>
+        </message>
+        <message>
+            <source>1 cell pasted</source>
+            <translation>1 cell pasted</translation>
+        </message>
+        <message>
+            <source>%1 cells pasted</source>
+            <translation>%1 cells pasted</translation>
+        </message>
+        <message>
+            <source>Saved</source>
+            <translation>Saved</translation>
+        </message>
+        <message>
+            <source>Saved; %1 (undo brings back what was dropped)</source>
+            <translation>Saved; %1 (undo brings back what was dropped)</translation>
+        </message>
+        <message>
+            <source>, </source>
+            <translation>, </translation>
+        </message>
+        <message>
+            <source>1 line without location dropped</source>
+            <translation>1 line without location dropped</translation>
+        </message>
+        <message>
+            <source>%1 lines without location dropped</source>
+            <translation>%1 lines without location dropped</translation>
+        </message>
+        <message>
+            <source>1 mark without title dropped</source>
+            <translation>1 mark without title dropped</translation>
+        </message>
+        <message>
+            <source>%1 marks without title dropped</source>
+            <translation>%1 marks without title dropped</translation>
+        </message>
+        <message>
+            <source>1 row without file name dropped</source>
+            <translation>1 row without file name dropped</translation>
+        </message>
+        <message>
+            <source>%1 rows without file name dropped</source>
+            <translation>%1 rows without file name dropped</translation>
+        </message>
+        <message>
+            <source>Marks without a title (%1) and the levels below them are left out when the file is saved.</source>
+            <translation>Marks without a title (%1) and the levels below them are left out when the file is saved.</translation>
+        </message>
+</context>
 </TS>

@@ -12,10 +12,6 @@
             <translation>抵抗則</translation>
         </message>
         <message>
-            <source>Re&amp;sistance formula:</source>
-            <translation>抵抗則(&amp;S):</translation>
-        </message>
-        <message>
             <source>Manning's M</source>
             <translation>マニングのM(粗度係数の逆数)</translation>
         </message>
@@ -58,6 +54,10 @@
         <message>
             <source>Local Values</source>
             <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Re&amp;sistance formula:</source>
+            <translation>抵抗則(&amp;S):</translation>
         </message>
     </context>
     <context>
@@ -154,10 +154,6 @@
             <translation>Alpha(&amp;A):</translation>
         </message>
         <message>
-            <source>Theta:</source>
-            <translation>Theta:</translation>
-        </message>
-        <message>
             <source>E&amp;ps:</source>
             <translation>Eps(&amp;P):</translation>
         </message>
@@ -208,6 +204,10 @@
         <message>
             <source>(Energy - Not Avail.)</source>
             <translation>(エネルギー - 利用不可)</translation>
+        </message>
+        <message>
+            <source>Theta:</source>
+            <translation>Theta:</translation>
         </message>
     </context>
     <context>
@@ -268,16 +268,16 @@
             <translation>追加(&amp;A)</translation>
         </message>
         <message>
+            <source>Lines of the set-up</source>
+            <translation>設定の行</translation>
+        </message>
+        <message>
             <source>&amp;Duplicate</source>
             <translation>複製(&amp;D)</translation>
         </message>
         <message>
             <source>Dele&amp;te</source>
             <translation>削除(&amp;T)</translation>
-        </message>
-        <message>
-            <source>Lines of the set-up</source>
-            <translation>設定の行</translation>
         </message>
     </context>
     <context>
@@ -388,12 +388,16 @@
             <translation>全体値</translation>
         </message>
         <message>
-            <source>Wa&amp;ter Level</source>
-            <translation>水位(&amp;T)</translation>
-        </message>
-        <message>
             <source>Water &amp;Depth</source>
             <translation>水深(&amp;D)</translation>
+        </message>
+        <message>
+            <source>Local Values</source>
+            <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Wa&amp;ter Level</source>
+            <translation>水位(&amp;T)</translation>
         </message>
         <message>
             <source>Wate&amp;r Level</source>
@@ -407,10 +411,6 @@
             <source>Di&amp;scharge:</source>
             <translation>流量(&amp;S):</translation>
         </message>
-        <message>
-            <source>Local Values</source>
-            <translation>地点別の値</translation>
-        </message>
     </context>
     <context>
         <name>CKlrInitPage</name>
@@ -421,10 +421,6 @@
         <message>
             <source>Global values</source>
             <translation>全体値</translation>
-        </message>
-        <message>
-            <source>Wate&amp;r level (h1)</source>
-            <translation>水位(h1)(&amp;R)</translation>
         </message>
         <message>
             <source>&amp;Interface level (h0)</source>
@@ -442,6 +438,10 @@
             <source>Local values</source>
             <translation>地点別の値</translation>
         </message>
+        <message>
+            <source>Wate&amp;r level (h1)</source>
+            <translation>水位(h1)(&amp;R)</translation>
+        </message>
     </context>
     <context>
         <name>CKlrParamPage</name>
@@ -452,14 +452,6 @@
         <message>
             <source>&amp;Interface Friction Factor</source>
             <translation>界面摩擦係数(&amp;I)</translation>
-        </message>
-        <message>
-            <source>&amp;Maximum volume of entrainment</source>
-            <translation>最大連行量(&amp;M)</translation>
-        </message>
-        <message>
-            <source>Ma&amp;ximum entrainment velocity</source>
-            <translation>最大連行速度(&amp;X)</translation>
         </message>
         <message>
             <source>Minimum layer &amp;thickness for entrainment cutoff</source>
@@ -508,6 +500,14 @@
         <message>
             <source>Local values</source>
             <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>&amp;Maximum volume of entrainment</source>
+            <translation>最大連行量(&amp;M)</translation>
+        </message>
+        <message>
+            <source>Ma&amp;ximum entrainment velocity</source>
+            <translation>最大連行速度(&amp;X)</translation>
         </message>
     </context>
     <context>
@@ -558,10 +558,6 @@
             <translation>マップ出力ファイル</translation>
         </message>
         <message>
-            <source>&amp;Apply DEM input data for ground elevations</source>
-            <translation>地盤高にDEM入力データを使用する(&amp;A)</translation>
-        </message>
-        <message>
             <source>Input topography</source>
             <translation>入力地形</translation>
         </message>
@@ -576,6 +572,10 @@
         <message>
             <source>&amp;Map additional flooded areas using help grid from KVR GIS</source>
             <translation>KVR GISの補助グリッドで追加の浸水域を表示する(&amp;M)</translation>
+        </message>
+        <message>
+            <source>&amp;Apply DEM input data for ground elevations</source>
+            <translation>地盤高にDEM入力データを使用する(&amp;A)</translation>
         </message>
         <message>
             <source>Hel&amp;p grid</source>
@@ -731,16 +731,8 @@
             <translation>Beta_Limit(&amp;B):</translation>
         </message>
         <message>
-            <source>Fac_&amp;0:</source>
-            <translation>Fac_0(&amp;0):</translation>
-        </message>
-        <message>
             <source>&amp;Qconv_Factor:</source>
             <translation>Qconv_Factor(&amp;Q):</translation>
-        </message>
-        <message>
-            <source>Hc&amp;onv_Factor:</source>
-            <translation>Hconv_Factor(&amp;O):</translation>
         </message>
         <message>
             <source>&amp;Min_Hconv_In_Branch:</source>
@@ -763,24 +755,12 @@
             <translation>エネルギー式を用いる(&amp;U)</translation>
         </message>
         <message>
-            <source>Model contraction and ex&amp;pansion losses</source>
-            <translation>急縮・急拡損失を考慮する(&amp;P)</translation>
-        </message>
-        <message>
             <source>&amp;Allow upstream slope</source>
             <translation>上流向きの水面勾配を許す(&amp;A)</translation>
         </message>
         <message>
-            <source>Velocit&amp;y distribution coefficient based on conveyance</source>
-            <translation>通水能から流速分布係数を求める(&amp;Y)</translation>
-        </message>
-        <message>
             <source>&amp;No suppression of convective terms</source>
             <translation>移流項を抑制しない(&amp;N)</translation>
-        </message>
-        <message>
-            <source>Fr&amp;iction slope evaluation</source>
-            <translation>摩擦勾配の評価(&amp;I)</translation>
         </message>
         <message>
             <source>Default</source>
@@ -817,6 +797,26 @@
         <message>
             <source>Load branch an&amp;d chainages</source>
             <translation>河川名と追加距離の読み込み(&amp;D)</translation>
+        </message>
+        <message>
+            <source>Fac_&amp;0:</source>
+            <translation>Fac_0(&amp;0):</translation>
+        </message>
+        <message>
+            <source>Hc&amp;onv_Factor:</source>
+            <translation>Hconv_Factor(&amp;O):</translation>
+        </message>
+        <message>
+            <source>Model contraction and ex&amp;pansion losses</source>
+            <translation>急縮・急拡損失を考慮する(&amp;P)</translation>
+        </message>
+        <message>
+            <source>Velocit&amp;y distribution coefficient based on conveyance</source>
+            <translation>通水能から流速分布係数を求める(&amp;Y)</translation>
+        </message>
+        <message>
+            <source>Fr&amp;iction slope evaluation</source>
+            <translation>摩擦勾配の評価(&amp;I)</translation>
         </message>
     </context>
     <context>
@@ -1007,10 +1007,6 @@
             <translation>区切り文字(&amp;D)</translation>
         </message>
         <message>
-            <source>Width of col&amp;umns</source>
-            <translation>列幅(&amp;U)</translation>
-        </message>
-        <message>
             <source>&amp;Minimum</source>
             <translation>最小値(&amp;M)</translation>
         </message>
@@ -1031,16 +1027,8 @@
             <translation>出力期間</translation>
         </message>
         <message>
-            <source>Limited output &amp;period</source>
-            <translation>出力期間を限定する(&amp;P)</translation>
-        </message>
-        <message>
             <source>&amp;Start</source>
             <translation>開始(&amp;S)</translation>
-        </message>
-        <message>
-            <source>E&amp;nd</source>
-            <translation>終了(&amp;N)</translation>
         </message>
         <message>
             <source>Items in output</source>
@@ -1066,13 +1054,21 @@
             <source>All ex&amp;cepted those from the list</source>
             <translation>一覧のものを除くすべて(&amp;C)</translation>
         </message>
+        <message>
+            <source>Width of col&amp;umns</source>
+            <translation>列幅(&amp;U)</translation>
+        </message>
+        <message>
+            <source>Limited output &amp;period</source>
+            <translation>出力期間を限定する(&amp;P)</translation>
+        </message>
+        <message>
+            <source>E&amp;nd</source>
+            <translation>終了(&amp;N)</translation>
+        </message>
     </context>
     <context>
         <name>CWLCurvePage</name>
-        <message>
-            <source>Enabling water level &amp;increment due to curve</source>
-            <translation>湾曲による水位上昇を考慮する(&amp;I)</translation>
-        </message>
         <message>
             <source>System Definition</source>
             <translation>システムで決定</translation>
@@ -1082,28 +1078,32 @@
             <translation>平均範囲(&amp;R)</translation>
         </message>
         <message>
-            <source>Water &amp;Surface width</source>
-            <translation>水面幅(&amp;S)</translation>
-        </message>
-        <message>
             <source>&amp;Curvature Radius</source>
             <translation>曲率半径(&amp;C)</translation>
-        </message>
-        <message>
-            <source>Veloci&amp;ty</source>
-            <translation>流速(&amp;T)</translation>
         </message>
         <message>
             <source>Values</source>
             <translation>値</translation>
         </message>
         <message>
-            <source>Load &amp;Branch &amp;&amp; Chainage</source>
-            <translation>河道と距離標を読み込む(&amp;B)</translation>
-        </message>
-        <message>
             <source>Water level increment due to curve</source>
             <translation>湾曲による水位上昇</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to curve</source>
+            <translation>湾曲による水位上昇を考慮する(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Water &amp;Surface width</source>
+            <translation>水面幅(&amp;S)</translation>
+        </message>
+        <message>
+            <source>Veloci&amp;ty</source>
+            <translation>流速(&amp;T)</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>河道と距離標を読み込む(&amp;B)</translation>
         </message>
     </context>
     <context>
@@ -1119,10 +1119,6 @@
     </context>
     <context>
         <name>CWLSandBarsPage</name>
-        <message>
-            <source>Enabling water level &amp;increment due to sand bars</source>
-            <translation>砂州による水位上昇を考慮する(&amp;I)</translation>
-        </message>
         <message>
             <source>Method</source>
             <translation>方法</translation>
@@ -1140,12 +1136,16 @@
             <translation>値</translation>
         </message>
         <message>
-            <source>Load &amp;Branch &amp;&amp; Chainage</source>
-            <translation>河道と距離標を読み込む(&amp;B)</translation>
-        </message>
-        <message>
             <source>Water level increment due to sand bars</source>
             <translation>砂州による水位上昇</translation>
+        </message>
+        <message>
+            <source>Enabling water level &amp;increment due to sand bars</source>
+            <translation>砂州による水位上昇を考慮する(&amp;I)</translation>
+        </message>
+        <message>
+            <source>Load &amp;Branch &amp;&amp; Chainage</source>
+            <translation>河道と距離標を読み込む(&amp;B)</translation>
         </message>
     </context>
     <context>
@@ -1157,10 +1157,6 @@
         <message>
             <source>Global Value</source>
             <translation>全体値</translation>
-        </message>
-        <message>
-            <source>Wave &amp;Approximation:</source>
-            <translation>波動近似(&amp;A):</translation>
         </message>
         <message>
             <source>High Order Fully Dynamic</source>
@@ -1181,6 +1177,10 @@
         <message>
             <source>Local Values</source>
             <translation>地点別の値</translation>
+        </message>
+        <message>
+            <source>Wave &amp;Approximation:</source>
+            <translation>波動近似(&amp;A):</translation>
         </message>
     </context>
     <context>
@@ -1809,10 +1809,6 @@ Nothing was loaded.</source>
             <translation>区間長</translation>
         </message>
         <message>
-            <source>%1 locations added, %2 were there already.</source>
-            <translation>%1地点を追加しました。%2地点は既にありました。</translation>
-        </message>
-        <message>
             <source>%1 locations added, %2 were there already; %3 of these have new values.</source>
             <translation>%1地点を追加しました。%2地点は既にあり、うち%3地点の値を更新しました。</translation>
         </message>
@@ -1941,6 +1937,10 @@ DEM
 (h,p,q)</translation>
         </message>
         <message>
+            <source>%1 locations added, %2 were there already.</source>
+            <translation>%1地点を追加しました。%2地点は既にありました。</translation>
+        </message>
+        <message>
             <source>Invalid DateTime</source>
             <translation>無効な日時</translation>
         </message>
@@ -1957,12 +1957,6 @@ DEM
 The simulation will write over it. Use this name?</source>
             <translation>%1 は既に存在します。
 計算を実行すると上書きされます。この名前を使いますか?</translation>
-        </message>
-        <message>
-            <source>%1 already exists.
-The simulation will read it. Use this name?</source>
-            <translation>%1 は既に存在します。
-計算を実行すると読み込まれます。この名前を使いますか?</translation>
         </message>
         <message>
             <source>Choose a File</source>
@@ -2087,6 +2081,154 @@ User defined marks</source>
 ユーザー定義マーク</translation>
         </message>
         <message>
+        <source>%1: &quot;%2&quot; was typed.</source>
+        <translation>%1: 「%2」と入力されました。</translation>
+    </message>
+    <message>
+        <source>Allowed: %1</source>
+        <translation>許容範囲: %1</translation>
+    </message>
+    <message>
+        <source>%1 to %2</source>
+        <translation>%1 ～ %2</translation>
+    </message>
+    <message>
+        <source>at least %1</source>
+        <translation>%1 以上</translation>
+    </message>
+    <message>
+        <source>at most %1</source>
+        <translation>%1 以下</translation>
+    </message>
+    <message>
+        <source>%1, line %2</source>
+        <translation>%1、%2 行目</translation>
+    </message>
+    <message>
+        <source>Select the line</source>
+        <translation>行を選択</translation>
+    </message>
+        <message>
+            <source>%1 does not exist.
+The simulation will look for it. Use this name?</source>
+            <translation>%1 は存在しません。
+計算時にこのファイルが読み込まれます。この名前を使いますか?</translation>
+        </message>
+        <message>
+            <source>Could not write &quot;%1&quot;: %2.</source>
+            <translation>「%1」に書き込めませんでした: %2。</translation>
+        </message>
+        <message>
+            <source>Could not read &quot;%1&quot;: %2.</source>
+            <translation>「%1」を読み込めませんでした: %2。</translation>
+        </message>
+        <message>
+            <source>The new content is complete in &quot;%1&quot;.</source>
+            <translation>新しい内容は「%1」にすべて残っています。</translation>
+        </message>
+        <message>
+            <source>%1 is now %2</source>
+            <translation>%1 は %2 になりました</translation>
+        </message>
+        <message>
+            <source>%1 could not be read when it was opened; what is shown is not its content.
+Saving replaces it. As it is now it stays in a copy beside it, %2.
+Save?</source>
+            <translation>%1 は開いたときに読み込めませんでした。表示されているのはその内容ではありません。
+保存すると置き換えられます。今のファイルは同じフォルダの %2 に残ります。
+保存しますか?</translation>
+        </message>
+        <message>
+            <source>%1 holds values that were not taken as they stand (places: %2).
+Saving writes what is shown instead. As it is now the file stays in a copy beside it, %3.
+Save?</source>
+            <translation>%1 には、そのまま取り込めなかった値があります (%2 か所)。
+保存すると、表示されている値で書き込まれます。今のファイルは同じフォルダの %3 に残ります。
+保存しますか?</translation>
+        </message>
+        <message>
+            <source>%1 could not be read. What is shown here are default values, not its content.
+%2</source>
+            <translation>%1 を読み込めませんでした。表示されているのは既定値で、ファイルの内容ではありません。
+%2</translation>
+        </message>
+        <message>
+            <source>Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.</source>
+            <translation>%1 の値のうち、そのまま取り込めなかったもの: %2 か所。保存すると、今のファイルのコピーが残ります。</translation>
+        </message>
+        <message>
+            <source>The file as it was before this save is kept in %1.</source>
+            <translation>保存前のファイルは %1 に残っています。</translation>
+        </message>
+        <message>
+            <source>Show List...</source>
+            <translation>一覧を表示...</translation>
+        </message>
+        <message>
+            <source>Edit Default Values</source>
+            <translation>既定値を編集</translation>
+        </message>
+        <message>
+            <source>Close this bar</source>
+            <translation>このバーを閉じる</translation>
+        </message>
+        <message>
+            <source>%1: Values Not Taken as They Stand</source>
+            <translation>%1: そのまま取り込めなかった値</translation>
+        </message>
+        <message>
+            <source>These places of %1 are not written as they should be. Each row says what stands there, what was expected, and what is used instead. Nothing is changed in the file unless you save; a save keeps the file as it is in a copy.</source>
+            <translation>%1 のこれらの箇所は、正しく書かれていません。各行に、ファイルの内容、期待される内容、代わりに使われる値を示します。保存しない限りファイルは変わりません。保存すると、今のファイルのコピーが残ります。</translation>
+        </message>
+        <message>
+            <source>Line
+Column
+Section
+Keyword
+Parameter
+In the file
+Expected
+Used instead</source>
+            <translation>行
+列
+セクション
+キーワード
+パラメータ
+ファイルの内容
+期待される内容
+代わりに使う値</translation>
+        </message>
+        <message>
+            <source>a number
+an integer
+true or false
+a text in quotes
+a file name in &lt; &gt;
+six integers
+a count that fits the %1 parameters behind it
+a flag for each of %1 titles
+a target [%1]
+more parameters, or a smaller count</source>
+            <translation>数値
+整数
+true または false
+引用符で囲んだ文字列
+&lt; &gt; で囲んだファイル名
+6 個の整数
+後に続く %1 個のパラメータに合う個数
+%1 個のタイトルごとに 1 個のフラグ
+ターゲット [%1]
+より多くのパラメータ、またはより小さい個数</translation>
+        </message>
+        <message>
+            <source>&amp;Copy</source>
+            <translation>コピー(&amp;C)</translation>
+        </message>
+        <message>
+            <source>C&amp;lose</source>
+            <translation>閉じる(&amp;L)</translation>
+        </message>
+        <message>
             <source>Full value: %1</source>
             <translation>全桁の値: %1</translation>
         </message>
@@ -2136,5 +2278,77 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
             <source>In a table</source>
             <translation>表</translation>
         </message>
-    </context>
+        <message>
+            <source>Undone: %1</source>
+            <translation>元に戻しました: %1</translation>
+        </message>
+        <message>
+            <source>Redone: %1</source>
+            <translation>やり直しました: %1</translation>
+        </message>
+        <message>
+            <source>Line inserted</source>
+            <translation>行を挿入しました</translation>
+        </message>
+        <message>
+            <source>%1 lines inserted</source>
+            <translation>%1 行を挿入しました</translation>
+        </message>
+        <message>
+            <source>Line deleted</source>
+            <translation>行を削除しました</translation>
+        </message>
+        <message>
+            <source>%1 lines deleted</source>
+            <translation>%1 行を削除しました</translation>
+        </message>
+        <message>
+            <source>1 cell pasted</source>
+            <translation>1 個のセルに貼り付けました</translation>
+        </message>
+        <message>
+            <source>%1 cells pasted</source>
+            <translation>%1 個のセルに貼り付けました</translation>
+        </message>
+        <message>
+            <source>Saved</source>
+            <translation>保存しました</translation>
+        </message>
+        <message>
+            <source>Saved; %1 (undo brings back what was dropped)</source>
+            <translation>保存しました。%1(「元に戻す」で復元できます)</translation>
+        </message>
+        <message>
+            <source>, </source>
+            <translation>、</translation>
+        </message>
+        <message>
+            <source>1 line without location dropped</source>
+            <translation>位置のない 1 行を除きました</translation>
+        </message>
+        <message>
+            <source>%1 lines without location dropped</source>
+            <translation>位置のない %1 行を除きました</translation>
+        </message>
+        <message>
+            <source>1 mark without title dropped</source>
+            <translation>名称のないマーク 1 件を除きました</translation>
+        </message>
+        <message>
+            <source>%1 marks without title dropped</source>
+            <translation>名称のないマーク %1 件を除きました</translation>
+        </message>
+        <message>
+            <source>1 row without file name dropped</source>
+            <translation>ファイル名のない 1 行を除きました</translation>
+        </message>
+        <message>
+            <source>%1 rows without file name dropped</source>
+            <translation>ファイル名のない %1 行を除きました</translation>
+        </message>
+        <message>
+            <source>Marks without a title (%1) and the levels below them are left out when the file is saved.</source>
+            <translation>名称のないマーク(%1 件)とその水位は、ファイルの保存時に除かれます。</translation>
+        </message>
+</context>
 </TS>

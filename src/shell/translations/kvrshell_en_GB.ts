@@ -251,6 +251,18 @@
             <translation>Projects</translation>
         </message>
         <message>
+            <source>%1: open in the project %2</source>
+            <translation>%1: open in the project %2</translation>
+        </message>
+        <message>
+            <source>These files of the project %1 are open in another project and stay there:
+%2
+To have one of them in %1, close its window and open it from the list of %1.</source>
+            <translation>These files of the project %1 are open in another project and stay there:
+%2
+To have one of them in %1, close its window and open it from the list of %1.</translation>
+        </message>
+        <message>
             <source>%1 could not be opened: no editor reads files of this kind.
 The editors read %2.</source>
             <translation>%1 could not be opened: no editor reads files of this kind.
@@ -397,6 +409,10 @@ Shell of the river model editors.</translation>
         <message>
             <source>%1 (no editor)</source>
             <translation>%1 (no editor)</translation>
+        </message>
+        <message>
+            <source>%1 (in the project %2)</source>
+            <translation>%1 (in the project %2)</translation>
         </message>
         <message>
             <source>&amp;Open</source>

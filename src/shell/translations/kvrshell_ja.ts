@@ -251,6 +251,18 @@
             <translation>プロジェクト</translation>
         </message>
         <message>
+            <source>%1: open in the project %2</source>
+            <translation>%1: プロジェクト %2 で開いています</translation>
+        </message>
+        <message>
+            <source>These files of the project %1 are open in another project and stay there:
+%2
+To have one of them in %1, close its window and open it from the list of %1.</source>
+            <translation>プロジェクト %1 の次のファイルは、ほかのプロジェクトで開いているため、そちらに属したままになります。
+%2
+%1 で使うには、そのウィンドウを閉じてから、%1 の一覧で開いてください。</translation>
+        </message>
+        <message>
             <source>%1 could not be opened: no editor reads files of this kind.
 The editors read %2.</source>
             <translation>%1 を開けません。この種類のファイルを扱うエディタがありません。
@@ -397,6 +409,10 @@ Shell of the river model editors.</source>
         <message>
             <source>%1 (no editor)</source>
             <translation>%1 (エディタなし)</translation>
+        </message>
+        <message>
+            <source>%1 (in the project %2)</source>
+            <translation>%1 (プロジェクト %2 内)</translation>
         </message>
         <message>
             <source>&amp;Open</source>

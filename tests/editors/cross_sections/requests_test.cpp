@@ -1,6 +1,8 @@
 // What other editors ask, and what they are told.
 #include "cross_sections_fixture.h"
 
+#include <QLineEdit>
+
 namespace {
 
 TEST_F(CrossSectionTest, LocationsComeByBranchAndChainage)
@@ -104,6 +106,47 @@ TEST_F(CrossSectionTest, APlaceShownElsewhereSelectsTheNearestSectionAndIsNotTol
     Ask(view, KsRequest::LocationShown, &objects);
     EXPECT_EQ(view->CurrentSection(), Main2500Later) << "it is as near as the other survey";
     EXPECT_TRUE(log.isEmpty()) << log.join(' ').toStdString();
+}
+
+TEST_F(CrossSectionTest, APlaceShownElsewhereNeitherExtendsASelectionNorDisturbsTyping)
+{
+    CCrossSectionView* view = Open();
+    const auto show = [&](const char* branch, double chainage) {
+        CObList objects;
+        objects.push_back(Location(branch, chainage));
+        Ask(view, KsRequest::LocationShown, &objects);
+    };
+    for (const auto& [key, modifier] :
+         {std::pair(Qt::Key_Control, Qt::ControlModifier), std::pair(Qt::Key_Shift, Qt::ShiftModifier)}) {
+        show("MAIN", 1000);
+        QTest::keyPress(view->window()->windowHandle(), key, modifier);
+        show("SIDE", 300);
+        show("MAIN", 2500);
+        const auto rows = view->Sections()->selectionModel()->selectedRows();
+        EXPECT_EQ(rows.size(), 1) << modifier;
+        EXPECT_EQ(rows.value(0).row(), Main2500) << modifier;
+        QTest::keyRelease(view->window()->windowHandle(), key);
+    }
+    view->Points()->setFocus();
+    view->Points()->GoTo(1, CPointTable::Level);
+    QTest::keyClick(view->Points(), Qt::Key_F2);
+    auto* editor = view->Points()->findChild<QLineEdit*>();
+    ASSERT_NE(editor, nullptr);
+    editor->selectAll();
+    QTest::keyClicks(editor, "10");
+    show("SIDE", 300);
+    EXPECT_EQ(view->CurrentSection(), Main2500);
+    QTest::keyClicks(editor, "1.5");
+    EXPECT_TRUE(view->MayLeave(KsLeave::Field));
+    EXPECT_EQ(view->Document()->Sections().sections[Main2500].points[1].level, 101.5);
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete); // the editor before
+    QTest::keyClick(view->Points(), Qt::Key_F2);
+    QTest::keyClicks(view->Points()->findChild<QLineEdit*>(), "x");
+    EXPECT_FALSE(view->MayLeave(KsLeave::Field));
+    EXPECT_FALSE(view->MayLeave(KsLeave::Page));
+    QCoreApplication::processEvents();
+    EXPECT_EQ(boxes.size(), 2) << "once for each time";
+    EXPECT_TRUE(view->Points()->IsEditing());
 }
 
 TEST_F(CrossSectionTest, ASectionSelectedIsToldOnceAndAnswersDoNotMoveIt)

@@ -27,6 +27,11 @@ TEST(CrossSections, ArePlacedByBranchAsFirstMetThenByChainage)
     EXPECT_TRUE(all.IsTaken(At("a", 5.0002), 0));
     EXPECT_FALSE(all.IsTaken(At("a", 5), 1)) << "by itself";
     EXPECT_FALSE(all.IsTaken(At("a", 5.001)));
+
+    all.sections = {At("Inn", 7), At("A", 1), At("INN", 3)}; // one branch, spelt twice
+    EXPECT_EQ(all.Branches(), QStringList({"Inn", "A"}));
+    EXPECT_THAT(all.ByPlace(), testing::ElementsAre(2, 0, 1));
+    EXPECT_TRUE(all.IsTaken(At("inn", 3)));
 }
 
 TEST(CrossSections, WaterIsAsWideAsTheWidthSays)

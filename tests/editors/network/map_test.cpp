@@ -124,6 +124,16 @@ TEST_F(NetworkTest, TheLegendCoversNoBranchWhenAllIsShown)
     }
 }
 
+TEST_F(NetworkTest, OnlyLocationsCountAndPlacesAreSaidWithTheirUnit)
+{
+    CNetworkView* view = Open();
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->PlacedCount() == 2; }));
+    EXPECT_EQ(view->Map()->Locations().size(), 4u) << "two of them are not in this network; blank lines are nowhere";
+    EXPECT_EQ(PlaceText("MAIN", 1234.56), "MAIN 1234.6 m");
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    EXPECT_EQ(PlaceText("MAIN", 304.8), "MAIN 1000.0 ft");
+}
+
 TEST_F(NetworkTest, WithoutAMousePlacesAndLocationsAreReached)
 {
     CNetworkView* view = Open();

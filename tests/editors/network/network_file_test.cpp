@@ -36,6 +36,11 @@ TEST_F(NetworkTest, AFileIsReadAndWrittenBackWithWhatTheEditorDoesNotKnow)
     const QString third = folder.filePath("c.kvnw");
     ASSERT_EQ(WriteNetwork(third, again), "");
     EXPECT_EQ(Read(third), text);
+    EXPECT_THAT(text.toStdString(), testing::Not(HasSubstr("CoordinateSystem")));
+    again.system = "EPSG:25832";
+    ASSERT_EQ(WriteNetwork(third, again), "");
+    ASSERT_EQ(ReadNetwork(third, network), "");
+    EXPECT_EQ(network.system, "EPSG:25832");
 }
 
 TEST_F(NetworkTest, ABadFileSaysWhereAndWhat)
@@ -52,6 +57,8 @@ TEST_F(NetworkTest, ABadFileSaysWhereAndWhat)
         {"Chainage = 1000, 8000", "Chainage = 1000", "line 5: expected 2 numbers after \"Chainage =\"."},
         {"Chainage = 1000, 8000", "Chainage = 8, 8.0", "line 5: the chainages of the two ends have to differ."},
         {"FlowsDownstream = true", "FlowsDownstream = 1", "line 6: expected true or false."},
+        {"Survey = \"2019\", 3", "CoordinateSystem = 25832",
+         "line 2: expected the name of a coordinate system, CoordinateSystem = \"EPSG:...\"."},
         {"Vertex = 3000, 0\n", "Vertex = 3000, \"north\"\n", "line 10: expected 2 numbers after \"Vertex =\"."},
         {"Vertex = 3000, 4000", "Vertex = inf, 4000", "line 11: expected 2 numbers"},
         {"DATA = 2000, 400, 30", "DATA = nan, 400, 30", "line 14: expected 3 numbers after \"DATA =\"."},

@@ -132,8 +132,6 @@ protected:
     static CObList* GetData(const CString& path, CKsDoc* document)
     {
         current->log << QString("get data %1").arg(document == &current->hdDoc && path == document->GetPathName());
-        if (current->storing) // the document takes over what is being typed
-            Ask(current->storing, KsRequest::DataChanged, nullptr);
         auto list = std::make_unique<CObList>();
         list->push_back(std::make_unique<CKvrCBEText>()); // not what was asked for
         for (const CMapLocation& each : current->hdLocations) {
@@ -153,12 +151,12 @@ protected:
 
     inline static NetworkTest* current = nullptr;
     bool hdOpen = true;
-    CNetworkView* storing = nullptr; // told of a change while data are fetched
-    std::vector<CMapLocation> hdLocations{{"MAIN", 2000, HDInitialData, {}, KsUnset},
-                                          {"MAIN", 5000, HDBedData, {}, KsUnset},
-                                          {"MAIN", 9000, HDBedData, {}, KsUnset}, // behind the end
-                                          {"LOST", 100, HDWindData, {}, KsUnset},
-                                          {"SIDE", 250, HDDataTypeCount, {}, KsUnset}}; // no such kind
+    std::vector<CMapLocation> hdLocations{
+        {"MAIN", 2000, HDInitialData, {}, KsUnset}, {"MAIN", 5000, HDBedData, {}, KsUnset},
+        {"MAIN", 9000, HDBedData, {}, KsUnset},                                                  // behind the end
+        {"LOST", 100, HDWindData, {}, KsUnset},     {"SIDE", 250, HDDataTypeCount, {}, KsUnset}, // no such kind
+        {"", 100, HDInitialData, {}, KsUnset}, // lines that are not complete
+        {"MAIN", 1e10, HDInitialData, {}, KsUnset}};
     FakeHDDoc hdDoc;
     FakeHDView hdView; // goes before its document
 };

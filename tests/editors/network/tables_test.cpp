@@ -162,6 +162,77 @@ TEST_F(NetworkTest, WhatIsBeingTypedIsStoredBeforeASave)
     EXPECT_FALSE(view->Document()->IsModified());
 }
 
+TEST_F(NetworkTest, WhatCannotBeStoredStaysInItsEditorAndIsToldOnce)
+{
+    CNetworkView* view = Open();
+    CLinesView* channel = view->Channel();
+    const auto type = [&](const char* text) {
+        channel->setFocus();
+        channel->GoTo(0, CChannelTable::Width);
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete); // the editor before
+        QTest::keyClick(channel, Qt::Key_F2);
+        auto* editor = channel->findChild<QLineEdit*>();
+        EXPECT_NE(editor, nullptr);
+        editor->selectAll();
+        QTest::keyClicks(editor, text);
+        return editor;
+    };
+    QLineEdit* editor = type("wide");
+    const auto isKept = [&](const char* after) {
+        QTest::qWait(1); // what comes later comes, too
+        ASSERT_EQ(boxes.size(), 1) << after;
+        EXPECT_EQ(boxes.takeFirst(), "Line 1, Width [m]: expected a number, found \"wide\".");
+        EXPECT_TRUE(channel->IsEditing()) << after;
+        EXPECT_EQ(editor->text(), "wide") << after;
+        EXPECT_EQ(QApplication::focusWidget(), editor) << after;
+        EXPECT_EQ(view->Document()->UndoStack().count(), 0) << after;
+    };
+    EXPECT_FALSE(view->MayLeave(KsLeave::Page));
+    isKept("asked");
+    QTest::keyClick(editor, Qt::Key_Enter);
+    isKept("Enter");
+    QTest::mouseClick(channel->viewport(), Qt::LeftButton, {},
+                      channel->visualRect(channel->model()->index(1, CChannelTable::Radius)).center());
+    isKept("another cell");
+    view->Map()->setFocus();
+    isKept("the map");
+    EXPECT_TRUE(view->OnCommand(NetworkCommand::DeleteLine)); // carried out, and refused
+    isKept("a command");
+    view->Document()->ReplaceBranch(1, view->Document()->Network().branches[1], "another change");
+    EXPECT_EQ(editor->text(), "wide") << "a change of the document is no change of what is being typed";
+    view->Document()->UndoStack().undo();
+    QTest::keyClick(editor, Qt::Key_Escape);
+    EXPECT_FALSE(channel->IsEditing());
+    EXPECT_EQ(Text(channel, 0, CChannelTable::Width), "30");
+
+    editor = type("31.5");
+    EXPECT_TRUE(view->OnCommand(NetworkCommand::InsertLine));
+    EXPECT_EQ(view->Document()->Network().branches[0].channel[0].width, 31.5);
+    EXPECT_EQ(channel->model()->rowCount(), 4);
+    EXPECT_TRUE(boxes.isEmpty()) << boxes.join(';').toStdString();
+}
+
+TEST_F(NetworkTest, HeldKeysDoNotExtendASelectionThatTheMapMakes)
+{
+    CNetworkView* view = Open();
+    const auto selected = [&] {
+        QStringList rows;
+        for (const QModelIndex& index : view->Branches()->selectionModel()->selectedRows())
+            rows << QString::number(index.row());
+        return rows.join(' ').toStdString();
+    };
+    for (const auto& [key, modifier] :
+         {std::pair(Qt::Key_Control, Qt::ControlModifier), std::pair(Qt::Key_Shift, Qt::ShiftModifier)}) {
+        view->Branches()->selectRow(0);
+        QTest::keyPress(view->window()->windowHandle(), key, modifier);
+        view->Map()->SetPicked(CNetworkMap::Place{"SIDE", 100});
+        EXPECT_EQ(selected(), "1") << modifier;
+        view->Map()->SetPicked(CNetworkMap::Place{"MAIN", 2000});
+        EXPECT_EQ(selected(), "0") << modifier;
+        QTest::keyRelease(view->window()->windowHandle(), key);
+    }
+}
+
 TEST_F(NetworkTest, CommandsOfTheMenuDoWhatTheySay)
 {
     CNetworkView* view = Open();

@@ -95,27 +95,107 @@
         <name>CImportDialog</name>
         <message>
             <source>Import Branches from %1</source>
-            <translation>%1からの河川の取り込み</translation>
+            <translation>%1 から河川をインポート</translation>
         </message>
         <message>
-            <source>&amp;Layer:</source>
+            <source>&amp;Layers:</source>
             <translation>レイヤー(&amp;L):</translation>
         </message>
         <message>
+            <source>Layer</source>
+            <translation>レイヤー</translation>
+        </message>
+        <message>
+            <source>Geometry</source>
+            <translation>図形</translation>
+        </message>
+        <message>
+            <source>Lines</source>
+            <translation>線の数</translation>
+        </message>
+        <message>
+            <source>Coordinate system</source>
+            <translation>座標系</translation>
+        </message>
+        <message>
+            <source>Remark</source>
+            <translation>備考</translation>
+        </message>
+        <message>
+            <source>Layers of the file</source>
+            <translation>ファイルのレイヤー</translation>
+        </message>
+        <message>
+            <source>none named</source>
+            <translation>指定なし</translation>
+        </message>
+        <message>
+            <source>cannot be taken: no lines among %1 features</source>
+            <translation>取り込めません: %1 個の地物に線がありません</translation>
+        </message>
+        <message>
+            <source>incomplete or damaged</source>
+            <translation>不完全または破損</translation>
+        </message>
+        <message>
             <source>Field with the &amp;name:</source>
-            <translation>河川名の属性(&amp;N):</translation>
+            <translation>河川名のフィールド(&amp;N):</translation>
         </message>
         <message>
             <source>Field with the &amp;first chainage [m]:</source>
-            <translation>始点の追加距離 [m] の属性(&amp;F):</translation>
+            <translation>始点の追加距離のフィールド [m](&amp;F):</translation>
         </message>
         <message>
             <source>Field with the la&amp;st chainage [m]:</source>
-            <translation>終点の追加距離 [m] の属性(&amp;S):</translation>
+            <translation>終点の追加距離のフィールド [m](&amp;S):</translation>
+        </message>
+        <message>
+            <source>Lines whose &amp;parts do not meet:</source>
+            <translation>部分がつながらない線(&amp;P):</translation>
+        </message>
+        <message>
+            <source>become branches NAME-1, NAME-2, each from 0 to its length</source>
+            <translation>河川 名前-1、名前-2 にする(それぞれ 0 から長さまで)</translation>
+        </message>
+        <message>
+            <source>become branches that share the chainages of the line</source>
+            <translation>線の追加距離を分け合う河川にする</translation>
+        </message>
+        <message>
+            <source>are left out</source>
+            <translation>取り込まない</translation>
+        </message>
+        <message>
+            <source>&amp;Coordinates in the network:</source>
+            <translation>河道網での座標(&amp;C):</translation>
+        </message>
+        <message>
+            <source>EPSG code of the coordinate system</source>
+            <translation>座標系の EPSG コード</translation>
+        </message>
+        <message>
+            <source>Take lines &amp;without a name, too</source>
+            <translation>名前のない線も取り込む(&amp;W)</translation>
+        </message>
+        <message>
+            <source>&amp;Take what could be read of the damaged file</source>
+            <translation>破損したファイルから読み取れた分を取り込む(&amp;T)</translation>
+        </message>
+        <message>
+            <source>The branches of the network are in this coordinate s&amp;ystem, too</source>
+            <translation>河道網の既存の河川もこの座標系である(&amp;Y)</translation>
+        </message>
+        <message>
+            <source>What the import &amp;gives:</source>
+            <translation>インポートの結果(&amp;G):</translation>
         </message>
         <message>
             <source>&amp;Import</source>
-            <translation>取り込み(&amp;I)</translation>
+            <translation>インポート(&amp;I)</translation>
+        </message>
+        <message>
+            <source>C&amp;opy</source>
+            <translation>コピー(&amp;O)</translation>
         </message>
         <message>
             <source>(none: numbered)</source>
@@ -126,20 +206,48 @@
             <translation>(なし: 0)</translation>
         </message>
         <message>
-            <source>(none: length of the line)</source>
-            <translation>(なし: 線の長さ)</translation>
+            <source>(none: by the length of the line)</source>
+            <translation>(なし: 線の長さによる)</translation>
         </message>
         <message>
-            <source>, the first is named &quot;%1&quot;</source>
-            <translation>、最初の名称は「%1」</translation>
+            <source>another one, by its EPSG code:</source>
+            <translation>その他(EPSG コードで指定):</translation>
         </message>
         <message>
-            <source>Lines: %1</source>
-            <translation>線の数: %1</translation>
+            <source>taken as the network&apos;s: %1</source>
+            <translation>河道網の座標系とみなす: %1</translation>
         </message>
         <message>
-            <source>Left out, because they are no lines: %1</source>
-            <translation>線でないため除外: %1</translation>
+            <source>as in the file, taken as meters</source>
+            <translation>ファイルのまま(メートルとみなす)</translation>
+        </message>
+        <message>
+            <source>the network&apos;s: %1</source>
+            <translation>河道網の座標系: %1</translation>
+        </message>
+        <message>
+            <source>as in the file: %1</source>
+            <translation>ファイルのまま: %1</translation>
+        </message>
+        <message>
+            <source>projected to %1</source>
+            <translation>%1 に投影</translation>
+        </message>
+        <message>
+            <source>&quot;%1&quot; is no EPSG code of a coordinate system. Expected a number, for example 25832.</source>
+            <translation>「%1」は座標系の EPSG コードではありません。番号を入力してください(例: 25832)。</translation>
+        </message>
+        <message>
+            <source>Choose a layer.</source>
+            <translation>レイヤーを選択してください。</translation>
+        </message>
+        <message>
+            <source>No line of this layer becomes a branch.</source>
+            <translation>このレイヤーには河川になる線がありません。</translation>
+        </message>
+        <message>
+            <source>The network names the coordinate system &quot;%1&quot;, which is not known here.</source>
+            <translation>河道網に記された座標系「%1」は不明です。</translation>
         </message>
     </context>
     <context>
@@ -177,14 +285,6 @@
     </context>
     <context>
         <name>CNetworkView</name>
-        <message>
-            <source>C&amp;hannel of %1</source>
-            <translation>%1の河道(&amp;H)</translation>
-        </message>
-        <message>
-            <source>C&amp;hannel</source>
-            <translation>河道(&amp;H)</translation>
-        </message>
         <message>
             <source>&amp;Branches</source>
             <translation>河川(&amp;B)</translation>
@@ -258,14 +358,6 @@
             <translation>すべてのファイル (*)</translation>
         </message>
         <message>
-            <source>... and %1 more.</source>
-            <translation>... ほか%1件。</translation>
-        </message>
-        <message>
-            <source>The branches were imported:</source>
-            <translation>河川を取り込みました:</translation>
-        </message>
-        <message>
             <source>&amp;Show in HD Parameters</source>
             <translation>HDパラメーターで表示(&amp;S)</translation>
         </message>
@@ -277,43 +369,131 @@
             <source>&amp;Insert Here as</source>
             <translation>ここに挿入(&amp;I)</translation>
         </message>
+        <message>
+            <source>%1 holds no lines. Its layers, with their geometry and the number of features:</source>
+            <translation>%1 には線がありません。レイヤーとその図形、地物の数:</translation>
+        </message>
+        <message>
+            <source>&amp;Channel of %1</source>
+            <translation>%1の河道(&amp;C)</translation>
+        </message>
+        <message>
+            <source>&amp;Channel</source>
+            <translation>河道(&amp;C)</translation>
+        </message>
     </context>
     <context>
         <name>GisLines</name>
-        <message>
-            <source>the format is not known.</source>
-            <translation>形式が不明です。</translation>
-        </message>
         <message>
             <source>%1 could not be read as a GIS file: %2</source>
             <translation>%1をGISファイルとして読み込めませんでした: %2</translation>
         </message>
         <message>
-            <source>%1 holds no lines (%2 features of other kinds).</source>
-            <translation>%1に線がありません(その他の地物: %2)。</translation>
+            <source>the format is not known.</source>
+            <translation>形式が不明です。</translation>
         </message>
         <message>
-            <source>%1: the layer &quot;%2&quot; is in degrees of longitude and latitude. Distances along a branch need map coordinates in meters: project the file first.</source>
-            <translation>%1: レイヤー「%2」は経緯度(度)の座標です。河川に沿った距離にはメートル単位の平面座標が必要です。先に投影変換してください。</translation>
+            <source>%1 has no layers.</source>
+            <translation>%1 にはレイヤーがありません。</translation>
         </message>
     </context>
     <context>
         <name>ImportBranches</name>
         <message>
-            <source>The library that reads GIS files could not be loaded: %1</source>
-            <translation>GISファイルを読み込むライブラリをロードできませんでした: %1</translation>
+            <source>feature %1</source>
+            <translation>地物 %1</translation>
+        </message>
+        <message>
+            <source>&quot;%1&quot; (feature %2)</source>
+            <translation>「%1」(地物 %2)</translation>
+        </message>
+        <message>
+            <source>could not be read: %1</source>
+            <translation>読み取れません: %1</translation>
+        </message>
+        <message>
+            <source>has no geometry.</source>
+            <translation>図形がありません。</translation>
+        </message>
+        <message>
+            <source>is no line (%1).</source>
+            <translation>線ではありません(%1)。</translation>
+        </message>
+        <message>
+            <source>has no name.</source>
+            <translation>名前がありません。</translation>
+        </message>
+        <message>
+            <source>vertices without coordinates, left out: %1.</source>
+            <translation>座標のない頂点を除きました: %1。</translation>
+        </message>
+        <message>
+            <source>lies outside the area of the coordinate system.</source>
+            <translation>座標系の範囲外にあります。</translation>
+        </message>
+        <message>
+            <source>the line has no length.</source>
+            <translation>線に長さがありません。</translation>
+        </message>
+        <message>
+            <source>the line is empty.</source>
+            <translation>線が空です。</translation>
+        </message>
+        <message>
+            <source>parts outside the area of the coordinate system, left out: %1 of %2.</source>
+            <translation>座標系の範囲外の部分を除きました: %2 個のうち %1 個。</translation>
+        </message>
+        <message>
+            <source>parts without a length, left out: %1 of %2.</source>
+            <translation>長さのない部分を除きました: %2 個のうち %1 個。</translation>
+        </message>
+        <message>
+            <source>its %1 parts meet and become one branch.</source>
+            <translation>%1 個の部分がつながるので 1 本の河川にします。</translation>
+        </message>
+        <message>
+            <source>Parts that ran the other way, turned: %1.</source>
+            <translation>逆向きだった部分を反転しました: %1。</translation>
         </message>
         <message>
             <source>Branch</source>
             <translation>河川</translation>
         </message>
         <message>
-            <source>&quot;%1&quot; is taken and becomes &quot;%2&quot;.</source>
-            <translation>「%1」はすでにあるため「%2」とします。</translation>
+            <source>has no name and becomes &quot;%1&quot;.</source>
+            <translation>名前がないので「%1」とします。</translation>
         </message>
         <message>
-            <source>&quot;%1&quot;: no two different chainages; it goes from 0 to its length.</source>
-            <translation>「%1」: 異なる2つの追加距離がないため、0から線の長さまでとします。</translation>
+            <source>this name is taken; the branch becomes &quot;%1&quot;.</source>
+            <translation>この名前は使われているので「%1」とします。</translation>
+        </message>
+        <message>
+            <source>no two different chainages; it goes from 0 to its length, %1.</source>
+            <translation>異なる 2 つの追加距離がないので、0 から長さ %1 までとします。</translation>
+        </message>
+        <message>
+            <source>its chainages go from %1 to %2, but the line is %3 long.</source>
+            <translation>追加距離は %1 から %2 ですが、線の長さは %3 です。</translation>
+        </message>
+        <message>
+            <source>its parts do not meet: %1 pieces.</source>
+            <translation>部分がつながりません: %1 個。</translation>
+        </message>
+        <message>
+            <source>The chainages of the line are shared out among them.</source>
+            <translation>線の追加距離を長さに応じて分けます。</translation>
+        </message>
+        <message>
+            <source>Each goes from 0 to its length.</source>
+            <translation>それぞれ 0 から長さまでとします。</translation>
+        </message>
+        <message>
+            <source>its parts do not meet and become %1. %2</source>
+            <translation>部分がつながらないので %1 とします。%2</translation>
+        </message>
+        <message>
+            <source>The library that reads GIS files could not be loaded: %1</source>
+            <translation>GISファイルを読み込むライブラリをロードできませんでした: %1</translation>
         </message>
     </context>
     <context>
@@ -380,6 +560,10 @@
             <source>%1 is no river network: it has no section [%2].</source>
             <translation>%1は河道網ではありません: セクション[%2]がありません。</translation>
         </message>
+        <message>
+            <source>expected the name of a coordinate system, CoordinateSystem = &quot;EPSG:...&quot;.</source>
+            <translation>座標系の名前 CoordinateSystem = &quot;EPSG:...&quot; が必要です。</translation>
+        </message>
     </context>
     <context>
         <name>NetworkTexts</name>
@@ -442,6 +626,154 @@ Import Branches</source>
 %2</source>
             <translation>%1を保存できませんでした。
 %2</translation>
+        </message>
+    </context>
+    <context>
+        <name>CImportReportDialog</name>
+        <message>
+            <source>Imported Branches</source>
+            <translation>インポートした河川</translation>
+        </message>
+        <message>
+            <source>C&amp;opy</source>
+            <translation>コピー(&amp;O)</translation>
+        </message>
+        <message>
+            <source>&amp;Close</source>
+            <translation>閉じる(&amp;C)</translation>
+        </message>
+    </context>
+    <context>
+        <name>ImportReport</name>
+        <message>
+            <source>The layer names no coordinate system: its numbers are taken as meters on a map.</source>
+            <translation>レイヤーに座標系の指定がありません。座標値は地図上のメートルとみなします。</translation>
+        </message>
+        <message>
+            <source>Coordinate system: %1, as in the file.</source>
+            <translation>座標系: %1(ファイルのまま)。</translation>
+        </message>
+        <message>
+            <source>Coordinate system: %1, projected from %2.</source>
+            <translation>座標系: %1(%2 から投影)。</translation>
+        </message>
+        <message>
+            <source>Lengths on this map are %1 times those on the ground</source>
+            <translation>この地図上の長さは地上の %1 倍です</translation>
+        </message>
+        <message>
+            <source> (from %1 to %2 by line)</source>
+            <translation>(線により %1 から %2)</translation>
+        </message>
+        <message>
+            <source>.</source>
+            <translation>。</translation>
+        </message>
+        <message>
+            <source>So are chainages that follow from them. Another coordinate system avoids this.</source>
+            <translation>長さから求めた追加距離も同様です。別の座標系を選ぶと避けられます。</translation>
+        </message>
+        <message>
+            <source>The file counts %1 features, but only %2 could be read.</source>
+            <translation>ファイルには %1 個の地物があるはずですが、%2 個しか読み取れませんでした。</translation>
+        </message>
+        <message>
+            <source>The file is incomplete or damaged.</source>
+            <translation>ファイルが不完全か破損しています。</translation>
+        </message>
+        <message>
+            <source>Features with errors: %1 of %2.</source>
+            <translation>エラーのある地物: %2 個のうち %1 個。</translation>
+        </message>
+        <message>
+            <source>These lines lie %1 away from the branches of the network: they may be in different coordinate systems.</source>
+            <translation>これらの線は河道網の河川から %1 離れています。座標系が異なる可能性があります。</translation>
+        </message>
+        <message>
+            <source>%1, layer &quot;%2&quot;</source>
+            <translation>%1、レイヤー「%2」</translation>
+        </message>
+        <message>
+            <source>Branches: %1, in all %2</source>
+            <translation>河川: %1、合計 %2</translation>
+        </message>
+        <message>
+            <source>Left out</source>
+            <translation>取り込まないもの</translation>
+        </message>
+        <message>
+            <source>Changed</source>
+            <translation>変更したもの</translation>
+        </message>
+        <message>
+            <source>Branches</source>
+            <translation>河川</translation>
+        </message>
+        <message>
+            <source>%1: %2 long, chainages from %3 to %4</source>
+            <translation>%1: 長さ %2、追加距離 %3 から %4</translation>
+        </message>
+        <message>
+            <source>Report of the import</source>
+            <translation>インポートの報告</translation>
+        </message>
+    </context>
+    <context>
+        <name>GisGeometry</name>
+        <message>
+            <source>Point</source>
+            <translation>点</translation>
+        </message>
+        <message>
+            <source>Multi Point</source>
+            <translation>複数の点</translation>
+        </message>
+        <message>
+            <source>Line String</source>
+            <translation>線</translation>
+        </message>
+        <message>
+            <source>Multi Line String</source>
+            <translation>複数部分の線</translation>
+        </message>
+        <message>
+            <source>Polygon</source>
+            <translation>ポリゴン</translation>
+        </message>
+        <message>
+            <source>Multi Polygon</source>
+            <translation>複数部分のポリゴン</translation>
+        </message>
+        <message>
+            <source>Unknown (any)</source>
+            <translation>任意</translation>
+        </message>
+        <message>
+            <source>None</source>
+            <translation>なし</translation>
+        </message>
+        <message>
+            <source>Compound Curve</source>
+            <translation>複合曲線</translation>
+        </message>
+        <message>
+            <source>Multi Curve</source>
+            <translation>複数部分の曲線</translation>
+        </message>
+        <message>
+            <source>Geometry Collection</source>
+            <translation>図形の集まり</translation>
+        </message>
+    </context>
+    <context>
+        <name>GisSystems</name>
+        <message>
+            <source>%1 is in degrees: distances along a branch need a map in meters.</source>
+            <translation>%1 の単位は度です。河川に沿った距離にはメートル単位の地図が必要です。</translation>
+        </message>
+        <message>
+            <source>%1 cannot be projected to %2. %3</source>
+            <translation>%1 から %2 へ投影できません。%3</translation>
         </message>
     </context>
 </TS>

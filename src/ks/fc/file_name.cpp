@@ -1,0 +1,34 @@
+#include "ks/fc/file_name.h"
+
+#include <QDir>
+#include <QFileInfo>
+
+CString KsExistingSpelling(const CString& path)
+{
+    const QFileInfo file(path);
+    if (path.isEmpty() || file.exists() || file.fileName().isEmpty())
+        return path;
+    const CString given = file.path(), folder = QFileInfo::exists(given) ? given : KsExistingSpelling(given);
+    const CString same = QDir(folder).filePath(file.fileName());
+    if (QFileInfo::exists(same))
+        return same;
+    const auto names = QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot, QDir::Name);
+    for (const CString& name : names)
+        if (name.compare(file.fileName(), Qt::CaseInsensitive) == 0)
+            return QDir(folder).filePath(name);
+    return path;
+}
+
+CString KsFileKey(const CString& path)
+{
+    if (path.isEmpty())
+        return {};
+    const QFileInfo file(KsExistingSpelling(path));
+    const CString canonical = file.canonicalFilePath();
+    return canonical.isEmpty() ? QDir::cleanPath(file.absoluteFilePath()) : canonical;
+}
+
+bool KsSameFile(const CString& a, const CString& b)
+{
+    return !a.isEmpty() && !b.isEmpty() && (a == b || KsFileKey(a) == KsFileKey(b));
+}

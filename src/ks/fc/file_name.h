@@ -1,0 +1,13 @@
+// Files named by paths, in whatever case they are spelt.
+#pragma once
+
+#include "ks/fc/types.h"
+#include "ks/ks_export.h"
+
+/// The path as files and folders are spelt on disk: a project or a list may hold another case, and an editor may have
+/// saved a file with its extension in capitals. The path itself when it exists as it stands, or when nothing fits.
+KS_API CString KsExistingSpelling(const CString& path);
+/// Names a file, whichever of its paths is given: another spelling, a way through other folders, a link to it.
+KS_API CString KsFileKey(const CString& path);
+/// Whether two paths name one file; an empty path names none.
+KS_API bool KsSameFile(const CString& a, const CString& b);

@@ -1,0 +1,14 @@
+// Why the system refused something, in the user's language.
+#pragma once
+
+#include "ks/fc/types.h"
+#include "ks/ks_export.h"
+
+#include <system_error>
+
+class QFileDevice;
+
+/// The reason as a phrase, "no space is left on the device"; of rare ones the system's own text.
+KS_API CString KsSystemReason(std::error_code error);
+/// Why the last operation on a file failed, as a sentence.
+KS_API CString KsSystemReason(const QFileDevice& file);

@@ -1,0 +1,52 @@
+// The places of a file that were not taken as they stand, as a table.
+#pragma once
+
+#include "module/document_file.h"
+
+#include <QAbstractTableModel>
+#include <QDialog>
+
+class QLabel;
+class QPushButton;
+class QTableView;
+
+/// A row a place: where it is, what stands there, what was expected, what is used instead.
+class CFindingsModel : public QAbstractTableModel
+{
+    Q_OBJECT
+public:
+    CFindingsModel(std::vector<Finding> findings, QObject* parent);
+
+    int rowCount(const QModelIndex& parent = {}) const override;
+    int columnCount(const QModelIndex& parent = {}) const override;
+    QVariant data(const QModelIndex& index, int role) const override;
+    QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
+    /// Captions and rows, parted by tabs.
+    QString Text(const QModelIndexList& rows) const;
+    void Retranslate();
+
+private:
+    std::vector<Finding> m_findings;
+};
+
+class CFindingsDialog : public QDialog
+{
+    Q_OBJECT
+public:
+    CFindingsDialog(const CDocumentFile& file, QWidget* parent);
+
+protected:
+    void changeEvent(QEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+
+private:
+    void Retranslate();
+    void Copy();
+
+    CString m_name;
+    CFindingsModel* m_model; // children
+    QLabel* m_text;
+    QTableView* m_table;
+    QPushButton* m_copy;
+    QPushButton* m_close;
+};

@@ -1,0 +1,255 @@
+"""The program as its user meets it: pages, fields, cells, messages, windows."""
+import os
+import re
+import signal
+import subprocess
+import time
+
+from hands import Hands
+from screen import Table, application
+from waiting import PATIENCE, NotInTime, wait_for
+
+
+def active_window():
+    """The window that has the keyboard; empty while it passes from one to the next."""
+    return subprocess.run(['xdotool', 'getactivewindow'], capture_output=True, text=True).stdout.strip()
+
+
+class Editor:
+    """The program, started with files; `folder` is where it runs and where its log is kept."""
+
+    def __init__(self, folder, *files, language=None):
+        self.hands = Hands()
+        self._log = open(f'{folder}/kvrshell.log', 'w+', encoding='utf-8', errors='replace')
+        program = os.path.join(os.environ['KVR_BIN'], 'kvrshell')
+        # Settings of its own: what one case chooses must not meet the next.
+        environment = dict(os.environ, XDG_CONFIG_HOME=f'{folder}/settings', LC_ALL=(language or 'C') + '.UTF-8')
+        self.process = subprocess.Popen([program, *files], cwd=folder, stdout=self._log, stderr=self._log,
+                                        env=environment)
+        try:
+            self.root = application(self.process)
+            self.frame = next(w for w in self.root.children() if w.role == 'frame')
+        except BaseException:
+            self.end()
+            raise
+        self._window = wait_for(active_window, 'the window has the keyboard')
+        self.settle()
+
+    def end(self):
+        """Ends the program whatever state it is in, and gives back what it wrote to its log."""
+        if self._log.closed:
+            return ''
+        if self.process.poll() is None:
+            self.process.send_signal(signal.SIGKILL)
+        self.process.wait()
+        self._log.seek(0)
+        text = self._log.read()
+        self._log.close()
+        return text
+
+    # ---- time
+
+    def settle(self, seconds=0.15):
+        """Lets the program meet what was pressed: it has answered, and some time later nothing on screen differs."""
+        before = None
+        for _ in range(20):
+            time.sleep(seconds * PATIENCE)
+            now = (self.frame.name, len(self._boxes()), self.status())
+            if now == before:
+                return
+            before = now
+
+    # ---- keys
+
+    def press(self, *keys, pause=20):
+        self.hands.press(*keys, pause=pause)
+
+    def type(self, text, speed=25):
+        self.hands.type(text, speed)
+
+    def click(self, widget, **more):
+        self.hands.click(*widget.middle, **more)
+        self.settle(0.05)
+
+    def menu(self, *entries):
+        """Chooses a menu entry with the mouse: menu('Edit', 'Undo'). Entries are found by how they begin
+        or end."""
+        bar = self._menu_bar()
+        item = wait_for(lambda: next((w for w in bar.children() if w.name == entries[0]), None),
+                        f'the menu {entries[0]} is there')
+        self.hands.click(*item.middle)
+        for entry in entries[1:]:
+            item = wait_for(lambda: self._entry(entry), f'the entry {entry} is shown')
+            self.hands.click(*item.middle)
+        x, y, width, height = self.frame.place
+        self.hands.rest(x + width // 2, y + height - 2)  # over nothing that would speak in the status bar
+        self.settle()
+
+    def _menu_bar(self):
+        return next(w for w in self.frame.children() if w.role == 'menu bar')
+
+    def _entry(self, name):
+        for popup in [w for w in self._popups(self._menu_bar()) if w.shown]:
+            for item in popup.children():
+                its = item.name.split('\t')[0]
+                if (its.startswith(name) or its.endswith(name)) and item.shown:
+                    return item
+        return None
+
+    def _popups(self, widget):
+        for child in widget.children():
+            if child.role == 'popup menu':
+                yield child
+            if child.role in ('popup menu', 'menu item', 'menu'):
+                yield from self._popups(child)
+
+    def open_menu(self, name):
+        item = next(w for w in self._menu_bar().children() if w.name == name)
+        self.hands.click(*item.middle)
+        self.settle(0.1)
+
+    # ---- windows
+
+    @property
+    def title(self):
+        return self.frame.name
+
+    @property
+    def modified(self):
+        return '*' in self.title
+
+    def status(self):
+        bar = next((w for w in self.frame.children() if w.role == 'status bar'), None)
+        return bar.name if bar else ''
+
+    def window(self, title):
+        """The window of a document, by how its title begins."""
+        return self.frame.find('frame', f'^{re.escape(title)}')
+
+    def windows(self):
+        return [w.name for w in self.frame.all('frame') if w.name]
+
+    def project_files(self):
+        """What stands below the project in its tree, with the marks of modified files."""
+        names = [w.name for w in self.frame.find('tree', '^Files of the project').children() if w.role == 'table cell']
+        return names[1:]
+
+    # ---- pages
+
+    def page(self, name):
+        """Clicks the tab of a page."""
+        self.hands.click(*self._tab(name).middle)
+        self.settle(0.1)
+
+    def _tab(self, name):
+        return self.frame.find('page tab', f'^{re.escape(name)}$')
+
+    def pages(self):
+        """The captions of all pages, from top to bottom."""
+        return [tab.name for tab in self._sheet().children() if tab.role == 'page tab']
+
+    def current_page(self):
+        return self._sheet().name
+
+    def _sheet(self):
+        """The column of tabs of the window in front."""
+        return next(w for w in self.frame.all('page tab list') if w.place[2] < w.place[3])
+
+    def go_to(self, name):
+        """Brings a page into view and waits for it."""
+        self.page(name)
+        wait_for(lambda: self.current_page() == name, f'the page {name} is in front')
+
+    def field(self, name, role='text', nth=0):
+        """A field of the page by how its name begins."""
+        pattern = f'^{re.escape(name)}'
+        return wait_for(lambda: (self.frame.all(role, pattern)[nth:] or [None])[0], f'a {role} {name!r} is shown')
+
+    def fill(self, name, text, speed=25, leave='Tab', nth=0):
+        """Replaces what stands in a field by typed text and leaves it with a key, if one is given."""
+        self.hands.click(*self.field(name, nth=nth).middle)
+        self.press('ctrl+a')
+        self.type(text, speed) if text else self.press('BackSpace')
+        if leave:
+            self.press(leave)
+            self.settle(0.1)
+
+    # ---- tables
+
+    def table(self, name='Local ', nth=0):
+        """A table of the page by how its name begins."""
+        pattern = f'^{re.escape(name)}'
+        return Table(wait_for(lambda: (self.frame.all('table', pattern)[nth:] or [None])[0],
+                              f'a table {name!r} is shown'))
+
+    def click_cell(self, line, column, table=None, **more):
+        self.click((table or self.table()).cell(line, column), **more)
+
+    def put(self, line, column, text, speed=25, leave='Tab', table=None):
+        """Types into a cell, in place of what stands there."""
+        self.click_cell(line, column, table)
+        self.type(text, speed)
+        if leave:
+            self.press(leave)
+            self.settle(0.1)
+
+    def empty(self, line, column, table=None):
+        """Empties a cell that stays in edit mode."""
+        self.click_cell(line, column, table)
+        self.press('F2', 'ctrl+a', 'BackSpace')
+
+    def focus(self):
+        return self.frame.focus()
+
+    # ---- messages
+
+    def _boxes(self):
+        # Every one is a window of the desktop, and modal. Looking for it among the widgets takes far longer.
+        if active_window() == self._window:
+            return []
+        # Seen from the program it stands beside the frame, or below the window that it is about.
+        beside = [w for w in self.root.children() if w.role in ('alert', 'dialog') and w.shown]
+        return beside or self.frame.all('alert') + self.frame.all('dialog')
+
+    def box(self, seconds=5.0):
+        """The message box or dialog that is up, once it is."""
+        return wait_for(lambda: (self._boxes() or [None])[0], 'a message or dialog is shown', seconds)
+
+    def box_texts(self):
+        box = self.box()
+        return [label.text for label in box.all('label') if label.text]
+
+    def answer(self, button='OK'):
+        """The texts of the message that has to be up, pressed away by its button."""
+        box = self.box()
+        texts = [label.text for label in box.all('label') if label.text]
+        found = wait_for(lambda: next((b for b in box.all('push button') if b.name.replace('&', '') == button), None),
+                         f'the button {button} among {[b.name for b in box.all("push button")]} of {texts}')
+        self.hands.click(*found.middle)
+        wait_for(lambda: box not in self._boxes() and self._gone(box), f'the message {texts} goes')
+        self.settle(0.1)
+        return texts
+
+    @staticmethod
+    def _gone(box):
+        try:
+            return not box.shown
+        except Exception:  # its object is no more
+            return True
+
+    def no_message(self):
+        """What stands in a message that is up against expectation; None when there is none."""
+        self.settle()
+        boxes = self._boxes()
+        return [label.text for label in boxes[0].all('label') if label.text] if boxes else None
+
+    # ---- files
+
+    def save(self, seconds=8.0):
+        """Ctrl+S, and what it changes: the mark of a modified document goes."""
+        self.press('ctrl+s')
+        try:
+            wait_for(lambda: not self.modified, 'the document is saved', seconds)
+        except NotInTime as late:
+            raise NotInTime(f'{late}; message: {self.no_message()}') from None
+        self.settle(0.1)
