@@ -93,17 +93,12 @@ CSwitchFormula::CSwitchFormula(CKavo0_hdDoc& document, std::int32_t formula, boo
     ConvertTools(globals.BedResist);
     for (std::size_t line = 0; line < parameters.BedList.GetCount(); ++line) {
         HD_Resistfact& record = parameters.BedList.GetAt(line);
-        if (document.IsPlaceholder(record))
-            continue;
         for (double* value :
              {&record.Resistance, &record.ZoneResistance1, &record.ZoneResistance2, &record.ZoneResistance3})
             Invert(*value);
     }
-    for (std::size_t line = 0; line < parameters.BedResistanceToolboxList.GetCount(); ++line) {
-        HDBedResTool& record = parameters.BedResistanceToolboxList.GetAt(line);
-        if (!document.IsPlaceholder(record))
-            ConvertTools(record);
-    }
+    for (std::size_t line = 0; line < parameters.BedResistanceToolboxList.GetCount(); ++line)
+        ConvertTools(parameters.BedResistanceToolboxList.GetAt(line));
 }
 
 ChangePlace CSwitchFormula::Apply()
