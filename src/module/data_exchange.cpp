@@ -231,7 +231,6 @@ void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(
         const bool mayLeave = served->MayLeave(KsLeave::Page);
         if (!served || !Ready(served)) // the question may have taken its time
             return;
-        served->ActivePage()->StoreToDocument();
         CKavo0_hdDoc& document = *served->GetDocument();
         const HDDataTable& table = *FindDataTable(item->type);
         Exchange exchange{*item, table, *served, document, table.list(document.Parameters()), mayLeave};

@@ -74,7 +74,6 @@ QWidget* CBindings::ControlFor(const void* value) const
 
 void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
 {
-    m_controls.emplace_back(&value, field);
     field->Setup(&value, options.textLimit, options.decimals, options.generalNotation,
                  options.unit ? *options.unit : DeclaredUnit(m_document->Parameters().Global, value));
     field->SetRange(options.minimum.has_value(), options.minimum.value_or(0), options.maximum.has_value(),
