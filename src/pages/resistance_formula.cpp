@@ -131,14 +131,14 @@ void SwitchResistanceFormula(CKavo0_hdDoc& document, std::int32_t formula, QComb
             answer = KsMessageBox(LoadString(Str::CannotConvert)
                                       .arg(box.itemText(before), box.itemText(formula))
                                       .arg(converted->ChangeCount()),
-                                  Button::Ok | Button::Cancel, Button::Ok, &box);
+                                  Button::Ok | Button::Cancel, &box, {}, Button::Ok);
     } else if (IsKnown(before) && converted->ChangeCount() > 0) {
         answer = KsMessageBox(LoadString(Str::OfferConversion)
                                   .arg(box.itemText(before), box.itemText(formula))
                                   .arg(converted->ChangeCount())
                                   .arg(KsShortestNumber(globals.G_resistance),
                                        KsFormatNumber(QStringLiteral("%.6lg"), Inverse(globals.G_resistance))),
-                              Button::Yes | Button::No | Button::Cancel, Button::No, &box);
+                              Button::Yes | Button::No | Button::Cancel, &box, {}, Button::No);
     }
     if (answer == Button::Cancel)
         return;

@@ -18,13 +18,7 @@ QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
 } // namespace
 
 QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent,
-                                         const CString& details)
-{
-    return KsMessageBox(text, buttons, QMessageBox::NoButton, parent);
-}
-
-QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons,
-                                         QMessageBox::StandardButton defaultButton, QWidget* parent)
+                                         const CString& details, QMessageBox::StandardButton defaultButton)
 {
     if (const auto handler = Handler())
         return handler(text, buttons);

@@ -10,14 +10,11 @@
 class QWidget;
 
 /// Shows a modal message with the given buttons and returns the one pressed. The title is the application's name;
-/// `details` stand below the text.
+/// `details` stand below the text; Enter presses `defaultButton`.
 KS_API QMessageBox::StandardButton KsMessageBox(const CString& text,
                                                 QMessageBox::StandardButtons buttons = QMessageBox::Ok,
-                                                QWidget* parent = nullptr, const CString& details = {});
-
-/// Likewise; Enter presses `defaultButton`.
-KS_API QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons,
-                                                QMessageBox::StandardButton defaultButton, QWidget* parent);
+                                                QWidget* parent = nullptr, const CString& details = {},
+                                                QMessageBox::StandardButton defaultButton = QMessageBox::NoButton);
 
 using KsMessageBoxHandler =
     std::function<QMessageBox::StandardButton(const CString& text, QMessageBox::StandardButtons buttons)>;
