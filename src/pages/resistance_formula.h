@@ -17,7 +17,7 @@ QString ResistanceUnit(std::int32_t formula);
 /// when the user thinks better of it. `box` names the formulas.
 void SwitchResistanceFormula(CKavo0_hdDoc& document, std::int32_t formula, QComboBox& box);
 
-/// Another formula and other resistances with it. Lines that nobody has touched yet take no part.
+/// Another formula, and other resistances with it.
 class CSwitchFormula : public CDocumentCommand
 {
 public:

@@ -200,7 +200,7 @@ protected:
         // One entry of the lists after the other, because they lock other cells.
         const bool hasLists = std::any_of(model.Columns().begin(), model.Columns().end(),
                                           [](const ColumnSpec& column) { return bool(column.choices.entries); });
-        for (int entry = 0; entry < (hasLists ? 6 : 1); ++entry)
+        for (int entry = 0; entry < (hasLists ? 8 : 1); ++entry)
             for (int row = 0; row < std::min(model.rowCount(), 2); ++row)
                 for (int column = 0; column < model.columnCount(); ++column) {
                     const Choices& choices = model.Columns()[std::size_t(column)].choices;

@@ -184,7 +184,7 @@ TEST_F(EncroachPageTest, AWrongCellKeepsTheSetup)
     AddSetup({"A", "B"});
     AddSetup({"C", "D"});
     Open<CEncroachPage>();
-    Type(1, 5, "1.");
+    Type(1, 7, "1."); // a position
     Click("next_1343");
     EXPECT_EQ(boxes.value(0), "Floating point number required");
     EXPECT_EQ(Shown(), "-nadd Set-up 1 A");

@@ -233,5 +233,5 @@ TEST_F(LayerPagesTest, TextsFollowTheLanguage)
     follows([&] { return Headers().back(); }, "Q0");
     Open<CReachLengthPage>();
     follows([&] { return Headers().back(); }, "Right bank");
-    follows([&] { return Find<QAbstractButton>(1104)->text(); }, "&Load branch and chainages");
+    follows([&] { return Find<QAbstractButton>(1104)->text(); }, "Load &branch and chainages");
 }

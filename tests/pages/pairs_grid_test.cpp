@@ -20,7 +20,7 @@ protected:
     }
     void OpenToolbox()
     {
-        globals.BedResist.Method = 2; // the table
+        globals.BedResist.Method = 9; // unknown: may use anything
         Open<CBedToolboxPage>();
         global = Find<CGenGrid>(1318);
         line = Find<CGenGrid>(1320);

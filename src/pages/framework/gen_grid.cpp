@@ -114,15 +114,14 @@ QString CGenGrid::TextAt(int row, int column) const
 
 QString CGenGrid::LineText() const
 {
-    const int fixed = m_model->FixedRows();
-    const int row = CurrentRow() - fixed, column = CurrentColumn() - 1;
-    if (row <= 0 || column < 0 || CurrentRow() > int(m_model->Rows()->Count())) // the rows may be about to be synced
+    const int fixed = m_model->FixedRows(), line = CurrentRow() - fixed, column = CurrentColumn() - 1;
+    if (line <= 0 || column < 0)
         return {};
+    if (!m_model->HidesDigits(CurrentRow() - 1, column))
+        return LoadString(Str::LineOfLines).arg(line).arg(RowCount() - fixed);
     const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
-    const CellValue value = m_model->Value(row + fixed - 1, column);
-    if (!HidesDigits(spec, value, ShownText(spec, value)))
-        return LoadString(Str::LineOfLines).arg(row).arg(RowCount() - fixed);
-    return LoadString(Str::LineOfLinesValue).arg(row).arg(RowCount() - fixed).arg(spec.header(), FullText(spec, value));
+    const QString number = FullText(spec, m_model->Value(CurrentRow() - 1, column));
+    return LoadString(Str::LineOfLinesValue).arg(line).arg(RowCount() - fixed).arg(spec.header(), number);
 }
 
 void CGenGrid::UpdateRowHeader()

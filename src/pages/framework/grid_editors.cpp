@@ -1,6 +1,5 @@
 #include "pages/framework/grid_editors.h"
 
-#include "pages/framework/cell_text.h"
 #include "pages/framework/digits_mark.h"
 #include "pages/framework/gen_grid.h"
 #include "pages/framework/grid_keys.h"
@@ -222,16 +221,6 @@ void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cel
     painter->drawText(x, y, text);
 }
 
-void CGridDelegate::PaintMark(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
-{
-    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
-    if (column.Kind() != CellKind::Number)
-        return;
-    const CellValue value = m_grid->Model()->Value(index.row(), index.column());
-    if (HidesDigits(column, value, ShownText(column, value)))
-        PaintDigitsMark(*painter, cell.rect, cell.palette, cell.state.testFlag(QStyle::State_Selected));
-}
-
 void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const
 {
     constexpr QStyle::State special = QStyle::State_Selected | QStyle::State_HasFocus | QStyle::State_MouseOver;
@@ -241,7 +230,9 @@ void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
             PaintText(painter, option, index);
         else
             QStyledItemDelegate::paint(painter, option, index);
-        return PaintMark(painter, option, index);
+        if (m_grid->Model()->HidesDigits(index.row(), index.column()))
+            PaintDigitsMark(*painter, option.rect, option.palette, option.state.testFlag(QStyle::State_Selected));
+        return;
     }
     QStyleOptionViewItem cell = option;
     initStyleOption(&cell, index);

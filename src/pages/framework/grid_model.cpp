@@ -148,6 +148,15 @@ bool CGridModel::IsLocked(int row, int column) const
     return spec.locked(shown->At(0));
 }
 
+bool CGridModel::HidesDigits(int row, int column) const
+{
+    const ColumnSpec& spec = m_columns[std::size_t(column)];
+    if (spec.Kind() != CellKind::Number || !IsRow(row))
+        return false;
+    const CellValue value = Value(row, column);
+    return ::HidesDigits(spec, value, ShownText(spec, value));
+}
+
 QVariant CGridModel::data(const QModelIndex& index, int role) const
 {
     if (!index.isValid() || !IsRow(index.row()))

@@ -57,6 +57,8 @@ public:
     /// Why the cell would not take the text; empty when it would.
     QString Refusal(int row, int column, const QString& text) const;
     bool IsLocked(int row, int column) const;
+    /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
+    bool HidesDigits(int row, int column) const;
 
     /// Rows of the source, without the offered one.
     int StoredRows() const { return m_rows ? int(m_rows->Count()) : 0; }
