@@ -403,8 +403,12 @@ Shell of the river model editors.</translation>
             <translation>%1 (no editor)</translation>
         </message>
         <message>
-            <source>%1 (in the project %2)</source>
-            <translation>%1 (in the project %2)</translation>
+            <source>%1 (in %2)</source>
+            <translation>%1 (in %2)</translation>
+        </message>
+        <message>
+            <source>%1: open in the project %2</source>
+            <translation>%1: open in the project %2</translation>
         </message>
         <message>
             <source>&amp;Open</source>
