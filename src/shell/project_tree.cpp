@@ -62,12 +62,13 @@ void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, cons
     else if (state.kind == CMemberState::Unknown)
         text = tr("%1 (no editor)").arg(text);
     else if (!state.elsewhere.isEmpty())
-        text = tr("%1 (in the project %2)").arg(text, state.elsewhere);
+        text = tr("%1 (in %2)").arg(text, state.elsewhere); // the tree is narrow; the tip says it in full
     auto* item = new QTreeWidgetItem(&project, {text});
     item->setData(0, HandleRole, project.data(0, HandleRole));
     item->setData(0, PathRole, path);
     item->setIcon(0, state.icon);
-    item->setToolTip(0, QDir::toNativeSeparators(path));
+    const QString tip = QDir::toNativeSeparators(path);
+    item->setToolTip(0, state.elsewhere.isEmpty() ? tip : tr("%1: open in the project %2").arg(tip, state.elsewhere));
     QFont font = m_tree->font();
     font.setBold(state.kind == CMemberState::Open && state.elsewhere.isEmpty());
     item->setFont(0, font);

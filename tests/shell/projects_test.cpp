@@ -296,7 +296,7 @@ TEST_F(ShellTest, AFileOfTwoProjectsBelongsToOneAndTheUserIsTold)
     EXPECT_FALSE(asked[0].contains("b.tst: "));
     EXPECT_EQ(ProjectOf("both.tst"), one);
     EXPECT_EQ(shown(0, 0), "both.tst");
-    EXPECT_EQ(shown(1, 0), "BOTH.tst (in the project one)");
+    EXPECT_EQ(shown(1, 0), "BOTH.tst (in one)");
 
     // Where it is opened from, there it belongs.
     for (const auto& [from, project] : {std::pair(1, two), std::pair(0, one)}) {
@@ -308,7 +308,7 @@ TEST_F(ShellTest, AFileOfTwoProjectsBelongsToOneAndTheUserIsTold)
         QCoreApplication::processEvents();
         ASSERT_TRUE(ViewOf("both.tst"));
         EXPECT_EQ(ProjectOf("both.tst"), project);
-        EXPECT_TRUE(shown(1 - from, 0).endsWith(from == 0 ? "(in the project one)" : "(in the project two)"));
+        EXPECT_TRUE(shown(1 - from, 0).endsWith(from == 0 ? "(in one)" : "(in two)"));
     }
     EXPECT_TRUE(frame->CloseProject(one));
     Settle();

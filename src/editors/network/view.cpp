@@ -7,10 +7,6 @@
 #include <QVBoxLayout>
 #include <algorithm>
 
-namespace {
-constexpr int RefreshDelay = 60; // milliseconds: shorter than a blink, longer than a burst of changes
-} // namespace
-
 CNetworkView::CNetworkView(QWidget* parent) : CProjectView(parent)
 {
     setObjectName(QStringLiteral("networkView"));

@@ -77,6 +77,7 @@ private:
     CLinesView *m_branches = nullptr, *m_channel = nullptr;
     QLabel *m_branchTitle = nullptr, *m_channelTitle = nullptr;
     std::unique_ptr<CLocationSource> m_source;
-    QTimer m_refresh; // one fetch for changes that follow one another
+    static constexpr int RefreshDelay = 60; // milliseconds: shorter than a blink, longer than a burst of changes
+    QTimer m_refresh;                       // one fetch for changes that follow one another
     bool m_stale = true;
 };

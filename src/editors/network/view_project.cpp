@@ -3,10 +3,27 @@
 #include "editors/network/view.h"
 #include "ks/fc/branch_name.h"
 
+#include <QElapsedTimer>
 #include <QFileInfo>
 #include <QHash>
 #include <QMenu>
+#include <algorithm>
 #include <cmath>
+
+namespace {
+
+constexpr int PauseFactor = 4; // of the time that the last refresh took
+
+bool SameLocations(const std::vector<CMapLocation>& a, const std::vector<CMapLocation>& b)
+{
+    const auto same = [](double x, double y) { return x == y || (std::isnan(x) && std::isnan(y)); };
+    return std::equal(a.begin(), a.end(), b.begin(), b.end(), [&](const CMapLocation& x, const CMapLocation& y) {
+        return x.kind == y.kind && x.chainage == y.chainage && same(x.second, y.second) && x.branch == y.branch &&
+               x.file == y.file;
+    });
+}
+
+} // namespace
 
 // ---- requests ----------------------------------------------------------------------------------
 
@@ -121,8 +138,21 @@ void CNetworkView::showEvent(QShowEvent* event)
 
 void CNetworkView::RefreshLocations()
 {
+    // A document that is being saved does not answer: its locations stay until it does.
+    const auto views = Document()->ProjectViews(this);
+    if (std::any_of(views.begin(), views.end(), [](CView* view) { return view->GetDocument()->IsExecuting(); })) {
+        m_refresh.start();
+        return;
+    }
     m_stale = false;
-    m_map->SetLocations(m_source->Fetch());
+    QElapsedTimer time;
+    time.start();
+    auto locations = m_source->Fetch();
+    // Of what the user edits most are values, of which the map shows nothing.
+    if (!SameLocations(locations, m_map->Locations()))
+        m_map->SetLocations(std::move(locations));
+    // Where that takes long, it waits until there is a pause in the changes.
+    m_refresh.setInterval(int(std::max<qint64>(RefreshDelay, PauseFactor * time.elapsed())));
 }
 
 void CNetworkView::DeleteLocation()

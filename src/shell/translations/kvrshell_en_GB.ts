@@ -411,10 +411,6 @@ Shell of the river model editors.</translation>
             <translation>%1 (no editor)</translation>
         </message>
         <message>
-            <source>%1 (in the project %2)</source>
-            <translation>%1 (in the project %2)</translation>
-        </message>
-        <message>
             <source>&amp;Open</source>
             <translation>&amp;Open</translation>
         </message>
@@ -429,6 +425,14 @@ Shell of the river model editors.</translation>
         <message>
             <source>Files of the project</source>
             <translation>Files of the project</translation>
+        </message>
+        <message>
+            <source>%1 (in %2)</source>
+            <translation>%1 (in %2)</translation>
+        </message>
+        <message>
+            <source>%1: open in the project %2</source>
+            <translation>%1: open in the project %2</translation>
         </message>
     </context>
     <context>

@@ -411,10 +411,6 @@ Shell of the river model editors.</source>
             <translation>%1 (エディタなし)</translation>
         </message>
         <message>
-            <source>%1 (in the project %2)</source>
-            <translation>%1 (プロジェクト %2 内)</translation>
-        </message>
-        <message>
             <source>&amp;Open</source>
             <translation>開く(&amp;O)</translation>
         </message>
@@ -429,6 +425,14 @@ Shell of the river model editors.</source>
         <message>
             <source>Files of the project</source>
             <translation>プロジェクトのファイル</translation>
+        </message>
+        <message>
+            <source>%1 (in %2)</source>
+            <translation>%1 (%2 内)</translation>
+        </message>
+        <message>
+            <source>%1: open in the project %2</source>
+            <translation>%1: プロジェクト %2 で開いています</translation>
         </message>
     </context>
     <context>
