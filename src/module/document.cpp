@@ -77,11 +77,12 @@ CString CKavo0_hdDoc::SavePathFor(const CString& path) const
 
 BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
 {
-    const FocusPause pause;
     const CString target = SavePathFor(path);
-    UpdateAllViews(nullptr, Hint::Store);
+    // Questions come first: behind one the window would give the focus to its first widget.
     if (!MayReplace(target, path) || !m_file.MayReplace(target))
         return false;
+    const FocusPause pause;
+    UpdateAllViews(nullptr, Hint::Store);
 
     RemovePlaceholders();
     auto purged = std::make_unique<CPurgedLines>(*this);
