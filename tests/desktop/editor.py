@@ -6,7 +6,7 @@ import subprocess
 import time
 
 from hands import Hands
-from screen import Table, application
+from screen import State, Table, application
 from waiting import PATIENCE, NotInTime, wait_for
 
 
@@ -15,11 +15,24 @@ def active_window():
     return subprocess.run(['xdotool', 'getactivewindow'], capture_output=True, text=True).stdout.strip()
 
 
+def largest_window(pid):
+    """The main window of a program: a message may be up as soon as it starts."""
+    found = subprocess.run(['xdotool', 'search', '--onlyvisible', '--pid', str(pid)], capture_output=True, text=True)
+
+    def area(window):
+        size = subprocess.run(['xdotool', 'getwindowgeometry', '--shell', window], capture_output=True,
+                              text=True).stdout
+        return int(re.search(r'WIDTH=(\d+)', size).group(1)) * int(re.search(r'HEIGHT=(\d+)', size).group(1))
+
+    return max(found.stdout.split(), key=area, default='')
+
+
 class Editor:
     """The program, started with files; `folder` is where it runs and where its log is kept."""
 
     def __init__(self, folder, *files, language=None):
         self.hands = Hands()
+        self._known = {}  # widgets that were looked for
         self._log = open(f'{folder}/kvrshell.log', 'w+', encoding='utf-8', errors='replace')
         program = os.path.join(os.environ['KVR_BIN'], 'kvrshell')
         # Settings of its own: what one case chooses must not meet the next.
@@ -32,7 +45,7 @@ class Editor:
         except BaseException:
             self.end()
             raise
-        self._window = wait_for(active_window, 'the window has the keyboard')
+        self._window = wait_for(lambda: largest_window(self.process.pid), 'the window is on the desktop')
         self.settle()
 
     def end(self):
@@ -51,13 +64,12 @@ class Editor:
 
     def settle(self, seconds=0.15):
         """Lets the program meet what was pressed: it has answered, and some time later nothing on screen differs."""
-        before = None
+        seen = None
         for _ in range(20):
-            time.sleep(seconds * PATIENCE)
-            now = (self.frame.name, len(self._boxes()), self.status())
-            if now == before:
+            before, seen = seen, (self.frame.name, active_window(), self.status())
+            if seen == before:
                 return
-            before = now
+            time.sleep(seconds * PATIENCE)
 
     # ---- keys
 
@@ -127,7 +139,9 @@ class Editor:
         return self.frame.find('frame', f'^{re.escape(title)}')
 
     def windows(self):
-        return [w.name for w in self.frame.all('frame') if w.name]
+        """The titles of the documents' windows, those behind others too."""
+        pane = next(w for w in self.frame.children() if w.role == 'layered pane')
+        return [w.name for w in pane.children() if w.role == 'frame']
 
     def project_files(self):
         """What stands below the project in its tree, with the marks of modified files."""
@@ -162,8 +176,19 @@ class Editor:
 
     def field(self, name, role='text', nth=0):
         """A field of the page by how its name begins."""
+        return self._shown(role, name, nth)
+
+    def _shown(self, role, name, nth):
+        """The nth widget that shows, of those whose name begins so. Looking through a window takes a while, so what was
+        found is remembered as long as it is there."""
+        key = (role, name, nth)
+        known = self._known.get(key)
+        if known and known.is_shown_as(role, name):
+            return known
         pattern = f'^{re.escape(name)}'
-        return wait_for(lambda: (self.frame.all(role, pattern)[nth:] or [None])[0], f'a {role} {name!r} is shown')
+        found = wait_for(lambda: (self.frame.all(role, pattern)[nth:] or [None])[0], f'a {role} {name!r} is shown')
+        self._known[key] = found
+        return found
 
     def fill(self, name, text, speed=25, leave='Tab', nth=0):
         """Replaces what stands in a field by typed text and leaves it with a key, if one is given."""
@@ -178,9 +203,7 @@ class Editor:
 
     def table(self, name='Local ', nth=0):
         """A table of the page by how its name begins."""
-        pattern = f'^{re.escape(name)}'
-        return Table(wait_for(lambda: (self.frame.all('table', pattern)[nth:] or [None])[0],
-                              f'a table {name!r} is shown'))
+        return Table(self._shown('table', name, nth))
 
     def click_cell(self, line, column, table=None, **more):
         self.click((table or self.table()).cell(line, column), **more)
@@ -209,7 +232,8 @@ class Editor:
             return []
         # Seen from the program it stands beside the frame, or below the window that it is about.
         beside = [w for w in self.root.children() if w.role in ('alert', 'dialog') and w.shown]
-        return beside or self.frame.all('alert') + self.frame.all('dialog')
+        boxes = beside or self.frame.all('alert') + self.frame.all('dialog')
+        return sorted(boxes, key=lambda box: not box.has(State.ACTIVE))
 
     def box(self, seconds=5.0):
         """The message box or dialog that is up, once it is."""
@@ -226,7 +250,7 @@ class Editor:
         found = wait_for(lambda: next((b for b in box.all('push button') if b.name.replace('&', '') == button), None),
                          f'the button {button} among {[b.name for b in box.all("push button")]} of {texts}')
         self.hands.click(*found.middle)
-        wait_for(lambda: box not in self._boxes() and self._gone(box), f'the message {texts} goes')
+        wait_for(lambda: self._gone(box), f'the message {texts} goes')
         self.settle(0.1)
         return texts
 

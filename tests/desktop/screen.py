@@ -42,6 +42,13 @@ class Widget:
     def shown(self):
         return self.has(State.SHOWING)
 
+    def is_shown_as(self, role, beginning):
+        """Whether this is still there, shown, and has such a role and name."""
+        try:
+            return self.shown and self.name.startswith(beginning) and self.role == role
+        except GLib.Error:
+            return False
+
     @property
     def enabled(self):
         return self.has(State.ENABLED)

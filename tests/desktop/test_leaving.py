@@ -10,6 +10,165 @@ SIX_LINES = samples.hd_text({'InitList': [f'"MOORBECK", {100 * n}, {n}.25, {n}.5
                             {'Quasi_steady': ['EnergyEquation = true, 0', 'G_ContractExpansion = 0.15, 0.35']})
 
 
+class EmptiedCell(Case):
+    """An emptied cell of a column with a global value takes the global value."""
+
+    def assert_global_after(self, leave, back='Initial'):
+        self.open(SIX_LINES)
+        self.editor.empty(2, 3)
+        leave()
+        self.assert_no_message()
+        if back:
+            self.editor.go_to(back)
+        self.assertEqual(self.editor.table().cell(2, 3).name, '3.5')
+        self.editor.save()
+        self.assertEqual(self.saved().records('InitList')[1], '"MOORBECK", 200, 3.5, 2.5')
+
+    def test_page_key(self):
+        self.assert_global_after(lambda: self.editor.press('ctrl+Next'))
+
+    def test_save(self):
+        self.assert_global_after(lambda: self.editor.press('ctrl+s'), back=None)
+
+    def test_menu(self):
+        self.assert_global_after(lambda: self.editor.menu('File', 'Save'), back=None)
+
+    def test_close(self):
+        editor = self.open(SIX_LINES)
+        editor.empty(2, 3)
+        editor.press('ctrl+F4')
+        editor.answer('Save')
+        wait_for(lambda: not editor.windows(), 'the window closes')
+        self.assertEqual(self.saved().records('InitList')[1], '"MOORBECK", 200, 3.5, 2.5')
+
+
+class BadText(Case):
+    """Text that cannot be stored is told once, with its field, and nothing changes until it is mended."""
+
+    def setUp(self):
+        super().setUp()
+        self.editor = self.open()
+
+    def assert_field_waits(self):
+        """The field is in view with what was typed, and has the focus: digits go into it and nowhere else."""
+        editor = self.editor
+        self.assertEqual(editor.current_page(), 'Default Values')
+        others = {w.name: w.text for w in editor.frame.all('text') if w.name != 'Delta:'}
+        editor.type('77')
+        editor.settle()
+        self.assertIn('77', editor.field('Delta').text)
+        self.assertEqual({w.name: w.text for w in editor.frame.all('text') if w.name != 'Delta:'}, others)
+
+    def spoil_field(self, text='abc', leave=None):
+        self.editor.go_to('Default Values')
+        self.editor.fill('Delta', text, leave=leave)
+
+    def test_field_then_tab_key(self):
+        self.spoil_field(leave='Tab')
+        self.assert_told_once('Invalid floating point number!', 'Delta', 'abc', '0.5', '1')
+        self.assert_field_waits()
+
+    def test_field_then_tab_clicked(self):
+        self.spoil_field()
+        self.editor.page('Wind')
+        self.assert_told_once('Invalid floating point number!', 'Delta', 'abc', '0.5', '1')
+        self.assert_field_waits()
+
+    def test_field_then_page_key(self):
+        self.spoil_field('7')
+        self.editor.press('ctrl+Next')
+        self.assert_told_once('Floating-point value is out of range', 'Delta', '7', '0.5', '1')
+        self.assert_field_waits()
+
+    def test_field_then_save(self):
+        before = self.saved().text
+        self.spoil_field()
+        self.editor.press('ctrl+s')
+        self.assert_told_once('Invalid floating point number!', 'Delta', 'abc')
+        self.assertEqual(self.saved().text, before)
+        self.assert_field_waits()
+        self.editor.fill('Delta', '0.75', leave=None)
+        self.editor.save()
+        self.assertEqual(self.saved().value('delta'), '0.75')
+
+    def test_change_then_field_then_save(self):
+        """The mark of a modified document stays when its save is refused."""
+        self.editor.put(1, 3, '2.5')
+        self.spoil_field()
+        self.editor.press('ctrl+s')
+        self.assert_told_once('Invalid floating point number!')
+        self.assertTrue(self.editor.modified)
+        self.assertEqual(self.saved().records('InitList')[0], '"MOORBECK", 100, 1.25, 10.5')
+
+    def test_field_then_close(self):
+        self.spoil_field()
+        self.editor.press('ctrl+F4')
+        self.assert_told_once('Invalid floating point number!', 'Delta', 'abc')
+        self.assertEqual(self.editor.windows(), ['moor.HDKV'])
+        self.assert_field_waits()
+
+    def test_field_then_end_of_program(self):
+        self.spoil_field()
+        self.editor.press('ctrl+q')
+        self.assert_told_once('Invalid floating point number!', 'Delta', 'abc')
+        self.assert_field_waits()
+
+    def assert_cell_waits(self):
+        self.assertEqual(self.editor.current_page(), 'Initial')
+        self.editor.press('ctrl+a')
+        self.editor.type('2.5\t')
+        self.editor.settle()
+        self.assert_no_message()
+        self.assertEqual(self.editor.table().line(1), ['MOORBECK', '100', '2.5', '10.5'])
+
+    def spoil_cell(self, leave=None):
+        self.editor.put(1, 3, 'x', leave=leave)
+
+    def test_cell_then_tab_key(self):
+        self.spoil_cell(leave='Tab')
+        self.assert_told_once('Floating point number required', 'x')
+        self.assert_cell_waits()
+
+    def test_cell_then_other_cell(self):
+        self.spoil_cell()
+        self.editor.click_cell(3, 2)
+        self.assert_told_once('Floating point number required', 'x', 'Initial h', 'm')
+        self.assert_cell_waits()
+
+    def test_cell_then_tab_clicked(self):
+        self.spoil_cell()
+        self.editor.page('Wind')
+        self.assert_told_once('Floating point number required', 'x')
+        self.assert_cell_waits()
+
+    def test_cell_then_save(self):
+        before = self.saved().text
+        self.spoil_cell()
+        self.editor.press('ctrl+s')
+        self.assert_told_once('Floating point number required', 'x')
+        self.assertEqual(self.saved().text, before)
+        self.assert_cell_waits()
+
+    def test_cell_then_close(self):
+        self.spoil_cell()
+        self.editor.press('ctrl+F4')
+        self.assert_told_once('Floating point number required', 'x')
+        self.assertEqual(self.editor.windows(), ['moor.HDKV'])
+        self.assert_cell_waits()
+
+    def test_integer_then_save(self):
+        editor = self.editor
+        editor.go_to('Encroachment')
+        editor.fill('Maximum number', 'abc', leave=None)
+        editor.press('ctrl+s')
+        self.assert_told_once('abc', 'Maximum number of iterations')
+        editor.press('Escape')
+        wait_for(lambda: editor.field('Maximum number').text == '20', 'Escape reverts the field')
+        editor.page('Initial')
+        self.assert_no_message()
+        self.assertEqual(editor.current_page(), 'Initial')
+
+
 class WhileTyping(Case):
     """Commands that come while a cell is being typed into lose nothing of it."""
 
@@ -29,3 +188,23 @@ class WhileTyping(Case):
             self.assertEqual(editor.table().cell(line, 3).name, f'7.{line}', f'after {key}')
         editor.save()
         self.assertEqual([r.split(', ')[2] for r in self.saved().records('InitList')[:3]], ['7.1', '7.2', '7.3'])
+
+    def test_bad_text_stops_a_command(self):
+        editor = self.open(SIX_LINES)
+        editor.put(1, 3, 'x', leave=None)
+        editor.press('ctrl+g')
+        self.assert_told_once('Floating point number required', 'x')
+        editor.press('Escape')
+        wait_for(lambda: editor.table().cell(1, 3).name == '1.25', 'Escape takes back what was typed')
+
+    def test_other_window(self):
+        """A click into another window does what a click on a tab does."""
+        editor = self.open_project()
+        editor.page('Default Values')
+        editor.fill('Delta', 'abc', leave=None)
+        editor.click(editor.table('Branches of the river network').cell(2, 2))
+        self.assert_told_once('Invalid floating point number!', 'Delta', 'abc')
+        editor.press('ctrl+a')
+        editor.type('0.75\t')
+        editor.save()
+        self.assertEqual(self.saved().value('delta'), '0.75')
