@@ -4,12 +4,14 @@ import re
 import subprocess
 import time
 
+DOUBLE_CLICK = 0.5  # seconds; two clicks farther apart are two clicks
 KEYS = {'\t': 'Tab', '\n': 'Return'}
 
 
 class Hands:
     def __init__(self):
         self.log = []
+        self._clicked = None, 0.0  # where and when last
 
     def press(self, *keys, pause=20):
         """Keys by their X names, with what is held: 'Tab', 'ctrl+s', 'shift+F3'. `pause`: milliseconds after each."""
@@ -31,9 +33,13 @@ class Hands:
     def click(self, x, y, button=1, times=1, held=None):
         self.log.append(f'click {x}, {y}' + (f' button {button}' if button != 1 else '') +
                         (f' {times} times' if times != 1 else '') + (f' with {held}' if held else ''))
+        # Two clicks at one place are a double click only when that is asked for.
+        if self._clicked[0] == (x, y):
+            time.sleep(max(0.0, self._clicked[1] + DOUBLE_CLICK - time.monotonic()))
         hold = ['keydown', held] if held else []
         let_go = ['keyup', held] if held else []
         self._do('mousemove', x, y, *hold, 'click', '--repeat', times, '--delay', 40, button, *let_go)
+        self._clicked = (x, y), time.monotonic()
 
     def drag(self, start, end):
         self.log.append(f'drag {start} to {end}')
