@@ -48,6 +48,7 @@ TEST_F(ShellTest, TheLinesMenuBelongsToTheActiveView)
     emit Menu(2)->aboutToHide();
     QTest::keyClick(frame.get(), Qt::Key_I, Qt::ControlModifier);
     EXPECT_EQ(frame->ActiveDocument()->UndoStack().count(), 1);
+    answers = {QMessageBox::Discard};
     Action("actionClose")->trigger();
     EXPECT_FALSE(lines->isEnabled());
 }

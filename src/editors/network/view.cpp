@@ -111,8 +111,8 @@ void CNetworkView::CurrentBranchChanged()
     const auto& branches = Document()->Network().branches;
     const bool some = branch >= 0 && std::size_t(branch) < branches.size();
     m_channelTitle->setText(
-        some ? tr("C&hannel of %1").arg(QString(branches[std::size_t(branch)].name).replace(u'&', QStringLiteral("&&")))
-             : tr("C&hannel"));
+        some ? tr("Cha&nnel of %1").arg(QString(branches[std::size_t(branch)].name).replace(u'&', QStringLiteral("&&")))
+             : tr("Cha&nnel"));
 }
 
 CLinesView* CNetworkView::FocusTable() const

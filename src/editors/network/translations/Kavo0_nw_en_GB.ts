@@ -374,11 +374,11 @@
             <translation>%1 holds no lines. Its layers, with their geometry and the number of features:</translation>
         </message>
         <message>
-            <source>&amp;Channel of %1</source>
+            <source>Cha&amp;nnel of %1</source>
             <translation>&amp;Channel of %1</translation>
         </message>
         <message>
-            <source>&amp;Channel</source>
+            <source>Cha&amp;nnel</source>
             <translation>&amp;Channel</translation>
         </message>
     </context>

@@ -374,11 +374,11 @@
             <translation>%1 には線がありません。レイヤーとその図形、地物の数:</translation>
         </message>
         <message>
-            <source>&amp;Channel of %1</source>
+            <source>Cha&amp;nnel of %1</source>
             <translation>%1の河道(&amp;C)</translation>
         </message>
         <message>
-            <source>&amp;Channel</source>
+            <source>Cha&amp;nnel</source>
             <translation>河道(&amp;C)</translation>
         </message>
     </context>
