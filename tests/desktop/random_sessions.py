@@ -84,7 +84,7 @@ class RandomSession:
         if leave in ('Tab', 'Return'):
             self.editor.press(leave)
         elif leave == 'click':
-            self.editor.click_cell(self.a_line(), 2)
+            self.editor.click_cell(self.a_line(), 1)
         elif leave == 'page':
             self.change_page()
         elif leave == 'save':
