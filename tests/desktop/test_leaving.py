@@ -24,6 +24,9 @@ class EmptiedCell(Case):
         self.editor.save()
         self.assertEqual(self.saved().records('InitList')[1], '"MOORBECK", 200, 3.5, 2.5')
 
+    def test_tab_clicked(self):
+        self.assert_global_after(lambda: self.editor.page('Wind'))
+
     def test_page_key(self):
         self.assert_global_after(lambda: self.editor.press('ctrl+Next'))
 
@@ -40,6 +43,20 @@ class EmptiedCell(Case):
         editor.answer('Save')
         wait_for(lambda: not editor.windows(), 'the window closes')
         self.assertEqual(self.saved().records('InitList')[1], '"MOORBECK", 200, 3.5, 2.5')
+
+    def test_other_pages(self):
+        editor = self.open(SIX_LINES)
+        for page, table, column in (('Wind', 'Local', 3), ('Bed Resist.', '', 3), ('Quasi Steady', '', 3),
+                                    ('Quasi Steady', '', 4)):
+            editor.go_to(page)
+            editor.empty(1, column, editor.table(table))
+            editor.page('Initial')
+            self.assert_no_message()
+        editor.save()
+        saved = self.saved()
+        self.assertEqual(saved.records('WindList')[0], '"MOORBECK", 100, 0.9')
+        self.assertEqual(saved.records('BedList')[0].split(', ')[2], saved.value('G_resistance'))
+        self.assertEqual(saved.records('QSSContractionExpansionList')[0], '"MOORBECK", 100, 0.15, 0.35')
 
 
 class BadText(Case):
