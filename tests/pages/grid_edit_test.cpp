@@ -110,6 +110,10 @@ TEST_F(GridEditTest, BlankCells)
     Type(2, 3, "");
     EXPECT_TRUE(view->page->OnKillActive());
     EXPECT_EQ(init.GetAt(1).InitialH, 7) << "left with the page: the global value";
+    init.GetAt(1).InitialH = 1;
+    Type(2, 3, "");
+    view->other->setFocus(Qt::MouseFocusReason); // where a click goes before the page is asked
+    EXPECT_EQ(init.GetAt(1).InitialH, 7) << "likewise with the table";
     EXPECT_EQ(Stored(), "A 10000000000 0 20, B 2 7 21");
 }
 
@@ -158,4 +162,17 @@ TEST_F(GridEditTest, AnOpenEditorGoesWithItsWindow)
     view.reset();
     EXPECT_EQ(init.GetAt(0).RiverName, "A");
     EXPECT_FALSE(document.IsModified());
+}
+
+TEST_F(GridEditTest, KeysBetweenTwoClicksDoNotMoveTheSecondOne)
+{
+    Type(1, 3, "3");
+    QTest::keyClick(Editor(), Qt::Key_Return);
+    ASSERT_EQ(Current(), std::pair(1, 4));
+    const QPoint first = grid->visualRect(grid->model()->index(0, 2)).center();
+    QTest::mouseDClick(grid->viewport(), Qt::LeftButton, {}, first);
+    ASSERT_TRUE(Editor());
+    EXPECT_EQ(Current(), std::pair(1, 3));
+    QTest::keyClick(Editor(), Qt::Key_Tab);
+    EXPECT_EQ(Current(), std::pair(1, 4));
 }

@@ -192,11 +192,13 @@ void CGenGrid::CellModified(int row, int column)
         m_page->OnGridCellModified(row, column);
 }
 
-void CGenGrid::StoreEditedLine()
+void CGenGrid::StoreEditedLine(BlankRule blanks)
 {
     if (!m_modified)
         return;
     m_modified = false;
+    if (blanks == BlankRule::Fill)
+        m_model->Store(blanks);
     if (auto* host = Host()) {
         const int column = m_locationOnAnyColumn ? 1 : m_modifiedColumn;
         host->EditedLineChanged(IsLocationGrid() ? column : 0);
@@ -228,7 +230,7 @@ void CGenGrid::focusOutEvent(QFocusEvent* event)
     // Whatever is edited next reloads the rows, so the line is stored first.
     if (event->reason() != Qt::PopupFocusReason && event->reason() != Qt::ActiveWindowFocusReason &&
         !isAncestorOf(QApplication::focusWidget()))
-        StoreEditedLine();
+        StoreEditedLine(BlankRule::Fill);
 }
 
 void CGenGrid::focusInEvent(QFocusEvent* event)
@@ -247,9 +249,15 @@ void CGenGrid::mousePressEvent(QMouseEvent* event)
 void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
 {
     if (RowCount() == 0 && m_model->Rows())
-        Run(GridAction::AppendLine);
-    else
-        QTableView::mouseDoubleClickEvent(event);
+        return Run(GridAction::AppendLine);
+    // Two clicks with keys between them may be a double click, and the keys have moved on from the cell clicked first.
+    const QModelIndex cell = indexAt(event->position().toPoint());
+    if (cell.isValid() && cell != currentIndex()) {
+        if (m_page ? !m_page->LeaveField() : !CommitEditor())
+            return;
+        SetCurrentCell(cell.row() + 1, cell.column() + 1);
+    }
+    QTableView::mouseDoubleClickEvent(event);
 }
 
 void CGenGrid::paintEvent(QPaintEvent* event)

@@ -77,8 +77,9 @@ public:
 
     /// Takes the text being typed into the cell; false when the cell refuses it and stays open.
     bool CommitEditor();
-    /// Has the view store the edited line, if one was edited since the last time.
-    void StoreEditedLine();
+    /// Has the view store the edited line, if one was edited since the last time. A cell left blank by a move in the
+    /// table is zero; one left together with the table takes the column's fill value, as it does with the page.
+    void StoreEditedLine(BlankRule blanks = BlankRule::Zero);
     void Run(GridAction action);
 
 protected:

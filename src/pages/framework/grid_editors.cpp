@@ -305,7 +305,7 @@ void CGridDelegate::LostFocus(const QEvent* event)
         return;
     if (Refusal().isEmpty()) {
         Commit();
-        m_grid->StoreEditedLine();
+        m_grid->StoreEditedLine(BlankRule::Fill);
         return;
     }
     QTimer::singleShot(0, m_editor, [this] {
