@@ -106,4 +106,4 @@ class SharedFile(Case):
         while editor.no_message():  # each project says it of the other's files
             editor.answer('OK')
         tree = [w.name for w in editor.frame.find('tree', '^Files of the project').children() if w.role == 'table cell']
-        self.assertEqual(sorted(name.split()[0] for name in tree if '(in the' in name), ['moor.HDKV', 'moor.kvxs'])
+        self.assertEqual(sorted(name.split()[0] for name in tree if '(in ' in name), ['moor.HDKV', 'moor.kvxs'])

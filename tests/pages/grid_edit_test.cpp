@@ -166,11 +166,14 @@ TEST_F(GridEditTest, AnOpenEditorGoesWithItsWindow)
 
 TEST_F(GridEditTest, KeysBetweenTwoClicksDoNotMoveTheSecondOne)
 {
-    Type(1, 3, "3");
+    const QPoint first = grid->visualRect(grid->model()->index(0, 2)).center();
+    QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, first);
+    QTest::keyClick(grid, '3');
     QTest::keyClick(Editor(), Qt::Key_Return);
     ASSERT_EQ(Current(), std::pair(1, 4));
-    const QPoint first = grid->visualRect(grid->model()->index(0, 2)).center();
-    QTest::mouseDClick(grid->viewport(), Qt::LeftButton, {}, first);
+    QMouseEvent second(QEvent::MouseButtonDblClick, first, grid->viewport()->mapToGlobal(first), Qt::LeftButton,
+                       Qt::LeftButton, {});
+    QApplication::sendEvent(grid->viewport(), &second);
     ASSERT_TRUE(Editor());
     EXPECT_EQ(Current(), std::pair(1, 3));
     QTest::keyClick(Editor(), Qt::Key_Tab);
