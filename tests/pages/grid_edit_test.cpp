@@ -1,5 +1,7 @@
 #include "page_fixture.h"
 
+#include "pages/framework/name_offers.h"
+
 #include "pages/init_page.h"
 
 class GridEditTest : public PageTest
@@ -139,6 +141,16 @@ TEST_F(GridEditTest, BranchNamesToChooseFrom)
     Type(1, 1, "moo");
     QTest::keyClick(Editor(), Qt::Key_Down); // taken on purpose
     QTest::keyClick(Editor(), Qt::Key_Return);
+    EXPECT_EQ(init.GetAt(0).RiverName, "MOORBECK");
+    Type(2, 1, "river1");
+    auto* offers = view->findChildren<CNameOffers*>().last(); // those of closed editors may still be there
+    ASSERT_TRUE(offers->isVisible());
+    QTest::mouseClick(offers->viewport(), Qt::LeftButton, {}, offers->visualItemRect(offers->item(0)).center());
+    ASSERT_TRUE(Editor());
+    EXPECT_TRUE(Editor()->hasFocus());
+    EXPECT_FALSE(offers->isVisible());
+    QTest::keyClick(Editor(), Qt::Key_Return);
+    EXPECT_EQ(init.GetAt(1).RiverName, "RIVER10");
     view->branches.clear();
     Enter(1, 1, "x");
     EXPECT_EQ(init.GetAt(0).RiverName, "X") << "no network: plain text";

@@ -4,13 +4,13 @@
 #include "pages/framework/gen_grid.h"
 #include "pages/framework/grid_keys.h"
 #include "pages/framework/grid_model.h"
+#include "pages/framework/name_offers.h"
 #include "pages/framework/typing.h"
 #include "res/strings.h"
 
-#include <QAbstractItemView>
 #include <QApplication>
-#include <QCompleter>
 #include <QKeyEvent>
+#include <QMdiSubWindow>
 #include <QPainter>
 #include <QScopedValueRollback>
 #include <QTimer>
@@ -25,43 +25,24 @@ QString TextOf(const QWidget* editor)
     return list ? list->currentText() : static_cast<const QLineEdit*>(editor)->text();
 }
 
-/// Keys that leave the cell do so also while names are offered; the list of offers would keep them.
-class OfferKeys : public QObject
+/// The whole of a document's view, where there is room for what a cell offers.
+QWidget* ViewAround(QWidget* widget)
 {
-public:
-    explicit OfferKeys(QComboBox* list) : QObject(list), m_list(list) {}
-
-protected:
-    bool eventFilter(QObject* object, QEvent* event) override
-    {
-        if (event->type() != QEvent::KeyPress)
-            return QObject::eventFilter(object, event);
-        const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
-        if (!key || !key->whileEditing)
-            return QObject::eventFilter(object, event);
-        m_list->completer()->popup()->hide();
-        QCoreApplication::sendEvent(m_list, event);
-        return true;
-    }
-
-private:
-    QComboBox* m_list;
-};
+    while (!widget->isWindow() && widget->parentWidget() && !qobject_cast<QMdiSubWindow*>(widget->parentWidget()))
+        widget = widget->parentWidget();
+    return widget;
+}
 
 /// The branch names of the network, to choose from; another name can still be typed.
-QWidget* MakeBranchList(const QStringList& names, QWidget* parent)
+QWidget* MakeBranchList(const QStringList& names, QWidget* parent, QWidget* view)
 {
     auto* list = new QComboBox(parent);
     list->setEditable(true);
     list->setLineEdit(new CGridStringEdit(list));
     list->setInsertPolicy(QComboBox::NoInsert);
     list->addItems(names);
-    // Names are offered below what is typed, and taken only when they are chosen: completed in the cell, a name that is
-    // the start of another could not be typed.
-    list->completer()->setCompletionMode(QCompleter::PopupCompletion);
-    list->completer()->setCaseSensitivity(Qt::CaseInsensitive);
-    list->completer()->popup()->installEventFilter(new OfferKeys(list));
     list->setMaxVisibleItems(DropDownHeight / list->fontMetrics().lineSpacing());
+    new CNameOffers(list, view);
     return list;
 }
 
@@ -134,7 +115,7 @@ QWidget* CGridDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem
 {
     const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
     const QStringList names = index.column() + 1 == m_grid->BranchNameColumn() ? m_grid->BranchNames() : QStringList();
-    QWidget* editor = names.isEmpty() ? MakeEditor(column, parent) : MakeBranchList(names, parent);
+    QWidget* editor = names.isEmpty() ? MakeEditor(column, parent) : MakeBranchList(names, parent, ViewAround(m_grid));
     editor->setObjectName(FindControl(column.control).editorName);
     editor->setAccessibleName(column.header());
     editor->setAutoFillBackground(true);
