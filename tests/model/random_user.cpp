@@ -149,7 +149,9 @@ void RandomUser::TypeIntoCell()
         if (!grid->Delegate()->Editor())
             return; // locked
     }
-    m_typed = text;
+    const CellKind kind = grid->Model()->Columns()[std::size_t(cell.column())].Kind();
+    if (kind != CellKind::Choice && kind != CellKind::TextChoice) // those take an entry that begins so
+        m_typed = text;
     Leave(true);
 }
 
