@@ -107,7 +107,9 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
     UpdateAllViews(nullptr, Hint::Reload);
     SetModifiedFlag(false);
     emit FileStateChanged();
-    const QString saved = dropped.isEmpty() ? LoadString(Str::Saved) : LoadString(Str::SavedDropping).arg(dropped);
+    QString saved = dropped.isEmpty() ? LoadString(Str::Saved) : LoadString(Str::SavedDropping).arg(dropped);
+    if (const std::size_t unwritten = UnwrittenSetups(); unwritten > 0)
+        saved += QStringLiteral("   ") + LoadCounted(unwritten, Str::SetupNotWritten, Str::SetupsNotWritten);
     Say(m_file.Renamed().isEmpty() ? saved : saved + QStringLiteral("   ") + m_file.Renamed());
     return true;
 }
@@ -121,6 +123,16 @@ bool CKavo0_hdDoc::MayReplace(const CString& target, const CString& path)
     const CString question =
         LoadString(Str::ReplaceOtherSpelling).arg(QFileInfo(target).fileName(), QFileInfo(path).fileName());
     return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
+}
+
+/// Set-ups of encroachment that hold too little for the file.
+std::size_t CKavo0_hdDoc::UnwrittenSetups() const
+{
+    const auto& setups = m_parameters.EncroachList;
+    std::size_t unwritten = 0;
+    for (std::size_t setup = 0; setup < setups.GetCount(); ++setup)
+        unwritten += !CGenMetaList<HDEncroach>::IsWorthKeeping(setups.GetAt(setup));
+    return unwritten;
 }
 
 /// Writes the whole content; on failure the user has been told and the file is what it was.

@@ -92,6 +92,7 @@ private:
     void ShowStep(bool isUndo);
     void TellStep();
     bool WriteData(const CString& path);
+    std::size_t UnwrittenSetups() const;
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);
     LRESULT SendToShell(unsigned message, WPARAM request, CView* view, const CString& name, CObList* objects = nullptr);

@@ -56,7 +56,9 @@ void CDocumentFile::Read(const CString& path, HD_Parameters& parameters)
 /// Whether the file stands, under its present spelling, where a save to `target` writes.
 bool CDocumentFile::IsReplacedBy(const CString& target) const
 {
-    return !m_path.isEmpty() && SavePathFor(m_path) == target && QFileInfo::exists(m_path);
+    // One file may be reached by several paths, and be saved by another than it was opened by.
+    return !m_path.isEmpty() && QFileInfo::exists(m_path) &&
+           (SavePathFor(m_path) == target || SameFile(m_path.toStdString(), target.toStdString()));
 }
 
 /// What a copy of the file is called; null when nothing has to be kept.

@@ -173,8 +173,8 @@ void CKavo0_hdView::CurrentLocationChanged()
         TellLocationLater();
 }
 
-/// In the status bar: the line of the table that is worked in, the number of its current cell where the cell leaves digits
-/// out, and what has just been done.
+/// In the status bar: the line of the table that is worked in, the number of its current cell where the cell leaves
+/// digits out, and what has just been done.
 void CKavo0_hdView::ShowLine()
 {
     if (!MainFrame() || MainFrame()->GetActiveView() != this)
@@ -244,8 +244,9 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     const bool lines = m_linesEnabled && page && isUsable(page->GetGrid());
     switch (id) {
     case Command::InsertLine:
-    case Command::DeleteLine:
         return m_linesEnabled && page && isUsable(page->LinesGrid());
+    case Command::DeleteLine:
+        return m_linesEnabled && page && isUsable(page->LinesGrid()) && page->LinesGrid()->HasLinesToDelete();
     case Command::GotoLine:
     case Command::Search:
         return lines;
@@ -295,8 +296,10 @@ bool CKavo0_hdView::OnCommand(int id)
 void CKavo0_hdView::GotoLine()
 {
     CGotoDlg dialog(this);
-    if (dialog.exec() == QDialog::Accepted)
-        ActivePage()->GotoLine(dialog.Line());
+    if (dialog.exec() != QDialog::Accepted)
+        return;
+    ActivePage()->GotoLine(dialog.Line());
+    ActivePage()->GetGrid()->setFocus(Qt::OtherFocusReason);
 }
 
 void CKavo0_hdView::Search()
@@ -322,6 +325,7 @@ void CKavo0_hdView::SearchAgain()
     if (grid->SearchRows(m_search.row, m_search.name, m_search.chainage, m_search.chainageCriterion,
                          m_search.nameCriterion)) {
         m_search.found = true;
+        grid->setFocus(Qt::OtherFocusReason); // the next key is meant for the line found
         return;
     }
     const bool hadFound = std::exchange(m_search.found, false);

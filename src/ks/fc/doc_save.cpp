@@ -88,8 +88,10 @@ CString CKsDoc::AskSavePath()
                 tr("%1 is open in another window. Choose another name.").arg(QDir::toNativeSeparators(written)));
             continue;
         }
-        if (!QFileInfo::exists(written) || SameFile(written, m_path) ||
-            KsMessageBox(tr("%1 exists already. Replace it?").arg(QDir::toNativeSeparators(written)),
+        // A name that differs from the file written by its case only is one that the user takes for that file.
+        const CString taken = QFileInfo::exists(written) || !QFileInfo::exists(path) ? written : path;
+        if (!QFileInfo::exists(taken) || SameFile(taken, m_path) ||
+            KsMessageBox(tr("%1 exists already. Replace it?").arg(QDir::toNativeSeparators(taken)),
                          QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
             return path;
     }

@@ -65,6 +65,8 @@ void CCtrlEdit::ShowValue()
     setMaxLength(std::max(m_textLimit, int(m_shown.size()))); // a number is never cut
     if (text() != m_shown)
         setText(m_shown);
+    if (!hasFocus())
+        setCursorPosition(0); // should the field be too narrow, the leading digits are those in sight
     m_typing->Shown();
     UpdateToolTip();
 }

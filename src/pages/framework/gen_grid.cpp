@@ -71,6 +71,13 @@ CGenGrid::CGenGrid(QWidget* parent)
             [this] { m_linesChosen = m_choosingLines; });
     connect(m_model, &CGridModel::CellModified, this, &CGenGrid::CellModified);
     connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGenGrid::MakeRoomForDigits);
+    connect(
+        &KsUnits::Instance(), &KsUnits::Changed, this,
+        [this] {
+            if (KsUnits::Instance().AllDigits())
+                MakeRoomForDigits();
+        },
+        Qt::QueuedConnection); // when the view shows the new unit
 }
 
 CGenGrid::~CGenGrid()
@@ -458,7 +465,8 @@ int CGenGrid::InsertLine()
 std::optional<QItemSelectionRange> CGenGrid::LinesToDelete() const
 {
     auto lines = SelectedBlock();
-    if (!lines && m_deletesCurrentLine && currentIndex().isValid())
+    const bool isCurrentMeant = m_deletesCurrentLine && !(lines && lines->width() == ColumnCount());
+    if (isCurrentMeant && currentIndex().isValid())
         lines.emplace(currentIndex().siblingAtColumn(0), currentIndex().siblingAtColumn(ColumnCount() - 1));
     else if (!m_linesChosen)
         return std::nullopt;

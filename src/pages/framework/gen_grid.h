@@ -61,6 +61,7 @@ public:
     /// the current line without a selection in a grid that says so. A grid left empty gets a new line, unless its rows
     /// may be none.
     bool DeleteSelectedLines();
+    bool HasLinesToDelete() const { return LinesToDelete().has_value(); }
     void SetDeletesCurrentLine(bool deletes) { m_deletesCurrentLine = deletes; }
     /// A click or the space bar on a cell that acts at once.
     void ActOn(int row, int column);

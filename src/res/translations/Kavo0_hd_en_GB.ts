@@ -2350,5 +2350,13 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
             <source>Marks without a title (%1) and the levels below them are left out when the file is saved.</source>
             <translation>Marks without a title (%1) and the levels below them are left out when the file is saved.</translation>
         </message>
+        <message>
+            <source>1 encroachment set-up without a filled second line was not written</source>
+            <translation>1 encroachment set-up without a filled second line was not written</translation>
+        </message>
+        <message>
+            <source>%1 encroachment set-ups without a filled second line were not written</source>
+            <translation>%1 encroachment set-ups without a filled second line were not written</translation>
+        </message>
 </context>
 </TS>

@@ -2350,5 +2350,13 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
             <source>Marks without a title (%1) and the levels below them are left out when the file is saved.</source>
             <translation>名称のないマーク(%1 件)とその水位は、ファイルの保存時に除かれます。</translation>
         </message>
+        <message>
+            <source>1 encroachment set-up without a filled second line was not written</source>
+            <translation>2行目が入力されていない河積阻害の設定1件は書き込まれませんでした</translation>
+        </message>
+        <message>
+            <source>%1 encroachment set-ups without a filled second line were not written</source>
+            <translation>2行目が入力されていない河積阻害の設定%1件は書き込まれませんでした</translation>
+        </message>
 </context>
 </TS>
