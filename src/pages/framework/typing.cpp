@@ -190,6 +190,8 @@ bool CTyping::KeyPressed(int key)
 
 bool CTyping::eventFilter(QObject* object, QEvent* event)
 {
+    if (!qobject_cast<QLineEdit*>(object)) // a field that is being taken apart loses its focus last
+        return false;
     switch (event->type()) {
     case QEvent::FocusOut:
         if (!StaysInField(event))
