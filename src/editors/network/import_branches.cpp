@@ -236,6 +236,7 @@ private:
             whole += LengthOf(each.line);
         const bool share = m_options.parts == CImportParts::ShareChainages;
         const auto chainages = share ? Chainages(feature, whole) : std::nullopt;
+        const auto [first, last] = chainages.value_or(std::pair(0.0, whole));
         QStringList names;
         double before = 0;
         for (const CJoinedLine& each : lines) {
@@ -243,8 +244,8 @@ private:
             CNetworkBranch& branch = NewBranch(QStringLiteral("%1-%2").arg(wanted).arg(names.size() + 1), each.line);
             const double after = before + branch.end;
             if (chainages) {
-                branch.start = std::lerp(chainages->first, chainages->second, before / whole);
-                branch.end = std::lerp(chainages->first, chainages->second, after / whole);
+                branch.start = std::lerp(first, last, before / whole);
+                branch.end = std::lerp(first, last, after / whole);
             }
             before = after;
             names << ImportBranches::tr("\"%1\" (%2)").arg(branch.name, Metres(LengthOf(each.line)));
