@@ -4,7 +4,7 @@
 #include "data/hd_parameters.h"
 #include "ks/fc/hd_messages.h"
 #include "module/data_tables.h"
-#include "module/document.h"
+#include "document/document.h"
 
 #include <QApplication>
 #include <string>

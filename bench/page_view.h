@@ -1,7 +1,7 @@
 // A page outside the program, hosted as the program's view hosts it.
 #pragma once
 
-#include "module/document.h"
+#include "document/document.h"
 #include "pages/framework/page.h"
 
 #include <QApplication>

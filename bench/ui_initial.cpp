@@ -2,7 +2,7 @@
 // size; and what storing one edited cell, moving on and repainting costs, against a thousand lines.
 #include "bench/page_view.h"
 #include "bench/report.h"
-#include "pages/framework/gen_grid.h"
+#include "grid/gen_grid.h"
 #include "pages/init_page.h"
 
 #include <QApplication>

@@ -2,7 +2,7 @@
 // storing a cell.
 #include "bench/page_view.h"
 #include "bench/report.h"
-#include "pages/framework/gen_grid.h"
+#include "grid/gen_grid.h"
 #include "pages/wl_mark_page.h"
 
 #include <QScrollBar>

@@ -1,12 +1,33 @@
-# What every target of the project shares: warnings, include root, sanitizers come from the preset.
+# What every target of the project shares: warnings, include roots; sanitizers come from the preset.
 
+set(KVR_SRC ${PROJECT_SOURCE_DIR}/src)
 find_program(KVR_CCACHE ccache)
 if(KVR_CCACHE)
   set(CMAKE_CXX_COMPILER_LAUNCHER ${KVR_CCACHE})
 endif()
 
+# Lets whoever links the target include the headers of a room, a folder under src, as "room/header.h" - and, as each
+# room has a root of its own, nothing else: an include of a room that is not linked does not compile.
+function(kvr_room target room)
+  string(REPLACE "/" "_" name ${room})
+  set(root ${CMAKE_BINARY_DIR}/rooms/${name})
+  cmake_path(GET room PARENT_PATH above)
+  file(MAKE_DIRECTORY ${root}/${above})
+  file(CREATE_LINK ${PROJECT_SOURCE_DIR}/src/${room} ${root}/${room} SYMBOLIC)
+  get_target_property(type ${target} TYPE)
+  if(type STREQUAL INTERFACE_LIBRARY)
+    target_include_directories(${target} INTERFACE ${root})
+  else()
+    target_include_directories(${target} PUBLIC ${root})
+  endif()
+endfunction()
+
 function(kvr_defaults target)
-  target_include_directories(${target} PUBLIC ${PROJECT_SOURCE_DIR}/src)
+  cmake_path(IS_PREFIX KVR_SRC ${CMAKE_CURRENT_SOURCE_DIR} isRoom)
+  if(isRoom)
+    file(RELATIVE_PATH room ${KVR_SRC} ${CMAKE_CURRENT_SOURCE_DIR})
+    kvr_room(${target} ${room})
+  endif()
   target_compile_options(${target} PRIVATE -Wall -Wextra -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual)
   if(KVR_WERROR)
     target_compile_options(${target} PRIVATE -Werror)

@@ -2,7 +2,7 @@
 //   make_examples FOLDER
 //   make_examples --locations N FILE
 #include "data/hd_file.h"
-#include "data/utf8_path.h"
+#include "base/utf8_path.h"
 #include "sample_network.h"
 #include "sample_river.h"
 #include "sample_sections.h"

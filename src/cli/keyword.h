@@ -2,7 +2,7 @@
 #pragma once
 
 #include "data/global_var.h"
-#include "data/result.h"
+#include "base/result.h"
 
 struct NamedValue
 {

@@ -1,5 +1,5 @@
 #include "cli/open_file.h"
-#include "data/utf8_path.h"
+#include "base/utf8_path.h"
 
 int New(const std::string& file)
 {

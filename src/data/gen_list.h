@@ -2,9 +2,9 @@
 // in constant time.
 #pragma once
 
-#include "data/finding.h"
+#include "files/finding.h"
 #include "data/river_pos.h"
-#include "data/unknown_content.h"
+#include "files/unknown_content.h"
 
 #include <cstddef>
 #include <functional>

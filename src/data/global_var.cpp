@@ -1,6 +1,6 @@
 #include "data/global_var.h"
 
-#include "data/field_io.h"
+#include "files/field_io.h"
 
 #include <algorithm>
 

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "data/families.h"
-#include "data/unknown_content.h"
+#include "files/unknown_content.h"
 
 #include <deque>
 #include <map>

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "data/hd_parameters.h"
-#include "data/safe_file.h"
+#include "files/safe_file.h"
 
 /// Owns a loaded or created structure of the parameter-file library.
 class TqlStructure

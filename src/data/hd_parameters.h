@@ -5,7 +5,7 @@
 #include "data/families.h"
 #include "data/gen_list.h"
 #include "data/global_var.h"
-#include "data/unknown_content.h"
+#include "files/unknown_content.h"
 
 inline constexpr const char* HDTargetName = "KAVO0_HD";
 

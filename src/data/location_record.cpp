@@ -1,6 +1,6 @@
 #include "data/location_record.h"
 
-#include "data/field_io.h"
+#include "files/field_io.h"
 
 void WriteRecord(tqlHandle structure, const HD_RiverPos& record, FieldList fields)
 {

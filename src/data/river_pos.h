@@ -1,8 +1,8 @@
 // The base of every record that is tied to a location in the river network.
 #pragma once
 
-#include "data/extra_params.h"
-#include "data/field.h"
+#include "files/extra_params.h"
+#include "files/field.h"
 #include "tql/tql.h"
 
 #include <memory>

@@ -1,7 +1,7 @@
 // The bar above the pages that says what the document's file is when it is not simply what the pages show.
 #pragma once
 
-#include "module/document.h"
+#include "document/document.h"
 
 #include <QFrame>
 #include <QPointer>

@@ -1,7 +1,7 @@
 // The places of a file that were not taken as they stand, as a table.
 #pragma once
 
-#include "module/document_file.h"
+#include "document/document_file.h"
 
 #include <QAbstractTableModel>
 #include <QDialog>

@@ -1,7 +1,7 @@
 #include "module/kavo0_hd.h"
 
 #include "ks/language/language.h"
-#include "module/document.h"
+#include "document/document.h"
 #include "module/frame.h"
 #include "module/view.h"
 #include "res/strings.h"

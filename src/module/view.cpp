@@ -7,10 +7,10 @@
 #include "module/file_bar.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
-#include "pages/framework/gen_grid.h"
-#include "pages/framework/goto_dlg.h"
+#include "grid/gen_grid.h"
+#include "grid/goto_dlg.h"
 #include "pages/framework/page.h"
-#include "pages/framework/search_dlg.h"
+#include "grid/search_dlg.h"
 #include "res/strings.h"
 
 #include <QTimer>

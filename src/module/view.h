@@ -2,7 +2,7 @@
 #pragma once
 
 #include "ks/fc/frames.h"
-#include "module/document.h"
+#include "document/document.h"
 #include "pages/framework/page_host.h"
 
 #include <QString>

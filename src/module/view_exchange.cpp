@@ -5,7 +5,7 @@
 #include "ks/fc/exchange.h"
 #include "ks/fc/message_box.h"
 #include "module/kavo0_hd.h"
-#include "pages/framework/gen_grid.h"
+#include "grid/gen_grid.h"
 #include "pages/framework/page.h"
 #include "res/strings.h"
 

@@ -1,7 +1,7 @@
 #include "pages/load_option_dlg.h"
 
 #include "ks/fc/message_box.h"
-#include "module/document.h"
+#include "document/document.h"
 #include "pages/framework/page.h"
 #include "pages/location_loader.h"
 #include "res/strings.h"

@@ -1,9 +1,9 @@
 #include "pages/location_loader.h"
 
 #include "ks/fc/branch_name.h"
-#include "module/document.h"
+#include "document/document.h"
 #include "pages/framework/commands.h"
-#include "pages/framework/gen_grid.h"
+#include "grid/gen_grid.h"
 #include "pages/framework/page.h"
 #include "res/strings.h"
 

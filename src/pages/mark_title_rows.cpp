@@ -1,6 +1,6 @@
 #include "pages/mark_title_rows.h"
 
-#include "module/document.h"
+#include "document/document.h"
 
 #include <algorithm>
 #include <vector>

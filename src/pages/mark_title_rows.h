@@ -2,7 +2,7 @@
 // taking it out moves the levels of every location along.
 #pragma once
 
-#include "module/row_source.h"
+#include "grid/row_source.h"
 
 #include <cstdint>
 #include <string>

@@ -2,7 +2,7 @@
 
 #include "ks/fc/message_box.h"
 #include "ks/units/edit_style.h"
-#include "module/document.h"
+#include "document/document.h"
 #include "res/strings.h"
 
 #include <QComboBox>

@@ -1,7 +1,7 @@
 // The resistance formula: the unit that bed resistances are given in, and what becomes of them when it is switched.
 #pragma once
 
-#include "module/list_commands.h"
+#include "document/list_commands.h"
 
 #include <QString>
 #include <cstdint>

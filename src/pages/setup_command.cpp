@@ -1,6 +1,6 @@
 #include "pages/setup_command.h"
 
-#include "module/document.h"
+#include "document/document.h"
 #include "res/strings.h"
 
 CSetupCommand::CSetupCommand(CKavo0_hdDoc& document, std::size_t index,

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "data/hd_parameters.h"
-#include "module/list_commands.h"
+#include "document/list_commands.h"
 
 class CSetupCommand : public CDocumentCommand
 {

@@ -1,7 +1,7 @@
 // What the tests of the data room share: parameters from text, and objects whose every field differs from another's.
 #pragma once
 
-#include "data/field_io.h"
+#include "files/field_io.h"
 #include "data/hd_file.h"
 
 #include <filesystem>

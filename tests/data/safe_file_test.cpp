@@ -1,6 +1,6 @@
 #include "hd_support.h"
 
-#include "data/utf8_path.h"
+#include "base/utf8_path.h"
 
 #include <cstring>
 #include <functional>

@@ -2,8 +2,8 @@
 
 #include "module/data_tables.h"
 #include "module/sheet.h"
-#include "pages/framework/gen_grid.h"
-#include "pages/framework/grid_editors.h"
+#include "grid/gen_grid.h"
+#include "grid/grid_editors.h"
 #include "pages/framework/page.h"
 
 #include <QAbstractButton>

@@ -10,7 +10,7 @@
 #include "module/sheet.h"
 #include "module/view.h"
 #include "pages/framework/ctrl_edit.h"
-#include "pages/framework/gen_grid.h"
+#include "grid/gen_grid.h"
 #include "pages/framework/page.h"
 
 #include <QApplication>

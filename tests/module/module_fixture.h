@@ -4,7 +4,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/messages.h"
 #include "ks/fc/package.h"
-#include "module/document.h"
+#include "document/document.h"
 
 #include <QFile>
 #include <QTemporaryDir>

@@ -7,8 +7,8 @@
 #include "module/kavo0_hd.h"
 #include "module/sheet.h"
 #include "module/view.h"
-#include "pages/framework/gen_grid.h"
-#include "pages/framework/grid_keys.h"
+#include "grid/gen_grid.h"
+#include "grid/grid_keys.h"
 #include "pages/framework/page.h"
 #include "pages/framework/page_help.h"
 

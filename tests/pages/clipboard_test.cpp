@@ -1,6 +1,6 @@
 #include "page_fixture.h"
 
-#include "pages/framework/grid_clipboard.h"
+#include "grid/grid_clipboard.h"
 #include "pages/init_page.h"
 
 #include <QClipboard>

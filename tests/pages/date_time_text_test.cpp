@@ -1,5 +1,5 @@
 // Dates and times as users write them, in their locale's forms.
-#include "pages/framework/date_time_text.h"
+#include "grid/date_time_text.h"
 
 #include "ks/language/language.h"
 

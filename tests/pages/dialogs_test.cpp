@@ -1,7 +1,7 @@
 #include "page_fixture.h"
 
-#include "pages/framework/goto_dlg.h"
-#include "pages/framework/search_dlg.h"
+#include "grid/goto_dlg.h"
+#include "grid/search_dlg.h"
 
 #include <QRadioButton>
 

@@ -1,7 +1,7 @@
 // What the formats of cells and fields hide can be seen: a mark, the tool tip, the status bar's text, all digits.
 #include "page_fixture.h"
 
-#include "pages/framework/cell_text.h"
+#include "grid/cell_text.h"
 #include "pages/framework/ctrl_edit.h"
 
 namespace {

@@ -1,6 +1,6 @@
 #include "page_fixture.h"
 
-#include "pages/framework/name_offers.h"
+#include "grid/name_offers.h"
 
 #include "pages/init_page.h"
 

@@ -1,6 +1,6 @@
 #include "page_fixture.h"
 
-#include "pages/framework/grid_keys.h"
+#include "grid/grid_keys.h"
 #include "pages/init_page.h"
 
 #include <QClipboard>

@@ -1,6 +1,6 @@
 #include "page_fixture.h"
 
-#include "pages/framework/cell_text.h"
+#include "grid/cell_text.h"
 
 #include <QAbstractItemModelTester>
 #include <bit>

@@ -1,4 +1,4 @@
-#include "pages/framework/number_syntax.h"
+#include "grid/number_syntax.h"
 
 #include <gtest/gtest.h>
 #include <limits>

@@ -4,7 +4,7 @@
 #include "data/hd_file.h"
 #include "ks/fc/file_dialog.h"
 #include "pages/framework/date_time_edit.h"
-#include "pages/framework/date_time_text.h"
+#include "grid/date_time_text.h"
 #include "pages/framework/file_browse.h"
 #include "pages/maps_page.h"
 #include "pages/text_output_page.h"

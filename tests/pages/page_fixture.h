@@ -2,7 +2,7 @@
 #pragma once
 
 #include "ks/fc/message_box.h"
-#include "pages/framework/grid_editors.h"
+#include "grid/grid_editors.h"
 #include "pages/framework/location_page.h"
 
 #include <QComboBox>

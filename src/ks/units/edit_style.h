@@ -3,7 +3,7 @@
 
 #include "ks/fc/types.h"
 #include "ks/ks_export.h"
-#include "ks/units/unit_group.h"
+#include "base/unit_group.h"
 
 #include <QObject>
 

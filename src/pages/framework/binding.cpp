@@ -2,7 +2,7 @@
 
 #include "data/global_var.h"
 #include "ks/units/edit_fields.h"
-#include "module/document.h"
+#include "document/document.h"
 #include "pages/framework/commands.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"

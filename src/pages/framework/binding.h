@@ -2,9 +2,9 @@
 // user has changed a control, each change being an undo step; nothing is written that nobody changed.
 #pragma once
 
-#include "data/field.h"
+#include "files/field.h"
 #include "pages/framework/file_browse.h"
-#include "pages/framework/typing.h"
+#include "grid/typing.h"
 
 #include <QObject>
 #include <cstdint>

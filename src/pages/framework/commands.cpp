@@ -1,6 +1,6 @@
 #include "pages/framework/commands.h"
 
-#include "module/document.h"
+#include "document/document.h"
 #include "res/strings.h"
 
 #include <QUndoStack>

@@ -1,8 +1,8 @@
 // Undo commands of what pages edit.
 #pragma once
 
-#include "module/list_commands.h"
-#include "pages/framework/column_spec.h"
+#include "document/list_commands.h"
+#include "grid/column_spec.h"
 
 #include <vector>
 

@@ -1,8 +1,8 @@
 #include "pages/framework/ctrl_edit.h"
 
-#include "pages/framework/column_spec.h"
-#include "pages/framework/digits_mark.h"
-#include "pages/framework/number_syntax.h"
+#include "grid/column_spec.h"
+#include "grid/digits_mark.h"
+#include "grid/number_syntax.h"
 #include "res/strings.h"
 
 #include <QPainter>

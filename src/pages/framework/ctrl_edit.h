@@ -2,7 +2,7 @@
 #pragma once
 
 #include "ks/units/edit_style.h"
-#include "pages/framework/typing.h"
+#include "grid/typing.h"
 
 #include <QLineEdit>
 #include <functional>

@@ -1,6 +1,6 @@
 #include "pages/framework/date_time_edit.h"
 
-#include "pages/framework/date_time_text.h"
+#include "grid/date_time_text.h"
 
 CDateTimeEdit::CDateTimeEdit(QWidget* parent) : QLineEdit(parent) {}
 

@@ -1,7 +1,7 @@
 // A field for a date and time in the user's locale.
 #pragma once
 
-#include "data/field.h"
+#include "files/field.h"
 
 #include <QLineEdit>
 #include <optional>

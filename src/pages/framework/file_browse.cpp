@@ -2,7 +2,7 @@
 
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
-#include "module/document.h"
+#include "document/document.h"
 #include "res/strings.h"
 
 #include <QDir>

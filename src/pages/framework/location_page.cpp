@@ -2,7 +2,7 @@
 
 #include "ks/fc/message_box.h"
 #include "ks/fc/wnd_resizer.h"
-#include "module/list_rows.h"
+#include "document/list_rows.h"
 
 #include <QUndoStack>
 

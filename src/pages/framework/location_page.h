@@ -1,10 +1,10 @@
 // Base of the pages that edit one list of locations in a grid.
 #pragma once
 
-#include "module/document.h"
-#include "pages/framework/gen_grid.h"
+#include "document/document.h"
+#include "grid/gen_grid.h"
 #include "pages/framework/page.h"
-#include "pages/framework/vector_rows.h"
+#include "document/vector_rows.h"
 #include "res/strings.h"
 
 /// What a column says about itself beyond its field.

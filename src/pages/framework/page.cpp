@@ -1,8 +1,8 @@
 #include "pages/framework/page.h"
 
-#include "module/document.h"
+#include "document/document.h"
 #include "pages/framework/ctrl_edit.h"
-#include "pages/framework/gen_grid.h"
+#include "grid/gen_grid.h"
 #include "pages/framework/page_help.h"
 
 #include <QApplication>

@@ -3,7 +3,7 @@
 
 #include "data/global_var.h"
 #include "ks/units/edit_style.h"
-#include "module/change_place.h"
+#include "document/change_place.h"
 #include "pages/framework/binding.h"
 #include "pages/framework/page_host.h"
 

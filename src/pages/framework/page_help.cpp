@@ -1,6 +1,6 @@
 #include "pages/framework/page_help.h"
 
-#include "pages/framework/grid_keys.h"
+#include "grid/grid_keys.h"
 
 #include <QKeySequence>
 #include <QStringList>

@@ -1,0 +1,87 @@
+// What reading a file meets that is not in order: values that are not taken as they stand, and whatever else departs
+// from the tables. The readers of fields, lists and sections report it while they read.
+#pragma once
+
+#include "files/field.h"
+#include "tql/tql.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+struct Finding
+{
+    enum Kind
+    {
+        // Reading does not keep what stands there, so rewriting the file would lose it.
+        WrongType,
+        CountDoesNotFit, // a repeated group, and what follows it in its keyword
+        ShortDate,
+        SurplusFlags, // more flags than mark titles
+        NoTarget,
+        // Taken, though it is written otherwise than it should be.
+        OtherType,
+        // Nothing that stands there is lost.
+        Missing,
+        NoDate,
+        NotRead, // because another keyword is missing
+        Unknown,
+        Repeated,
+        UnknownParams,
+        IncompleteLine
+    };
+
+    Kind kind = WrongType;
+    std::size_t line = 0, column = 0; // from 1
+    std::string section{};            // in which it stands
+    std::string keyword{};            // empty for a section
+    int parameter = 0;                // from 1; 0 for a whole keyword or section
+    std::string field{};              // name of the parameter; of the missing keyword for NotRead
+    FieldKind expected = FieldKind::Integer;
+    TqlType type = TqlType::None; // of what stands there
+    int behind = 0;               // parameters behind a count; mark titles
+    bool more = false;            // others behind it are missing, too
+    std::string found{};          // as it stands in the file
+    std::string used{};           // what is used instead, in the same notation
+
+    /// Whether rewriting the file would lose what stands there.
+    bool LosesContent() const { return kind <= NoTarget; }
+    /// Whether the user must know before relying on what is shown: a value was lost or taken for another, or a count
+    /// leaves parameters missing and so may have been meant otherwise.
+    bool NeedsAttention() const { return kind <= OtherType || (kind == Missing && behind > 0); }
+};
+
+/// One sentence in English, without the place.
+std::string FindingText(const Finding& finding);
+
+class LoadReport
+{
+public:
+    enum class Wanted
+    {
+        Attention, // what the user must know
+        Everything
+    };
+    explicit LoadReport(tqlHandle structure, Wanted wanted = Wanted::Attention)
+        : m_structure(structure), m_wanted(wanted)
+    {
+    }
+
+    bool WantsEverything() const { return m_wanted == Wanted::Everything; }
+    /// Where the keywords that are read from now on stand.
+    void InSection(std::string_view section) { m_section = section; }
+    /// Whether the first line of a list need not be complete.
+    bool firstLineMayBeBlank = false;
+
+    /// Completes the place, which is that of a section, keyword or parameter, unless nobody wants the finding.
+    void Add(tqlHandle place, tqlHandle keyword, Finding finding);
+    /// What was found, in file order.
+    std::vector<Finding> Take();
+
+private:
+    tqlHandle m_structure;
+    Wanted m_wanted;
+    std::string m_section;
+    std::vector<Finding> m_findings;
+};

@@ -1,0 +1,23 @@
+// Between the value of a cell and its texts.
+#pragma once
+
+#include "grid/column_spec.h"
+
+/// The text of a cell that is not being edited.
+QString ShownText(const ColumnSpec& column, const CellValue& value);
+/// Whether `shown`, the text of a cell, leaves out digits of its number.
+bool HidesDigits(const ColumnSpec& column, const CellValue& value, const QString& shown);
+/// The whole value with its unit.
+QString FullText(const ColumnSpec& column, const CellValue& value);
+/// The whole text where the cell may not show it, and the unit.
+QString CellToolTip(const ColumnSpec& column, const CellValue& value);
+/// The text that editing starts with and that is copied: it reads back to the same number, in display units.
+QString EditText(const ColumnSpec& column, const CellValue& value);
+
+struct CellReading
+{
+    CellValue value;
+    QString refusal; // why the text is no value of the column; empty when it is one
+};
+/// What a typed or pasted text means. Nothing typed is the empty cell.
+CellReading ReadCell(const ColumnSpec& column, const QString& text);

@@ -1,0 +1,154 @@
+#include "grid/column_spec.h"
+
+#include "data/river_pos.h"
+#include "res/strings.h"
+
+#include <QCoreApplication>
+#include <algorithm>
+#include <iterator>
+
+namespace {
+
+constexpr GridControl Controls[] = {
+    {Control::Integer, CellKind::Integer, 0, "edit"},
+    {Control::Formatted, CellKind::Number, AsFormatted, "doubleEdit"},
+    {Control::Number, CellKind::Number, 3, "doubleEdit_1110"},
+    {Control::Text, CellKind::Text, 0, "stringEdit_1111", true},
+    {Control::FreeText, CellKind::Text, 0, "textEdit"},
+    {Control::DropDown, CellKind::Choice, 0, "dropDown"},
+    {Control::DropDownList, CellKind::TextChoice, 0, "dropDownList"},
+    {Control::CheckBox, CellKind::Flag, 0, "checkBox"},
+    {Control::PushButton, CellKind::Button, 0, "pushButton"},
+    {Control::DateTime, CellKind::DateTime, 0, "dateTimeEdit"},
+    {Control::Chainage, CellKind::Number, 0, "doubleEdit_1112"},
+};
+
+template <typename T>
+CellAccess AccessAs(const Field& field)
+{
+    return {[field](const void* row) -> CellValue { return field.In<T>(row); },
+            [field](void* row, const CellValue& value) { field.In<T>(row) = std::get<T>(value); }};
+}
+
+} // namespace
+
+const GridControl& FindControl(int id)
+{
+    return *std::find_if(std::begin(Controls), std::end(Controls) - 1,
+                         [id](const GridControl& control) { return control.id == id; });
+}
+
+CellAccess FieldAccess(const Field& field)
+{
+    switch (field.kind) {
+    case FieldKind::Integer:
+    case FieldKind::Choice:
+        return AccessAs<std::int32_t>(field);
+    case FieldKind::Text:
+    case FieldKind::FileName:
+        return AccessAs<std::string>(field);
+    case FieldKind::DateTime:
+        return AccessAs<HDDateTime>(field);
+    case FieldKind::Boolean:
+        return {
+            [field](const void* row) -> CellValue { return std::int32_t(field.In<bool>(row)); },
+            [field](void* row, const CellValue& value) { field.In<bool>(row) = std::get<std::int32_t>(value) != 0; }};
+    default:
+        return AccessAs<double>(field);
+    }
+}
+
+QString Choices::TextOf(std::int32_t index) const
+{
+    const QStringList texts = entries();
+    return index >= first && index - first < texts.size() ? texts[index - first] : QString::number(index);
+}
+
+std::optional<QString> Choices::EntryOf(const QString& text) const
+{
+    for (const QString& entry : entries())
+        if (entry.compare(text.trimmed(), Qt::CaseInsensitive) == 0)
+            return entry;
+    return std::nullopt;
+}
+
+std::optional<std::int32_t> Choices::IndexOf(const QString& text) const
+{
+    const QStringList texts = entries();
+    const QString wanted = text.trimmed();
+    const qsizetype entry = texts.indexOf(EntryOf(text).value_or(QString()));
+    if (entry >= 0)
+        return first + std::int32_t(entry);
+    bool isNumber = false;
+    const std::int32_t number = wanted.toInt(&isNumber);
+    if (isNumber && number >= first && number - first < texts.size())
+        return number;
+    return std::nullopt;
+}
+
+QString UnitToolTip(const QString& unit)
+{
+    return unit.isEmpty() ? QString() : QCoreApplication::translate("CKsEditStyle", "Unit: %1").arg(unit);
+}
+
+QString NumberText(const QString& number, const QString& unit)
+{
+    return unit.isEmpty() ? number : number + u' ' + unit;
+}
+
+QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit)
+{
+    const QString unitTip = UnitToolTip(unit);
+    if (!style.HidesDigits(value, shown))
+        return unitTip;
+    const QString full = LoadString(Str::FullValue).arg(NumberText(style.FullText(value), unit));
+    return unitTip.isEmpty() ? full : full + u'\n' + unitTip;
+}
+
+CellValue ColumnSpec::FillValue() const
+{
+    return style.UnitConvertFromBase(*fill, 0);
+}
+
+CellValue ColumnSpec::EmptyValue() const
+{
+    switch (Kind()) {
+    case CellKind::Text:
+    case CellKind::TextChoice:
+        return std::string();
+    case CellKind::Integer:
+    case CellKind::Flag:
+        return std::int32_t(0);
+    case CellKind::DateTime:
+        return HDDateTime{};
+    case CellKind::Button:
+        return {};
+    case CellKind::Choice:
+        return choices.whenEmptied;
+    case CellKind::Number:
+        break;
+    }
+    return emptyIsNotGiven ? NotGiven : style.UnitConvertFromBase(0, 0);
+}
+
+CellValue ColumnSpec::NewLineValue() const
+{
+    if (fill)
+        return FillValue();
+    if (choices.inNewLines)
+        return *choices.inNewLines;
+    return emptyIsNotGiven ? CellValue(NotGiven) : CellValue();
+}
+
+QString ColumnSpec::UnitSymbol() const
+{
+    return unitText ? unitText() : style.UnitSymbol();
+}
+
+QString ColumnSpec::ToolTip(bool isHeader) const
+{
+    const QString unitTip = UnitToolTip(UnitSymbol());
+    if (!isHeader || !hint)
+        return unitTip;
+    return unitTip.isEmpty() ? hint() : hint() + u'\n' + unitTip;
+}

@@ -1,0 +1,150 @@
+#include "grid/grid_clipboard.h"
+
+#include "ks/fc/message_box.h"
+#include "document/document.h"
+#include "grid/cell_text.h"
+#include "grid/gen_grid.h"
+#include "pages/framework/page.h"
+#include "res/strings.h"
+
+#include <QClipboard>
+#include <QGuiApplication>
+#include <QMimeData>
+#include <algorithm>
+#include <numeric>
+
+QString WriteTable(const std::vector<QStringList>& rows)
+{
+    QString text;
+    for (const QStringList& row : rows) {
+        if (&row != &rows.front())
+            text += QLatin1Char('\n');
+        for (qsizetype column = 0; column < row.size(); ++column) {
+            if (column > 0)
+                text += QLatin1Char('\t');
+            const QString& cell = row[column];
+            const bool special = std::any_of(
+                cell.begin(), cell.end(), [](QChar c) { return c == u'\t' || c == u'\n' || c == u'\r' || c == u'"'; });
+            text += special ? u'"' + QString(cell).replace(u'"', QStringLiteral("\"\"")) + u'"' : cell;
+        }
+    }
+    return text;
+}
+
+namespace {
+
+/// Reads one cell from `at` on and leaves `at` on what ended it.
+QString ReadTableCell(const QString& text, qsizetype& at)
+{
+    QString cell;
+    // Quotes that are not closed are part of the text.
+    bool quoted = at < text.size() && text[at] == u'"' && text.indexOf(u'"', at + 1) >= 0;
+    at += quoted;
+    for (; at < text.size(); ++at) {
+        const QChar c = text[at];
+        if (quoted && c == u'"') {
+            if (at + 1 < text.size() && text[at + 1] == u'"')
+                cell += text[++at];
+            else
+                quoted = false;
+        } else if (!quoted && (c == u'\t' || c == u'\n' || c == u'\r')) {
+            break;
+        } else {
+            cell += c;
+        }
+    }
+    return cell;
+}
+
+} // namespace
+
+std::vector<QStringList> ReadTable(const QString& text)
+{
+    std::vector<QStringList> rows;
+    qsizetype at = 0;
+    while (at < text.size() || rows.empty()) {
+        QStringList& row = rows.emplace_back();
+        row << ReadTableCell(text, at);
+        while (at < text.size() && text[at] == u'\t')
+            row << ReadTableCell(text, ++at);
+        if (at < text.size())
+            at += text[at] == u'\r' && at + 1 < text.size() && text[at + 1] == u'\n' ? 2 : 1;
+    }
+    return rows;
+}
+
+namespace {
+
+std::size_t CountOf(const std::vector<QStringList>& cells)
+{
+    return std::accumulate(cells.begin(), cells.end(), std::size_t(0),
+                           [](std::size_t count, const QStringList& row) { return count + std::size_t(row.size()); });
+}
+
+} // namespace
+
+bool CGenGrid::CanCopy() const
+{
+    return selectionModel()->hasSelection() || currentIndex().isValid();
+}
+
+void CGenGrid::Copy() const
+{
+    if (!CanCopy())
+        return;
+    const QItemSelection selection = selectionModel()->selection();
+    const QItemSelectionRange range = selection.isEmpty() ? QItemSelectionRange(currentIndex()) : selection.front();
+    std::vector<QStringList> rows;
+    rows.reserve(std::size_t(range.height()));
+    for (int row = range.top(); row <= range.bottom(); ++row) {
+        QStringList& cells = rows.emplace_back();
+        for (int column = range.left(); column <= range.right(); ++column)
+            cells << EditText(m_model->Columns()[std::size_t(column)], m_model->Value(row, column));
+    }
+    QGuiApplication::clipboard()->setText(WriteTable(rows));
+}
+
+bool CGenGrid::CanPaste() const
+{
+    const QMimeData* content = QGuiApplication::clipboard()->mimeData();
+    return content && content->hasText() && !content->text().isEmpty() && m_model->Rows() &&
+           (currentIndex().isValid() || RowCount() == 0);
+}
+
+bool CGenGrid::Paste()
+{
+    if (!CanPaste())
+        return false;
+    const auto selected = SelectedBlock();
+    const int top = selected ? selected->top() : std::max(0, currentIndex().row());
+    const int left = selected ? selected->left() : std::max(0, currentIndex().column());
+    auto cells = ReadTable(QGuiApplication::clipboard()->text());
+    if (selected && cells.size() == 1 && cells.front().size() == 1) // one copied cell fills the selection
+        cells.assign(std::size_t(selected->height()), QStringList(selected->width(), cells.front().front()));
+
+    const auto header = [this](int column) { return m_model->Columns()[std::size_t(column)].header(); };
+    const auto refuse = [this](const QString& message) {
+        KsMessageBox(message, QMessageBox::Ok, this);
+        return false;
+    };
+    for (std::size_t r = 0; r < cells.size(); ++r) {
+        const int row = top + int(r), width = int(cells[r].size());
+        if (left + width > ColumnCount())
+            return refuse(LoadString(Str::PasteTooWide).arg(width).arg(header(left)).arg(ColumnCount() - left));
+        for (int c = 0; c < width; ++c) {
+            const QString refusal = m_model->Refusal(row, left + c, cells[r][c]);
+            if (!refusal.isEmpty())
+                return refuse(LoadString(Str::PasteRefused)
+                                  .arg(QString::number(row + 1), header(left + c), cells[r][c], refusal));
+        }
+    }
+    StoreEditedLine();
+    m_model->Paste(top, left, cells, LoadString(Str::UndoPaste));
+    if (m_page)
+        m_page->GetDocument()->Say(LoadCounted(CountOf(cells), Str::CellPasted, Str::CellsPasted));
+    m_modified = true; // the view tells the project when locations came in
+    m_modifiedColumn = left + 1;
+    StoreEditedLine();
+    Reload();
+    return true;
+}

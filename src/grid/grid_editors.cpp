@@ -1,0 +1,322 @@
+#include "grid/grid_editors.h"
+
+#include "grid/digits_mark.h"
+#include "grid/gen_grid.h"
+#include "grid/grid_keys.h"
+#include "grid/grid_model.h"
+#include "grid/name_offers.h"
+#include "grid/typing.h"
+#include "res/strings.h"
+
+#include <QApplication>
+#include <QKeyEvent>
+#include <QMdiSubWindow>
+#include <QPainter>
+#include <QScopedValueRollback>
+#include <QTimer>
+
+namespace {
+
+constexpr int DropDownHeight = 500; // pixels
+
+QString TextOf(const QWidget* editor)
+{
+    const auto* list = qobject_cast<const QComboBox*>(editor);
+    return list ? list->currentText() : static_cast<const QLineEdit*>(editor)->text();
+}
+
+/// The whole of a document's view, where there is room for what a cell offers.
+QWidget* ViewAround(QWidget* widget)
+{
+    while (!widget->isWindow() && widget->parentWidget() && !qobject_cast<QMdiSubWindow*>(widget->parentWidget()))
+        widget = widget->parentWidget();
+    return widget;
+}
+
+/// The branch names of the network, to choose from; another name can still be typed.
+QWidget* MakeBranchList(const QStringList& names, QWidget* parent, QWidget* view)
+{
+    auto* list = new QComboBox(parent);
+    list->setEditable(true);
+    list->setLineEdit(new CGridStringEdit(list));
+    list->setInsertPolicy(QComboBox::NoInsert);
+    list->addItems(names);
+    list->setMaxVisibleItems(DropDownHeight / list->fontMetrics().lineSpacing());
+    new CNameOffers(list, view);
+    return list;
+}
+
+QWidget* MakeEditor(const ColumnSpec& column, QWidget* parent)
+{
+    switch (column.Kind()) {
+    case CellKind::Choice:
+    case CellKind::TextChoice:
+        return new CGridChoiceEdit(column.choices.entries(), parent);
+    case CellKind::Number:
+    case CellKind::Integer:
+        return new CGridDoubleEdit(parent);
+    default:
+        break;
+    }
+    if (FindControl(column.control).upperCase)
+        return new CGridStringEdit(parent);
+    auto* edit = new QLineEdit(parent);
+    edit->setFrame(false);
+    return edit;
+}
+
+} // namespace
+
+CGridDoubleEdit::CGridDoubleEdit(QWidget* parent) : QLineEdit(parent)
+{
+    setFrame(false);
+    setAlignment(Qt::AlignRight);
+}
+
+CGridStringEdit::CGridStringEdit(QWidget* parent) : QLineEdit(parent)
+{
+    setFrame(false);
+    connect(this, &QLineEdit::textEdited, this, [this](const QString& text) {
+        const QString upper = text.toUpper();
+        if (upper == text)
+            return;
+        const int cursor = cursorPosition() + int(upper.size() - text.size());
+        setText(upper);
+        setCursorPosition(cursor);
+    });
+}
+
+CGridChoiceEdit::CGridChoiceEdit(const QStringList& entries, QWidget* parent) : QComboBox(parent)
+{
+    addItems(entries);
+    // Opened by the mouse the entries are what the user wants to see next.
+    if (QApplication::mouseButtons() != Qt::NoButton)
+        QTimer::singleShot(0, this, &QComboBox::showPopup);
+}
+
+void CGridChoiceEdit::SetText(const QString& text)
+{
+    if (!text.isEmpty() && findText(text) < 0)
+        addItem(text);
+    setCurrentIndex(findText(text));
+}
+
+void CGridChoiceEdit::keyPressEvent(QKeyEvent* event)
+{
+    if (event->key() == Qt::Key_Backspace)
+        setCurrentIndex(-1);
+    else
+        QComboBox::keyPressEvent(event);
+}
+
+CGridDelegate::CGridDelegate(CGenGrid* grid) : QStyledItemDelegate(grid), m_grid(grid) {}
+
+QWidget* CGridDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&, const QModelIndex& index) const
+{
+    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
+    const QStringList names = index.column() + 1 == m_grid->BranchNameColumn() ? m_grid->BranchNames() : QStringList();
+    QWidget* editor = names.isEmpty() ? MakeEditor(column, parent) : MakeBranchList(names, parent, ViewAround(m_grid));
+    editor->setObjectName(FindControl(column.control).editorName);
+    editor->setAccessibleName(column.header());
+    editor->setAutoFillBackground(true);
+    m_editor = editor;
+    m_index = index;
+    return editor;
+}
+
+void CGridDelegate::setEditorData(QWidget* editor, const QModelIndex& index) const
+{
+    // Once, when the editor opens: what is being typed outlives a reload of the rows.
+    if (editor->property("opened").toBool())
+        return;
+    editor->setProperty("opened", true);
+    const QString text = index.data(Qt::EditRole).toString();
+    if (auto* choice = qobject_cast<CGridChoiceEdit*>(editor)) {
+        choice->SetText(text);
+    } else if (auto* list = qobject_cast<QComboBox*>(editor)) {
+        list->setCurrentText(text);
+        list->lineEdit()->selectAll();
+    } else {
+        static_cast<QLineEdit*>(editor)->setText(text);
+    }
+}
+
+void CGridDelegate::setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const
+{
+    model->setData(index, TextOf(editor), Qt::EditRole);
+}
+
+void CGridDelegate::destroyEditor(QWidget* editor, const QModelIndex& index) const
+{
+    if (editor == m_editor)
+        m_editor = nullptr;
+    QStyledItemDelegate::destroyEditor(editor, index);
+}
+
+void CGridDelegate::PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
+{
+    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
+    const QStyle& style = *m_grid->style();
+    const bool locked = m_grid->Model()->IsLocked(index.row(), index.column());
+    QStyleOptionButton button;
+    button.palette = cell.palette;
+    button.state = cell.state & (QStyle::State_Enabled | QStyle::State_MouseOver);
+    button.state.setFlag(QStyle::State_Enabled, cell.state.testFlag(QStyle::State_Enabled) && !locked);
+    if (column.Kind() == CellKind::Flag) {
+        const QSize size(style.pixelMetric(QStyle::PM_IndicatorWidth, nullptr, m_grid),
+                         style.pixelMetric(QStyle::PM_IndicatorHeight, nullptr, m_grid));
+        button.rect = QStyle::alignedRect(cell.direction, Qt::AlignCenter, size, cell.rect);
+        button.state |= index.data(Qt::CheckStateRole).toInt() == Qt::Checked ? QStyle::State_On : QStyle::State_Off;
+        style.drawPrimitive(QStyle::PE_IndicatorCheckBox, &button, painter, m_grid);
+    } else {
+        button.rect = cell.rect.adjusted(1, 1, -1, -1);
+        button.state |= QStyle::State_Raised;
+        button.text = QStringLiteral("...");
+        button.fontMetrics = cell.fontMetrics;
+        style.drawControl(QStyle::CE_PushButton, &button, painter, m_grid);
+    }
+}
+
+/// A text on its background. The style would lay it out as it does rich contents, which takes several times as long,
+/// and a table repaints hundreds of cells at each step of scrolling.
+void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
+{
+    const QVariant background = index.data(Qt::BackgroundRole);
+    if (background.isValid())
+        painter->fillRect(cell.rect, qvariant_cast<QBrush>(background));
+    QString text = index.data(Qt::DisplayRole).toString();
+    if (text.isEmpty())
+        return;
+    const int margin = m_grid->style()->pixelMetric(QStyle::PM_FocusFrameHMargin, nullptr, m_grid) + 1;
+    const QRect inside = cell.rect.adjusted(margin, 0, -margin, 0);
+    int width = cell.fontMetrics.horizontalAdvance(text);
+    if (width > inside.width()) {
+        text = cell.fontMetrics.elidedText(text, cell.textElideMode, inside.width());
+        width = cell.fontMetrics.horizontalAdvance(text);
+    }
+    const bool isRight = m_grid->Model()->Columns()[std::size_t(index.column())].IsRightAligned();
+    const int x = isRight ? inside.right() + 1 - width : inside.left();
+    const int y = inside.top() + (inside.height() - cell.fontMetrics.height() + 1) / 2 + cell.fontMetrics.ascent();
+    const bool enabled = cell.state.testFlag(QStyle::State_Enabled);
+    painter->setPen(cell.palette.color(enabled ? QPalette::Normal : QPalette::Disabled, QPalette::Text));
+    painter->drawText(x, y, text);
+}
+
+void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const
+{
+    constexpr QStyle::State special = QStyle::State_Selected | QStyle::State_HasFocus | QStyle::State_MouseOver;
+    const bool isText = !m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce();
+    if (isText) {
+        if (!(option.state & special) && option.direction == Qt::LeftToRight)
+            PaintText(painter, option, index);
+        else
+            QStyledItemDelegate::paint(painter, option, index);
+        if (m_grid->Model()->HidesDigits(index.row(), index.column()))
+            PaintDigitsMark(*painter, option.rect, option.palette, option.state.testFlag(QStyle::State_Selected));
+        return;
+    }
+    QStyleOptionViewItem cell = option;
+    initStyleOption(&cell, index);
+    cell.features &= ~QStyleOptionViewItem::HasCheckIndicator; // drawn centred below
+    m_grid->style()->drawControl(QStyle::CE_ItemViewItem, &cell, painter, m_grid);
+    PaintControl(painter, cell, index);
+}
+
+bool CGridDelegate::editorEvent(QEvent* event, QAbstractItemModel*, const QStyleOptionViewItem& option,
+                                const QModelIndex& index)
+{
+    if (!m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce())
+        return false;
+    switch (event->type()) {
+    case QEvent::MouseButtonRelease: {
+        const auto* mouse = static_cast<QMouseEvent*>(event);
+        if (mouse->button() != Qt::LeftButton || !option.rect.contains(mouse->position().toPoint()))
+            return false;
+        break;
+    }
+    case QEvent::KeyPress:
+        if (static_cast<QKeyEvent*>(event)->key() != Qt::Key_Space)
+            return false;
+        break;
+    default:
+        return event->type() == QEvent::MouseButtonDblClick; // the second release acts
+    }
+    m_grid->ActOn(index.row() + 1, index.column() + 1);
+    return true;
+}
+
+QString CGridDelegate::Refusal() const
+{
+    return m_grid->Model()->Refusal(m_index.row(), m_index.column(), TextOf(m_editor));
+}
+
+bool CGridDelegate::Commit()
+{
+    if (!m_editor || !m_index.isValid())
+        return true;
+    if (m_telling)
+        return false;
+    QWidget* editor = m_editor;
+    const QString refusal = Refusal();
+    if (refusal.isEmpty()) {
+        m_editor = nullptr; // closing takes the focus, which would commit again
+        emit commitData(editor);
+        emit closeEditor(editor);
+        return true;
+    }
+    const QScopedValueRollback telling(m_telling, true);
+    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(m_index.column())];
+    const QString place = LoadString(Str::CellPlace).arg(column.header()).arg(m_index.row() + 1);
+    const QString unit = column.unitText ? column.unitText() : column.style.UnitSymbol();
+    TellRefusal(*editor, refusal, RefusalDetails(place, TextOf(editor), {}, unit));
+    return false;
+}
+
+/// Nobody asked before the focus went. A value is taken at once; a text that is none is told when the focus has
+/// arrived.
+void CGridDelegate::LostFocus(const QEvent* event)
+{
+    const auto reason = static_cast<const QFocusEvent*>(event)->reason();
+    const QWidget* focus = QApplication::focusWidget();
+    // The editor stays while another window or its own pop-up is in front, and a click into the grid is the grid's to
+    // judge: it commits before the current cell moves.
+    const bool inGrid = focus && (focus == m_grid || m_grid->isAncestorOf(focus));
+    if (reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || inGrid || !m_grid->HasPage() ||
+        m_telling || !m_editor || !m_index.isValid())
+        return;
+    if (Refusal().isEmpty()) {
+        Commit();
+        m_grid->StoreEditedLine(BlankRule::Fill);
+        return;
+    }
+    QTimer::singleShot(0, m_editor, [this] {
+        if (!m_grid->isVisible() || !m_grid->isEnabled())
+            emit closeEditor(m_editor); // what took the focus took the table away: the cell keeps its value
+        else if (!m_editor->hasFocus())
+            Commit();
+    });
+}
+
+bool CGridDelegate::eventFilter(QObject* object, QEvent* event)
+{
+    if (object != m_editor)
+        return QStyledItemDelegate::eventFilter(object, event);
+    switch (event->type()) {
+    case QEvent::FocusOut:
+        LostFocus(event);
+        return false;
+    case QEvent::ShortcutOverride:
+    case QEvent::KeyPress: {
+        const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
+        if (!key || !key->whileEditing)
+            break;
+        event->accept();
+        if (event->type() == QEvent::KeyPress && Commit())
+            m_grid->Run(key->action);
+        return true;
+    }
+    default:
+        break;
+    }
+    return QStyledItemDelegate::eventFilter(object, event);
+}

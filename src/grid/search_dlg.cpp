@@ -1,0 +1,55 @@
+#include "grid/search_dlg.h"
+
+#include "ks/units/edit_fields.h"
+#include "ui_search_dlg.h"
+
+#include <QButtonGroup>
+
+namespace {
+
+/// The buttons' group, each button's place being its value.
+void Choose(QButtonGroup* group, std::initializer_list<QRadioButton*> buttons, int value)
+{
+    int id = 0;
+    for (QRadioButton* button : buttons)
+        group->addButton(button, id++);
+    if (auto* button = group->button(value))
+        button->setChecked(true);
+}
+
+} // namespace
+
+CSearchDlg::CSearchDlg(const QString& riverName, double chainage, int chainageCriterion, int nameCriterion,
+                       QWidget* parent)
+    : QDialog(parent),
+      m_ui(std::make_unique<Ui::CSearchDlg>()),
+      m_riverName(riverName),
+      m_chainageCriterion(chainageCriterion),
+      m_nameCriterion(nameCriterion),
+      m_chainage(chainage),
+      m_shownChainage(m_style.UnitConvertFromBase(chainage, 1))
+{
+    m_ui->setupUi(this);
+    Choose(m_ui->nameCriterion, {m_ui->partialMatch_1059, m_ui->fullMatch_1060}, nameCriterion);
+    Choose(m_ui->chainageCriterion, {m_ui->less_1062, m_ui->equal_1063, m_ui->greater_1064, m_ui->notUse_1067},
+           chainageCriterion);
+    m_ui->riverName_1058->setText(riverName);
+    DDX_KSedit(false, *m_ui->chainage_1061, m_shownChainage, m_style);
+    m_shownText = m_ui->chainage_1061->text();
+    m_ui->chainageUnit->setText(m_style.UnitSymbol());
+    m_ui->riverName_1058->selectAll();
+}
+
+CSearchDlg::~CSearchDlg() = default;
+
+void CSearchDlg::accept()
+{
+    if (!DDX_KSedit(true, *m_ui->chainage_1061, m_shownChainage, m_style))
+        return;
+    if (m_ui->chainage_1061->text() != m_shownText) // else it stays what it was to the last bit
+        m_chainage = m_style.UnitConvertFromBase(m_shownChainage, 0);
+    m_riverName = m_ui->riverName_1058->text();
+    m_chainageCriterion = m_ui->chainageCriterion->checkedId();
+    m_nameCriterion = m_ui->nameCriterion->checkedId();
+    QDialog::accept();
+}

@@ -1,0 +1,218 @@
+#include "grid/typing.h"
+
+#include "ks/fc/message_box.h"
+#include "grid/column_spec.h"
+#include "res/strings.h"
+
+#include <QAccessible>
+#include <QKeyEvent>
+#include <QLineEdit>
+#include <QPointer>
+#include <QScopedValueRollback>
+#include <QScrollArea>
+#include <QTimer>
+#include <algorithm>
+
+namespace {
+
+/// The name of a field as a user reads it.
+QString NameOf(QWidget& field)
+{
+    QAccessibleInterface* accessible = QAccessible::queryAccessibleInterface(&field);
+    QString name = accessible ? accessible->text(QAccessible::Name).remove(u'&').trimmed() : QString();
+    if (name.endsWith(u':'))
+        name.chop(1);
+    return name;
+}
+
+qsizetype CommonStart(const QString& a, const QString& b)
+{
+    return std::mismatch(a.begin(), a.end(), b.begin(), b.end()).first - a.begin();
+}
+
+qsizetype CommonEnd(const QString& a, const QString& b)
+{
+    return std::mismatch(a.rbegin(), a.rend(), b.rbegin(), b.rend()).first - a.rbegin();
+}
+
+/// Another window or a menu in front does not leave a field.
+bool StaysInField(const QEvent* event)
+{
+    const auto reason = static_cast<const QFocusEvent*>(event)->reason();
+    return reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason;
+}
+
+} // namespace
+
+void TellRefusal(QWidget& widget, const QString& message, const QString& details)
+{
+    for (QWidget* parent = widget.parentWidget(); parent; parent = parent->parentWidget()) {
+        if (auto* area = qobject_cast<QScrollArea*>(parent))
+            area->ensureWidgetVisible(&widget);
+    }
+    widget.setFocus(Qt::OtherFocusReason); // where it goes back to when the message is read
+    const QPointer<QWidget> told = &widget;
+    KsMessageBox(message, QMessageBox::Ok, &widget, details);
+    if (told)
+        told->setFocus(Qt::OtherFocusReason);
+}
+
+QString RefusalDetails(const QString& place, const QString& typed, const QString& allowed, const QString& unit)
+{
+    QStringList lines{LoadString(Str::TypedThere).arg(place, typed)};
+    if (!allowed.isEmpty())
+        lines << LoadString(Str::Allowed).arg(allowed);
+    if (!unit.isEmpty())
+        lines << UnitToolTip(unit);
+    return lines.join(u'\n');
+}
+
+QString AllowedRange(const QString& minimum, const QString& maximum)
+{
+    if (!minimum.isEmpty() && !maximum.isEmpty())
+        return LoadString(Str::RangeFromTo).arg(minimum, maximum);
+    return !minimum.isEmpty()   ? LoadString(Str::RangeFrom).arg(minimum)
+           : !maximum.isEmpty() ? LoadString(Str::RangeTo).arg(maximum)
+                                : QString();
+}
+
+CTyping::CTyping(QLineEdit* field, TypedField what) : QObject(field), m_field(field), m_what(std::move(what))
+{
+    field->installEventFilter(this);
+    connect(field, &QLineEdit::textEdited, this, &CTyping::Edited);
+    // Told after an edit, so during one this is the selection that the edit replaced.
+    connect(field, &QLineEdit::selectionChanged, this, [this] {
+        m_selected = m_field->selectionStart();
+        m_selectedLength = m_field->selectionLength();
+    });
+    Shown();
+}
+
+void CTyping::Shown()
+{
+    m_text = m_field->text();
+    m_length = m_before = m_after = m_text.size();
+    m_field->setModified(false);
+}
+
+void CTyping::Edited(const QString& text)
+{
+    const qsizetype shorter = std::min(text.size(), m_text.size());
+    const qsizetype start = m_selected >= 0 ? m_selected : CommonStart(m_text, text);
+    const qsizetype end = m_selected >= 0 ? m_text.size() - m_selected - m_selectedLength
+                                          : std::min(CommonEnd(m_text, text), shorter - std::min(start, shorter));
+    m_before = std::clamp<qsizetype>(start, 0, m_before);
+    m_after = std::clamp<qsizetype>(end, 0, m_after);
+    m_text = text;
+}
+
+bool CTyping::IsTyped() const
+{
+    return m_field->isModified() && (m_field->text().size() != m_length || m_before + m_after < m_length);
+}
+
+bool CTyping::MayWait() const
+{
+    return m_what.waitsForPage && !Complaint().isEmpty();
+}
+
+bool CTyping::Take()
+{
+    if (!IsTyped())
+        return true;
+    if (m_telling)
+        return false;
+    if (!m_field->isVisible() || !m_field->isEnabled()) { // a setting took it away
+        Revert();
+        return true;
+    }
+    const QString complaint = Complaint();
+    if (complaint.isEmpty()) {
+        m_field->setModified(false); // storing shows the page afresh
+        m_what.store();
+        Revert();
+        return true;
+    }
+    const QScopedValueRollback telling(m_telling, true);
+    const auto text = [](const std::function<QString()>& make) { return make ? make() : QString(); };
+    TellRefusal(*m_field, complaint,
+                RefusalDetails(NameOf(*m_field), m_field->text(), text(m_what.allowed), text(m_what.unit)));
+    m_field->selectAll();
+    return false;
+}
+
+void CTyping::Revert()
+{
+    m_field->setModified(false);
+    m_what.show();
+    Shown();
+}
+
+/// Nobody asked before the focus went. A value is taken at once. Anything else is told when the focus has arrived,
+/// unless what took the focus disabled the field: then it is nobody's value any more.
+void CTyping::FocusLost()
+{
+    if (!IsTyped() || m_telling || MayWait())
+        return;
+    if (Complaint().isEmpty()) {
+        Take();
+        return;
+    }
+    QTimer::singleShot(0, this, [this] {
+        if (!m_field->isVisible() || !m_field->isEnabled())
+            Revert();
+        else if (!m_field->hasFocus() && !m_telling)
+            Take();
+    });
+}
+
+bool CTyping::KeyPressed(int key)
+{
+    switch (key) {
+    case Qt::Key_Return:
+    case Qt::Key_Enter:
+        if (TakeField())
+            m_field->selectAll();
+        return true;
+    case Qt::Key_Escape:
+        if (!IsTyped())
+            return false;
+        Revert();
+        m_field->selectAll();
+        return true;
+    case Qt::Key_Tab:
+    case Qt::Key_Backtab:
+        return !TakeField(); // asked before the focus goes
+    default:
+        return false;
+    }
+}
+
+bool CTyping::eventFilter(QObject* object, QEvent* event)
+{
+    if (!qobject_cast<QLineEdit*>(object)) // a field that is being taken apart loses its focus last
+        return false;
+    switch (event->type()) {
+    case QEvent::FocusOut:
+        if (!StaysInField(event))
+            FocusLost();
+        return false;
+    case QEvent::EnabledChange:
+        if (!m_field->isEnabled() && IsTyped())
+            Revert();
+        return false;
+    case QEvent::ShortcutOverride:
+    case QEvent::KeyPress: {
+        const auto* key = static_cast<QKeyEvent*>(event);
+        // With nothing of its own to take back the field leaves undo and redo to the document.
+        if ((key->matches(QKeySequence::Undo) || key->matches(QKeySequence::Redo)) && !IsTyped()) {
+            event->ignore();
+            return true;
+        }
+        return event->type() == QEvent::KeyPress && !(key->modifiers() & (Qt::ControlModifier | Qt::AltModifier)) &&
+               KeyPressed(key->key());
+    }
+    default:
+        return QObject::eventFilter(object, event);
+    }
+}
