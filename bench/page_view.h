@@ -17,10 +17,10 @@ public:
     }
     void OnUpdate(CView*, int, CHint*) override { m_page.LoadFromDocument(&m_document); }
     CView* HostView() override { return this; }
-    void EditedLineChanged(int) override
+    void EditedLineChanged() override
     {
         m_page.StoreToDocument();
-        m_document.UpdateAllViews(nullptr, Hint::Reload);
+        m_document.UpdateAllViews(nullptr, CKsDoc::ReloadHint);
     }
     void CurrentLocationChanged() override {}
     void Execute(int) override {}

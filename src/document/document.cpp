@@ -6,14 +6,9 @@
 #include "grid/row_source.h"
 #include "res/strings.h"
 
-#include <QApplication>
-#include <QDir>
 #include <QFileInfo>
-#include <QPointer>
-#include <QTimer>
 #include <QUndoStack>
 #include <algorithm>
-#include <utility>
 
 namespace {
 
@@ -45,21 +40,13 @@ private:
 
 } // namespace
 
-CKavo0_hdDoc::CKavo0_hdDoc()
-{
-    connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKavo0_hdDoc::StepMade);
-}
+CKavo0_hdDoc::CKavo0_hdDoc() : CKsProjectDoc(HDPackageKind) {}
 
 bool CKavo0_hdDoc::HasExtension(const CString& path)
 {
     // Mixed spellings are refused: the shell's file tables know these two.
     const CString extension = QFileInfo(path).suffix();
     return extension == QLatin1String("HDKV") || extension == QLatin1String("hdkv");
-}
-
-BOOL CKavo0_hdDoc::OnNewDocument()
-{
-    return CKsDoc::OnNewDocument();
 }
 
 BOOL CKavo0_hdDoc::OnOpenDocument(const CString& path)
@@ -86,7 +73,7 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
     if (!MayLeave())
         return false;
     const CString target = SavePathFor(path);
-    UpdateAllViews(nullptr, Hint::Store);
+    UpdateAllViews(nullptr, CKsDoc::StoreHint);
     if (!MayReplace(target, path) || !m_file.MayReplace(target))
         return false;
 
@@ -94,7 +81,7 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
     purged->TakeOut();
     if (!WriteData(target)) {
         purged->PutBack(); // what is in memory stays as the user left it
-        UpdateAllViews(nullptr, Hint::Reload);
+        UpdateAllViews(nullptr, CKsDoc::ReloadHint);
         return false;
     }
     const QString dropped = purged->Summary();
@@ -104,7 +91,7 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
 
     m_isReadOnly = false;
     SetPathName(target);
-    UpdateAllViews(nullptr, Hint::Reload);
+    UpdateAllViews(nullptr, CKsDoc::ReloadHint);
     SetModifiedFlag(false);
     emit FileStateChanged();
     QString saved = dropped.isEmpty() ? LoadString(Str::Saved) : LoadString(Str::SavedDropping).arg(dropped);
@@ -161,84 +148,4 @@ void CKavo0_hdDoc::DeleteContents()
     m_rowsShown.clear();
     m_parameters.RemoveAllRecords();
     CKsDoc::DeleteContents();
-}
-
-LRESULT CKavo0_hdDoc::SendToShell(unsigned message, WPARAM request, CView* view, const CString& name, CObList* objects)
-{
-    CKSComm_Package package;
-    package.view = view;
-    package.text = name;
-    package.kind = HDPackageKind;
-    package.project = m_hProject;
-    package.objects = objects;
-    return KsSendMessage(KsMainWindow(), message, request, reinterpret_cast<LPARAM>(&package));
-}
-
-BOOL CKavo0_hdDoc::GetProjectInfo(CView* view, const CString& name)
-{
-    m_hProject = 0;
-    m_hProject = SendToShell(KsMessage::SwitchBoard(), KsRequest::JoinProject, view, name);
-    return m_hProject != 0;
-}
-
-LRESULT CKavo0_hdDoc::AskShell(WPARAM request, CView* view, CObList* objects)
-{
-    return m_hProject ? SendToShell(KsMessage::SwitchBoard(), request, view, GetPathName(), objects) : 0;
-}
-
-void CKavo0_hdDoc::TellShell(WPARAM news, CView* view, CObList* objects)
-{
-    if (m_hProject)
-        SendToShell(KsMessage::BetweenEditors(), news, view, GetPathName(), objects);
-}
-
-void CKavo0_hdDoc::LeaveProject(CView* view, const CString& name)
-{
-    if (m_hProject)
-        SendToShell(KsMessage::SwitchBoard(), KsRequest::LeaveProject, view, name);
-}
-
-void CKavo0_hdDoc::StepMade(int index)
-{
-    ShowStep(index < std::exchange(m_steps, index));
-    TellStep();
-}
-
-/// What a complete step that was undone or redone has changed.
-void CKavo0_hdDoc::ShowStep(bool isUndo)
-{
-    if (!m_stepShows)
-        return; // a new step
-    emit Reveal(*std::exchange(m_stepShows, std::nullopt));
-    Say(LoadString(isUndo ? Str::Undone : Str::Redone).arg(isUndo ? UndoStack().redoText() : UndoStack().undoText()));
-}
-
-/// A step comes in the middle of things: the page that made it goes on storing, and whoever hears of it may ask at
-/// once.
-void CKavo0_hdDoc::TellStep()
-{
-    if (!m_hProject || UndoStack().count() == 0) // a cleared stack is no step
-        return;
-    if (m_untold++ == 0)
-        QTimer::singleShot(0, this, &CKavo0_hdDoc::TellChanges);
-}
-
-void CKavo0_hdDoc::TellChanges()
-{
-    for (int steps = std::exchange(m_untold, 0); steps > 0; --steps)
-        DataChange(GetPathName());
-}
-
-void CKavo0_hdDoc::DataChange(const CString& name)
-{
-    if (m_hProject)
-        SendToShell(KsMessage::BetweenEditors(), KsRequest::DataChanged, nullptr, name);
-}
-
-void CKavo0_hdDoc::UpdateAll(CView* sender, int hint, CHint* object)
-{
-    SetModifiedFlag(true);
-    UpdateAllViews(sender, hint, object);
-    if (sender && !sender->isAncestorOf(QApplication::focusWidget()))
-        sender->setFocus();
 }

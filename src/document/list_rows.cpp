@@ -62,7 +62,7 @@ public:
         return std::make_unique<CRecordBlock>(m_list.RemoveAt(row, count));
     }
     const void* Data() const override { return &m_list; }
-    CGenList* List() const override { return &m_list; }
+    const void* List() const override { return &m_list; }
 
 private:
     static HD_RiverPos* Record(RowKey key) { return reinterpret_cast<HD_RiverPos*>(key); }
@@ -100,7 +100,7 @@ public:
         return m_lines->Take(row - 1, count);
     }
     const void* Data() const override { return m_lines->Data(); }
-    CGenList* List() const override { return m_lines->List(); }
+    const void* List() const override { return m_lines->List(); }
 
 private:
     RowKey GlobalKey() const { return reinterpret_cast<RowKey>(m_globals); }

@@ -3,6 +3,8 @@
 
 #include "grid/row_source.h"
 
+class CGenList;
+
 /// `list` is one of a document's lists.
 std::shared_ptr<IRowSource> MakeListRows(CGenList& list);
 

@@ -1,5 +1,6 @@
 #include "document/purged_lines.h"
 
+#include "grid/row_commands.h"
 #include "res/strings.h"
 
 #include <QStringList>

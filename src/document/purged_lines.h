@@ -3,7 +3,8 @@
 
 #include "data/hd_parameters.h"
 #include "document/document.h"
-#include "document/list_commands.h"
+#include "grid/row_source.h"
+#include "ks/fc/doc_command.h"
 
 #include <vector>
 

@@ -1,9 +1,11 @@
 #include "grid/cell_text.h"
 
-#include "data/river_pos.h"
+#include "base/not_given.h"
 #include "grid/date_time_text.h"
+#include "grid/grid_texts.h"
 #include "grid/number_syntax.h"
-#include "res/strings.h"
+
+#include <cmath>
 
 namespace {
 
@@ -28,6 +30,8 @@ QString ShownText(const ColumnSpec& column, const CellValue& value)
     const int decimals = FindControl(column.control).decimals;
     if (decimals == AsFormatted || KsUnits::Instance().AllDigits())
         return column.style.ShownText(*number);
+    if (decimals == UpToThousandths)
+        return KsShortestNumber(std::round(column.style.UnitConvertFromBase(*number, 1) * 1000) / 1000);
     return KsFormatNumber(QStringLiteral("%-.%1lf").arg(decimals), column.style.UnitConvertFromBase(*number, 1));
 }
 
@@ -70,33 +74,34 @@ CellReading ReadCell(const ColumnSpec& column, const QString& text)
     if (column.Kind() == CellKind::Text)
         return {(FindControl(column.control).upperCase ? text.toUpper() : text).toStdString(), {}};
     if (text.isEmpty())
-        return {};
+        return {{}, column.isRequired ? GridTexts::tr("Floating point number required") : QString()};
     if (column.Kind() == CellKind::Button)
-        return {{}, LoadString(Str::CellLocked)};
+        return {{}, GridTexts::tr("The cell is locked.")};
     if (column.Kind() == CellKind::Flag)
         return text == u'0' || text == u'1' ? CellReading{std::int32_t(text == u'1'), {}}
-                                            : CellReading{{}, LoadString(Str::FlagRequired)};
+                                            : CellReading{{}, GridTexts::tr("Please enter 0 or 1.")};
     if (column.Kind() == CellKind::DateTime) {
         const auto time = ReadDateTime(text);
         return time ? CellReading{*time, {}} : CellReading{{}, DateTimeRefusal(text)};
     }
-    if (column.Kind() == CellKind::TextChoice) {
-        if (const auto entry = column.choices.EntryOf(text))
+    if (column.Kind() == CellKind::TextChoice || column.Kind() == CellKind::Choice) {
+        const auto entry = column.choices.EntryOf(text);
+        if (entry && column.Kind() == CellKind::TextChoice)
             return {entry->toStdString(), {}};
-        return {{}, LoadString(Str::ChoiceRequired).arg(column.choices.entries().join(QStringLiteral(", ")))};
-    }
-    if (column.Kind() == CellKind::Choice) {
-        if (const auto index = column.choices.IndexOf(text))
+        if (const auto index = column.choices.IndexOf(text); index && column.Kind() == CellKind::Choice)
             return {*index, {}};
-        return {{}, LoadString(Str::ChoiceRequired).arg(column.choices.entries().join(QStringLiteral(", ")))};
+        return {{}, GridTexts::tr("One of these is required: %1").arg(column.choices.entries().join(", "))};
     }
     if (column.Kind() == CellKind::Integer) {
         bool isInteger = false;
         const std::int32_t value = text.toInt(&isInteger);
-        return isInteger ? CellReading{value, {}} : CellReading{{}, LoadString(Str::IntegerRequired)};
+        return isInteger ? CellReading{value, {}} : CellReading{{}, GridTexts::tr("Please enter an integer.")};
     }
     const auto number = ReadNumber(text.toStdString());
     if (!number)
-        return {{}, LoadString(Str::GridNumberRequired)};
-    return {column.style.UnitConvertFromBase(*number, 0), {}};
+        return {{}, GridTexts::tr("Floating point number required")};
+    const double value = column.style.UnitConvertFromBase(*number, 0);
+    if (!column.IsAllowed(value))
+        return {{}, GridTexts::tr("Floating-point value is out of range")};
+    return {value, {}};
 }

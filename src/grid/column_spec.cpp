@@ -1,7 +1,8 @@
 #include "grid/column_spec.h"
 
-#include "data/river_pos.h"
-#include "res/strings.h"
+#include "base/not_given.h"
+#include "grid/grid_texts.h"
+#include "grid/typing.h"
 
 #include <QCoreApplication>
 #include <algorithm>
@@ -20,6 +21,7 @@ constexpr GridControl Controls[] = {
     {Control::CheckBox, CellKind::Flag, 0, "checkBox"},
     {Control::PushButton, CellKind::Button, 0, "pushButton"},
     {Control::DateTime, CellKind::DateTime, 0, "dateTimeEdit"},
+    {Control::Measured, CellKind::Number, UpToThousandths, "doubleEdit"},
     {Control::Chainage, CellKind::Number, 0, "doubleEdit_1112"},
 };
 
@@ -101,7 +103,7 @@ QString NumberToolTip(const CKsEditStyle& style, double value, const QString& sh
     const QString unitTip = UnitToolTip(unit);
     if (!style.HidesDigits(value, shown))
         return unitTip;
-    const QString full = LoadString(Str::FullValue).arg(NumberText(style.FullText(value), unit));
+    const QString full = GridTexts::tr("Full value: %1").arg(NumberText(style.FullText(value), unit));
     return unitTip.isEmpty() ? full : full + u'\n' + unitTip;
 }
 
@@ -143,6 +145,19 @@ CellValue ColumnSpec::NewLineValue() const
 QString ColumnSpec::UnitSymbol() const
 {
     return unitText ? unitText() : style.UnitSymbol();
+}
+
+QString ColumnSpec::Allowed() const
+{
+    const auto text = [this](std::optional<double> bound) {
+        return bound ? KsShortestNumber(style.UnitConvertFromBase(*bound, 1)) : QString();
+    };
+    return AllowedRange(text(minimum), text(maximum));
+}
+
+bool ColumnSpec::IsAllowed(double value) const
+{
+    return !(minimum && value < *minimum) && !(maximum && value > *maximum);
 }
 
 QString ColumnSpec::ToolTip(bool isHeader) const

@@ -39,6 +39,8 @@ enum class CellKind
 
 /// A number that is not being edited stands as the column's format has it.
 inline constexpr int AsFormatted = -1;
+/// Likewise with the decimals that it has, up to thousandths.
+inline constexpr int UpToThousandths = -2;
 /// A format for numbers of any magnitude: six digits that count, and no zeros to fill them up.
 inline constexpr const char* SignificantDigits = "%.6lg";
 
@@ -47,7 +49,7 @@ struct GridControl
 {
     int id;
     CellKind kind;
-    int decimals;           // of a number that is not being edited; AsFormatted
+    int decimals;           // of a number that is not being edited; AsFormatted, UpToThousandths
     const char* editorName; // object name of the editor
     bool upperCase = false; // of a text
 };
@@ -63,6 +65,7 @@ inline constexpr int FreeText = 52519;     // as it is typed
 inline constexpr int CheckBox = 52520;
 inline constexpr int PushButton = 52521;
 inline constexpr int DateTime = 52522;
+inline constexpr int Measured = 52523; // a number without zeros behind its last digit
 } // namespace Control
 const GridControl& FindControl(int id);
 
@@ -103,6 +106,8 @@ struct ColumnSpec
     std::function<QString()> header;
     int width = 72;               // pixels at the original font size; the grid scales it
     CKsEditStyle style;           // unit group and format
+    std::optional<double> minimum = {}, maximum = {}; // of a number, base units
+    bool isRequired = false;                          // an empty cell is refused
     bool emptyIsNotGiven = false; // an empty cell is stored as the mark for "not given", and the mark shows as empty
     Choices choices;              // of a drop-down column
     std::function<QString()> unitText; // symbol instead of the style's, where the unit depends on a setting
@@ -124,6 +129,9 @@ struct ColumnSpec
     /// What a new line holds; nothing where the record's own default stands.
     CellValue NewLineValue() const;
     QString UnitSymbol() const;
+    /// "at least 0", in the user's unit; empty without bounds.
+    QString Allowed() const;
+    bool IsAllowed(double value) const;
     /// Unit of the cells, and on a header also what the column is.
     QString ToolTip(bool header) const;
 };

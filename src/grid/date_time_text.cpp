@@ -1,7 +1,7 @@
 #include "grid/date_time_text.h"
 
 #include "ks/language/language.h"
-#include "res/strings.h"
+#include "grid/grid_texts.h"
 
 #include <QDateTime>
 #include <QLocale>
@@ -151,7 +151,7 @@ QString DateTimeText(const HDDateTime& time)
     if (time == HDDateTime{})
         return {};
     if (!time.IsValid())
-        return LoadString(Str::InvalidDateTime);
+        return GridTexts::tr("Invalid DateTime");
     // In UTC, so that no hour of the calendar is missing where clocks change.
     const QDateTime value(QDate(time.Year, time.Month, time.Day), QTime(time.Hour, time.Minute, time.Second), Qt::UTC);
     const QLocale locale = KsLangGetUserLocale();
@@ -172,5 +172,5 @@ std::optional<HDDateTime> ReadDateTime(const QString& text)
 QString DateTimeRefusal(const QString& text)
 {
     const HDDateTime example{2024, 5, 31, 18, 0, 0};
-    return LoadString(Str::DateTimeRequired).arg(text, DateTimeText(example));
+    return GridTexts::tr("\"%1\" is no date and time. Expected one such as %2.").arg(text, DateTimeText(example));
 }

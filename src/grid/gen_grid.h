@@ -1,5 +1,5 @@
-// The record grid of the pages: rows are locations, the row number stands in the vertical header. Rows and columns
-// count from 1 in everything that pages and the view call.
+// The record grid: rows are locations or other lines, the row number stands in the vertical header. Rows and columns
+// count from 1 in everything that its host calls.
 #pragma once
 
 #include "grid/grid_model.h"
@@ -7,10 +7,18 @@
 #include <QTableView>
 #include <optional>
 
-class CGenPropertyPage;
 class CGridDelegate;
-class IPageHost;
+class CGridWidths;
+class IGridHost;
 enum class GridAction;
+
+/// Which lines Delete means.
+enum class LineChoice
+{
+    WholeLines,  // selected by their numbers, not cell by cell, in one range
+    CurrentLine, // likewise; without such a selection the current line
+    LinesOfCells // those of the selected cells
+};
 
 class CGenGrid : public QTableView
 {
@@ -19,15 +27,12 @@ public:
     explicit CGenGrid(QWidget* parent = nullptr);
     ~CGenGrid() override;
 
-    /// Binds grid and page to each other: this is the page's grid of locations.
-    void SetOwnerPage(CGenPropertyPage* page);
-    /// A further grid of the page, of something else than locations.
-    void SetPartOfPage(CGenPropertyPage* page);
-    /// The page goes; nothing is reported or stored any more.
-    void LeavePage() { m_page = nullptr; }
-    bool HasPage() const { return m_page; }
+    /// Null when the host goes: nothing is reported or stored any more.
+    void SetHost(IGridHost* host) { m_host = host; }
+    IGridHost* Host() const { return m_host; }
     CGridModel* Model() const { return m_model; }
     CGridDelegate* Delegate() const { return m_delegate; }
+    CGridWidths& Widths() const { return *m_widths; }
 
     int RowCount() const { return m_model->rowCount(); }
     int ColumnCount() const { return m_model->columnCount(); }
@@ -44,41 +49,39 @@ public:
     /// Column whose cells offer the branch names of the network; 0 for none.
     void SetBranchNameColumn(int column) { m_branchNameColumn = column; }
     int BranchNameColumn() const { return m_branchNameColumn; }
-    QStringList BranchNames() const;
-    /// Every edited cell counts as a change of the line's location.
-    void SetLocationOnAnyColumn(bool any) { m_locationOnAnyColumn = any; }
-    /// Appending asks the page (the default) or, when false, the view's command.
-    void SetAppendThroughPage(bool through) { m_appendThroughPage = through; }
 
-    /// Shows the rows as they are now; keeps the current cell, or makes the first one current.
+    /// Shows the rows as they are now; keeps the current cell.
+    void Refresh();
+    /// Likewise; without a current cell the first one becomes it.
     void Reload();
+    /// Shows other rows; none is current.
+    void ShowRows(CKsDoc& document, std::shared_ptr<IRowSource> rows);
     /// Inserts a line above the first selected range, or behind the last line; returns its row.
     int InsertLine();
+    /// Below the current line instead, or behind the last one when there is none.
+    void SetInsertsBelow(bool below) { m_insertsBelow = below; }
     /// Selects whole lines, as clicks on their numbers do.
     void SelectLines(int first, int last);
     void selectAll() override;
-    /// Deletes the selected lines when whole lines are selected - by their numbers, not cell by cell - in one range;
-    /// the current line without a selection in a grid that says so. A grid left empty gets a new line, unless its rows
-    /// may be none.
+    /// Deletes the lines that are chosen. A grid left empty gets a new line, unless its rows may be none.
     bool DeleteSelectedLines();
     bool HasLinesToDelete() const { return LinesToDelete().has_value(); }
-    void SetDeletesCurrentLine(bool deletes) { m_deletesCurrentLine = deletes; }
+    void SetLineChoice(LineChoice choice) { m_lineChoice = choice; }
     /// A click or the space bar on a cell that acts at once.
     void ActOn(int row, int column);
     void GotoLine(int row);
-    /// Looks for a line from `row` on (0 is taken as 1). On success the line becomes current, and `row` is the one
-    /// behind it; otherwise `row` is 0. `chainage` is in metres, and compared as shown in the chainage column.
-    bool SearchRows(int& row, const QString& name, double chainage, int chainageCriterion, int nameCriterion);
 
+    /// More than the current cell, in one range.
+    std::optional<QItemSelectionRange> SelectedBlock() const;
     bool CanCopy() const;
-    void Copy() const;
     bool CanPaste() const;
     /// Pastes at the selection. False, after a message, when a cell refuses its text; then nothing changed.
     bool Paste();
 
+    bool IsEditing() const;
     /// Takes the text being typed into the cell; false when the cell refuses it and stays open.
     bool CommitEditor();
-    /// Has the view store the edited line, if one was edited since the last time. A cell left blank by a move in the
+    /// Has the host store the edited line, if one was edited since the last time. A cell left blank by a move in the
     /// table is zero; one left together with the table takes the column's fill value, as it does with the page.
     void StoreEditedLine(BlankRule blanks = BlankRule::Zero);
     void Run(GridAction action);
@@ -97,31 +100,22 @@ protected:
     void keyboardSearch(const QString&) override {} // typing edits the cell
 
 private:
-    IPageHost* Host() const;
-    bool IsLocationGrid() const;
-    std::optional<QItemSelectionRange> SelectedBlock() const; // more than the current cell, in one range
     std::optional<QItemSelectionRange> LinesToDelete() const;
+    bool LeaveField();
+    bool MayGrow() const { return m_model->Rows() && m_model->Rows()->MayGrow(); }
     void NextCell();
     void PreviousCell();
-    void AppendLine();
-    void Execute(int command);
-    void CellModified(int row, int column);
-    void UpdateRowHeader();
-    void SetColumnWidths(int first);
-    int WidthOfTexts(int column, int firstRow) const;
-    void MakeRoomForDigits();
+    void Ask(GridAction action);
 
     CGridModel* m_model;       // child
     CGridDelegate* m_delegate; // child
-    CGenPropertyPage* m_page = nullptr;
-    int m_lastRow = 0, m_lastColumn = 0; // current at the last cell move
-    bool m_modified = false;             // since the last cell move
-    int m_modifiedColumn = 0;            // the leftmost one
-    bool m_appendThroughPage = true;
+    CGridWidths* m_widths;     // child
+    IGridHost* m_host = nullptr;
+    int m_lastRow = 0;       // current at the last cell move
+    bool m_modified = false; // since the last cell move
     int m_branchNameColumn = 0;
-    bool m_locationOnAnyColumn = false;
-    bool m_deletesCurrentLine = false;
+    bool m_insertsBelow = false;
+    LineChoice m_lineChoice = LineChoice::WholeLines;
     bool m_choosingLines = false; // the selection is being made by line numbers
     bool m_linesChosen = false;   // the selection was made so
-    int m_widthsSet = 0;          // of so many columns; from then on they are the user's
 };

@@ -1,7 +1,7 @@
 #include "grid/goto_dlg.h"
 
+#include "grid/grid_texts.h"
 #include "ks/fc/message_box.h"
-#include "res/strings.h"
 #include "ui_goto_dlg.h"
 
 CGotoDlg::CGotoDlg(QWidget* parent) : QDialog(parent), m_ui(std::make_unique<Ui::CGotoDlg>())
@@ -22,7 +22,7 @@ void CGotoDlg::accept()
         m_line = *line;
         return QDialog::accept();
     }
-    KsMessageBox(LoadString(Str::LineBelowOne), QMessageBox::Ok, this);
+    KsMessageBox(GridTexts::tr("Line number must be greater than 0"), QMessageBox::Ok, this);
     m_ui->line_1057->setFocus();
     m_ui->line_1057->selectAll();
 }

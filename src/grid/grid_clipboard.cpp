@@ -1,11 +1,10 @@
 #include "grid/grid_clipboard.h"
 
-#include "ks/fc/message_box.h"
-#include "document/document.h"
 #include "grid/cell_text.h"
 #include "grid/gen_grid.h"
-#include "pages/framework/page.h"
-#include "res/strings.h"
+#include "grid/grid_texts.h"
+#include "ks/fc/doc.h"
+#include "ks/fc/message_box.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
@@ -88,18 +87,19 @@ bool CGenGrid::CanCopy() const
     return selectionModel()->hasSelection() || currentIndex().isValid();
 }
 
-void CGenGrid::Copy() const
+void CopyCells(const CGenGrid& grid)
 {
-    if (!CanCopy())
+    if (!grid.CanCopy())
         return;
-    const QItemSelection selection = selectionModel()->selection();
-    const QItemSelectionRange range = selection.isEmpty() ? QItemSelectionRange(currentIndex()) : selection.front();
+    const QItemSelection selection = grid.selectionModel()->selection();
+    const QItemSelectionRange range =
+        selection.isEmpty() ? QItemSelectionRange(grid.currentIndex()) : selection.front();
     std::vector<QStringList> rows;
     rows.reserve(std::size_t(range.height()));
     for (int row = range.top(); row <= range.bottom(); ++row) {
         QStringList& cells = rows.emplace_back();
         for (int column = range.left(); column <= range.right(); ++column)
-            cells << EditText(m_model->Columns()[std::size_t(column)], m_model->Value(row, column));
+            cells << EditText(grid.Model()->Columns()[std::size_t(column)], grid.Model()->Value(row, column));
     }
     QGuiApplication::clipboard()->setText(WriteTable(rows));
 }
@@ -109,6 +109,37 @@ bool CGenGrid::CanPaste() const
     const QMimeData* content = QGuiApplication::clipboard()->mimeData();
     return content && content->hasText() && !content->text().isEmpty() && m_model->Rows() &&
            (currentIndex().isValid() || RowCount() == 0);
+}
+
+/// Why the cells cannot go to row `top` and column `left`; empty when they can.
+static QString PasteRefusal(const CGridModel& model, int top, int left, const std::vector<QStringList>& cells)
+{
+    const auto header = [&](int column) { return model.Columns()[std::size_t(column)].header(); };
+    const auto refused = [&](int row, int column, const QString& text, const QString& reason) {
+        return GridTexts::tr("Nothing was pasted. Line %1, column \"%2\" cannot take \"%3\":\n%4")
+            .arg(QString::number(row + 1), header(column), text, reason);
+    };
+    if (!model.Rows()->MayGrow() && top + int(cells.size()) > model.StoredRows())
+        return GridTexts::tr("Nothing was pasted. From line %1 on the table has only %2 lines.")
+            .arg(top + 1)
+            .arg(model.StoredRows() - top);
+    for (std::size_t r = 0; r < cells.size(); ++r) {
+        const int row = top + int(r), width = int(cells[r].size());
+        if (left + width > model.columnCount())
+            return GridTexts::tr("Nothing was pasted. The copied cells are %1 columns wide; from column \"%2\" on the "
+                                 "table has only %3.")
+                .arg(width)
+                .arg(header(left))
+                .arg(model.columnCount() - left);
+        for (int c = 0; c < width; ++c) {
+            const QString refusal = model.Refusal(row, left + c, cells[r][c], false);
+            if (!refusal.isEmpty())
+                return refused(row, left + c, cells[r][c], refusal);
+        }
+    }
+    if (const auto fault = model.Fault(top, left, cells))
+        return refused(top + int(fault->row), left, cells[fault->row].join(QStringLiteral("  ")), fault->text);
+    return {};
 }
 
 bool CGenGrid::Paste()
@@ -121,29 +152,15 @@ bool CGenGrid::Paste()
     auto cells = ReadTable(QGuiApplication::clipboard()->text());
     if (selected && cells.size() == 1 && cells.front().size() == 1) // one copied cell fills the selection
         cells.assign(std::size_t(selected->height()), QStringList(selected->width(), cells.front().front()));
-
-    const auto header = [this](int column) { return m_model->Columns()[std::size_t(column)].header(); };
-    const auto refuse = [this](const QString& message) {
-        KsMessageBox(message, QMessageBox::Ok, this);
+    if (const QString refusal = PasteRefusal(*m_model, top, left, cells); !refusal.isEmpty()) {
+        KsMessageBox(refusal, QMessageBox::Ok, this);
         return false;
-    };
-    for (std::size_t r = 0; r < cells.size(); ++r) {
-        const int row = top + int(r), width = int(cells[r].size());
-        if (left + width > ColumnCount())
-            return refuse(LoadString(Str::PasteTooWide).arg(width).arg(header(left)).arg(ColumnCount() - left));
-        for (int c = 0; c < width; ++c) {
-            const QString refusal = m_model->Refusal(row, left + c, cells[r][c]);
-            if (!refusal.isEmpty())
-                return refuse(LoadString(Str::PasteRefused)
-                                  .arg(QString::number(row + 1), header(left + c), cells[r][c], refusal));
-        }
     }
     StoreEditedLine();
-    m_model->Paste(top, left, cells, LoadString(Str::UndoPaste));
-    if (m_page)
-        m_page->GetDocument()->Say(LoadCounted(CountOf(cells), Str::CellPasted, Str::CellsPasted));
-    m_modified = true; // the view tells the project when locations came in
-    m_modifiedColumn = left + 1;
+    m_model->Paste(top, left, cells, GridTexts::tr("Paste"));
+    m_model->Document()->Say(
+        GridTexts::Counted(CountOf(cells), GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted")));
+    m_modified = true; // the host tells the project when locations came in
     StoreEditedLine();
     Reload();
     return true;

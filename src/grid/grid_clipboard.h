@@ -4,7 +4,12 @@
 #include <QStringList>
 #include <vector>
 
+class CGenGrid;
+
 /// A text with tabs, line ends or quotes is put in quotes, its quotes doubled. No line end behind the last line.
 QString WriteTable(const std::vector<QStringList>& rows);
 /// Takes LF, CRLF and CR as line ends; one line end behind the last line is no further line.
 std::vector<QStringList> ReadTable(const QString& text);
+
+/// Puts the selected cells of a grid, or the current one, on the clipboard.
+void CopyCells(const CGenGrid& grid);

@@ -2,11 +2,12 @@
 
 #include "grid/digits_mark.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_host.h"
 #include "grid/grid_keys.h"
 #include "grid/grid_model.h"
+#include "grid/grid_texts.h"
 #include "grid/name_offers.h"
 #include "grid/typing.h"
-#include "res/strings.h"
 
 #include <QApplication>
 #include <QKeyEvent>
@@ -114,7 +115,8 @@ CGridDelegate::CGridDelegate(CGenGrid* grid) : QStyledItemDelegate(grid), m_grid
 QWidget* CGridDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&, const QModelIndex& index) const
 {
     const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
-    const QStringList names = index.column() + 1 == m_grid->BranchNameColumn() ? m_grid->BranchNames() : QStringList();
+    const bool offersNames = index.column() + 1 == m_grid->BranchNameColumn() && m_grid->Host();
+    const QStringList names = offersNames ? m_grid->Host()->BranchNames() : QStringList();
     QWidget* editor = names.isEmpty() ? MakeEditor(column, parent) : MakeBranchList(names, parent, ViewAround(m_grid));
     editor->setObjectName(FindControl(column.control).editorName);
     editor->setAccessibleName(column.header());
@@ -266,9 +268,8 @@ bool CGridDelegate::Commit()
     }
     const QScopedValueRollback telling(m_telling, true);
     const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(m_index.column())];
-    const QString place = LoadString(Str::CellPlace).arg(column.header()).arg(m_index.row() + 1);
-    const QString unit = column.unitText ? column.unitText() : column.style.UnitSymbol();
-    TellRefusal(*editor, refusal, RefusalDetails(place, TextOf(editor), {}, unit));
+    const QString place = GridTexts::tr("%1, line %2").arg(column.header()).arg(m_index.row() + 1);
+    TellRefusal(*editor, refusal, RefusalDetails(place, TextOf(editor), column.Allowed(), column.UnitSymbol()));
     return false;
 }
 
@@ -281,7 +282,7 @@ void CGridDelegate::LostFocus(const QEvent* event)
     // The editor stays while another window or its own pop-up is in front, and a click into the grid is the grid's to
     // judge: it commits before the current cell moves.
     const bool inGrid = focus && (focus == m_grid || m_grid->isAncestorOf(focus));
-    if (reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || inGrid || !m_grid->HasPage() ||
+    if (reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || inGrid || !m_grid->Host() ||
         m_telling || !m_editor || !m_index.isValid())
         return;
     if (Refusal().isEmpty()) {

@@ -1,7 +1,10 @@
 #include "grid/grid_keys.h"
 
+#include "grid/grid_texts.h"
+
 #include <QKeyEvent>
 #include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -11,28 +14,51 @@ constexpr Qt::KeyboardModifiers All = CtrlShift | Qt::AltModifier | Qt::MetaModi
 
 // Insert, Delete, F3 and F7 never reach the table widget, whatever is held with them.
 constexpr GridKey Keys[] = {
-    {Qt::Key_Tab, None, All, GridAction::NextCell, true, Str::KeyNextCell},
-    {Qt::Key_Return, None, All, GridAction::NextCell, true, Str::KeyNextCell},
-    {Qt::Key_Enter, None, All, GridAction::NextCell, true, Str::KeyNextCell},
-    {Qt::Key_Backtab, None, Ctrl, GridAction::PreviousCell, true, Str::KeyPreviousCell},
-    {Qt::Key_Tab, Shift, All, GridAction::PreviousCell, true, Str::KeyPreviousCell},
-    {Qt::Key_Return, Shift, All, GridAction::PreviousCell, true, Str::KeyPreviousCell},
-    {Qt::Key_Enter, Shift, All, GridAction::PreviousCell, true, Str::KeyPreviousCell},
-    {Qt::Key_Insert, None, CtrlShift, GridAction::AppendLine, true, Str::KeyAppendLine},
-    {Qt::Key_Insert, Ctrl, Ctrl, GridAction::CopyAndAppend, false, Str::KeyCopyAppend},
-    {Qt::Key_Insert, Shift, CtrlShift, GridAction::PasteAndAppend, false, Str::KeyPasteAppend},
-    {Qt::Key_Delete, None, None, GridAction::DeleteLine, false, Str::KeyDeleteLine},
-    {Qt::Key_C, Ctrl, All, GridAction::Copy, false, Str::KeyCopy},
-    {Qt::Key_V, Ctrl, All, GridAction::Paste, false, Str::KeyPaste},
-    {Qt::Key_Space, Shift, All, GridAction::SelectLine, false, Str::KeySelectLine},
-    {Qt::Key_F3, None, None, GridAction::SearchAgain, true, Str::KeySearchAgain},
-    {Qt::Key_F7, None, None, GridAction::Search, true, Str::KeySearch},
-    {Qt::Key_Z, Ctrl, All, GridAction::Undo, false, Str::KeyUndo},
-    {Qt::Key_Y, Ctrl, All, GridAction::Redo, false, Str::KeyRedo},
-    {Qt::Key_Z, CtrlShift, All, GridAction::Redo, false, Str::KeyRedo},
+    {Qt::Key_Tab, None, All, GridAction::NextCell, true},
+    {Qt::Key_Return, None, All, GridAction::NextCell, true},
+    {Qt::Key_Enter, None, All, GridAction::NextCell, true},
+    {Qt::Key_Backtab, None, Ctrl, GridAction::PreviousCell, true},
+    {Qt::Key_Tab, Shift, All, GridAction::PreviousCell, true},
+    {Qt::Key_Return, Shift, All, GridAction::PreviousCell, true},
+    {Qt::Key_Enter, Shift, All, GridAction::PreviousCell, true},
+    {Qt::Key_Insert, None, CtrlShift, GridAction::AppendLine, true},
+    {Qt::Key_Insert, Ctrl, Ctrl, GridAction::CopyAndAppend, false},
+    {Qt::Key_Insert, Shift, CtrlShift, GridAction::PasteAndAppend, false},
+    {Qt::Key_Delete, None, None, GridAction::DeleteLine, false},
+    {Qt::Key_C, Ctrl, All, GridAction::Copy, false},
+    {Qt::Key_V, Ctrl, All, GridAction::Paste, false},
+    {Qt::Key_Space, Shift, All, GridAction::SelectLine, false},
+    {Qt::Key_F3, None, None, GridAction::SearchAgain, true},
+    {Qt::Key_F7, None, None, GridAction::Search, true},
+    {Qt::Key_Z, Ctrl, All, GridAction::Undo, false},
+    {Qt::Key_Y, Ctrl, All, GridAction::Redo, false},
+    {Qt::Key_Z, CtrlShift, All, GridAction::Redo, false},
 };
 
+// What the actions do, in their order.
+constexpr const char* Descriptions[] = {
+    QT_TRANSLATE_NOOP("GridTexts", "Next cell; behind the last one a new line"),
+    QT_TRANSLATE_NOOP("GridTexts", "Previous cell"),
+    QT_TRANSLATE_NOOP("GridTexts", "Insert line"),
+    QT_TRANSLATE_NOOP("GridTexts", "Copy, then insert line"),
+    QT_TRANSLATE_NOOP("GridTexts", "Paste, then insert line"),
+    QT_TRANSLATE_NOOP("GridTexts", "Delete selected lines"),
+    QT_TRANSLATE_NOOP("GridTexts", "Select the line"),
+    QT_TRANSLATE_NOOP("GridTexts", "Copy"),
+    QT_TRANSLATE_NOOP("GridTexts", "Paste"),
+    QT_TRANSLATE_NOOP("GridTexts", "Search again"),
+    QT_TRANSLATE_NOOP("GridTexts", "Search"),
+    QT_TRANSLATE_NOOP("GridTexts", "Undo"),
+    QT_TRANSLATE_NOOP("GridTexts", "Redo"),
+};
+static_assert(std::size(Descriptions) == std::size_t(GridAction::Redo) + 1);
+
 } // namespace
+
+QString GridKey::Text() const
+{
+    return GridTexts::tr(Descriptions[std::size_t(action)]);
+}
 
 std::span<const GridKey> GridKeys()
 {

@@ -1,9 +1,7 @@
 // The keys of the grid: one row a key.
 #pragma once
 
-#include "res/strings.h"
-
-#include <Qt>
+#include <QString>
 #include <span>
 
 class QKeyEvent;
@@ -32,7 +30,9 @@ struct GridKey
     Qt::KeyboardModifiers lookedAt;
     GridAction action;
     bool whileEditing; // also when a cell editor has the focus
-    Str description;
+
+    /// What it does, in the user's language.
+    QString Text() const;
 };
 
 std::span<const GridKey> GridKeys();

@@ -1,9 +1,8 @@
 #include "grid/grid_model.h"
 
-#include "document/document.h"
 #include "grid/cell_text.h"
-#include "pages/framework/commands.h"
-#include "res/strings.h"
+#include "grid/grid_texts.h"
+#include "grid/row_commands.h"
 
 #include <QGuiApplication>
 #include <QPalette>
@@ -47,7 +46,7 @@ void CGridModel::RemoveColumnsFrom(int count)
     endRemoveColumns();
 }
 
-void CGridModel::SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows)
+void CGridModel::SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows)
 {
     beginResetModel();
     m_document = &document;
@@ -103,7 +102,7 @@ void* CGridModel::RowObject(int row) const
     if (!IsOffered(row))
         return m_rows->At(std::size_t(row));
     if (!m_offered)
-        m_offered = NewLines(1);
+        m_offered = NewLines(1, StoredRows());
     return m_offered->At(0);
 }
 
@@ -207,16 +206,43 @@ Qt::ItemFlags CGridModel::flags(const QModelIndex& index) const
     return m_columns[std::size_t(index.column())].ActsAtOnce() ? flags : flags | Qt::ItemIsEditable;
 }
 
-QString CGridModel::Refusal(int row, int column, const QString& text) const
+QString CGridModel::Refusal(int row, int column, const QString& text, bool isAlone) const
 {
     const ColumnSpec& spec = m_columns[std::size_t(column)];
     if (IsRow(row)) {
         if (text == EditText(spec, Value(row, column)))
             return {}; // a stored number may be one that nobody could type
         if (IsLocked(row, column))
-            return LoadString(Str::CellLocked);
+            return GridTexts::tr("The cell is locked.");
     }
-    return ReadCell(spec, text).refusal;
+    const QString refusal = ReadCell(spec, text).refusal;
+    if (!refusal.isEmpty() || !isAlone)
+        return refusal;
+    const auto fault = Fault(row, column, {{text}});
+    return fault ? fault->text : QString();
+}
+
+std::optional<IRowSource::Fault> CGridModel::Fault(int row, int column, const std::vector<QStringList>& texts) const
+{
+    if (!m_rows || !m_rows->HasRules())
+        return std::nullopt;
+    const int last = StoredRows(), added = std::max(0, row + int(texts.size()) - last);
+    const auto rows = m_rows->NewRows(texts.size());
+    const auto lines = NewLines(added, last);
+    for (int r = 0; r < int(texts.size()); ++r) {
+        void* object = row + r < last ? rows->At(std::size_t(r)) : lines->At(std::size_t(row + r - last));
+        if (row + r < last)
+            CopyRow(row + r, object);
+        for (int c = 0; c < texts[std::size_t(r)].size(); ++c) {
+            const ColumnSpec& spec = m_columns[std::size_t(column + c)];
+            const CellValue value = ReadCell(spec, texts[std::size_t(r)][c]).value;
+            spec.access->set(object, Resolved(column + c, value, BlankRule::Zero));
+        }
+        for (const ColumnSpec& each : m_columns) // a new line is made in one piece
+            if (row + r >= last)
+                each.access->set(rows->At(std::size_t(r)), each.access->get(object));
+    }
+    return m_rows->FindFault(std::size_t(row), *rows);
 }
 
 bool CGridModel::setData(const QModelIndex& index, const QVariant& value, int role)
@@ -249,6 +275,40 @@ void CGridModel::CopyRow(int row, void* target) const
         m_columns[std::size_t(column)].access->set(target, Resolved(column, Value(row, column), BlankRule::Zero));
 }
 
+/// Pushes what is one step of the user's; then the rows stand in their order. Returns where the line at `row` is.
+template <typename Push>
+int CGridModel::Change(const QString& step, int row, Push push)
+{
+    QUndoStack& undo = m_document->UndoStack();
+    undo.beginMacro(step);
+    push(undo);
+    row = Arrange(row);
+    undo.endMacro();
+    return row;
+}
+
+/// The current cell and the selection go with their lines.
+int CGridModel::Arrange(int row)
+{
+    const auto order = m_rows->Order();
+    if (order.empty())
+        return row;
+    Sync();
+    const QScopedValueRollback syncing(m_syncing, true);
+    emit layoutAboutToBeChanged({}, VerticalSortHint);
+    m_document->UndoStack().push(new CArrangeLines(*m_document, m_rows, order, std::size_t(row)));
+    const auto placeOf = [&order](int was) {
+        return int(std::find(order.begin(), order.end(), std::size_t(was)) - order.begin());
+    };
+    const QModelIndexList before = persistentIndexList();
+    QModelIndexList after;
+    for (const QModelIndex& cell : before)
+        after << index(placeOf(cell.row()), cell.column());
+    changePersistentIndexList(before, after);
+    emit layoutChanged({}, VerticalSortHint);
+    return placeOf(row);
+}
+
 bool CGridModel::Store(BlankRule rule)
 {
     if (m_pending.empty())
@@ -278,7 +338,7 @@ bool CGridModel::StoreOffered(const Overlay& typed, BlankRule rule)
     if (!changed)
         return false;
     m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, std::size_t(StoredRows()), std::move(m_offered),
-                                                  LoadString(Str::UndoEditCells)));
+                                                  GridTexts::tr("Change of cells")));
     Sync();
     return true;
 }
@@ -302,7 +362,13 @@ bool CGridModel::StoreRows(const Overlay& overlay, BlankRule rule)
     }
     if (changes.empty())
         return false;
-    m_document->UndoStack().push(new CSetCells(*m_document, m_rows, std::move(changes), place));
+    const auto set = [&](QUndoStack& undo) {
+        undo.push(new CSetCells(*m_document, m_rows, std::move(changes), place));
+    };
+    if (m_rows->IsOrdered())
+        Change(GridTexts::tr("Change of cells"), int(place), set);
+    else
+        set(m_document->UndoStack());
     return true;
 }
 
@@ -329,18 +395,19 @@ void CGridModel::Paste(int row, int column, const std::vector<QStringList>& text
     }
     if (changes.empty() && !added)
         return;
-    m_document->UndoStack().beginMacro(step);
-    if (!changes.empty())
-        m_document->UndoStack().push(new CSetCells(*m_document, m_rows, std::move(changes), std::size_t(row)));
-    if (added)
-        m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, std::size_t(last), std::move(added)));
-    m_document->UndoStack().endMacro();
+    Change(step, row, [&](QUndoStack& undo) {
+        if (!changes.empty())
+            undo.push(new CSetCells(*m_document, m_rows, std::move(changes), std::size_t(row)));
+        if (added)
+            undo.push(new CInsertLines(*m_document, m_rows, std::size_t(last), std::move(added)));
+    });
     Sync();
 }
 
-std::unique_ptr<IRowBlock> CGridModel::NewLines(int count) const
+std::unique_ptr<IRowBlock> CGridModel::NewLines(int count, int at) const
 {
     auto lines = m_rows->NewRows(std::size_t(count));
+    m_rows->Fit(*lines, std::size_t(at));
     for (const ColumnSpec& column : m_columns) {
         const CellValue value = column.NewLineValue();
         for (std::size_t i = 0; i < lines->Count() && !std::holds_alternative<std::monostate>(value); ++i)
@@ -349,15 +416,23 @@ std::unique_ptr<IRowBlock> CGridModel::NewLines(int count) const
     return lines;
 }
 
-void CGridModel::InsertRows(int row, int count)
+int CGridModel::InsertRow(int row)
 {
     if (!m_rows)
-        return;
+        return row;
     Store();
-    const auto at = std::size_t(std::max(row, FixedRows()));
-    m_document->UndoStack().push(new CInsertLines(*m_document, m_rows, at, NewLines(count + OffersRow())));
-    m_document->Say(LoadCounted(std::size_t(count), Str::LineInserted, Str::LinesInserted));
+    const int at = std::min(std::max(row, FixedRows()), StoredRows());
+    auto lines = NewLines(1 + OffersRow(), at);
+    const auto insert = [&](QUndoStack& undo) {
+        undo.push(new CInsertLines(*m_document, m_rows, std::size_t(at), std::move(lines)));
+    };
+    if (m_rows->IsOrdered())
+        row = Change(GridTexts::tr("Insertion of lines"), at, insert);
+    else
+        insert(m_document->UndoStack());
+    m_document->Say(GridTexts::tr("Line inserted"));
     Sync();
+    return row;
 }
 
 void CGridModel::RemoveRows(int row, int count)
@@ -367,6 +442,7 @@ void CGridModel::RemoveRows(int row, int count)
     if (count <= 0)
         return;
     m_document->UndoStack().push(new CDeleteLines(*m_document, m_rows, std::size_t(row), std::size_t(count)));
-    m_document->Say(LoadCounted(std::size_t(count), Str::LineDeleted, Str::LinesDeleted));
+    m_document->Say(GridTexts::Counted(std::size_t(count), GridTexts::tr("Line deleted"),
+                                       GridTexts::tr("%1 lines deleted")));
     Sync();
 }

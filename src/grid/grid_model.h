@@ -13,7 +13,7 @@
 #include <map>
 #include <vector>
 
-class CKavo0_hdDoc;
+class CKsDoc;
 
 /// What an emptied value cell is stored as.
 enum class BlankRule
@@ -34,8 +34,9 @@ public:
     const std::vector<ColumnSpec>& Columns() const { return m_columns; }
     /// Where the rows are (null while there are none); the document keeps the undo steps. Both outlive the model. What
     /// was typed and not stored is dropped.
-    void SetSource(CKavo0_hdDoc& document, std::shared_ptr<IRowSource> rows);
+    void SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows);
     const std::shared_ptr<IRowSource>& Rows() const { return m_rows; }
+    CKsDoc* Document() const { return m_document; }
 
     /// Shows the source as it is now. Costs the same for any number of rows as long as none came, went or moved.
     void Sync();
@@ -54,8 +55,11 @@ public:
 
     /// What the cell holds, typed or stored.
     CellValue Value(int row, int column) const;
-    /// Why the cell would not take the text; empty when it would.
-    QString Refusal(int row, int column, const QString& text) const;
+    /// Why the cell would not take the text; empty when it would. What the other rows have to say is asked as well when
+    /// the text goes into this cell alone, and with Fault when it is one of several.
+    QString Refusal(int row, int column, const QString& text, bool isAlone = true) const;
+    /// Why the rows from `row` on could not take these texts from `column` on; see IRowSource::FindFault.
+    std::optional<IRowSource::Fault> Fault(int row, int column, const std::vector<QStringList>& texts) const;
     bool IsLocked(int row, int column) const;
     /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
     bool HidesDigits(int row, int column) const;
@@ -73,10 +77,11 @@ public:
     /// text `step`. Every text must have passed Refusal.
     void Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step);
 
-    /// New lines with the columns' fill values, not in the source.
-    std::unique_ptr<IRowBlock> NewLines(int count) const;
-    /// New lines before `row`, with the columns' fill values: an undo step. The offered row becomes a line before them.
-    void InsertRows(int row, int count = 1);
+    /// New lines with the columns' fill values, not in the source; they fit at its end.
+    std::unique_ptr<IRowBlock> NewLines(int count) const { return NewLines(count, StoredRows()); }
+    /// A new line before `row`, with the columns' fill values: an undo step. The offered row becomes a line before it.
+    /// Returns the row where it went.
+    int InsertRow(int row);
     /// Rows at the top that are no lines of the table.
     int FixedRows() const { return m_rows ? int(m_rows->FixedRows()) : 0; }
     /// An undo step; the offered row stays. No fixed row is among the rows.
@@ -102,13 +107,17 @@ private:
     int ShownRows() const { return StoredRows() + OffersRow(); }
     bool IsRow(int row) const { return row >= 0 && row < ShownRows(); }
     void* RowObject(int row) const;
+    std::unique_ptr<IRowBlock> NewLines(int count, int at) const;
+    template <typename Push>
+    int Change(const QString& step, int row, Push push);
+    int Arrange(int row);
     RowKey KeyOf(int row) const;
     bool IsGone(const CellKey& cell, std::size_t row) const;
     bool StoreOffered(const Overlay& typed, BlankRule rule);
     bool StoreRows(const Overlay& overlay, BlankRule rule);
 
     std::vector<ColumnSpec> m_columns;
-    CKavo0_hdDoc* m_document = nullptr;
+    CKsDoc* m_document = nullptr;
     std::shared_ptr<IRowSource> m_rows;
     int m_rowCount = 0; // as the views know it
     std::uint64_t m_revision = 0;

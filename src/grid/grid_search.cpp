@@ -1,25 +1,18 @@
-// Searching lines by branch name and chainage.
-#include "data/river_pos.h"
+#include "grid/grid_search.h"
+
+#include "base/not_given.h"
 #include "grid/cell_text.h"
 #include "grid/gen_grid.h"
+#include "grid/goto_dlg.h"
+#include "grid/grid_texts.h"
 #include "grid/number_syntax.h"
+#include "grid/search_dlg.h"
+#include "ks/fc/message_box.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace {
-
-enum ChainageCriterion
-{
-    Below = 0,
-    Equal = 1,
-    Above = 2,
-    NotUsed = 3
-};
-enum NameCriterion
-{
-    Partial = 0,
-    Full = 1
-};
 
 /// A chainage as the column's text says it; an empty cell reads as 0.
 double AsShown(const ColumnSpec& column, double chainage)
@@ -37,49 +30,117 @@ std::string InCapitals(const std::string& name)
     return plain ? name : QString::fromStdString(name).toUpper().toStdString();
 }
 
-bool NamePasses(const std::string& name, const std::string& wanted, int criterion)
+bool NamePasses(const std::string& name, const std::string& wanted, NameMatch match)
 {
-    if (wanted.empty())
-        return true;
-    return criterion == Partial ? name.starts_with(wanted) : criterion != Full || name == wanted;
+    return match == NameMatch::Beginning || wanted.empty() ? name.starts_with(wanted) : name == wanted;
 }
 
-bool ChainagePasses(double shown, double wanted, int criterion)
+bool ChainagePasses(double shown, double wanted, ChainageMatch match)
 {
-    switch (criterion) {
-    case Below:
+    switch (match) {
+    case ChainageMatch::Less:
         return shown < wanted;
-    case Equal:
+    case ChainageMatch::Equal:
         return shown == wanted;
-    case Above:
+    case ChainageMatch::Greater:
         return shown > wanted;
-    default:
-        return criterion == NotUsed;
+    case ChainageMatch::Any:
+        break;
     }
+    return true;
 }
 
 } // namespace
 
-bool CGenGrid::SearchRows(int& row, const QString& name, double chainage, int chainageCriterion, int nameCriterion)
+bool SearchRows(CGenGrid& grid, int& row, const LineQuery& query)
 {
     constexpr int NameColumn = 0, ChainageColumn = 1;
-    const std::string wantedName = name.toUpper().toStdString(); // as the column stores them
-    const ColumnSpec& chainageColumn = m_model->Columns()[ChainageColumn];
-    const double wanted = AsShown(chainageColumn, chainage);
-    for (row = std::max(row, m_model->FixedRows() + 1); row <= RowCount();) {
+    const CGridModel& model = *grid.Model();
+    const std::string wantedName = query.name.toUpper().toStdString(); // as the column stores them
+    const ColumnSpec& chainageColumn = model.Columns()[ChainageColumn];
+    const double wanted = AsShown(chainageColumn, query.chainage);
+    for (row = std::max(row, model.FixedRows() + 1); row <= grid.RowCount();) {
         const int line = row++ - 1;
-        if (!NamePasses(InCapitals(std::get<std::string>(m_model->Value(line, NameColumn))), wantedName, nameCriterion))
+        const std::string name = InCapitals(std::get<std::string>(model.Value(line, NameColumn)));
+        if (!NamePasses(name, wantedName, query.nameMatch))
             continue;
-        if (chainageCriterion != NotUsed) {
-            const CellValue value = m_model->Value(line, ChainageColumn);
+        if (query.chainageMatch != ChainageMatch::Any) {
+            const CellValue value = model.Value(line, ChainageColumn);
             const auto* number = std::get_if<double>(&value);
-            if (!ChainagePasses(AsShown(chainageColumn, number ? *number : NotGiven), wanted, chainageCriterion))
+            if (!ChainagePasses(AsShown(chainageColumn, number ? *number : NotGiven), wanted, query.chainageMatch))
                 continue;
         }
-        clearSelection();
-        GotoLine(line + 1);
+        grid.clearSelection();
+        grid.GotoLine(line + 1);
         return true;
     }
     row = 0;
     return false;
+}
+
+std::vector<CKsMenuCommand> CGridSearch::MenuCommands()
+{
+    return {
+        {Command::GotoLine, GridTexts::tr("&Go to Line..."), QKeySequence(Qt::CTRL | Qt::Key_G)},
+        {},
+        {Command::Search, GridTexts::tr("&Search..."), QKeySequence(Qt::Key_F7)},
+        {Command::SearchAgain, GridTexts::tr("Search &Again"), QKeySequence(Qt::Key_F3)},
+    };
+}
+
+bool CGridSearch::Knows(int command)
+{
+    return command == Command::GotoLine || command == Command::Search || command == Command::SearchAgain;
+}
+
+bool CGridSearch::CanRun(int command, const CGenGrid* grid) const
+{
+    return Knows(command) && grid && grid->isEnabled() && (command != Command::SearchAgain || m_asked);
+}
+
+void CGridSearch::Run(int command, CGenGrid& grid)
+{
+    if (command == Command::GotoLine)
+        Goto(grid);
+    else if (command == Command::Search)
+        Ask(grid);
+    else
+        Next(grid);
+}
+
+void CGridSearch::Goto(CGenGrid& grid)
+{
+    CGotoDlg dialog(&grid);
+    if (dialog.exec() != QDialog::Accepted)
+        return;
+    grid.GotoLine(dialog.Line());
+    grid.setFocus(Qt::OtherFocusReason);
+}
+
+void CGridSearch::Ask(CGenGrid& grid)
+{
+    CSearchDlg dialog(m_query, &grid);
+    if (dialog.exec() != QDialog::Accepted)
+        return;
+    m_query = dialog.Query();
+    m_asked = true;
+    m_grid = nullptr; // from the top
+    Next(grid);
+}
+
+void CGridSearch::Next(CGenGrid& grid)
+{
+    if (std::exchange(m_grid, &grid) != &grid) {
+        m_row = 0;
+        m_found = false;
+    }
+    if (SearchRows(grid, m_row, m_query)) {
+        m_found = true;
+        grid.setFocus(Qt::OtherFocusReason); // the next key is meant for the line found
+        return;
+    }
+    const bool hadFound = std::exchange(m_found, false);
+    KsMessageBox(hadFound ? GridTexts::tr("The last occurence of searched item already found")
+                          : GridTexts::tr("Searched item not found"),
+                 QMessageBox::Ok, &grid);
 }

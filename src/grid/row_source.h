@@ -2,11 +2,12 @@
 // of the document only, so that undo commands may hold them for as long as the document lives.
 #pragma once
 
+#include <QString>
 #include <cstddef>
 #include <cstdint>
 #include <memory>
-
-class CGenList;
+#include <optional>
+#include <vector>
 
 /// Rows that are out of their source: new ones, or removed ones that a command keeps. Owns them.
 class IRowBlock
@@ -48,11 +49,30 @@ public:
     bool IsEmpty() const { return Count() == FixedRows(); }
     /// Whether a grid may show the source without rows; otherwise it offers one to type into.
     virtual bool MayBeEmpty() const { return false; }
+    /// Whether a grid may add lines.
+    virtual bool MayGrow() const { return true; }
+
+    // Rows that depend on each other.
+    /// Makes new rows fit between those at `at` - 1 and `at`, where they will be put.
+    virtual void Fit(IRowBlock& /*rows*/, std::size_t /*at*/) const {}
+    /// Why the rows from `first` on may not hold what `rows` hold; those behind the last one would be new.
+    struct Fault
+    {
+        std::size_t row = 0; // among `rows`
+        QString text;        // for the user
+    };
+    virtual std::optional<Fault> FindFault(std::size_t /*first*/, IRowBlock& /*rows*/) const { return std::nullopt; }
+    /// Whether that has to be asked before cells change.
+    virtual bool HasRules() const { return false; }
+    /// Where rows stand in an order of their own: for each place the row that belongs there; empty when all do.
+    virtual std::vector<std::size_t> Order() const { return {}; }
+    virtual bool IsOrdered() const { return false; }
+    virtual void Rearrange(const std::vector<std::size_t>& /*order*/) {}
 
     /// The list or table of the document that the rows are kept in.
     virtual const void* Data() const = 0;
     /// That list, or the list that the table belongs to; null for neither.
-    virtual CGenList* List() const { return nullptr; }
+    virtual const void* List() const { return nullptr; }
     /// Where the list shows the row: a row kept inside a record is shown at the record.
     virtual std::size_t ListRow(std::size_t row) const { return row; }
 };

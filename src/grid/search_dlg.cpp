@@ -19,21 +19,17 @@ void Choose(QButtonGroup* group, std::initializer_list<QRadioButton*> buttons, i
 
 } // namespace
 
-CSearchDlg::CSearchDlg(const QString& riverName, double chainage, int chainageCriterion, int nameCriterion,
-                       QWidget* parent)
+CSearchDlg::CSearchDlg(const LineQuery& query, QWidget* parent)
     : QDialog(parent),
       m_ui(std::make_unique<Ui::CSearchDlg>()),
-      m_riverName(riverName),
-      m_chainageCriterion(chainageCriterion),
-      m_nameCriterion(nameCriterion),
-      m_chainage(chainage),
-      m_shownChainage(m_style.UnitConvertFromBase(chainage, 1))
+      m_query(query),
+      m_shownChainage(m_style.UnitConvertFromBase(query.chainage, 1))
 {
     m_ui->setupUi(this);
-    Choose(m_ui->nameCriterion, {m_ui->partialMatch_1059, m_ui->fullMatch_1060}, nameCriterion);
+    Choose(m_ui->nameCriterion, {m_ui->partialMatch_1059, m_ui->fullMatch_1060}, int(query.nameMatch));
     Choose(m_ui->chainageCriterion, {m_ui->less_1062, m_ui->equal_1063, m_ui->greater_1064, m_ui->notUse_1067},
-           chainageCriterion);
-    m_ui->riverName_1058->setText(riverName);
+           int(query.chainageMatch));
+    m_ui->riverName_1058->setText(query.name);
     DDX_KSedit(false, *m_ui->chainage_1061, m_shownChainage, m_style);
     m_shownText = m_ui->chainage_1061->text();
     m_ui->chainageUnit->setText(m_style.UnitSymbol());
@@ -47,9 +43,9 @@ void CSearchDlg::accept()
     if (!DDX_KSedit(true, *m_ui->chainage_1061, m_shownChainage, m_style))
         return;
     if (m_ui->chainage_1061->text() != m_shownText) // else it stays what it was to the last bit
-        m_chainage = m_style.UnitConvertFromBase(m_shownChainage, 0);
-    m_riverName = m_ui->riverName_1058->text();
-    m_chainageCriterion = m_ui->chainageCriterion->checkedId();
-    m_nameCriterion = m_ui->nameCriterion->checkedId();
+        m_query.chainage = m_style.UnitConvertFromBase(m_shownChainage, 0);
+    m_query.name = m_ui->riverName_1058->text();
+    m_query.chainageMatch = ChainageMatch(m_ui->chainageCriterion->checkedId());
+    m_query.nameMatch = NameMatch(m_ui->nameCriterion->checkedId());
     QDialog::accept();
 }

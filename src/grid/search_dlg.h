@@ -1,6 +1,7 @@
 // "Search": what lines to look for.
 #pragma once
 
+#include "grid/grid_search.h"
 #include "ks/units/edit_style.h"
 
 #include <QDialog>
@@ -14,25 +15,17 @@ class CSearchDlg : public QDialog
 {
     Q_OBJECT
 public:
-    /// `chainage` in metres. Chainage criterion: 0 less, 1 equal, 2 greater, 3 not used. Name criterion: 0 partial
-    /// match (the name begins with the text), 1 full match.
-    CSearchDlg(const QString& riverName, double chainage, int chainageCriterion, int nameCriterion,
-               QWidget* parent = nullptr);
+    explicit CSearchDlg(const LineQuery& query, QWidget* parent = nullptr);
     ~CSearchDlg() override;
 
-    // After OK.
-    const QString& RiverName() const { return m_riverName; }
-    double Chainage() const { return m_chainage; }
-    int ChainageCriterion() const { return m_chainageCriterion; }
-    int NameCriterion() const { return m_nameCriterion; }
+    /// What was asked for, after OK.
+    const LineQuery& Query() const { return m_query; }
     void accept() override;
 
 private:
     std::unique_ptr<Ui::CSearchDlg> m_ui;
     CKsEditStyle m_style{UnitGroup::Chainage, "%.10lg"};
-    QString m_riverName;
-    int m_chainageCriterion, m_nameCriterion;
-    double m_chainage;      // metres
+    LineQuery m_query;
     double m_shownChainage; // in the user's unit
     QString m_shownText;
 };

@@ -2,7 +2,7 @@
 
 #include "ks/fc/message_box.h"
 #include "grid/column_spec.h"
-#include "res/strings.h"
+#include "grid/grid_texts.h"
 
 #include <QAccessible>
 #include <QKeyEvent>
@@ -59,9 +59,9 @@ void TellRefusal(QWidget& widget, const QString& message, const QString& details
 
 QString RefusalDetails(const QString& place, const QString& typed, const QString& allowed, const QString& unit)
 {
-    QStringList lines{LoadString(Str::TypedThere).arg(place, typed)};
+    QStringList lines{GridTexts::tr("%1: \"%2\" was typed.").arg(place, typed)};
     if (!allowed.isEmpty())
-        lines << LoadString(Str::Allowed).arg(allowed);
+        lines << GridTexts::tr("Allowed: %1").arg(allowed);
     if (!unit.isEmpty())
         lines << UnitToolTip(unit);
     return lines.join(u'\n');
@@ -70,9 +70,9 @@ QString RefusalDetails(const QString& place, const QString& typed, const QString
 QString AllowedRange(const QString& minimum, const QString& maximum)
 {
     if (!minimum.isEmpty() && !maximum.isEmpty())
-        return LoadString(Str::RangeFromTo).arg(minimum, maximum);
-    return !minimum.isEmpty()   ? LoadString(Str::RangeFrom).arg(minimum)
-           : !maximum.isEmpty() ? LoadString(Str::RangeTo).arg(maximum)
+        return GridTexts::tr("%1 to %2").arg(minimum, maximum);
+    return !minimum.isEmpty()   ? GridTexts::tr("at least %1").arg(minimum)
+           : !maximum.isEmpty() ? GridTexts::tr("at most %1").arg(maximum)
                                 : QString();
 }
 

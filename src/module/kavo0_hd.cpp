@@ -2,6 +2,7 @@
 
 #include "ks/language/language.h"
 #include "document/document.h"
+#include "grid/grid_texts.h"
 #include "module/frame.h"
 #include "module/view.h"
 #include "res/strings.h"
@@ -32,6 +33,7 @@ void LoadModuleResources()
 {
     InitResources();
     KsLangLoadResDll("Kavo0_hd", &g_languageModule, 0);
+    GridTexts::Load();
     KsMessage::ProjectMapChanged(); // registered from the start, so that its number is known to everybody
 }
 

@@ -1,22 +1,18 @@
 #include "module/view.h"
 
 #include "ks/fc/after_paint.h"
-#include "ks/fc/message_box.h"
-#include "ks/fc/status.h"
-#include "ks/language/language.h"
 #include "module/file_bar.h"
 #include "module/page_table.h"
 #include "module/sheet.h"
 #include "grid/gen_grid.h"
-#include "grid/goto_dlg.h"
 #include "pages/framework/page.h"
-#include "grid/search_dlg.h"
 #include "res/strings.h"
 
 #include <QTimer>
 #include <QUndoStack>
 #include <QVBoxLayout>
 #include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -24,7 +20,7 @@ constexpr int LinesMenuPosition = 2; // the third menu of the main frame
 
 } // namespace
 
-CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CView(parent)
+CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CKsProjectView(parent)
 {
     setObjectName("hdView");
     setWindowTitle(LoadString(Str::SheetCaption));
@@ -32,10 +28,6 @@ CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CView(parent)
 
 CKavo0_hdView::~CKavo0_hdView()
 {
-    if (auto* document = GetDocument()) {
-        document->LeaveProject(this, document->GetPathName());
-        document->DataChange(document->GetPathName());
-    }
     delete m_sheet; // while this is still a host
 }
 
@@ -49,14 +41,8 @@ CGenPropertyPage* CKavo0_hdView::ActivePage() const
     return m_sheet ? m_sheet->ActivePage() : nullptr;
 }
 
-CKsMDIFrameWnd* CKavo0_hdView::MainFrame() const
-{
-    return qobject_cast<CKsMDIFrameWnd*>(window());
-}
-
 void CKavo0_hdView::OnInitialUpdate()
 {
-    CView::OnInitialUpdate();
     m_sheet = new CDlgPropertySheet(this);
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
@@ -68,14 +54,9 @@ void CKavo0_hdView::OnInitialUpdate()
     connect(GetDocument(), &CKavo0_hdDoc::FileStateChanged, m_sheet, allowEditing);
     allowEditing();
 
+    CKsProjectView::OnInitialUpdate();
     AddTabs();
-    m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
-    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowLine);
-    connect(GetDocument(), &CKavo0_hdDoc::Said, this, &CKavo0_hdView::Say);
-    for (auto switched : {&KsUnits::Changed, &KsUnits::DigitsChanged})
-        connect(&KsUnits::Instance(), switched, this, [this] { OnUpdate(nullptr, Hint::Reload, nullptr); });
-    connect(&KsLanguage::Instance(), &KsLanguage::Changed, this, &CKavo0_hdView::ShowLine);
-    connect(GetDocument(), &CKavo0_hdDoc::Reveal, this, &CKavo0_hdView::RevealChange);
+    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowStatus);
     if (auto* page = ActivePage())
         page->OnSetActive();
     KsAfterPaint(this, this, [this] { MakeOtherPages(); });
@@ -97,7 +78,7 @@ std::unique_ptr<CGenPropertyPage> CKavo0_hdView::MakePage(const PageEntry& entry
 {
     auto page = entry.make(GetDocument());
     page->SetHost(this);
-    if (entry.offersBranchNames && m_inProject && page->GetGrid())
+    if (entry.offersBranchNames && GetDocument()->ProjectHandle() && page->GetGrid())
         page->GetGrid()->SetBranchNameColumn(1);
     return page;
 }
@@ -115,16 +96,16 @@ void CKavo0_hdView::MakeOtherPages()
     }
 }
 
-void CKavo0_hdView::OnUpdate(CView*, int hint, CHint*)
+void CKavo0_hdView::OnUpdate(CView* sender, int hint, CHint* object)
 {
     auto* page = ActivePage();
     if (!page)
         return;
-    if (hint == Hint::Store)
+    if (hint == CKsDoc::StoreHint)
         page->StoreToDocument();
-    else if (hint == Hint::Reload)
+    else if (hint == CKsDoc::ReloadHint)
         page->LoadFromDocument(GetDocument());
-    ShowLine(); // a paste or an undone step may have changed the list and the current cell
+    CKsProjectView::OnUpdate(sender, hint, object);
 }
 
 bool CKavo0_hdView::MayLeave(KsLeave what)
@@ -135,67 +116,33 @@ bool CKavo0_hdView::MayLeave(KsLeave what)
 
 void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deactivated)
 {
-    if (activate) {
-        SendToolbarMessage(KsMessage::ShowToolbar());
+    if (activate)
         EnableLinesMenu(m_linesEnabled);
-        ShowLine();
-    } else if (activated) {
-        if (activated == deactivated)
-            SendToolbarMessage(KsMessage::HideToolbar());
-        if (!qobject_cast<CKavo0_hdView*>(activated))
-            SendToolbarMessage(KsMessage::HideToolbar());
-    }
-    CView::OnActivateView(activate, activated, deactivated);
-}
-
-LRESULT CKavo0_hdView::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
-{
-    if (message == KsMessage::BetweenEditors())
-        return AnswerEditor(wParam, reinterpret_cast<CKSComm_Package*>(lParam));
-    if (message == KsMessage::ProjectManagement() && wParam != 2)
-        return 0;
-    return CView::WindowProc(message, wParam, lParam);
+    CKsProjectView::OnActivateView(activate, activated, deactivated);
 }
 
 // ---- what a page tells -------------------------------------------------------------------------
 
-void CKavo0_hdView::EditedLineChanged(int /*column*/)
+void CKavo0_hdView::EditedLineChanged()
 {
     if (auto* page = ActivePage())
         page->StoreToDocument();
-    GetDocument()->UpdateAllViews(nullptr, Hint::Reload);
+    GetDocument()->UpdateAllViews(nullptr, CKsDoc::ReloadHint);
 }
 
 void CKavo0_hdView::CurrentLocationChanged()
 {
-    ShowLine();
+    ShowStatus();
     if (MainFrame())
         TellLocationLater();
 }
 
-/// In the status bar: the line of the table that is worked in, the number of its current cell where the cell leaves
-/// digits out, and what has just been done.
-void CKavo0_hdView::ShowLine()
+/// The line of the table that is worked in, and the number of its current cell where the cell leaves digits out.
+CString CKavo0_hdView::PlaceText() const
 {
-    if (!MainFrame() || MainFrame()->GetActiveView() != this)
-        return;
     const auto* page = ActivePage();
     const auto* grid = page ? page->LinesGrid() : nullptr;
-    QStringList parts;
-    if (const QString line = grid ? grid->LineText() : QString(); !line.isEmpty())
-        parts << line;
-    if (const QString said = std::exchange(m_said, {}); !said.isEmpty())
-        parts << said;
-    KsTellStatus(*this, parts.join(QStringLiteral("   ")));
-}
-
-/// When the present event is over: lines that become current in it are shown first, and would hide what is said.
-void CKavo0_hdView::Say(const QString& text)
-{
-    QTimer::singleShot(0, this, [this, text] {
-        m_said = text;
-        ShowLine();
-    });
+    return grid ? grid->LineText() : CString();
 }
 
 void CKavo0_hdView::EnableLinesMenu(bool enable)
@@ -213,27 +160,20 @@ void CKavo0_hdView::RevealChange(const ChangePlace& place)
             ++tab;
     if (tab == m_sheet->PageCount() || !m_sheet->SetActivePage(tab))
         return;
-    // A window in the background stays there.
-    const bool isActive = !MainFrame() || MainFrame()->GetActiveView() == this;
-    m_sheet->PageAt(tab)->Reveal(place, isActive);
+    m_sheet->PageAt(tab)->Reveal(place, IsActive()); // a window in the background stays there
 }
 
 // ---- commands ----------------------------------------------------------------------------------
 
 std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
 {
-    std::vector<CKsMenuCommand> menu{
-        {Command::InsertLine, LoadString(Str::MenuInsertLine), QKeySequence()},
-        {Command::DeleteLine, LoadString(Str::MenuDeleteLine), QKeySequence()},
-        {},
-        {Command::GotoLine, LoadString(Str::MenuGotoLine), QKeySequence(Qt::CTRL | Qt::Key_G)},
-        {},
-        {Command::Search, LoadString(Str::MenuSearch), QKeySequence(Qt::Key_F7)},
-        {Command::SearchAgain, LoadString(Str::MenuSearchAgain), QKeySequence(Qt::Key_F3)},
-    };
-    if (m_inProject)
-        menu.insert(menu.begin() + 1,
-                    {Command::FetchLocation, LoadString(Str::MenuFetchLocation), QKeySequence(Qt::CTRL | Qt::Key_L)});
+    std::vector<CKsMenuCommand> menu{{Command::InsertLine, LoadString(Str::MenuInsertLine)}};
+    if (GetDocument()->ProjectHandle())
+        menu.push_back(
+            {Command::FetchLocation, LoadString(Str::MenuFetchLocation), QKeySequence(Qt::CTRL | Qt::Key_L)});
+    menu.push_back({Command::DeleteLine, LoadString(Str::MenuDeleteLine)});
+    menu.emplace_back();
+    std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     return menu;
 }
 
@@ -247,17 +187,12 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
         return m_linesEnabled && page && isUsable(page->LinesGrid());
     case Command::DeleteLine:
         return m_linesEnabled && page && isUsable(page->LinesGrid()) && page->LinesGrid()->HasLinesToDelete();
-    case Command::GotoLine:
-    case Command::Search:
-        return lines;
     case Command::FetchLocation:
-        return lines && m_inProject;
-    case Command::SearchAgain:
-        return lines && m_search.asked;
+        return lines && GetDocument()->ProjectHandle();
     case KsCommand::Help:
         return true;
     default:
-        return false;
+        return lines && m_search.CanRun(id, page->GetGrid());
     }
 }
 
@@ -276,58 +211,11 @@ bool CKavo0_hdView::OnCommand(int id)
     case Command::FetchLocation:
         FetchLocation();
         return true;
-    case Command::GotoLine:
-        GotoLine();
-        return true;
-    case Command::Search:
-        Search();
-        return true;
-    case Command::SearchAgain:
-        SearchAgain();
-        return true;
     case KsCommand::Help:
         page->OnHelp();
         return true;
     default:
-        return false;
+        m_search.Run(id, *page->GetGrid());
+        return true;
     }
-}
-
-void CKavo0_hdView::GotoLine()
-{
-    CGotoDlg dialog(this);
-    if (dialog.exec() != QDialog::Accepted)
-        return;
-    ActivePage()->GotoLine(dialog.Line());
-    ActivePage()->GetGrid()->setFocus(Qt::OtherFocusReason);
-}
-
-void CKavo0_hdView::Search()
-{
-    CSearchDlg dialog(m_search.name, m_search.chainage, m_search.chainageCriterion, m_search.nameCriterion, this);
-    if (dialog.exec() != QDialog::Accepted)
-        return;
-    m_search = {dialog.RiverName(), dialog.Chainage(), dialog.ChainageCriterion(), dialog.NameCriterion()};
-    m_search.asked = true;
-    m_search.page = ActivePage();
-    SearchAgain();
-}
-
-void CKavo0_hdView::SearchAgain()
-{
-    auto* grid = ActivePage() ? ActivePage()->GetGrid() : nullptr;
-    if (!grid)
-        return;
-    if (std::exchange(m_search.page, ActivePage()) != ActivePage()) {
-        m_search.row = 0;
-        m_search.found = false;
-    }
-    if (grid->SearchRows(m_search.row, m_search.name, m_search.chainage, m_search.chainageCriterion,
-                         m_search.nameCriterion)) {
-        m_search.found = true;
-        grid->setFocus(Qt::OtherFocusReason); // the next key is meant for the line found
-        return;
-    }
-    const bool hadFound = std::exchange(m_search.found, false);
-    KsMessageBox(LoadString(hadFound ? Str::LastOccurrence : Str::NotFound), QMessageBox::Ok, this);
 }

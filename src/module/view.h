@@ -1,8 +1,8 @@
 // The view of an HD parameter document: hosts the sheet of pages and relays between them, the document and the shell.
 #pragma once
 
-#include "ks/fc/frames.h"
 #include "document/document.h"
+#include "ks/fc/project_view.h"
 #include "pages/framework/page_host.h"
 
 #include <QString>
@@ -11,7 +11,7 @@ class CDlgPropertySheet;
 class CGenPropertyPage;
 struct PageEntry;
 
-class CKavo0_hdView : public CView, public CCommandTarget, public IPageHost
+class CKavo0_hdView : public CKsProjectView, public IPageHost
 {
     Q_OBJECT
 public:
@@ -28,7 +28,6 @@ public:
     void OnUpdate(CView* sender, int hint, CHint* object) override;
     void OnActivateView(bool activate, CView* activated, CView* deactivated) override;
     bool MayLeave(KsLeave what) override;
-    LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam) override;
 
     // CCommandTarget
     bool OnCommand(int id) override;
@@ -37,47 +36,30 @@ public:
 
     // IPageHost
     CView* HostView() override { return this; }
-    void EditedLineChanged(int column) override;
+    void EditedLineChanged() override;
     void CurrentLocationChanged() override;
-    void CurrentCellChanged() override { ShowLine(); }
+    void CurrentCellChanged() override { ShowStatus(); }
     void Execute(int command) override { OnCommand(command); }
     QStringList BranchNames() override;
     void EnableLinesMenu(bool enable) override;
 
-private:
-    /// What F7 asked for and F3 goes on with.
-    struct SearchState
-    {
-        QString name;
-        double chainage = 0; // metres
-        int chainageCriterion = 3, nameCriterion = 0;
-        int row = 0;                            // the next search starts here; 0 is the first row
-        const CGenPropertyPage* page = nullptr; // on which `row` is
-        bool asked = false, found = false;
-    };
+protected:
+    LRESULT OnRequest(WPARAM request, CKSComm_Package& package) override;
+    void RevealChange(const ChangePlace& place) override;
+    CString PlaceText() const override;
 
-    LRESULT AnswerEditor(WPARAM request, CKSComm_Package* package);
+private:
     void FetchLocation();
-    void ShowLine();
-    void Say(const QString& text);
     void TellLocationLater();
     void TellLocation();
 
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
     void MakeOtherPages();
-    void Search();
-    void SearchAgain();
-    void GotoLine();
-    void RevealChange(const ChangePlace& place);
-    void SendToolbarMessage(unsigned message);
-    CKsMDIFrameWnd* MainFrame() const;
 
     CDlgPropertySheet* m_sheet = nullptr;                      // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
-    bool m_inProject = false;
     bool m_tellLocation = false; // once the present event is over
-    QString m_said;              // in the status bar, behind the line
-    SearchState m_search;
+    CGridSearch m_search;
     bool m_linesEnabled = true;
 };

@@ -13,29 +13,22 @@
 #include <cmath>
 #include <iterator>
 
-void CKavo0_hdView::SendToolbarMessage(unsigned message)
-{
-    CKSComm_Package package;
-    package.view = this;
-    KsSendMessage(KsMainWindow(), message, 0, reinterpret_cast<LPARAM>(&package));
-}
-
-LRESULT CKavo0_hdView::AnswerEditor(WPARAM request, CKSComm_Package* package)
+LRESULT CKavo0_hdView::OnRequest(WPARAM request, CKSComm_Package& package)
 {
     if (request != KsRequest::GetData && request != KsRequest::InsertData && request != KsRequest::DeleteData)
         return 0;
     // One of these documents never meets the requests of another.
-    if (!package || !package->view || !package->objects || qobject_cast<CKavo0_hdView*>(package->view)) {
+    if (!package.view || !package.objects || qobject_cast<CKavo0_hdView*>(package.view)) {
         qDebug("HD data exchange: a request without sender or list, or of this editor; nothing is done");
         return 0;
     }
     if (request == KsRequest::InsertData) {
-        CKavo0_hd::InsertData({}, this, package->objects);
+        CKavo0_hd::InsertData({}, this, package.objects);
     } else if (request == KsRequest::DeleteData) {
-        CKavo0_hd::DeleteData({}, this, package->objects);
+        CKavo0_hd::DeleteData({}, this, package.objects);
     } else if (const std::unique_ptr<CObList> items{CKavo0_hd::GetData({}, this)}) {
-        package->objects->insert(package->objects->end(), std::make_move_iterator(items->begin()),
-                                 std::make_move_iterator(items->end()));
+        package.objects->insert(package.objects->end(), std::make_move_iterator(items->begin()),
+                                std::make_move_iterator(items->end()));
     }
     return 0;
 }
@@ -44,7 +37,7 @@ LRESULT CKavo0_hdView::AnswerEditor(WPARAM request, CKSComm_Package* package)
 /// asks at once. Many moves in one event are told once.
 void CKavo0_hdView::TellLocationLater()
 {
-    if (m_inProject && !std::exchange(m_tellLocation, true))
+    if (GetDocument()->ProjectHandle() && !std::exchange(m_tellLocation, true))
         QTimer::singleShot(0, this, &CKavo0_hdView::TellLocation);
 }
 
@@ -57,24 +50,14 @@ void CKavo0_hdView::TellLocation()
     const auto record = page && page->GetGrid() ? page->GetRecordAt(page->GetGrid()->CurrentRow()) : nullptr;
     if (!record || record->IsBlank())
         return;
-    auto shown = std::make_unique<CKvrCBELocation>();
-    shown->branch = QString::fromStdString(record->RiverName);
-    shown->chainage = record->Chainage;
-    CObList objects;
-    objects.push_back(std::move(shown));
-    GetDocument()->TellShell(KsRequest::LocationShown, this, &objects);
+    GetDocument()->LocationShown(this, QString::fromStdString(record->RiverName), record->Chainage);
 }
 
 QStringList CKavo0_hdView::BranchNames()
 {
-    CObList names;
-    QStringList branches;
-    GetDocument()->AskShell(KsRequest::BranchNames, this, &names);
-    for (const auto& item : names) {
-        const auto* name = dynamic_cast<const CKvrCBEText*>(item.get());
-        if (name && !name->text.isEmpty())
-            branches << KsBranchKey(name->text); // as the column stores them
-    }
+    QStringList branches = GetDocument()->BranchNames(this);
+    for (QString& branch : branches)
+        branch = KsBranchKey(branch); // as the column stores them
     branches.removeDuplicates();
     return branches;
 }
@@ -82,7 +65,7 @@ QStringList CKavo0_hdView::BranchNames()
 void CKavo0_hdView::FetchLocation()
 {
     CObList objects;
-    GetDocument()->AskShell(KsRequest::FetchLocation, this, &objects);
+    GetDocument()->AskProject(KsRequest::FetchLocation, this, &objects);
     const auto* place = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
     if (!place || place->branch.isEmpty() || !std::isfinite(place->chainage)) {
         KsMessageBox(LoadString(Str::FetchNoAnswer), QMessageBox::Ok, this);

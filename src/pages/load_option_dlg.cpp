@@ -34,7 +34,7 @@ void AskForLocations(CGenPropertyPage& page)
         return;
     const WPARAM request = dialog.Option() == 0 ? KsRequest::LoadLocations : KsRequest::LoadLocationsAndChannel;
     CObList places;
-    if (!document.AskShell(request, page.GetHost() ? page.GetHost()->HostView() : nullptr, &places)) {
+    if (!document.AskProject(request, page.GetHost() ? page.GetHost()->HostView() : nullptr, &places)) {
         KsMessageBox(LoadString(Str::LoadNoAnswer), QMessageBox::Ok, &page);
         return;
     }

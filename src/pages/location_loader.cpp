@@ -2,8 +2,8 @@
 
 #include "ks/fc/branch_name.h"
 #include "document/document.h"
-#include "pages/framework/commands.h"
 #include "grid/gen_grid.h"
+#include "grid/row_commands.h"
 #include "pages/framework/page.h"
 #include "res/strings.h"
 

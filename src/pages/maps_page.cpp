@@ -53,8 +53,8 @@ CMapsPage::CMapsPage(CKavo0_hdDoc* document, QWidget* parent)
     Bindings().EnableWhen([usesDem, &maps] { return usesDem() && maps.MapAreaGeoDb; },
                           {m_ui->helpGridLabel_1243, m_ui->helpGrid_1241});
 
-    m_ui->maps_1226->SetDeletesCurrentLine(true);
-    m_ui->dem_1227->SetDeletesCurrentLine(true);
+    m_ui->maps_1226->SetLineChoice(LineChoice::CurrentLine);
+    m_ui->dem_1227->SetLineChoice(LineChoice::CurrentLine);
     DeclareMaps();
     ItemsGrid(m_ui->dem_1227, maps.DemInputFiles)
         .Value(MapsInputs, &CMapsInput::FileName, {.header = LineOf(Str::DemColumns, 0), .width = 150})
@@ -117,7 +117,7 @@ void CMapsPage::ShowStatus()
     m_ui->status_1229->setText(count > 0 ? LoadString(Str::RowsWithoutFile).arg(count) : QString());
 }
 
-void CMapsPage::OnGridButtonClicked(CGenGrid& grid, int row, int /*column*/)
+void CMapsPage::ButtonClicked(CGenGrid& grid, int row, int /*column*/)
 {
     const bool isMap = &grid == m_ui->maps_1226;
     BrowseInto(grid, row, isMap ? MapFileColumn : DemFileColumn, GridFile(isMap));

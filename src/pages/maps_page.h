@@ -17,7 +17,7 @@ public:
     ~CMapsPage() override;
 
     void LoadFromDocument(CKavo0_hdDoc* document) override;
-    void OnGridButtonClicked(CGenGrid& grid, int row, int column) override;
+    void ButtonClicked(CGenGrid& grid, int row, int column) override;
 
 protected:
     void Retranslate() override;

@@ -95,7 +95,7 @@ public:
     }
 
     const void* Data() const override { return &Titles(); }
-    CGenList* List() const override { return &m_document.Parameters().WaterLevelMarkList; }
+    const void* List() const override { return static_cast<CGenList*>(&m_document.Parameters().WaterLevelMarkList); }
     std::size_t ListRow(std::size_t) const override { return std::size_t(-1); } // no line of the list
 
 private:

@@ -80,7 +80,8 @@ void CSwitchFormula::ConvertTools(Tools& tools)
 
 CSwitchFormula::CSwitchFormula(CKavo0_hdDoc& document, std::int32_t formula, bool convert)
     : CDocumentCommand(document, LoadString(convert ? Str::UndoConvert : Str::UndoValue)),
-      m_before(document.Parameters().Global.resist_num),
+      m_formula(document.Parameters().Global.resist_num),
+      m_before(m_formula),
       m_after(formula)
 {
     if (!convert)
@@ -103,7 +104,7 @@ CSwitchFormula::CSwitchFormula(CKavo0_hdDoc& document, std::int32_t formula, boo
 
 ChangePlace CSwitchFormula::Apply()
 {
-    Document().Parameters().Global.resist_num = m_after;
+    m_formula = m_after;
     for (const Change& change : m_changes)
         change.Target() = change.after;
     return {};
@@ -111,7 +112,7 @@ ChangePlace CSwitchFormula::Apply()
 
 ChangePlace CSwitchFormula::Revert()
 {
-    Document().Parameters().Global.resist_num = m_before;
+    m_formula = m_before;
     for (const Change& change : m_changes)
         change.Target() = change.before;
     return {};

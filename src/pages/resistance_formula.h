@@ -1,12 +1,13 @@
 // The resistance formula: the unit that bed resistances are given in, and what becomes of them when it is switched.
 #pragma once
 
-#include "document/list_commands.h"
+#include "ks/fc/doc_command.h"
 
 #include <QString>
 #include <cstdint>
 #include <vector>
 
+class CKavo0_hdDoc;
 class QComboBox;
 struct CBRTVeloRes;
 
@@ -44,6 +45,7 @@ private:
     void Put(double& value, double after);
     void Invert(double& value);
 
+    std::int32_t& m_formula; // of the document
     std::int32_t m_before, m_after;
     std::vector<Change> m_changes;
 };

@@ -2,7 +2,9 @@
 #pragma once
 
 #include "data/hd_parameters.h"
-#include "document/list_commands.h"
+#include "ks/fc/doc_command.h"
+
+class CKavo0_hdDoc;
 
 class CSetupCommand : public CDocumentCommand
 {

@@ -28,7 +28,7 @@ CTextOutputPage::CTextOutputPage(CKavo0_hdDoc* document, QWidget* parent)
     Bindings().Add({m_ui->all_1218, m_ui->only_1219, m_ui->except_1220}, output.GridPointOutputType);
 
     for (CGenGrid* grid : {m_ui->grid_1217, m_ui->items_1216, m_ui->files_1226})
-        grid->SetDeletesCurrentLine(true);
+        grid->SetLineChoice(LineChoice::CurrentLine);
     Grid(m_ui->grid_1217)
         .BranchName({.width = 110})
         .Chainage({.caption = Str::UpstreamChainage})
@@ -56,7 +56,7 @@ void CTextOutputPage::LoadFromDocument(CKavo0_hdDoc* document)
     CLocationPage::LoadFromDocument(document);
 }
 
-void CTextOutputPage::OnGridButtonClicked(CGenGrid& grid, int row, int /*column*/)
+void CTextOutputPage::ButtonClicked(CGenGrid& grid, int row, int /*column*/)
 {
     const bool isBridge = grid.TextAt(row, FileFormatColumn) == LineOf(Str::OutputFormats, 0)();
     BrowseInto(grid, row, FileNameColumn,

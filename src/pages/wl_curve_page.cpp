@@ -1,6 +1,6 @@
 #include "pages/wl_curve_page.h"
 
-#include "pages/framework/commands.h"
+#include "document/store_value.h"
 #include "pages/load_option_dlg.h"
 #include "ui_wl_curve_page.h"
 

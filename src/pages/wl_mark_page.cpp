@@ -82,7 +82,7 @@ CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document, QWidget* parent)
     : CLocationPage(document, &HD_Parameters::WaterLevelMarkList, parent), m_ui(std::make_unique<Ui::CWLMarkPage>())
 {
     m_ui->setupUi(this);
-    m_ui->grid_1074->SetDeletesCurrentLine(true);
+    m_ui->grid_1074->SetLineChoice(LineChoice::CurrentLine);
     Grid(m_ui->grid_1074).BranchName({.width = 71}).Chainage({.width = 71});
     RowsGrid(m_ui->titles_1075, MakeMarkTitleRows(*document))
         .Value(TitleAccess(), FieldKind::Text, UnitGroup::None,

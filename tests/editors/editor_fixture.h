@@ -2,12 +2,16 @@
 // hears.
 #pragma once
 
+#include "grid/gen_grid.h"
+#include "grid/grid_editors.h"
+#include "grid/row_commands.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/exchange.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
 #include "ks/units/edit_style.h"
 
+#include <QComboBox>
 #include <QFile>
 #include <QTemporaryDir>
 #include <QTest>
@@ -73,6 +77,43 @@ protected:
         item->chainage = chainage;
         item->radius = radius;
         return item;
+    }
+
+    static QString Text(const CGenGrid* table, int row, int column, int role = Qt::DisplayRole)
+    {
+        return table->model()->index(row, column).data(role).toString();
+    }
+    /// Opens the cell's editor and replaces what stands there.
+    static QWidget* Type(CGenGrid* table, int row, int column, const QString& text)
+    {
+        table->setFocus();
+        table->SetCurrentCell(row + 1, column + 1);
+        QTest::keyClick(table, Qt::Key_F2);
+        QWidget* editor = table->Delegate()->Editor();
+        if (auto* field = qobject_cast<QLineEdit*>(editor)) {
+            field->selectAll();
+            field->insert(text);
+        } else if (auto* list = qobject_cast<QComboBox*>(editor)) {
+            list->setCurrentText(text);
+        }
+        return editor;
+    }
+    /// Likewise, and leaves the cell. False when it refuses the text, which is given up then.
+    static bool Edit(CGenGrid* table, int row, int column, const QString& text)
+    {
+        QWidget* editor = Type(table, row, column, text);
+        if (editor && !table->CommitEditor()) {
+            QTest::keyClick(editor, Qt::Key_Escape);
+            return false;
+        }
+        table->StoreEditedLine();
+        return editor != nullptr;
+    }
+    static void Select(CGenGrid* table, int row) { table->SetCurrentCell(row + 1, 1); }
+    /// Takes lines out of a table's rows, as one step.
+    static void Remove(CKsDoc& document, const std::shared_ptr<IRowSource>& rows, std::size_t row, std::size_t count)
+    {
+        document.UndoStack().push(new CDeleteLines(document, rows, row, count));
     }
 
     /// What the shell asks of the plug-in KVR_PLUGIN, which has one document template and one tool bar.

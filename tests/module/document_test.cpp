@@ -31,7 +31,7 @@ TEST_F(DocumentTest, SavePurgesWritesUpperCaseAndUndoBringsTheLinesBack)
     ASSERT_TRUE(document.OnOpenDocument(Path("river.hdkv")));
     document.SetPathName(Path("river.hdkv"));
     document.Parameters().LeakageList.Add(); // lists that are not cleaned keep incomplete lines
-    document.UpdateAll(nullptr, Hint::Reload, nullptr);
+    document.UpdateAll(nullptr, CKsDoc::ReloadHint, nullptr);
     ASSERT_TRUE(document.IsModified());
 
     ASSERT_TRUE(document.OnSaveDocument(Path("river.hdkv")));
@@ -159,7 +159,7 @@ TEST_F(DocumentTest, AFailedSaveLeavesFileAndMemoryAsTheyWere)
 {
     Write(Path("river.HDKV"), SmallFile);
     ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
-    document.UpdateAll(nullptr, Hint::Reload, nullptr);
+    document.UpdateAll(nullptr, CKsDoc::ReloadHint, nullptr);
     const CString target = Path("missing folder/river.HDKV");
     EXPECT_FALSE(document.OnSaveDocument(target));
     ASSERT_EQ(boxes.size(), 1);
@@ -198,17 +198,18 @@ TEST_F(DocumentTest, DeleteContentsKeepsTheGlobalValues)
 TEST_F(DocumentTest, TalksToTheShellOnlyInsideAProject)
 {
     CView view;
-    EXPECT_FALSE(document.GetProjectInfo(&view, "p"));
-    document.LeaveProject(&view, "p");
-    document.DataChange("p");
+    document.SetPathName("p");
+    EXPECT_FALSE(document.JoinProject(&view));
+    document.LeaveProject(&view);
+    document.DataChanged();
     ASSERT_EQ(messages.size(), 1u);
     EXPECT_EQ(messages[0].request, 25u);
 
     projectHandle = 77;
     messages.clear();
-    EXPECT_TRUE(document.GetProjectInfo(&view, "p"));
-    document.DataChange("p");
-    document.LeaveProject(&view, "p");
+    EXPECT_TRUE(document.JoinProject(&view));
+    document.DataChanged();
+    document.LeaveProject(&view);
     ASSERT_EQ(messages.size(), 3u);
     const std::pair<unsigned, WPARAM> expected[] = {
         {KsMessage::SwitchBoard(), 25}, {KsMessage::BetweenEditors(), 522}, {KsMessage::SwitchBoard(), 24}};

@@ -2,7 +2,7 @@
 #include "exchange_fixture.h"
 
 #include "ks/fc/exchange.h"
-#include "pages/framework/commands.h"
+#include "document/store_value.h"
 #include "pages/load_option_dlg.h"
 
 #include <QCheckBox>

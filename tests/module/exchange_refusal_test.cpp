@@ -76,9 +76,9 @@ TEST_F(ExchangeTest, NoChangeIsMadeInsideAnotherAndNothingIsMetWhileTheDocumentS
     EXPECT_EQ(List(*view, 0).GetCount(), 2u);
 
     // Whoever hears that the data changed may ask at once.
-    view->GetDocument()->GetProjectInfo(nullptr, {});
+    view->GetDocument()->JoinProject(nullptr);
     projectHandle = 5;
-    view->GetDocument()->GetProjectInfo(view, {});
+    view->GetDocument()->JoinProject(view);
     std::string heard;
     answerShell = [&](unsigned, WPARAM request, CKSComm_Package&, LRESULT joined) {
         if (request == KsRequest::DataChanged)

@@ -132,7 +132,7 @@ TEST_F(ViewTest, TheHelpCommandReachesThePage)
     QTest::keyClick(*help, Qt::Key_Escape);
     const QString tables = PageHelpText(true);
     for (const GridKey& key : GridKeys())
-        EXPECT_TRUE(tables.contains(LoadString(key.description).toHtmlEscaped()));
+        EXPECT_TRUE(tables.contains(key.Text().toHtmlEscaped()));
     EXPECT_TRUE(tables.contains("Ctrl+Ins")) << tables.toStdString();
     EXPECT_FALSE(PageHelpText(false).contains("Ctrl+Ins"));
 }

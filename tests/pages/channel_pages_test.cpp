@@ -258,7 +258,7 @@ TEST_F(ChannelPagesTest, LoadingLocationsSaysWhyItCannot)
     EXPECT_TRUE(boxes[0].contains("belongs to no project"));
 
     ProjectShell shell;
-    document.GetProjectInfo(view.get(), "x");
+    document.JoinProject(view.get());
     const struct
     {
         const char* button; // null cancels

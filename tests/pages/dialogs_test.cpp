@@ -37,14 +37,14 @@ TEST_F(DialogsTest, SearchConvertsTheChainage)
 {
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     const double odd = 376.2756000000001;
-    CSearchDlg same("MAIN", odd, 1, 1);
+    CSearchDlg same({"MAIN", odd, ChainageMatch::Equal, NameMatch::Whole});
     same.accept();
-    EXPECT_EQ(same.Chainage(), odd) << "not typed: not changed";
-    EXPECT_EQ(same.RiverName(), "MAIN");
-    EXPECT_EQ(same.ChainageCriterion(), 1);
-    EXPECT_EQ(same.NameCriterion(), 1);
+    EXPECT_EQ(same.Query().chainage, odd) << "not typed: not changed";
+    EXPECT_EQ(same.Query().name, "MAIN");
+    EXPECT_EQ(same.Query().chainageMatch, ChainageMatch::Equal);
+    EXPECT_EQ(same.Query().nameMatch, NameMatch::Whole);
 
-    CSearchDlg dialog("", 0, 3, 0);
+    CSearchDlg dialog({});
     dialog.show();
     auto* chainage = dialog.findChild<QLineEdit*>("chainage_1061");
     EXPECT_EQ(chainage->text(), "0");
@@ -58,8 +58,8 @@ TEST_F(DialogsTest, SearchConvertsTheChainage)
     dialog.findChild<QRadioButton*>("fullMatch_1060")->click();
     dialog.accept();
     EXPECT_EQ(dialog.result(), QDialog::Accepted);
-    EXPECT_NEAR(dialog.Chainage(), 304.8, 0.001);
-    EXPECT_EQ(dialog.RiverName(), "RIV");
-    EXPECT_EQ(dialog.ChainageCriterion(), 2);
-    EXPECT_EQ(dialog.NameCriterion(), 1);
+    EXPECT_NEAR(dialog.Query().chainage, 304.8, 0.001);
+    EXPECT_EQ(dialog.Query().name, "RIV");
+    EXPECT_EQ(dialog.Query().chainageMatch, ChainageMatch::Greater);
+    EXPECT_EQ(dialog.Query().nameMatch, NameMatch::Whole);
 }

@@ -121,7 +121,7 @@ TEST_F(InitPageTest, GlobalFieldsAreStoredWhenLeft)
     discharge->selectAll();
     QTest::keyClicks(discharge, "12.5");
     EXPECT_EQ(globals.G_discharge, 0);
-    document.UpdateAllViews(nullptr, Hint::Store); // a save with the field still open
+    document.UpdateAllViews(nullptr, CKsDoc::StoreHint); // a save with the field still open
     EXPECT_EQ(globals.G_discharge, 12.5);
     EXPECT_TRUE(document.IsModified());
     QTest::keyClick(discharge, Qt::Key_Z, Qt::ControlModifier);

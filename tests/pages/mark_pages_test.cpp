@@ -2,6 +2,7 @@
 #include "page_fixture.h"
 
 #include "data/hd_file.h"
+#include "grid/grid_search.h"
 #include "pages/location_loader.h"
 #include "pages/wl_curve_page.h"
 #include "pages/wl_mark_page.h"
@@ -209,7 +210,7 @@ TEST_F(MarkPagesTest, TheGlobalRowIsNoLineOfTheList)
     EXPECT_FALSE(view->page->GetRecordAt(1));
     EXPECT_EQ(view->page->GetRecordAt(2)->RiverName, "A");
     int row = 1;
-    EXPECT_FALSE(grid->SearchRows(row, "GLOBAL", 0, 3, 0));
+    EXPECT_FALSE(SearchRows(*grid, row, {"GLOBAL"}));
 }
 
 TEST_F(MarkPagesTest, CurveSwitchesTakeEachOtherAlong)

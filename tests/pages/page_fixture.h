@@ -34,17 +34,17 @@ public:
     }
     void OnUpdate(CView*, int hint, CHint*) override
     {
-        if (hint == Hint::Store)
+        if (hint == CKsDoc::StoreHint)
             page->StoreToDocument();
         else
             page->LoadFromDocument(&document);
     }
     CView* HostView() override { return this; }
-    void EditedLineChanged(int column) override
+    void EditedLineChanged() override
     {
-        edited << column;
+        ++edited;
         page->StoreToDocument();
-        document.UpdateAllViews(nullptr, Hint::Reload);
+        document.UpdateAllViews(nullptr, CKsDoc::ReloadHint);
     }
     void CurrentLocationChanged() override { locations << page->GetGrid()->CurrentRow(); }
     void Execute(int command) override
@@ -61,7 +61,8 @@ public:
     CKavo0_hdDoc& document;
     CGenPropertyPage* page;
     QLineEdit* other; // something else to focus
-    QList<int> edited, locations, commands, revealed;
+    int edited = 0; // lines
+    QList<int> locations, commands, revealed;
     QStringList branches;
     bool linesMenu = false;
 };

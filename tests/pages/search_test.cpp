@@ -1,5 +1,6 @@
 #include "page_fixture.h"
 
+#include "grid/grid_search.h"
 #include "pages/init_page.h"
 
 class SearchTest : public PageTest
@@ -14,11 +15,11 @@ protected:
         Open<CInitPage>();
     }
     /// The rows found one after the other, as "search" and "search again" do.
-    QList<int> Found(const char* name, double chainage, int chainageCriterion, int nameCriterion, int from = 0)
+    QList<int> Found(const LineQuery& query, int from = 0)
     {
         QList<int> rows;
         int row = from;
-        while (grid->SearchRows(row, name, chainage, chainageCriterion, nameCriterion)) {
+        while (SearchRows(*grid, row, query)) {
             EXPECT_EQ(row, grid->CurrentRow() + 1);
             rows << grid->CurrentRow();
         }
@@ -29,47 +30,39 @@ protected:
 
 TEST_F(SearchTest, Criteria)
 {
-    enum
-    {
-        Less,
-        Equal,
-        Greater,
-        NotUsed
-    };
-    enum
-    {
-        Partial,
-        Full,
-        Neither
-    };
+    using enum ChainageMatch;
+    using enum NameMatch;
     const struct
     {
-        const char* name;
-        double chainage;
-        int chainageCriterion, nameCriterion;
+        LineQuery query;
         QList<int> rows;
     } cases[] = {
-        {"", 0, NotUsed, Partial, {1, 2, 3, 4}}, {"RIV", 0, NotUsed, Partial, {1, 3, 4}},
-        {"RIV", 0, NotUsed, Full, {4}},          {"RIV", 0, NotUsed, Neither, {1, 2, 3, 4}},
-        {"river1", 0, NotUsed, Full, {1}},       {"", 200.5, Equal, Partial, {2}},
-        {"", 200, Equal, Partial, {}},           {"", 200.5, Less, Partial, {1, 4}}, // an empty cell reads as 0
-        {"", 200.5, Greater, Partial, {3}},      {"", 0, Equal, Partial, {4}},
-        {"RIVER", 100, Greater, Partial, {3}},   {"", 0, 7, Partial, {}},
+        {{}, {1, 2, 3, 4}},
+        {{"RIV"}, {1, 3, 4}},
+        {{"RIV", 0, Any, Whole}, {4}},
+        {{"", 0, Any, Whole}, {1, 2, 3, 4}},
+        {{"river1", 0, Any, Whole}, {1}},
+        {{"", 200.5, Equal}, {2}},
+        {{"", 200, Equal}, {}},
+        {{"", 200.5, Less}, {1, 4}}, // an empty cell reads as 0
+        {{"", 200.5, Greater}, {3}},
+        {{"", 0, Equal}, {4}},
+        {{"RIVER", 100, Greater}, {3}},
     };
     for (const auto& c : cases)
-        EXPECT_EQ(Found(c.name, c.chainage, c.chainageCriterion, c.nameCriterion), c.rows)
-            << c.name << ' ' << c.chainage << ' ' << c.chainageCriterion << ' ' << c.nameCriterion;
-    EXPECT_EQ(Found("", 0, NotUsed, Partial, 3), (QList<int>{3, 4}));
-    EXPECT_TRUE(Found("", 0, NotUsed, Partial, 9).isEmpty());
+        EXPECT_EQ(Found(c.query), c.rows) << c.query.name.toStdString() << ' ' << c.query.chainage;
+    EXPECT_EQ(Found({}, 3), (QList<int>{3, 4}));
+    EXPECT_TRUE(Found({}, 9).isEmpty());
 }
 
 TEST_F(SearchTest, ComparesWhatIsShownAndWhatWasTyped)
 {
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     Enter(1, 2, "1234.5"); // feet
-    EXPECT_EQ(Found("", CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(1234.5, 0), 1, 0), QList<int>{1});
+    const double wanted = CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(1234.5, 0);
+    EXPECT_EQ(Found({"", wanted, ChainageMatch::Equal}), QList<int>{1});
     grid->Model()->setData(grid->Model()->index(1, 0), "typed", Qt::EditRole);
-    EXPECT_EQ(Found("TYPED", 0, 3, 1), QList<int>{2}) << "a line that is not stored yet";
+    EXPECT_EQ(Found({"TYPED", 0, ChainageMatch::Any, NameMatch::Whole}), QList<int>{2}) << "a line that is not stored yet";
 }
 
 TEST_F(SearchTest, GotoLine)

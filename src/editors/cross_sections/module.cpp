@@ -1,6 +1,7 @@
 #include "editors/cross_sections/module.h"
 
 #include "editors/cross_sections/view.h"
+#include "grid/grid_texts.h"
 #include "ks/fc/doc_template.h"
 #include "ks/language/language.h"
 
@@ -39,6 +40,7 @@ void CrossSectionModule::LoadResources()
 {
     InitResources();
     KsLangLoadResDll("Kavo0_xs", &g_texts, 0);
+    GridTexts::Load();
 }
 
 void CrossSectionModule::FreeResources()
@@ -74,9 +76,9 @@ bool CrossSectionModule::InitToolBar(CKsToolBarEx* bar, CKsMDIFrameWnd* frame, u
                           {CrossSectionCommand::Next, ":/cross_sections/next.svg",
                            CrossSectionTexts::tr("Shows the cross section below\nNext Cross Section")},
                           {0, "", {}},
-                          {CrossSectionCommand::InsertLine, ":/cross_sections/insert.svg",
+                          {Command::InsertLine, ":/cross_sections/insert.svg",
                            CrossSectionTexts::tr("Adds a cross section or a point below the current one\nInsert Line")},
-                          {CrossSectionCommand::DeleteLine, ":/cross_sections/delete.svg",
+                          {Command::DeleteLine, ":/cross_sections/delete.svg",
                            CrossSectionTexts::tr("Deletes the selected cross sections or points\nDelete Lines")}});
     if (!loaded)
         return false;

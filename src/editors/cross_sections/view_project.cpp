@@ -15,7 +15,7 @@ LRESULT CCrossSectionView::OnRequest(WPARAM request, CKSComm_Package& package)
     const bool known = request == KsRequest::LoadLocations || request == KsRequest::LoadLocationsAndChannel ||
                        request == KsRequest::BranchNames || request == KsRequest::LocationShown;
     if (!known)
-        return CProjectView::OnRequest(request, package);
+        return CTablesView::OnRequest(request, package);
     if (!package.objects) {
         qDebug("cross sections: request %llu without a list", static_cast<unsigned long long>(request));
         return 0;
@@ -26,7 +26,7 @@ LRESULT CCrossSectionView::OnRequest(WPARAM request, CKSComm_Package& package)
     case KsRequest::LoadLocationsAndChannel:
         return FillChannel(*package.objects);
     case KsRequest::BranchNames:
-        return BranchNames(*package.objects);
+        return ListBranches(*package.objects);
     default:
         return ShowLocation(*package.objects);
     }
@@ -70,7 +70,7 @@ LRESULT CCrossSectionView::FillChannel(const CObList& objects) const
     return filled;
 }
 
-LRESULT CCrossSectionView::BranchNames(CObList& objects) const
+LRESULT CCrossSectionView::ListBranches(CObList& objects) const
 {
     const QStringList branches = Document()->Sections().Branches();
     AppendBranchNames(branches, objects);
@@ -82,7 +82,7 @@ LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
 {
     const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
     // An answer to what this view tells would move its user away, and so would any place while a cell is being typed.
-    if (!item || m_telling || m_sections->IsEditing() || m_points->IsEditing())
+    if (!item || m_telling || IsEditing())
         return 0;
     const int nearest = Document()->Sections().Nearest(item->branch, item->chainage);
     const CCrossSection *there = Document()->Section(nearest), *here = Document()->Section(CurrentSection());
@@ -90,7 +90,7 @@ LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
                    std::abs(here->chainage - item->chainage) <= std::abs(there->chainage - item->chainage)))
         return 0;
     const QScopedValueRollback showing(m_showing, true);
-    GoToRow(m_sections, nearest);
+    GoToSection(nearest);
     return 0;
 }
 
@@ -106,19 +106,6 @@ void CCrossSectionView::TellLocation()
         return;
     const QScopedValueRollback telling(m_telling, true);
     Document()->LocationShown(this, m_toldBranch, m_toldChainage);
-}
-
-/// For the first section of a document: a branch that the project has.
-QString CCrossSectionView::NewBranch()
-{
-    CObList items;
-    Document()->AskProject(KsRequest::BranchNames, this, &items);
-    for (const auto& item : items) {
-        const auto* text = dynamic_cast<const CKvrCBEText*>(item.get());
-        if (text && !text->text.isEmpty())
-            return text->text;
-    }
-    return tr("BRANCH");
 }
 
 void CCrossSectionView::OnProjectsChanged()

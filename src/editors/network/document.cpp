@@ -1,16 +1,16 @@
 #include "editors/network/document.h"
 
-#include "editors/network/commands.h"
 #include "editors/network/network_file.h"
+#include "editors/network/network_tables.h"
+#include "grid/row_commands.h"
 
 #include <QUndoStack>
-#include <cmath>
 
 namespace {
 constexpr int NetworkPackageKind = 1; // what this editor's packages call themselves
 } // namespace
 
-CNetworkDoc::CNetworkDoc() : CProjectDoc(NetworkPackageKind) {}
+CNetworkDoc::CNetworkDoc() : CParameterDoc(NetworkPackageKind) {}
 
 const CLinearReference& CNetworkDoc::Reference() const
 {
@@ -37,44 +37,26 @@ void CNetworkDoc::DeleteContents()
     m_reference.reset();
 }
 
-void CNetworkDoc::Changed()
+void CNetworkDoc::UpdateAll(CView* sender, int hint, CHint* object)
 {
     m_reference.reset();
+    CParameterDoc::UpdateAll(sender, hint, object);
     emit NetworkChanged();
-    DataChanged();
-}
-
-void CNetworkDoc::ReplaceBranch(int index, CNetworkBranch branch, const QString& text)
-{
-    branch.SortChannel();
-    UndoStack().push(new CReplaceBranch(*this, index, std::move(branch), text));
-}
-
-void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QString& text)
-{
-    AppendBranches(std::move(branches), m_network.system, text);
 }
 
 void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QString& system, const QString& text)
 {
-    if (!branches.empty())
-        UndoStack().push(new CAppendBranches(*this, std::move(branches), system, text));
-}
-
-void CNetworkDoc::RemoveBranches(std::vector<int> indexes, const QString& text)
-{
-    if (!indexes.empty())
-        UndoStack().push(new CRemoveBranches(*this, std::move(indexes), text));
-}
-
-QString CNetworkDoc::WhyNot(int index, const CNetworkBranch& branch) const
-{
-    if (branch.name.isEmpty())
-        return tr("A branch needs a name.");
-    const int other = m_network.FindBranch(branch.name);
-    if (other >= 0 && other != index)
-        return tr("There is a branch \"%1\" already.").arg(branch.name);
-    if (branch.start == branch.end)
-        return tr("The chainages of the two ends of a branch have to differ.");
-    return {};
+    if (branches.empty())
+        return;
+    const auto rows = MakeBranchRows(*this);
+    auto added = rows->NewRows(branches.size());
+    for (std::size_t i = 0; i < branches.size(); ++i) {
+        branches[i].SortChannel();
+        *static_cast<CNetworkBranch*>(added->At(i)) = std::move(branches[i]);
+    }
+    UndoStack().beginMacro(text);
+    if (system != m_network.system)
+        UndoStack().push(new CSetValue<QString>(*this, text, m_network.system, system));
+    UndoStack().push(new CInsertLines(*this, rows, rows->Count(), std::move(added)));
+    UndoStack().endMacro();
 }

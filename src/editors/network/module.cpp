@@ -2,6 +2,7 @@
 
 #include "editors/network/import_branches.h"
 #include "editors/network/view.h"
+#include "grid/grid_texts.h"
 #include "ks/fc/doc_template.h"
 #include "ks/language/language.h"
 
@@ -40,6 +41,7 @@ void NetworkModule::LoadResources()
 {
     InitResources();
     KsLangLoadResDll("Kavo0_nw", &g_texts, 0);
+    GridTexts::Load();
 }
 
 void NetworkModule::FreeResources()

@@ -1,13 +1,12 @@
 #include "editors/network/view.h"
 
-#include "editors/common/quantity.h"
-
 #include <QLabel>
 #include <QSplitter>
 #include <QVBoxLayout>
 #include <algorithm>
+#include <utility>
 
-CNetworkView::CNetworkView(QWidget* parent) : CProjectView(parent)
+CNetworkView::CNetworkView(QWidget* parent) : CTablesView(parent)
 {
     setObjectName(QStringLiteral("networkView"));
     m_refresh.setSingleShot(true);
@@ -34,7 +33,6 @@ void CNetworkView::OnInitialUpdate()
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(splitter);
     setFocusProxy(m_map);
-    Retranslate();
 
     connect(m_map, &CNetworkMap::PickedChanged, this, &CNetworkView::PickedChanged);
     connect(m_map, &CNetworkMap::DeleteRequested, this, &CNetworkView::DeleteLocation);
@@ -42,8 +40,7 @@ void CNetworkView::OnInitialUpdate()
         if (const auto menu = MapMenu(); !menu->isEmpty())
             menu->exec(at);
     });
-    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CNetworkView::UnitsChanged);
-    CProjectView::OnInitialUpdate();
+    CTablesView::OnInitialUpdate();
     m_source = std::make_unique<CLocationSource>(*Document(), *this);
     LocationsChanged();
 }
@@ -53,105 +50,62 @@ void CNetworkView::OnInitialUpdate()
 void CNetworkView::MakeTables(QSplitter* splitter)
 {
     auto* side = new QSplitter(Qt::Vertical);
-    m_branchTable = new CBranchTable(*Document(), this);
-    m_channelTable = new CChannelTable(*Document(), this);
-    m_branches = MakeTable(m_branchTable, "branchTable");
-    m_channel = MakeTable(m_channelTable, "channelTable");
-    m_branchTitle = new QLabel;
-    m_channelTitle = new QLabel;
-    m_channelTitle->setWordWrap(true);
-    for (const auto& [title, table] : {std::pair(m_branchTitle, m_branches), std::pair(m_channelTitle, m_channel)}) {
-        auto* pane = new QWidget;
-        auto* layout = new QVBoxLayout(pane);
-        layout->setContentsMargins(6, 6, 6, 6);
-        layout->addWidget(title);
-        layout->addWidget(table);
-        title->setBuddy(table);
-        side->addWidget(pane);
-    }
+    m_branches = AddTable(*side, m_branchTitle, "branchTable");
+    m_channel = AddTable(*side, m_channelTitle, "channelTable");
+    AddBranchColumns(*m_branches->Model());
+    AddChannelColumns(*m_channel->Model());
+    m_branches->ShowRows(*Document(), MakeBranchRows(*Document()));
     splitter->addWidget(side);
-    connect(m_branches->selectionModel(), &QItemSelectionModel::currentRowChanged, this,
-            &CNetworkView::CurrentBranchChanged);
-    connect(Document(), &CNetworkDoc::NetworkChanged, this, &CNetworkView::NetworkChanged);
-    if (m_branchTable->rowCount() > 0)
-        m_branches->GoTo(0, CBranchTable::Name);
-    CurrentBranchChanged();
 }
 
-CLinesView* CNetworkView::MakeTable(CNetworkTable* model, const char* name)
+int CNetworkView::CurrentBranch() const
 {
-    auto* table = new CLinesView(model, QString::fromLatin1(name));
-    for (const auto& [key, run] : {std::pair(Qt::Key_Delete, &CNetworkView::DeleteLines),
-                                   std::pair(Qt::Key_Insert, &CNetworkView::InsertLine)}) {
-        auto* action = new QAction(table);
-        action->setShortcut(key);
-        action->setShortcutContext(Qt::WidgetShortcut);
-        connect(action, &QAction::triggered, this, run);
-        table->addAction(action);
-    }
-    // It waits until the cell's editor has closed: that would commit once more to where its line stood before.
-    connect(model, &CNetworkTable::LineMoved, table, &CLinesView::GoTo, Qt::QueuedConnection);
-    return table;
+    return std::min(m_branches->CurrentRow(), int(Document()->Network().branches.size())) - 1;
 }
 
-/// A table that was filled anew has no current line: it goes on with the one that stands there now.
-void CNetworkView::NetworkChanged()
+void CNetworkView::LineCurrent(CGenGrid& grid)
 {
-    const int lines = m_branchTable->rowCount();
-    if (!m_branches->currentIndex().isValid() && lines > 0)
-        m_branches->GoTo(std::clamp(m_channelTable->Branch(), 0, lines - 1), CBranchTable::Name);
-    CurrentBranchChanged();
+    if (&grid == m_branches)
+        ShowChannel();
 }
 
-void CNetworkView::CurrentBranchChanged()
+void CNetworkView::ShowDocument()
 {
-    const int branch = m_branches->currentIndex().row();
-    m_channelTable->SetBranch(branch);
+    m_branches->Reload();
+    ShowChannel();
+}
+
+void CNetworkView::ShowChannel()
+{
+    const int branch = CurrentBranch();
+    if (std::exchange(m_channelOf, branch) != branch)
+        m_channel->ShowRows(*Document(), MakeChannelRows(*Document(), branch));
+    m_channel->setEnabled(branch >= 0);
+    m_channel->Refresh();
     m_map->SetCurrentBranch(branch);
-    const auto& branches = Document()->Network().branches;
-    const bool some = branch >= 0 && std::size_t(branch) < branches.size();
-    m_channelTitle->setText(
-        some ? tr("Cha&nnel of %1").arg(QString(branches[std::size_t(branch)].name).replace(u'&', QStringLiteral("&&")))
-             : tr("Cha&nnel"));
+    const QString name = branch >= 0 ? Document()->Network().branches[std::size_t(branch)].name : QString();
+    m_channelTitle->setText(branch >= 0 ? tr("Cha&nnel of %1").arg(QString(name).replace(u'&', QStringLiteral("&&")))
+                                        : tr("Cha&nnel"));
 }
 
-CLinesView* CNetworkView::FocusTable() const
+/// A line of a channel is shown once its branch is current.
+void CNetworkView::RevealChange(const ChangePlace& place)
 {
-    for (CLinesView* table : {m_branches, m_channel}) {
-        const QWidget* focus = QApplication::focusWidget();
-        if (table && (table == focus || table->isAncestorOf(focus)))
-            return table;
-    }
-    return nullptr;
+    const bool isChannel = place.list == &Document()->Network().branches;
+    if (!isChannel && place.data != &Document()->Network().branches)
+        return;
+    const int column = std::max(place.column, 1);
+    m_branches->SetCurrentCell(isChannel ? place.listRow : place.row, isChannel ? m_branches->CurrentColumn() : column);
+    if (isChannel)
+        m_channel->SetCurrentCell(place.row, column);
+    if (IsActive())
+        (isChannel ? m_channel : m_branches)->setFocus(Qt::OtherFocusReason);
 }
 
 void CNetworkView::InsertLine()
 {
-    const int row = m_channelTable->InsertLine(m_channel->currentIndex().row());
-    if (row < 0)
-        return;
-    m_channel->GoTo(row, CChannelTable::Chainage);
+    m_channel->InsertLine();
     m_channel->setFocus();
-}
-
-void CNetworkView::DeleteLines()
-{
-    const CLinesView* table = FocusTable();
-    if (!table)
-        return;
-    std::vector<int> rows;
-    const auto selected = table->selectionModel()->selectedRows();
-    for (const QModelIndex& index : selected)
-        rows.push_back(index.row());
-    static_cast<CNetworkTable*>(table->model())->RemoveLines(rows);
-}
-
-void CNetworkView::UnitsChanged()
-{
-    m_branchTable->Reload();
-    m_channelTable->Reload();
-    m_branches->FitColumns();
-    m_channel->FitColumns();
 }
 
 void CNetworkView::Retranslate()
@@ -159,28 +113,4 @@ void CNetworkView::Retranslate()
     m_branchTitle->setText(tr("&Branches"));
     m_branches->setAccessibleName(tr("Branches of the river network"));
     m_channel->setAccessibleName(tr("Radius and width along the current branch"));
-    CurrentBranchChanged();
-    m_branchTable->Reload();
-    m_channelTable->Reload();
-    m_branches->FitColumns();
-    m_channel->FitColumns();
-}
-
-void CNetworkView::changeEvent(QEvent* event)
-{
-    if (event->type() == QEvent::LanguageChange && m_map)
-        Retranslate();
-    CProjectView::changeEvent(event);
-}
-
-/// Hint 1 of the shell: what is being typed moves into the document.
-void CNetworkView::OnUpdate(CView*, int hint, CHint*)
-{
-    if (hint == CKsDoc::StoreHint)
-        MayLeave(KsLeave::Field);
-}
-
-bool CNetworkView::MayLeave(KsLeave)
-{
-    return !m_map || (m_branches->Store() && m_channel->Store());
 }

@@ -1,10 +1,14 @@
 // The commands of the network's view, and the import.
 #include "editors/network/import_dialog.h"
 #include "editors/network/view.h"
+#include "grid/grid_widths.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
 
+#include <QApplication>
 #include <QFileInfo>
+#include <algorithm>
+#include <iterator>
 
 namespace {
 constexpr double ZoomStep = 1.4;
@@ -40,12 +44,12 @@ std::vector<CKsMenuCommand> CNetworkView::LinesMenu() const
                         QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_I), tr("Reads lines of a GIS file as branches")});
         menu.emplace_back();
     }
-    menu.push_back(
-        {NetworkCommand::InsertLine, tr("&Insert Line"), {}, tr("Adds a line to the channel of the branch")});
-    menu.push_back(
-        {NetworkCommand::DeleteLine, tr("&Delete Lines"), {}, tr("Deletes the selected lines of the table")});
+    menu.push_back({Command::InsertLine, tr("&Insert Line"), {}, tr("Adds a line to the channel of the branch")});
+    menu.push_back({Command::DeleteLine, tr("&Delete Lines"), {}, tr("Deletes the selected lines of the table")});
     menu.emplace_back();
-    menu.push_back({NetworkCommand::FitAll, tr("Show &All"), {}, tr("Shows the whole network on the map")});
+    std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
+    menu.emplace_back();
+    menu.push_back({NetworkCommand::FitAll, tr("Sho&w All"), {}, tr("Shows the whole network on the map")});
     menu.push_back({NetworkCommand::ZoomIn, tr("&Zoom In"), {}, tr("Enlarges the map")});
     menu.push_back({NetworkCommand::ZoomOut, tr("Zoom &Out"), {}, tr("Makes the map smaller")});
     return menu;
@@ -58,16 +62,16 @@ bool CNetworkView::IsCommandEnabled(int id) const
     switch (id) {
     case NetworkCommand::Import:
         return CanImport();
-    case NetworkCommand::InsertLine:
-        return m_branches->currentIndex().isValid();
-    case NetworkCommand::DeleteLine:
-        return FocusTable() && FocusTable()->selectionModel()->hasSelection();
+    case Command::InsertLine:
+        return CurrentBranch() >= 0;
+    case Command::DeleteLine: // the key means something else on the map
+        return Lines().isAncestorOf(QApplication::focusWidget()) && CTablesView::IsCommandEnabled(id);
     case NetworkCommand::FitAll:
     case NetworkCommand::ZoomIn:
     case NetworkCommand::ZoomOut:
         return !Document()->Network().branches.empty();
     default:
-        return false;
+        return CTablesView::IsCommandEnabled(id);
     }
 }
 
@@ -75,19 +79,10 @@ bool CNetworkView::OnCommand(int id)
 {
     if (!IsCommandEnabled(id))
         return false;
-    const bool changes =
-        id == NetworkCommand::Import || id == NetworkCommand::InsertLine || id == NetworkCommand::DeleteLine;
-    if (changes && !MayLeave(KsLeave::Field))
-        return true; // the user has been told
     switch (id) {
     case NetworkCommand::Import:
-        AskForImport();
-        break;
-    case NetworkCommand::InsertLine:
-        InsertLine();
-        break;
-    case NetworkCommand::DeleteLine:
-        DeleteLines();
+        if (MayLeave(KsLeave::Field))
+            AskForImport();
         break;
     case NetworkCommand::FitAll:
         m_map->FitAll();
@@ -98,6 +93,8 @@ bool CNetworkView::OnCommand(int id)
     case NetworkCommand::ZoomOut:
         m_map->Zoom(1 / ZoomStep);
         break;
+    default:
+        return CTablesView::OnCommand(id);
     }
     return true;
 }
@@ -131,7 +128,8 @@ void CNetworkView::Import(const QString& path)
     const QString report = ImportReport(dialog.Import(), Document()->Network());
     const auto first = static_cast<int>(Document()->Network().branches.size());
     Document()->AppendBranches(dialog.Import().plan.branches, dialog.NetworkSystem(), tr("Import Branches"));
-    m_branches->GoTo(first, CBranchTable::Name);
+    m_branches->SetCurrentCell(first + 1, BranchName + 1);
+    m_branches->Widths().MakeRoom();
     m_map->FitAll();
     CImportReportDialog(report, this).exec();
 }

@@ -40,7 +40,7 @@ LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
     const bool known = request == KsRequest::FetchLocation || request == KsRequest::BranchNames ||
                        request == KsRequest::LoadLocationsAndChannel || request == KsRequest::LocationShown;
     if (!known)
-        return CProjectView::OnRequest(request, package);
+        return CTablesView::OnRequest(request, package);
     if (!package.objects) {
         qDebug("network: request %llu without a list", static_cast<unsigned long long>(request));
         return 0;
@@ -49,7 +49,7 @@ LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
     case KsRequest::FetchLocation:
         return FetchLocation(*package.objects);
     case KsRequest::BranchNames:
-        return BranchNames(*package.objects);
+        return ListBranches(*package.objects);
     case KsRequest::LoadLocationsAndChannel:
         return FillChannel(*package.objects);
     default:
@@ -69,7 +69,7 @@ LRESULT CNetworkView::FetchLocation(CObList& objects) const
     return 1;
 }
 
-LRESULT CNetworkView::BranchNames(CObList& objects) const
+LRESULT CNetworkView::ListBranches(CObList& objects) const
 {
     QStringList branches;
     for (const CNetworkBranch& branch : Document()->Network().branches)
@@ -131,7 +131,7 @@ void CNetworkView::LocationsChanged()
 
 void CNetworkView::showEvent(QShowEvent* event)
 {
-    CProjectView::showEvent(event);
+    CKsProjectView::showEvent(event);
     if (m_stale && m_map)
         m_refresh.start();
 }
@@ -169,8 +169,8 @@ void CNetworkView::PickedChanged()
 {
     const auto picked = m_map->Picked();
     const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
-    if (branch >= 0 && branch != m_branches->currentIndex().row())
-        m_branches->GoTo(branch, CBranchTable::Name);
+    if (branch >= 0 && branch != CurrentBranch())
+        m_branches->SetCurrentCell(branch + 1, BranchName + 1);
 }
 
 std::unique_ptr<QMenu> CNetworkView::MapMenu()

@@ -4,6 +4,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/system_reason.h"
 
+#include <QApplication>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
@@ -15,6 +16,7 @@ CKsDoc::CKsDoc() : m_undo(new QUndoStack(this))
 {
     // Undoing back to what was saved leaves nothing to save.
     connect(m_undo, &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
+    connect(m_undo, &QUndoStack::indexChanged, this, &CKsDoc::StepMade);
 }
 
 CKsDoc::~CKsDoc()
@@ -94,6 +96,24 @@ void CKsDoc::UpdateAllViews(CView* sender, int hint, CHint* object)
         if (view != sender && std::find(m_views.begin(), m_views.end(), view) != m_views.end())
             view->OnUpdate(sender, hint, object);
     }
+}
+
+void CKsDoc::UpdateAll(CView* sender, int hint, CHint* object)
+{
+    SetModifiedFlag(true);
+    UpdateAllViews(sender, hint, object);
+    if (sender && !sender->isAncestorOf(QApplication::focusWidget()))
+        sender->setFocus();
+}
+
+/// What a complete step that was undone or redone has changed.
+void CKsDoc::StepMade(int index)
+{
+    const bool isUndo = index < std::exchange(m_steps, index);
+    if (!m_stepShows)
+        return; // a new step
+    emit Reveal(*std::exchange(m_stepShows, std::nullopt));
+    Say(isUndo ? tr("Undone: %1").arg(m_undo->redoText()) : tr("Redone: %1").arg(m_undo->undoText()));
 }
 
 void CKsDoc::AddView(CView* view)

@@ -1,11 +1,13 @@
 // Documents and views of the shell.
 #pragma once
 
+#include "ks/fc/change_place.h"
 #include "ks/fc/messages.h"
 #include "ks/fc/types.h"
 
 #include <QObject>
 #include <QWidget>
+#include <optional>
 #include <vector>
 
 class CKsDoc;
@@ -93,10 +95,17 @@ public:
     bool IsModified() const { return m_modified; }
     void SetModifiedFlag(bool modified = true);
 
-    /// Hint by which every editor's views move the values being edited into the document.
-    static constexpr int StoreHint = 1;
+    // Hints by which every editor's views move the values being edited into the document, and show the document again.
+    static constexpr int StoreHint = 1, ReloadHint = 2;
     /// Calls OnUpdate of every view but the sender.
     void UpdateAllViews(CView* sender, int hint = 0, CHint* object = nullptr);
+    /// The content changed: marks the document modified, updates all views but the sender, and gives the sender the
+    /// focus back. Every command of the undo stack calls it (CDocumentCommand).
+    virtual void UpdateAll(CView* sender = nullptr, int hint = ReloadHint, CHint* object = nullptr);
+    /// A step that is being undone or redone shows here; told (Reveal) when the step is complete.
+    void StepShows(const ChangePlace& place) { m_stepShows = place; }
+    /// Tells the user in passing.
+    void Say(const CString& text) { emit Said(text); }
     const std::vector<CView*>& Views() const { return m_views; }
     void AddView(CView* view);
     void RemoveView(CView* view);
@@ -107,10 +116,15 @@ public:
 signals:
     void TitleChanged(); // path, title or modified flag
     void PathNameChanged(const CString& oldPath, const CString& newPath);
+    /// A step was undone or redone; the view brings what it changed into view.
+    void Reveal(const ChangePlace& place);
+    /// What was done, for the status bar.
+    void Said(const CString& text);
 
 private:
     friend class CMultiDocTemplate;
     CString AskSavePath();
+    void StepMade(int index);
 
     CString m_path, m_title;
     std::vector<CView*> m_views;
@@ -118,4 +132,6 @@ private:
     CMultiDocTemplate* m_template = nullptr;
     bool m_modified = false, m_executing = false;
     bool m_named = false; // SetPathName was called during a save
+    std::optional<ChangePlace> m_stepShows;
+    int m_steps = 0; // the undo stack's index, as last heard
 };

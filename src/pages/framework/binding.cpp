@@ -3,7 +3,7 @@
 #include "data/global_var.h"
 #include "ks/units/edit_fields.h"
 #include "document/document.h"
-#include "pages/framework/commands.h"
+#include "document/store_value.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"
 #include "res/strings.h"

@@ -3,6 +3,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/wnd_resizer.h"
 #include "document/list_rows.h"
+#include "grid/grid_texts.h"
 
 #include <QUndoStack>
 
@@ -146,7 +147,7 @@ GridColumns CLocationPage::GridWithGlobals(CGenGrid* grid, void* globals)
 
 GridColumns CLocationPage::Grid(CGenGrid* grid)
 {
-    grid->SetOwnerPage(this);
+    SetGrid(grid);
     CWndResizer(this).SetAnchor(grid, CWndResizer::All);
     ShowList(m_list);
     connect(grid->selectionModel(), &QItemSelectionModel::currentRowChanged, this, &CLocationPage::ShowParts);
@@ -164,10 +165,18 @@ void CLocationPage::ShowList(CGenList* list)
 
 GridColumns CLocationPage::AddPart(CGenGrid* grid, std::shared_ptr<IRowSource> rows, RowsOfLine rowsOfLine)
 {
-    grid->SetPartOfPage(this);
+    AddPartGrid(grid);
     grid->Model()->SetSource(*GetDocument(), std::move(rows));
     m_parts.push_back({grid, std::move(rowsOfLine)});
     return GridColumns(*grid);
+}
+
+std::size_t CLocationPage::RowOf(const CGenList& list, const HD_RiverPos& record)
+{
+    std::size_t row = 0;
+    while (row < list.GetCount() && &list.GetAt(row) != &record)
+        ++row;
+    return row;
 }
 
 HD_RiverPos* CLocationPage::CurrentRecord() const
@@ -257,8 +266,8 @@ void CLocationPage::InsertLocation(const QString& riverName, const QString& chai
     }
     StoreToDocument();
     const int row = model.StoredRows();
-    model.Paste(row, 0, {{riverName, chainageText}}, LoadString(Str::UndoInsert));
-    GetDocument()->Say(LoadString(Str::LineInserted));
+    model.Paste(row, 0, {{riverName, chainageText}}, GridTexts::tr("Insertion of lines"));
+    GetDocument()->Say(GridTexts::tr("Line inserted"));
     GetGrid()->SetCurrentCell(row + 1, 1);
 }
 

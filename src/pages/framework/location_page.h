@@ -3,8 +3,8 @@
 
 #include "document/document.h"
 #include "grid/gen_grid.h"
+#include "grid/vector_rows.h"
 #include "pages/framework/page.h"
-#include "document/vector_rows.h"
 #include "res/strings.h"
 
 /// What a column says about itself beyond its field.
@@ -59,7 +59,7 @@ public:
     }
     /// A value of the rows that is no declared field; `kind` says how it is edited.
     GridColumns& Value(CellAccess access, FieldKind kind, UnitGroup unit, ColumnOptions options);
-    /// Push buttons; the page answers them (OnGridButtonClicked).
+    /// Push buttons; the page answers them (ButtonClicked).
     GridColumns& Button(ColumnOptions options);
 
 private:
@@ -118,7 +118,8 @@ protected:
     GridColumns PairsGrid(CGenGrid* grid, std::vector<T> Record::*pairs)
     {
         return AddPart(grid, nullptr, [this, pairs](HD_RiverPos& record) {
-            return std::make_shared<VectorRows<T>>(static_cast<Record&>(record).*pairs, VectorOwner{m_list, &record});
+            const VectorOwner owner{m_list, [list = m_list, &record] { return RowOf(*list, record); }};
+            return std::make_shared<VectorRows<T>>(static_cast<Record&>(record).*pairs, owner);
         });
     }
     /// Has the user choose the file that a cell names.
@@ -135,6 +136,7 @@ private:
         HD_RiverPos* shown = nullptr; // the line whose rows it shows
     };
 
+    static std::size_t RowOf(const CGenList& list, const HD_RiverPos& record);
     GridColumns AddPart(CGenGrid* grid, std::shared_ptr<IRowSource> rows, RowsOfLine rowsOfLine);
     HD_RiverPos* CurrentRecord() const;
     void ShowParts();

@@ -3,6 +3,7 @@
 #include "document/document.h"
 #include "pages/framework/ctrl_edit.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_keys.h"
 #include "pages/framework/page_help.h"
 
 #include <QApplication>
@@ -22,7 +23,7 @@ CGenPropertyPage::~CGenPropertyPage()
 {
     // The controls go after the page, and a cell or field that is being edited must not report to it then.
     for (auto* grid : findChildren<CGenGrid*>())
-        grid->LeavePage();
+        grid->SetHost(nullptr);
     for (auto* field : findChildren<CCtrlEdit*>())
         field->Unbind();
 }
@@ -30,6 +31,18 @@ CGenPropertyPage::~CGenPropertyPage()
 HD_Global_Var& CGenPropertyPage::Globals() const
 {
     return m_document->Parameters().Global;
+}
+
+void CGenPropertyPage::SetGrid(CGenGrid* grid)
+{
+    m_grid = grid;
+    grid->SetHost(this);
+}
+
+void CGenPropertyPage::AddPartGrid(CGenGrid* grid)
+{
+    m_partGrids.push_back(grid);
+    grid->SetHost(this);
 }
 
 void CGenPropertyPage::InsertLocation(const QString&, const QString&) {}
@@ -128,9 +141,48 @@ std::unique_ptr<HD_RiverPos> CGenPropertyPage::GetRecordAt(int) const
     return nullptr;
 }
 
-void CGenPropertyPage::OnGridCellModified(int, int) {}
+// ---- what a grid asks --------------------------------------------------------------------------
 
-void CGenPropertyPage::OnGridButtonClicked(CGenGrid&, int, int) {}
+void CGenPropertyPage::LineEdited(CGenGrid&)
+{
+    if (m_host)
+        return m_host->EditedLineChanged();
+    StoreToDocument();
+    LoadFromDocument(m_document);
+}
+
+void CGenPropertyPage::CellCurrent(CGenGrid&)
+{
+    if (m_host)
+        m_host->CurrentCellChanged();
+}
+
+void CGenPropertyPage::LineCurrent(CGenGrid& grid)
+{
+    if (m_host && &grid == m_grid)
+        m_host->CurrentLocationChanged();
+}
+
+void CGenPropertyPage::Run(CGenGrid&, GridAction action)
+{
+    switch (action) {
+    case GridAction::AppendLine:
+        return AppendLine();
+    case GridAction::DeleteLine:
+        return m_host ? m_host->Execute(Command::DeleteLine) : DeleteLines();
+    case GridAction::Undo:
+    case GridAction::Redo:
+        return UndoRedo(action == GridAction::Undo);
+    default:
+        if (m_host)
+            m_host->Execute(action == GridAction::Search ? Command::Search : Command::SearchAgain);
+    }
+}
+
+QStringList CGenPropertyPage::BranchNames()
+{
+    return m_host ? m_host->BranchNames() : QStringList();
+}
 
 void CGenPropertyPage::OnHelp()
 {

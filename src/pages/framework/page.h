@@ -3,7 +3,8 @@
 
 #include "data/global_var.h"
 #include "ks/units/edit_style.h"
-#include "document/change_place.h"
+#include "grid/grid_host.h"
+#include "ks/fc/change_place.h"
 #include "pages/framework/binding.h"
 #include "pages/framework/page_host.h"
 
@@ -17,7 +18,7 @@ class CGenList;
 class CKavo0_hdDoc;
 class HD_RiverPos;
 
-class CGenPropertyPage : public QWidget
+class CGenPropertyPage : public QWidget, public IGridHost
 {
     Q_OBJECT
 public:
@@ -30,16 +31,16 @@ public:
     IPageHost* GetHost() const { return m_host; }
     /// The page's location grid, null on a page without one.
     CGenGrid* GetGrid() const { return m_grid; }
-    void SetGrid(CGenGrid* grid) { m_grid = grid; }
+    void SetGrid(CGenGrid* grid);
     /// Further grids of the page.
-    void AddPartGrid(CGenGrid* grid) { m_partGrids.push_back(grid); }
+    void AddPartGrid(CGenGrid* grid);
     /// The grid that inserting and deleting lines mean: a further grid while it has the focus, else the
     /// page's grid; null on a page without one.
     CGenGrid* LinesGrid() const;
     /// Takes the texts being typed into cells; false when one is refused (the user has been told).
     bool CommitGrids();
     /// Takes what is being typed while the page stays in front; false when it is refused (the user has been told).
-    bool LeaveField();
+    bool LeaveField() override;
     /// The list that the page's grid edits; null without one.
     virtual CGenList* GetList() const { return nullptr; }
 
@@ -52,9 +53,14 @@ public:
     virtual void StoreToDocument();
     /// A new record with what the row shows; null when there is no such row. The caller owns it.
     virtual std::unique_ptr<HD_RiverPos> GetRecordAt(int row) const;
-    virtual void OnGridCellModified(int row, int column);
-    /// A push button of `grid`, one of the page's.
-    virtual void OnGridButtonClicked(CGenGrid& grid, int row, int column);
+
+    // IGridHost; push buttons are the concrete page's (ButtonClicked).
+    void LineEdited(CGenGrid& grid) override;
+    void CellCurrent(CGenGrid& grid) override;
+    void LineCurrent(CGenGrid& grid) override;
+    void Run(CGenGrid& grid, GridAction action) override;
+    bool CanSearch(const CGenGrid& grid) const override { return &grid == m_grid; }
+    QStringList BranchNames() override;
 
     /// The help command: what the keys do on this page.
     virtual void OnHelp();

@@ -1,6 +1,7 @@
 #include "pages/framework/page_help.h"
 
 #include "grid/grid_keys.h"
+#include "res/strings.h"
 
 #include <QKeySequence>
 #include <QStringList>
@@ -31,15 +32,15 @@ QString PageHelpText(bool hasTables)
     if (!hasTables)
         return text;
     // Keys that do the same stand in one row.
-    std::vector<std::pair<Str, QStringList>> rows;
+    std::vector<std::pair<QString, QStringList>> rows;
     for (const GridKey& key : GridKeys()) {
-        if (rows.empty() || rows.back().first != key.description)
-            rows.push_back({key.description, {}});
+        if (rows.empty() || rows.back().first != key.Text())
+            rows.push_back({key.Text(), {}});
         if (key.key != Qt::Key_Backtab) // the same as Shift+Tab
             rows.back().second << KeyName(key.key, key.held);
     }
     text += QStringLiteral("<p><b>%1</b></p><table>").arg(LoadString(Str::HelpTables).toHtmlEscaped());
     for (const auto& [description, keys] : rows)
-        text += Row(keys.join(QStringLiteral(", ")), LoadString(description));
+        text += Row(keys.join(QStringLiteral(", ")), description);
     return text + QStringLiteral("</table>");
 }

@@ -1,18 +1,14 @@
 // What a page and its grid ask of the view that hosts them.
 #pragma once
 
+#include "grid/grid_search.h"
+
 #include <QStringList>
 
 class CView;
 
-/// Commands of the view, numbered as in the menu and tool bar resources.
 namespace Command {
-inline constexpr int Search = 42600;
-inline constexpr int SearchAgain = 42601;
-inline constexpr int InsertLine = 42602;
-inline constexpr int DeleteLine = 42603;
-inline constexpr int GotoLine = 42604;
-inline constexpr int FetchLocation = 42605;
+inline constexpr int FetchLocation = 42605; // beside those of grid/grid_search.h
 } // namespace Command
 
 class IPageHost
@@ -20,9 +16,8 @@ class IPageHost
 public:
     virtual ~IPageHost() = default;
     virtual CView* HostView() = 0;
-    /// The line just left was edited. `column` is the cell's column, or 1 for a page whose every column is a location.
-    /// The active page is stored, a change of location is told to the project, and all views reload.
-    virtual void EditedLineChanged(int column) = 0;
+    /// The line just left was edited: the active page is stored, and all views reload.
+    virtual void EditedLineChanged() = 0;
     /// Another cell, or another grid, of the active page became the current one.
     virtual void CurrentCellChanged() {}
     /// Another row of the active page's list became current.

@@ -5,7 +5,6 @@
 #include "editors/cross_sections/view.h"
 #include "editors/editor_fixture.h"
 
-#include <QTableView>
 #include <cmath>
 #include <functional>
 
@@ -104,15 +103,6 @@ protected:
         if (view)
             view->Sections()->setFocus();
         return view;
-    }
-    static void Select(QTableView* table, int row) { table->setCurrentIndex(table->model()->index(row, 0)); }
-    static QString Text(const QTableView* table, int row, int column, int role = Qt::DisplayRole)
-    {
-        return table->model()->index(row, column).data(role).toString();
-    }
-    static bool Edit(QTableView* table, int row, int column, const QString& text)
-    {
-        return table->model()->setData(table->model()->index(row, column), text);
     }
     static void UndoAll(CCrossSectionView* view)
     {

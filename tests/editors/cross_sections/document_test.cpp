@@ -11,10 +11,11 @@ TEST_F(CrossSectionTest, ChangesAreTracedToldAndSaved)
     EXPECT_EQ(log, QStringList{"shell 25"}) << "nobody asked for the first section";
     EXPECT_EQ(view->CurrentSection(), 0);
     log.clear();
-    EXPECT_TRUE(Edit(view->Sections(), Main1000, CSectionTable::Width, "12"));
+    EXPECT_TRUE(Edit(view->Sections(), Main1000, SectionWidth, "12"));
     EXPECT_TRUE(document->IsModified());
     document->UndoStack().undo();
     EXPECT_FALSE(document->IsModified());
+    QCoreApplication::processEvents(); // news wait for the end of the event
     EXPECT_EQ(log, QStringList({"others 522", "others 522"}));
     document->UndoStack().redo();
     ASSERT_TRUE(document->DoSave(folder.filePath("saved.kvxs")));
@@ -39,7 +40,7 @@ TEST_F(CrossSectionTest, OutsideAProjectNobodyIsTold)
     CCrossSectionView* view = Open();
     log.clear();
     Select(view->Sections(), Side300);
-    EXPECT_TRUE(Edit(view->Sections(), Side300, CSectionTable::Radius, "99"));
+    EXPECT_TRUE(Edit(view->Sections(), Side300, SectionRadius, "99"));
     EXPECT_TRUE(log.isEmpty()) << log.join(' ').toStdString();
     project = 9;
     KsSendMessage(view, KsMessage::ProjectManagement(), KsRequest::ProjectOpened, 0);
@@ -50,9 +51,7 @@ TEST_F(CrossSectionTest, WhatIsBeingTypedIsSaved)
 {
     CCrossSectionView* view = Open();
     Select(view->Points(), 0);
-    view->Points()->setFocus();
-    view->Points()->edit(view->Points()->model()->index(0, CPointTable::Level));
-    QTest::keyClicks(QApplication::focusWidget(), "4.25");
+    Type(view->Points(), 0, PointLevel, "4.25");
     ASSERT_TRUE(view->Document()->DoSave(folder.filePath("typed.kvxs")));
     EXPECT_TRUE(Read(folder.filePath("typed.kvxs")).contains("Point = -5, 4.25"));
 }

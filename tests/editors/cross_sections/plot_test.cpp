@@ -57,14 +57,14 @@ TEST_F(CrossSectionTest, ThePlotFollowsEditsSelectionAndUnits)
     Select(view->Sections(), Main2500);
     CSectionPlot* plot = view->Plot();
     const CPlotStyle style(plot->palette());
-    EXPECT_TRUE(Edit(view->Sections(), Main2500, CSectionTable::Width, "28"));
+    EXPECT_TRUE(Edit(view->Sections(), Main2500, SectionWidth, "28"));
     ASSERT_TRUE(plot->Water().has_value());
     EXPECT_NEAR(plot->Water()->level, 109, 1e-6);
     EXPECT_TRUE(IsLike(ColourAt(plot, 14.3, 108.3), style.water));
-    EXPECT_TRUE(Edit(view->Sections(), Main2500, CSectionTable::Width, "31"));
+    EXPECT_TRUE(Edit(view->Sections(), Main2500, SectionWidth, "31"));
     EXPECT_FALSE(plot->Water().has_value()) << "wider than the section";
     EXPECT_FALSE(Has(plot->grab().toImage(), style.water));
-    EXPECT_TRUE(Edit(view->Points(), 1, CPointTable::Level, "109"));
+    EXPECT_TRUE(Edit(view->Points(), 1, PointLevel, "109"));
     EXPECT_TRUE(IsLike(ColourAt(plot, 9.3, 104.3), style.soil)) << "there was nothing before";
     view->Document()->UndoStack().undo();
     EXPECT_TRUE(IsLike(ColourAt(plot, 9.3, 104.3), style.paper));

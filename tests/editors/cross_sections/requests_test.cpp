@@ -19,11 +19,11 @@ TEST_F(CrossSectionTest, LocationsComeByBranchAndChainage)
     }
     EXPECT_EQ(places, QStringList({"MAIN 1", "MAIN 1000", "MAIN 2500.5", "MAIN 2500.5", "SIDE 300"}));
     // Edited lines stay where they are in the table, not in the answer.
-    EXPECT_TRUE(Edit(view->Sections(), Main1000, CSectionTable::Chainage, "9000"));
+    EXPECT_TRUE(Edit(view->Sections(), Main1000, SectionChainage, "9000"));
     objects.clear();
     Ask(view, KsRequest::LoadLocations, &objects);
     EXPECT_EQ(dynamic_cast<const CKvrCBELocation&>(*objects.at(2)).chainage, 9000);
-    view->Document()->RemoveSections({0, 1, 2, 3}, "x");
+    Remove(*view->Document(), view->Sections()->Model()->Rows(), 0, SmallRows);
     objects.clear();
     EXPECT_EQ(Ask(view, KsRequest::LoadLocations, &objects), 0);
     EXPECT_EQ(objects.size(), 0u);
@@ -33,7 +33,7 @@ TEST_F(CrossSectionTest, LocationsComeByBranchAndChainage)
 TEST_F(CrossSectionTest, RadiusAndWidthAreFilledWhereTheyAreMissing)
 {
     CCrossSectionView* view = Open();
-    EXPECT_TRUE(Edit(view->Sections(), Main2500, CSectionTable::Width, "")); // the later survey has it
+    EXPECT_TRUE(Edit(view->Sections(), Main2500, SectionWidth, "")); // the later survey has it
     struct Case
     {
         const char* branch;
@@ -122,26 +122,19 @@ TEST_F(CrossSectionTest, APlaceShownElsewhereNeitherExtendsASelectionNorDisturbs
         QTest::keyPress(view->window()->windowHandle(), key, modifier);
         show("SIDE", 300);
         show("MAIN", 2500);
-        const auto rows = view->Sections()->selectionModel()->selectedRows();
+        const auto rows = view->Sections()->selectionModel()->selectedIndexes();
         EXPECT_EQ(rows.size(), 1) << modifier;
         EXPECT_EQ(rows.value(0).row(), Main2500) << modifier;
         QTest::keyRelease(view->window()->windowHandle(), key);
     }
-    view->Points()->setFocus();
-    view->Points()->GoTo(1, CPointTable::Level);
-    QTest::keyClick(view->Points(), Qt::Key_F2);
-    auto* editor = view->Points()->findChild<QLineEdit*>();
+    auto* editor = Type(view->Points(), 1, PointLevel, "10");
     ASSERT_NE(editor, nullptr);
-    editor->selectAll();
-    QTest::keyClicks(editor, "10");
     show("SIDE", 300);
     EXPECT_EQ(view->CurrentSection(), Main2500);
     QTest::keyClicks(editor, "1.5");
     EXPECT_TRUE(view->MayLeave(KsLeave::Field));
     EXPECT_EQ(view->Document()->Sections().sections[Main2500].points[1].level, 101.5);
-    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete); // the editor before
-    QTest::keyClick(view->Points(), Qt::Key_F2);
-    QTest::keyClicks(view->Points()->findChild<QLineEdit*>(), "x");
+    Type(view->Points(), 1, PointLevel, "x");
     EXPECT_FALSE(view->MayLeave(KsLeave::Field));
     EXPECT_FALSE(view->MayLeave(KsLeave::Page));
     QCoreApplication::processEvents();

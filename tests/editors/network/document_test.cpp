@@ -19,53 +19,47 @@ TEST_F(NetworkTest, EveryChangeIsUndoneRedoneAndTold)
     QUndoStack& undo = document.UndoStack();
     std::vector<CNetworkBranch> more(3);
     more[0].name = "A", more[1].name = "B", more[2].name = "C";
-    CNetworkBranch side = document.Network().branches[1];
-    side.name = "LEFT";
-    side.channel = {{300, 1, 2}, {100, 3, 4}};
+    more[0].channel = {{300, 1, 2}, {100, 3, 4}};
 
     const QStringList states[] = {
-        {"MAIN", "SIDE"}, {"MAIN", "SIDE", "A", "B", "C"}, {"MAIN", "LEFT", "A", "B", "C"}, {"LEFT", "B"}};
-    const std::function<void()> changes[] = {[&] { document.AppendBranches(more, "append"); },
-                                             [&] { document.ReplaceBranch(1, side, "replace"); },
-                                             [&] {
-                                                 document.RemoveBranches({4, 0, 2}, "remove");
-                                             }};
+        {"MAIN", "SIDE"}, {"MAIN", "SIDE", "A", "B", "C"}, {"MAIN", "LEFT", "A", "B", "C"}, {"LEFT", "A", "B", "C"}};
+    const std::function<void()> changes[] = {
+        [&] { document.AppendBranches(more, "EPSG:25832", "append"); },
+        [&] { Edit(view->Branches(), 1, BranchName, " LEFT "); },
+        [&] { Remove(document, view->Branches()->Model()->Rows(), 0, 1); }};
     for (int i = 0; i < 3; ++i) {
         log.clear();
         changes[i]();
+        QCoreApplication::processEvents(); // news wait for the end of the event
         EXPECT_EQ(Names(document), states[i + 1]);
         EXPECT_EQ(log.count("others 522"), 1) << i;
         EXPECT_TRUE(document.IsModified());
     }
-    EXPECT_EQ(document.Network().branches[0].channel[0].chainage, 100); // sorted
+    EXPECT_EQ(document.Network().branches[1].channel[0].chainage, 100); // sorted
+    EXPECT_EQ(document.Network().system, "EPSG:25832");
     for (int round = 0; round < 2; ++round) {
         for (int i = 2; i >= 0; --i) {
             undo.undo();
             EXPECT_EQ(Names(document), states[i]);
         }
         EXPECT_FALSE(document.IsModified());
+        EXPECT_EQ(document.Network().system, "");
         EXPECT_EQ(document.Network().branches[0].line.size(), 3u);
         for (int i = 0; i < 3; ++i) {
             undo.redo();
             EXPECT_EQ(Names(document), states[i + 1]);
         }
     }
-    log.clear();
-    document.RemoveBranches({}, "nothing");
-    document.AppendBranches({}, "nothing");
+    document.AppendBranches({}, "EPSG:4326", "nothing");
     EXPECT_EQ(undo.count(), 3);
-    EXPECT_TRUE(log.isEmpty());
 }
 
 TEST_F(NetworkTest, TheReferenceFollowsTheNetwork)
 {
     CNetworkView* view = Open();
     EXPECT_EQ(view->Document()->Reference().PointAt(0, 4000), QPointF(3000, 0));
-    CNetworkBranch main = view->Document()->Network().branches[0];
-    main.start = 0;
-    main.end = 14000;
-    view->Document()->ReplaceBranch(0, main, "x");
-    EXPECT_EQ(view->Document()->Reference().PointAt(0, 6000), QPointF(3000, 0));
+    EXPECT_TRUE(Edit(view->Branches(), 0, BranchFrom, "2750"));
+    EXPECT_EQ(view->Document()->Reference().PointAt(0, 5000), QPointF(3000, 0));
     view->Document()->UndoStack().undo();
     EXPECT_EQ(view->Document()->Reference().PointAt(0, 4000), QPointF(3000, 0));
 }
@@ -82,7 +76,8 @@ TEST_F(NetworkTest, AViewJoinsItsProjectAndLeavesIt)
     project = 0; // a file of no project
     view = Open();
     log.clear();
-    view->Document()->RemoveBranches({0}, "x");
+    Remove(*view->Document(), view->Branches()->Model()->Rows(), 0, 1);
+    QCoreApplication::processEvents();
     EXPECT_EQ(view->Document()->ProjectViews(view).size(), 0u);
     EXPECT_TRUE(log.isEmpty()) << log.join(';').toStdString();
     project = 9; // now its project is opened

@@ -314,7 +314,7 @@ TEST_F(ImportTest, TheDialogShowsWhatItGivesAndDoesNothingBeforeItIsAccepted)
     EXPECT_EQ(view->Document()->Network().system, "") << "where its other branches lie is not known";
     EXPECT_EQ(view->Branches()->currentIndex().row(), 2);
     const int name = view->Branches()->fontMetrics().horizontalAdvance("RIVER WITH A RATHER LONG NAME");
-    EXPECT_GT(view->Branches()->columnWidth(CBranchTable::Name), name);
+    EXPECT_GT(view->Branches()->columnWidth(BranchName), name);
     EXPECT_TRUE(boxes.isEmpty());
     EXPECT_EQ(view->Document()->UndoStack().count(), 1);
     view->Document()->UndoStack().undo();

@@ -86,9 +86,7 @@ TEST_F(NetworkTest, ABadFileSaysWhereAndWhat)
 TEST_F(NetworkTest, ASaveThatFailsTellsWhyAndLeavesTheDocumentModified)
 {
     CNetworkView* view = Open();
-    auto branch = view->Document()->Network().branches[0];
-    branch.name = "OTHER";
-    view->Document()->ReplaceBranch(0, branch, "x");
+    EXPECT_TRUE(Edit(view->Branches(), 0, BranchName, "OTHER"));
     const QString nowhere = folder.filePath("missing/river.kvnw");
     EXPECT_FALSE(view->Document()->DoSave(nowhere));
     ASSERT_EQ(boxes.size(), 1);

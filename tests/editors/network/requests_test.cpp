@@ -18,7 +18,7 @@ TEST_F(NetworkTest, ThePickedPlaceIsFetched)
     ASSERT_NE(place, nullptr);
     EXPECT_EQ(place->branch, "MAIN");
     EXPECT_EQ(place->chainage, 2500);
-    view->Document()->RemoveBranches({0}, "x"); // the place is gone
+    Remove(*view->Document(), view->Branches()->Model()->Rows(), 0, 1); // the place is gone
     EXPECT_EQ(Ask(view, KsRequest::FetchLocation, &objects), 0);
 }
 
@@ -76,9 +76,11 @@ TEST_F(NetworkTest, ABranchIsTheOneWhoseCapitalsAreTheSame)
     names.push_back(std::move(known));
     EXPECT_EQ(Ask(view, KsRequest::BranchNames, &names), 1);
     EXPECT_EQ(names.size(), 2u);
-    CNetworkBranch twin = view->Document()->Network().branches[0];
-    twin.name = "weisse elster";
-    EXPECT_NE(view->Document()->WhyNot(-1, twin), QString()) << "the name is taken";
+    const auto rows = view->Branches()->Model()->Rows();
+    const auto twin = rows->NewRows(1);
+    *static_cast<CNetworkBranch*>(twin->At(0)) = view->Document()->Network().branches[0];
+    static_cast<CNetworkBranch*>(twin->At(0))->name = "weisse elster";
+    EXPECT_TRUE(rows->FindFault(rows->Count(), *twin)) << "the name is taken";
 }
 
 TEST_F(NetworkTest, StrangeRequestsDoNothing)

@@ -1,18 +1,18 @@
 // The elements of a vector as the rows of a grid: the pairs of a table, the entries of a list without locations.
 #pragma once
 
-#include "data/gen_list.h"
 #include "grid/row_source.h"
 
 #include <algorithm>
+#include <functional>
 #include <iterator>
 #include <vector>
 
-/// The record that a vector is part of; none for a vector of the global values.
+/// The line of a list that a vector is part of; none for a vector that stands for itself.
 struct VectorOwner
 {
-    CGenList* list = nullptr;
-    HD_RiverPos* record = nullptr;
+    const void* list = nullptr;
+    std::function<std::size_t()> row = {}; // where the line is
 };
 
 /// What a grid shows of a source without rows.
@@ -22,7 +22,7 @@ enum class WhenEmpty
     OneRow // to type into
 };
 
-/// A vector of the document, which exists as long as the document, or as long as the record that owns it.
+/// A vector of the document, which exists as long as the document, or as long as the line that owns it.
 /// A row's key is its place. Elements move in memory, so no address could name one; and a command that holds keys is
 /// only run with the vector as it was when the command was made, undo being strictly backwards.
 template <typename T>
@@ -30,14 +30,20 @@ class VectorRows : public IRowSource
 {
 public:
     explicit VectorRows(std::vector<T>& rows, VectorOwner owner = {}, WhenEmpty whenEmpty = WhenEmpty::Nothing)
-        : m_rows(rows), m_owner(owner), m_whenEmpty(whenEmpty)
+        : m_rows([&rows]() -> std::vector<T>& { return rows; }), m_owner(std::move(owner)), m_whenEmpty(whenEmpty)
+    {
+    }
+    /// A vector that moves in memory: `rows` knows where it is.
+    explicit VectorRows(std::function<std::vector<T>&()> rows, VectorOwner owner = {},
+                        WhenEmpty whenEmpty = WhenEmpty::Nothing)
+        : m_rows(std::move(rows)), m_owner(std::move(owner)), m_whenEmpty(whenEmpty)
     {
     }
 
-    std::size_t Count() const override { return m_rows.size(); }
-    void* At(std::size_t row) override { return &m_rows[row]; }
+    std::size_t Count() const override { return m_rows().size(); }
+    void* At(std::size_t row) override { return &m_rows()[row]; }
     /// With places as keys, only rows behind the end are stale.
-    std::uint64_t Revision() const override { return m_rows.size(); }
+    std::uint64_t Revision() const override { return Count(); }
 
     RowKey KeyAt(std::size_t row) override { return row; }
     void* Object(RowKey key) override { return At(key); }
@@ -51,30 +57,34 @@ public:
     {
         row = std::min(row, Count());
         auto& rows = static_cast<Block&>(*block).rows;
-        m_rows.insert(m_rows.begin() + std::ptrdiff_t(row), std::make_move_iterator(rows.begin()),
-                      std::make_move_iterator(rows.end()));
+        m_rows().insert(m_rows().begin() + std::ptrdiff_t(row), std::make_move_iterator(rows.begin()),
+                        std::make_move_iterator(rows.end()));
         return row;
     }
     std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
     {
-        const auto first = m_rows.begin() + std::ptrdiff_t(row), last = first + std::ptrdiff_t(count);
+        const auto first = m_rows().begin() + std::ptrdiff_t(row), last = first + std::ptrdiff_t(count);
         std::vector<T> taken(std::make_move_iterator(first), std::make_move_iterator(last));
-        m_rows.erase(first, last);
+        m_rows().erase(first, last);
         return std::make_unique<Block>(std::move(taken));
     }
 
-    const void* Data() const override { return &m_rows; }
-    bool MayBeEmpty() const override { return m_whenEmpty == WhenEmpty::Nothing; }
-    CGenList* List() const override { return m_owner.list; }
-    std::size_t ListRow(std::size_t row) const override
+    void Rearrange(const std::vector<std::size_t>& order) override
     {
-        if (!m_owner.list)
-            return row;
-        std::size_t at = 0;
-        while (at < m_owner.list->GetCount() && &m_owner.list->GetAt(at) != m_owner.record)
-            ++at;
-        return at;
+        std::vector<T> arranged;
+        arranged.reserve(order.size());
+        for (const std::size_t row : order)
+            arranged.push_back(std::move(m_rows()[row]));
+        m_rows() = std::move(arranged);
     }
+
+    const void* Data() const override { return &m_rows(); }
+    bool MayBeEmpty() const override { return m_whenEmpty == WhenEmpty::Nothing; }
+    const void* List() const override { return m_owner.list; }
+    std::size_t ListRow(std::size_t row) const override { return m_owner.list ? m_owner.row() : row; }
+
+protected:
+    std::vector<T>& Rows() const { return m_rows(); }
 
 private:
     struct Block : IRowBlock
@@ -85,7 +95,7 @@ private:
         std::vector<T> rows;
     };
 
-    std::vector<T>& m_rows;
+    std::function<std::vector<T>&()> m_rows;
     VectorOwner m_owner;
     WhenEmpty m_whenEmpty;
 };

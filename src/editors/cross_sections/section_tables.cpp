@@ -1,0 +1,156 @@
+#include "editors/cross_sections/section_tables.h"
+
+#include "editors/common/columns.h"
+#include "editors/cross_sections/document.h"
+#include "grid/vector_rows.h"
+
+#include <numeric>
+#include <set>
+
+namespace {
+
+struct SectionTables
+{
+    Q_DECLARE_TR_FUNCTIONS(SectionTables)
+};
+
+class CSectionRows : public VectorRows<CCrossSection>
+{
+public:
+    explicit CSectionRows(CCrossSectionDoc& document)
+        : VectorRows(document.Sections().sections), m_document(document)
+    {
+    }
+
+    /// On the branch of the section above, between it and the next one; the first of all is on a branch of the project.
+    void Fit(IRowBlock& rows, std::size_t at) const override
+    {
+        constexpr double step = 100; // metres, behind the only section of a branch
+        for (std::size_t i = 0; i < rows.Count(); ++i) {
+            auto& line = *static_cast<CCrossSection*>(rows.At(i));
+            const auto* before = i > 0 ? static_cast<CCrossSection*>(rows.At(i - 1)) : Above(at, 1);
+            if (!before) {
+                line.branch = m_document.NewBranch();
+                continue;
+            }
+            line.branch = before->branch;
+            line.topoId = before->topoId;
+            const CCrossSection *next = Above(at + 1, 1), *previous = i > 0 ? Above(at, 1) : Above(at, 2);
+            if (next && next->branch == line.branch)
+                line.chainage = std::midpoint(before->chainage, next->chainage);
+            else if (previous && previous->branch == line.branch)
+                line.chainage = 2 * before->chainage - previous->chainage;
+            else
+                line.chainage = before->chainage + step;
+            while (m_document.Sections().IsTaken(line)) // by a section that stands elsewhere in the table
+                line.chainage += step;
+        }
+    }
+    bool HasRules() const override { return true; }
+    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    {
+        std::set<decltype(CCrossSection().Key())> taken; // by the others
+        for (std::size_t row = 0; row < Count(); ++row) {
+            if (row < first || row >= first + rows.Count())
+                taken.insert(Rows()[row].Key());
+        }
+        for (std::size_t i = 0; i < rows.Count(); ++i) {
+            const auto& section = *static_cast<const CCrossSection*>(rows.At(i));
+            if (section.branch.isEmpty())
+                return Fault{i, ::FindFault(section).text};
+            if (!taken.insert(section.Key()).second)
+                return Fault{i, WhyTaken(section)};
+        }
+        return std::nullopt;
+    }
+
+private:
+    /// The section so many lines above the place `at`; null when there is none.
+    const CCrossSection* Above(std::size_t at, std::size_t lines) const
+    {
+        return at >= lines && at - lines < Count() ? &Rows()[at - lines] : nullptr;
+    }
+
+    CCrossSectionDoc& m_document;
+};
+
+/// Sections move in memory when others come and go, so the points are looked for by the section's place.
+std::vector<CSectionPoint>& PointsOf(CCrossSectionDoc& document, std::size_t section)
+{
+    static std::vector<CSectionPoint> none;
+    auto& sections = document.Sections().sections;
+    return section < sections.size() ? sections[section].points : none;
+}
+
+class CPointRows : public VectorRows<CSectionPoint>
+{
+public:
+    CPointRows(CCrossSectionDoc& document, std::size_t section)
+        : VectorRows([&document, section]() -> std::vector<CSectionPoint>& { return PointsOf(document, section); },
+                     {&document.Sections().sections, [section] { return section; }})
+    {
+    }
+
+    /// Half way from the point above to the one below; behind the last one as far again.
+    void Fit(IRowBlock& rows, std::size_t at) const override
+    {
+        constexpr double step = 1; // metres, behind the only point
+        const auto& points = Rows();
+        for (std::size_t i = 0; i < rows.Count(); ++i) {
+            auto& point = *static_cast<CSectionPoint*>(rows.At(i));
+            if (i == 0 && at == 0)
+                continue;
+            const CSectionPoint before = i > 0 ? *static_cast<CSectionPoint*>(rows.At(i - 1)) : points[at - 1];
+            if (at < points.size())
+                point = {std::midpoint(before.offset, points[at].offset), std::midpoint(before.level, points[at].level)};
+            else
+                point = {before.offset + (at > 1 ? points[at - 1].offset - points[at - 2].offset : step), before.level};
+        }
+    }
+    bool HasRules() const override { return true; }
+    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    {
+        CCrossSection section;
+        section.branch = QStringLiteral("-");
+        section.points = Rows();
+        section.points.resize(std::max(section.points.size(), first + rows.Count()));
+        for (std::size_t i = 0; i < rows.Count(); ++i)
+            section.points[first + i] = *static_cast<const CSectionPoint*>(rows.At(i));
+        const CSectionFault fault = ::FindFault(section);
+        if (fault.field == CSectionFault::Nothing)
+            return std::nullopt;
+        const std::size_t at = std::size_t(std::max(fault.point, 0)); // or it is the point above that is too far
+        return Fault{std::min(at > first ? at - first : 0, rows.Count() - 1), fault.text};
+    }
+};
+
+} // namespace
+
+std::shared_ptr<IRowSource> MakeSectionRows(CCrossSectionDoc& document)
+{
+    return std::make_shared<CSectionRows>(document);
+}
+
+std::shared_ptr<IRowSource> MakePointRows(CCrossSectionDoc& document, int section)
+{
+    return document.Section(section) ? std::make_shared<CPointRows>(document, std::size_t(section)) : nullptr;
+}
+
+void AddSectionColumns(CGridModel& model)
+{
+    ColumnSpec width;
+    width.minimum = 0;
+    TableColumns<CCrossSection>(model)
+        .Text([] { return SectionTables::tr("Branch"); }, &CCrossSection::branch)
+        .Number([] { return SectionTables::tr("Chainage"); }, &CCrossSection::chainage, UnitGroup::Chainage)
+        .Known([] { return SectionTables::tr("Radius"); }, &CCrossSection::radius, UnitGroup::Radius)
+        .Known([] { return SectionTables::tr("Width"); }, &CCrossSection::width, UnitGroup::Width, width)
+        .Text([] { return SectionTables::tr("Topo ID"); }, &CCrossSection::topoId);
+}
+
+void AddPointColumns(CGridModel& model)
+{
+    TableColumns<CSectionPoint>(model)
+        .Number([] { return SectionTables::tr("Offset"); }, &CSectionPoint::offset, UnitGroup::Width)
+        .Number([] { return SectionTables::tr("Bed level"); }, &CSectionPoint::level, UnitGroup::WaterLevel);
+}

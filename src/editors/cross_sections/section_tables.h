@@ -1,0 +1,27 @@
+// The tables beside the plot: the cross sections, and the points of one of them.
+#pragma once
+
+#include "grid/row_source.h"
+
+class CCrossSectionDoc;
+class CGridModel;
+
+enum SectionColumn
+{
+    SectionBranch,
+    SectionChainage,
+    SectionRadius,
+    SectionWidth,
+    SectionTopoId
+};
+enum PointColumn
+{
+    PointOffset,
+    PointLevel
+};
+
+std::shared_ptr<IRowSource> MakeSectionRows(CCrossSectionDoc& document);
+/// Null for an index that there is no section for.
+std::shared_ptr<IRowSource> MakePointRows(CCrossSectionDoc& document, int section);
+void AddSectionColumns(CGridModel& model);
+void AddPointColumns(CGridModel& model);

@@ -1,0 +1,162 @@
+#include "editors/network/network_tables.h"
+
+#include "editors/common/columns.h"
+#include "editors/network/document.h"
+#include "grid/vector_rows.h"
+#include "ks/fc/branch_name.h"
+
+#include <QSet>
+#include <algorithm>
+#include <numeric>
+
+namespace {
+
+struct NetworkTables
+{
+    Q_DECLARE_TR_FUNCTIONS(NetworkTables)
+};
+
+class CBranchRows : public VectorRows<CNetworkBranch>
+{
+public:
+    explicit CBranchRows(CNetworkDoc& document) : VectorRows(document.Network().branches) {}
+
+    bool MayGrow() const override { return false; }
+    bool HasRules() const override { return true; }
+    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    {
+        QSet<QString> taken; // by the others
+        for (std::size_t row = 0; row < Count(); ++row) {
+            if (row < first || row >= first + rows.Count())
+                taken.insert(KsBranchKey(Rows()[row].name));
+        }
+        for (std::size_t i = 0; i < rows.Count(); ++i) {
+            const auto& branch = *static_cast<const CNetworkBranch*>(rows.At(i));
+            const QString key = KsBranchKey(branch.name);
+            if (key.isEmpty())
+                return Fault{i, NetworkTables::tr("A branch needs a name.")};
+            if (taken.contains(key))
+                return Fault{i, NetworkTables::tr("There is a branch \"%1\" already.").arg(branch.name)};
+            if (branch.start == branch.end)
+                return Fault{i, NetworkTables::tr("The chainages of the two ends of a branch have to differ.")};
+            taken.insert(key);
+        }
+        return std::nullopt;
+    }
+};
+
+/// Branches move in memory when others come and go, so the channel is looked for by the branch's place.
+std::vector<CChannelRow>& ChannelOf(CNetworkDoc& document, std::size_t branch)
+{
+    static std::vector<CChannelRow> none;
+    auto& branches = document.Network().branches;
+    return branch < branches.size() ? branches[branch].channel : none;
+}
+
+class CChannelRows : public VectorRows<CChannelRow>
+{
+public:
+    CChannelRows(CNetworkDoc& document, std::size_t branch)
+        : VectorRows([&document, branch]() -> std::vector<CChannelRow>& { return ChannelOf(document, branch); },
+                     {&document.Network().branches, [branch] { return branch; }}),
+          m_branch([&document, branch] { return &document.Network().branches[branch]; })
+    {
+    }
+
+    /// Half way from the line above to the one below, the branch's end at last; without radius and width.
+    void Fit(IRowBlock& rows, std::size_t at) const override
+    {
+        const CNetworkBranch& branch = *m_branch();
+        const auto& channel = branch.channel;
+        const auto [low, high] = std::minmax(branch.start, branch.end);
+        for (std::size_t i = 0; i < rows.Count(); ++i) {
+            auto& row = *static_cast<CChannelRow*>(rows.At(i));
+            if (i == 0 && channel.empty()) {
+                row.chainage = low;
+                continue;
+            }
+            const std::size_t above = at > 0 ? at - 1 : 0;
+            const double from = i > 0 ? static_cast<CChannelRow*>(rows.At(i - 1))->chainage : channel[above].chainage;
+            double to = at < channel.size() ? channel[at].chainage : high;
+            if (to <= from) // the last line is at the end of the branch
+                to = above > 0 ? channel[above - 1].chainage : low;
+            row.chainage = std::midpoint(from, to);
+        }
+    }
+    bool HasRules() const override { return true; }
+    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    {
+        QSet<double> taken; // by the others
+        for (std::size_t row = 0; row < Count(); ++row) {
+            if (row < first || row >= first + rows.Count())
+                taken.insert(Rows()[row].chainage);
+        }
+        for (std::size_t i = 0; i < rows.Count(); ++i) {
+            const double chainage = static_cast<const CChannelRow*>(rows.At(i))->chainage;
+            if (taken.contains(chainage))
+                return Fault{i, NetworkTables::tr("There is a line at this chainage already.")};
+            taken.insert(chainage);
+        }
+        return std::nullopt;
+    }
+    bool IsOrdered() const override { return true; }
+    std::vector<std::size_t> Order() const override
+    {
+        const auto& channel = Rows();
+        const auto byChainage = [&](std::size_t a, std::size_t b) { return channel[a].chainage < channel[b].chainage; };
+        std::vector<std::size_t> order(channel.size());
+        std::iota(order.begin(), order.end(), 0);
+        if (std::is_sorted(order.begin(), order.end(), byChainage))
+            return {};
+        std::stable_sort(order.begin(), order.end(), byChainage);
+        return order;
+    }
+
+private:
+    std::function<const CNetworkBranch*()> m_branch;
+};
+
+} // namespace
+
+std::shared_ptr<IRowSource> MakeBranchRows(CNetworkDoc& document)
+{
+    return std::make_shared<CBranchRows>(document);
+}
+
+std::shared_ptr<IRowSource> MakeChannelRows(CNetworkDoc& document, int branch)
+{
+    if (branch < 0 || std::size_t(branch) >= document.Network().branches.size())
+        return nullptr;
+    return std::make_shared<CChannelRows>(document, std::size_t(branch));
+}
+
+void AddBranchColumns(CGridModel& model)
+{
+    using Columns = TableColumns<CNetworkBranch>;
+    const CellAccess vertices{[](const void* row) -> CellValue { return std::int32_t(Columns::Of(row).line.size()); },
+                              [](void*, const CellValue&) {}};
+    const CellAccess flow{
+        [](const void* row) -> CellValue { return std::int32_t(Columns::Of(row).downstream); },
+        [](void* row, const CellValue& value) { Columns::Of(row).downstream = std::get<std::int32_t>(value) != 0; }};
+    ColumnSpec counted, direction;
+    counted.locked = [](const void*) { return true; };
+    direction.choices.entries = [] {
+        return QStringList{NetworkTables::tr("decreasing"), NetworkTables::tr("increasing")};
+    };
+    direction.choices.whenEmptied = 1;
+    direction.hint = [] { return NetworkTables::tr("Whether water flows towards increasing or decreasing chainages"); };
+    Columns(model)
+        .Text([] { return NetworkTables::tr("Branch"); }, &CNetworkBranch::name)
+        .Number([] { return NetworkTables::tr("From"); }, &CNetworkBranch::start, UnitGroup::Chainage)
+        .Number([] { return NetworkTables::tr("To"); }, &CNetworkBranch::end, UnitGroup::Chainage)
+        .Add(Control::Integer, [] { return NetworkTables::tr("Vertices"); }, counted, vertices)
+        .Add(Control::DropDown, [] { return NetworkTables::tr("Flow"); }, direction, flow);
+}
+
+void AddChannelColumns(CGridModel& model)
+{
+    TableColumns<CChannelRow>(model)
+        .Number([] { return NetworkTables::tr("Chainage"); }, &CChannelRow::chainage, UnitGroup::Chainage)
+        .Known([] { return NetworkTables::tr("Radius"); }, &CChannelRow::radius, UnitGroup::Radius)
+        .Known([] { return NetworkTables::tr("Width"); }, &CChannelRow::width, UnitGroup::Width);
+}

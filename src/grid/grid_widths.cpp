@@ -1,0 +1,111 @@
+#include "grid/grid_widths.h"
+
+#include "grid/gen_grid.h"
+
+#include <QHeaderView>
+#include <algorithm>
+
+namespace {
+
+constexpr int NumberColumnWidth = 40;
+// Pixels of the font that the columns' widths are meant for: its height, and the mean width of the Latin letters.
+constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
+constexpr int RowsAtStart = 30, RowsForRoom = 4000; // whose texts are measured, at even distances through the table
+constexpr int MostOfAWindow = 320;                  // pixels that a long name may take
+
+/// The row numbers. They are as wide as the grid says: measuring texts of many rows, as the base does whenever the
+/// table is laid out, would cost more than all the rest of showing it.
+class RowNumbers : public QHeaderView
+{
+public:
+    explicit RowNumbers(QWidget* parent) : QHeaderView(Qt::Vertical, parent) { setSectionsClickable(true); }
+    QSize sizeHint() const override { return {minimumWidth(), QHeaderView::minimumSizeHint().height()}; }
+};
+
+double FontScale(const QWidget& widget)
+{
+    const QFontMetrics font = widget.fontMetrics();
+    const QString letters = QStringLiteral("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz");
+    const double letterWidth = double(font.horizontalAdvance(letters)) / double(letters.size());
+    return std::max({1.0, font.height() / OriginalFontHeight, letterWidth / OriginalLetterWidth});
+}
+
+} // namespace
+
+CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid)
+{
+    grid.setVerticalHeader(new RowNumbers(&grid));
+    grid.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    grid.verticalHeader()->setHighlightSections(false);
+    grid.verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    UpdateRowNumbers();
+    grid.horizontalHeader()->setHighlightSections(false);
+    connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGridWidths::MakeRoom);
+    connect(
+        &KsUnits::Instance(), &KsUnits::Changed, this,
+        [this] {
+            if (KsUnits::Instance().AllDigits())
+                MakeRoom();
+        },
+        Qt::QueuedConnection); // when the view shows the new unit
+}
+
+void CGridWidths::UpdateRowNumbers()
+{
+    QHeaderView& numbers = *m_grid.verticalHeader();
+    const QFontMetrics font = m_grid.fontMetrics();
+    const int height = font.height() + 8;
+    if (numbers.defaultSectionSize() != height) // setting it visits every row
+        numbers.setDefaultSectionSize(height);
+    const int longest = font.horizontalAdvance(QString::number(std::max(m_grid.RowCount(), 100))) + 12;
+    const int width = std::max(int(NumberColumnWidth * FontScale(m_grid)), longest);
+    if (numbers.width() != width)
+        numbers.setFixedWidth(width);
+}
+
+void CGridWidths::Update()
+{
+    UpdateRowNumbers();
+    for (int column = std::min(m_columnsSet, m_grid.ColumnCount()); column < m_grid.ColumnCount(); ++column) {
+        const int width = int(m_grid.Model()->Columns()[std::size_t(column)].width * FontScale(m_grid));
+        m_grid.setColumnWidth(column, std::max(width, WidthOfTexts(column, RowsAtStart)));
+    }
+    m_columnsSet = m_grid.ColumnCount();
+}
+
+void CGridWidths::Reset()
+{
+    if (std::exchange(m_columnsSet, 0) > 0) // not before the rows are there
+        Update();
+    else
+        UpdateRowNumbers();
+}
+
+void CGridWidths::MakeRoom()
+{
+    for (int column = 0; column < std::min(m_columnsSet, m_grid.ColumnCount()); ++column)
+        m_grid.setColumnWidth(column, std::max(m_grid.columnWidth(column), WidthOfTexts(column, RowsForRoom)));
+}
+
+/// What the header and the texts need: of `most` rows of the whole table, and of those in sight. Only a text that is
+/// as long as any before is measured.
+int CGridWidths::WidthOfTexts(int column, int most) const
+{
+    const QFontMetrics font = m_grid.fontMetrics();
+    int width = font.horizontalAdvance(m_grid.Model()->Columns()[std::size_t(column)].header());
+    qsizetype longest = 0;
+    const auto measure = [&](int row) {
+        const QString text = m_grid.TextAt(row, column + 1);
+        if (text.size() < longest)
+            return;
+        longest = text.size();
+        width = std::max(width, font.horizontalAdvance(text));
+    };
+    const int rows = m_grid.RowCount(), step = std::max(1, rows / most);
+    for (int row = 1; row <= rows; row += step)
+        measure(row);
+    const int inSight = std::max(1, m_grid.rowAt(0) + 1);
+    for (int row = inSight; step > 1 && row < std::min(rows, inSight + RowsAtStart); ++row)
+        measure(row);
+    return std::min(width + 16, MostOfAWindow);
+}

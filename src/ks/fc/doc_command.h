@@ -1,0 +1,54 @@
+// Undo commands that change a document: their common base, and the change of a single value.
+#pragma once
+
+#include "ks/fc/change_place.h"
+#include "ks/fc/doc.h"
+
+#include <QUndoCommand>
+
+/// Every change marks the document modified and reloads the views. A change that undo or redo brings back is also
+/// shown to the user, wherever it is.
+class KS_API CDocumentCommand : public QUndoCommand
+{
+public:
+    CDocumentCommand(CKsDoc& document, const QString& text);
+    void undo() final { Run(false); }
+    void redo() final { Run(true); }
+
+protected:
+    virtual ChangePlace Apply() = 0;
+    virtual ChangePlace Revert() = 0;
+
+private:
+    void Run(bool forward);
+
+    CKsDoc& m_document;
+    bool m_repeated = false;
+};
+
+/// Changes one value of the document that no list holds.
+template <typename T>
+class CSetValue : public CDocumentCommand
+{
+public:
+    CSetValue(CKsDoc& document, const QString& text, T& target, T value)
+        : CDocumentCommand(document, text), m_target(target), m_before(target), m_after(std::move(value))
+    {
+    }
+
+protected:
+    ChangePlace Apply() override
+    {
+        m_target = m_after;
+        return {&m_target};
+    }
+    ChangePlace Revert() override
+    {
+        m_target = m_before;
+        return {&m_target};
+    }
+
+private:
+    T& m_target;
+    T m_before, m_after;
+};

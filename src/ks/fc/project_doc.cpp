@@ -1,0 +1,103 @@
+#include "ks/fc/project_doc.h"
+
+#include "ks/fc/exchange.h"
+
+#include <QTimer>
+#include <QUndoStack>
+#include <utility>
+
+CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind)
+{
+    connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
+}
+
+LRESULT CKsProjectDoc::Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const
+{
+    CKSComm_Package package;
+    package.view = sender;
+    package.text = GetPathName();
+    package.kind = m_kind;
+    package.project = m_project;
+    package.objects = objects;
+    return KsSendMessage(window, message, request, reinterpret_cast<LPARAM>(&package));
+}
+
+bool CKsProjectDoc::JoinProject(CView* view)
+{
+    m_project = 0;
+    m_project = Send(KsMainWindow(), KsMessage::SwitchBoard(), KsRequest::JoinProject, view, nullptr);
+    return m_project != 0;
+}
+
+void CKsProjectDoc::LeaveProject(CView* view)
+{
+    AskProject(KsRequest::LeaveProject, view);
+}
+
+/// A step comes in the middle of things: the view that made it goes on storing, and whoever hears of it may ask at
+/// once.
+void CKsProjectDoc::StepMade()
+{
+    if (!m_project || UndoStack().count() == 0) // a cleared stack is no step
+        return;
+    if (m_untold++ == 0)
+        QTimer::singleShot(0, this, &CKsProjectDoc::TellChanges);
+}
+
+void CKsProjectDoc::TellChanges()
+{
+    for (int steps = std::exchange(m_untold, 0); steps > 0; --steps)
+        DataChanged();
+}
+
+void CKsProjectDoc::LocationShown(CView* view, const CString& branch, double chainage)
+{
+    auto shown = std::make_unique<CKvrCBELocation>();
+    shown->branch = branch;
+    shown->chainage = chainage;
+    CObList objects;
+    objects.push_back(std::move(shown));
+    TellProject(KsRequest::LocationShown, view, &objects);
+}
+
+LRESULT CKsProjectDoc::AskProject(WPARAM request, CView* view, CObList* objects) const
+{
+    return m_project ? Send(KsMainWindow(), KsMessage::SwitchBoard(), request, view, objects) : 0;
+}
+
+void CKsProjectDoc::TellProject(WPARAM news, CView* view, CObList* objects) const
+{
+    if (m_project)
+        Send(KsMainWindow(), KsMessage::BetweenEditors(), news, view, objects);
+}
+
+LRESULT CKsProjectDoc::AskView(CView* receiver, WPARAM request, CView* sender, CObList* objects) const
+{
+    return Send(receiver, KsMessage::BetweenEditors(), request, sender, objects);
+}
+
+std::vector<CView*> CKsProjectDoc::ProjectViews(CView* view) const
+{
+    CObList items;
+    AskProject(KsRequest::ProjectViews, view, &items);
+    std::vector<CView*> views;
+    for (const auto& item : items) {
+        const auto* each = dynamic_cast<const CKvrCBEView*>(item.get());
+        if (each && each->view && each->view->GetDocument())
+            views.push_back(each->view);
+    }
+    return views;
+}
+
+QStringList CKsProjectDoc::BranchNames(CView* view) const
+{
+    CObList items;
+    AskProject(KsRequest::BranchNames, view, &items);
+    QStringList names;
+    for (const auto& item : items) {
+        const auto* name = dynamic_cast<const CKvrCBEText*>(item.get());
+        if (name && !name->text.isEmpty())
+            names << name->text;
+    }
+    return names;
+}

@@ -1,0 +1,49 @@
+// The document of an editor that takes part in projects: joins and leaves them, tells the others of changes, asks them.
+#pragma once
+
+#include "ks/fc/doc.h"
+#include "ks/fc/package.h"
+
+#include <QStringList>
+
+class KS_API CKsProjectDoc : public CKsDoc
+{
+    Q_OBJECT
+public:
+    /// `kind`: what the editor's packages call themselves.
+    explicit CKsProjectDoc(int kind);
+
+    /// Joins the project that the document's file is a member of; false when there is none.
+    bool JoinProject(CView* view);
+    void LeaveProject(CView* view);
+    /// 0 outside a project.
+    std::intptr_t ProjectHandle() const { return m_project; }
+
+    /// Tells the other editors of the project that data changed. Every step on the undo stack, forth or back, is told
+    /// by itself, once, when the event that it belongs to is over.
+    void DataChanged() { TellProject(KsRequest::DataChanged, nullptr); }
+    /// Tells at once what waits to be told.
+    void TellChanges();
+    /// Tells the other editors of the project that the user of `view` looks at a place.
+    void LocationShown(CView* view, const CString& branch, double chainage);
+
+    /// Sends a request to the shell's switchboard; its answer, 0 outside a project. What the other editors have to say
+    /// is appended to `objects`, which stays the caller's.
+    LRESULT AskProject(WPARAM request, CView* view, CObList* objects = nullptr) const;
+    /// Tells the other editors of the project something (KsRequest); nothing outside a project.
+    void TellProject(WPARAM news, CView* view, CObList* objects = nullptr) const;
+    /// Sends a request with `objects` to one view of another editor.
+    LRESULT AskView(CView* receiver, WPARAM request, CView* sender, CObList* objects) const;
+    /// The views of the project's other documents, for the duration of the present event.
+    std::vector<CView*> ProjectViews(CView* view) const;
+    /// The names of the branches that the project's other editors know, as they spell them; none is empty.
+    QStringList BranchNames(CView* view) const;
+
+private:
+    void StepMade();
+    LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const;
+
+    int m_kind;
+    std::intptr_t m_project = 0;
+    int m_untold = 0; // steps that the project has not heard of
+};
