@@ -6,9 +6,7 @@
 #include <QDir>
 #include <QFile>
 #include <QLabel>
-#include <QRegularExpression>
 #include <QSignalSpy>
-#include <QXmlStreamReader>
 #include <cerrno>
 #include <gtest/gtest.h>
 
@@ -35,16 +33,6 @@ struct Listener : QWidget
         QWidget::changeEvent(event);
     }
 };
-
-QStringList Placeholders(const QString& text)
-{
-    QStringList found;
-    static const QRegularExpression expression("%[0-9]|\\(&[A-Z0-9]\\)|&(?=[A-Za-z])");
-    for (auto match = expression.globalMatch(text); match.hasNext();)
-        found << match.next().captured().replace(QRegularExpression("\\(?&.*"), "&");
-    found.sort();
-    return found;
-}
 
 } // namespace
 
@@ -92,33 +80,4 @@ TEST_F(Language, WhyTheSystemRefusesIsSaidInTheUsersLanguage)
     EXPECT_EQ(KsSystemReason(missing), "ファイルまたはフォルダがありません。");
     EXPECT_FALSE(KsSystemReason(std::make_error_code(std::errc::owner_dead)).isEmpty()) << "the system's own text";
     KsLangFreeResDll(handle);
-}
-
-TEST_F(Language, EveryTextIsTranslatedWithItsPlaceholdersAndMnemonics)
-{
-    int texts = 0;
-    for (const char* folder : {"/src/ks/language", "/src/shell/translations"}) {
-        const QDir dir(QStringLiteral(KVR_SOURCE_DIR) + folder);
-        for (const QString& name : dir.entryList({"*.ts"})) {
-            QFile file(dir.filePath(name));
-            ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-            QXmlStreamReader xml(&file);
-            QString source;
-            while (!xml.atEnd()) {
-                xml.readNext();
-                if (xml.name() == u"source" && xml.isStartElement()) {
-                    source = xml.readElementText();
-                } else if (xml.name() == u"translation" && xml.isStartElement()) {
-                    ++texts;
-                    const bool unfinished = xml.attributes().hasAttribute("type");
-                    const QString translation = xml.readElementText();
-                    EXPECT_FALSE(unfinished || translation.isEmpty())
-                        << name.toStdString() << ": " << source.toStdString();
-                    EXPECT_EQ(Placeholders(source), Placeholders(translation)) << source.toStdString();
-                }
-            }
-            EXPECT_FALSE(xml.hasError()) << xml.errorString().toStdString();
-        }
-    }
-    EXPECT_GT(texts, 100);
 }

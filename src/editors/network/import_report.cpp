@@ -14,11 +14,10 @@
 
 namespace {
 
-struct ImportReportText
+struct Text
 {
     Q_DECLARE_TR_FUNCTIONS(ImportReport)
 };
-using Text = ImportReportText;
 
 QString Length(double metres)
 {

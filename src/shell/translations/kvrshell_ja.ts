@@ -1,483 +1,483 @@
 <?xml version="1.0" encoding="utf-8"?>
 <!DOCTYPE TS>
 <TS version="2.1" language="ja" sourcelanguage="en_US">
-    <context>
-        <name>CFrameAction</name>
-        <message>
-            <source>&amp;New</source>
-            <translation>新規作成(&amp;N)</translation>
-        </message>
-        <message>
-            <source>Starts a new document</source>
-            <translation>新しい文書を作成します</translation>
-        </message>
-        <message>
-            <source>&amp;Open...</source>
-            <translation>開く(&amp;O)...</translation>
-        </message>
-        <message>
-            <source>Opens a document or a project</source>
-            <translation>文書またはプロジェクトを開きます</translation>
-        </message>
-        <message>
-            <source>Open &amp;Project...</source>
-            <translation>プロジェクトを開く(&amp;P)...</translation>
-        </message>
-        <message>
-            <source>Opens a project with all its files</source>
-            <translation>プロジェクトとそのすべてのファイルを開きます</translation>
-        </message>
-        <message>
-            <source>Open &amp;Recent</source>
-            <translation>最近使ったファイル(&amp;R)</translation>
-        </message>
-        <message>
-            <source>Opens one of the files used last</source>
-            <translation>最近使ったファイルを開きます</translation>
-        </message>
-        <message>
-            <source>&amp;Save</source>
-            <translation>上書き保存(&amp;S)</translation>
-        </message>
-        <message>
-            <source>Saves the active document</source>
-            <translation>作業中の文書を保存します</translation>
-        </message>
-        <message>
-            <source>Save &amp;As...</source>
-            <translation>名前を付けて保存(&amp;A)...</translation>
-        </message>
-        <message>
-            <source>Saves the active document under a new name</source>
-            <translation>作業中の文書に名前を付けて保存します</translation>
-        </message>
-        <message>
-            <source>&amp;Close</source>
-            <translation>閉じる(&amp;C)</translation>
-        </message>
-        <message>
-            <source>Closes the active window</source>
-            <translation>作業中のウィンドウを閉じます</translation>
-        </message>
-        <message>
-            <source>Close Projec&amp;t</source>
-            <translation>プロジェクトを閉じる(&amp;T)</translation>
-        </message>
-        <message>
-            <source>Closes the project with all its files</source>
-            <translation>プロジェクトとそのすべてのファイルを閉じます</translation>
-        </message>
-        <message>
-            <source>E&amp;xit</source>
-            <translation>終了(&amp;X)</translation>
-        </message>
-        <message>
-            <source>Closes all documents and ends the program</source>
-            <translation>すべての文書を閉じてプログラムを終了します</translation>
-        </message>
-        <message>
-            <source>&amp;Undo</source>
-            <translation>元に戻す(&amp;U)</translation>
-        </message>
-        <message>
-            <source>Takes the last change back</source>
-            <translation>直前の変更を取り消します</translation>
-        </message>
-        <message>
-            <source>&amp;Redo</source>
-            <translation>やり直す(&amp;R)</translation>
-        </message>
-        <message>
-            <source>Makes the change again that was taken back</source>
-            <translation>取り消した変更をもう一度行います</translation>
-        </message>
-        <message>
-            <source>Cu&amp;t</source>
-            <translation>切り取り(&amp;T)</translation>
-        </message>
-        <message>
-            <source>Moves the selection to the clipboard</source>
-            <translation>選択範囲を切り取ってクリップボードに入れます</translation>
-        </message>
-        <message>
-            <source>&amp;Copy</source>
-            <translation>コピー(&amp;C)</translation>
-        </message>
-        <message>
-            <source>Copies the selection to the clipboard</source>
-            <translation>選択範囲をクリップボードにコピーします</translation>
-        </message>
-        <message>
-            <source>&amp;Paste</source>
-            <translation>貼り付け(&amp;P)</translation>
-        </message>
-        <message>
-            <source>Puts in what is on the clipboard</source>
-            <translation>クリップボードの内容を貼り付けます</translation>
-        </message>
-        <message>
-            <source>&amp;Units</source>
-            <translation>単位系(&amp;U)</translation>
-        </message>
-        <message>
-            <source>Units in which values are shown; files are not affected</source>
-            <translation>値を表示する単位系を選びます (ファイルの内容は変わりません)</translation>
-        </message>
-        <message>
-            <source>&amp;Language</source>
-            <translation>言語(&amp;L)</translation>
-        </message>
-        <message>
-            <source>Language of the program</source>
-            <translation>プログラムの表示言語を選びます</translation>
-        </message>
-        <message>
-            <source>&amp;Tool Bars</source>
-            <translation>ツールバー(&amp;T)</translation>
-        </message>
-        <message>
-            <source>Shows or hides tool bars</source>
-            <translation>ツールバーの表示と非表示を切り替えます</translation>
-        </message>
-        <message>
-            <source>&amp;Cascade</source>
-            <translation>重ねて表示(&amp;C)</translation>
-        </message>
-        <message>
-            <source>Arranges the windows one behind the other</source>
-            <translation>ウィンドウを重ねて並べます</translation>
-        </message>
-        <message>
-            <source>&amp;Tile</source>
-            <translation>並べて表示(&amp;T)</translation>
-        </message>
-        <message>
-            <source>Arranges the windows side by side</source>
-            <translation>ウィンドウを重ならないように並べます</translation>
-        </message>
-        <message>
-            <source>Ne&amp;xt</source>
-            <translation>次のウィンドウ(&amp;X)</translation>
-        </message>
-        <message>
-            <source>Goes to the next window</source>
-            <translation>次のウィンドウに移ります</translation>
-        </message>
-        <message>
-            <source>Pre&amp;vious</source>
-            <translation>前のウィンドウ(&amp;V)</translation>
-        </message>
-        <message>
-            <source>Goes to the previous window</source>
-            <translation>前のウィンドウに移ります</translation>
-        </message>
-        <message>
-            <source>Ta&amp;bs</source>
-            <translation>タブ表示(&amp;B)</translation>
-        </message>
-        <message>
-            <source>Shows the windows as tabs</source>
-            <translation>ウィンドウをタブで表示します</translation>
-        </message>
-        <message>
-            <source>Close &amp;All</source>
-            <translation>すべて閉じる(&amp;A)</translation>
-        </message>
-        <message>
-            <source>Closes all windows</source>
-            <translation>すべてのウィンドウを閉じます</translation>
-        </message>
-        <message>
-            <source>&amp;Contents</source>
-            <translation>目次(&amp;C)</translation>
-        </message>
-        <message>
-            <source>Shows the help of the editor</source>
-            <translation>エディタのヘルプを表示します</translation>
-        </message>
-        <message>
-            <source>&amp;Plug-ins...</source>
-            <translation>プラグイン(&amp;P)...</translation>
-        </message>
-        <message>
-            <source>Lists the editors that were loaded</source>
-            <translation>読み込まれたエディタの一覧を表示します</translation>
-        </message>
-        <message>
-            <source>&amp;About</source>
-            <translation>バージョン情報(&amp;A)</translation>
-        </message>
-        <message>
-            <source>Name and version of the program</source>
-            <translation>プログラムの名称とバージョンを表示します</translation>
-        </message>
-        <message>
-            <source>&amp;Project</source>
-            <translation>プロジェクト(&amp;P)</translation>
-        </message>
-        <message>
-            <source>Shows or hides the files of the project</source>
-            <translation>プロジェクトのファイル一覧の表示と非表示を切り替えます</translation>
-        </message>
-        <message>
-            <source>&amp;Side by Side</source>
-            <translation>横に並べて表示(&amp;S)</translation>
-        </message>
-        <message>
-            <source>Puts the other windows beside the active one</source>
-            <translation>作業中のウィンドウの横にほかのウィンドウを並べます</translation>
-        </message>
-        <message>
-            <source>All &amp;Digits</source>
-            <translation>全桁表示(&amp;D)</translation>
-        </message>
-        <message>
-            <source>Shows every digit of the numbers in tables and fields</source>
-            <translation>表と入力欄の数値を全桁で表示します</translation>
-        </message>
-    </context>
-    <context>
-        <name>CMainFrame</name>
-        <message>
-            <source>Not loaded: %1 (see Help, Plug-ins)</source>
-            <translation>読み込めませんでした: %1 (「ヘルプ」の「プラグイン」を参照)</translation>
-        </message>
-        <message>
-            <source>Project: %1</source>
-            <translation>プロジェクト: %1</translation>
-        </message>
-        <message>
-            <source>Projects</source>
-            <translation>プロジェクト</translation>
-        </message>
-        <message>
-            <source>%1: open in the project %2</source>
-            <translation>%1: プロジェクト %2 で開いています</translation>
-        </message>
-        <message>
-            <source>These files of the project %1 are open in another project and stay there:
+<context>
+    <name>CFrameAction</name>
+    <message>
+        <source>&amp;New</source>
+        <translation>新規作成(&amp;N)</translation>
+    </message>
+    <message>
+        <source>Starts a new document</source>
+        <translation>新しい文書を作成します</translation>
+    </message>
+    <message>
+        <source>&amp;Open...</source>
+        <translation>開く(&amp;O)...</translation>
+    </message>
+    <message>
+        <source>Opens a document or a project</source>
+        <translation>文書またはプロジェクトを開きます</translation>
+    </message>
+    <message>
+        <source>Open &amp;Project...</source>
+        <translation>プロジェクトを開く(&amp;P)...</translation>
+    </message>
+    <message>
+        <source>Opens a project with all its files</source>
+        <translation>プロジェクトとそのすべてのファイルを開きます</translation>
+    </message>
+    <message>
+        <source>Open &amp;Recent</source>
+        <translation>最近使ったファイル(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Opens one of the files used last</source>
+        <translation>最近使ったファイルを開きます</translation>
+    </message>
+    <message>
+        <source>&amp;Save</source>
+        <translation>上書き保存(&amp;S)</translation>
+    </message>
+    <message>
+        <source>Saves the active document</source>
+        <translation>作業中の文書を保存します</translation>
+    </message>
+    <message>
+        <source>Save &amp;As...</source>
+        <translation>名前を付けて保存(&amp;A)...</translation>
+    </message>
+    <message>
+        <source>Saves the active document under a new name</source>
+        <translation>作業中の文書に名前を付けて保存します</translation>
+    </message>
+    <message>
+        <source>&amp;Close</source>
+        <translation>閉じる(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Closes the active window</source>
+        <translation>作業中のウィンドウを閉じます</translation>
+    </message>
+    <message>
+        <source>Close Projec&amp;t</source>
+        <translation>プロジェクトを閉じる(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Closes the project with all its files</source>
+        <translation>プロジェクトとそのすべてのファイルを閉じます</translation>
+    </message>
+    <message>
+        <source>E&amp;xit</source>
+        <translation>終了(&amp;X)</translation>
+    </message>
+    <message>
+        <source>Closes all documents and ends the program</source>
+        <translation>すべての文書を閉じてプログラムを終了します</translation>
+    </message>
+    <message>
+        <source>&amp;Undo</source>
+        <translation>元に戻す(&amp;U)</translation>
+    </message>
+    <message>
+        <source>Takes the last change back</source>
+        <translation>直前の変更を取り消します</translation>
+    </message>
+    <message>
+        <source>&amp;Redo</source>
+        <translation>やり直す(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Makes the change again that was taken back</source>
+        <translation>取り消した変更をもう一度行います</translation>
+    </message>
+    <message>
+        <source>Cu&amp;t</source>
+        <translation>切り取り(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Moves the selection to the clipboard</source>
+        <translation>選択範囲を切り取ってクリップボードに入れます</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>コピー(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Copies the selection to the clipboard</source>
+        <translation>選択範囲をクリップボードにコピーします</translation>
+    </message>
+    <message>
+        <source>&amp;Paste</source>
+        <translation>貼り付け(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Puts in what is on the clipboard</source>
+        <translation>クリップボードの内容を貼り付けます</translation>
+    </message>
+    <message>
+        <source>&amp;Units</source>
+        <translation>単位系(&amp;U)</translation>
+    </message>
+    <message>
+        <source>Units in which values are shown; files are not affected</source>
+        <translation>値を表示する単位系を選びます (ファイルの内容は変わりません)</translation>
+    </message>
+    <message>
+        <source>&amp;Language</source>
+        <translation>言語(&amp;L)</translation>
+    </message>
+    <message>
+        <source>Language of the program</source>
+        <translation>プログラムの表示言語を選びます</translation>
+    </message>
+    <message>
+        <source>&amp;Tool Bars</source>
+        <translation>ツールバー(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Shows or hides tool bars</source>
+        <translation>ツールバーの表示と非表示を切り替えます</translation>
+    </message>
+    <message>
+        <source>&amp;Cascade</source>
+        <translation>重ねて表示(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Arranges the windows one behind the other</source>
+        <translation>ウィンドウを重ねて並べます</translation>
+    </message>
+    <message>
+        <source>&amp;Tile</source>
+        <translation>並べて表示(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Arranges the windows side by side</source>
+        <translation>ウィンドウを重ならないように並べます</translation>
+    </message>
+    <message>
+        <source>Ne&amp;xt</source>
+        <translation>次のウィンドウ(&amp;X)</translation>
+    </message>
+    <message>
+        <source>Goes to the next window</source>
+        <translation>次のウィンドウに移ります</translation>
+    </message>
+    <message>
+        <source>Pre&amp;vious</source>
+        <translation>前のウィンドウ(&amp;V)</translation>
+    </message>
+    <message>
+        <source>Goes to the previous window</source>
+        <translation>前のウィンドウに移ります</translation>
+    </message>
+    <message>
+        <source>Ta&amp;bs</source>
+        <translation>タブ表示(&amp;B)</translation>
+    </message>
+    <message>
+        <source>Shows the windows as tabs</source>
+        <translation>ウィンドウをタブで表示します</translation>
+    </message>
+    <message>
+        <source>Close &amp;All</source>
+        <translation>すべて閉じる(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Closes all windows</source>
+        <translation>すべてのウィンドウを閉じます</translation>
+    </message>
+    <message>
+        <source>&amp;Contents</source>
+        <translation>目次(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Shows the help of the editor</source>
+        <translation>エディタのヘルプを表示します</translation>
+    </message>
+    <message>
+        <source>&amp;Plug-ins...</source>
+        <translation>プラグイン(&amp;P)...</translation>
+    </message>
+    <message>
+        <source>Lists the editors that were loaded</source>
+        <translation>読み込まれたエディタの一覧を表示します</translation>
+    </message>
+    <message>
+        <source>&amp;About</source>
+        <translation>バージョン情報(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Name and version of the program</source>
+        <translation>プログラムの名称とバージョンを表示します</translation>
+    </message>
+    <message>
+        <source>&amp;Project</source>
+        <translation>プロジェクト(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Shows or hides the files of the project</source>
+        <translation>プロジェクトのファイル一覧の表示と非表示を切り替えます</translation>
+    </message>
+    <message>
+        <source>&amp;Side by Side</source>
+        <translation>横に並べて表示(&amp;S)</translation>
+    </message>
+    <message>
+        <source>Puts the other windows beside the active one</source>
+        <translation>作業中のウィンドウの横にほかのウィンドウを並べます</translation>
+    </message>
+    <message>
+        <source>All &amp;Digits</source>
+        <translation>全桁表示(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Shows every digit of the numbers in tables and fields</source>
+        <translation>表と入力欄の数値を全桁で表示します</translation>
+    </message>
+</context>
+<context>
+    <name>CMainFrame</name>
+    <message>
+        <source>Not loaded: %1 (see Help, Plug-ins)</source>
+        <translation>読み込めませんでした: %1 (「ヘルプ」の「プラグイン」を参照)</translation>
+    </message>
+    <message>
+        <source>Project: %1</source>
+        <translation>プロジェクト: %1</translation>
+    </message>
+    <message>
+        <source>Projects</source>
+        <translation>プロジェクト</translation>
+    </message>
+    <message>
+        <source>%1: open in the project %2</source>
+        <translation>%1: プロジェクト %2 で開いています</translation>
+    </message>
+    <message>
+        <source>These files of the project %1 are open in another project and stay there:
 %2
 To have one of them in %1, close its window and open it from the list of %1.</source>
-            <translation>プロジェクト %1 の次のファイルは、ほかのプロジェクトで開いているため、そちらに属したままになります。
+        <translation>プロジェクト %1 の次のファイルは、ほかのプロジェクトで開いているため、そちらに属したままになります。
 %2
 %1 で使うには、そのウィンドウを閉じてから、%1 の一覧で開いてください。</translation>
-        </message>
-        <message>
-            <source>%1 could not be opened: no editor reads files of this kind.
+    </message>
+    <message>
+        <source>%1 could not be opened: no editor reads files of this kind.
 The editors read %2.</source>
-            <translation>%1 を開けません。この種類のファイルを扱うエディタがありません。
+        <translation>%1 を開けません。この種類のファイルを扱うエディタがありません。
 扱える拡張子: %2</translation>
-        </message>
-        <message>
-            <source>New</source>
-            <translation>新規作成</translation>
-        </message>
-        <message>
-            <source>Kind of document:</source>
-            <translation>文書の種類:</translation>
-        </message>
-        <message>
-            <source>All files</source>
-            <translation>すべてのファイル</translation>
-        </message>
-        <message>
-            <source>Open</source>
-            <translation>開く</translation>
-        </message>
-        <message>
-            <source>Open Project</source>
-            <translation>プロジェクトを開く</translation>
-        </message>
-        <message>
-            <source>&amp;Undo %1</source>
-            <translation>元に戻す(&amp;U) %1</translation>
-        </message>
-        <message>
-            <source>&amp;Redo %1</source>
-            <translation>やり直す(&amp;R) %1</translation>
-        </message>
-        <message>
-            <source>&amp;File</source>
-            <translation>ファイル(&amp;F)</translation>
-        </message>
-        <message>
-            <source>&amp;Edit</source>
-            <translation>編集(&amp;E)</translation>
-        </message>
-        <message>
-            <source>&amp;Lines</source>
-            <translation>行(&amp;L)</translation>
-        </message>
-        <message>
-            <source>&amp;View</source>
-            <translation>表示(&amp;V)</translation>
-        </message>
-        <message>
-            <source>&amp;Window</source>
-            <translation>ウィンドウ(&amp;W)</translation>
-        </message>
-        <message>
-            <source>&amp;Help</source>
-            <translation>ヘルプ(&amp;H)</translation>
-        </message>
-        <message>
-            <source>&amp;Metric</source>
-            <translation>メートル法(&amp;M)</translation>
-        </message>
-        <message>
-            <source>&amp;US Customary</source>
-            <translation>米国慣用単位(&amp;U)</translation>
-        </message>
-        <message>
-            <source>Standard</source>
-            <translation>標準</translation>
-        </message>
-        <message>
-            <source>No editor was found. See Help, Plug-ins.</source>
-            <translation>エディタが見つかりません。「ヘルプ」の「プラグイン」を参照してください。</translation>
-        </message>
-        <message>
-            <source>Open a file with File, Open, or drop it here.</source>
-            <translation>「ファイル」の「開く」でファイルを開くか、ここにドロップしてください。</translation>
-        </message>
-        <message>
-            <source>&amp;Clear List</source>
-            <translation>一覧を消去(&amp;C)</translation>
-        </message>
-        <message>
-            <source>About %1</source>
-            <translation>%1 のバージョン情報</translation>
-        </message>
-        <message>
-            <source>%1, version %2
+    </message>
+    <message>
+        <source>New</source>
+        <translation>新規作成</translation>
+    </message>
+    <message>
+        <source>Kind of document:</source>
+        <translation>文書の種類:</translation>
+    </message>
+    <message>
+        <source>All files</source>
+        <translation>すべてのファイル</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>開く</translation>
+    </message>
+    <message>
+        <source>Open Project</source>
+        <translation>プロジェクトを開く</translation>
+    </message>
+    <message>
+        <source>&amp;Undo %1</source>
+        <translation>元に戻す(&amp;U) %1</translation>
+    </message>
+    <message>
+        <source>&amp;Redo %1</source>
+        <translation>やり直す(&amp;R) %1</translation>
+    </message>
+    <message>
+        <source>&amp;File</source>
+        <translation>ファイル(&amp;F)</translation>
+    </message>
+    <message>
+        <source>&amp;Edit</source>
+        <translation>編集(&amp;E)</translation>
+    </message>
+    <message>
+        <source>&amp;Lines</source>
+        <translation>行(&amp;L)</translation>
+    </message>
+    <message>
+        <source>&amp;View</source>
+        <translation>表示(&amp;V)</translation>
+    </message>
+    <message>
+        <source>&amp;Window</source>
+        <translation>ウィンドウ(&amp;W)</translation>
+    </message>
+    <message>
+        <source>&amp;Help</source>
+        <translation>ヘルプ(&amp;H)</translation>
+    </message>
+    <message>
+        <source>&amp;Metric</source>
+        <translation>メートル法(&amp;M)</translation>
+    </message>
+    <message>
+        <source>&amp;US Customary</source>
+        <translation>米国慣用単位(&amp;U)</translation>
+    </message>
+    <message>
+        <source>Standard</source>
+        <translation>標準</translation>
+    </message>
+    <message>
+        <source>No editor was found. See Help, Plug-ins.</source>
+        <translation>エディタが見つかりません。「ヘルプ」の「プラグイン」を参照してください。</translation>
+    </message>
+    <message>
+        <source>Open a file with File, Open, or drop it here.</source>
+        <translation>「ファイル」の「開く」でファイルを開くか、ここにドロップしてください。</translation>
+    </message>
+    <message>
+        <source>&amp;Clear List</source>
+        <translation>一覧を消去(&amp;C)</translation>
+    </message>
+    <message>
+        <source>About %1</source>
+        <translation>%1 のバージョン情報</translation>
+    </message>
+    <message>
+        <source>%1, version %2
 
 Shell of the river model editors.</source>
-            <translation>%1 バージョン %2
+        <translation>%1 バージョン %2
 
 河川モデルエディタのシェルです。</translation>
-        </message>
-        <message>
-            <source>The project could not be opened.
+    </message>
+    <message>
+        <source>The project could not be opened.
 %1</source>
-            <translation>プロジェクトを開けませんでした。
+        <translation>プロジェクトを開けませんでした。
 %1</translation>
-        </message>
-        <message>
-            <source>These files of the project %1 could not be opened:
+    </message>
+    <message>
+        <source>These files of the project %1 could not be opened:
 %2</source>
-            <translation>プロジェクト %1 の次のファイルを開けませんでした:
+        <translation>プロジェクト %1 の次のファイルを開けませんでした:
 %2</translation>
-        </message>
-        <message>
-            <source>%1: the file does not exist</source>
-            <translation>%1: ファイルがありません</translation>
-        </message>
-        <message>
-            <source>%1: no editor reads files of this kind</source>
-            <translation>%1: この種類のファイルを扱うエディタがありません</translation>
-        </message>
-    </context>
-    <context>
-        <name>CPluginsDialog</name>
-        <message>
-            <source>Plug-ins</source>
-            <translation>プラグイン</translation>
-        </message>
-        <message>
-            <source>Editor</source>
-            <translation>エディタ</translation>
-        </message>
-        <message>
-            <source>File</source>
-            <translation>ファイル</translation>
-        </message>
-        <message>
-            <source>State</source>
-            <translation>状態</translation>
-        </message>
-        <message>
-            <source>In use</source>
-            <translation>使用中</translation>
-        </message>
-    </context>
-    <context>
-        <name>CProjectTree</name>
-        <message>
-            <source>%1 (missing)</source>
-            <translation>%1 (ファイルなし)</translation>
-        </message>
-        <message>
-            <source>%1 (no editor)</source>
-            <translation>%1 (エディタなし)</translation>
-        </message>
-        <message>
-            <source>&amp;Open</source>
-            <translation>開く(&amp;O)</translation>
-        </message>
-        <message>
-            <source>&amp;Close Project</source>
-            <translation>プロジェクトを閉じる(&amp;C)</translation>
-        </message>
-        <message>
-            <source>Project</source>
-            <translation>プロジェクト</translation>
-        </message>
-        <message>
-            <source>Files of the project</source>
-            <translation>プロジェクトのファイル</translation>
-        </message>
-        <message>
-            <source>%1 (in %2)</source>
-            <translation>%1 (%2 内)</translation>
-        </message>
-        <message>
-            <source>%1: open in the project %2</source>
-            <translation>%1: プロジェクト %2 で開いています</translation>
-        </message>
-    </context>
-    <context>
-        <name>PluginLoader</name>
-        <message>
-            <source>Its document template %1 is missing or names no file extension.</source>
-            <translation>文書テンプレート %1 がないか、拡張子が定められていません。</translation>
-        </message>
-        <message>
-            <source>It could not be loaded: %1</source>
-            <translation>読み込めませんでした: %1</translation>
-        </message>
-        <message>
-            <source>It is no editor: it does not export %1.</source>
-            <translation>エディタではありません。次の関数が公開されていません: %1</translation>
-        </message>
-    </context>
-    <context>
-        <name>Projects</name>
-        <message>
-            <source>%1 is no project: it has no section [%2].</source>
-            <translation>%1 はプロジェクトではありません。セクション [%2] がありません。</translation>
-        </message>
-        <message>
-            <source>%1, line %2: expected a file name after "File =".</source>
-            <translation>%1 の %2 行目: 「File =」の後にファイル名が必要です。</translation>
-        </message>
-    </context>
-    <context>
-        <name>ShellMain</name>
-        <message>
-            <source>Shell of the river model editors</source>
-            <translation>河川モデルエディタのシェル</translation>
-        </message>
-        <message>
-            <source>Folder of the editors.</source>
-            <translation>エディタのフォルダ</translation>
-        </message>
-        <message>
-            <source>folder</source>
-            <translation>フォルダ</translation>
-        </message>
-        <message>
-            <source>Files and projects to open.</source>
-            <translation>開くファイルまたはプロジェクト</translation>
-        </message>
-    </context>
+    </message>
+    <message>
+        <source>%1: the file does not exist</source>
+        <translation>%1: ファイルがありません</translation>
+    </message>
+    <message>
+        <source>%1: no editor reads files of this kind</source>
+        <translation>%1: この種類のファイルを扱うエディタがありません</translation>
+    </message>
+</context>
+<context>
+    <name>CPluginsDialog</name>
+    <message>
+        <source>Plug-ins</source>
+        <translation>プラグイン</translation>
+    </message>
+    <message>
+        <source>Editor</source>
+        <translation>エディタ</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>ファイル</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>状態</translation>
+    </message>
+    <message>
+        <source>In use</source>
+        <translation>使用中</translation>
+    </message>
+</context>
+<context>
+    <name>CProjectTree</name>
+    <message>
+        <source>%1 (missing)</source>
+        <translation>%1 (ファイルなし)</translation>
+    </message>
+    <message>
+        <source>%1 (no editor)</source>
+        <translation>%1 (エディタなし)</translation>
+    </message>
+    <message>
+        <source>&amp;Open</source>
+        <translation>開く(&amp;O)</translation>
+    </message>
+    <message>
+        <source>&amp;Close Project</source>
+        <translation>プロジェクトを閉じる(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Project</source>
+        <translation>プロジェクト</translation>
+    </message>
+    <message>
+        <source>Files of the project</source>
+        <translation>プロジェクトのファイル</translation>
+    </message>
+    <message>
+        <source>%1 (in %2)</source>
+        <translation>%1 (%2 内)</translation>
+    </message>
+    <message>
+        <source>%1: open in the project %2</source>
+        <translation>%1: プロジェクト %2 で開いています</translation>
+    </message>
+</context>
+<context>
+    <name>PluginLoader</name>
+    <message>
+        <source>Its document template %1 is missing or names no file extension.</source>
+        <translation>文書テンプレート %1 がないか、拡張子が定められていません。</translation>
+    </message>
+    <message>
+        <source>It could not be loaded: %1</source>
+        <translation>読み込めませんでした: %1</translation>
+    </message>
+    <message>
+        <source>It is no editor: it does not export %1.</source>
+        <translation>エディタではありません。次の関数が公開されていません: %1</translation>
+    </message>
+</context>
+<context>
+    <name>Projects</name>
+    <message>
+        <source>%1 is no project: it has no section [%2].</source>
+        <translation>%1 はプロジェクトではありません。セクション [%2] がありません。</translation>
+    </message>
+    <message>
+        <source>%1, line %2: expected a file name after &quot;File =&quot;.</source>
+        <translation>%1 の %2 行目: 「File =」の後にファイル名が必要です。</translation>
+    </message>
+</context>
+<context>
+    <name>ShellMain</name>
+    <message>
+        <source>Shell of the river model editors</source>
+        <translation>河川モデルエディタのシェル</translation>
+    </message>
+    <message>
+        <source>Folder of the editors.</source>
+        <translation>エディタのフォルダ</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>フォルダ</translation>
+    </message>
+    <message>
+        <source>Files and projects to open.</source>
+        <translation>開くファイルまたはプロジェクト</translation>
+    </message>
+</context>
 </TS>
