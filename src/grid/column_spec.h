@@ -39,8 +39,6 @@ enum class CellKind
 
 /// A number that is not being edited stands as the column's format has it.
 inline constexpr int AsFormatted = -1;
-/// A format for numbers of any magnitude: six digits that count, and no zeros to fill them up.
-inline constexpr const char* SignificantDigits = "%.6lg";
 
 /// The cell editors by number, in one table.
 struct GridControl
