@@ -1,8 +1,11 @@
 #include "cli/field_text.h"
 
+#include "files/field_io.h"
+
+#include <algorithm>
 #include <charconv>
 #include <cmath>
-#include <functional>
+#include <iterator>
 
 namespace {
 
@@ -28,30 +31,12 @@ std::string DateText(const HDDateTime& d)
 /// Text of a field that is no group.
 std::string ScalarText(const Field& field, const void* object)
 {
-    switch (field.kind) {
-    case FieldKind::Number:
-        return Shortest(field.In<double>(object));
-    case FieldKind::Integer:
-    case FieldKind::Choice:
-        return Shortest(field.In<std::int32_t>(object));
-    case FieldKind::Boolean:
-        return field.In<bool>(object) ? "true" : "false";
-    case FieldKind::Text:
-    case FieldKind::FileName:
-        return field.In<std::string>(object);
-    case FieldKind::DateTime:
-        return DateText(field.In<HDDateTime>(object));
-    case FieldKind::Group:
-        break;
-    }
-    return {};
-}
-
-void ForEachElement(const Field& field, const void* object, const std::function<void(const void*)>& visit)
-{
-    void* const container = field.address(const_cast<void*>(object));
-    for (std::size_t i = 0; i < field.group->size(container); ++i)
-        visit(field.group->at(container, i));
+    return Visit(field, object,
+                 Overloads{[](bool value) { return std::string(value ? "true" : "false"); },
+                           [](const std::string& value) { return value; },
+                           [](const HDDateTime& value) { return DateText(value); },
+                           [](GroupValue<const void>) { return std::string(); },
+                           [](auto value) { return Shortest(value); }});
 }
 
 std::string JsonElement(FieldList fields, const void* element)
@@ -82,26 +67,7 @@ public:
 private:
     Result<void> ParseField(const Field& field, void* object)
     {
-        switch (field.kind) {
-        case FieldKind::Number:
-            return ParseNumber(field.name, field.In<double>(object), "a number");
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-            return ParseNumber(field.name, field.In<std::int32_t>(object), "an integer");
-        case FieldKind::Boolean:
-            return ParseBoolean(field, object);
-        case FieldKind::Text:
-        case FieldKind::FileName:
-            if (AtEnd())
-                return Missing(field.name, "a text");
-            field.In<std::string>(object) = m_texts[m_next++];
-            return {};
-        case FieldKind::DateTime:
-            return ParseDate(field, object);
-        case FieldKind::Group:
-            return ParseGroup(field, object);
-        }
-        return {};
+        return Visit(field, object, [&](auto&& value) { return ParseValue(field.name, value); });
     }
 
     bool AtEnd() const { return m_next == m_texts.size(); }
@@ -112,6 +78,12 @@ private:
     Error Wrong(std::string_view name, const char* expected) const
     {
         return {std::string(name) + " should be " + expected + ", found \"" + m_texts[m_next] + '"'};
+    }
+
+    Result<void> ParseValue(std::string_view name, double& value) { return ParseNumber(name, value, "a number"); }
+    Result<void> ParseValue(std::string_view name, std::int32_t& value)
+    {
+        return ParseNumber(name, value, "an integer");
     }
 
     template <typename T>
@@ -129,50 +101,52 @@ private:
         return {};
     }
 
-    Result<void> ParseBoolean(const Field& field, void* object)
+    Result<void> ParseValue(std::string_view name, bool& value)
     {
         if (AtEnd())
-            return Missing(field.name, "true or false");
+            return Missing(name, "true or false");
         const std::string& text = m_texts[m_next];
         if (text != "true" && text != "false")
-            return Wrong(field.name, "true or false");
-        field.In<bool>(object) = text == "true";
+            return Wrong(name, "true or false");
+        value = text == "true";
         ++m_next;
         return {};
     }
 
-    Result<void> ParseDate(const Field& field, void* object)
+    Result<void> ParseValue(std::string_view name, std::string& value)
+    {
+        if (AtEnd())
+            return Missing(name, "a text");
+        value = m_texts[m_next++];
+        return {};
+    }
+
+    Result<void> ParseValue(std::string_view name, HDDateTime& value)
     {
         HDDateTime date;
         std::int32_t* const parts[] = {&date.Year, &date.Month, &date.Day, &date.Hour, &date.Minute, &date.Second};
         for (std::int32_t* part : parts)
-            if (Result<void> read = ParseNumber(field.name, *part, "six integers: year month day hour minute second");
-                !read)
+            if (Result<void> read = ParseNumber(name, *part, "six integers: year month day hour minute second"); !read)
                 return read;
         if (!date.IsValid())
-            return Error{std::string(field.name) + " should be a date and time, found " + DateText(date)};
-        field.In<HDDateTime>(object) = date;
+            return Error{std::string(name) + " should be a date and time, found " + DateText(date)};
+        value = date;
         return {};
     }
 
-    Result<void> ParseGroup(const Field& field, void* object)
+    Result<void> ParseValue(std::string_view name, GroupValue<void> group)
     {
-        const GroupAccess& group = *field.group;
-        const std::string what = "the number of " + std::string(field.name);
+        const std::string what = "the number of " + std::string(name);
         std::int32_t count = 0;
         if (Result<void> read = ParseNumber(what, count, "an integer"); !read)
             return read;
-        std::size_t perElement = 0;
-        for (const Field& element : group.elements)
-            perElement += element.FixedParams();
-        if (count < 0 || static_cast<std::size_t>(count) > (m_texts.size() - m_next) / perElement)
-            return Error{what + " is " + Shortest(count) + ", which does not fit the " +
-                         std::to_string(m_texts.size() - m_next) + " values behind it"};
-        void* const container = field.address(object);
-        group.resize(container, 0);
-        group.resize(container, static_cast<std::size_t>(count));
-        for (std::int32_t i = 0; i < count; ++i)
-            if (Result<void> read = Parse(group.elements, group.at(container, static_cast<std::size_t>(i))); !read)
+        const std::size_t given = m_texts.size() - m_next;
+        if (!CountFits(group.Elements(), count, static_cast<int>(given)))
+            return Error{what + " is " + Shortest(count) + ", which does not fit the " + std::to_string(given) +
+                         " values behind it"};
+        group.Renew(static_cast<std::size_t>(count));
+        for (std::size_t i = 0; i < group.size(); ++i)
+            if (Result<void> read = Parse(group.Elements(), group[i]); !read)
                 return read;
         return {};
     }
@@ -187,41 +161,30 @@ std::string CellText(const Field& field, const void* object)
 {
     if (field.kind != FieldKind::Group)
         return ScalarText(field, object);
+    const auto group = field.GroupIn(object);
     std::string text;
-    ForEachElement(field, object, [&](const void* element) {
-        if (!text.empty())
-            text += "; ";
-        for (const Field& part : field.group->elements) {
-            if (&part != field.group->elements.data())
-                text += ' ';
-            text += ScalarText(part, element);
-        }
-    });
+    for (std::size_t i = 0; i < group.size(); ++i) {
+        text += i ? "; " : "";
+        const FieldList parts = group.Elements();
+        for (const Field& part : parts)
+            text += (&part == parts.data() ? "" : " ") + ScalarText(part, group[i]);
+    }
     return text;
 }
 
 std::string JsonText(const Field& field, const void* object)
 {
-    switch (field.kind) {
-    case FieldKind::Number:
-        return std::isfinite(field.In<double>(object)) ? ScalarText(field, object) : "null";
-    case FieldKind::Text:
-    case FieldKind::FileName:
-    case FieldKind::DateTime:
-        return JsonString(ScalarText(field, object));
-    case FieldKind::Group: {
-        std::string text = "[";
-        ForEachElement(field, object, [&](const void* element) {
-            text += (text.size() > 1 ? ", " : "") + JsonElement(field.group->elements, element);
-        });
-        return text + ']';
-    }
-    case FieldKind::Integer:
-    case FieldKind::Choice:
-    case FieldKind::Boolean:
-        break;
-    }
-    return ScalarText(field, object);
+    return Visit(field, object,
+                 Overloads{[](double value) { return std::isfinite(value) ? Shortest(value) : "null"; },
+                           [](std::int32_t value) { return Shortest(value); },
+                           [&](bool) { return ScalarText(field, object); },
+                           [](GroupValue<const void> group) {
+                               std::string text = "[";
+                               for (std::size_t i = 0; i < group.size(); ++i)
+                                   text += (i ? ", " : "") + JsonElement(group.Elements(), group[i]);
+                               return text + ']';
+                           },
+                           [&](const auto&) { return JsonString(ScalarText(field, object)); }});
 }
 
 std::string JsonString(std::string_view text)
@@ -242,21 +205,18 @@ std::string JsonString(std::string_view text)
 std::vector<std::string> ParamTexts(FieldList fields, const void* object)
 {
     std::vector<std::string> texts;
-    for (const Field& field : fields) {
-        if (field.kind == FieldKind::Group) {
-            texts.push_back(std::to_string(field.group->size(field.address(const_cast<void*>(object)))));
-            ForEachElement(field, object, [&](const void* element) {
-                for (std::string& text : ParamTexts(field.group->elements, element))
-                    texts.push_back(std::move(text));
-            });
-        } else if (field.kind == FieldKind::DateTime) {
-            const auto& d = field.In<HDDateTime>(object);
-            for (const std::int32_t part : {d.Year, d.Month, d.Day, d.Hour, d.Minute, d.Second})
-                texts.push_back(Shortest(part));
-        } else {
-            texts.push_back(ScalarText(field, object));
-        }
-    }
+    for (const Field& field : fields)
+        Visit(field, object,
+              Overloads{[&](GroupValue<const void> group) {
+                            texts.push_back(std::to_string(group.size()));
+                            for (std::size_t i = 0; i < group.size(); ++i)
+                                std::ranges::move(ParamTexts(group.Elements(), group[i]), std::back_inserter(texts));
+                        },
+                        [&](const HDDateTime& d) {
+                            for (const std::int32_t part : {d.Year, d.Month, d.Day, d.Hour, d.Minute, d.Second})
+                                texts.push_back(Shortest(part));
+                        },
+                        [&](const auto&) { texts.push_back(ScalarText(field, object)); }});
     return texts;
 }
 

@@ -62,12 +62,11 @@ void RecordTable::AddSets(const CGenMetaList<HDEncroach>& sets)
         AddList(sets.GetAt(index), static_cast<int>(index + 1));
 }
 
-void RecordTable::AddItems(const Field& items, HD_Global_Var& global)
+void RecordTable::AddItems(GroupValue<const void> items)
 {
-    SetFields({items.group->elements});
-    void* const container = items.address(&global);
-    for (std::size_t index = 0; index < items.group->size(container); ++index)
-        AddRow(items.group->at(container, index));
+    SetFields({items.Elements()});
+    for (std::size_t index = 0; index < items.size(); ++index)
+        AddRow(items[index]);
 }
 
 std::vector<std::string> RecordTable::Headers() const

@@ -18,7 +18,7 @@ public:
 
     void AddList(const CGenParamListBase& list, int set = 0);
     void AddSets(const CGenMetaList<HDEncroach>& sets);
-    void AddItems(const Field& items, HD_Global_Var& global);
+    void AddItems(GroupValue<const void> items);
 
     void Print(std::ostream& stream, Format format) const;
 

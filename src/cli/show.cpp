@@ -1,6 +1,7 @@
 #include "cli/match.h"
 #include "cli/open_file.h"
 #include "cli/record_table.h"
+#include "files/declare_field.h"
 
 #include <iostream>
 
@@ -18,13 +19,13 @@ std::string KnownLists()
 }
 
 /// The records or items of the list; false when there is no such list.
-bool MakeTable(HD_Parameters& parameters, const std::string& name, RecordTable& table)
+bool MakeTable(const HD_Parameters& parameters, const std::string& name, RecordTable& table)
 {
     for (const ListEntry& entry : HDLists()) {
         if (!SameIgnoringCase(entry.section, name))
             continue;
-        if (entry.list)
-            table.AddList(*entry.list(parameters));
+        if (entry.constList)
+            table.AddList(*entry.constList(parameters));
         else
             table.AddSets(parameters.EncroachList);
         return true;
@@ -33,7 +34,7 @@ bool MakeTable(HD_Parameters& parameters, const std::string& name, RecordTable& 
         for (const Field& items : section.items) {
             if (!SameIgnoringCase(items.name, name))
                 continue;
-            table.AddItems(items, parameters.Global);
+            table.AddItems(items.GroupIn(&parameters.Global));
             return true;
         }
     }
@@ -48,7 +49,7 @@ struct OverviewRow
 constexpr Field overviewFields[] = {Text<&OverviewRow::section>("section"), Text<&OverviewRow::contents>("contents"),
                                     Integer<&OverviewRow::count>("count")};
 
-std::vector<OverviewRow> Overview(HD_Parameters& parameters)
+std::vector<OverviewRow> Overview(const HD_Parameters& parameters)
 {
     std::vector<OverviewRow> rows;
     const auto add = [&rows](std::string_view section, const char* contents, std::size_t count) {
@@ -57,11 +58,11 @@ std::vector<OverviewRow> Overview(HD_Parameters& parameters)
     for (const GlobalSection& section : HDGlobalSections()) {
         add(section.name, "keywords", section.keywords.size());
         for (const Field& items : section.items)
-            add(items.name, "items", items.group->size(items.address(&parameters.Global)));
+            add(items.name, "items", items.GroupIn(&parameters.Global).size());
     }
     for (const ListEntry& entry : HDLists()) {
-        if (entry.list)
-            add(entry.section, "records", entry.list(parameters)->GetCount());
+        if (entry.constList)
+            add(entry.section, "records", entry.constList(parameters)->GetCount());
         else
             add(entry.section, "sets", parameters.EncroachList.GetCount());
     }

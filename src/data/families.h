@@ -13,12 +13,7 @@ public:
     double InitialH = 0; // water level or depth, see the global switch iLevelDepth
     double InitialQ = 0;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Number<&HD_Initial::InitialH>("InitialH", UnitGroup::WaterLevel),
-                                           Number<&HD_Initial::InitialQ>("InitialQ", UnitGroup::Discharge)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Topographical wind factor.
@@ -27,11 +22,7 @@ class HD_Windfact final : public HDRecord<HD_Windfact>
 public:
     double WindFactor = 0;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Number<&HD_Windfact::WindFactor>("WindFactor", UnitGroup::Factor)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Bed resistance, of the whole section and of its three zones. Older files end with the first value.
@@ -41,14 +32,7 @@ public:
     double Resistance = 30;
     double ZoneResistance1 = 30, ZoneResistance2 = 25, ZoneResistance3 = 20;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Number<&HD_Resistfact::Resistance>("Resistance"),
-                                           Optional(Number<&HD_Resistfact::ZoneResistance1>("ZoneResistance1")),
-                                           Optional(Number<&HD_Resistfact::ZoneResistance2>("ZoneResistance2")),
-                                           Optional(Number<&HD_Resistfact::ZoneResistance3>("ZoneResistance3"))};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Approximation of the momentum equation in a reach.
@@ -58,13 +42,7 @@ public:
     double DownstreamChainage = 0;      // end of the reach that starts at Chainage
     std::int32_t WaveApproximation = 0; // 0 high order fully dynamic, 1 fully dynamic, 2 diffusive, 3 kinematic
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {
-            Number<&HD_Wavetype::DownstreamChainage>("DownstreamChainage", UnitGroup::Chainage),
-            Choice<&HD_Wavetype::WaveApproximation>("WaveApproximation")};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Water loss, four coefficients.
@@ -73,13 +51,7 @@ class HD_Waterloss final : public HDRecord<HD_Waterloss>
 public:
     double WaterLoss1 = 0, WaterLoss2 = 0, WaterLoss3 = 0, WaterLoss4 = 0;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {
-            Number<&HD_Waterloss::WaterLoss1>("WaterLoss1"), Number<&HD_Waterloss::WaterLoss2>("WaterLoss2"),
-            Number<&HD_Waterloss::WaterLoss3>("WaterLoss3"), Number<&HD_Waterloss::WaterLoss4>("WaterLoss4")};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Flood plain resistance.
@@ -88,21 +60,16 @@ class HD_Flood_resist final : public HDRecord<HD_Flood_resist>
 public:
     double FloodPlainResistance = 0;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {
-            Number<&HD_Flood_resist::FloodPlainResistance>("FloodPlainResistance", UnitGroup::FloodPlainResistance)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// One pair of mixing coefficients.
 struct CMixingWCCoef
 {
     double First = 0, Second = 0;
+
+    static FieldList DeclaredFields();
 };
-/// The repeated group of such pairs: a count, then the pairs.
-extern const GroupAccess MixingPairs;
 
 /// Mixing coefficients: any number of pairs, then four single ones.
 class HDMixingCoef final : public HDRecord<HDMixingCoef>
@@ -134,14 +101,7 @@ public:
     double CurveValue2 = 0;       // radius
     double CurveValue3 = 0;       // velocity
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Choice<&HDWLCurve::CurveOption>("CurveOption"),
-                                           Number<&HDWLCurve::CurveValue1>("CurveValue1", UnitGroup::Width),
-                                           Number<&HDWLCurve::CurveValue2>("CurveValue2", UnitGroup::Radius),
-                                           Number<&HDWLCurve::CurveValue3>("CurveValue3", UnitGroup::Velocity)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Water level increment due to sand bars.
@@ -153,23 +113,16 @@ public:
     double SandBarValue3 = 0; // area of the low water channel
     double SandBarValue4 = 0; // observed increment
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {
-            Number<&HDWLSandBars::SandBarValue1>("SandBarValue1", UnitGroup::Slope),
-            Number<&HDWLSandBars::SandBarValue2>("SandBarValue2", UnitGroup::Width),
-            Number<&HDWLSandBars::SandBarValue3>("SandBarValue3", UnitGroup::Area),
-            Number<&HDWLSandBars::SandBarValue4>("SandBarValue4", UnitGroup::WaterLevel)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// One step of a resistance curve over velocity.
 struct CBRTVeloRes
 {
     double Velocity = 0, ResValue = 0;
+
+    static FieldList DeclaredFields();
 };
-extern const GroupAccess VelocityResistances;
 
 /// Bed resistance as a function of the flow, bounded, or as a table over velocity.
 class HDBedResTool final : public HDRecord<HDBedResTool>
@@ -199,12 +152,7 @@ class HDKlrParam final : public HDRecord<HDKlrParam>
 public:
     double R1 = 0.05, R2 = 0.05;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Number<&HDKlrParam::R1>("R1", UnitGroup::Factor),
-                                           Number<&HDKlrParam::R2>("R2", UnitGroup::Factor)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Initial conditions of the two layers: 1 the top layer, 0 the bottom layer.
@@ -213,13 +161,7 @@ class HDKlrInit final : public HDRecord<HDKlrInit>
 public:
     double h1 = 0, h0 = 0, Q1 = 0, Q0 = 0;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {
-            Number<&HDKlrInit::h1>("h1", UnitGroup::WaterLevel), Number<&HDKlrInit::h0>("h0", UnitGroup::WaterLevel),
-            Number<&HDKlrInit::Q1>("Q1", UnitGroup::Discharge), Number<&HDKlrInit::Q0>("Q0", UnitGroup::Discharge)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Contraction and expansion losses of the quasi-steady solver.
@@ -228,12 +170,7 @@ class HDContraExpan final : public HDRecord<HDContraExpan>
 public:
     double Contraction = 0.1, Expansion = 0.3;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Number<&HDContraExpan::Contraction>("Contraction", UnitGroup::Factor),
-                                           Number<&HDContraExpan::Expansion>("Expansion", UnitGroup::Factor)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Over-bank reach lengths, left and right bank.
@@ -242,12 +179,7 @@ class HDReachLength final : public HDRecord<HDReachLength>
 public:
     double ReachLength1 = 0, ReachLength2 = 0;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Number<&HDReachLength::ReachLength1>("ReachLength1", UnitGroup::Chainage),
-                                           Number<&HDReachLength::ReachLength2>("ReachLength2", UnitGroup::Chainage)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Grid points of the time series output: a reach from Chainage to PointValue.
@@ -256,11 +188,7 @@ class HDOutputGridPoint final : public HDRecord<HDOutputGridPoint>
 public:
     double PointValue = 0; // downstream chainage
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {Number<&HDOutputGridPoint::PointValue>("PointValue", UnitGroup::Chainage)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };
 
 /// Groundwater leakage.
@@ -269,10 +197,5 @@ class HDLeakage final : public HDRecord<HDLeakage>
 public:
     double LeakageCoefficient = 0;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr Field fields[] = {
-            Number<&HDLeakage::LeakageCoefficient>("LeakageCoefficient", UnitGroup::LeakageCoefficient)};
-        return fields;
-    }
+    static FieldList DeclaredFields();
 };

@@ -6,25 +6,23 @@
 
 namespace {
 
-void LoadItems(tqlHandle section, const GroupAccess& group, void* container, LoadReport* report)
+void LoadItems(tqlHandle section, GroupValue<void> items, LoadReport* report)
 {
-    const int count = tqlGetNoKeywords(section, HDItemKeyword);
-    group.resize(container, 0); // new elements start with their defaults
-    group.resize(container, static_cast<std::size_t>(count));
-    for (int number = 1; number <= count; ++number) {
-        void* const element = group.at(container, static_cast<std::size_t>(number - 1));
-        ParamCursor params(tqlKeywordByNameNum(section, HDItemKeyword, number), report);
-        ReadFields(params, group.elements, element);
-        ReadExtra(params, *group.extra(element));
+    const auto count = static_cast<std::size_t>(tqlGetNoKeywords(section, HDItemKeyword));
+    items.Renew(count);
+    for (std::size_t index = 0; index < count; ++index) {
+        ParamCursor params(tqlKeywordByNameNum(section, HDItemKeyword, static_cast<int>(index) + 1), report);
+        ReadFields(params, items.Elements(), items[index]);
+        ReadExtra(params, *items.ExtraOf(index));
     }
 }
 
-void SaveItems(tqlHandle structure, const GroupAccess& group, void* container)
+void SaveItems(tqlHandle structure, GroupValue<const void> items)
 {
-    for (std::size_t index = 0; index < group.size(container); ++index) {
+    for (std::size_t index = 0; index < items.size(); ++index) {
         tqlAddKeyword(structure, HDItemKeyword);
-        WriteFields(structure, group.elements, group.at(container, index));
-        group.extra(group.at(container, index))->Write(structure);
+        WriteFields(structure, items.Elements(), items[index]);
+        items.ExtraOf(index)->Write(structure);
     }
 }
 
@@ -69,7 +67,7 @@ void HD_Global_Var::LoadSection(tqlHandle section, const GlobalSection& table, L
             continue;
         if (report)
             report->InSection(items.name);
-        LoadItems(inner, *items.group, items.address(this), report);
+        LoadItems(inner, items.GroupIn(this), report);
         CollectUnknown(inner, &HDKnownItem, m_unknown[items.name], report);
     }
     if (report)
@@ -90,7 +88,7 @@ void HD_Global_Var::LoadKeyword(tqlHandle keyword, const GlobalKeyword& row, Loa
     else
         m_extra[&row] = std::move(extra);
     // The titles stand before their flags in the table, and so are read by now.
-    if (report && row.Fields().front().group == &HDMarkFlags && MarkInterpolate.size() > MarkTitles.size())
+    if (report && row.Fields().front().address(this) == &MarkInterpolate && MarkInterpolate.size() > MarkTitles.size())
         report->Add(keyword, keyword,
                     {.kind = Finding::SurplusFlags,
                      .behind = static_cast<int>(MarkTitles.size()),
@@ -128,7 +126,7 @@ void HD_Global_Var::SaveSection(tqlHandle structure, const GlobalSection& table)
     }
     for (const Field& items : table.items) {
         tqlAddSection(structure, items.name);
-        SaveItems(structure, *items.group, items.address(const_cast<HD_Global_Var*>(this)));
+        SaveItems(structure, items.GroupIn(this));
         SaveUnknown(structure, items.name);
         tqlEndSection(structure);
     }

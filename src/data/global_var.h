@@ -3,6 +3,7 @@
 #pragma once
 
 #include "data/families.h"
+#include "files/declare_field.h"
 #include "files/unknown_content.h"
 
 #include <deque>
@@ -93,6 +94,8 @@ struct CTextOutItem
     std::string UserName;
     std::int32_t Decimals = 2;
     ExtraParams Extra;
+
+    static FieldList DeclaredFields();
 };
 
 struct CTextAutoFile
@@ -101,6 +104,8 @@ struct CTextAutoFile
     bool AutoName = false;
     std::string FileName;
     ExtraParams Extra;
+
+    static FieldList DeclaredFields();
 };
 
 struct HDTextOutput
@@ -129,6 +134,8 @@ struct CMapsOutput
     bool DefaultPeriod = false;
     HDDateTime StartTime = HDDateTime::Now(), EndTime = HDDateTime::Now();
     ExtraParams Extra;
+
+    static FieldList DeclaredFields();
 };
 
 struct CMapsInput
@@ -137,6 +144,8 @@ struct CMapsInput
     std::int32_t ItemNo = 0;
     std::int32_t Order = 0; // priority among the files
     ExtraParams Extra;
+
+    static FieldList DeclaredFields();
 };
 
 struct HDMapOutput
@@ -228,9 +237,6 @@ private:
     std::map<const GlobalKeyword*, std::string> m_unread; // parameters of keywords that another one's absence closed
 };
 
-// The elements of the lists without locations.
-extern const GroupAccess HDMarkFlags, TextOutItems, TextAutoFiles, MapsOutputs, MapsInputs;
-
 /// The section of a file that holds the global values.
 inline constexpr std::string_view HDGlobalSectionName = "Global_Variables";
 /// The keyword that holds one element of an item sub-section.
@@ -244,8 +250,8 @@ struct GlobalKeyword
     FieldList several{};
     std::string_view onlyWith{}; // read only when this keyword is there
 
-    constexpr GlobalKeyword(const Field& field, std::string_view with = {})
-        : name(field.name), single(field), onlyWith(with)
+    consteval GlobalKeyword(const Field& field, std::string_view with = {})
+        : name(field.name), single(FieldsOf<HD_Global_Var>({field})[0]), onlyWith(with)
     {
     }
     constexpr GlobalKeyword(std::string_view keyword, FieldList fields) : name(keyword), several(fields) {}

@@ -5,31 +5,32 @@
 namespace {
 
 template <auto List>
-CGenParamListBase* Of(HD_Parameters& parameters)
+constexpr ListEntry Entry(const char* section, bool purgedAtSave)
 {
-    return &(parameters.*List);
+    return {section, purgedAtSave, [](HD_Parameters& parameters) -> CGenParamListBase* { return &(parameters.*List); },
+            [](const HD_Parameters& parameters) -> const CGenParamListBase* { return &(parameters.*List); }};
 }
 
 using P = HD_Parameters;
 constexpr ListEntry lists[] = {
-    {"InitList", true, &Of<&P::InitList>},
-    {"WindList", true, &Of<&P::WindList>},
-    {"BedList", true, &Of<&P::BedList>},
-    {"WaveList", true, &Of<&P::WaveList>},
-    {"WaterList", true, &Of<&P::WaterList>},
-    {"FloodList", true, &Of<&P::FloodList>},
-    {"MixingCoefList", true, &Of<&P::MixingCoefList>},
-    {"WaterLevelMarkList", true, &Of<&P::WaterLevelMarkList>},
-    {"BedResistanceToolboxList", true, &Of<&P::BedResistanceToolboxList>},
-    {"WLCurveList", false, &Of<&P::WLCurveList>},
-    {"WLSandBarsList", false, &Of<&P::WLSandBarsList>},
-    {"Enc_Simulation", false, nullptr},
-    {"KlrParamList", true, &Of<&P::KlrParamList>},
-    {"KlrInitList", true, &Of<&P::KlrInitList>},
-    {"QSSContractionExpansionList", true, &Of<&P::QSSContractionExpansionList>},
-    {"QSSReachLengthsList", true, &Of<&P::QSSReachLengthsList>},
-    {"OutputGridPoints", false, &Of<&P::OutputGridPoints>},
-    {"LeakageList", false, &Of<&P::LeakageList>},
+    Entry<&P::InitList>("InitList", true),
+    Entry<&P::WindList>("WindList", true),
+    Entry<&P::BedList>("BedList", true),
+    Entry<&P::WaveList>("WaveList", true),
+    Entry<&P::WaterList>("WaterList", true),
+    Entry<&P::FloodList>("FloodList", true),
+    Entry<&P::MixingCoefList>("MixingCoefList", true),
+    Entry<&P::WaterLevelMarkList>("WaterLevelMarkList", true),
+    Entry<&P::BedResistanceToolboxList>("BedResistanceToolboxList", true),
+    Entry<&P::WLCurveList>("WLCurveList", false),
+    Entry<&P::WLSandBarsList>("WLSandBarsList", false),
+    {"Enc_Simulation", false, nullptr, nullptr},
+    Entry<&P::KlrParamList>("KlrParamList", true),
+    Entry<&P::KlrInitList>("KlrInitList", true),
+    Entry<&P::QSSContractionExpansionList>("QSSContractionExpansionList", true),
+    Entry<&P::QSSReachLengthsList>("QSSReachLengthsList", true),
+    Entry<&P::OutputGridPoints>("OutputGridPoints", false),
+    Entry<&P::LeakageList>("LeakageList", false),
 };
 
 } // namespace
@@ -76,8 +77,8 @@ void HD_Parameters::Save(tqlHandle structure, bool everySet) const
     tqlAddTarget(structure, HDTargetName);
     Global.Save(structure);
     for (const ListEntry& entry : lists) {
-        if (entry.list)
-            entry.list(const_cast<HD_Parameters&>(*this))->Save(structure);
+        if (entry.constList)
+            entry.constList(*this)->Save(structure);
         else
             EncroachList.Save(structure, everySet);
     }

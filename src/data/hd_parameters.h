@@ -48,8 +48,10 @@ struct HD_Parameters
 struct ListEntry
 {
     const char* section;
-    bool purgedAtSave;                          // incomplete lines are removed when the document is saved
-    CGenParamListBase* (*list)(HD_Parameters&); // null for the encroachment set-ups, a list of lists
+    bool purgedAtSave; // incomplete lines are removed when the document is saved
+    // Null for the encroachment set-ups, a list of lists.
+    CGenParamListBase* (*list)(HD_Parameters&);
+    const CGenParamListBase* (*constList)(const HD_Parameters&);
 };
 std::span<const ListEntry> HDLists();
 /// The target's sections that are known, each once.

@@ -18,10 +18,3 @@ void ReadRecord(tqlHandle keyword, LoadReport* report, HD_RiverPos& record, Fiel
         ReadFields(params, fields, &record);
     ReadExtra(params, record.Extra);
 }
-
-FieldList LocationFields()
-{
-    static constexpr Field fields[] = {Text<&HD_RiverPos::RiverName>("RiverName"),
-                                       Number<&HD_RiverPos::Chainage>("Chainage", UnitGroup::Chainage)};
-    return fields;
-}

@@ -1,19 +1,19 @@
-// One parameter of a keyword, declared once: its name, where it lives in its object, its kind and quantity.
-// Reading, writing, comparison, export and grid columns all walk arrays of these.
+// One parameter of a keyword, declared once (declare_field.h): its name, the member that holds it, and all else that is
+// known about it. Reading, writing, comparison, export, grid columns and single fields all walk arrays of these.
 #pragma once
 
 #include "base/unit_group.h"
 
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
 #include <type_traits>
-#include <vector>
 
 class ExtraParams;
-class HD_RiverPos;
+enum class Str : int; // the number of a text; who gives one knows the table
 
 /// A calendar date and time as a file stores it. The six integers are kept even when they are no date.
 struct HDDateTime
@@ -40,26 +40,130 @@ enum class FieldKind
 };
 
 struct Field;
+using FieldList = std::span<const Field>;
 
 /// How the elements of a repeated group are reached. `container` is the address that Field::address gives.
 struct GroupAccess
 {
-    std::span<const Field> elements; // fields of one element, in file order
-    bool padWhenEmpty = false;       // an empty group is followed by one element with default values
-    std::size_t (*size)(const void* container) = nullptr;
-    void (*resize)(void* container, std::size_t count) = nullptr;
-    void* (*at)(void* container, std::size_t index) = nullptr;
-    ExtraParams* (*extra)(void* element) = nullptr; // what a file holds behind the element's fields; may be null
+    FieldList (*elements)(); // fields of one element, in file order
+    std::size_t (*size)(const void* container);
+    void (*resize)(void* container, std::size_t count);
+    void* (*at)(void* container, std::size_t index);
+    const void* (*constAt)(const void* container, std::size_t index);
+    ExtraParams* (*extra)(void* element); // what a file holds behind the element's fields; null where nothing is kept
+    const ExtraParams* (*constExtra)(const void* element);
+};
+
+/// One line of a text that holds several, or the whole of it.
+struct TextLine
+{
+    static constexpr int Whole = -1;
+
+    Str text{};
+    int line = Whole;
+
+    explicit constexpr operator bool() const { return text != Str{}; }
+};
+
+/// The value of a group: the elements of a container. `Void` is const for an object that is.
+template <typename Void>
+class GroupValue
+{
+public:
+    using Extra = std::conditional_t<std::is_const_v<Void>, const ExtraParams, ExtraParams>;
+
+    GroupValue(const Field& field, Void* container) : m_field(&field), m_container(container) {}
+
+    FieldList Elements() const { return Access().elements(); }
+    std::size_t size() const { return Access().size(m_container); }
+    Void* operator[](std::size_t index) const
+    {
+        if constexpr (std::is_const_v<Void>)
+            return Access().constAt(m_container, index);
+        else
+            return Access().at(m_container, index);
+    }
+    /// Elements with their defaults; what the group held is gone.
+    void Renew(std::size_t count) const requires(!std::is_const_v<Void>)
+    {
+        Access().resize(m_container, 0);
+        Access().resize(m_container, count);
+    }
+    /// Null where nothing is kept.
+    Extra* ExtraOf(std::size_t index) const
+    {
+        if (!Access().extra)
+            return nullptr;
+        if constexpr (std::is_const_v<Void>)
+            return Access().constExtra((*this)[index]);
+        else
+            return Access().extra((*this)[index]);
+    }
+
+private:
+    inline const GroupAccess& Access() const;
+
+    const Field* m_field;
+    Void* m_container;
 };
 
 struct Field
 {
     std::string_view name;
     FieldKind kind = FieldKind::Number;
+    const void* owner = nullptr; // the tag of the class that declares the member
+    // A location record is passed as its HD_RiverPos.
+    void* (*address)(void* object) = nullptr;
+    const void* (*constAddress)(const void* object) = nullptr;
+    const GroupAccess* group = nullptr; // Group only
     UnitGroup unit = UnitGroup::None;
-    bool optionalTail = false;                // read only when the keyword has parameters left; always written
-    void* (*address)(void* object) = nullptr; // a location record is passed as its HD_RiverPos
-    const GroupAccess* group = nullptr;       // Group only
+    bool optionalTail = false; // read only when the keyword has parameters left; always written
+    bool padWhenEmpty = false; // an empty group is followed by one element with default values
+    TextLine title{};
+    Str choices{};                              // the texts of the indices, one a line; for a text what it may be
+    std::int32_t firstChoice = 0;               // the index of the first of them
+    int digits = 0;                             // significant ones, where a number is shown; 0 for the usual
+    std::optional<double> minimum{}, maximum{}; // what a user may enter, in base units
+
+    // What else a declaration says, one after the other.
+    constexpr Field Title(Str text, int line = TextLine::Whole) const
+    {
+        Field field = *this;
+        field.title = {text, line};
+        return field;
+    }
+    constexpr Field Choices(Str texts, std::int32_t first = 0) const
+    {
+        Field field = *this;
+        field.choices = texts;
+        field.firstChoice = first;
+        return field;
+    }
+    constexpr Field Range(std::optional<double> least, std::optional<double> most = {}) const
+    {
+        Field field = *this;
+        field.minimum = least;
+        field.maximum = most;
+        return field;
+    }
+    constexpr Field Digits(int significant) const
+    {
+        Field field = *this;
+        field.digits = significant;
+        return field;
+    }
+    constexpr Field OptionalTail() const
+    {
+        Field field = *this;
+        field.optionalTail = true;
+        return field;
+    }
+    constexpr Field PadWhenEmpty() const
+    {
+        Field field = *this;
+        field.padWhenEmpty = true;
+        return field;
+    }
 
     /// The value inside `object`, of the type that the kind says.
     template <typename T>
@@ -70,156 +174,67 @@ struct Field
     template <typename T>
     const T& In(const void* object) const
     {
-        return *static_cast<const T*>(address(const_cast<void*>(object)));
+        return *static_cast<const T*>(constAddress(object));
     }
+    GroupValue<void> GroupIn(void* object) const { return {*this, address(object)}; }
+    GroupValue<const void> GroupIn(const void* object) const { return {*this, constAddress(object)}; }
     /// Number of file parameters: 1, 6 for a date-time, 0 for a group (depends on its count).
     std::size_t FixedParams() const { return kind == FieldKind::DateTime ? 6 : kind == FieldKind::Group ? 0 : 1; }
 };
 
-using FieldList = std::span<const Field>;
-
-namespace field_detail {
-
-template <typename>
-struct MemberOf;
-template <typename C, typename M>
-struct MemberOf<M C::*>
+template <typename Void>
+const GroupAccess& GroupValue<Void>::Access() const
 {
-    using Class = C;
-    using Type = M;
+    return *m_field->group;
+}
+
+/// Stands for the type of a group, whose elements have a type each.
+struct GroupType
+{
 };
 
-/// The object as the class that declares the member. Records travel as their base class.
-template <typename Class>
-Class* Object(void* object)
+/// Calls `visit` with std::type_identity of the type that values of the kind have.
+template <typename Visitor>
+decltype(auto) VisitKind(FieldKind kind, Visitor&& visit)
 {
-    if constexpr (std::is_base_of_v<HD_RiverPos, Class>)
-        return static_cast<Class*>(static_cast<HD_RiverPos*>(object));
-    else
-        return static_cast<Class*>(object);
-}
-/// A member, or a member of a member.
-template <auto Member, auto... Inner>
-void* Address(void* object)
-{
-    return &((Object<typename MemberOf<decltype(Member)>::Class>(object)->*Member).*....*Inner);
-}
-template <std::size_t Index, auto Member, auto... Inner>
-void* ElementAddress(void* object)
-{
-    return &((Object<typename MemberOf<decltype(Member)>::Class>(object)->*Member).*....*Inner)[Index];
-}
-inline void* Identity(void* object)
-{
-    return object;
+    switch (kind) {
+    case FieldKind::Number:
+        return visit(std::type_identity<double>{});
+    case FieldKind::Integer:
+    case FieldKind::Choice:
+        return visit(std::type_identity<std::int32_t>{});
+    case FieldKind::Boolean:
+        return visit(std::type_identity<bool>{});
+    case FieldKind::Text:
+    case FieldKind::FileName:
+        return visit(std::type_identity<std::string>{});
+    case FieldKind::DateTime:
+        return visit(std::type_identity<HDDateTime>{});
+    case FieldKind::Group:
+        break;
+    }
+    return visit(std::type_identity<GroupType>{});
 }
 
-template <typename Container>
-std::size_t Size(const void* container)
+/// Functions of several types of value as one visitor.
+template <typename... Functions>
+struct Overloads : Functions...
 {
-    return static_cast<const Container*>(container)->size();
-}
-template <typename Container>
-void Resize(void* container, std::size_t count)
-{
-    static_cast<Container*>(container)->resize(count);
-}
-template <typename Container>
-void* At(void* container, std::size_t index)
-{
-    return &(*static_cast<Container*>(container))[index];
-}
-template <typename Element>
-ExtraParams* Extra(void* element)
-{
-    return &static_cast<Element*>(element)->Extra;
-}
-template <typename Container>
-constexpr auto ExtraAccess() -> ExtraParams* (*)(void*)
-{
-    if constexpr (requires(typename Container::value_type element) { element.Extra; })
-        return &Extra<typename Container::value_type>;
-    else
-        return nullptr;
-}
+    using Functions::operator()...;
+};
+template <typename... Functions>
+Overloads(Functions...) -> Overloads<Functions...>;
 
-} // namespace field_detail
-
-// Declaring fields: Number<&HD_Initial::InitialH>("InitialH", UnitGroup::WaterLevel), or, for a member of a member,
-// Number<&HD_Global_Var::HeatBalance, &HDHeatBalance::Latitude>("Latitude", UnitGroup::GeoAngle).
-template <auto... Path>
-constexpr Field Number(std::string_view name, UnitGroup unit = UnitGroup::None)
+/// Calls `visit` with the field's value in `object`: double, std::int32_t, bool, std::string, HDDateTime or GroupValue,
+/// const where the object is.
+template <typename Object, typename Visitor>
+decltype(auto) Visit(const Field& field, Object* object, Visitor&& visit)
 {
-    return {name, FieldKind::Number, unit, false, &field_detail::Address<Path...>};
-}
-/// Element `Index` of an array member.
-template <std::size_t Index, auto... Path>
-constexpr Field NumberAt(std::string_view name, UnitGroup unit = UnitGroup::None)
-{
-    return {name, FieldKind::Number, unit, false, &field_detail::ElementAddress<Index, Path...>};
-}
-template <std::size_t Index, auto... Path>
-constexpr Field BooleanAt(std::string_view name)
-{
-    return {name, FieldKind::Boolean, UnitGroup::None, false, &field_detail::ElementAddress<Index, Path...>};
-}
-template <auto... Path>
-constexpr Field Scalar(FieldKind kind, std::string_view name)
-{
-    return {name, kind, UnitGroup::None, false, &field_detail::Address<Path...>};
-}
-template <auto... Path>
-constexpr Field Integer(std::string_view name)
-{
-    return Scalar<Path...>(FieldKind::Integer, name);
-}
-template <auto... Path>
-constexpr Field Choice(std::string_view name)
-{
-    return Scalar<Path...>(FieldKind::Choice, name);
-}
-template <auto... Path>
-constexpr Field Boolean(std::string_view name)
-{
-    return Scalar<Path...>(FieldKind::Boolean, name);
-}
-template <auto... Path>
-constexpr Field Text(std::string_view name)
-{
-    return Scalar<Path...>(FieldKind::Text, name);
-}
-template <auto... Path>
-constexpr Field FileName(std::string_view name)
-{
-    return Scalar<Path...>(FieldKind::FileName, name);
-}
-template <auto... Path>
-constexpr Field DateTime(std::string_view name)
-{
-    return Scalar<Path...>(FieldKind::DateTime, name);
-}
-/// The element of a group of plain values (a list of strings, of numbers).
-constexpr Field Plain(FieldKind kind, std::string_view name, UnitGroup unit = UnitGroup::None)
-{
-    return {name, kind, unit, false, &field_detail::Identity};
-}
-constexpr Field Optional(Field field)
-{
-    field.optionalTail = true;
-    return field;
-}
-template <typename Container>
-constexpr GroupAccess GroupOf(FieldList elements, bool padWhenEmpty = false)
-{
-    return {elements,
-            padWhenEmpty,
-            &field_detail::Size<Container>,
-            &field_detail::Resize<Container>,
-            &field_detail::At<Container>,
-            field_detail::ExtraAccess<Container>()};
-}
-template <auto... Path>
-constexpr Field Group(std::string_view name, const GroupAccess& access)
-{
-    return {name, FieldKind::Group, UnitGroup::None, false, &field_detail::Address<Path...>, &access};
+    using Void = std::conditional_t<std::is_const_v<Object>, const void, void>;
+    return VisitKind(field.kind, [&]<typename T>(std::type_identity<T>) -> decltype(auto) {
+        if constexpr (std::is_same_v<T, GroupType>)
+            return visit(field.GroupIn(static_cast<Void*>(object)));
+        else
+            return visit(field.In<T>(static_cast<Void*>(object)));
+    });
 }

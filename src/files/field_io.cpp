@@ -2,6 +2,7 @@
 
 #include "files/extra_params.h"
 
+#include <algorithm>
 #include <bit>
 #include <cmath>
 #include <limits>
@@ -57,20 +58,19 @@ void ReportType(const ParamCursor& params, tqlHandle at, const Field& field, con
 }
 
 template <typename Value>
-void ReadValue(ParamCursor& params, const Field& field, void* object)
+void ReadValue(ParamCursor& params, const Field& field, const void* object, Value& value)
 {
-    auto* const value = static_cast<Value*>(field.address(object));
     const tqlHandle at = params.param;
-    if (!params.Take(value)) [[unlikely]]
-        ReportType(params, at, field, object, TakeBeyondDoubt(at, value));
+    if (!params.Take(&value)) [[unlikely]]
+        ReportType(params, at, field, object, TakeBeyondDoubt(at, &value));
 }
 
 /// Strings and file names are read alike; which of them it should be is told.
-void ReadText(ParamCursor& params, const Field& field, void* object)
+void ReadText(ParamCursor& params, const Field& field, const void* object, std::string& value)
 {
     const tqlHandle at = params.param;
     const TqlType expected = field.kind == FieldKind::Text ? TqlType::String : TqlType::FileName;
-    const bool taken = params.Take(static_cast<std::string*>(field.address(object)));
+    const bool taken = params.Take(&value);
     if (params.report && tqlGetType(at) != expected) [[unlikely]]
         ReportType(params, at, field, object, taken);
 }
@@ -78,10 +78,9 @@ void ReadText(ParamCursor& params, const Field& field, void* object)
 // ---- dates -------------------------------------------------------------------------------------
 
 /// Six integers; a date made of halves would be neither the old nor the new one.
-void ReadDateTime(ParamCursor& params, const Field& field, void* object)
+void ReadDateTime(ParamCursor& params, const Field& field, const void* object, HDDateTime& value)
 {
     constexpr int parts = 6;
-    auto& value = *static_cast<HDDateTime*>(field.address(object));
     const tqlHandle first = params.param;
     const auto report = [&](Finding::Kind kind, tqlHandle at, int parameter) {
         if (params.report)
@@ -128,18 +127,15 @@ void WriteDateTime(tqlHandle structure, const HDDateTime& value)
 }
 
 /// Reads a count and its elements; false when the count is none or does not fit.
-bool ReadGroup(ParamCursor& params, const Field& field, void* object)
+bool ReadGroup(ParamCursor& params, const Field& field, GroupValue<void> group)
 {
-    const GroupAccess& group = *field.group;
-    void* const container = field.address(object);
     const tqlHandle at = params.param;
     std::int32_t elements = 0;
     const bool isInteger = tqlGetInt(at, &elements);
-    if ((!isInteger && !GetWhole(at, &elements)) || !CountFits(group, elements, params.Left() - 1))
+    if ((!isInteger && !GetWhole(at, &elements)) || !CountFits(group.Elements(), elements, params.Left() - 1))
         return false;
     params.Next();
-    group.resize(container, 0); // new elements start with their defaults
-    group.resize(container, static_cast<std::size_t>(elements));
+    group.Renew(static_cast<std::size_t>(elements));
     if (!isInteger && params.report)
         params.report->Add(at, params.keyword,
                            {.kind = Finding::OtherType,
@@ -150,9 +146,9 @@ bool ReadGroup(ParamCursor& params, const Field& field, void* object)
                             .found = std::string(tqlGetRawParam(at)),
                             .used = std::to_string(elements)});
     for (std::int32_t i = 0; i < elements; ++i)
-        ReadFields(params, group.elements, group.at(container, static_cast<std::size_t>(i)));
-    const int size = static_cast<int>(ParamsOf(group.elements));
-    if (elements == 0 && group.padWhenEmpty && params.Left() >= size)
+        ReadFields(params, group.Elements(), group[static_cast<std::size_t>(i)]);
+    const int size = static_cast<int>(ParamsOf(group.Elements()));
+    if (elements == 0 && field.padWhenEmpty && params.Left() >= size)
         params.Skip(size);
     return true;
 }
@@ -190,64 +186,63 @@ void ReportMissing(const ParamCursor& params, FieldList missing, const void* obj
                         .used = ParamsText(missing, object)});
 }
 
+void WriteValue(tqlHandle structure, const Field& field, const std::string& value)
+{
+    if (field.kind == FieldKind::FileName)
+        tqlAddFilename(structure, value);
+    else
+        tqlAddString(structure, value);
+}
+
 /// The element that stands for "none" where a keyword may not end with its count.
 void WritePadding(tqlHandle structure, FieldList fields)
 {
-    for (const Field& field : fields) {
-        switch (field.kind) {
-        case FieldKind::Number:
-            tqlAddDouble(structure, 0);
-            break;
-        case FieldKind::Boolean:
-            tqlAddBool(structure, false);
-            break;
-        case FieldKind::Text:
-            tqlAddString(structure, {});
-            break;
-        case FieldKind::FileName:
-            tqlAddFilename(structure, {});
-            break;
-        case FieldKind::DateTime:
-            WriteDateTime(structure, {});
-            break;
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-        case FieldKind::Group:
-            tqlAddInt(structure, 0);
-            break;
-        }
-    }
+    for (const Field& field : fields)
+        VisitKind(field.kind, Overloads{[&](std::type_identity<double>) { tqlAddDouble(structure, 0); },
+                                        [&](std::type_identity<bool>) { tqlAddBool(structure, false); },
+                                        [&](std::type_identity<std::string>) { WriteValue(structure, field, {}); },
+                                        [&](std::type_identity<HDDateTime>) { WriteDateTime(structure, {}); },
+                                        [&](auto) { tqlAddInt(structure, 0); }});
 }
 
-void WriteGroup(tqlHandle structure, const GroupAccess& group, void* container)
+void WriteGroup(tqlHandle structure, const Field& field, GroupValue<const void> group)
 {
-    const std::size_t size = group.size(container);
-    tqlAddInt(structure, static_cast<std::int32_t>(size));
-    for (std::size_t i = 0; i < size; ++i)
-        WriteFields(structure, group.elements, group.at(container, i));
-    if (size == 0 && group.padWhenEmpty)
-        WritePadding(structure, group.elements);
+    tqlAddInt(structure, static_cast<std::int32_t>(group.size()));
+    for (std::size_t i = 0; i < group.size(); ++i)
+        WriteFields(structure, group.Elements(), group[i]);
+    if (group.size() == 0 && field.padWhenEmpty)
+        WritePadding(structure, group.Elements());
 }
 
-bool SameGroup(const GroupAccess& group, void* a, void* b)
+bool Same(GroupValue<const void> a, GroupValue<const void> b)
 {
-    const std::size_t size = group.size(a);
-    if (size != group.size(b))
+    if (a.size() != b.size())
         return false;
-    for (std::size_t i = 0; i < size; ++i)
-        if (!SameFields(group.elements, group.at(a, i), group.at(b, i)))
+    for (std::size_t i = 0; i < a.size(); ++i)
+        if (!SameFields(a.Elements(), a[i], b[i]))
             return false;
     return true;
 }
 
-void CopyGroup(const GroupAccess& group, void* from, void* to)
+/// By bits: a nan equals itself, and -0 is not 0.
+bool Same(double a, double b)
 {
-    const std::size_t size = group.size(from);
-    group.resize(to, size);
-    for (std::size_t i = 0; i < size; ++i) {
-        CopyFields(group.elements, group.at(from, i), group.at(to, i));
-        if (group.extra)
-            *group.extra(group.at(to, i)) = *group.extra(group.at(from, i));
+    return std::bit_cast<std::uint64_t>(a) == std::bit_cast<std::uint64_t>(b);
+}
+
+template <typename Value>
+bool Same(const Value& a, const Value& b)
+{
+    return a == b;
+}
+
+void CopyGroup(GroupValue<const void> from, GroupValue<void> to)
+{
+    to.Renew(from.size());
+    for (std::size_t i = 0; i < from.size(); ++i) {
+        CopyFields(from.Elements(), from[i], to[i]);
+        if (ExtraParams* const extra = to.ExtraOf(i))
+            *extra = *from.ExtraOf(i);
     }
 }
 
@@ -261,9 +256,9 @@ std::size_t ParamsOf(FieldList fields)
     return count;
 }
 
-bool CountFits(const GroupAccess& group, std::int32_t count, int paramsLeft)
+bool CountFits(FieldList elements, std::int32_t count, int paramsLeft)
 {
-    return count >= 0 && count <= paramsLeft / static_cast<int>(ParamsOf(group.elements));
+    return count >= 0 && count <= paramsLeft / static_cast<int>(ParamsOf(elements));
 }
 
 bool ReadFields(ParamCursor& params, FieldList fields, void* object)
@@ -278,32 +273,27 @@ bool ReadFields(ParamCursor& params, FieldList fields, void* object)
             return false;
         }
         inTail = field.optionalTail;
-        switch (field.kind) {
-        case FieldKind::Number:
-            ReadValue<double>(params, field, object);
-            break;
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-            ReadValue<std::int32_t>(params, field, object);
-            break;
-        case FieldKind::Boolean:
-            ReadValue<bool>(params, field, object);
-            break;
-        case FieldKind::Text:
-        case FieldKind::FileName:
-            ReadText(params, field, object);
-            break;
-        case FieldKind::DateTime:
-            ReadDateTime(params, field, object);
-            break;
-        case FieldKind::Group:
-            if (!ReadGroup(params, field, object)) {
-                ReportCount(params, fields.subspan(static_cast<std::size_t>(&field - fields.data())), object);
-                params.ToEnd();
-                return true; // told
-            }
-            behindCount = true;
-            break;
+        const bool isRead = Visit(field, object,
+                                  Overloads{[&](std::string& value) {
+                                                ReadText(params, field, object, value);
+                                                return true;
+                                            },
+                                            [&](HDDateTime& value) {
+                                                ReadDateTime(params, field, object, value);
+                                                return true;
+                                            },
+                                            [&](GroupValue<void> group) {
+                                                behindCount = true;
+                                                return ReadGroup(params, field, group);
+                                            },
+                                            [&](auto& value) {
+                                                ReadValue(params, field, object, value);
+                                                return true;
+                                            }});
+        if (!isRead) {
+            ReportCount(params, fields.subspan(static_cast<std::size_t>(&field - fields.data())), object);
+            params.ToEnd();
+            return true; // told
         }
     }
     return true;
@@ -332,91 +322,29 @@ std::string ParamsText(FieldList fields, const void* object)
 
 void WriteFields(tqlHandle structure, FieldList fields, const void* object)
 {
-    for (const Field& field : fields) {
-        switch (field.kind) {
-        case FieldKind::Number:
-            tqlAddDouble(structure, field.In<double>(object));
-            break;
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-            tqlAddInt(structure, field.In<std::int32_t>(object));
-            break;
-        case FieldKind::Boolean:
-            tqlAddBool(structure, field.In<bool>(object));
-            break;
-        case FieldKind::Text:
-            tqlAddString(structure, field.In<std::string>(object));
-            break;
-        case FieldKind::FileName:
-            tqlAddFilename(structure, field.In<std::string>(object));
-            break;
-        case FieldKind::DateTime:
-            WriteDateTime(structure, field.In<HDDateTime>(object));
-            break;
-        case FieldKind::Group:
-            WriteGroup(structure, *field.group, field.address(const_cast<void*>(object)));
-            break;
-        }
-    }
+    for (const Field& field : fields)
+        Visit(field, object,
+              Overloads{[&](double value) { tqlAddDouble(structure, value); },
+                        [&](std::int32_t value) { tqlAddInt(structure, value); },
+                        [&](bool value) { tqlAddBool(structure, value); },
+                        [&](const std::string& value) { WriteValue(structure, field, value); },
+                        [&](const HDDateTime& value) { WriteDateTime(structure, value); },
+                        [&](GroupValue<const void> group) { WriteGroup(structure, field, group); }});
 }
 
 bool SameFields(FieldList fields, const void* a, const void* b)
 {
-    for (const Field& field : fields) {
-        bool same = false;
-        switch (field.kind) {
-        case FieldKind::Number: // bits: a nan equals itself, and -0 is not 0
-            same =
-                std::bit_cast<std::uint64_t>(field.In<double>(a)) == std::bit_cast<std::uint64_t>(field.In<double>(b));
-            break;
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-            same = field.In<std::int32_t>(a) == field.In<std::int32_t>(b);
-            break;
-        case FieldKind::Boolean:
-            same = field.In<bool>(a) == field.In<bool>(b);
-            break;
-        case FieldKind::Text:
-        case FieldKind::FileName:
-            same = field.In<std::string>(a) == field.In<std::string>(b);
-            break;
-        case FieldKind::DateTime:
-            same = field.In<HDDateTime>(a) == field.In<HDDateTime>(b);
-            break;
-        case FieldKind::Group:
-            same = SameGroup(*field.group, field.address(const_cast<void*>(a)), field.address(const_cast<void*>(b)));
-            break;
-        }
-        if (!same)
-            return false;
-    }
-    return true;
+    return std::ranges::all_of(fields, [&](const Field& field) {
+        return Visit(field, a,
+                     Overloads{[&](GroupValue<const void> group) { return Same(group, field.GroupIn(b)); },
+                               [&]<typename T>(const T& value) { return Same(value, field.In<T>(b)); }});
+    });
 }
 
 void CopyFields(FieldList fields, const void* from, void* to)
 {
-    for (const Field& field : fields) {
-        switch (field.kind) {
-        case FieldKind::Number:
-            field.In<double>(to) = field.In<double>(from);
-            break;
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-            field.In<std::int32_t>(to) = field.In<std::int32_t>(from);
-            break;
-        case FieldKind::Boolean:
-            field.In<bool>(to) = field.In<bool>(from);
-            break;
-        case FieldKind::Text:
-        case FieldKind::FileName:
-            field.In<std::string>(to) = field.In<std::string>(from);
-            break;
-        case FieldKind::DateTime:
-            field.In<HDDateTime>(to) = field.In<HDDateTime>(from);
-            break;
-        case FieldKind::Group:
-            CopyGroup(*field.group, field.address(const_cast<void*>(from)), field.address(to));
-            break;
-        }
-    }
+    for (const Field& field : fields)
+        Visit(field, from,
+              Overloads{[&](GroupValue<const void> group) { CopyGroup(group, field.GroupIn(to)); },
+                        [&]<typename T>(const T& value) { field.In<T>(to) = value; }});
 }

@@ -8,8 +8,8 @@
 /// Number of file parameters of one element of a group (elements hold no groups).
 std::size_t ParamsOf(FieldList fields);
 
-/// Whether `count` elements of the group fit into the parameters that are left in its keyword.
-bool CountFits(const GroupAccess& group, std::int32_t count, int paramsLeft);
+/// Whether `count` elements of a group fit into the parameters that are left in its keyword.
+bool CountFits(FieldList elements, std::int32_t count, int paramsLeft);
 
 /// Walks the parameters of one keyword.
 struct ParamCursor

@@ -25,13 +25,6 @@ constexpr GridControl Controls[] = {
     {Control::Chainage, CellKind::Number, 0, "doubleEdit_1112"},
 };
 
-template <typename T>
-CellAccess AccessAs(const Field& field)
-{
-    return {[field](const void* row) -> CellValue { return field.In<T>(row); },
-            [field](void* row, const CellValue& value) { field.In<T>(row) = std::get<T>(value); }};
-}
-
 } // namespace
 
 const GridControl& FindControl(int id)
@@ -42,22 +35,18 @@ const GridControl& FindControl(int id)
 
 CellAccess FieldAccess(const Field& field)
 {
-    switch (field.kind) {
-    case FieldKind::Integer:
-    case FieldKind::Choice:
-        return AccessAs<std::int32_t>(field);
-    case FieldKind::Text:
-    case FieldKind::FileName:
-        return AccessAs<std::string>(field);
-    case FieldKind::DateTime:
-        return AccessAs<HDDateTime>(field);
-    case FieldKind::Boolean:
-        return {
-            [field](const void* row) -> CellValue { return std::int32_t(field.In<bool>(row)); },
-            [field](void* row, const CellValue& value) { field.In<bool>(row) = std::get<std::int32_t>(value) != 0; }};
-    default:
-        return AccessAs<double>(field);
-    }
+    return VisitKind(field.kind, [&]<typename T>(std::type_identity<T>) -> CellAccess {
+        if constexpr (std::is_same_v<T, GroupType>)
+            Q_UNREACHABLE(); // a table of its own
+        else if constexpr (std::is_same_v<T, bool>)
+            return {[field](const void* row) -> CellValue { return std::int32_t(field.In<bool>(row)); },
+                    [field](void* row, const CellValue& value) {
+                        field.In<bool>(row) = std::get<std::int32_t>(value) != 0;
+                    }};
+        else
+            return {[field](const void* row) -> CellValue { return field.In<T>(row); },
+                    [field](void* row, const CellValue& value) { field.In<T>(row) = std::get<T>(value); }};
+    });
 }
 
 QString Choices::TextOf(std::int32_t index) const

@@ -41,8 +41,6 @@ enum class CellKind
 inline constexpr int AsFormatted = -1;
 /// Likewise with the decimals that it has, up to thousandths.
 inline constexpr int UpToThousandths = -2;
-/// A format for numbers of any magnitude: six digits that count, and no zeros to fill them up.
-inline constexpr const char* SignificantDigits = "%.6lg";
 
 /// The cell editors by number, in one table.
 struct GridControl

@@ -28,11 +28,8 @@ CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
                            m_ui->zone_1305, m_ui->unit_1305, m_ui->zoneLabel_1306, m_ui->zone_1306, m_ui->unit_1306});
 
     // The values of the approach not in use are kept.
-    const auto column = [&](Str caption, const double& global, bool ofZones) {
-        return ColumnOptions{.caption = caption,
-                             .format = SignificantDigits,
-                             .asFormatted = true,
-                             .fill = &global,
+    const auto column = [&](const double& global, bool ofZones) {
+        return ColumnOptions{.fill = &global,
                              .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
                              .unitText = unit};
     };
@@ -40,10 +37,10 @@ CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
     Grid(m_ui->grid_1307)
         .BranchName({.width = 110})
         .Chainage({})
-        .Value(&R::Resistance, column(Str::Resistance, globals.G_resistance, false))
-        .Value(&R::ZoneResistance1, column(Str::Zone1, globals.ZoneResistance1, true))
-        .Value(&R::ZoneResistance2, column(Str::Zone2, globals.ZoneResistance2, true))
-        .Value(&R::ZoneResistance3, column(Str::Zone3, globals.ZoneResistance3, true));
+        .Value(&R::Resistance, column(globals.G_resistance, false))
+        .Value(&R::ZoneResistance1, column(globals.ZoneResistance1, true))
+        .Value(&R::ZoneResistance2, column(globals.ZoneResistance2, true))
+        .Value(&R::ZoneResistance3, column(globals.ZoneResistance3, true));
 }
 
 CBedPage::~CBedPage() = default;

@@ -40,20 +40,15 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document, QWidget* parent)
     Bindings().Add(m_ui->maxRes_1317, tools.MaxRes, {.unitText = unit, .unitLabel = m_ui->unit_1317});
 
     const auto lockUnless = [uses](Method method) { return [uses, method](const void*) { return !uses(method); }; };
-    const auto coefficient = [&](Str caption, const double& global) {
-        return ColumnOptions{.caption = caption,
-                             .width = 60,
-                             .format = SignificantDigits,
-                             .asFormatted = true,
-                             .fill = &global,
-                             .locked = lockUnless(Coefficients)};
+    const auto coefficient = [&](const double& global) {
+        return ColumnOptions{.width = 60, .fill = &global, .locked = lockUnless(Coefficients)};
     };
     const auto explained = [&](ColumnOptions options) {
         options.hint = [] { return LoadString(Str::CoefFormula); };
         return options;
     };
-    const auto bound = [&](Str caption, const double& global) {
-        ColumnOptions options = coefficient(caption, global);
+    const auto bound = [&](const double& global) {
+        ColumnOptions options = coefficient(global);
         options.unitText = unit;
         return options;
     };
@@ -61,19 +56,13 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document, QWidget* parent)
     Grid(m_ui->grid_1319)
         .BranchName({.width = 110})
         .Chainage({})
-        .Value(&R::CoefA, explained(coefficient(Str::CoefA, tools.CoefA)))
-        .Value(&R::CoefB, explained(coefficient(Str::CoefB, tools.CoefB)))
-        .Value(&R::MinRes, bound(Str::MinRes, tools.MinRes))
-        .Value(&R::MaxRes, bound(Str::MaxRes, tools.MaxRes));
-    const auto step = [&](Str caption) {
-        return ColumnOptions{
-            .caption = caption, .format = SignificantDigits, .asFormatted = true, .locked = lockUnless(Table)};
-    };
-    ColumnOptions resistance = step(Str::Resistance);
-    resistance.unitText = unit;
+        .Value(&R::CoefA, explained(coefficient(tools.CoefA)))
+        .Value(&R::CoefB, explained(coefficient(tools.CoefB)))
+        .Value(&R::MinRes, bound(tools.MinRes))
+        .Value(&R::MaxRes, bound(tools.MaxRes));
     for (GridColumns pairs : {PairsGrid(m_ui->pairs_1318, tools.VeloRes), PairsGrid(m_ui->linePairs_1320, &R::VeloRes)})
-        pairs.Value(VelocityResistances.elements[0], step(Str::Velocity))
-            .Value(VelocityResistances.elements[1], resistance);
+        pairs.Value(&CBRTVeloRes::Velocity, {.locked = lockUnless(Table)})
+            .Value(&CBRTVeloRes::ResValue, {.locked = lockUnless(Table), .unitText = unit});
     m_ui->formulaLabel->setText(LoadString(Str::CoefFormula));
 }
 

@@ -83,14 +83,8 @@ void CEncroachPage::DeclareColumns()
 {
     GridColumns columns = Grid(m_ui->grid_1348);
     columns.BranchName({.width = 110}).Chainage({});
-    const Str entries[] = {Str::EncroachMethods, Str::EncroachBanks, Str::EncroachReductions};
-    const Str* next = entries;
-    qsizetype number = 0;
     for (const Field& field : HDEncroach::DeclaredFields()) {
         ColumnOptions options{
-            .header = [number] { return LoadString(Str::EncroachColumns).split(u'\n')[number]; },
-            .format = SignificantDigits,
-            .asFormatted = true,
             .locked =
                 [name = field.name](const void* row) {
                     const auto* record = static_cast<const HD_RiverPos*>(row);
@@ -100,11 +94,9 @@ void CEncroachPage::DeclareColumns()
                 [name = field.name] {
                     return LoadString(Str::StoredAs).arg(QString::fromLatin1(name.data(), name.size()));
                 }};
-        ++number;
         if (field.kind == FieldKind::Choice) {
             options.width = 130;
-            options.choices = *next++;
-            options.choice = {.first = 1, .whenEmptied = 1};
+            options.choice = {.whenEmptied = field.firstChoice};
         }
         columns.Value(field, std::move(options));
     }

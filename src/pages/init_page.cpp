@@ -11,10 +11,8 @@ CInitPage::CInitPage(CKavo0_hdDoc* document, QWidget* parent)
     const auto isLevel = [&globals] { return globals.iLevelDepth != 1; };
 
     Bind({m_ui->level_1201, m_ui->depth_1202}, &HD_Global_Var::iLevelDepth);
-    Bind(m_ui->levelOrDepth_1001, &HD_Global_Var::G_waterlevel,
-         {.unit = UnitGroup::WaterLevel, .unitLabel = m_ui->unit_1001});
-    Bind(m_ui->discharge_1002, &HD_Global_Var::G_discharge,
-         {.unit = UnitGroup::Discharge, .unitLabel = m_ui->unit_1002});
+    Bind(m_ui->levelOrDepth_1001, &HD_Global_Var::G_waterlevel, {.unitLabel = m_ui->unit_1001});
+    Bind(m_ui->discharge_1002, &HD_Global_Var::G_discharge, {.unitLabel = m_ui->unit_1002});
     Bindings().ShowWhen(isLevel, {m_ui->levelLabel_1203});
     Bindings().ShowWhen(isDepth, {m_ui->depthLabel_1204});
 
@@ -24,10 +22,8 @@ CInitPage::CInitPage(CKavo0_hdDoc* document, QWidget* parent)
         .Value(&HD_Initial::InitialH,
                {.header = [isDepth] { return LoadString(isDepth() ? Str::InitialY : Str::InitialH); },
                 .width = 58,
-                .format = "%.6lg",
                 .fill = &globals.G_waterlevel})
-        .Value(&HD_Initial::InitialQ,
-               {.caption = Str::InitialQ, .width = 58, .format = "%.6lg", .fill = &globals.G_discharge});
+        .Value(&HD_Initial::InitialQ, {.width = 58, .fill = &globals.G_discharge});
 }
 
 CInitPage::~CInitPage() = default;

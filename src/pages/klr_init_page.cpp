@@ -8,18 +8,18 @@ CKlrInitPage::CKlrInitPage(CKavo0_hdDoc* document, QWidget* parent)
     m_ui->setupUi(this);
     // Eight digits: millimetres and litres also of large levels and discharges.
     HDKlrInitial& klr = Globals().KlrInit;
-    Bindings().Add(m_ui->waterLevel_1183, klr.h1, {.decimals = 8, .unitLabel = m_ui->unit_1183});
-    Bindings().Add(m_ui->interfaceLevel_1184, klr.h0, {.decimals = 8, .unitLabel = m_ui->unit_1184});
-    Bindings().Add(m_ui->topDischarge_1185, klr.Q1, {.decimals = 8, .unitLabel = m_ui->unit_1185});
-    Bindings().Add(m_ui->bottomDischarge_1161, klr.Q0, {.decimals = 8, .unitLabel = m_ui->unit_1161});
+    Bindings().Add(m_ui->waterLevel_1183, klr.h1, {.unitLabel = m_ui->unit_1183});
+    Bindings().Add(m_ui->interfaceLevel_1184, klr.h0, {.unitLabel = m_ui->unit_1184});
+    Bindings().Add(m_ui->topDischarge_1185, klr.Q1, {.unitLabel = m_ui->unit_1185});
+    Bindings().Add(m_ui->bottomDischarge_1161, klr.Q0, {.unitLabel = m_ui->unit_1161});
 
     Grid(m_ui->grid_1186)
         .BranchName({.width = 100})
         .Chainage({.width = 100})
-        .Value(&HDKlrInit::h1, {.caption = Str::LayerH1, .width = 50})
-        .Value(&HDKlrInit::h0, {.caption = Str::LayerH0, .width = 50})
-        .Value(&HDKlrInit::Q1, {.caption = Str::LayerQ1, .width = 50})
-        .Value(&HDKlrInit::Q0, {.caption = Str::LayerQ0, .width = 50});
+        .Value(&HDKlrInit::h1, {.width = 50})
+        .Value(&HDKlrInit::h0, {.width = 50})
+        .Value(&HDKlrInit::Q1, {.width = 50})
+        .Value(&HDKlrInit::Q0, {.width = 50});
 }
 
 CKlrInitPage::~CKlrInitPage() = default;

@@ -8,7 +8,7 @@ CKlrParamPage::CKlrParamPage(CKavo0_hdDoc* document, QWidget* parent)
     m_ui->setupUi(this);
     HDKlrConstants& klr = Globals().Klr;
     Bindings().Add(m_ui->frictionFactor_1006, klr.fricfac);
-    Bindings().Add(m_ui->maxVolume_1153, klr.maxvol, {.decimals = 8, .unitLabel = m_ui->unit_1153});
+    Bindings().Add(m_ui->maxVolume_1153, klr.maxvol, {.unitLabel = m_ui->unit_1153});
     Bindings().Add(m_ui->maxVelocity_1154, klr.maxvelo, {.unitLabel = m_ui->unit_1154});
     Bindings().Add(m_ui->minThickness_1155, klr.minthick, {.unitLabel = m_ui->unit_1155});
     Bindings().Add(m_ui->densityDifference_1156, klr.densdiff);
@@ -20,8 +20,8 @@ CKlrParamPage::CKlrParamPage(CKavo0_hdDoc* document, QWidget* parent)
     Grid(m_ui->grid_1186)
         .BranchName({.width = 100})
         .Chainage({.width = 100})
-        .Value(&HDKlrParam::R1, {.caption = Str::LayerR1, .width = 50})
-        .Value(&HDKlrParam::R2, {.caption = Str::LayerR2, .width = 50});
+        .Value(&HDKlrParam::R1, {.width = 50})
+        .Value(&HDKlrParam::R2, {.width = 50});
 }
 
 CKlrParamPage::~CKlrParamPage() = default;

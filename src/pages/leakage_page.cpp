@@ -9,16 +9,14 @@ CLeakagePage::CLeakagePage(CKavo0_hdDoc* document, QWidget* parent)
     HDLeakageGlobal& leakage = Globals().Leakage;
     const auto included = [&leakage] { return leakage.IncludeLeakage; };
     Bindings().Add(m_ui->includeLeakage_1228, leakage.IncludeLeakage);
-    Bindings().Add(m_ui->coefficient_1238, leakage.LeakageCoefficient, {.decimals = 3});
+    Bindings().Add(m_ui->coefficient_1238, leakage.LeakageCoefficient);
     Bindings().EnableWhen(included, {m_ui->globalCoefficient, m_ui->localCoefficients_1262});
     Bindings().ShowWhen(included, {m_ui->grid_1186});
 
-    // Coefficients are far below one, so three decimals would show nothing of them.
     Grid(m_ui->grid_1186)
         .BranchName({.width = 100})
         .Chainage({.width = 72})
-        .Value(&HDLeakage::LeakageCoefficient,
-               {.caption = Str::LeakageCoef, .width = 82, .format = SignificantDigits, .asFormatted = true});
+        .Value(&HDLeakage::LeakageCoefficient, {.width = 82});
 }
 
 CLeakagePage::~CLeakagePage() = default;

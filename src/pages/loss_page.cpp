@@ -10,10 +10,8 @@ CLossPage::CLossPage(CKavo0_hdDoc* document, QWidget* parent)
     columns.BranchName({.width = 100}).Chainage({.width = 72});
     int number = 0;
     for (const Field& field : HD_Waterloss::DeclaredFields())
-        columns.Value(field, {.header = [n = ++number] { return LoadString(Str::WaterLossNumber).arg(n); },
-                              .width = 82,
-                              .format = SignificantDigits,
-                              .asFormatted = true});
+        columns.Value(field,
+                      {.header = [n = ++number] { return LoadString(Str::WaterLossNumber).arg(n); }, .width = 82});
 }
 
 CLossPage::~CLossPage() = default;

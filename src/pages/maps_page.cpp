@@ -57,39 +57,33 @@ CMapsPage::CMapsPage(CKavo0_hdDoc* document, QWidget* parent)
     m_ui->dem_1227->SetLineChoice(LineChoice::CurrentLine);
     DeclareMaps();
     ItemsGrid(m_ui->dem_1227, maps.DemInputFiles)
-        .Value(MapsInputs, &CMapsInput::FileName, {.header = LineOf(Str::DemColumns, 0), .width = 150})
+        .Value(&CMapsInput::FileName, {.width = 150})
         .Button({.header = LineOf(Str::DemColumns, 1), .width = 20})
-        .Value(MapsInputs, &CMapsInput::ItemNo, {.header = LineOf(Str::DemColumns, 2)})
-        .Value(MapsInputs, &CMapsInput::Order, {.header = LineOf(Str::DemColumns, 3)});
+        .Value(&CMapsInput::ItemNo)
+        .Value(&CMapsInput::Order);
 }
 
 CMapsPage::~CMapsPage() = default;
 
 void CMapsPage::DeclareMaps()
 {
-    int next = 0;
-    const auto column = [&next](ColumnOptions options) {
-        options.header = LineOf(Str::MapColumns, next++);
-        return options;
-    };
     const auto isDem = [](const void* row) { return Map(row).Item == DemItem; };
     using M = CMapsOutput;
     GridColumns columns = ItemsGrid(m_ui->maps_1226, Globals().MapOutput.MapOutputFiles);
     for (double M::*number : {&M::XOrigin, &M::YOrigin, &M::Rotation, &M::GridSize})
-        columns.Value(MapsOutputs, number, column({.width = 50}));
+        columns.Value(number, {.width = 50});
     for (std::int32_t M::*cells : {&M::JCells, &M::KCells})
-        columns.Value(MapsOutputs, cells, column({.width = 50}));
-    columns.Value(MapsOutputs, &M::FileName, column({}))
-        .Button(column({.width = 20}))
-        .Value(MapsOutputs, &M::Type, column({.locked = isDem, .choices = Str::MapTypes}))
-        .Value(MapsOutputs, &M::Item, column({.choices = Str::MapItems}))
-        .Value(MapsOutputs, &M::ComponentNo,
-               column({.width = 50, .locked = [](const void* row) { return Map(row).Item != AdItem; }}))
-        .Value(MapsOutputs, &M::StoringFrequency,
-               column({.width = 50, .locked = [isDem](const void* row) { return IsNotDynamic(row) || isDem(row); }}))
-        .Value(MapsOutputs, &M::DefaultPeriod, column({.width = 20, .locked = IsNotDynamic}))
-        .Value(MapsOutputs, &M::StartTime, column({.width = 110, .locked = IsNotDynamic}))
-        .Value(MapsOutputs, &M::EndTime, column({.width = 110, .locked = IsNotDynamic}));
+        columns.Value(cells, {.width = 50});
+    columns.Value(&M::FileName)
+        .Button({.header = LineOf(Str::MapColumns, 7), .width = 20})
+        .Value(&M::Type, {.locked = isDem})
+        .Value(&M::Item)
+        .Value(&M::ComponentNo, {.width = 50, .locked = [](const void* row) { return Map(row).Item != AdItem; }})
+        .Value(&M::StoringFrequency,
+               {.width = 50, .locked = [isDem](const void* row) { return IsNotDynamic(row) || isDem(row); }})
+        .Value(&M::DefaultPeriod, {.width = 20, .locked = IsNotDynamic})
+        .Value(&M::StartTime, {.width = 110, .locked = IsNotDynamic})
+        .Value(&M::EndTime, {.width = 110, .locked = IsNotDynamic});
 }
 
 void CMapsPage::LoadFromDocument(CKavo0_hdDoc* document)

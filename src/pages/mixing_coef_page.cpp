@@ -13,11 +13,8 @@ CMixingCoefPage::CMixingCoefPage(CKavo0_hdDoc* document, QWidget* parent)
     Bindings().Add(m_ui->coef_1333, mixing.MixCoef4);
 
     const auto coefficient = [](int number, const double& global) {
-        return ColumnOptions{.header = [number] { return LoadString(Str::MixCoefNumber).arg(number); },
-                             .width = 60,
-                             .format = SignificantDigits,
-                             .asFormatted = true,
-                             .fill = &global};
+        return ColumnOptions{
+            .header = [number] { return LoadString(Str::MixCoefNumber).arg(number); }, .width = 60, .fill = &global};
     };
     using R = HDMixingCoef;
     Grid(m_ui->grid_1335)
@@ -29,11 +26,7 @@ CMixingCoefPage::CMixingCoefPage(CKavo0_hdDoc* document, QWidget* parent)
         .Value(&R::MixCoef4, coefficient(4, mixing.MixCoef4));
     for (GridColumns pairs :
          {PairsGrid(m_ui->pairs_1334, mixing.CoefPairs), PairsGrid(m_ui->linePairs_1336, &R::CoefPairs)})
-        pairs
-            .Value(MixingPairs.elements[0],
-                   {.caption = Str::WidthDepthRatio, .format = SignificantDigits, .asFormatted = true})
-            .Value(MixingPairs.elements[1],
-                   {.caption = Str::MixingCoefficient, .format = SignificantDigits, .asFormatted = true});
+        pairs.Value(&CMixingWCCoef::First).Value(&CMixingWCCoef::Second);
 }
 
 CMixingCoefPage::~CMixingCoefPage() = default;

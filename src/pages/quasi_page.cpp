@@ -9,13 +9,13 @@ CQuasiPage::CQuasiPage(CKavo0_hdDoc* document, QWidget* parent)
 {
     m_ui->setupUi(this);
     using G = HD_Global_Var;
-    Bind(m_ui->relax_1024, &G::relax, {});
-    Bind(m_ui->betaLimit_1028, &G::beta_limit, {.decimals = 8});
-    Bind(m_ui->fac0_1030, &G::fac_0, {});
-    Bind(m_ui->qconvFactor_1032, &G::qconv_factor, {});
-    Bind(m_ui->hconvFactor_1034, &G::hconv_factor, {});
+    Bind(m_ui->relax_1024, &G::relax);
+    Bind(m_ui->betaLimit_1028, &G::beta_limit);
+    Bind(m_ui->fac0_1030, &G::fac_0);
+    Bind(m_ui->qconvFactor_1032, &G::qconv_factor);
+    Bind(m_ui->hconvFactor_1034, &G::hconv_factor);
     Bind(m_ui->minHconv_1036, &G::min_hconv, {.unitLabel = m_ui->unit_1036});
-    Bind(m_ui->qStrucFactor_1038, &G::qstruc_factor, {});
+    Bind(m_ui->qStrucFactor_1038, &G::qstruc_factor);
     Bind(m_ui->hstop_1041, &G::hstop, {.unitLabel = m_ui->unit_1041});
 
     Bind(m_ui->energyEquation_1187, &G::EnergyEquation);
@@ -24,8 +24,8 @@ CQuasiPage::CQuasiPage(CKavo0_hdDoc* document, QWidget* parent)
     Bind(m_ui->velocityCoefficient_1190, &G::VelocityCoefficient);
     Bind(m_ui->noSuppression_1191, &G::NoConvectiveSuppression);
     Bind(m_ui->frictionSlope_1194, &G::FrictionSlope);
-    Bind(m_ui->contraction_1042, &G::G_Contraction, {});
-    Bind(m_ui->expansion_1043, &G::G_Expansion, {});
+    Bind(m_ui->contraction_1042, &G::G_Contraction);
+    Bind(m_ui->expansion_1043, &G::G_Expansion);
 
     const auto usesEnergy = [this] { return Globals().EnergyEquation; };
     Bindings().EnableWhen(usesEnergy,
@@ -39,8 +39,8 @@ CQuasiPage::CQuasiPage(CKavo0_hdDoc* document, QWidget* parent)
     Grid(m_ui->grid_1197)
         .BranchName({.width = 110})
         .Chainage({})
-        .Value(&HDContraExpan::Contraction, {.caption = Str::Contraction, .fill = &Globals().G_Contraction})
-        .Value(&HDContraExpan::Expansion, {.caption = Str::Expansion, .fill = &Globals().G_Expansion});
+        .Value(&HDContraExpan::Contraction, {.fill = &Globals().G_Contraction})
+        .Value(&HDContraExpan::Expansion, {.fill = &Globals().G_Expansion});
 }
 
 void CQuasiPage::LoadBranches()

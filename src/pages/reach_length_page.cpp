@@ -16,8 +16,8 @@ CReachLengthPage::CReachLengthPage(CKavo0_hdDoc* document, QWidget* parent)
     Grid(m_ui->grid_1186)
         .BranchName({.width = 100})
         .Chainage({.width = 100})
-        .Value(&HDReachLength::ReachLength1, {.caption = Str::LeftBank, .width = 90})
-        .Value(&HDReachLength::ReachLength2, {.caption = Str::RightBank, .width = 90});
+        .Value(&HDReachLength::ReachLength1, {.width = 90})
+        .Value(&HDReachLength::ReachLength2, {.width = 90});
 }
 
 CReachLengthPage::~CReachLengthPage() = default;

@@ -32,17 +32,15 @@ CTextOutputPage::CTextOutputPage(CKavo0_hdDoc* document, QWidget* parent)
     Grid(m_ui->grid_1217)
         .BranchName({.width = 110})
         .Chainage({.caption = Str::UpstreamChainage})
-        .Value(&HDOutputGridPoint::PointValue, {.caption = Str::DownstreamChainage, .emptyIsNotGiven = true});
+        .Value(&HDOutputGridPoint::PointValue, {.emptyIsNotGiven = true});
     ItemsGrid(m_ui->items_1216, output.OutputItems)
-        .Value(TextOutItems, &CTextOutItem::Item,
-               {.header = LineOf(Str::OutputItemColumns, 0), .width = 200, .choices = Str::OutputItems})
-        .Value(TextOutItems, &CTextOutItem::UserName, {.header = LineOf(Str::OutputItemColumns, 1), .width = 110})
-        .Value(TextOutItems, &CTextOutItem::Decimals, {.header = LineOf(Str::OutputItemColumns, 2), .width = 110});
+        .Value(&CTextOutItem::Item, {.width = 200})
+        .Value(&CTextOutItem::UserName, {.width = 110})
+        .Value(&CTextOutItem::Decimals, {.width = 110});
     ItemsGrid(m_ui->files_1226, output.OutputFiles)
-        .Value(TextAutoFiles, &CTextAutoFile::Format,
-               {.header = LineOf(Str::OutputFileColumns, 0), .width = 185, .choices = Str::OutputFormats})
-        .Value(TextAutoFiles, &CTextAutoFile::AutoName, {.header = LineOf(Str::OutputFileColumns, 1), .width = 35})
-        .Value(TextAutoFiles, &CTextAutoFile::FileName, {.header = LineOf(Str::OutputFileColumns, 2), .width = 185})
+        .Value(&CTextAutoFile::Format, {.width = 185})
+        .Value(&CTextAutoFile::AutoName, {.width = 35})
+        .Value(&CTextAutoFile::FileName, {.width = 185})
         .Button({.header = LineOf(Str::OutputFileColumns, 3), .width = 20});
 }
 

@@ -16,11 +16,9 @@ CWavePage::CWavePage(CKavo0_hdDoc* document, QWidget* parent)
     Grid(m_ui->grid_1011)
         .BranchName({.width = 110})
         .Chainage({.caption = Str::UpstreamChainage})
-        .Value(&HD_Wavetype::DownstreamChainage, {.caption = Str::DownstreamChainage, .emptyIsNotGiven = true})
-        .Value(&HD_Wavetype::WaveApproximation, {.caption = Str::WaveApproximation,
-                                                 .width = 150,
-                                                 .choices = Str::WaveApproximations,
-                                                 .choice = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
+        .Value(&HD_Wavetype::DownstreamChainage, {.emptyIsNotGiven = true})
+        .Value(&HD_Wavetype::WaveApproximation,
+               {.width = 150, .choice = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
 }
 
 CWavePage::~CWavePage() = default;

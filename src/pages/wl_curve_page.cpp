@@ -35,28 +35,21 @@ CWLCurvePage::CWLCurvePage(CKavo0_hdDoc* document, QWidget* parent)
     GridWithGlobals(m_ui->grid_1103, &curve)
         .BranchName({.width = 71})
         .Chainage({.width = 71})
-        .Value(&R::CurveOption, {.caption = Str::AverageRange,
-                                 .width = 89,
-                                 .locked = [&curve](const void*) { return curve.SystemRange; },
-                                 .choices = Str::AverageRanges,
-                                 .globalIndex = &curve.Range})
-        .Value(&R::CurveValue1, {.caption = Str::WaterWidth,
-                                 .width = 53,
+        .Value(
+            &R::CurveOption,
+            {.width = 89, .locked = [&curve](const void*) { return curve.SystemRange; }, .globalIndex = &curve.Range})
+        .Value(&R::CurveValue1, {.width = 53,
                                  .emptyIsNotGiven = true,
                                  .locked = [&curve](const void*) { return curve.SystemWidth; },
                                  .locationValue = LocationValue::Width,
                                  .globalNumber = &curve.Width})
-        .Value(&R::CurveValue2, {.caption = Str::CurveRadius,
-                                 .width = 53,
+        .Value(&R::CurveValue2, {.width = 53,
                                  .emptyIsNotGiven = true,
                                  .locked = [&curve](const void*) { return curve.SystemRadius; },
                                  .locationValue = LocationValue::Radius,
                                  .globalNumber = &curve.Radius})
-        .Value(&R::CurveValue3, {.caption = Str::Velocity,
-                                 .width = 53,
-                                 .emptyIsNotGiven = true,
-                                 .locked = velocityIsSystems,
-                                 .globalNumber = &curve.Velocity});
+        .Value(&R::CurveValue3,
+               {.width = 53, .emptyIsNotGiven = true, .locked = velocityIsSystems, .globalNumber = &curve.Velocity});
 }
 
 CWLCurvePage::~CWLCurvePage() = default;

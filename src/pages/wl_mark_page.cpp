@@ -85,9 +85,9 @@ CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document, QWidget* parent)
     m_ui->grid_1074->SetLineChoice(LineChoice::CurrentLine);
     Grid(m_ui->grid_1074).BranchName({.width = 71}).Chainage({.width = 71});
     RowsGrid(m_ui->titles_1075, MakeMarkTitleRows(*document))
-        .Value(TitleAccess(), FieldKind::Text, UnitGroup::None,
+        .Value(TitleAccess(), {.name = "Title", .kind = FieldKind::Text},
                {.caption = Str::MarkTitle, .width = 300, .upperCase = true})
-        .Value(InterpolateAccess(), FieldKind::Boolean, UnitGroup::None,
+        .Value(InterpolateAccess(), {.name = "Interpolate", .kind = FieldKind::Boolean},
                {.caption = Str::MarkInterpolate, .width = 50});
 }
 
@@ -103,7 +103,7 @@ void CWLMarkPage::ShowLevelColumns()
     GridColumns columns(*GetGrid());
     for (auto title = std::size_t(model.columnCount() - LocationColumns); title < shown; ++title)
         columns.Value(
-            LevelAccess(title), FieldKind::Number, UnitGroup::WaterLevel,
+            LevelAccess(title), {.name = "Level", .unit = UnitGroup::WaterLevel},
             {.header = [&titles,
                         title] { return title < titles.size() ? QString::fromStdString(titles[title]) : QString(); },
              .width = 62,

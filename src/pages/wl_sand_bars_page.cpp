@@ -19,10 +19,9 @@ CWLSandBarsPage::CWLSandBarsPage(CKavo0_hdDoc* document, QWidget* parent)
     Bindings().EnableWhen([&sand] { return sand.Enabled; }, {m_ui->method, m_ui->load_1104, m_ui->grid_1103});
     connect(m_ui->load_1104, &QPushButton::clicked, this, [this] { AskForLocations(*this); });
 
-    const auto number = [&sand](Str caption, double& global) {
+    const auto number = [&sand](double& global) {
         const bool isObserved = &global == &sand.Observed;
         return ColumnOptions{
-            .caption = caption,
             .width = 62,
             .asFormatted = &global == &sand.Slope, // slopes are far below one, three decimals show nothing of them
             .emptyIsNotGiven = true,
@@ -34,10 +33,10 @@ CWLSandBarsPage::CWLSandBarsPage(CKavo0_hdDoc* document, QWidget* parent)
     GridWithGlobals(m_ui->grid_1103, &sand)
         .BranchName({.width = 71})
         .Chainage({.width = 71})
-        .Value(&R::SandBarValue1, number(Str::BedSlope, sand.Slope))
-        .Value(&R::SandBarValue2, number(Str::LowWaterWidth, sand.Width))
-        .Value(&R::SandBarValue3, number(Str::LowWaterArea, sand.Area))
-        .Value(&R::SandBarValue4, number(Str::ObservedIncrement, sand.Observed));
+        .Value(&R::SandBarValue1, number(sand.Slope))
+        .Value(&R::SandBarValue2, number(sand.Width))
+        .Value(&R::SandBarValue3, number(sand.Area))
+        .Value(&R::SandBarValue4, number(sand.Observed));
 }
 
 CWLSandBarsPage::~CWLSandBarsPage() = default;

@@ -15,7 +15,7 @@ struct Row
 // Sorted by number at compile time is not asked of the table: it is short and looked up a few times a window.
 constexpr Row Rows[] = {
 #define KVR_STRING(number, name, text) {number, text},
-#include "res/string_table.inc"
+#include "texts/string_table.inc"
 #undef KVR_STRING
 };
 

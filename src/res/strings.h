@@ -1,15 +1,10 @@
 // The module's texts by number, in English; translations stand in res/translations/Kavo0_hd_*.ts.
 #pragma once
 
+#include "texts/text_numbers.h"
+
 #include <QString>
 #include <cstddef>
-
-enum class Str : int
-{
-#define KVR_STRING(number, name, text) name = number,
-#include "res/string_table.inc"
-#undef KVR_STRING
-};
 
 /// The text in the user's language.
 QString LoadString(Str id);

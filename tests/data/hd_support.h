@@ -1,8 +1,8 @@
 // What the tests of the data room share: parameters from text, and objects whose every field differs from another's.
 #pragma once
 
-#include "files/field_io.h"
 #include "data/hd_file.h"
+#include "files/field_io.h"
 
 #include <filesystem>
 #include <fstream>
@@ -45,35 +45,20 @@ inline void Disturb(FieldList fields, void* object, int& seed)
         0.1 + 0.2, -0.0, 5e-324, 1.7976931348623157e308, 1e10 - 1e-6, -1e-7, std::numeric_limits<double>::infinity()};
     for (const Field& field : fields) {
         ++seed;
-        switch (field.kind) {
-        case FieldKind::Number: {
-            double& value = field.In<double>(object);
-            value =
-                value == 0 ? -1.0 / seed : value + numbers[static_cast<std::size_t>(seed) % std::size(numbers)] + seed;
-            break;
-        }
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-            field.In<std::int32_t>(object) += 100 + seed;
-            break;
-        case FieldKind::Boolean:
-            field.In<bool>(object) = !field.In<bool>(object);
-            break;
-        case FieldKind::Text:
-        case FieldKind::FileName:
-            field.In<std::string>(object) += "\"<M\xC3\x9CHLE>\\\n\t" + std::to_string(seed);
-            break;
-        case FieldKind::DateTime:
-            field.In<HDDateTime>(object) = {1900 + seed, 13, -1, 25, 61, seed}; // kept though it is no date
-            break;
-        case FieldKind::Group: {
-            void* const container = field.address(object);
-            field.group->resize(container, 2 + static_cast<std::size_t>(seed % 3));
-            for (std::size_t i = 0; i < field.group->size(container); ++i)
-                Disturb(field.group->elements, field.group->at(container, i), seed);
-            break;
-        }
-        }
+        Visit(field, object,
+              Overloads{[&](double& value) {
+                            value = value == 0
+                                        ? -1.0 / seed
+                                        : value + numbers[static_cast<std::size_t>(seed) % std::size(numbers)] + seed;
+                        },
+                        [&](std::int32_t& value) { value += 100 + seed; }, [](bool& value) { value = !value; },
+                        [&](std::string& value) { value += "\"<M\xC3\x9CHLE>\\\n\t" + std::to_string(seed); },
+                        [&](HDDateTime& value) { value = {1900 + seed, 13, -1, 25, 61, seed}; }, // kept, though no date
+                        [&](GroupValue<void> group) {
+                            group.Renew(2 + static_cast<std::size_t>(seed % 3));
+                            for (std::size_t i = 0; i < group.size(); ++i)
+                                Disturb(group.Elements(), group[i], seed);
+                        }});
     }
 }
 

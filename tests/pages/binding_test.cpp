@@ -19,7 +19,7 @@ public:
         Bind(&integer, &HD_Global_Var::no_iter);
         Bind(&list, &HD_Global_Var::G_wave);
         Bind({&level, &depth}, &HD_Global_Var::iLevelDepth);
-        Bind(&number, &HD_Global_Var::G_wind_factor, {.minimum = 0});
+        Bind(&number, &HD_Global_Var::zeta_min);
         Bindings().EnableWhen([this] { return box.isChecked(); }, {&number});
         Bindings().ShowWhen([this] { return Globals().iLevelDepth == 1; }, {&hidden});
     }

@@ -20,35 +20,20 @@ namespace {
 void Change(const Field& field, void* object, int& seed)
 {
     ++seed;
-    switch (field.kind) {
-    case FieldKind::Number:
-        field.In<double>(object) += 0.25 + seed;
-        break;
-    case FieldKind::Integer:
-        field.In<std::int32_t>(object) += seed;
-        break;
-    case FieldKind::Choice:
-        field.In<std::int32_t>(object) = field.In<std::int32_t>(object) == 1 ? 2 : 1;
-        break;
-    case FieldKind::Boolean:
-        field.In<bool>(object) = !field.In<bool>(object);
-        break;
-    case FieldKind::Text:
-    case FieldKind::FileName:
-        field.In<std::string>(object) = "TEXT " + std::to_string(seed);
-        break;
-    case FieldKind::DateTime:
-        field.In<HDDateTime>(object) = {2000 + seed, 2, 28, 23, 59, 1};
-        break;
-    case FieldKind::Group: {
-        void* container = field.address(object);
-        field.group->resize(container, 2);
-        for (std::size_t i = 0; i < 2; ++i)
-            for (const Field& element : field.group->elements)
-                Change(element, field.group->at(container, i), seed);
-        break;
-    }
-    }
+    Visit(field, object,
+          Overloads{[&](double& value) { value += 0.25 + seed; },
+                    [&](std::int32_t& value) {
+                        value = field.kind == FieldKind::Integer ? value + seed : value == 1 ? 2 : 1;
+                    },
+                    [](bool& value) { value = !value; },
+                    [&](std::string& value) { value = "TEXT " + std::to_string(seed); },
+                    [&](HDDateTime& value) { value = {2000 + seed, 2, 28, 23, 59, 1}; },
+                    [&](GroupValue<void> group) {
+                        group.Renew(2);
+                        for (std::size_t i = 0; i < group.size(); ++i)
+                            for (const Field& element : group.Elements())
+                                Change(element, group[i], seed);
+                    }});
 }
 
 /// Every value of every section is another one than in a new file.

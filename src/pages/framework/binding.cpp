@@ -1,9 +1,9 @@
 #include "pages/framework/binding.h"
 
 #include "data/global_var.h"
-#include "ks/units/edit_fields.h"
 #include "document/document.h"
 #include "document/store_value.h"
+#include "ks/units/edit_fields.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"
 #include "res/strings.h"
@@ -19,15 +19,17 @@
 
 namespace {
 
-/// The unit group that the global value's declaration gives it; none for a number that is not a global value.
-UnitGroup DeclaredUnit(HD_Global_Var& globals, const double& value)
+constexpr int UsualDigits = 6;
+
+/// The declaration of a global value; one without a name for a number that is none.
+Field Declaration(const HD_Global_Var& globals, const double& value)
 {
     for (const GlobalSection& section : HDGlobalSections())
         for (const GlobalKeyword& keyword : section.keywords)
             for (const Field& field : keyword.Fields())
-                if (field.address(&globals) == &value)
-                    return field.unit;
-    return UnitGroup::None;
+                if (field.constAddress(&globals) == &value)
+                    return field;
+    return {};
 }
 
 } // namespace
@@ -74,10 +76,10 @@ QWidget* CBindings::ControlFor(const void* value) const
 
 void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
 {
-    field->Setup(&value, options.textLimit, options.decimals, options.generalNotation,
-                 options.unit ? *options.unit : DeclaredUnit(m_document->Parameters().Global, value));
-    field->SetRange(options.minimum.has_value(), options.minimum.value_or(0), options.maximum.has_value(),
-                    options.maximum.value_or(0));
+    const Field declared = Declaration(m_document->Parameters().Global, value);
+    field->Setup(&value, options.textLimit, declared.digits ? declared.digits : UsualDigits, true, declared.unit);
+    field->SetRange(declared.minimum.has_value(), declared.minimum.value_or(0), declared.maximum.has_value(),
+                    declared.maximum.value_or(0));
     field->SetUnitText(options.unitText);
     field->SetStore([this](double& target, double number) { Store(target, number); });
     m_typed.push_back(&field->Typing());

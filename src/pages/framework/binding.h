@@ -3,14 +3,13 @@
 #pragma once
 
 #include "files/field.h"
-#include "pages/framework/file_browse.h"
 #include "grid/typing.h"
+#include "pages/framework/file_browse.h"
 
 #include <QObject>
 #include <cstdint>
 #include <functional>
 #include <initializer_list>
-#include <optional>
 #include <string>
 #include <vector>
 
@@ -25,16 +24,12 @@ class QLineEdit;
 class QRadioButton;
 class QWidget;
 
-/// How a number is edited in a single field.
+/// How a number is edited in a single field, beyond what its declaration says.
 struct FieldOptions
 {
-    std::optional<UnitGroup> unit = {}; // by default the declared one of the global value
-    int decimals = 6;
-    bool generalNotation = true; // false: scientific
     int textLimit = 20;
-    std::optional<double> minimum = {}, maximum = {}; // base units
-    std::function<QString()> unitText = {};           // symbol of a unit that depends on a setting
-    QLabel* unitLabel = nullptr;                      // shows the unit beside the field
+    std::function<QString()> unitText = {}; // symbol of a unit that depends on a setting
+    QLabel* unitLabel = nullptr;            // shows the unit beside the field
 };
 
 class CBindings : public QObject

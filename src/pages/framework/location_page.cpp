@@ -1,22 +1,16 @@
 #include "pages/framework/location_page.h"
 
-#include "ks/fc/message_box.h"
-#include "ks/fc/wnd_resizer.h"
 #include "document/list_rows.h"
 #include "grid/grid_texts.h"
+#include "ks/fc/message_box.h"
+#include "ks/fc/wnd_resizer.h"
 
 #include <QUndoStack>
 
-namespace {
-
-constexpr Field NameField = Text<&HD_RiverPos::RiverName>("RiverName");
-constexpr Field ChainageField = Number<&HD_RiverPos::Chainage>("Chainage", UnitGroup::Chainage);
-
-} // namespace
-
 std::function<QString()> LineOf(Str text, int line)
 {
-    return [text, line] { return LoadString(text).split(u'\n').value(line); };
+    return
+        [text, line] { return line == TextLine::Whole ? LoadString(text) : LoadString(text).split(u'\n').value(line); };
 }
 
 const Field& GridColumns::FieldAt(FieldList fields, void* object, const void* member)
@@ -54,23 +48,30 @@ void GridColumns::AddGlobalRow(ColumnSpec& column, CellAccess& access, const Col
     };
 }
 
-GridColumns& GridColumns::Add(int control, UnitGroup unit, CellAccess access, ColumnOptions options)
+GridColumns& GridColumns::Add(int control, const Field& field, CellAccess access, ColumnOptions options)
 {
     ColumnSpec column;
     column.control = control;
     column.header = std::move(options.header);
     if (!column.header)
-        column.header = [caption = options.caption] { return LoadString(caption); };
+        column.header = options.caption != Str::None ? LineOf(options.caption, TextLine::Whole)
+                                                     : LineOf(field.title.text, field.title.line);
     column.width = options.width;
-    column.style = CKsEditStyle(unit, options.format);
+    column.style = CKsEditStyle(field.unit);
+    if (field.digits)
+        column.style.SetFormat(QStringLiteral("%.%1lg").arg(field.digits));
+    column.minimum = field.minimum;
+    column.maximum = field.maximum;
     column.emptyIsNotGiven = options.emptyIsNotGiven;
     column.fill = options.fill;
     column.locked = options.locked;
     if (m_globals)
         AddGlobalRow(column, access, options);
     column.choices = std::move(options.choice);
-    if (options.choices)
-        column.choices.entries = [entries = *options.choices] { return LoadString(entries).split(u'\n'); };
+    if (field.choices != Str::None) {
+        column.choices.entries = [entries = field.choices] { return LoadString(entries).split(u'\n'); };
+        column.choices.first = field.firstChoice;
+    }
     column.unitText = std::move(options.unitText);
     column.hint = std::move(options.hint);
     column.locationValue = options.locationValue;
@@ -81,52 +82,51 @@ GridColumns& GridColumns::Add(int control, UnitGroup unit, CellAccess access, Co
 
 GridColumns& GridColumns::BranchName(ColumnOptions options)
 {
-    if (!options.header)
-        options.caption = Str::RiverName;
-    return Add(Control::Text, UnitGroup::None, FieldAccess(NameField), std::move(options));
+    const Field& field = LocationFields()[0];
+    return Add(Control::Text, field, FieldAccess(field), std::move(options));
 }
 
 GridColumns& GridColumns::Chainage(ColumnOptions options)
 {
-    if (!options.header && options.caption == Str::RiverName)
-        options.caption = Str::Chainage;
+    const Field& field = LocationFields()[1];
     options.emptyIsNotGiven = true;
-    return Add(Control::Chainage, ChainageField.unit, FieldAccess(ChainageField), std::move(options));
+    return Add(Control::Chainage, field, FieldAccess(field), std::move(options));
 }
 
 GridColumns& GridColumns::Value(const Field& field, ColumnOptions options)
 {
-    return Value(FieldAccess(field), field.kind, field.unit, std::move(options));
+    return Value(FieldAccess(field), field, std::move(options));
 }
 
-GridColumns& GridColumns::Value(CellAccess access, FieldKind kind, UnitGroup unit, ColumnOptions options)
+GridColumns& GridColumns::Value(CellAccess access, const Field& field, ColumnOptions options)
 {
+    const bool hasChoices = field.choices != Str::None;
     const auto control = [&] {
-        switch (kind) {
+        switch (field.kind) {
         case FieldKind::Text:
-            return options.choices ? Control::DropDownList : options.upperCase ? Control::Text : Control::FreeText;
+            return hasChoices ? Control::DropDownList : options.upperCase ? Control::Text : Control::FreeText;
         case FieldKind::FileName:
             return Control::FreeText;
         case FieldKind::Integer:
         case FieldKind::Choice:
-            return options.choices ? Control::DropDown : Control::Integer;
+            return hasChoices ? Control::DropDown : Control::Integer;
         case FieldKind::Boolean:
             return Control::CheckBox;
         case FieldKind::DateTime:
             return Control::DateTime;
         default:
-            return options.asFormatted                                      ? Control::Formatted
-                   : options.emptyIsNotGiven && unit == UnitGroup::Chainage ? Control::Chainage
-                                                                            : Control::Number;
+            return options.asFormatted || field.digits                            ? Control::Formatted
+                   : options.emptyIsNotGiven && field.unit == UnitGroup::Chainage ? Control::Chainage
+                                                                                  : Control::Number;
         }
     }();
-    return Add(control, unit, std::move(access), std::move(options));
+    return Add(control, field, std::move(access), std::move(options));
 }
 
 GridColumns& GridColumns::Button(ColumnOptions options)
 {
     CellAccess nothing{[](const void*) { return CellValue(); }, [](void*, const CellValue&) {}};
-    return Add(Control::PushButton, UnitGroup::None, std::move(nothing), std::move(options));
+    return Add(Control::PushButton, {}, std::move(nothing), std::move(options));
 }
 
 CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent)

@@ -7,22 +7,20 @@
 #include "pages/framework/page.h"
 #include "res/strings.h"
 
-/// What a column says about itself beyond its field.
+/// What a column says about itself beyond its field, and where it differs from what that declares.
 struct ColumnOptions
 {
     std::function<QString()> header = {}; // by default the text of `caption`
-    Str caption = Str::RiverName;
+    Str caption = Str::None;              // by default the field's title
     int width = 72;
-    const char* format = "%-lf";
-    bool asFormatted = false;     // numbers stand in `format`, not with the control's decimals
+    bool asFormatted = false;     // a number stands with six decimals, not with the control's
     const double* fill = nullptr; // see ColumnSpec
     bool emptyIsNotGiven = false;
-    std::function<bool(const void* row)> locked = {}; // see ColumnSpec
-    std::optional<Str> choices = {};                  // entries of a drop-down column, one a line of the text
-    Choices choice = {};                              // the rest of a drop-down column; its entries come from `choices`
-    std::function<QString()> unitText = {};           // see ColumnSpec
-    std::function<QString()> hint = {};               // see ColumnSpec
-    bool upperCase = false;                           // of a text
+    std::function<bool(const void* row)> locked = {};  // see ColumnSpec
+    Choices choice = {};                               // of a drop-down column; the declared entries are put in
+    std::function<QString()> unitText = {};            // see ColumnSpec
+    std::function<QString()> hint = {};                // see ColumnSpec
+    bool upperCase = false;                            // of a text
     LocationValue locationValue = LocationValue::None; // see ColumnSpec
     // What the row "Global" of a grid shows in the column, where the grid has one; the cell is locked without.
     double* globalNumber = nullptr;
@@ -41,30 +39,23 @@ public:
 
     GridColumns& BranchName(ColumnOptions options);
     GridColumns& Chainage(ColumnOptions options);
-    /// A declared field of the records; its unit is that of the declaration.
-    GridColumns& Value(const Field& field, ColumnOptions options);
-    template <typename Record, typename T>
-    GridColumns& Value(T Record::*member, ColumnOptions options)
+    /// A declared field of the records, or of the elements of a group.
+    GridColumns& Value(const Field& field, ColumnOptions options = {});
+    template <typename Row, typename T>
+    GridColumns& Value(T Row::*member, ColumnOptions options = {})
     {
-        static Record record;
-        return Value(FieldAt(Record::DeclaredFields(), static_cast<HD_RiverPos*>(&record), &(record.*member)),
-                     std::move(options));
+        static Row row;
+        using Object = std::conditional_t<std::is_base_of_v<HD_RiverPos, Row>, HD_RiverPos, Row>;
+        return Value(FieldAt(Row::DeclaredFields(), static_cast<Object*>(&row), &(row.*member)), std::move(options));
     }
-    /// Likewise of the elements of a group.
-    template <typename Element, typename T>
-    GridColumns& Value(const GroupAccess& group, T Element::*member, ColumnOptions options)
-    {
-        static Element element;
-        return Value(FieldAt(group.elements, &element, &(element.*member)), std::move(options));
-    }
-    /// A value of the rows that is no declared field; `kind` says how it is edited.
-    GridColumns& Value(CellAccess access, FieldKind kind, UnitGroup unit, ColumnOptions options);
+    /// A value that the rows reach in a way of their own; `field` says the rest.
+    GridColumns& Value(CellAccess access, const Field& field, ColumnOptions options);
     /// Push buttons; the page answers them (ButtonClicked).
     GridColumns& Button(ColumnOptions options);
 
 private:
     static const Field& FieldAt(FieldList fields, void* object, const void* member);
-    GridColumns& Add(int control, UnitGroup unit, CellAccess access, ColumnOptions options);
+    GridColumns& Add(int control, const Field& field, CellAccess access, ColumnOptions options);
     void AddGlobalRow(ColumnSpec& column, CellAccess& access, const ColumnOptions& options) const;
 
     CGenGrid& m_grid;
