@@ -4,6 +4,7 @@
 #include "grid/date_time_text.h"
 #include "grid/grid_texts.h"
 #include "grid/number_syntax.h"
+#include "grid/typing.h"
 
 #include <cmath>
 
@@ -102,6 +103,6 @@ CellReading ReadCell(const ColumnSpec& column, const QString& text)
         return {{}, GridTexts::tr("Floating point number required")};
     const double value = column.style.UnitConvertFromBase(*number, 0);
     if (!column.IsAllowed(value))
-        return {{}, GridTexts::tr("Floating-point value is out of range")};
+        return {{}, OutOfRange()};
     return {value, {}};
 }

@@ -435,6 +435,12 @@ int CGridModel::InsertRow(int row)
     return row;
 }
 
+void CGridModel::AppendRow(const QStringList& texts)
+{
+    Paste(StoredRows(), 0, {texts}, GridTexts::tr("Insertion of lines"));
+    m_document->Say(GridTexts::tr("Line inserted"));
+}
+
 void CGridModel::RemoveRows(int row, int count)
 {
     Store();

@@ -82,6 +82,8 @@ public:
     /// A new line before `row`, with the columns' fill values: an undo step. The offered row becomes a line before it.
     /// Returns the row where it went.
     int InsertRow(int row);
+    /// A new line behind the last one, with these texts from its first cell on: an undo step.
+    void AppendRow(const QStringList& texts);
     /// Rows at the top that are no lines of the table.
     int FixedRows() const { return m_rows ? int(m_rows->FixedRows()) : 0; }
     /// An undo step; the offered row stays. No fixed row is among the rows.

@@ -67,6 +67,11 @@ QString RefusalDetails(const QString& place, const QString& typed, const QString
     return lines.join(u'\n');
 }
 
+QString OutOfRange()
+{
+    return GridTexts::tr("Floating-point value is out of range");
+}
+
 QString AllowedRange(const QString& minimum, const QString& maximum)
 {
     if (!minimum.isEmpty() && !maximum.isEmpty())

@@ -33,6 +33,14 @@
         <source>%1 exists already. Replace it?</source>
         <translation>%1 は既に存在します。置き換えますか?</translation>
     </message>
+    <message>
+        <source>Undone: %1</source>
+        <translation>元に戻しました: %1</translation>
+    </message>
+    <message>
+        <source>Redone: %1</source>
+        <translation>やり直しました: %1</translation>
+    </message>
 </context>
 <context>
     <name>CKsEditLong</name>

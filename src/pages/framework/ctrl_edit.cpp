@@ -2,7 +2,6 @@
 
 #include "grid/column_spec.h"
 #include "grid/digits_mark.h"
-#include "grid/grid_texts.h"
 #include "grid/number_syntax.h"
 #include "res/strings.h"
 
@@ -97,7 +96,7 @@ QString CCtrlEdit::Complaint() const
     if (!IsValidNumber(text().toStdString()))
         return LoadString(Str::InvalidNumber);
     const auto value = Typed();
-    return value && InRange(*value) ? QString() : GridTexts::tr("Floating-point value is out of range");
+    return value && InRange(*value) ? QString() : OutOfRange();
 }
 
 QString CCtrlEdit::Allowed() const

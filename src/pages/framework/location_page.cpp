@@ -1,7 +1,6 @@
 #include "pages/framework/location_page.h"
 
 #include "document/list_rows.h"
-#include "grid/grid_texts.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/wnd_resizer.h"
 
@@ -266,8 +265,7 @@ void CLocationPage::InsertLocation(const QString& riverName, const QString& chai
     }
     StoreToDocument();
     const int row = model.StoredRows();
-    model.Paste(row, 0, {{riverName, chainageText}}, GridTexts::tr("Insertion of lines"));
-    GetDocument()->Say(GridTexts::tr("Line inserted"));
+    model.AppendRow({riverName, chainageText});
     GetGrid()->SetCurrentCell(row + 1, 1);
 }
 

@@ -300,17 +300,6 @@
     </message>
 </context>
 <context>
-    <name>CGotoDlg</name>
-    <message>
-        <source>Go to grid line</source>
-        <translation>指定行へ移動</translation>
-    </message>
-    <message>
-        <source>&amp;Line number:</source>
-        <translation>行番号(&amp;L):</translation>
-    </message>
-</context>
-<context>
     <name>CHeatBalancePage</name>
     <message>
         <source>Heat Balance Calculation</source>
@@ -508,13 +497,6 @@
     <message>
         <source>Ma&amp;ximum entrainment velocity</source>
         <translation>最大連行速度(&amp;X)</translation>
-    </message>
-</context>
-<context>
-    <name>CKsEditStyle</name>
-    <message>
-        <source>Unit: %1</source>
-        <translation>単位: %1</translation>
     </message>
 </context>
 <context>
@@ -832,65 +814,6 @@
     <message>
         <source>Load &amp;branch and chainages</source>
         <translation>河川名と追加距離の読み込み(&amp;B)</translation>
-    </message>
-</context>
-<context>
-    <name>CSearchDlg</name>
-    <message>
-        <source>Search</source>
-        <translation>検索</translation>
-    </message>
-    <message>
-        <source>River Name</source>
-        <translation>河川名</translation>
-    </message>
-    <message>
-        <source>River &amp;name:</source>
-        <translation>河川名(&amp;N):</translation>
-    </message>
-    <message>
-        <source>&amp;Partial match</source>
-        <translation>前方一致(&amp;P)</translation>
-    </message>
-    <message>
-        <source>&amp;Full match</source>
-        <translation>完全一致(&amp;F)</translation>
-    </message>
-    <message>
-        <source>Chainage</source>
-        <translation>追加距離</translation>
-    </message>
-    <message>
-        <source>&amp;Chainage:</source>
-        <translation>追加距離(&amp;C):</translation>
-    </message>
-    <message>
-        <source>&lt;</source>
-        <translation>&lt;</translation>
-    </message>
-    <message>
-        <source>Less than</source>
-        <translation>より小さい</translation>
-    </message>
-    <message>
-        <source>=</source>
-        <translation>=</translation>
-    </message>
-    <message>
-        <source>Equal to</source>
-        <translation>等しい</translation>
-    </message>
-    <message>
-        <source>&gt;</source>
-        <translation>&gt;</translation>
-    </message>
-    <message>
-        <source>Greater than</source>
-        <translation>より大きい</translation>
-    </message>
-    <message>
-        <source>Not &amp;Use</source>
-        <translation>使わない(&amp;U)</translation>
     </message>
 </context>
 <context>
@@ -1417,36 +1340,12 @@ Replace it Yes/No ?</source>
         <translation>不完全な行の削除</translation>
     </message>
     <message>
-        <source>Line %1 of %2</source>
-        <translation>%1 行目 / 全 %2 行</translation>
-    </message>
-    <message>
-        <source>Searched item not found</source>
-        <translation>検索した項目が見つかりません</translation>
-    </message>
-    <message>
-        <source>The last occurence of searched item already found</source>
-        <translation>これ以降に該当する項目はありません</translation>
-    </message>
-    <message>
         <source>&amp;Insert Line</source>
         <translation>行の挿入(&amp;I)</translation>
     </message>
     <message>
         <source>&amp;Delete Line</source>
         <translation>行の削除(&amp;D)</translation>
-    </message>
-    <message>
-        <source>&amp;Go to Line...</source>
-        <translation>指定行へ移動(&amp;G)...</translation>
-    </message>
-    <message>
-        <source>&amp;Search...</source>
-        <translation>検索(&amp;S)...</translation>
-    </message>
-    <message>
-        <source>Search &amp;Again</source>
-        <translation>次を検索(&amp;A)</translation>
     </message>
     <message>
         <source>Insert &amp;Location from Network</source>
@@ -1475,54 +1374,8 @@ Pick a place on the network&apos;s map first.</source>
         <translation>初期条件</translation>
     </message>
     <message>
-        <source>Floating point number required</source>
-        <translation>数値を入力してください</translation>
-    </message>
-    <message>
         <source>Invalid floating point number!</source>
         <translation>数値の書き方が正しくありません。</translation>
-    </message>
-    <message>
-        <source>Floating-point value is out of range</source>
-        <translation>数値が範囲外です</translation>
-    </message>
-    <message>
-        <source>Please enter an integer.</source>
-        <translation>整数を入力してください。</translation>
-    </message>
-    <message>
-        <source>Line number must be greater than 0</source>
-        <translation>行番号は1以上にしてください</translation>
-    </message>
-    <message>
-        <source>Nothing was pasted. Line %1, column &quot;%2&quot; cannot take &quot;%3&quot;:
-%4</source>
-        <translation>貼り付けませんでした。%1 行目の「%2」列には「%3」を入れられません:
-%4</translation>
-    </message>
-    <message>
-        <source>Nothing was pasted. The copied cells are %1 columns wide; from column &quot;%2&quot; on the table has only %3.</source>
-        <translation>貼り付けませんでした。コピーしたセルは %1 列ありますが、表には「%2」列から %3 列しかありません。</translation>
-    </message>
-    <message>
-        <source>The cell is locked.</source>
-        <translation>セルはロックされています。</translation>
-    </message>
-    <message>
-        <source>Change of cells</source>
-        <translation>セルの変更</translation>
-    </message>
-    <message>
-        <source>Insertion of lines</source>
-        <translation>行の挿入</translation>
-    </message>
-    <message>
-        <source>Deletion of lines</source>
-        <translation>行の削除</translation>
-    </message>
-    <message>
-        <source>Paste</source>
-        <translation>貼り付け</translation>
     </message>
     <message>
         <source>Change of a value</source>
@@ -1531,50 +1384,6 @@ Pick a place on the network&apos;s map first.</source>
     <message>
         <source>Loading of locations</source>
         <translation>位置の読み込み</translation>
-    </message>
-    <message>
-        <source>Next cell; behind the last one a new line</source>
-        <translation>次のセル(最後のセルでは行を追加)</translation>
-    </message>
-    <message>
-        <source>Previous cell</source>
-        <translation>前のセル</translation>
-    </message>
-    <message>
-        <source>Insert line</source>
-        <translation>行の挿入</translation>
-    </message>
-    <message>
-        <source>Copy, then insert line</source>
-        <translation>コピーして行を挿入</translation>
-    </message>
-    <message>
-        <source>Paste, then insert line</source>
-        <translation>貼り付けて行を挿入</translation>
-    </message>
-    <message>
-        <source>Delete selected lines</source>
-        <translation>選択した行の削除</translation>
-    </message>
-    <message>
-        <source>Copy</source>
-        <translation>コピー</translation>
-    </message>
-    <message>
-        <source>Search again</source>
-        <translation>次を検索</translation>
-    </message>
-    <message>
-        <source>Search</source>
-        <translation>検索</translation>
-    </message>
-    <message>
-        <source>Undo</source>
-        <translation>元に戻す</translation>
-    </message>
-    <message>
-        <source>Redo</source>
-        <translation>やり直し</translation>
     </message>
     <message>
         <source>Wind</source>
@@ -1611,14 +1420,6 @@ Pick a place on the network&apos;s map first.</source>
     <message>
         <source>Water Loss %1</source>
         <translation>損失水量 %1</translation>
-    </message>
-    <message>
-        <source>One of these is required: %1</source>
-        <translation>次のいずれかを入力してください: %1</translation>
-    </message>
-    <message>
-        <source>No lines. Insert adds one.</source>
-        <translation>行がありません。Insertキーで追加します。</translation>
     </message>
     <message>
         <source>Wave Approx</source>
@@ -1941,18 +1742,6 @@ DEM
         <translation>%1地点を追加しました。%2地点は既にありました。</translation>
     </message>
     <message>
-        <source>Invalid DateTime</source>
-        <translation>無効な日時</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; is no date and time. Expected one such as %2.</source>
-        <translation>「%1」は日時ではありません。%2 のように入力してください。</translation>
-    </message>
-    <message>
-        <source>Please enter 0 or 1.</source>
-        <translation>0または1を入力してください。</translation>
-    </message>
-    <message>
         <source>%1 already exists.
 The simulation will write over it. Use this name?</source>
         <translation>%1 は既に存在します。
@@ -2081,34 +1870,6 @@ User defined marks</source>
 ユーザー定義マーク</translation>
     </message>
     <message>
-        <source>%1: &quot;%2&quot; was typed.</source>
-        <translation>%1: 「%2」と入力されました。</translation>
-    </message>
-    <message>
-        <source>Allowed: %1</source>
-        <translation>許容範囲: %1</translation>
-    </message>
-    <message>
-        <source>%1 to %2</source>
-        <translation>%1 ～ %2</translation>
-    </message>
-    <message>
-        <source>at least %1</source>
-        <translation>%1 以上</translation>
-    </message>
-    <message>
-        <source>at most %1</source>
-        <translation>%1 以下</translation>
-    </message>
-    <message>
-        <source>%1, line %2</source>
-        <translation>%1、%2 行目</translation>
-    </message>
-    <message>
-        <source>Select the line</source>
-        <translation>行を選択</translation>
-    </message>
-    <message>
         <source>%1 does not exist.
 The simulation will look for it. Use this name?</source>
         <translation>%1 は存在しません。
@@ -2229,14 +1990,6 @@ true または false
         <translation>閉じる(&amp;L)</translation>
     </message>
     <message>
-        <source>Full value: %1</source>
-        <translation>全桁の値: %1</translation>
-    </message>
-    <message>
-        <source>Line %1 of %2, %3: %4</source>
-        <translation>%1 行目 / 全 %2 行、%3: %4</translation>
-    </message>
-    <message>
         <source>Resistance = a·(V·R)^b, between minimum and maximum. V is the velocity in m/s, R the hydraulic radius in m.</source>
         <translation>抵抗値 = a·(V·R)^b(最小値と最大値の間)。Vは流速(m/s)、Rは径深(m)です。</translation>
     </message>
@@ -2277,38 +2030,6 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
     <message>
         <source>In a table</source>
         <translation>表</translation>
-    </message>
-    <message>
-        <source>Undone: %1</source>
-        <translation>元に戻しました: %1</translation>
-    </message>
-    <message>
-        <source>Redone: %1</source>
-        <translation>やり直しました: %1</translation>
-    </message>
-    <message>
-        <source>Line inserted</source>
-        <translation>行を挿入しました</translation>
-    </message>
-    <message>
-        <source>%1 lines inserted</source>
-        <translation>%1 行を挿入しました</translation>
-    </message>
-    <message>
-        <source>Line deleted</source>
-        <translation>行を削除しました</translation>
-    </message>
-    <message>
-        <source>%1 lines deleted</source>
-        <translation>%1 行を削除しました</translation>
-    </message>
-    <message>
-        <source>1 cell pasted</source>
-        <translation>1 個のセルに貼り付けました</translation>
-    </message>
-    <message>
-        <source>%1 cells pasted</source>
-        <translation>%1 個のセルに貼り付けました</translation>
     </message>
     <message>
         <source>Saved</source>

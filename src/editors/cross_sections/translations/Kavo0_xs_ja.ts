@@ -2,6 +2,13 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ja" sourcelanguage="en_US">
 <context>
+    <name>CCrossSectionDoc</name>
+    <message>
+        <source>BRANCH</source>
+        <translation>河川</translation>
+    </message>
+</context>
+<context>
     <name>CCrossSectionView</name>
     <message>
         <source>&amp;Points</source>
@@ -55,67 +62,14 @@
         <source>Shows the cross section below</source>
         <translation>1つ下の横断面を表示します</translation>
     </message>
-    <message>
-        <source>BRANCH</source>
-        <translation>河川</translation>
-    </message>
 </context>
 <context>
-    <name>CLinesTable</name>
-    <message>
-        <source>Line %1, %2: %3</source>
-        <translation>%1行目、%2: %3</translation>
-    </message>
-</context>
-<context>
-    <name>CPointTable</name>
-    <message>
-        <source>Offset</source>
-        <translation>横断距離</translation>
-    </message>
-    <message>
-        <source>Bed level</source>
-        <translation>河床高</translation>
-    </message>
-    <message>
-        <source>%1 of Point</source>
-        <translation>測点の%1の変更</translation>
-    </message>
-    <message>
-        <source>Delete Points</source>
-        <translation>測点の削除</translation>
-    </message>
-    <message>
-        <source>Insert Point</source>
-        <translation>測点の挿入</translation>
-    </message>
-    <message>
-        <source>Line %1 of the pasted text: expected an offset and a bed level, found &quot;%2&quot;.</source>
-        <translation>貼り付けるテキストの%1行目: 横断距離と河床高が必要です(内容: 「%2」)。</translation>
-    </message>
-    <message>
-        <source>The pasted text does not fit here: %1</source>
-        <translation>ここには貼り付けられません: %1</translation>
-    </message>
-    <message>
-        <source>Paste Points</source>
-        <translation>測点の貼り付け</translation>
-    </message>
-</context>
-<context>
-    <name>CProjectDoc</name>
+    <name>CParameterDoc</name>
     <message>
         <source>%1 could not be saved.
 %2</source>
         <translation>%1を保存できませんでした。
 %2</translation>
-    </message>
-</context>
-<context>
-    <name>CSectionLines</name>
-    <message>
-        <source>expected a number, found &quot;%1&quot;.</source>
-        <translation>数値を入力してください(入力: 「%1」)。</translation>
     </message>
 </context>
 <context>
@@ -165,41 +119,6 @@ Bed level %2</source>
     <message>
         <source>Width %1</source>
         <translation>水面幅 %1</translation>
-    </message>
-</context>
-<context>
-    <name>CSectionTable</name>
-    <message>
-        <source>Branch</source>
-        <translation>河川名</translation>
-    </message>
-    <message>
-        <source>Chainage</source>
-        <translation>追加距離</translation>
-    </message>
-    <message>
-        <source>Radius</source>
-        <translation>曲率半径</translation>
-    </message>
-    <message>
-        <source>Width</source>
-        <translation>水面幅</translation>
-    </message>
-    <message>
-        <source>Topo ID</source>
-        <translation>測量ID</translation>
-    </message>
-    <message>
-        <source>%1 of Cross Section</source>
-        <translation>横断面の%1の変更</translation>
-    </message>
-    <message>
-        <source>Delete Cross Sections</source>
-        <translation>横断面の削除</translation>
-    </message>
-    <message>
-        <source>Insert Cross Section</source>
-        <translation>横断面の挿入</translation>
     </message>
 </context>
 <context>
@@ -300,6 +219,37 @@ Delete Lines</source>
     <message>
         <source>there is a cross section of branch &quot;%1&quot; at chainage %2 m with the topo ID &quot;%3&quot; already.</source>
         <translation>河川「%1」の追加距離%2 m、測量ID「%3」の横断面はすでにあります。</translation>
+    </message>
+</context>
+<context>
+    <name>SectionTables</name>
+    <message>
+        <source>Branch</source>
+        <translation>河川名</translation>
+    </message>
+    <message>
+        <source>Chainage</source>
+        <translation>追加距離</translation>
+    </message>
+    <message>
+        <source>Radius</source>
+        <translation>径深</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>水路幅</translation>
+    </message>
+    <message>
+        <source>Topo ID</source>
+        <translation>測量ID</translation>
+    </message>
+    <message>
+        <source>Offset</source>
+        <translation>横断距離</translation>
+    </message>
+    <message>
+        <source>Bed level</source>
+        <translation>河床高</translation>
     </message>
 </context>
 </TS>

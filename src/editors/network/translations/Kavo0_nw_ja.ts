@@ -2,96 +2,6 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ja" sourcelanguage="en_US">
 <context>
-    <name>CBranchTable</name>
-    <message>
-        <source>Branch</source>
-        <translation>河川名</translation>
-    </message>
-    <message>
-        <source>From</source>
-        <translation>始点</translation>
-    </message>
-    <message>
-        <source>To</source>
-        <translation>終点</translation>
-    </message>
-    <message>
-        <source>Vertices</source>
-        <translation>頂点数</translation>
-    </message>
-    <message>
-        <source>Flow</source>
-        <translation>流下方向</translation>
-    </message>
-    <message>
-        <source>Checked: water flows towards increasing chainages</source>
-        <translation>オン: 追加距離が増える方向に流下します</translation>
-    </message>
-    <message>
-        <source>increasing</source>
-        <translation>距離増加方向</translation>
-    </message>
-    <message>
-        <source>decreasing</source>
-        <translation>距離減少方向</translation>
-    </message>
-    <message>
-        <source>Name of Branch</source>
-        <translation>河川名の変更</translation>
-    </message>
-    <message>
-        <source>expected a number, found &quot;%1&quot;.</source>
-        <translation>数値を入力してください(入力: 「%1」)。</translation>
-    </message>
-    <message>
-        <source>Chainage of Branch</source>
-        <translation>河川の追加距離の変更</translation>
-    </message>
-    <message>
-        <source>Flow Direction</source>
-        <translation>流下方向の変更</translation>
-    </message>
-    <message>
-        <source>Delete Branches</source>
-        <translation>河川の削除</translation>
-    </message>
-</context>
-<context>
-    <name>CChannelTable</name>
-    <message>
-        <source>Chainage</source>
-        <translation>追加距離</translation>
-    </message>
-    <message>
-        <source>Radius</source>
-        <translation>曲率半径</translation>
-    </message>
-    <message>
-        <source>Width</source>
-        <translation>水路幅</translation>
-    </message>
-    <message>
-        <source>expected a number, found &quot;%1&quot;.</source>
-        <translation>数値を入力してください(入力: 「%1」)。</translation>
-    </message>
-    <message>
-        <source>there is a line at this chainage already.</source>
-        <translation>この追加距離の行はすでにあります。</translation>
-    </message>
-    <message>
-        <source>Channel</source>
-        <translation>河道データの変更</translation>
-    </message>
-    <message>
-        <source>Delete Lines</source>
-        <translation>行の削除</translation>
-    </message>
-    <message>
-        <source>Insert Line</source>
-        <translation>行の挿入</translation>
-    </message>
-</context>
-<context>
     <name>CImportDialog</name>
     <message>
         <source>Import Branches from %1</source>
@@ -266,28 +176,6 @@
     </message>
 </context>
 <context>
-    <name>CLinesTable</name>
-    <message>
-        <source>Line %1, %2: %3</source>
-        <translation>%1行目、%2: %3</translation>
-    </message>
-</context>
-<context>
-    <name>CNetworkDoc</name>
-    <message>
-        <source>A branch needs a name.</source>
-        <translation>河川名を入力してください。</translation>
-    </message>
-    <message>
-        <source>There is a branch &quot;%1&quot; already.</source>
-        <translation>河川「%1」はすでにあります。</translation>
-    </message>
-    <message>
-        <source>The chainages of the two ends of a branch have to differ.</source>
-        <translation>河川の両端の追加距離は異なる値にしてください。</translation>
-    </message>
-</context>
-<context>
     <name>CNetworkMap</name>
     <message>
         <source>Map of the river network</source>
@@ -335,10 +223,6 @@
     <message>
         <source>Deletes the selected lines of the table</source>
         <translation>表で選択した行を削除します</translation>
-    </message>
-    <message>
-        <source>Show &amp;All</source>
-        <translation>全体を表示(&amp;A)</translation>
     </message>
     <message>
         <source>Shows the whole network on the map</source>
@@ -396,9 +280,13 @@
         <source>Cha&amp;nnel</source>
         <translation>河道(&amp;C)</translation>
     </message>
+    <message>
+        <source>Sho&amp;w All</source>
+        <translation>全体を表示(&amp;W)</translation>
+    </message>
 </context>
 <context>
-    <name>CProjectDoc</name>
+    <name>CParameterDoc</name>
     <message>
         <source>%1 could not be saved.
 %2</source>
@@ -724,6 +612,69 @@
     <message>
         <source>expected the name of a coordinate system, CoordinateSystem = &quot;EPSG:...&quot;.</source>
         <translation>座標系の名前 CoordinateSystem = &quot;EPSG:...&quot; が必要です。</translation>
+    </message>
+</context>
+<context>
+    <name>NetworkTables</name>
+    <message>
+        <source>A branch needs a name.</source>
+        <translation>河川名を入力してください。</translation>
+    </message>
+    <message>
+        <source>There is a branch &quot;%1&quot; already.</source>
+        <translation>河川「%1」はすでにあります。</translation>
+    </message>
+    <message>
+        <source>The chainages of the two ends of a branch have to differ.</source>
+        <translation>河川の両端の追加距離は異なる値にしてください。</translation>
+    </message>
+    <message>
+        <source>There is a line at this chainage already.</source>
+        <translation>この追加距離の行はすでにあります。</translation>
+    </message>
+    <message>
+        <source>decreasing</source>
+        <translation>距離減少方向</translation>
+    </message>
+    <message>
+        <source>increasing</source>
+        <translation>距離増加方向</translation>
+    </message>
+    <message>
+        <source>Whether water flows towards increasing or decreasing chainages</source>
+        <translation>追加距離が増える方向と減る方向のどちらに流下するか</translation>
+    </message>
+    <message>
+        <source>Branch</source>
+        <translation>河川名</translation>
+    </message>
+    <message>
+        <source>From</source>
+        <translation>始点</translation>
+    </message>
+    <message>
+        <source>To</source>
+        <translation>終点</translation>
+    </message>
+    <message>
+        <source>Vertices</source>
+        <translation>頂点数</translation>
+    </message>
+    <message>
+        <source>Flow</source>
+        <translation>流下方向</translation>
+    </message>
+    <message>
+        <source>Chainage</source>
+        <translation>追加距離</translation>
+    </message>
+    <message>
+        <source>Radius</source>
+        <translation>径深</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>水路幅</translation>
     </message>
 </context>
 <context>
