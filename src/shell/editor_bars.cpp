@@ -11,15 +11,14 @@ namespace {
 constexpr unsigned FirstBarId = 0xE880; // control ids of the editors' bars, above those of the frame's own
 } // namespace
 
-CEditorBars::CEditorBars(CKsMDIFrameWnd* frame) : QObject(frame), m_frame(frame) {}
+CEditorBars::CEditorBars(CKsMDIFrameWnd& frame, const CPlugins& plugins) : m_frame(frame), m_plugins(plugins) {}
 
-void CEditorBars::Create(const std::vector<std::unique_ptr<CPlugin>>& plugins)
+void CEditorBars::Create()
 {
     for (Bar& bar : m_bars)
         delete bar.bar;
     m_bars.clear();
-    m_plugins = &plugins;
-    for (const auto& plugin : plugins) {
+    for (const auto& plugin : m_plugins.All()) {
         if (plugin->IsUsable())
             AddBars(*plugin);
     }
@@ -47,13 +46,10 @@ void CEditorBars::AddBars(const CPlugin& plugin)
 void CEditorBars::Show(const CView* view, bool show)
 {
     const CMultiDocTemplate* documents = view && view->GetDocument() ? view->GetDocument()->GetDocTemplate() : nullptr;
-    if (!documents || !m_plugins)
+    const CPlugin* plugin = m_plugins.Of(documents);
+    if (!plugin)
         return;
-    for (const auto& plugin : *m_plugins) {
-        const auto& own = plugin->templates;
-        if (std::any_of(own.begin(), own.end(), [&](const auto& each) { return each.get() == documents; }))
-            m_shown[plugin.get()] = show;
-    }
+    m_shown[plugin] = show;
     Update();
 }
 
@@ -71,7 +67,7 @@ void CEditorBars::Update()
         Bar& bar = m_bars[i];
         const bool visible = bar.toggle->isChecked() && m_shown[bar.plugin];
         if (visible && !bar.bar) {
-            bar.bar = bar.plugin->KsCreateToolbar(m_frame, 0, FirstBarId + unsigned(i), bar.index);
+            bar.bar = bar.plugin->KsCreateToolbar(&m_frame, 0, FirstBarId + static_cast<unsigned>(i), bar.index);
             if (!bar.bar)
                 continue;
             bar.bar->setObjectName(bar.toggle->objectName());

@@ -10,6 +10,7 @@
 
 class CKsMDIFrameWnd;
 class CKsToolBarEx;
+class CPlugins;
 class CView;
 struct CPlugin;
 
@@ -20,9 +21,10 @@ class CEditorBars : public QObject
 {
     Q_OBJECT
 public:
-    explicit CEditorBars(CKsMDIFrameWnd* frame);
+    /// Both outlive the bars.
+    CEditorBars(CKsMDIFrameWnd& frame, const CPlugins& plugins);
     /// Begins anew with the bars of all usable plug-ins; those made before are removed.
-    void Create(const std::vector<std::unique_ptr<CPlugin>>& plugins);
+    void Create();
     /// Shows or hides the bars of the editor that the view belongs to.
     void Show(const CView* view, bool show);
     /// One checkable action a bar: whether the user wants to see it.
@@ -41,8 +43,8 @@ private:
     void Update();
     void SaveHidden() const;
 
-    CKsMDIFrameWnd* m_frame;
+    CKsMDIFrameWnd& m_frame;
+    const CPlugins& m_plugins;
     std::vector<Bar> m_bars;
     std::map<const CPlugin*, bool> m_shown; // asked for by a view
-    const std::vector<std::unique_ptr<CPlugin>>* m_plugins = nullptr;
 };

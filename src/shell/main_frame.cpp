@@ -3,55 +3,42 @@
 #include "ks/fc/exports.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
+#include "shell/project_respell.h"
 #include "shell/settings_keys.h"
 
 #include <QApplication>
 #include <QCloseEvent>
+#include <QDropEvent>
 #include <QIcon>
 #include <QLabel>
 #include <QMenu>
+#include <QMimeData>
 #include <QScreen>
 #include <QSettings>
 #include <QStatusBar>
-#include <QTabBar>
+#include <QUndoStack>
+#include <QUrl>
 
-static void InitResources()
+CMainFrame::CMainFrame()
+    : m_windows(*this),
+      m_projects(*this, m_windows, m_plugins, m_recent),
+      m_files(*this, m_plugins, m_projects),
+      m_bars(*this, m_plugins),
+      m_menus(*this),
+      m_pluginLabel(new QLabel(this)),
+      m_projectLabel(new QLabel(this))
 {
-    Q_INIT_RESOURCE(shell); // stands in a static library
-}
-
-CMainFrame::CMainFrame() : m_bars(this)
-{
-    InitResources();
     setObjectName(QStringLiteral("mainFrame"));
     setAcceptDrops(true);
     setWindowIcon(QIcon(QStringLiteral(":/shell/shell.svg")));
-    MdiArea().setTabsClosable(true);
-    MdiArea().setTabsMovable(true);
-    MdiArea().setDocumentMode(true);
-    m_pluginLabel = new QLabel(this);
     m_pluginLabel->setObjectName(QStringLiteral("pluginLabel"));
     statusBar()->addPermanentWidget(m_pluginLabel);
-    m_projectLabel = new QLabel(this);
     statusBar()->addPermanentWidget(m_projectLabel);
-
-    m_projectTree = new CProjectTree(this);
-    addDockWidget(Qt::LeftDockWidgetArea, m_projectTree);
-    m_projectTree->hide(); // until there is a project
-    // Queued: what is chosen fills the tree anew, whose items are busy until then.
-    connect(m_projectTree, &CProjectTree::MemberChosen, this, &CMainFrame::ShowMember, Qt::QueuedConnection);
-    connect(m_projectTree, &CProjectTree::CloseProjectChosen, this, &CMainFrame::CloseProject, Qt::QueuedConnection);
-
-    CreateActions();
-    CreateMenus();
-    connect(&m_undo, &QUndoGroup::canUndoChanged, this, &CMainFrame::UpdateUndoTexts);
-    connect(&m_undo, &QUndoGroup::canRedoChanged, this, &CMainFrame::UpdateUndoTexts);
-    connect(&m_undo, &QUndoGroup::undoTextChanged, this, &CMainFrame::UpdateUndoTexts);
-    connect(&m_undo, &QUndoGroup::redoTextChanged, this, &CMainFrame::UpdateUndoTexts);
+    connect(&m_projects, &CProjectController::Changed, this, &CMainFrame::Update);
 
     Retranslate();
     ReadSettings();
-    UpdateActions();
+    Update();
     KsSetMainWindow(this);
 }
 
@@ -59,36 +46,16 @@ CMainFrame::~CMainFrame()
 {
     DestroyWindows(); // while this still answers the editors' messages
     KsClearExports();
-    for (const auto& plugin : m_plugins)
-        plugin->templates.clear();
+    m_plugins.Clear();
 }
 
 void CMainFrame::LoadPlugins(const QString& folder)
 {
-    auto loaded = ::LoadPlugins(folder);
-    for (auto& plugin : loaded) {
-        for (const auto& documents : plugin->templates)
-            AddTemplate(documents.get());
-        m_plugins.push_back(std::move(plugin));
-    }
-    m_bars.Create(m_plugins);
+    for (const CMultiDocTemplate* documents : m_plugins.Load(folder))
+        Follow(*documents);
+    m_bars.Create();
     Retranslate();
-    UpdateActions();
-}
-
-/// Names the plug-ins that are not used, without stopping anybody.
-void CMainFrame::UpdatePluginLabel()
-{
-    QStringList names, reasons;
-    for (const auto& plugin : m_plugins) {
-        if (plugin->IsUsable())
-            continue;
-        names << plugin->name;
-        reasons << plugin->name + QStringLiteral(": ") + plugin->error;
-    }
-    m_pluginLabel->setVisible(!names.isEmpty());
-    m_pluginLabel->setText(tr("Not loaded: %1 (see Help, Plug-ins)").arg(names.join(QStringLiteral(", "))));
-    m_pluginLabel->setToolTip(reasons.join(u'\n'));
+    Update();
 }
 
 LRESULT CMainFrame::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
@@ -99,15 +66,80 @@ LRESULT CMainFrame::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
         return 0;
     }
     if (package && message == KsMessage::SwitchBoard())
-        return m_projects.SwitchBoard(wParam, *package);
+        return m_projects.Registry().SwitchBoard(wParam, *package);
     if (package && message == KsMessage::BetweenEditors())
-        m_projects.Forward(wParam, *package);
+        m_projects.Registry().Forward(wParam, *package);
     return CKsMDIFrameWnd::WindowProc(message, wParam, lParam);
 }
 
-CKsDoc* CMainFrame::ActiveDocument() const
+QMenu* CMainFrame::createPopupMenu()
 {
-    return GetActiveView() ? GetActiveView()->GetDocument() : nullptr;
+    auto* menu = new QMenu(this);
+    m_menus.FillToolBars(menu);
+    return menu;
+}
+
+// ---- documents ---------------------------------------------------------------------------------
+
+void CMainFrame::Follow(const CMultiDocTemplate& documents)
+{
+    connect(&documents, &CMultiDocTemplate::DocumentClosing, &m_projects, &CProjectController::UpdateTree,
+            Qt::QueuedConnection);
+    connect(&documents, &CMultiDocTemplate::DocumentOpened, this, [this](CKsDoc* document) {
+        m_edit.History().addStack(&document->UndoStack());
+        connect(document, &CKsDoc::TitleChanged, this, &CMainFrame::UpdateTitle);
+        connect(document, &CKsDoc::PathNameChanged, this, &CMainFrame::DocumentRenamed);
+    });
+    connect(&documents, &CMultiDocTemplate::DocumentShown, this, &CMainFrame::DocumentShown);
+}
+
+/// Whoever opened it: the user, a project, or an editor for another one.
+void CMainFrame::DocumentShown(const CKsDoc* document)
+{
+    if (!document->GetPathName().isEmpty())
+        m_recent.Add(document->GetPathName());
+    const CPlugin* editor = m_plugins.Of(document->GetDocTemplate());
+    for (const CView* view : document->Views()) {
+        if (auto* window = m_windows.Of(view); window && editor)
+            window->setWindowIcon(editor->Icon());
+    }
+    Update(); // by now it may have joined a project
+}
+
+void CMainFrame::DocumentRenamed(const QString& oldPath, const QString& newPath)
+{
+    m_recent.Rename(oldPath, newPath);
+    for (const auto& project : m_projects.Registry().All())
+        RespellMember(project->path, oldPath, newPath);
+    if (!newPath.isEmpty())
+        m_recent.Add(newPath);
+}
+
+void CMainFrame::ActiveViewChanged(CView* view)
+{
+    CKsDoc* document = view ? view->GetDocument() : nullptr;
+    m_edit.History().setActiveStack(document ? &document->UndoStack() : nullptr);
+    m_menus.ViewChanged();
+    Update();
+    TellStatus({}); // it was about the view before
+}
+
+// ---- texts -------------------------------------------------------------------------------------
+
+void CMainFrame::Retranslate()
+{
+    m_menus.Retranslate();
+    MdiArea().SetHint(m_plugins.Templates().empty() ? tr("No editor was found. See Help, Plug-ins.")
+                                                    : tr("Open a file with File, Open, or drop it here."));
+    UpdatePluginLabel();
+    UpdateTitle();
+}
+
+/// What can be done, and where one is.
+void CMainFrame::Update()
+{
+    UpdateTitle();
+    m_menus.Update();
 }
 
 void CMainFrame::UpdateTitle()
@@ -117,18 +149,35 @@ void CMainFrame::UpdateTitle()
     // This form is also the one that a maximised document window would make of it.
     setWindowTitle(document ? QStringLiteral("%1 - [%2[*]]").arg(program, document->GetTitle()) : program);
     setWindowModified(document && document->IsModified());
-    const CProject* project = m_projects.FindByView(GetActiveView());
+    const CProject* project = m_projects.Registry().FindByView(GetActiveView());
     m_projectLabel->setText(project ? tr("Project: %1").arg(project->name) : QString());
     m_projectLabel->setToolTip(project ? project->path : QString());
-    UpdateProjectTree();
+    m_projects.UpdateTree();
 }
+
+/// Names the plug-ins that are not used, without stopping anybody.
+void CMainFrame::UpdatePluginLabel()
+{
+    QStringList names, reasons;
+    for (const auto& plugin : m_plugins.All()) {
+        if (plugin->IsUsable())
+            continue;
+        names << plugin->name;
+        reasons << plugin->name + QStringLiteral(": ") + plugin->error;
+    }
+    m_pluginLabel->setVisible(!names.isEmpty());
+    m_pluginLabel->setText(tr("Not loaded: %1 (see Help, Plug-ins)").arg(names.join(QStringLiteral(", "))));
+    m_pluginLabel->setToolTip(reasons.join(u'\n'));
+}
+
+// ---- events ------------------------------------------------------------------------------------
 
 void CMainFrame::changeEvent(QEvent* event)
 {
     if (event->type() == QEvent::LanguageChange) {
-        for (const auto& plugin : m_plugins)
+        for (const auto& plugin : m_plugins.All())
             plugin->UpdateName();
-        m_bars.Create(m_plugins);
+        m_bars.Create();
         Retranslate();
     }
     CKsMDIFrameWnd::changeEvent(event);
@@ -144,6 +193,25 @@ void CMainFrame::closeEvent(QCloseEvent* event)
     event->accept();
 }
 
+void CMainFrame::dragEnterEvent(QDragEnterEvent* event)
+{
+    const auto urls = event->mimeData()->urls();
+    if (std::any_of(urls.begin(), urls.end(), [this](const QUrl& url) { return m_files.Knows(url.toLocalFile()); }))
+        event->acceptProposedAction();
+}
+
+void CMainFrame::dropEvent(QDropEvent* event)
+{
+    const auto urls = event->mimeData()->urls();
+    event->acceptProposedAction();
+    if (!MayLeave())
+        return;
+    for (const QUrl& url : urls) {
+        if (url.isLocalFile())
+            OpenFile(url.toLocalFile());
+    }
+}
+
 // ---- settings ----------------------------------------------------------------------------------
 
 void CMainFrame::ReadSettings()
@@ -152,20 +220,11 @@ void CMainFrame::ReadSettings()
     if (!restoreGeometry(settings.value(Settings::Geometry).toByteArray()))
         resize(QSize(1500, 940).boundedTo(screen()->availableSize()));
     restoreState(settings.value(Settings::State).toByteArray());
-    m_projectTree->hide(); // until a project is opened
-    ShowTabs(settings.value(Settings::Tabs, true).toBool());
+    m_projects.Tree().hide(); // until a project is opened
+    m_windows.ShowTabs(settings.value(Settings::Tabs, true).toBool());
     const bool usCustomary = settings.value(Settings::UsCustomary, false).toBool();
     KsUnits::Instance().SetSystem(usCustomary ? KsUnitSystem::UsCustomary : KsUnitSystem::Metric);
     KsUnits::Instance().SetAllDigits(settings.value(Settings::AllDigits, false).toBool());
-}
-
-/// Document windows as tabs, or as windows inside the frame.
-void CMainFrame::ShowTabs(bool tabs)
-{
-    MdiArea().setViewMode(tabs ? QMdiArea::TabbedView : QMdiArea::SubWindowView);
-    if (auto* bar = MdiArea().findChild<QTabBar*>(QString(), Qt::FindDirectChildrenOnly))
-        bar->setExpanding(false);
-    Action("actionTabs")->setChecked(tabs);
 }
 
 void CMainFrame::WriteSettings() const

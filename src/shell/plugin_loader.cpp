@@ -74,18 +74,65 @@ std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
     }
     plugin->UpdateName();
     plugin->error = TakeTemplates(*plugin);
-    if (plugin->IsUsable())
+    if (!plugin->IsUsable())
+        plugin->templates.clear();
+    else
         KsAddExports([file](const char* name) { return QLibrary::resolve(file, name); });
     return plugin;
 }
 
-std::vector<std::unique_ptr<CPlugin>> LoadPlugins(const QString& folder)
+std::vector<CMultiDocTemplate*> CPlugins::Load(const QString& folder)
 {
-    std::vector<std::unique_ptr<CPlugin>> plugins;
+    std::vector<CMultiDocTemplate*> loaded;
     const auto files = QDir(folder).entryInfoList(QDir::Files, QDir::Name);
     for (const QFileInfo& file : files) {
-        if (QLibrary::isLibrary(file.fileName()))
-            plugins.push_back(LoadPlugin(file.absoluteFilePath()));
+        if (!QLibrary::isLibrary(file.fileName()))
+            continue;
+        m_plugins.push_back(LoadPlugin(file.absoluteFilePath()));
+        for (const auto& documents : m_plugins.back()->templates)
+            loaded.push_back(documents.get());
     }
-    return plugins;
+    return loaded;
+}
+
+void CPlugins::Clear()
+{
+    for (const auto& plugin : m_plugins)
+        plugin->templates.clear();
+}
+
+std::vector<CMultiDocTemplate*> CPlugins::Templates() const
+{
+    std::vector<CMultiDocTemplate*> templates;
+    for (const auto& plugin : m_plugins) {
+        for (const auto& documents : plugin->templates)
+            templates.push_back(documents.get());
+    }
+    return templates;
+}
+
+CMultiDocTemplate* CPlugins::TemplateFor(const QString& path) const
+{
+    for (CMultiDocTemplate* documents : Templates()) {
+        if (documents->MatchesExtension(path))
+            return documents;
+    }
+    return nullptr;
+}
+
+CKsDoc* CPlugins::FindDocument(const QString& path) const
+{
+    const CMultiDocTemplate* documents = TemplateFor(path);
+    return documents ? documents->FindDocument(path) : nullptr;
+}
+
+const CPlugin* CPlugins::Of(const CMultiDocTemplate* documents) const
+{
+    for (const auto& plugin : m_plugins) {
+        for (const auto& each : plugin->templates) {
+            if (each.get() == documents)
+                return plugin.get();
+        }
+    }
+    return nullptr;
 }

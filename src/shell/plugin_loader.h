@@ -33,5 +33,26 @@ struct CPlugin
 
 /// Loads one library and asks it for its templates. What goes wrong is told in `error`.
 std::unique_ptr<CPlugin> LoadPlugin(const QString& file);
-/// Loads every library of a folder, in the order of their names. A folder that is not there holds none.
-std::vector<std::unique_ptr<CPlugin>> LoadPlugins(const QString& folder);
+
+/// The editors.
+class CPlugins
+{
+public:
+    /// Loads every library of a folder, in the order of their names; a folder that is not there holds none. Answers the
+    /// templates that came in.
+    std::vector<CMultiDocTemplate*> Load(const QString& folder);
+    /// Closes what their templates hold; the libraries stay.
+    void Clear();
+    /// Those that cannot be used, too.
+    const std::vector<std::unique_ptr<CPlugin>>& All() const { return m_plugins; }
+    std::vector<CMultiDocTemplate*> Templates() const;
+    /// The one that reads files of this name; null for none.
+    CMultiDocTemplate* TemplateFor(const QString& path) const;
+    /// The open document of a file; null for none.
+    CKsDoc* FindDocument(const QString& path) const;
+    /// The editor that a template came from; null for none.
+    const CPlugin* Of(const CMultiDocTemplate* documents) const;
+
+private:
+    std::vector<std::unique_ptr<CPlugin>> m_plugins;
+};

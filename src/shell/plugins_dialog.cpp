@@ -8,7 +8,7 @@
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
-CPluginsDialog::CPluginsDialog(const std::vector<std::unique_ptr<CPlugin>>& plugins, QWidget* parent) : QDialog(parent)
+CPluginsDialog::CPluginsDialog(const CPlugins& plugins, QWidget* parent) : QDialog(parent)
 {
     setObjectName(QStringLiteral("pluginsDialog"));
     setWindowTitle(tr("Plug-ins"));
@@ -16,7 +16,7 @@ CPluginsDialog::CPluginsDialog(const std::vector<std::unique_ptr<CPlugin>>& plug
     list->setRootIsDecorated(false);
     list->setWordWrap(true);
     list->setHeaderLabels({tr("Editor"), tr("File"), tr("State")});
-    for (const auto& plugin : plugins) {
+    for (const auto& plugin : plugins.All()) {
         auto* item = new QTreeWidgetItem(list, {plugin->name, QFileInfo(plugin->file).fileName(),
                                                 plugin->IsUsable() ? tr("In use") : plugin->error});
         item->setToolTip(1, plugin->file);

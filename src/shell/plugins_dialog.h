@@ -2,14 +2,12 @@
 #pragma once
 
 #include <QDialog>
-#include <memory>
-#include <vector>
 
-struct CPlugin;
+class CPlugins;
 
 class CPluginsDialog : public QDialog
 {
     Q_OBJECT
 public:
-    explicit CPluginsDialog(const std::vector<std::unique_ptr<CPlugin>>& plugins, QWidget* parent = nullptr);
+    explicit CPluginsDialog(const CPlugins& plugins, QWidget* parent = nullptr);
 };

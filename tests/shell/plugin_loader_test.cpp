@@ -21,8 +21,8 @@ const CPlugin* Named(const std::vector<std::unique_ptr<CPlugin>>& plugins, const
 
 TEST_F(ShellTest, WhatIsNoEditorIsNamedAndTheOthersWork)
 {
-    const CPlugin* good = Named(frame->Plugins(), "test_editor");
-    const CPlugin* broken = Named(frame->Plugins(), "broken_editor");
+    const CPlugin* good = Named(frame->Plugins().All(), "test_editor");
+    const CPlugin* broken = Named(frame->Plugins().All(), "broken_editor");
     ASSERT_TRUE(good && broken);
     EXPECT_TRUE(good->IsUsable());
     EXPECT_EQ(good->name, "Test Editor");
@@ -48,13 +48,15 @@ TEST_F(ShellTest, AFolderMayHoldAnything)
     Write("text.dll", "no library by its content");
     Write("text.dylib", "no library by its content");
     QFile::copy(TEST_EDITORS "/test_editor.so", Path("zz_editor.so"));
-    const auto plugins = LoadPlugins(folder.path());
+    CPlugins loaded;
+    EXPECT_EQ(loaded.Load(folder.path()).size(), 1u);
+    const auto& plugins = loaded.All();
     ASSERT_GE(plugins.size(), 2u);
     EXPECT_FALSE(Named(plugins, "text")->IsUsable());
     EXPECT_FALSE(Named(plugins, "text")->error.isEmpty());
     EXPECT_TRUE(Named(plugins, "zz_editor")->IsUsable()) << "the one before it did no harm";
     EXPECT_FALSE(Named(plugins, "readme"));
-    EXPECT_TRUE(LoadPlugins(Path("nowhere")).empty());
+    EXPECT_TRUE(loaded.Load(Path("nowhere")).empty());
 }
 
 TEST_F(ShellTest, AShellWithoutEditorsSaysSo)

@@ -51,9 +51,9 @@ TEST_F(ShellTest, AtTheStartTheFirstFileIsThereAtOnceAndTheOthersFollow)
     EXPECT_EQ(asked.size(), 1) << "gone.tst";
     EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::SubWindowView);
 
-    EXPECT_TRUE(frame->CloseProject(ProjectOf("a.tst")));
+    EXPECT_TRUE(frame->Projects().Close(ProjectOf("a.tst")));
     EXPECT_TRUE(frame->OpenFile(path, true));
-    EXPECT_TRUE(frame->CloseProject(ProjectOf("a.tst")));
+    EXPECT_TRUE(frame->Projects().Close(ProjectOf("a.tst")));
     QTest::qWait(600);
     EXPECT_EQ(opened(), "") << "the others do not open in a project that was closed";
 }
@@ -111,7 +111,7 @@ TEST_F(ShellTest, AClosedViewLeavesAndTheOthersHearOfIt)
     Activate("b.tst");
     Action("actionClose")->trigger();
     Settle();
-    EXPECT_EQ(frame->Projects().Find(handle)->views.size(), 1u);
+    EXPECT_EQ(frame->Projects().Registry().Find(handle)->views.size(), 1u);
     EXPECT_THAT(TakeLog(ViewOf("a.tst")), ElementsAre(QString("between 522 %1").arg(handle)));
     frame->OpenFile(Path("b.tst"));
     EXPECT_EQ(ProjectOf("b.tst"), handle) << "it joins again";
@@ -145,14 +145,14 @@ TEST_F(ShellTest, ClosingAProjectClosesItsWindowsOnly)
     EXPECT_THAT(TakeLog(ViewOf("alone.tst")), ElementsAre(QString("project 1 %1").arg(handle)));
     ViewOf("b.tst")->GetDocument()->SetModifiedFlag();
     answers << QMessageBox::Cancel;
-    EXPECT_FALSE(frame->CloseProject(handle));
-    EXPECT_TRUE(frame->Projects().Find(handle));
+    EXPECT_FALSE(frame->Projects().Close(handle));
+    EXPECT_TRUE(frame->Projects().Registry().Find(handle));
     answers << QMessageBox::Discard;
-    EXPECT_TRUE(frame->CloseProject(handle));
+    EXPECT_TRUE(frame->Projects().Close(handle));
     Settle();
     EXPECT_EQ(Texts().Documents().size(), 1u);
     EXPECT_THAT(TakeLog(ViewOf("alone.tst")), ElementsAre(QString("project 3 %1").arg(handle)));
-    EXPECT_FALSE(frame->CloseProject(handle)) << "a handle is used once";
+    EXPECT_FALSE(frame->Projects().Close(handle)) << "a handle is used once";
     EXPECT_FALSE(Action("actionCloseProject")->isEnabled());
 }
 
@@ -174,7 +174,7 @@ TEST_F(ShellTest, WhatIsWrongWithAProjectIsSaid)
         EXPECT_FALSE(frame->OpenFile(c.path));
         EXPECT_TRUE(asked.takeLast().contains(c.says)) << c.says;
     }
-    EXPECT_TRUE(frame->Projects().All().empty());
+    EXPECT_TRUE(frame->Projects().Registry().All().empty());
 
     Write("there.tst");
     EXPECT_TRUE(
@@ -230,7 +230,7 @@ TEST_F(ShellTest, ATreeShowsTheProjectsFiles)
     EXPECT_EQ(shown(), "a.tst open, b.tst open, gone.tst (missing), p.kvrp (no editor)");
     Action("actionProjectTree")->trigger();
     EXPECT_FALSE(dock->isVisible());
-    EXPECT_TRUE(frame->CloseProject(frame->Projects().All().front()->handle));
+    EXPECT_TRUE(frame->Projects().Close(frame->Projects().Registry().All().front()->handle));
     EXPECT_EQ(tree->topLevelItemCount(), 0);
 }
 
@@ -245,7 +245,7 @@ TEST_F(ShellTest, AMemberIsFoundInWhateverCaseItWasSaved)
     EXPECT_TRUE(frame->OpenFile(Path("A.tst")));
     EXPECT_EQ(Texts().Documents().size(), 1u) << "it is open already";
     EXPECT_TRUE(frame->OpenFile(Path("P.KVRP")));
-    EXPECT_EQ(frame->Projects().All().size(), 1u) << "so is the project";
+    EXPECT_EQ(frame->Projects().Registry().All().size(), 1u) << "so is the project";
 }
 
 TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
@@ -264,8 +264,8 @@ TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
     Settle();
     EXPECT_EQ(asked.size(), 2);
     EXPECT_EQ(Texts().Documents().size(), 3u);
-    ASSERT_TRUE(frame->Projects().Find(handle));
-    EXPECT_EQ(frame->Projects().Find(handle)->views.size(), 3u);
+    ASSERT_TRUE(frame->Projects().Registry().Find(handle));
+    EXPECT_EQ(frame->Projects().Registry().Find(handle)->views.size(), 3u);
     EXPECT_EQ(frame->GetActiveView(), front);
     for (const char* name : {"a.tst", "b.tst", "c.tst"})
         EXPECT_THAT(TakeLog(ViewOf(name)), ElementsAre()) << name;
@@ -277,7 +277,7 @@ TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
     Settle();
     EXPECT_EQ(asked.size(), 2) << "each question once";
     EXPECT_TRUE(Texts().Documents().empty());
-    EXPECT_TRUE(frame->Projects().All().empty());
+    EXPECT_TRUE(frame->Projects().Registry().All().empty());
 }
 
 TEST_F(ShellTest, AFileOfTwoProjectsBelongsToOneAndTheUserIsTold)
@@ -310,7 +310,7 @@ TEST_F(ShellTest, AFileOfTwoProjectsBelongsToOneAndTheUserIsTold)
         EXPECT_EQ(ProjectOf("both.tst"), project);
         EXPECT_TRUE(shown(1 - from, 0).endsWith(from == 0 ? "(in one)" : "(in two)"));
     }
-    EXPECT_TRUE(frame->CloseProject(one));
+    EXPECT_TRUE(frame->Projects().Close(one));
     Settle();
     EXPECT_TRUE(ViewOf("b.tst"));
     EXPECT_FALSE(ViewOf("both.tst"));

@@ -62,14 +62,7 @@ protected:
     {
         return Write(name, "[KVR_PROJECT]\n[Members]\n" + members + "[/Members]\n[/KVR_PROJECT]\n");
     }
-    CMultiDocTemplate& Texts() const
-    {
-        for (const auto& plugin : frame->Plugins()) {
-            if (plugin->IsUsable())
-                return *plugin->templates.at(0);
-        }
-        throw std::runtime_error("the test editor was not loaded");
-    }
+    CMultiDocTemplate& Texts() const { return *frame->Plugins().Templates().at(0); }
     CView* ViewOf(const QString& name) const
     {
         const CKsDoc* document = Texts().FindDocument(Path(name));

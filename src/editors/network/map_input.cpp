@@ -1,4 +1,5 @@
-// The map's keys and mouse.
+#include "editors/network/map_input.h"
+
 #include "editors/network/network_map.h"
 
 #include <QApplication>
@@ -9,119 +10,117 @@
 #include <cmath>
 
 namespace {
+
 constexpr int PanStep = 60, PanPage = 400; // pixels of the user
 constexpr double ZoomStep = 1.4;
-} // namespace
 
 /// What a key does, whatever the modifiers.
-struct CNetworkMap::Key
+struct MapKey
 {
     int key;
     void (*run)(CNetworkMap& map);
 };
 
-const std::vector<CNetworkMap::Key>& CNetworkMap::Keys()
+// clang-format off
+constexpr MapKey Keys[] = {
+    {Qt::Key_Left, [](CNetworkMap& map) { map.Pan({PanStep, 0}); }},
+    {Qt::Key_Right, [](CNetworkMap& map) { map.Pan({-PanStep, 0}); }},
+    {Qt::Key_Up, [](CNetworkMap& map) { map.Pan({0, PanStep}); }},
+    {Qt::Key_Down, [](CNetworkMap& map) { map.Pan({0, -PanStep}); }},
+    {Qt::Key_PageUp, [](CNetworkMap& map) { map.Pan({0, PanPage}); }},
+    {Qt::Key_PageDown, [](CNetworkMap& map) { map.Pan({0, -PanPage}); }},
+    {Qt::Key_Plus, [](CNetworkMap& map) { map.Zoom(ZoomStep); }},
+    {Qt::Key_Equal, [](CNetworkMap& map) { map.Zoom(ZoomStep); }}, // plus without Shift
+    {Qt::Key_Minus, [](CNetworkMap& map) { map.Zoom(1 / ZoomStep); }},
+    {Qt::Key_Home, [](CNetworkMap& map) { map.FitAll(); }},
+    {Qt::Key_Space, [](CNetworkMap& map) { map.PickMiddle(); }},
+    {Qt::Key_N, [](CNetworkMap& map) { map.StepLocation(1); }},
+    {Qt::Key_P, [](CNetworkMap& map) { map.StepLocation(-1); }},
+    {Qt::Key_Escape, [](CNetworkMap& map) { map.Unmark(); }},
+    {Qt::Key_Delete, [](CNetworkMap& map) { emit map.DeleteRequested(); }},
+};
+// clang-format on
+
+} // namespace
+
+CMapInput::CMapInput(CNetworkMap& map) : QObject(&map), m_map(map)
 {
-    static const std::vector<Key> keys{
-        {Qt::Key_Left,
-         [](CNetworkMap& map) {
-             map.Pan({PanStep, 0});
-         }},
-        {Qt::Key_Right,
-         [](CNetworkMap& map) {
-             map.Pan({-PanStep, 0});
-         }},
-        {Qt::Key_Up,
-         [](CNetworkMap& map) {
-             map.Pan({0, PanStep});
-         }},
-        {Qt::Key_Down,
-         [](CNetworkMap& map) {
-             map.Pan({0, -PanStep});
-         }},
-        {Qt::Key_PageUp,
-         [](CNetworkMap& map) {
-             map.Pan({0, PanPage});
-         }},
-        {Qt::Key_PageDown,
-         [](CNetworkMap& map) {
-             map.Pan({0, -PanPage});
-         }},
-        {Qt::Key_Plus, [](CNetworkMap& map) { map.Zoom(ZoomStep); }},
-        {Qt::Key_Equal, [](CNetworkMap& map) { map.Zoom(ZoomStep); }}, // plus without Shift
-        {Qt::Key_Minus, [](CNetworkMap& map) { map.Zoom(1 / ZoomStep); }},
-        {Qt::Key_Home, [](CNetworkMap& map) { map.FitAll(); }},
-        {Qt::Key_Space, [](CNetworkMap& map) { map.PickMiddle(); }},
-        {Qt::Key_N, [](CNetworkMap& map) { map.StepLocation(1); }},
-        {Qt::Key_P, [](CNetworkMap& map) { map.StepLocation(-1); }},
-        {Qt::Key_Escape, [](CNetworkMap& map) { map.Unmark(); }},
-        {Qt::Key_Delete, [](CNetworkMap& map) { emit map.DeleteRequested(); }},
-    };
-    return keys;
+    map.installEventFilter(this);
 }
 
-void CNetworkMap::keyPressEvent(QKeyEvent* event)
+bool CMapInput::eventFilter(QObject*, QEvent* event)
+{
+    switch (event->type()) {
+    case QEvent::KeyPress:
+        return Key(*static_cast<QKeyEvent*>(event));
+    case QEvent::MouseButtonPress:
+        Press(*static_cast<QMouseEvent*>(event));
+        return true;
+    case QEvent::MouseMove:
+        Move(*static_cast<QMouseEvent*>(event));
+        return true;
+    case QEvent::MouseButtonRelease:
+        Release(*static_cast<QMouseEvent*>(event));
+        return true;
+    case QEvent::MouseButtonDblClick:
+        if (const auto* click = static_cast<QMouseEvent*>(event); click->button() == Qt::LeftButton)
+            m_map.ZoomAt(click->position(), ZoomStep * ZoomStep);
+        return true;
+    case QEvent::Wheel: {
+        constexpr double notch = 120; // as QWheelEvent counts
+        const auto* wheel = static_cast<QWheelEvent*>(event);
+        if (wheel->angleDelta().y() != 0)
+            m_map.ZoomAt(wheel->position(), std::pow(ZoomStep, wheel->angleDelta().y() / notch));
+        event->accept();
+        return true;
+    }
+    case QEvent::ContextMenu: {
+        const auto* menu = static_cast<QContextMenuEvent*>(event);
+        m_map.OpenMenu(menu->reason() == QContextMenuEvent::Mouse ? std::optional(menu->pos()) : std::nullopt);
+        return true;
+    }
+    default:
+        return false;
+    }
+}
+
+bool CMapInput::Key(const QKeyEvent& event)
 {
     constexpr auto commands = Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier;
-    for (const Key& key : Keys()) {
-        if (key.key == event->key() && !(event->modifiers() & commands)) {
-            key.run(*this);
-            return;
+    for (const MapKey& key : Keys) {
+        if (key.key == event.key() && !(event.modifiers() & commands)) {
+            key.run(m_map);
+            return true;
         }
     }
-    QWidget::keyPressEvent(event);
+    return false;
 }
 
-void CNetworkMap::mousePressEvent(QMouseEvent* event)
+void CMapInput::Press(const QMouseEvent& event)
 {
-    if (event->button() != Qt::LeftButton && event->button() != Qt::MiddleButton)
+    if (event.button() != Qt::LeftButton && event.button() != Qt::MiddleButton)
         return;
-    m_pressed = m_dragged = event->position().toPoint();
+    m_pressed = m_dragged = event.position().toPoint();
     m_pressing = true;
     m_dragging = false;
 }
 
-void CNetworkMap::mouseMoveEvent(QMouseEvent* event)
+void CMapInput::Move(const QMouseEvent& event)
 {
-    const QPoint at = event->position().toPoint();
+    const QPoint at = event.position().toPoint();
     if (m_pressing && !m_dragging && (at - m_pressed).manhattanLength() >= QApplication::startDragDistance()) {
         m_dragging = true;
-        setCursor(Qt::ClosedHandCursor);
+        m_map.setCursor(Qt::ClosedHandCursor);
     }
     if (m_dragging)
-        Pan(at - std::exchange(m_dragged, at));
+        m_map.Pan(at - std::exchange(m_dragged, at));
 }
 
-void CNetworkMap::mouseReleaseEvent(QMouseEvent* event)
+void CMapInput::Release(const QMouseEvent& event)
 {
     if (!std::exchange(m_pressing, false))
         return;
-    unsetCursor();
-    if (!std::exchange(m_dragging, false) && event->button() == Qt::LeftButton)
-        PickAt(event->position());
-}
-
-void CNetworkMap::mouseDoubleClickEvent(QMouseEvent* event)
-{
-    if (event->button() == Qt::LeftButton)
-        ZoomAt(event->position(), ZoomStep * ZoomStep);
-}
-
-void CNetworkMap::wheelEvent(QWheelEvent* event)
-{
-    constexpr double notch = 120; // as QWheelEvent counts
-    if (event->angleDelta().y() != 0)
-        ZoomAt(event->position(), std::pow(ZoomStep, event->angleDelta().y() / notch));
-    event->accept();
-}
-
-void CNetworkMap::contextMenuEvent(QContextMenuEvent* event)
-{
-    if (event->reason() == QContextMenuEvent::Mouse) {
-        PickAt(event->pos());
-        emit MenuRequested(event->globalPos());
-        return;
-    }
-    const auto picked = Picked() ? WindowPoint(*Picked()) : std::nullopt;
-    emit MenuRequested(mapToGlobal(picked ? picked->toPoint() : rect().center()));
+    m_map.unsetCursor();
+    if (!std::exchange(m_dragging, false) && event.button() == Qt::LeftButton)
+        m_map.PickAt(event.position());
 }

@@ -238,3 +238,24 @@ CMapScene::Label CMapScene::LabelAt(std::size_t branch, double distance, double 
     return {branch, center, std::atan2(along.y(), along.x()) * 180 / std::numbers::pi,
             QRectF(center.x() - width / 2, center.y() - height / 2, width, height)};
 }
+
+const CMapScene::Symbol* CMapScene::SymbolAt(const QPointF& plane) const
+{
+    const Symbol* best = nullptr;
+    double nearest = (SymbolSize / 2 + 1) * m_ratio;
+    for (const Symbol& symbol : m_symbols) {
+        const double distance = std::hypot(symbol.at.x() - plane.x(), symbol.at.y() - plane.y());
+        if (distance <= nearest) {
+            nearest = distance;
+            best = &symbol;
+        }
+    }
+    return best;
+}
+
+const CMapScene::Symbol* CMapScene::SymbolOf(std::size_t location) const
+{
+    const auto found = std::find_if(m_symbols.begin(), m_symbols.end(),
+                                    [location](const Symbol& symbol) { return symbol.location == location; });
+    return found == m_symbols.end() ? nullptr : &*found;
+}

@@ -55,6 +55,11 @@ public:
     const std::vector<Arrow>& Arrows() const { return m_arrows; }
     const std::vector<Label>& Labels() const { return m_labels; }
     const std::vector<Symbol>& Symbols() const { return m_symbols; }
+    /// The symbol that is drawn at a place of the plane, of several the one nearest and, of equals, drawn last; null
+    /// for none.
+    const Symbol* SymbolAt(const QPointF& plane) const;
+    /// The symbol of a location; null for one that is not on the map.
+    const Symbol* SymbolOf(std::size_t location) const;
     const QPainterPath& Text(std::size_t branch) const { return m_texts[branch]; }
     bool HasLeaders() const { return m_leaders; }
     bool HasCasings() const { return m_casings; }

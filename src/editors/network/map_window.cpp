@@ -1,4 +1,4 @@
-// How the map's window is painted: what moved is kept, and only the rest is drawn.
+// How the map's window is painted.
 #include "editors/network/map_overlay.h"
 #include "editors/network/network_map.h"
 
@@ -14,53 +14,32 @@ QString CNetworkMap::LocationText(const CMapLocation& location) const
 
 CLegend CNetworkMap::Legend() const
 {
-    CLegend legend{.elsewhere = static_cast<int>(m_locations.size() - m_placed.size())};
-    for (const CPlacedLocation& each : m_placed)
+    CLegend legend{.elsewhere = static_cast<int>(Locations().size() - PlacedCount())};
+    for (const CPlacedLocation& each : m_marks.Placed())
         ++legend.counts.at(static_cast<std::size_t>(each.kind));
     return legend;
 }
 
-/// Moves what is painted already, and paints the rest.
-void CNetworkMap::UpdateBuffer()
+/// The pixels of another screen are others.
+void CNetworkMap::ScreenChanged()
 {
-    const QSize pixels = (QSizeF(size()) * devicePixelRatioF()).toSize();
-    if (m_buffer.size() != pixels) {
-        m_buffer = QPixmap(pixels);
-        m_bufferValid = false;
-    }
-    m_buffer.setDevicePixelRatio(1);
-    const QPoint moved = m_projection.offset - m_bufferOffset;
-    QRegion missing(m_buffer.rect());
-    if (m_bufferValid && m_buffer.rect().translated(moved).intersects(m_buffer.rect())) {
-        missing = QRegion();
-        if (!moved.isNull())
-            m_buffer.scroll(moved.x(), moved.y(), m_buffer.rect(), &missing);
-    }
-    if (!missing.isEmpty()) {
-        const CMapStyle style(palette());
-        const CMapPainter map(Scene(), style, m_currentBranch, m_labelPictures);
-        QPainter painter(&m_buffer);
-        for (const QRect& part : missing)
-            map.Paint(painter, part, m_projection.offset);
-    }
-    m_bufferOffset = m_projection.offset;
-    m_bufferValid = true;
-    m_buffer.setDevicePixelRatio(devicePixelRatioF());
+    const double change = devicePixelRatioF() / m_scene->Ratio();
+    m_projection.scale *= change;
+    m_projection.offset = (QPointF(m_projection.offset) * change).toPoint();
+    m_names.clear();
+    SceneChanged();
 }
 
 void CNetworkMap::paintEvent(QPaintEvent*)
 {
-    if (m_scene && m_scene->Ratio() != devicePixelRatioF()) { // on another screen now
-        m_projection.scale *= devicePixelRatioF() / m_scene->Ratio();
-        m_projection.offset = (QPointF(m_projection.offset) * devicePixelRatioF() / m_scene->Ratio()).toPoint();
-        SceneChanged();
-        m_names.clear(); // of the other screen's pixels
-    }
-    UpdateBuffer();
-    QPainter painter(this);
-    painter.drawPixmap(0, 0, m_buffer);
-    painter.setRenderHint(QPainter::Antialiasing);
+    if (m_scene && m_scene->Ratio() != devicePixelRatioF())
+        ScreenChanged();
     const CMapStyle style(palette());
+    QPainter painter(this);
+    painter.drawPixmap(0, 0,
+                       m_buffer.Paint(Scene(), style, m_currentBranch, (QSizeF(size()) * devicePixelRatioF()).toSize(),
+                                      m_projection.offset));
+    painter.setRenderHint(QPainter::Antialiasing);
     PaintMarks(painter, style);
     PaintScaleBar(painter, style, rect(), m_projection.scale / devicePixelRatioF());
     PaintLegend(painter, style, rect(), Legend());
@@ -72,29 +51,28 @@ void CNetworkMap::paintEvent(QPaintEvent*)
 
 void CNetworkMap::PaintMarks(QPainter& painter, const CMapStyle& style) const
 {
-    if (m_shown) {
-        if (const auto at = WindowPoint(*m_shown))
-            PaintShown(painter, style, *at);
-    }
-    const auto symbol = Selected() ? SymbolPoint(static_cast<std::size_t>(m_selected)) : std::nullopt;
+    const auto shown = m_marks.Shown() ? WindowPoint(*m_marks.Shown()) : std::nullopt;
+    const auto symbol = m_marks.Selected() ? SymbolPoint(*m_marks.Selected()) : std::nullopt;
     const auto picked = Picked();
+    const auto text = [](const Place& place) { return PlaceText(place.branch, place.chainage); };
+    if (shown)
+        PaintShown(painter, style, *shown);
     if (symbol)
         PaintSelected(painter, style, *symbol);
     if (picked && symbol)
-        PaintPlaceLabel(painter, style, rect(), *symbol, PlaceText(picked->branch, picked->chainage));
+        PaintPlaceLabel(painter, style, rect(), *symbol, text(*picked));
     else if (picked)
-        PaintPicked(painter, style, rect(), *WindowPoint(*picked), PlaceText(picked->branch, picked->chainage));
-    else if (m_shown && WindowPoint(*m_shown))
-        PaintPlaceLabel(painter, style, rect(), *WindowPoint(*m_shown), PlaceText(m_shown->branch, m_shown->chainage));
+        PaintPicked(painter, style, rect(), *WindowPoint(*picked), text(*picked));
+    else if (shown)
+        PaintPlaceLabel(painter, style, rect(), *shown, text(*m_marks.Shown()));
 }
 
 bool CNetworkMap::event(QEvent* event)
 {
     if (event->type() == QEvent::ToolTip) {
         const auto* help = static_cast<QHelpEvent*>(event);
-        const int location = LocationAt(help->pos());
-        if (location >= 0)
-            QToolTip::showText(help->globalPos(), LocationText(m_locations[std::size_t(location)]), this);
+        if (const auto location = LocationAt(help->pos()))
+            QToolTip::showText(help->globalPos(), LocationText(Locations()[*location]), this);
         else
             QToolTip::hideText();
         return true;

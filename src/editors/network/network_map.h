@@ -2,13 +2,13 @@
 // locations selected on it.
 #pragma once
 
-#include "editors/network/map_painter.h"
+#include "editors/network/map_buffer.h"
+#include "editors/network/map_selection.h"
 
-#include <QPixmap>
 #include <QWidget>
-#include <optional>
 
 struct CLegend;
+struct CMapWindow;
 
 class CNetworkMap : public QWidget
 {
@@ -21,34 +21,37 @@ public:
     explicit CNetworkMap(const CNetworkDoc& document, QWidget* parent = nullptr);
     ~CNetworkMap() override;
 
-    void SetLocations(std::vector<CMapLocation> locations);
-    const std::vector<CMapLocation>& Locations() const { return m_locations; }
+    using Place = CMapPlace;
+    void SetLocations(std::vector<CMapLocation> locations) { m_marks.SetLocations(std::move(locations)); }
+    const std::vector<CMapLocation>& Locations() const { return m_marks.Locations(); }
     /// How many of them are at a place of the network.
-    std::size_t PlacedCount() const { return m_placed.size(); }
-
-    /// A place on a branch, by name.
-    struct Place
-    {
-        QString branch;
-        double chainage = 0; // metres
-        bool operator==(const Place&) const = default;
-    };
+    std::size_t PlacedCount() const { return m_marks.Placed().size(); }
     /// What the user picked, while it is in the network.
-    std::optional<Place> Picked() const;
-    void SetPicked(std::optional<Place> place);
+    std::optional<Place> Picked() const { return m_marks.Picked(); }
+    void SetPicked(std::optional<Place> place) { m_marks.Pick(std::move(place)); }
     /// The location that is selected; null for none. Valid until the locations change.
     const CMapLocation* Selected() const;
-    /// "BRANCH 1234.5" of the location selected, else of the place picked, else of the place shown; in metres.
-    QString MarkedText() const;
+    /// See CMapSelection::Text.
+    QString MarkedText() const { return m_marks.Text(); }
     /// Marks a place and brings it into sight.
     void ShowPlace(const Place& place);
     void SetCurrentBranch(int branch);
 
     void FitAll();
     /// Around the middle of the window.
-    void Zoom(double factor);
+    void Zoom(double factor) { ZoomAt(QRectF(rect()).center(), factor); }
+    void ZoomAt(const QPointF& window, double factor);
     /// By pixels of the user: what is shown moves right and down.
     void Pan(const QPoint& distance);
+    /// Picks the place, or selects the location, at a position of the window; far from all of them, nothing.
+    void PickAt(const QPointF& window);
+    /// Without a mouse: the place that is nearest to the middle of the window.
+    void PickMiddle();
+    /// To the next location along the branches, or back.
+    void StepLocation(int step);
+    void Unmark();
+    /// Opens the menu for what is at a position of the window, or, without one, for what is marked.
+    void OpenMenu(const std::optional<QPoint>& at);
     /// In window coordinates; none for a place that is nowhere.
     std::optional<QPointF> WindowPoint(const Place& place) const;
     /// Where a location's symbol is; none when it is not on the map.
@@ -58,7 +61,6 @@ public:
 
 signals:
     void PickedChanged();
-    void SelectionChanged();
     void DeleteRequested();
     /// The menu for what is picked or selected, at a global position.
     void MenuRequested(const QPoint& position);
@@ -67,54 +69,27 @@ protected:
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void changeEvent(QEvent* event) override;
-    void keyPressEvent(QKeyEvent* event) override;
-    void mousePressEvent(QMouseEvent* event) override;
-    void mouseMoveEvent(QMouseEvent* event) override;
-    void mouseReleaseEvent(QMouseEvent* event) override;
-    void mouseDoubleClickEvent(QMouseEvent* event) override;
-    void wheelEvent(QWheelEvent* event) override;
-    void contextMenuEvent(QContextMenuEvent* event) override;
     bool event(QEvent* event) override;
 
 private:
-    static constexpr int LabelMemory = 32 << 20; // bytes
-    struct Key;
-    static const std::vector<Key>& Keys();
     void NetworkChanged();
-    void PlaceAll();
     void SceneChanged();
+    void ScreenChanged();
     const CMapScene& Scene() const;
-    QRectF FullExtent() const;
-    void ZoomAt(const QPointF& window, double factor);
-    void UpdateBuffer();
-    void PickAt(const QPointF& window);
-    void PickMiddle();
-    void StepLocation(int step);
-    void SelectLocation(int location);
-    void Unmark();
-    int LocationAt(const QPointF& window) const;
+    CMapWindow Window() const;
+    std::optional<std::size_t> LocationAt(const QPointF& window) const;
+    std::optional<Place> Nearest(const QPointF& window, double reach) const;
     CLegend Legend() const;
-    void FitInto(const QRectF& part);
-    bool IsUnder(const QRectF& box) const;
     QString LocationText(const CMapLocation& location) const;
     void PaintMarks(QPainter& painter, const CMapStyle& style) const;
-    void KeepInSight(const QPointF& window);
+    void KeepInSight(const std::optional<QPointF>& window);
 
     const CNetworkDoc& m_document;
-    std::vector<CMapLocation> m_locations;
-    std::vector<CPlacedLocation> m_placed;
+    CMapSelection m_marks;
     CMapProjection m_projection;
-    bool m_fitted = false;                      // keep all in sight while the window is resized
+    bool m_fitted = true;                       // keep all in sight while the window is resized
     mutable std::vector<QPainterPath> m_names;  // of the branches; empty when something changed
     mutable std::unique_ptr<CMapScene> m_scene; // of the present scale; null when something changed
-
-    QPixmap m_buffer; // the window without marks
-    QPoint m_bufferOffset;
-    CMapPainter::LabelPictures m_labelPictures{LabelMemory}; // of the present scene
-    bool m_bufferValid = false;
-
-    std::optional<Place> m_picked, m_shown;
-    int m_selected = -1, m_currentBranch = -1;
-    QPoint m_pressed, m_dragged;
-    bool m_pressing = false, m_dragging = false;
+    CMapBuffer m_buffer;
+    int m_currentBranch = -1;
 };

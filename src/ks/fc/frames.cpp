@@ -8,6 +8,8 @@
 #include <QMenu>
 #include <QMenuBar>
 #include <QPainter>
+#include <QStatusBar>
+#include <QStatusTipEvent>
 #include <QStyle>
 #include <set>
 #include <utility>
@@ -183,6 +185,11 @@ void CKsMDIFrameWnd::ShowWindow(CKsMDIChildWnd* window)
     m_area->setActiveSubWindow(window);
 }
 
+CKsDoc* CKsMDIFrameWnd::ActiveDocument() const
+{
+    return m_activeView ? m_activeView->GetDocument() : nullptr;
+}
+
 bool CKsMDIFrameWnd::CloseAllWindows()
 {
     return CloseWindows(m_area->subWindowList());
@@ -227,6 +234,22 @@ bool CKsMDIFrameWnd::eventFilter(QObject* object, QEvent* event)
             return true;
     }
     return QMainWindow::eventFilter(object, event);
+}
+
+void CKsMDIFrameWnd::TellStatus(const CString& text)
+{
+    m_told = text;
+    statusBar()->showMessage(text);
+}
+
+/// A tip that ends comes as an empty one, which would take away what had been told - by the command just chosen, too.
+bool CKsMDIFrameWnd::event(QEvent* event)
+{
+    if (event->type() != QEvent::StatusTip)
+        return QMainWindow::event(event);
+    const CString tip = static_cast<QStatusTipEvent*>(event)->tip();
+    statusBar()->showMessage(tip.isEmpty() ? m_told : tip);
+    return true;
 }
 
 bool CKsMDIFrameWnd::SendCommand(int id)

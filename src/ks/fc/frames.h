@@ -97,6 +97,7 @@ public:
     CKsMDIArea& MdiArea() const { return *m_area; }
     /// The view of the active window; null when there is none.
     CView* GetActiveView() const { return m_activeView; }
+    CKsDoc* ActiveDocument() const;
     /// Enables or greys the menu at a position of the menu bar, counted from 0.
     void EnableMenuItem(int position, bool enable);
     /// Shows a window of the area for the first time, large enough to work in, and activates it.
@@ -105,10 +106,15 @@ public:
     void PlaceNewWindows(const QRect& place) { m_newPlace = place; }
     /// Asks for every modified document first, then closes all windows; false, and nothing closed, when one was kept.
     bool CloseAllWindows();
+    /// The same for some of them.
+    bool CloseWindows(const QList<QMdiSubWindow*>& windows);
     /// Asks the active view before another window, a dialog or a command takes over; see CView::MayLeave.
     bool MayLeave();
     /// Sends a command to the active view; false when there is none or it cannot do it now.
     bool SendCommand(int id);
+    /// Shows a text in the status bar until another takes its place. The tips of menus and buttons cover it only while
+    /// they are looked at.
+    void TellStatus(const CString& text);
 
 signals:
     /// Which commands can be carried out may have changed: another view or another focus.
@@ -117,11 +123,9 @@ signals:
 protected:
     /// A click outside the active view leaves it, so the view is asked before the click arrives.
     bool eventFilter(QObject* object, QEvent* event) override;
+    bool event(QEvent* event) override;
     /// Another view, or none, became active. Called before the views hear of it.
     virtual void ActiveViewChanged(CView* view);
-    /// Asks for every modified document of these windows first, then closes them; false, and nothing closed, when one
-    /// was kept.
-    bool CloseWindows(const QList<QMdiSubWindow*>& windows);
     void DestroyWindows();
 
 private:
@@ -130,6 +134,7 @@ private:
     CKsMDIArea* m_area;
     QPointer<CView> m_activeView;
     QRect m_newPlace;
+    CString m_told; // in the status bar, also while a tip covers it
 };
 
 /// A button of a tool bar resource; command 0 is a separator.

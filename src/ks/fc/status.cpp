@@ -1,11 +1,9 @@
 #include "ks/fc/status.h"
 
-#include <QCoreApplication>
-#include <QStatusTipEvent>
-#include <QWidget>
+#include "ks/fc/frames.h"
 
 void KsTellStatus(const QWidget& inside, const CString& text)
 {
-    QStatusTipEvent tip(text);
-    QCoreApplication::sendEvent(inside.window(), &tip);
+    if (auto* frame = qobject_cast<CKsMDIFrameWnd*>(inside.window()))
+        frame->TellStatus(text);
 }

@@ -2,6 +2,39 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ja" sourcelanguage="en_US">
 <context>
+    <name>CFileCommands</name>
+    <message>
+        <source>Projects</source>
+        <translation>プロジェクト</translation>
+    </message>
+    <message>
+        <source>%1 could not be opened: no editor reads files of this kind.
+The editors read %2.</source>
+        <translation>%1 を開けません。この種類のファイルを扱うエディタがありません。
+扱える拡張子: %2</translation>
+    </message>
+    <message>
+        <source>New</source>
+        <translation>新規作成</translation>
+    </message>
+    <message>
+        <source>Kind of document:</source>
+        <translation>文書の種類:</translation>
+    </message>
+    <message>
+        <source>All files</source>
+        <translation>すべてのファイル</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>開く</translation>
+    </message>
+    <message>
+        <source>Open Project</source>
+        <translation>プロジェクトを開く</translation>
+    </message>
+</context>
+<context>
     <name>CFrameAction</name>
     <message>
         <source>&amp;New</source>
@@ -237,65 +270,7 @@
     </message>
 </context>
 <context>
-    <name>CMainFrame</name>
-    <message>
-        <source>Not loaded: %1 (see Help, Plug-ins)</source>
-        <translation>読み込めませんでした: %1 (「ヘルプ」の「プラグイン」を参照)</translation>
-    </message>
-    <message>
-        <source>Project: %1</source>
-        <translation>プロジェクト: %1</translation>
-    </message>
-    <message>
-        <source>Projects</source>
-        <translation>プロジェクト</translation>
-    </message>
-    <message>
-        <source>%1: open in the project %2</source>
-        <translation>%1: プロジェクト %2 で開いています</translation>
-    </message>
-    <message>
-        <source>These files of the project %1 are open in another project and stay there:
-%2
-To have one of them in %1, close its window and open it from the list of %1.</source>
-        <translation>プロジェクト %1 の次のファイルは、ほかのプロジェクトで開いているため、そちらに属したままになります。
-%2
-%1 で使うには、そのウィンドウを閉じてから、%1 の一覧で開いてください。</translation>
-    </message>
-    <message>
-        <source>%1 could not be opened: no editor reads files of this kind.
-The editors read %2.</source>
-        <translation>%1 を開けません。この種類のファイルを扱うエディタがありません。
-扱える拡張子: %2</translation>
-    </message>
-    <message>
-        <source>New</source>
-        <translation>新規作成</translation>
-    </message>
-    <message>
-        <source>Kind of document:</source>
-        <translation>文書の種類:</translation>
-    </message>
-    <message>
-        <source>All files</source>
-        <translation>すべてのファイル</translation>
-    </message>
-    <message>
-        <source>Open</source>
-        <translation>開く</translation>
-    </message>
-    <message>
-        <source>Open Project</source>
-        <translation>プロジェクトを開く</translation>
-    </message>
-    <message>
-        <source>&amp;Undo %1</source>
-        <translation>元に戻す(&amp;U) %1</translation>
-    </message>
-    <message>
-        <source>&amp;Redo %1</source>
-        <translation>やり直す(&amp;R) %1</translation>
-    </message>
+    <name>CFrameMenus</name>
     <message>
         <source>&amp;File</source>
         <translation>ファイル(&amp;F)</translation>
@@ -333,48 +308,35 @@ The editors read %2.</source>
         <translation>標準</translation>
     </message>
     <message>
+        <source>&amp;Undo %1</source>
+        <translation>元に戻す(&amp;U) %1</translation>
+    </message>
+    <message>
+        <source>&amp;Redo %1</source>
+        <translation>やり直す(&amp;R) %1</translation>
+    </message>
+    <message>
+        <source>&amp;Clear List</source>
+        <translation>一覧を消去(&amp;C)</translation>
+    </message>
+</context>
+<context>
+    <name>CMainFrame</name>
+    <message>
+        <source>Not loaded: %1 (see Help, Plug-ins)</source>
+        <translation>読み込めませんでした: %1 (「ヘルプ」の「プラグイン」を参照)</translation>
+    </message>
+    <message>
+        <source>Project: %1</source>
+        <translation>プロジェクト: %1</translation>
+    </message>
+    <message>
         <source>No editor was found. See Help, Plug-ins.</source>
         <translation>エディタが見つかりません。「ヘルプ」の「プラグイン」を参照してください。</translation>
     </message>
     <message>
         <source>Open a file with File, Open, or drop it here.</source>
         <translation>「ファイル」の「開く」でファイルを開くか、ここにドロップしてください。</translation>
-    </message>
-    <message>
-        <source>&amp;Clear List</source>
-        <translation>一覧を消去(&amp;C)</translation>
-    </message>
-    <message>
-        <source>About %1</source>
-        <translation>%1 のバージョン情報</translation>
-    </message>
-    <message>
-        <source>%1, version %2
-
-Shell of the river model editors.</source>
-        <translation>%1 バージョン %2
-
-河川モデルエディタのシェルです。</translation>
-    </message>
-    <message>
-        <source>The project could not be opened.
-%1</source>
-        <translation>プロジェクトを開けませんでした。
-%1</translation>
-    </message>
-    <message>
-        <source>These files of the project %1 could not be opened:
-%2</source>
-        <translation>プロジェクト %1 の次のファイルを開けませんでした:
-%2</translation>
-    </message>
-    <message>
-        <source>%1: the file does not exist</source>
-        <translation>%1: ファイルがありません</translation>
-    </message>
-    <message>
-        <source>%1: no editor reads files of this kind</source>
-        <translation>%1: この種類のファイルを扱うエディタがありません</translation>
     </message>
 </context>
 <context>
@@ -398,6 +360,41 @@ Shell of the river model editors.</source>
     <message>
         <source>In use</source>
         <translation>使用中</translation>
+    </message>
+</context>
+<context>
+    <name>CProjectController</name>
+    <message>
+        <source>The project could not be opened.
+%1</source>
+        <translation>プロジェクトを開けませんでした。
+%1</translation>
+    </message>
+    <message>
+        <source>These files of the project %1 could not be opened:
+%2</source>
+        <translation>プロジェクト %1 の次のファイルを開けませんでした:
+%2</translation>
+    </message>
+    <message>
+        <source>%1: open in the project %2</source>
+        <translation>%1: プロジェクト %2 で開いています</translation>
+    </message>
+    <message>
+        <source>These files of the project %1 are open in another project and stay there:
+%2
+To have one of them in %1, close its window and open it from the list of %1.</source>
+        <translation>プロジェクト %1 の次のファイルは、ほかのプロジェクトで開いているため、そちらに属したままになります。
+%2
+%1 で使うには、そのウィンドウを閉じてから、%1 の一覧で開いてください。</translation>
+    </message>
+    <message>
+        <source>%1: the file does not exist</source>
+        <translation>%1: ファイルがありません</translation>
+    </message>
+    <message>
+        <source>%1: no editor reads files of this kind</source>
+        <translation>%1: この種類のファイルを扱うエディタがありません</translation>
     </message>
 </context>
 <context>
@@ -433,6 +430,21 @@ Shell of the river model editors.</source>
     <message>
         <source>%1: open in the project %2</source>
         <translation>%1: プロジェクト %2 で開いています</translation>
+    </message>
+</context>
+<context>
+    <name>HelpCommands</name>
+    <message>
+        <source>About %1</source>
+        <translation>%1 のバージョン情報</translation>
+    </message>
+    <message>
+        <source>%1, version %2
+
+Shell of the river model editors.</source>
+        <translation>%1 バージョン %2
+
+河川モデルエディタのシェルです。</translation>
     </message>
 </context>
 <context>

@@ -1,39 +1,33 @@
-// Projects in the main frame.
+#include "shell/project_controller.h"
+
 #include "ks/fc/after_paint.h"
 #include "ks/fc/file_name.h"
+#include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
-#include "shell/main_frame.h"
-#include "shell/settings_keys.h"
+#include "shell/plugin_loader.h"
+#include "shell/recent_files.h"
+#include "shell/window_manager.h"
 
 #include <QDir>
 #include <QFileInfo>
 #include <QLayout>
-#include <QSettings>
 
 namespace {
-
 constexpr int ProjectTreeWidth = 190; // pixels, until the user pulls it
-
-CKsMDIChildWnd* WindowOf(const QMdiArea& area, const CView* view)
-{
-    const auto windows = area.subWindowList();
-    for (QMdiSubWindow* window : windows) {
-        auto* child = qobject_cast<CKsMDIChildWnd*>(window);
-        if (child && view && child->GetActiveView() == view)
-            return child;
-    }
-    return nullptr;
-}
-
-/// Whether the user chose tabs, which single documents have also when nobody chose.
-bool UsesTabs()
-{
-    return QSettings().value(Settings::Tabs, false).toBool();
-}
-
 } // namespace
 
-bool CMainFrame::OpenProject(const QString& path, bool othersLater)
+CProjectController::CProjectController(CKsMDIFrameWnd& frame, CWindowManager& windows, const CPlugins& plugins,
+                                       CRecentFiles& recent)
+    : m_frame(frame), m_windows(windows), m_plugins(plugins), m_recent(recent), m_tree(new CProjectTree(&frame))
+{
+    frame.addDockWidget(Qt::LeftDockWidgetArea, m_tree);
+    m_tree->hide(); // until there is a project
+    // Queued: what is chosen fills the tree anew, whose items are busy until then.
+    connect(m_tree, &CProjectTree::MemberChosen, this, &CProjectController::ShowMember, Qt::QueuedConnection);
+    connect(m_tree, &CProjectTree::CloseProjectChosen, this, &CProjectController::Close, Qt::QueuedConnection);
+}
+
+bool CProjectController::Open(const QString& path, bool othersLater)
 {
     QString error;
     const CProject* opened = m_projects.Open(path, error);
@@ -44,17 +38,17 @@ bool CMainFrame::OpenProject(const QString& path, bool othersLater)
     const CProject project = *opened; // its views change while the members open
     m_recent.Add(project.path);
     Announce(KsRequest::ProjectOpened, project);
-    m_projectTree->show();
-    resizeDocks({m_projectTree}, {ProjectTreeWidth}, Qt::Horizontal);
-    layout()->activate(); // the tree takes its room first
+    m_tree->show();
+    m_frame.resizeDocks({m_tree}, {ProjectTreeWidth}, Qt::Horizontal);
+    m_frame.layout()->activate(); // the tree takes its room first
     const bool waits = othersLater && project.members.size() > 1;
-    if (waits && !UsesTabs()) {
-        ShowTabs(false);
-        PlaceNewWindows(FirstPlace());
+    if (waits && !CWindowManager::ChoseTabs()) {
+        m_windows.ShowTabs(false);
+        m_windows.PlaceNewWindowsFirst(true);
     }
     const QStringList missing = OpenMembers(project, project.members.mid(0, 1));
-    PlaceNewWindows({});
-    QWidget* first = MdiArea().currentSubWindow();
+    m_windows.PlaceNewWindowsFirst(false);
+    QWidget* first = m_frame.MdiArea().currentSubWindow();
     if (waits && first)
         KsAfterPaint(first, this, [this, project, missing] { OpenOtherMembers(project.handle, missing); });
     else
@@ -63,7 +57,7 @@ bool CMainFrame::OpenProject(const QString& path, bool othersLater)
 }
 
 /// `missing`: what could not be opened before.
-void CMainFrame::OpenOtherMembers(CProjectHandle handle, QStringList missing)
+void CProjectController::OpenOtherMembers(CProjectHandle handle, QStringList missing)
 {
     const CProject* found = m_projects.Find(handle);
     if (!found) // closed in the meantime
@@ -74,16 +68,15 @@ void CMainFrame::OpenOtherMembers(CProjectHandle handle, QStringList missing)
         KsMessageBox(
             tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing.join(u'\n')));
     TellOfSharedMembers(project);
-    if (MdiArea().subWindowList().size() > 1 && !project.members.isEmpty() && !UsesTabs()) {
+    if (m_windows.All().size() > 1 && !project.members.isEmpty() && !CWindowManager::ChoseTabs()) {
         ShowMember(project.handle, project.members.front()); // the first file is the main one
-        PlaceSideBySide();
+        m_windows.PlaceSideBySide();
     }
-    UpdateTitle();
-    UpdateActions();
+    emit Changed();
 }
 
 /// A file hears one project. Those of this one that are open in another stay there, and the user is told.
-void CMainFrame::TellOfSharedMembers(const CProject& project) const
+void CProjectController::TellOfSharedMembers(const CProject& project) const
 {
     QStringList shared;
     for (const QString& member : project.members) {
@@ -97,46 +90,40 @@ void CMainFrame::TellOfSharedMembers(const CProject& project) const
 }
 
 /// The project that an open file has joined; null for none.
-const CProject* CMainFrame::OwnerOf(const QString& member) const
+const CProject* CProjectController::OwnerOf(const QString& member) const
 {
-    const CMultiDocTemplate* documents = TemplateFor(member);
-    const CKsDoc* open = documents ? documents->FindDocument(member) : nullptr;
+    const CKsDoc* open = m_plugins.FindDocument(member);
     return open && !open->Views().empty() ? m_projects.FindByView(open->Views().front()) : nullptr;
 }
 
-CMemberState CMainFrame::StateOf(const CProject& project, const QString& stored) const
+CMemberState CProjectController::StateOf(const CProject& project, const QString& stored) const
 {
     const QString member = KsExistingSpelling(stored);
     CMemberState state;
     if (const CProject* owner = OwnerOf(member); owner && owner->handle != project.handle)
         state.elsewhere = owner->name;
-    for (const auto& plugin : m_plugins) {
-        for (const auto& documents : plugin->templates) {
-            if (!documents->MatchesExtension(member))
-                continue;
-            const CKsDoc* open = documents->FindDocument(member);
-            state.icon = plugin->Icon();
-            state.kind = open ? CMemberState::Open : CMemberState::Closed;
-            state.modified = open && open->IsModified();
-            if (!open && !QFileInfo::exists(member))
-                state.kind = CMemberState::Missing;
-            return state;
-        }
-    }
-    state.kind = QFileInfo::exists(member) ? CMemberState::Unknown : CMemberState::Missing;
+    const CPlugin* plugin = m_plugins.Of(m_plugins.TemplateFor(member));
+    const CKsDoc* open = m_plugins.FindDocument(member);
+    if (plugin)
+        state.icon = plugin->Icon();
+    state.modified = open && open->IsModified();
+    state.kind = open                         ? CMemberState::Open
+                 : !QFileInfo::exists(member) ? CMemberState::Missing
+                 : plugin                     ? CMemberState::Closed
+                                              : CMemberState::Unknown;
     return state;
 }
 
-void CMainFrame::UpdateProjectTree()
+void CProjectController::UpdateTree()
 {
-    m_projectTree->Show(m_projects,
-                        [this](const CProject& project, const QString& member) { return StateOf(project, member); });
+    m_tree->Show(m_projects,
+                 [this](const CProject& project, const QString& member) { return StateOf(project, member); });
     if (m_projects.All().empty())
-        m_projectTree->hide();
+        m_tree->hide();
 }
 
 /// Opens some members; what could not be opened, a line each.
-QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& members)
+QStringList CProjectController::OpenMembers(const CProject& project, const QStringList& members)
 {
     QStringList missing;
     for (const QString& stored : members) {
@@ -144,7 +131,7 @@ QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& 
         const QString name = QDir::toNativeSeparators(member);
         if (!QFileInfo::exists(member))
             missing << tr("%1: the file does not exist").arg(name);
-        else if (!TemplateFor(member))
+        else if (!m_plugins.TemplateFor(member))
             missing << tr("%1: no editor reads files of this kind").arg(name);
         else if (!OpenMember(project, member, false))
             missing << name;
@@ -152,36 +139,35 @@ QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& 
     return missing;
 }
 
-void CMainFrame::ShowMember(CProjectHandle handle, const QString& stored)
+void CProjectController::ShowMember(CProjectHandle handle, const QString& stored)
 {
     const CProject* project = m_projects.Find(handle);
     const QString member = KsExistingSpelling(stored);
-    if (project && TemplateFor(member) && QFileInfo::exists(member))
+    if (project && m_plugins.TemplateFor(member) && QFileInfo::exists(member))
         OpenMember(CProject(*project), member, true);
 }
 
 /// Opens a member, or, when it is open, brings it to the front if `show`.
-bool CMainFrame::OpenMember(const CProject& project, const QString& member, bool show)
+bool CProjectController::OpenMember(const CProject& project, const QString& member, bool show)
 {
-    CMultiDocTemplate& documents = *TemplateFor(member);
-    if (const CKsDoc* open = documents.FindDocument(member)) {
+    if (const CKsDoc* open = m_plugins.FindDocument(member)) {
         // A view joins when it first appears. One that is open already outside any project is opened anew.
         const CView* view = open->Views().empty() ? nullptr : open->Views().front();
-        auto* window = WindowOf(MdiArea(), view);
+        auto* window = m_windows.Of(view);
         if (show && window)
-            MdiArea().setActiveSubWindow(window);
+            m_frame.MdiArea().setActiveSubWindow(window);
         if (m_projects.FindByView(view) || !window)
             return true;
         if (!window->close())
-            return m_projects.FindByView(view) == &project; // kept by the user: not in this project
+            return false; // kept by the user: not in this project
     }
     m_projects.Prefer(project.handle);
-    const bool opened = documents.OpenDocumentFile(this, member) != nullptr;
+    const bool opened = m_plugins.TemplateFor(member)->OpenDocumentFile(&m_frame, member) != nullptr;
     m_projects.Prefer(0);
     return opened;
 }
 
-bool CMainFrame::CloseProject(CProjectHandle handle)
+bool CProjectController::Close(CProjectHandle handle)
 {
     const CProject* found = m_projects.Find(handle);
     if (!found)
@@ -189,38 +175,35 @@ bool CMainFrame::CloseProject(CProjectHandle handle)
     const CProject project = *found;
     QList<QMdiSubWindow*> windows;
     for (const QPointer<CView>& view : project.views) {
-        if (auto* window = WindowOf(MdiArea(), view); window && !window->IsClosing())
+        if (auto* window = m_windows.Of(view))
             windows << window;
     }
-    if (!CloseWindows(windows))
+    if (!m_frame.CloseWindows(windows))
         return false;
     Announce(KsRequest::ProjectClosing, project);
     m_projects.Close(handle);
-    UpdateTitle();
-    UpdateActions();
+    emit Changed();
     return true;
 }
 
 /// Tells every view that a project opens or closes.
-void CMainFrame::Announce(WPARAM what, const CProject& project)
+void CProjectController::Announce(WPARAM what, const CProject& project) const
 {
     CKSComm_Package package;
     package.text = project.path;
     package.project = project.handle;
-    const auto windows = MdiArea().subWindowList();
-    for (QMdiSubWindow* window : windows) {
-        if (const auto* child = qobject_cast<CKsMDIChildWnd*>(window))
-            KsSendMessage(child->GetActiveView(), KsMessage::ProjectManagement(), what,
-                          reinterpret_cast<LPARAM>(&package));
-    }
+    const auto windows = m_windows.All();
+    for (const CKsMDIChildWnd* window : windows)
+        KsSendMessage(window->GetActiveView(), KsMessage::ProjectManagement(), what,
+                      reinterpret_cast<LPARAM>(&package));
 }
 
-void CMainFrame::OnFileCloseProject()
+void CProjectController::CloseActive()
 {
     const auto& all = m_projects.All();
-    const CProject* active = m_projects.FindByView(GetActiveView());
+    const CProject* active = m_projects.FindByView(m_frame.GetActiveView());
     if (!active && !all.empty())
         active = all.back().get();
     if (active)
-        CloseProject(active->handle);
+        Close(active->handle);
 }

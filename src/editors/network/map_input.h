@@ -1,0 +1,30 @@
+// The map's keys and mouse.
+#pragma once
+
+#include <QObject>
+#include <QPoint>
+
+class CNetworkMap;
+class QKeyEvent;
+class QMouseEvent;
+
+/// Turns what the user does with keys and mouse into what a map can do.
+class CMapInput : public QObject
+{
+    Q_OBJECT
+public:
+    explicit CMapInput(CNetworkMap& map);
+
+protected:
+    bool eventFilter(QObject* object, QEvent* event) override;
+
+private:
+    bool Key(const QKeyEvent& event);
+    void Press(const QMouseEvent& event);
+    void Move(const QMouseEvent& event);
+    void Release(const QMouseEvent& event);
+
+    CNetworkMap& m_map;
+    QPoint m_pressed, m_dragged;
+    bool m_pressing = false, m_dragging = false;
+};
