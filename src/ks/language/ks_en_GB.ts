@@ -57,6 +57,153 @@
         </message>
     </context>
     <context>
+        <name>SyntaxError</name>
+        <message>
+            <source>%1 cannot be read: %2</source>
+            <translation>%1 cannot be read: %2</translation>
+        </message>
+        <message>
+            <source>%1, line %2, column %3: expected %4, found %5</source>
+            <translation>%1, line %2, column %3: expected %4, found %5</translation>
+        </message>
+        <message>
+            <source>the end of the line</source>
+            <translation>the end of the line</translation>
+        </message>
+        <message>
+            <source>the end of the file</source>
+            <translation>the end of the file</translation>
+        </message>
+        <message>
+            <source>a parameter file</source>
+            <translation>a parameter file</translation>
+        </message>
+        <message>
+            <source>an empty file</source>
+            <translation>an empty file</translation>
+        </message>
+        <message>
+            <source>a line of at most 16 MiB</source>
+            <translation>a line of at most 16 MiB</translation>
+        </message>
+        <message>
+            <source>a longer one</source>
+            <translation>a longer one</translation>
+        </message>
+        <message>
+            <source>at most 128 sections inside one another</source>
+            <translation>at most 128 sections inside one another</translation>
+        </message>
+        <message>
+            <source>one more</source>
+            <translation>one more</translation>
+        </message>
+        <message>
+            <source>text in UTF-8</source>
+            <translation>text in UTF-8</translation>
+        </message>
+        <message>
+            <source>a NUL character</source>
+            <translation>a NUL character</translation>
+        </message>
+        <message>
+            <source>the byte 0x%1</source>
+            <translation>the byte 0x%1</translation>
+        </message>
+        <message>
+            <source>a section in brackets, a keyword or a comment</source>
+            <translation>a section in brackets, a keyword or a comment</translation>
+        </message>
+        <message>
+            <source>a line feed after the carriage return</source>
+            <translation>a line feed after the carriage return</translation>
+        </message>
+        <message>
+            <source>a name of letters, digits, '_', '-' and '.'</source>
+            <translation>a name of letters, digits, '_', '-' and '.'</translation>
+        </message>
+        <message>
+            <source>] behind the name (names have letters, digits, '_', '-' and '.' only)</source>
+            <translation>] behind the name (names have letters, digits, '_', '-' and '.' only)</translation>
+        </message>
+        <message>
+            <source>a target in brackets, such as [Name]</source>
+            <translation>a target in brackets, such as [Name]</translation>
+        </message>
+        <message>
+            <source>a target in brackets, such as [Name], before any keyword</source>
+            <translation>a target in brackets, such as [Name], before any keyword</translation>
+        </message>
+        <message>
+            <source>= behind the keyword's name</source>
+            <translation>= behind the keyword's name</translation>
+        </message>
+        <message>
+            <source>a comma or the end of the line</source>
+            <translation>a comma or the end of the line</translation>
+        </message>
+        <message>
+            <source>a parameter (a number, true, false, "text" or &lt;file name&gt;)</source>
+            <translation>a parameter (a number, true, false, "text" or &lt;file name&gt;)</translation>
+        </message>
+        <message>
+            <source>true or false</source>
+            <translation>true or false</translation>
+        </message>
+        <message>
+            <source>a number such as -12, 0.5 or 1e-05</source>
+            <translation>a number such as -12, 0.5 or 1e-05</translation>
+        </message>
+        <message>
+            <source>an integer from -2147483648 to 2147483647</source>
+            <translation>an integer from -2147483648 to 2147483647</translation>
+        </message>
+        <message>
+            <source>a number within the range of 64-bit floats</source>
+            <translation>a number within the range of 64-bit floats</translation>
+        </message>
+        <message>
+            <source>" closing the string</source>
+            <translation>" closing the string</translation>
+        </message>
+        <message>
+            <source>&gt; closing the file name</source>
+            <translation>&gt; closing the file name</translation>
+        </message>
+        <message>
+            <source>one of the escapes \" \\ \n \r \t \u{...}</source>
+            <translation>one of the escapes \" \\ \n \r \t \u{...}</translation>
+        </message>
+        <message>
+            <source>one of the escapes \&gt; \\ \u{...}</source>
+            <translation>one of the escapes \&gt; \\ \u{...}</translation>
+        </message>
+        <message>
+            <source>\u{...} with the hexadecimal number of a character</source>
+            <translation>\u{...} with the hexadecimal number of a character</translation>
+        </message>
+        <message>
+            <source>no control character (they are written \u{...})</source>
+            <translation>no control character (they are written \u{...})</translation>
+        </message>
+        <message>
+            <source>a blank</source>
+            <translation>a blank</translation>
+        </message>
+        <message>
+            <source>a tab</source>
+            <translation>a tab</translation>
+        </message>
+        <message>
+            <source>a carriage return</source>
+            <translation>a carriage return</translation>
+        </message>
+        <message>
+            <source>the control character U+%1</source>
+            <translation>the control character U+%1</translation>
+        </message>
+    </context>
+    <context>
         <name>SystemReason</name>
         <message>
             <source>no space is left on the device</source>
