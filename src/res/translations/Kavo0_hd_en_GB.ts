@@ -1949,6 +1949,10 @@ DEM
             <translation>"%1" is no date and time. Expected one such as %2.</translation>
         </message>
         <message>
+            <source>"%1" holds a part of a second. Times are kept to the whole second. Expected one such as %2.</source>
+            <translation>"%1" holds a part of a second. Times are kept to the whole second. Expected one such as %2.</translation>
+        </message>
+        <message>
             <source>Please enter 0 or 1.</source>
             <translation>Please enter 0 or 1.</translation>
         </message>

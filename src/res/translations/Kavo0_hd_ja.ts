@@ -1949,6 +1949,10 @@ DEM
             <translation>「%1」は日時ではありません。%2 のように入力してください。</translation>
         </message>
         <message>
+            <source>"%1" holds a part of a second. Times are kept to the whole second. Expected one such as %2.</source>
+            <translation>「%1」には 1 秒未満の端数があります。時刻は秒単位で保存されます。%2 のように入力してください。</translation>
+        </message>
+        <message>
             <source>Please enter 0 or 1.</source>
             <translation>0または1を入力してください。</translation>
         </message>
