@@ -25,6 +25,36 @@ CKsMDIChildWnd* WindowOf(const QMdiArea& area, const CView* view)
     return nullptr;
 }
 
+/// Keeps what is told while it lives, so that it is told with the rest. Questions are asked at once.
+class CKeptMessages
+{
+public:
+    CKeptMessages()
+        : m_before(KsSetMessageBoxHandler([this](const CString& text, auto buttons) { return Take(text, buttons); }))
+    {
+    }
+    ~CKeptMessages() { KsSetMessageBoxHandler(m_before); }
+    CKeptMessages(const CKeptMessages&) = delete;
+    CKeptMessages& operator=(const CKeptMessages&) = delete;
+    const QStringList& Texts() const { return m_texts; }
+
+private:
+    QMessageBox::StandardButton Take(const CString& text, QMessageBox::StandardButtons buttons)
+    {
+        if (buttons == QMessageBox::Ok) {
+            m_texts << text;
+            return QMessageBox::Ok;
+        }
+        const auto keeping = KsSetMessageBoxHandler(m_before);
+        const auto answer = KsMessageBox(text, buttons);
+        KsSetMessageBoxHandler(keeping);
+        return answer;
+    }
+
+    QStringList m_texts;
+    KsMessageBoxHandler m_before;
+};
+
 /// Whether the user chose tabs, which single documents have also when nobody chose.
 bool UsesTabs()
 {
@@ -135,7 +165,7 @@ void CMainFrame::UpdateProjectTree()
         m_projectTree->hide();
 }
 
-/// Opens some members; what could not be opened, a line each.
+/// Opens some members; what could not be opened, and why, a line each.
 QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& members)
 {
     QStringList missing;
@@ -146,10 +176,27 @@ QStringList CMainFrame::OpenMembers(const CProject& project, const QStringList& 
             missing << tr("%1: the file does not exist").arg(name);
         else if (!TemplateFor(member))
             missing << tr("%1: no editor reads files of this kind").arg(name);
-        else if (!OpenMember(project, member, false))
-            missing << name;
+        else
+            missing += OpenMemberWithReasons(project, member);
     }
     return missing;
+}
+
+/// Why a member could not be opened; nothing when it was.
+QStringList CMainFrame::OpenMemberWithReasons(const CProject& project, const QString& member)
+{
+    bool opened = false;
+    QStringList said;
+    {
+        const CKeptMessages kept;
+        opened = OpenMember(project, member, false);
+        said = kept.Texts();
+    }
+    if (!opened)
+        return said.isEmpty() ? QStringList(QDir::toNativeSeparators(member)) : said;
+    for (const QString& text : said)
+        KsMessageBox(text);
+    return {};
 }
 
 void CMainFrame::ShowMember(CProjectHandle handle, const QString& stored)

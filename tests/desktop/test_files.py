@@ -76,6 +76,13 @@ class Unreadable(Case):
         self.assertIn('3 行 20 文字目', labels)
         self.assertNotIn('expected', labels)
 
+    def test_members_that_do_not_open_are_told_once(self):
+        samples.write_project(self.folder)
+        for name in ('moor.kvnw', 'moor.kvxs'):
+            samples.write(f'{self.folder}/{name}', '[Other\n')
+        self.start('moor.kvrp')
+        self.assert_told_once('These files of the project', 'moor.kvnw, line 1, column 7', 'moor.kvxs, line 1, column 7')
+
 
 class WhereFilesStand(Case):
     """A save renames the entry to the extension in capitals, and that is all it changes about it."""
@@ -106,7 +113,7 @@ class WhereFilesStand(Case):
         """It takes the place of the file that the user agreed to replace, whatever the case of its extension."""
         samples.write(f'{self.folder}/b.hdkv', '[Other]\n[/Other]\n')
         editor = self.open()
-        editor.press('ctrl+shift+s')
+        editor.menu('File', 'Save As')
         editor.box()
         editor.press('ctrl+a')
         editor.type('b.hdkv\n')
