@@ -114,7 +114,8 @@ std::string CheckError(tqlHandle structure, const TqlSyntaxError& error)
 {
     if (tqlGetNoSections(structure) != 0 || tqlGetNoKeywords(structure) != 0)
         return "half a document after an error";
-    if (error.line == 0 || error.column == 0 || error.expected.empty() || error.found.empty())
+    if (error.line == 0 || error.column == 0 || error.expected.phrase == TqlPhrase::None ||
+        error.found.phrase == TqlPhrase::None)
         return "incomplete report: " + error.message;
     return "";
 }

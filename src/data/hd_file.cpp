@@ -1,13 +1,15 @@
 #include "data/hd_file.h"
 
-Result<TqlStructure> ParseFile(const std::string& path)
+Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report)
 {
     TqlStructure structure(tqlLoadFile(path, 1));
-    TqlSyntaxError report;
-    if (!tqlGetSyntaxErr(structure.Get(), &report))
+    TqlSyntaxError error;
+    if (!tqlGetSyntaxErr(structure.Get(), &error))
         return structure;
     tqlGetErrorGlb(); // taken: the report says it all
-    return Error{report.message};
+    if (report)
+        *report = error;
+    return Error{error.message};
 }
 
 Result<HD_Parameters> LoadHDFile(const std::string& path)

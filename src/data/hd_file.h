@@ -26,8 +26,9 @@ private:
     tqlHandle m_handle;
 };
 
-/// Parses a parameter file; the error is the parser's sentence with file, line and column.
-Result<TqlStructure> ParseFile(const std::string& path);
+/// Parses a parameter file; the error is the parser's sentence with file, line and column, and, for whoever says it in
+/// another language, its report.
+Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report = nullptr);
 
 /// Reads a file into fresh parameters. A file without the target "KAVO0_HD" gives the defaults.
 Result<HD_Parameters> LoadHDFile(const std::string& path);

@@ -24,7 +24,7 @@ public:
 
     /// Whether a path has an extension of these files: ".HDKV" or ".hdkv".
     static bool HasExtension(const CString& path);
-    /// Accepts these extensions. A file that cannot be parsed opens with what the records hold, after a message.
+    /// Accepts these extensions. A file that cannot be parsed opens with what the records hold, and says so (File()).
     BOOL OnOpenDocument(const CString& path) override;
     /// Saves to the path with the extension ".HDKV"; see docs/architecture.md, "Saving".
     BOOL OnSaveDocument(const CString& path) override;

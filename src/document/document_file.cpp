@@ -1,7 +1,9 @@
 #include "document/document_file.h"
 
 #include "data/hd_file.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/syntax_error.h"
 #include "ks/fc/system_reason.h"
 #include "res/strings.h"
 
@@ -38,16 +40,23 @@ CString CDocumentFile::SavePathFor(const CString& path)
     return info.dir().filePath(info.completeBaseName() + QStringLiteral(".HDKV"));
 }
 
+bool CDocumentFile::IsUnreadable() const
+{
+    return m_error.code != TqlError::None;
+}
+
+CString CDocumentFile::Error() const
+{
+    return KsSyntaxErrorText(m_error);
+}
+
 void CDocumentFile::Read(const CString& path, HD_Parameters& parameters)
 {
     *this = {};
     m_path = path;
-    const Result<TqlStructure> structure = ParseFile(path.toStdString());
-    if (!structure) {
-        m_error = QString::fromStdString(structure.error().message);
-        KsMessageBox(m_error);
+    const Result<TqlStructure> structure = ParseFile(path.toStdString(), &m_error);
+    if (!structure)
         return;
-    }
     LoadReport report(structure.value().Get());
     parameters.Load(structure.value().Get(), &report);
     m_findings = report.Take();
@@ -59,6 +68,16 @@ bool CDocumentFile::IsReplacedBy(const CString& target) const
     // One file may be reached by several paths, and be saved by another than it was opened by.
     return !m_path.isEmpty() && QFileInfo::exists(m_path) &&
            (SavePathFor(m_path) == target || SameFile(m_path.toStdString(), target.toStdString()));
+}
+
+/// What a save to `target` writes over: the file that was read, or one of that name in whatever case it is spelt. Of
+/// two files that differ in their case only, `target` itself.
+CString CDocumentFile::EntryFor(const CString& target) const
+{
+    if (IsReplacedBy(target))
+        return m_path;
+    const CString entry = KsExistingSpelling(target);
+    return QFileInfo(entry).path() == QFileInfo(target).path() ? entry : target; // never in another folder
 }
 
 /// What a copy of the file is called; null when nothing has to be kept.
@@ -97,8 +116,10 @@ bool CDocumentFile::Write(const HD_Parameters& parameters, const CString& target
     // Where the file system tells the spellings apart, the file is written under its old one and then renamed: so it
     // remains the same entry, be it a link or a file with an owner, a mode and attributes of its own. Elsewhere both
     // spellings are one file already.
-    const bool renames = replaces && m_path != target && !SameFile(m_path.toStdString(), target.toStdString());
-    const std::string written = (renames ? m_path : target).toStdString();
+    const CString entry = EntryFor(target);
+    const bool renames =
+        entry != target && QFileInfo::exists(entry) && !SameFile(entry.toStdString(), target.toStdString());
+    const std::string written = (renames ? entry : target).toStdString();
     Result<void> saved = SaveHDFile(parameters, written);
     if (saved && renames)
         saved = RenameFile(written, target.toStdString());
@@ -106,7 +127,7 @@ bool CDocumentFile::Write(const HD_Parameters& parameters, const CString& target
         Tell(saved.error());
         return false;
     }
-    const CString renamed = renames ? LoadString(Str::FileIsNow).arg(NameOf(m_path), NameOf(target)) : CString();
+    const CString renamed = renames ? LoadString(Str::FileIsNow).arg(NameOf(entry), NameOf(target)) : CString();
     const CString kept = replaces ? m_keptCopy : CString();
     *this = {};
     m_path = target;

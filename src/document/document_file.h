@@ -3,6 +3,7 @@
 
 #include "files/finding.h"
 #include "ks/fc/types.h"
+#include "tql/tql.h"
 
 #include <vector>
 
@@ -11,7 +12,8 @@ struct HD_Parameters;
 class CDocumentFile
 {
 public:
-    /// Reads a file into the parameters. One that cannot be parsed leaves them as they are, after a message.
+    /// Reads a file into the parameters. One that cannot be parsed leaves them as they are, and nobody is told here:
+    /// several files may be opening, and the view says it as long as it is so.
     void Read(const CString& path, HD_Parameters& parameters);
     /// Whether the file may be replaced by a save to `target`: asks when it holds what the document does not.
     bool MayReplace(const CString& target) const;
@@ -21,9 +23,9 @@ public:
 
     const CString& Path() const { return m_path; }
     /// The file could not be parsed; the document holds nothing of it.
-    bool IsUnreadable() const { return !m_error.isEmpty(); }
-    /// What is wrong with it and where.
-    const CString& Error() const { return m_error; }
+    bool IsUnreadable() const;
+    /// What is wrong with it and where, in the user's language; empty when it was read.
+    CString Error() const;
     /// What was not taken as it stands.
     const std::vector<Finding>& Findings() const { return m_findings; }
     /// Where the last save kept what it replaced; empty when there was no need.
@@ -36,9 +38,11 @@ public:
 
 private:
     bool IsReplacedBy(const CString& target) const;
+    CString EntryFor(const CString& target) const;
     const char* CopySuffix() const;
     bool KeepCopy();
 
-    CString m_path, m_error, m_keptCopy, m_renamed;
+    CString m_path, m_keptCopy, m_renamed;
+    TqlSyntaxError m_error;
     std::vector<Finding> m_findings;
 };

@@ -122,7 +122,7 @@ void CProjectController::UpdateTree()
         m_tree->hide();
 }
 
-/// Opens some members; what could not be opened, a line each.
+/// Opens some members; what could not be opened, and why, a line each.
 QStringList CProjectController::OpenMembers(const CProject& project, const QStringList& members)
 {
     QStringList missing;
@@ -133,10 +133,27 @@ QStringList CProjectController::OpenMembers(const CProject& project, const QStri
             missing << tr("%1: the file does not exist").arg(name);
         else if (!m_plugins.TemplateFor(member))
             missing << tr("%1: no editor reads files of this kind").arg(name);
-        else if (!OpenMember(project, member, false))
-            missing << name;
+        else
+            missing += OpenMemberWithReasons(project, member);
     }
     return missing;
+}
+
+/// Why a member could not be opened; nothing when it was.
+QStringList CProjectController::OpenMemberWithReasons(const CProject& project, const QString& member)
+{
+    bool opened = false;
+    QStringList said;
+    {
+        const CKsKeptMessages kept;
+        opened = OpenMember(project, member, false);
+        said = kept.Texts();
+    }
+    if (!opened)
+        return said.isEmpty() ? QStringList(QDir::toNativeSeparators(member)) : said;
+    for (const QString& text : said)
+        KsMessageBox(text);
+    return {};
 }
 
 void CProjectController::ShowMember(CProjectHandle handle, const QString& stored)

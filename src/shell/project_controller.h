@@ -45,6 +45,7 @@ private:
     void TellOfSharedMembers(const CProject& project) const;
     void Announce(WPARAM what, const CProject& project) const;
     QStringList OpenMembers(const CProject& project, const QStringList& members);
+    QStringList OpenMemberWithReasons(const CProject& project, const QString& member);
     void OpenOtherMembers(CProjectHandle handle, QStringList missing);
     bool OpenMember(const CProject& project, const QString& member, bool show);
 

@@ -2,6 +2,7 @@
 
 #include "ks/fc/exchange.h"
 #include "ks/fc/file_name.h"
+#include "ks/fc/syntax_error.h"
 #include "tql/tql.h"
 
 #include <QCoreApplication>
@@ -36,7 +37,7 @@ bool ReadMembers(CProject& project, QString& error)
     const ParameterFile file(project.path);
     if (TqlSyntaxError report; tqlGetSyntaxErr(file.Get(), &report)) {
         tqlGetErrorGlb();
-        error = QString::fromStdString(report.message);
+        error = KsSyntaxErrorText(report);
         return false;
     }
     const tqlHandle target = tqlTargetByNameNum(file.Get(), "KVR_PROJECT", 1);

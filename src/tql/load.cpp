@@ -1,5 +1,6 @@
 // Files and texts into structures, and the error state.
 #include "tql/bytes.h"
+#include "tql/error_text.h"
 #include "tql/parser.h"
 
 #include <algorithm>
@@ -54,28 +55,30 @@ std::string FileNameOf(const std::string& path)
     return path.substr(path.find_last_of("/\\") + 1);
 }
 
-void FailToRead(Structure& structure, const std::string& path, const std::string& reason)
+void FailToRead(Structure& structure, const std::string& path, std::error_code reason)
 {
     TqlSyntaxError& error = structure.error;
     error.code = TqlError::Unreadable;
     error.file = FileNameOf(path);
-    error.expected = "a readable file";
-    error.found = reason;
-    error.message = path + " cannot be read: " + reason;
+    error.reason = reason;
+    error.message = path + " cannot be read: " + ReasonText(reason);
 }
 
-// Why a path that cannot be opened cannot, empty when nothing is known against it.
-std::string ReasonAgainst(const std::filesystem::path& path)
+// Why a path that cannot be opened cannot, none when nothing is known against it.
+std::error_code ReasonAgainst(const std::filesystem::path& path)
 {
     std::error_code code;
     const auto status = std::filesystem::status(path, code);
-    if (status.type() == std::filesystem::file_type::not_found)
-        return "there is no such file";
-    if (status.type() == std::filesystem::file_type::directory)
-        return "it is a folder";
-    if (code)
-        return code.message();
-    return status.type() == std::filesystem::file_type::regular ? "" : "it is no ordinary file";
+    switch (status.type()) {
+    case std::filesystem::file_type::regular:
+        return {};
+    case std::filesystem::file_type::not_found:
+        return std::make_error_code(std::errc::no_such_file_or_directory);
+    case std::filesystem::file_type::directory:
+        return std::make_error_code(std::errc::is_a_directory);
+    default:
+        return code ? code : std::make_error_code(std::errc::operation_not_supported);
+    }
 }
 
 // Reads to the end, however much the file grew or shrank since its size was asked.
@@ -99,7 +102,7 @@ bool ReadAll(std::ifstream& in, std::size_t expectedSize, Text& text)
 bool ReadFile(Structure& structure, const std::string& path)
 {
     const auto native = std::filesystem::u8path(path);
-    if (const std::string reason = ReasonAgainst(native); !reason.empty()) {
+    if (const std::error_code reason = ReasonAgainst(native)) {
         FailToRead(structure, path, reason);
         return false;
     }
@@ -109,10 +112,9 @@ bool ReadFile(Structure& structure, const std::string& path)
     std::ifstream in(native, std::ios::binary);
     if (!code && in && ReadAll(in, static_cast<std::size_t>(size), structure.text))
         return true;
-    FailToRead(structure, path,
-               code    ? code.message()
-               : errno ? std::generic_category().message(errno)
-                       : "reading failed");
+    if (!code)
+        code = errno ? std::error_code(errno, std::generic_category()) : std::make_error_code(std::errc::io_error);
+    FailToRead(structure, path, code);
     return false;
 }
 
@@ -126,7 +128,7 @@ tqlHandle Load(const std::string& path, Read read)
             structure->Clear();
     } catch (const std::bad_alloc&) {
         structure->Clear();
-        FailToRead(*structure, path, "there is not enough memory");
+        FailToRead(*structure, path, std::make_error_code(std::errc::not_enough_memory));
         structure->error.code = TqlError::TooLarge;
     }
     SetGlobalError(structure->error.code);

@@ -10,10 +10,6 @@ namespace tql {
 
 namespace {
 
-constexpr const char* AnyNumber = "a number such as -12, 0.5 or 1e-05";
-constexpr const char* IntRange = "an integer from -2147483648 to 2147483647";
-constexpr const char* DoubleRange = "a number within the range of 64-bit floats";
-
 const char* WordEndAt(const char* p)
 {
     while (!Is(*p, WordEnd))
@@ -49,14 +45,14 @@ NumberScan ScanNumber(const char* const p)
         const char* const end = WordEndAt(digits);
         const std::string_view word(digits, static_cast<std::size_t>(end - digits));
         if (word == "nan" || word == "inf")
-            return {end, TqlType::Double, nullptr};
-        return {end, TqlType::None, AnyNumber};
+            return {end, TqlType::Double};
+        return {end, TqlType::None, TqlPhrase::Number};
     }
     const char* end = SkipDigits(digits);
     if (Is(*end, WordEnd) && end != digits) {
         if (!FitsInt(digits, end, negative))
-            return {end, TqlType::None, IntRange};
-        return {end, TqlType::Int, nullptr};
+            return {end, TqlType::None, TqlPhrase::IntRange};
+        return {end, TqlType::Int};
     }
     bool anyDigit = end != digits, exponent = false;
     if (*end == '.') {
@@ -71,10 +67,10 @@ NumberScan ScanNumber(const char* const p)
         anyDigit = end != first;
     }
     if (!anyDigit || !Is(*end, WordEnd))
-        return {WordEndAt(end), TqlType::None, AnyNumber};
+        return {WordEndAt(end), TqlType::None, TqlPhrase::Number};
     if ((exponent || end - p > SafeLength) && !FitsDouble(p, end))
-        return {end, TqlType::None, DoubleRange};
-    return {end, TqlType::Double, nullptr};
+        return {end, TqlType::None, TqlPhrase::DoubleRange};
+    return {end, TqlType::Double};
 }
 
 const char* ReadInt(const char* p, std::int32_t& value)

@@ -11,9 +11,9 @@ namespace tql {
 
 struct NumberScan
 {
-    const char* end = nullptr;      // past the number, or past what looked like one
-    TqlType type = TqlType::None;   // Int, Double, or None when it is no number or is out of range
-    const char* expected = nullptr; // what would have been right, when type is None
+    const char* end = nullptr;            // past the number, or past what looked like one
+    TqlType type = TqlType::None;         // Int, Double, or None when it is no number or is out of range
+    TqlPhrase expected = TqlPhrase::None; // what would have been right, when type is None
 };
 
 /// End of a plain number, digits with or without a point, that is in range for its few digits; null for anything else,

@@ -2,6 +2,7 @@
 
 #include "tql/bytes.h"
 #include "tql/char_class.h"
+#include "tql/error_text.h"
 #include "tql/number.h"
 #include "tql/scan.h"
 #include "tql/utf8.h"
@@ -14,17 +15,14 @@ namespace tql {
 
 namespace {
 
-constexpr const char* EndOfLine = "the end of the line";
-
-std::string Closing(std::string_view name)
+TqlTerm Closing(std::string_view name)
 {
-    return "[/" + std::string(name) + "]";
+    return {TqlPhrase::Text, "[/" + std::string(name) + "]"};
 }
 
-// "U+0007" or "0xFF"
-std::string HexOf(const char* prefix, unsigned value, int digits)
+std::string HexOf(unsigned value, int digits)
 {
-    std::string text = prefix;
+    std::string text;
     for (int shift = (digits - 1) * 4; shift >= 0; shift -= 4)
         text += "0123456789ABCDEF"[(value >> shift) & 15];
     return text;
@@ -51,14 +49,11 @@ private:
     void AddKeyword(std::string_view name, const char* params, std::size_t count);
     /// Nothing but blanks and a comment is left.
     bool AtEnd(const char* p) const { return p == m_lineEnd || (*p == '/' && p[1] == '/'); }
-    bool ExpectEnd(const char* p, const char* expected = EndOfLine);
+    bool ExpectEnd(const char* p, TqlPhrase expected = TqlPhrase::EndOfLine);
 
-    bool Fail(TqlError code, const char* at, std::string expected, std::string found);
-    bool Fail(const char* at, std::string expected)
-    {
-        return Fail(TqlError::Syntax, at, std::move(expected), Found(at));
-    }
-    std::string Found(const char* at) const;
+    bool Fail(TqlError code, const char* at, TqlTerm expected, TqlTerm found);
+    bool Fail(const char* at, TqlPhrase expected) { return Fail(TqlError::Syntax, at, {expected}, Found(at)); }
+    TqlTerm Found(const char* at) const;
     bool FailEncoding(const char* at);
 
     Structure& m_structure;
@@ -86,16 +81,16 @@ bool Parser::Run()
     if (m_lineNumber == 0)
         m_lineNumber = 1, m_line = m_lineEnd = end;
     if (!m_open.empty())
-        return Fail(TqlError::Syntax, m_lineEnd, Closing(m_open.back()->name), "the end of the file");
+        return Fail(TqlError::Syntax, m_lineEnd, Closing(m_open.back()->name), {TqlPhrase::EndOfFile});
     if (!m_anything)
-        return Fail(TqlError::Syntax, m_lineEnd, "a parameter file", "an empty file");
+        return Fail(TqlError::Syntax, m_lineEnd, {TqlPhrase::ParameterFile}, {TqlPhrase::EmptyFile});
     return true;
 }
 
 bool Parser::CheckLine()
 {
     if (static_cast<std::size_t>(m_lineEnd - m_line) > MaxLineLength)
-        return Fail(TqlError::TooLarge, m_line, "a line of at most 16 MiB", "a longer one");
+        return Fail(TqlError::TooLarge, m_line, {TqlPhrase::LineOfLimit}, {TqlPhrase::LongerLine});
     const char* const bad = FindBadByte(m_line, m_lineEnd);
     return bad == m_lineEnd || FailEncoding(bad);
 }
@@ -103,11 +98,11 @@ bool Parser::CheckLine()
 bool Parser::FailEncoding(const char* at)
 {
     const auto byte = static_cast<unsigned char>(*at);
-    std::string found = byte == 0 ? "a NUL character" : HexOf("the byte 0x", byte, 2);
+    TqlTerm found = byte == 0 ? TqlTerm{TqlPhrase::NulCharacter} : TqlTerm{TqlPhrase::Byte, HexOf(byte, 2)};
     const std::string_view start(m_structure.text.begin(), m_structure.text.Size());
     if (start.starts_with("\xFF\xFE") || start.starts_with("\xFE\xFF"))
-        found = "UTF-16";
-    return Fail(TqlError::Encoding, at, "text in UTF-8", std::move(found));
+        found = {TqlPhrase::Text, "UTF-16"};
+    return Fail(TqlError::Encoding, at, {TqlPhrase::Utf8}, std::move(found));
 }
 
 bool Parser::ParseLine()
@@ -120,16 +115,16 @@ bool Parser::ParseLine()
         return ParseBracket(p);
     if (Is(*p, NameChar))
         return ParseKeyword(p);
-    return ExpectEnd(p, "a section in brackets, a keyword or a comment");
+    return ExpectEnd(p, TqlPhrase::Line);
 }
 
-bool Parser::ExpectEnd(const char* p, const char* expected)
+bool Parser::ExpectEnd(const char* p, TqlPhrase expected)
 {
     p = SkipBlanks(p);
     if (!AtEnd(p))
         return Fail(p, expected);
     const auto* const cr = static_cast<const char*>(std::memchr(p, '\r', static_cast<std::size_t>(m_lineEnd - p)));
-    return !cr || Fail(cr, "a line feed after the carriage return");
+    return !cr || Fail(cr, TqlPhrase::LineFeed);
 }
 
 bool Parser::ParseBracket(const char* p)
@@ -141,9 +136,9 @@ bool Parser::ParseBracket(const char* p)
     while (Is(*p, NameChar))
         ++p;
     if (p == begin)
-        return Fail(p, "a name of letters, digits, '_', '-' and '.'");
+        return Fail(p, TqlPhrase::Name);
     if (*p != ']')
-        return Fail(p, "] behind the name (names have letters, digits, '_', '-' and '.' only)");
+        return Fail(p, TqlPhrase::BracketBehindName);
     const std::string_view name(begin, static_cast<std::size_t>(p - begin));
     return ExpectEnd(p + 1) && (closes ? Close(name, bracket) : Open(name, bracket));
 }
@@ -151,7 +146,7 @@ bool Parser::ParseBracket(const char* p)
 bool Parser::Open(std::string_view name, const char* at)
 {
     if (m_open.size() == MaxDepth)
-        return Fail(TqlError::TooLarge, at, "at most 128 sections inside one another", "one more");
+        return Fail(TqlError::TooLarge, at, {TqlPhrase::DepthOfLimit}, {TqlPhrase::OneMore});
     Section* const section = &m_structure.nodes.emplace_back(Kind::Section, name);
     Section* const parent = m_open.empty() ? &m_structure : m_open.back();
     parent->sections.push_back(section);
@@ -162,7 +157,7 @@ bool Parser::Open(std::string_view name, const char* at)
 bool Parser::Close(std::string_view name, const char* at)
 {
     if (m_open.empty())
-        return Fail(TqlError::Syntax, at, "a target in brackets, such as [Name]", Closing(name));
+        return Fail(TqlError::Syntax, at, {TqlPhrase::Target}, Closing(name));
     if (m_open.back()->name != name)
         return Fail(TqlError::Syntax, at, Closing(m_open.back()->name), Closing(name));
     m_open.pop_back();
@@ -189,10 +184,10 @@ bool Parser::ParseKeyword(const char* p)
     p = SkipKeywordName(p);
     const std::string_view name(begin, static_cast<std::size_t>(p - begin));
     if (m_open.empty())
-        return Fail(TqlError::Syntax, begin, "a target in brackets, such as [Name], before any keyword", Found(begin));
+        return Fail(TqlError::Syntax, begin, {TqlPhrase::TargetFirst}, Found(begin));
     p = SkipBlanks(p);
     if (*p != '=')
-        return Fail(p, "= behind the keyword's name");
+        return Fail(p, TqlPhrase::EqualSign);
     p = SkipBlanks(p + 1);
     std::size_t count = 0;
     if (!ParseParams(p, count))
@@ -209,14 +204,14 @@ bool Parser::ParseParams(const char* p, std::size_t& count)
         const char* end = SkipPlainNumber(p);
         if (!end) {
             const ParamScan param = ScanParam(p);
-            if (param.expected)
+            if (param.expected != TqlPhrase::None)
                 return Fail(param.end, param.expected);
             end = param.end;
         }
         ++count;
         p = SkipBlanks(end);
         if (*p != ',')
-            return p == m_lineEnd || ExpectEnd(p, "a comma or the end of the line");
+            return p == m_lineEnd || ExpectEnd(p, TqlPhrase::CommaOrEnd);
         p = SkipBlanks(p + 1);
     }
 }
@@ -257,14 +252,18 @@ void Parser::AddKeyword(std::string_view name, const char* params, std::size_t c
 }
 
 // What stands at `at`, as far as a blank or a comma, for a message.
-std::string Parser::Found(const char* at) const
+TqlTerm Parser::Found(const char* at) const
 {
     if (at >= m_lineEnd)
-        return EndOfLine;
+        return {TqlPhrase::EndOfLine};
     if (*at == ' ')
-        return "a blank";
+        return {TqlPhrase::Blank};
+    if (*at == '\t')
+        return {TqlPhrase::Tab};
+    if (*at == '\r')
+        return {TqlPhrase::CarriageReturn};
     if (const auto code = static_cast<unsigned char>(*at); code < 0x20 || code == 0x7F)
-        return code == '\t' ? "a tab" : code == '\r' ? "a carriage return" : HexOf("the control character U+", code, 4);
+        return {TqlPhrase::ControlCharacter, HexOf(code, 4)};
     constexpr std::size_t longest = 40;
     const char* p = at;
     for (std::size_t characters = 0; p < m_lineEnd && characters < longest; ++characters) {
@@ -272,10 +271,10 @@ std::string Parser::Found(const char* at) const
             break;
         p += SequenceLength({p, static_cast<std::size_t>(m_lineEnd - p)});
     }
-    return std::string(at, p);
+    return {TqlPhrase::Text, std::string(at, p)};
 }
 
-bool Parser::Fail(TqlError code, const char* at, std::string expected, std::string found)
+bool Parser::Fail(TqlError code, const char* at, TqlTerm expected, TqlTerm found)
 {
     TqlSyntaxError& error = m_structure.error;
     error.code = code;
@@ -283,7 +282,7 @@ bool Parser::Fail(TqlError code, const char* at, std::string expected, std::stri
     error.line = m_lineNumber;
     error.column = CountCharacters({m_line, static_cast<std::size_t>(at - m_line)}) + 1;
     error.message = m_file + ", line " + std::to_string(error.line) + ", column " + std::to_string(error.column) +
-                    ": expected " + expected + ", found " + found;
+                    ": expected " + TermText(expected) + ", found " + TermText(found);
     error.expected = std::move(expected);
     error.found = std::move(found);
     return false;
@@ -307,7 +306,7 @@ bool IsParamList(std::string_view params)
         return false;
     while (p < end) {
         const ParamScan param = ScanParam(p);
-        if (param.expected)
+        if (param.expected != TqlPhrase::None)
             return false;
         if (param.end == end)
             return true;

@@ -44,15 +44,10 @@ struct Quoting
 {
     char close;
     CharClass stop;
-    const char* unclosed;
-    const char* control;
-    const char* badEscape;
+    TqlPhrase unclosed, badEscape;
 };
-constexpr const char* ControlsEscaped = "no control character (they are written \\u{...})";
-constexpr Quoting StringQuoting{'"', StringStop, "\" closing the string", ControlsEscaped,
-                                "one of the escapes \\\" \\\\ \\n \\r \\t \\u{...}"};
-constexpr Quoting FileQuoting{'>', FileStop, "> closing the file name", ControlsEscaped,
-                              "one of the escapes \\> \\\\ \\u{...}"};
+constexpr Quoting StringQuoting{'"', StringStop, TqlPhrase::StringEnd, TqlPhrase::StringEscape};
+constexpr Quoting FileQuoting{'>', FileStop, TqlPhrase::FileNameEnd, TqlPhrase::FileNameEscape};
 
 const Quoting& QuotingOf(char open)
 {
@@ -77,13 +72,13 @@ ParamScan ScanQuoted(const char* p)
                    EqualMask(block, 0x7F);
         });
         if (*p == quoting.close)
-            return {p + 1, nullptr};
+            return {p + 1};
         if (*p == '\t') {
             ++p;
             continue;
         }
         if (*p != '\\')
-            return {p, *p == '\n' || *p == '\r' ? quoting.unclosed : quoting.control};
+            return {p, *p == '\n' || *p == '\r' ? quoting.unclosed : TqlPhrase::NoControl};
         const char letter = p[1];
         if (letter == quoting.close || letter == '\\' || FindEscape(quoting, letter)) {
             p += 2;
@@ -94,7 +89,7 @@ ParamScan ScanQuoted(const char* p)
             return {p, quoting.badEscape};
         const char* const end = ScanCodePoint(p + 2, value);
         if (!end)
-            return {p, "\\u{...} with the hexadecimal number of a character"};
+            return {p, TqlPhrase::CodePoint};
         p = end;
     }
 }
@@ -103,8 +98,8 @@ ParamScan ScanWord(const char* p)
 {
     for (const std::string_view word : {std::string_view("true"), std::string_view("false")})
         if (std::strncmp(p, word.data(), word.size()) == 0 && Is(p[word.size()], WordEnd))
-            return {p + word.size(), nullptr};
-    return {p, "true or false"};
+            return {p + word.size()};
+    return {p, TqlPhrase::TrueOrFalse};
 }
 
 // Length of the run that a string or file name copies unchanged.
@@ -184,9 +179,9 @@ ParamScan ScanParam(const char* p)
         break;
     }
     if (!StartsNumber(*p))
-        return {p, "a parameter (a number, true, false, \"text\" or <file name>)"};
+        return {p, TqlPhrase::Parameter};
     const NumberScan number = ScanNumber(p);
-    return number.expected ? ParamScan{p, number.expected} : ParamScan{number.end, nullptr};
+    return number.type == TqlType::None ? ParamScan{p, number.expected} : ParamScan{number.end};
 }
 
 namespace {

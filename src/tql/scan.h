@@ -12,8 +12,8 @@ namespace tql {
 
 struct ParamScan
 {
-    const char* end = nullptr;      // past the parameter; where it went wrong, when `expected` is set
-    const char* expected = nullptr; // null: the parameter is well formed
+    const char* end = nullptr;            // past the parameter; where it went wrong, when `expected` is set
+    TqlPhrase expected = TqlPhrase::None; // none: the parameter is well formed
 };
 
 /// Checks the parameter that starts at `p` (no blank).

@@ -12,6 +12,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <system_error>
 #include <variant>
 #include <vector>
 
@@ -30,6 +31,24 @@ enum class TqlError : int
     Write       // tqlAppend could not write
 };
 
+/// What a message of the parser speaks of; their words are in tql/phrases.inc.
+enum class TqlPhrase : std::uint8_t
+{
+    None,
+#define TQL_PHRASE(name, english) name,
+#include "tql/phrases.inc"
+#undef TQL_PHRASE
+};
+/// The words in English, with %1 where a piece of the text goes.
+const char* tqlPhraseText(TqlPhrase phrase);
+
+/// A phrase with the piece of the text that it speaks of.
+struct TqlTerm
+{
+    TqlPhrase phrase = TqlPhrase::None;
+    std::string text{};
+};
+
 /// Where a load stopped and why. `message` is one sentence for the user, for example
 /// "river.hdkv, line 812, column 14: expected [/InitList], found [/WindList]".
 struct TqlSyntaxError
@@ -38,8 +57,9 @@ struct TqlSyntaxError
     std::string file;       // name as given to the load, without its folder
     std::size_t line = 0;   // from 1; 0 when the file could not be read at all
     std::size_t column = 0; // from 1, in characters (code points)
-    std::string expected;
-    std::string found;
+    TqlTerm expected;       // these two only of a text that was read
+    TqlTerm found;
+    std::error_code reason; // of a file that could not be read
     std::string message;
 };
 

@@ -58,9 +58,7 @@ class Unreadable(Case):
 
     def test_bar_says_so(self):
         editor = self.open(self.TEXT)
-        if editor.no_message():
-            editor.press('Return')
-            editor.settle()
+        self.assert_no_message()
         labels = ' '.join(w.text for w in editor.frame.all('label'))
         self.assertIn('line 3', labels)
         before = self.saved().text
@@ -69,6 +67,21 @@ class Unreadable(Case):
         if editor.no_message():
             editor.press('Escape')
         self.assertEqual(self.saved().text, before)
+
+
+    def test_member_of_a_project_says_so_in_the_users_language(self):
+        editor = self.open_project(self.TEXT, language='ja_JP')
+        self.assert_no_message()
+        labels = ' '.join(w.text for w in editor.frame.all('label'))
+        self.assertIn('3 行 20 文字目', labels)
+        self.assertNotIn('expected', labels)
+
+    def test_members_that_do_not_open_are_told_once(self):
+        samples.write_project(self.folder)
+        for name in ('moor.kvnw', 'moor.kvxs'):
+            samples.write(f'{self.folder}/{name}', '[Other\n')
+        self.start('moor.kvrp')
+        self.assert_told_once('These files of the project', 'moor.kvnw, line 1, column 7', 'moor.kvxs, line 1, column 7')
 
 
 class WhereFilesStand(Case):
@@ -94,6 +107,20 @@ class WhereFilesStand(Case):
     def test_mode_stays(self):
         os.chmod(samples.write(f'{self.folder}/river.hdkv', samples.hd_text()), 0o640)
         self.assertEqual(stat.S_IMODE(os.stat(self.open_river()).st_mode), 0o640)
+
+
+    def test_save_as_leaves_no_twin(self):
+        """It takes the place of the file that the user agreed to replace, whatever the case of its extension."""
+        samples.write(f'{self.folder}/b.hdkv', '[Other]\n[/Other]\n')
+        editor = self.open()
+        editor.menu('File', 'Save As')
+        editor.box()
+        editor.press('ctrl+a')
+        editor.type('b.hdkv\n')
+        self.assert_told_once('b.hdkv exists already', button='Yes')
+        wait_for(lambda: editor.title.startswith('b.HDKV') or 'b.HDKV' in editor.title, 'the new name is shown')
+        self.assertEqual(sorted(f for f in os.listdir(self.folder) if f.startswith('b.')), ['b.HDKV'])
+        self.assertIn('b.hdkv is now b.HDKV', editor.status())
 
 
 class WhatASaveDrops(Case):

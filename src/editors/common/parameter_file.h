@@ -18,7 +18,7 @@ public:
     CParameterFile(const CParameterFile&) = delete;
     CParameterFile& operator=(const CParameterFile&) = delete;
     tqlHandle Get() const { return m_handle; }
-    /// The parser's sentence with file, line and column; empty when the file was read well.
+    /// What the parser says, with file, line and column, in the user's language; empty when the file was read well.
     CString SyntaxError() const;
     /// "river.kvnw, line 12: <what>" for a section, keyword or parameter of the file `path`.
     static CString ErrorAt(const CString& path, tqlHandle node, const CString& what);

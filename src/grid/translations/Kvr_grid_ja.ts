@@ -117,6 +117,10 @@
         <translation>「%1」は日時ではありません。%2 のように入力してください。</translation>
     </message>
     <message>
+        <source>&quot;%1&quot; holds a part of a second. Times are kept to the whole second. Expected one such as %2.</source>
+        <translation>「%1」には 1 秒未満の端数があります。時刻は秒単位で保存されます。%2 のように入力してください。</translation>
+    </message>
+    <message>
         <source>Line %1 of %2</source>
         <translation>%1 行目 / 全 %2 行</translation>
     </message>

@@ -2,23 +2,12 @@
 #include "ks/fc/doc.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/file_dialog.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
-
-namespace {
-
-bool SameFile(const CString& a, const CString& b)
-{
-    if (a.isEmpty() || b.isEmpty())
-        return false;
-    const CString first = QFileInfo(a).canonicalFilePath(), second = QFileInfo(b).canonicalFilePath();
-    return first.isEmpty() || second.isEmpty() ? QDir::cleanPath(a) == QDir::cleanPath(b) : first == second;
-}
-
-} // namespace
 
 CString CKsDoc::SavePathFor(const CString& path) const
 {
@@ -88,9 +77,9 @@ CString CKsDoc::AskSavePath()
                 tr("%1 is open in another window. Choose another name.").arg(QDir::toNativeSeparators(written)));
             continue;
         }
-        // A name that differs from the file written by its case only is one that the user takes for that file.
-        const CString taken = QFileInfo::exists(written) || !QFileInfo::exists(path) ? written : path;
-        if (!QFileInfo::exists(taken) || SameFile(taken, m_path) ||
+        // A file whose name differs in its case only is the one that the user means.
+        const CString taken = KsExistingSpelling(written);
+        if (!QFileInfo::exists(taken) || KsSameFile(taken, m_path) ||
             KsMessageBox(tr("%1 exists already. Replace it?").arg(QDir::toNativeSeparators(taken)),
                          QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
             return path;

@@ -11,6 +11,8 @@ KsMessageBoxHandler& Handler()
     return handler;
 }
 
+CKsKeptMessages* keeper = nullptr; // the innermost one
+
 QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
 {
     return buttons == QMessageBox::Ok ? QMessageBox::Warning : QMessageBox::Question;
@@ -20,6 +22,10 @@ QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
 QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent,
                                          const CString& details, QMessageBox::StandardButton defaultButton)
 {
+    if (keeper && buttons == QMessageBox::Ok) {
+        keeper->m_texts << text;
+        return QMessageBox::Ok;
+    }
     if (const auto handler = Handler())
         return handler(text, buttons);
     QMessageBox box(IconFor(buttons), QCoreApplication::applicationName(), text, buttons,
@@ -35,4 +41,11 @@ QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::Stand
 KsMessageBoxHandler KsSetMessageBoxHandler(KsMessageBoxHandler handler)
 {
     return std::exchange(Handler(), std::move(handler));
+}
+
+CKsKeptMessages::CKsKeptMessages() : m_outer(std::exchange(keeper, this)) {}
+
+CKsKeptMessages::~CKsKeptMessages()
+{
+    keeper = m_outer;
 }

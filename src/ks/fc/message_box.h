@@ -5,6 +5,7 @@
 #include "ks/ks_export.h"
 
 #include <QMessageBox>
+#include <QStringList>
 #include <functional>
 
 class QWidget;
@@ -15,6 +16,24 @@ KS_API QMessageBox::StandardButton KsMessageBox(const CString& text,
                                                 QMessageBox::StandardButtons buttons = QMessageBox::Ok,
                                                 QWidget* parent = nullptr, const CString& details = {},
                                                 QMessageBox::StandardButton defaultButton = QMessageBox::NoButton);
+
+/// While it lives, messages that ask nothing are kept instead of shown, so that they can be told together. Questions are
+/// asked at once. The innermost one keeps.
+class KS_API CKsKeptMessages
+{
+public:
+    CKsKeptMessages();
+    ~CKsKeptMessages();
+    CKsKeptMessages(const CKsKeptMessages&) = delete;
+    CKsKeptMessages& operator=(const CKsKeptMessages&) = delete;
+    const QStringList& Texts() const { return m_texts; }
+
+private:
+    friend QMessageBox::StandardButton KsMessageBox(const CString&, QMessageBox::StandardButtons, QWidget*,
+                                                    const CString&, QMessageBox::StandardButton);
+    QStringList m_texts;
+    CKsKeptMessages* m_outer;
+};
 
 using KsMessageBoxHandler =
     std::function<QMessageBox::StandardButton(const CString& text, QMessageBox::StandardButtons buttons)>;

@@ -131,4 +131,151 @@
         <translation>%1。</translation>
     </message>
 </context>
+<context>
+    <name>SyntaxError</name>
+    <message>
+        <source>%1 cannot be read: %2</source>
+        <translation>%1 を読み込めません: %2</translation>
+    </message>
+    <message>
+        <source>%1, line %2, column %3: expected %4, found %5</source>
+        <translation>%1、%2 行 %3 文字目: %4 が必要ですが、%5 があります</translation>
+    </message>
+    <message>
+        <source>the end of the line</source>
+        <translation>行末</translation>
+    </message>
+    <message>
+        <source>the end of the file</source>
+        <translation>ファイルの終わり</translation>
+    </message>
+    <message>
+        <source>a parameter file</source>
+        <translation>パラメータファイル</translation>
+    </message>
+    <message>
+        <source>an empty file</source>
+        <translation>空のファイル</translation>
+    </message>
+    <message>
+        <source>a line of at most 16 MiB</source>
+        <translation>16 MiB 以下の行</translation>
+    </message>
+    <message>
+        <source>a longer one</source>
+        <translation>それより長い行</translation>
+    </message>
+    <message>
+        <source>at most 128 sections inside one another</source>
+        <translation>128 段以下のセクションの入れ子</translation>
+    </message>
+    <message>
+        <source>one more</source>
+        <translation>それより深い入れ子</translation>
+    </message>
+    <message>
+        <source>text in UTF-8</source>
+        <translation>UTF-8 のテキスト</translation>
+    </message>
+    <message>
+        <source>a NUL character</source>
+        <translation>NUL 文字</translation>
+    </message>
+    <message>
+        <source>the byte 0x%1</source>
+        <translation>バイト 0x%1</translation>
+    </message>
+    <message>
+        <source>a section in brackets, a keyword or a comment</source>
+        <translation>角括弧で囲んだセクション、キーワード、またはコメント</translation>
+    </message>
+    <message>
+        <source>a line feed after the carriage return</source>
+        <translation>復帰文字の直後の改行文字</translation>
+    </message>
+    <message>
+        <source>a name of letters, digits, &apos;_&apos;, &apos;-&apos; and &apos;.&apos;</source>
+        <translation>文字、数字、&apos;_&apos;、&apos;-&apos;、&apos;.&apos; からなる名前</translation>
+    </message>
+    <message>
+        <source>] behind the name (names have letters, digits, &apos;_&apos;, &apos;-&apos; and &apos;.&apos; only)</source>
+        <translation>名前の直後の ](名前に使えるのは文字、数字、&apos;_&apos;、&apos;-&apos;、&apos;.&apos; だけです)</translation>
+    </message>
+    <message>
+        <source>a target in brackets, such as [Name]</source>
+        <translation>[Name] のように角括弧で囲んだターゲット</translation>
+    </message>
+    <message>
+        <source>a target in brackets, such as [Name], before any keyword</source>
+        <translation>キーワードより前に、[Name] のように角括弧で囲んだターゲット</translation>
+    </message>
+    <message>
+        <source>= behind the keyword&apos;s name</source>
+        <translation>キーワード名の後の =</translation>
+    </message>
+    <message>
+        <source>a comma or the end of the line</source>
+        <translation>コンマまたは行末</translation>
+    </message>
+    <message>
+        <source>a parameter (a number, true, false, &quot;text&quot; or &lt;file name&gt;)</source>
+        <translation>パラメータ(数値、true、false、&quot;文字列&quot;、&lt;ファイル名&gt; のいずれか)</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true または false</translation>
+    </message>
+    <message>
+        <source>a number such as -12, 0.5 or 1e-05</source>
+        <translation>-12、0.5、1e-05 のような数値</translation>
+    </message>
+    <message>
+        <source>an integer from -2147483648 to 2147483647</source>
+        <translation>-2147483648 から 2147483647 までの整数</translation>
+    </message>
+    <message>
+        <source>a number within the range of 64-bit floats</source>
+        <translation>64 ビット浮動小数点数の範囲内の数値</translation>
+    </message>
+    <message>
+        <source>&quot; closing the string</source>
+        <translation>文字列を閉じる &quot;</translation>
+    </message>
+    <message>
+        <source>&gt; closing the file name</source>
+        <translation>ファイル名を閉じる &gt;</translation>
+    </message>
+    <message>
+        <source>one of the escapes \&quot; \\ \n \r \t \u{...}</source>
+        <translation>エスケープ \&quot; \\ \n \r \t \u{...} のいずれか</translation>
+    </message>
+    <message>
+        <source>one of the escapes \&gt; \\ \u{...}</source>
+        <translation>エスケープ \&gt; \\ \u{...} のいずれか</translation>
+    </message>
+    <message>
+        <source>\u{...} with the hexadecimal number of a character</source>
+        <translation>文字の 16 進番号を入れた \u{...}</translation>
+    </message>
+    <message>
+        <source>no control character (they are written \u{...})</source>
+        <translation>制御文字以外の文字(制御文字は \u{...} と書きます)</translation>
+    </message>
+    <message>
+        <source>a blank</source>
+        <translation>空白</translation>
+    </message>
+    <message>
+        <source>a tab</source>
+        <translation>タブ</translation>
+    </message>
+    <message>
+        <source>a carriage return</source>
+        <translation>復帰文字</translation>
+    </message>
+    <message>
+        <source>the control character U+%1</source>
+        <translation>制御文字 U+%1</translation>
+    </message>
+</context>
 </TS>

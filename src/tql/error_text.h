@@ -1,0 +1,12 @@
+// Messages in English.
+#pragma once
+
+#include "tql/tql.h"
+
+namespace tql {
+
+std::string TermText(const TqlTerm& term);
+/// Why a file could not be read.
+std::string ReasonText(std::error_code reason);
+
+} // namespace tql
