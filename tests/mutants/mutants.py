@@ -46,7 +46,7 @@ MUTANTS = [
     ('grid', 'grid/grid_model.cpp', 'rule == BlankRule::Fill && spec.fill ?', 'rule == BlankRule::Zero && spec.fill ?'),
     ('grid', 'grid/grid_model.cpp', 'm_document->UndoStack().beginMacro(step);\n', 'm_document->UndoStack().beginMacro(step.left(1));\n'),
     ('grid', 'grid/typing.cpp', 'm_before + m_after < m_length', 'm_before + m_after <= m_length'),
-    ('grid', 'grid/typing.cpp', 'if (!m_field->isEnabled() && IsTyped())', 'if (false)'),
+    ('grid', 'grid/typing.cpp', 'if (!m_field->isVisible() || !m_field->isEnabled()) { // a setting took it away', 'if (false) {'),
     ('grid', 'grid/grid_search.cpp', 'return shown < wanted;', 'return shown <= wanted;'),
     # Document and pages.
     ('document', 'document/purged_lines.cpp', 'while (all.size() < lines.rows[i])', 'while (all.size() + 1 < lines.rows[i])'),
