@@ -70,7 +70,10 @@ void CKavo0_hdView::OnInitialUpdate()
 
     AddTabs();
     m_inProject = GetDocument()->GetProjectInfo(this, GetDocument()->GetPathName());
-    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowLine);
+    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, [this] {
+        m_said.clear();
+        ShowLine();
+    });
     connect(GetDocument(), &CKavo0_hdDoc::Said, this, &CKavo0_hdView::Say);
     for (auto switched : {&KsUnits::Changed, &KsUnits::DigitsChanged})
         connect(&KsUnits::Instance(), switched, this, [this] { OnUpdate(nullptr, Hint::Reload, nullptr); });
@@ -124,7 +127,8 @@ void CKavo0_hdView::OnUpdate(CView*, int hint, CHint*)
         page->StoreToDocument();
     else if (hint == Hint::Reload)
         page->LoadFromDocument(GetDocument());
-    ShowLine(); // a paste or an undone step may have changed the list and the current cell
+    m_said.clear(); // of what was before
+    ShowLine();     // a paste or an undone step may have changed the list and the current cell
 }
 
 bool CKavo0_hdView::MayLeave(KsLeave what)
@@ -173,19 +177,25 @@ void CKavo0_hdView::CurrentLocationChanged()
         TellLocationLater();
 }
 
+QStringList CKavo0_hdView::LineTexts() const
+{
+    const auto* page = ActivePage();
+    const auto* grid = page ? page->LinesGrid() : nullptr;
+    const QString line = grid ? grid->LineText() : QString();
+    return line.isEmpty() ? QStringList() : QStringList(line);
+}
+
 /// In the status bar: the line of the table that is worked in, the number of its current cell where the cell leaves
 /// digits out, and what has just been done.
 void CKavo0_hdView::ShowLine()
 {
     if (!MainFrame() || MainFrame()->GetActiveView() != this)
         return;
-    const auto* page = ActivePage();
-    const auto* grid = page ? page->LinesGrid() : nullptr;
-    QStringList parts;
-    if (const QString line = grid ? grid->LineText() : QString(); !line.isEmpty())
-        parts << line;
-    if (const QString said = std::exchange(m_said, {}); !said.isEmpty())
-        parts << said;
+    QStringList parts = LineTexts();
+    if (m_saidAt != parts)
+        m_said.clear(); // the user has gone on
+    if (!m_said.isEmpty())
+        parts << m_said;
     KsTellStatus(*this, parts.join(QStringLiteral("   ")));
 }
 
@@ -194,6 +204,7 @@ void CKavo0_hdView::Say(const QString& text)
 {
     QTimer::singleShot(0, this, [this, text] {
         m_said = text;
+        m_saidAt = LineTexts();
         ShowLine();
     });
 }

@@ -58,6 +58,7 @@ private:
 
     LRESULT AnswerEditor(WPARAM request, CKSComm_Package* package);
     void FetchLocation();
+    QStringList LineTexts() const;
     void ShowLine();
     void Say(const QString& text);
     void TellLocationLater();
@@ -77,7 +78,8 @@ private:
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_inProject = false;
     bool m_tellLocation = false; // once the present event is over
-    QString m_said;              // in the status bar, behind the line
+    QString m_said;              // in the status bar, behind the line; until the user goes on
+    QStringList m_saidAt;        // what stood there when it was said
     SearchState m_search;
     bool m_linesEnabled = true;
 };

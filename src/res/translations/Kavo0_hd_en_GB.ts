@@ -2081,6 +2081,10 @@ Right X-Y coordinates
 User defined marks</translation>
         </message>
         <message>
+        <source>At most %1 characters fit in here; the end of what was typed or pasted is missing.</source>
+        <translation>At most %1 characters fit in here; the end of what was typed or pasted is missing.</translation>
+    </message>
+    <message>
         <source>%1: &quot;%2&quot; was typed.</source>
         <translation>%1: &quot;%2&quot; was typed.</translation>
     </message>
@@ -2208,7 +2212,8 @@ six integers
 a count that fits the %1 parameters behind it
 a flag for each of %1 titles
 a target [%1]
-more parameters, or a smaller count</source>
+more parameters, or a smaller count
+only one of this name; the first counts</source>
             <translation>a number
 an integer
 true or false
@@ -2218,7 +2223,8 @@ six integers
 a count that fits the %1 parameters behind it
 a flag for each of %1 titles
 a target [%1]
-more parameters, or a smaller count</translation>
+more parameters, or a smaller count
+only one of this name; the first counts</translation>
         </message>
         <message>
             <source>&amp;Copy</source>

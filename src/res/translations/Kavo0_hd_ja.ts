@@ -2081,6 +2081,10 @@ User defined marks</source>
 ユーザー定義マーク</translation>
         </message>
         <message>
+        <source>At most %1 characters fit in here; the end of what was typed or pasted is missing.</source>
+        <translation>ここに入るのは %1 文字までです。入力または貼り付けられた内容の末尾が欠けています。</translation>
+    </message>
+    <message>
         <source>%1: &quot;%2&quot; was typed.</source>
         <translation>%1: 「%2」と入力されました。</translation>
     </message>
@@ -2208,7 +2212,8 @@ six integers
 a count that fits the %1 parameters behind it
 a flag for each of %1 titles
 a target [%1]
-more parameters, or a smaller count</source>
+more parameters, or a smaller count
+only one of this name; the first counts</source>
             <translation>数値
 整数
 true または false
@@ -2218,7 +2223,8 @@ true または false
 後に続く %1 個のパラメータに合う個数
 %1 個のタイトルごとに 1 個のフラグ
 ターゲット [%1]
-より多くのパラメータ、またはより小さい個数</translation>
+より多くのパラメータ、またはより小さい個数
+この名前は 1 つだけ (最初のものが有効)</translation>
         </message>
         <message>
             <source>&amp;Copy</source>
