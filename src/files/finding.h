@@ -47,9 +47,9 @@ struct Finding
 
     /// Whether rewriting the file would lose what stands there.
     bool LosesContent() const { return kind <= NoTarget; }
-    /// Whether the user must know before relying on what is shown: a value was lost or taken for another, or a count
-    /// leaves parameters missing and so may have been meant otherwise.
-    bool NeedsAttention() const { return kind <= OtherType || (kind == Missing && behind > 0); }
+    /// Whether the user must know before relying on what is shown: a value was lost or taken for another, defaults stand
+    /// where parameters are missing, or something stands in the file that is never shown because it was there before.
+    bool NeedsAttention() const { return kind <= OtherType || kind == Missing || kind == Repeated; }
 };
 
 /// One sentence in English, without the place.

@@ -69,7 +69,8 @@ void CollectUnknown(tqlHandle section, const KnownNames& known, UnknownNodes& no
         if (report)
             report->Add(node, isSection ? nullptr : node,
                         {.kind = known(name, isSection) == Known::No ? Finding::Unknown : Finding::Repeated,
-                         .section = std::string(isSection ? name : std::string_view())});
+                         .section = std::string(isSection ? name : std::string_view()),
+                         .found = isSection ? std::string() : std::string(tqlGetRawParams(node))});
         nodes.push_back(CopyNode(node, isSection));
     });
 }

@@ -176,8 +176,7 @@ void CGenGrid::focusOutEvent(QFocusEvent* event)
 {
     QTableView::focusOutEvent(event);
     // Whatever is edited next reloads the rows, so the line is stored first.
-    if (event->reason() != Qt::PopupFocusReason && event->reason() != Qt::ActiveWindowFocusReason &&
-        !isAncestorOf(QApplication::focusWidget()))
+    if (!StaysBeingEdited(event->reason()) && !isAncestorOf(QApplication::focusWidget()))
         StoreEditedLine(BlankRule::Fill);
 }
 

@@ -282,8 +282,7 @@ void CGridDelegate::LostFocus(const QEvent* event)
     // The editor stays while another window or its own pop-up is in front, and a click into the grid is the grid's to
     // judge: it commits before the current cell moves.
     const bool inGrid = focus && (focus == m_grid || m_grid->isAncestorOf(focus));
-    if (reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || inGrid || !m_grid->Host() ||
-        m_telling || !m_editor || !m_index.isValid())
+    if (StaysBeingEdited(reason) || inGrid || !m_grid->Host() || m_telling || !m_editor || !m_index.isValid())
         return;
     if (Refusal().isEmpty()) {
         Commit();

@@ -35,14 +35,13 @@ qsizetype CommonEnd(const QString& a, const QString& b)
     return std::mismatch(a.rbegin(), a.rend(), b.rbegin(), b.rend()).first - a.rbegin();
 }
 
-/// Another window or a menu in front does not leave a field.
-bool StaysInField(const QEvent* event)
-{
-    const auto reason = static_cast<const QFocusEvent*>(event)->reason();
-    return reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason;
-}
-
 } // namespace
+
+bool StaysBeingEdited(Qt::FocusReason reason)
+{
+    return reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason ||
+           reason == Qt::MenuBarFocusReason;
+}
 
 void TellRefusal(QWidget& widget, const QString& message, const QString& details)
 {
@@ -85,6 +84,7 @@ CTyping::CTyping(QLineEdit* field, TypedField what) : QObject(field), m_field(fi
 {
     field->installEventFilter(this);
     connect(field, &QLineEdit::textEdited, this, &CTyping::Edited);
+    connect(field, &QLineEdit::inputRejected, this, [this] { m_cut = m_field->text().size() >= m_field->maxLength(); });
     // Told after an edit, so during one this is the selection that the edit replaced.
     connect(field, &QLineEdit::selectionChanged, this, [this] {
         m_selected = m_field->selectionStart();
@@ -97,6 +97,7 @@ void CTyping::Shown()
 {
     m_text = m_field->text();
     m_length = m_before = m_after = m_text.size();
+    m_cut = false;
     m_field->setModified(false);
 }
 
@@ -109,6 +110,16 @@ void CTyping::Edited(const QString& text)
     m_before = std::clamp<qsizetype>(start, 0, m_before);
     m_after = std::clamp<qsizetype>(end, 0, m_after);
     m_text = text;
+    m_cut = m_cut && text.size() >= m_field->maxLength();
+}
+
+/// A number whose end is missing may still be one, but not the one that was meant.
+QString CTyping::Complaint() const
+{
+    if (m_cut)
+        return GridTexts::tr("At most %1 characters fit in here; the end of what was typed or pasted is missing.")
+            .arg(m_field->maxLength());
+    return m_what.complaint ? m_what.complaint() : QString();
 }
 
 bool CTyping::IsTyped() const
@@ -199,7 +210,7 @@ bool CTyping::eventFilter(QObject* object, QEvent* event)
         return false;
     switch (event->type()) {
     case QEvent::FocusOut:
-        if (!StaysInField(event))
+        if (!StaysBeingEdited(static_cast<QFocusEvent*>(event)->reason()))
             FocusLost();
         return false;
     case QEvent::EnabledChange:

@@ -18,6 +18,10 @@ QString OutOfRange();
 /// "0.5 to 1", "at least 0" and so on; a bound may be empty.
 QString AllowedRange(const QString& minimum, const QString& maximum);
 
+/// Whether a field or cell that loses the focus for this reason is still being edited: another window, a menu or a
+/// list that it opened is in front for a while.
+bool StaysBeingEdited(Qt::FocusReason reason);
+
 /// What a field knows about its value.
 struct TypedField
 {
@@ -52,7 +56,7 @@ protected:
 
 private:
     bool MayWait() const;
-    QString Complaint() const { return m_what.complaint ? m_what.complaint() : QString(); }
+    QString Complaint() const;
     void FocusLost();
     bool KeyPressed(int key);
     void Edited(const QString& text);
@@ -64,4 +68,5 @@ private:
     qsizetype m_length = 0;              // of the text shown
     qsizetype m_selected = -1, m_selectedLength = 0;
     bool m_telling = false;
+    bool m_cut = false; // what was typed or pasted last did not fit, and its end is missing
 };

@@ -43,7 +43,8 @@ QString ExpectedText(const Finding& finding)
         FittingCount,
         FewerFlags,
         Target,
-        MoreParameters
+        MoreParameters,
+        OnlyOne
     };
     switch (finding.kind) {
     case Finding::CountDoesNotFit:
@@ -54,6 +55,8 @@ QString ExpectedText(const Finding& finding)
         return text(Target).arg(QString::fromStdString(finding.section));
     case Finding::Missing:
         return text(MoreParameters);
+    case Finding::Repeated:
+        return text(OnlyOne);
     default:
         break;
     }

@@ -56,7 +56,7 @@ void CKavo0_hdView::OnInitialUpdate()
 
     CKsProjectView::OnInitialUpdate();
     AddTabs();
-    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::ShowStatus);
+    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::MovedOn);
     if (auto* page = ActivePage())
         page->OnSetActive();
     KsAfterPaint(this, this, [this] { MakeOtherPages(); });

@@ -206,7 +206,24 @@ class Editor:
         return Table(self._shown('table', name, nth))
 
     def click_cell(self, line, column, table=None, **more):
-        self.click((table or self.table()).cell(line, column), **more)
+        table = table or self.table()
+        self.click(self.in_sight(table, table.cell(line, column)), **more)
+
+    def click_line(self, line, table=None, **more):
+        """On its number."""
+        table = table or self.table()
+        self.click(self.in_sight(table, table.line_number(line)), **more)
+
+    def in_sight(self, table, part):
+        """The part of a table, after the wheel was turned until its line is shown."""
+        for _ in range(200):
+            top, bottom = table.sight
+            middle = part.middle[1]
+            if top < middle < bottom:
+                return part
+            self.hands.wheel(*table.middle, down=middle >= bottom)
+            self.settle(0.02)
+        raise AssertionError('the wheel does not bring the line into sight')
 
     def put(self, line, column, text, speed=25, leave='Tab', table=None):
         """Types into a cell, in place of what stands there."""

@@ -41,6 +41,9 @@ class Hands:
         self._do('mousemove', x, y, *hold, 'click', '--repeat', times, '--delay', 40, button, *let_go)
         self._clicked = (x, y), time.monotonic()
 
+    def wheel(self, x, y, down):
+        self._do('mousemove', x, y, 'click', 5 if down else 4)
+
     def drag(self, start, end):
         self.log.append(f'drag {start} to {end}')
         self._do('mousemove', *start, 'mousedown', 1)

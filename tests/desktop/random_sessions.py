@@ -134,7 +134,7 @@ class RandomSession:
         if len(self.lines[self.page]) < 4:
             return
         line = self.a_line()
-        self.editor.click(self.editor.table().line_number(line))
+        self.editor.click_line(line)
         self.editor.press('Delete')
         del self.lines[self.page][line - 1]
 

@@ -169,6 +169,13 @@ class Table(Widget):
             elif child.role in ('table row header', 'table cell'):
                 return
 
+    @property
+    def sight(self):
+        """Top and bottom of where lines are shown, on the screen."""
+        _, y, _, height = self.place
+        header = next(self.children_until('table column header'), None)
+        return y + (header.place[3] if header else 0), y + height
+
     def line_number(self, line):
         """The header of a line."""
         return Widget(self._accessible.get_child_at_index((self.columns + 1) * line))

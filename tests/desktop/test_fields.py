@@ -132,7 +132,7 @@ class TableKeys(Case):
 
     def test_copy_after_undo(self):
         editor = self.open()
-        editor.click(editor.table().line_number(2))
+        editor.click_line(2)
         editor.press('Delete')
         editor.click_cell(1, 3)
         editor.press('ctrl+z')
@@ -152,7 +152,7 @@ class TableKeys(Case):
         editor.press('Delete')
         editor.settle()
         self.assertEqual(editor.table().lines, 3)
-        editor.click(editor.table().line_number(2))
+        editor.click_line(2)
         editor.press('Delete')
         editor.settle()
         table = editor.table()

@@ -32,7 +32,7 @@ class StatusBar(Case):
         editor.click_cell(1, 1)
         editor.press('Insert')
         self.assert_status('inserted')
-        editor.click(editor.table().line_number(2))
+        editor.click_line(2)
         editor.press('Delete')
         self.assert_status('deleted')
 

@@ -79,7 +79,7 @@ class Undo(Case):
         editor.put(1, 3, '0.875')
         editor.fill('Topographical', '0.75')
         editor.go_to('Initial')
-        editor.click(editor.table().line_number(2))
+        editor.click_line(2)
         editor.press('Delete')
         editor.save()
         changed = self.saved().text

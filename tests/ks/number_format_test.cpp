@@ -31,6 +31,7 @@ TEST(NumberFormat, PrintsWhatPrintfPrintsInTheCLocale)
     EXPECT_EQ(KsFormatNumber("%-.*lf", 1.5), "1.500000");
     EXPECT_EQ(KsFormatNumber("%.3lf", std::numeric_limits<double>::infinity()), "inf");
     EXPECT_EQ(KsFormatNumber("%.3lf", std::nan("")), "nan");
+    EXPECT_EQ(KsFormatNumber("%06.1f", -std::numeric_limits<double>::infinity()), "  -inf") << "no zeros before it";
     for (const char* none : {"", "text", "%d", "%", "%.3"})
         EXPECT_EQ(KsFormatNumber(none, 2.5), "2.5") << none;
 }

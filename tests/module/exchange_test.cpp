@@ -109,6 +109,16 @@ TEST_F(ExchangeTest, AChangeAsksWhoIsTypingOnceAndTakesNoLineFromUnderIt)
     CObList items = Items(0, "MAIN", 77); // as it is typed
     KvrMSGDeleteData({}, view, &items);
     EXPECT_EQ(Summary(Owned(KvrMSGGetData({}, view->GetDocument())).get()).substr(0, 10), "0 SIDE 0.1");
+
+    // A text that cannot be stored keeps its line, too.
+    grid->SetCurrentCell(1, 3);
+    for (const char key : {'1', 'e'})
+        QTest::keyClick(QApplication::focusWidget(), key);
+    items = Items(0, "SIDE", List(*view, 0).GetAt(0).Chainage);
+    KvrMSGDeleteData({}, view, &items);
+    EXPECT_EQ(List(*view, 0).GetCount(), 1u);
+    EXPECT_EQ(boxes.size(), 1) << "asked once";
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
 }
 
 TEST_F(ExchangeTest, MarksAndMaps)

@@ -125,6 +125,18 @@ TEST_F(CtrlEditTest, ARefusedTextGoesWithItsField)
     EXPECT_TRUE(field.hasFocus());
 }
 
+TEST_F(CtrlEditTest, ADisabledFieldShowsWhatIsStored)
+{
+    for (const char* typed : {"7", "7e"}) {
+        Type(typed);
+        field.setEnabled(false); // as a box beside it does
+        QTest::qWait(1);
+        EXPECT_EQ(field.text(), "1.23457") << typed;
+        field.setEnabled(true);
+    }
+    EXPECT_EQ(boxes, QStringList());
+}
+
 TEST_F(CtrlEditTest, RefusesAndKeepsTheFocus)
 {
     const double before = value;

@@ -36,6 +36,13 @@ TEST_F(GridEditTest, AMoveStoresTheLine)
     EXPECT_EQ(Stored(), "NECKAR 1 4.25 20, B 2 11 21");
 }
 
+TEST_F(GridEditTest, TheSameNumberSpeltAnewIsNoStep)
+{
+    Enter(1, 3, "10.0");
+    EXPECT_EQ(document.UndoStack().count(), 0);
+    EXPECT_FALSE(document.IsModified());
+}
+
 TEST_F(GridEditTest, EditingStartsWithTheWholeNumber)
 {
     init.GetAt(0).InitialH = 1.23456789;

@@ -203,6 +203,10 @@ TEST_F(MarkPagesTest, TheGlobalRowIsNoLineOfTheList)
     EXPECT_EQ(grid->TextAt(1, 1), "Global");
     Undo();
     Undo();
+    SelectRows(2, 2);
+    QTest::keyClick(grid, Qt::Key_Insert);
+    EXPECT_EQ(grid->TextAt(3, 1), "A") << "above the line chosen";
+    Undo();
     EXPECT_EQ(Texts(2), "A|10|Multiple ½|||0.000");
     view->page->InsertLocation("NEW", "12.5");
     EXPECT_EQ(document.Parameters().WLCurveList.GetAt(1).RiverName, "NEW");

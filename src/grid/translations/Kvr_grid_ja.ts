@@ -259,6 +259,10 @@
         <translation>行の削除</translation>
     </message>
     <message>
+        <source>At most %1 characters fit in here; the end of what was typed or pasted is missing.</source>
+        <translation>ここに入るのは %1 文字までです。入力または貼り付けられた内容の末尾が欠けています。</translation>
+    </message>
+    <message>
         <source>%1: &quot;%2&quot; was typed.</source>
         <translation>%1: 「%2」と入力されました。</translation>
     </message>

@@ -28,7 +28,7 @@ void CKsProjectView::OnInitialUpdate()
 
 void CKsProjectView::OnUpdate(CView*, int, CHint*)
 {
-    ShowStatus(); // a paste or an undone step may have changed the lines and the current cell
+    MovedOn(); // a paste or an undone step may have changed the lines and the current cell
 }
 
 void CKsProjectView::OnActivateView(bool activate, CView* activated, CView* deactivated)
@@ -56,9 +56,18 @@ void CKsProjectView::ShowStatus()
 {
     if (!MainFrame() || !IsActive())
         return;
-    QStringList parts{PlaceText(), std::exchange(m_said, {})};
+    const CString place = PlaceText();
+    if (place != m_saidAt)
+        m_said.clear();
+    QStringList parts{place, m_said};
     parts.removeAll(CString());
     KsTellStatus(*this, parts.join(QStringLiteral("   ")));
+}
+
+void CKsProjectView::MovedOn()
+{
+    m_said.clear();
+    ShowStatus();
 }
 
 /// When the present event is over: lines that become current in it are shown first, and would hide what is said.
@@ -66,6 +75,7 @@ void CKsProjectView::Say(const CString& text)
 {
     QTimer::singleShot(0, this, [this, text] {
         m_said = text;
+        m_saidAt = PlaceText();
         ShowStatus();
     });
 }

@@ -31,11 +31,14 @@ protected:
     virtual CString PlaceText() const { return {}; }
     /// In the status bar, while this view is the active one: where the user is, and what has just been done.
     void ShowStatus();
+    /// The user has turned to something else: what was done before is no longer told.
+    void MovedOn();
     bool IsActive() const; // a view outside a frame is
     CKsMDIFrameWnd* MainFrame() const;
 
 private:
     void Say(const CString& text);
     void SendToolbarMessage(unsigned message);
-    CString m_said; // not shown yet
+    CString m_said;   // in the status bar behind the place, until the user moves on
+    CString m_saidAt; // the place where it was said
 };

@@ -1960,28 +1960,6 @@ Used instead</source>
 代わりに使う値</translation>
     </message>
     <message>
-        <source>a number
-an integer
-true or false
-a text in quotes
-a file name in &lt; &gt;
-six integers
-a count that fits the %1 parameters behind it
-a flag for each of %1 titles
-a target [%1]
-more parameters, or a smaller count</source>
-        <translation>数値
-整数
-true または false
-引用符で囲んだ文字列
-&lt; &gt; で囲んだファイル名
-6 個の整数
-後に続く %1 個のパラメータに合う個数
-%1 個のタイトルごとに 1 個のフラグ
-ターゲット [%1]
-より多くのパラメータ、またはより小さい個数</translation>
-    </message>
-    <message>
         <source>&amp;Copy</source>
         <translation>コピー(&amp;C)</translation>
     </message>
@@ -2078,6 +2056,30 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
     <message>
         <source>%1 encroachment set-ups without a filled second line were not written</source>
         <translation>2行目が入力されていない河積阻害の設定%1件は書き込まれませんでした</translation>
+    </message>
+    <message>
+        <source>a number
+an integer
+true or false
+a text in quotes
+a file name in &lt; &gt;
+six integers
+a count that fits the %1 parameters behind it
+a flag for each of %1 titles
+a target [%1]
+more parameters, or a smaller count
+only one of this name; the first counts</source>
+        <translation>数値
+整数
+true または false
+引用符で囲んだ文字列
+&lt; &gt; で囲んだファイル名
+6 個の整数
+後に続く %1 個のパラメータに合う個数
+%1 個のタイトルごとに 1 個のフラグ
+ターゲット [%1]
+より多くのパラメータ、またはより小さい個数
+この名前は 1 つだけ (最初のものが有効)</translation>
     </message>
 </context>
 </TS>

@@ -1,0 +1,77 @@
+"""Faults that a test has to notice: (room, file below src, text that stands there once, the same with a fault)."""
+
+MUTANTS = [
+    # Text to tree and back.
+    ('tql', 'tql/utf8.cpp', 'first == 0xE0 && second < 0xA0', 'first == 0xE0 && second < 0x90'),
+    ('tql', 'tql/utf8.cpp', 'first == 0xF0 && second < 0x90', 'first == 0xF0 && second < 0x80'),
+    ('tql', 'tql/utf8.cpp', 'first == 0xF4 && second >= 0x90', 'first == 0xF4 && second > 0x90'),
+    ('tql', 'tql/utf8.cpp', "if (length == 0 || *p == '\\0')", 'if (length == 0)'),
+    ('tql', 'tql/number.cpp', 'std::numeric_limits<std::int32_t>::max()} + negative',
+     'std::numeric_limits<std::int32_t>::max()} + (negative || true)'),
+    ('tql', 'tql/number.cpp', 'digits > exactLimit', 'digits > 4 * exactLimit'),
+    ('tql', 'tql/number.cpp', '(value == 0 && std::signbit(value))', '(value == 0 && false)'),
+    ('tql', 'tql/number.cpp', 'if ((exponent || end - p > SafeLength)', 'if ((exponent && end - p > SafeLength)'),
+    ('tql', 'tql/scan.cpp', "*p == '}' && IsScalarValue(value) ?", "*p == '}' ?"),
+    # Fields, unknown content, the safe writer.
+    ('files', 'files/unknown_content.cpp', 'return !m_met.insert(name).second;', 'return false;'),
+    ('files', 'files/field_io.cpp', 'if (!tqlGetDouble(param, &number) || std::trunc(number) != number ||',
+     'if (!tqlGetDouble(param, &number) ||'),
+    ('files', 'files/field_io.cpp', 'number != 0 && number != 1', 'number < 0'),
+    ('files', 'files/safe_file.cpp', 'if (!error && sync)', 'if (!error && sync && text.empty())'),
+    ('files', 'files/safe_file.cpp', 'return error ? error : closed;', 'return closed ? error : error;'),
+    ('files', 'files/safe_file.cpp', 'text.remove_prefix(written);', 'text = {};'),
+    ('files', 'files/safe_file.cpp', 'existed && !fs::exists(target, ignored)', 'existed && false'),
+    # Lists and files.
+    ('data', 'data/gen_list.cpp', 'return record->IsBlank(); });', 'return record->RiverName.empty(); });'),
+    ('data', 'data/gen_list.cpp', 'if (record.Chainage == chainage)', 'if (record.Chainage >= chainage)'),
+    ('data', 'data/gen_list.cpp', 'occurrence > 1 || !report->firstLineMayBeBlank', 'occurrence > 1'),
+    ('data', 'data/gen_list.cpp', 'm_records.erase(first, last);', 'm_records.erase(first, first + 1);'),
+    # The tool.
+    ('cli', 'cli/record_table.cpp', 'text.find_first_of(",\\"\\r\\n")', 'text.find_first_of(",\\r\\n")'),
+    ('cli', 'cli/record_table.cpp', 'if (m_withSet)\n            stream', 'if (!m_withSet)\n            stream'),
+    ('cli', 'cli/field_text.cpp', '(text.size() == 1 ? "0" : "")', '""'),
+    # The shell's libraries.
+    ('ks', 'ks/units/number_format.cpp', 'magnitude >= 1e-5 && magnitude < 1e15', 'magnitude >= 1e-3 && magnitude < 1e15'),
+    ('ks', 'ks/units/number_format.cpp', 'format.zeros && std::isfinite(value) ?', 'format.zeros ?'),
+    ('ks', 'ks/fc/branch_name.cpp', 'return a.size() == b.size();', 'return true;'),
+    ('ks', 'ks/fc/file_name.cpp', 'Qt::CaseInsensitive', 'Qt::CaseSensitive'),
+    ('ks', 'ks/fc/doc_save.cpp', 'case QMessageBox::Discard:\n        return true;',
+     'case QMessageBox::Discard:\n        return false;'),
+    # The grid.
+    ('grid', 'grid/number_syntax.cpp', 'return IsTiny(text) ? std::optional(0.0) : std::nullopt;', 'return IsTiny(text) ? std::nullopt : std::optional(0.0);'),
+    ('grid', 'grid/grid_clipboard.cpp', "c == u'\\t' || c == u'\\n' || c == u'\\r' || c == u'\"'; });",
+     "c == u'\\t' || c == u'\\n' || c == u'\\r'; });"),
+    ('grid', 'grid/grid_clipboard.cpp', "text.indexOf(u'\"', at + 1) >= 0", 'true'),
+    ('grid', 'grid/grid_model.cpp', 'if (Same(before, after))\n            continue;', ''),
+    ('grid', 'grid/grid_model.cpp', 'rule == BlankRule::Fill && spec.fill ?', 'rule == BlankRule::Zero && spec.fill ?'),
+    ('grid', 'grid/grid_model.cpp', 'm_document->UndoStack().beginMacro(step);\n', 'm_document->UndoStack().beginMacro(step.left(1));\n'),
+    ('grid', 'grid/typing.cpp', 'm_before + m_after < m_length', 'm_before + m_after <= m_length'),
+    ('grid', 'grid/typing.cpp', 'if (!m_field->isVisible() || !m_field->isEnabled()) { // a setting took it away', 'if (false) {'),
+    ('grid', 'grid/grid_search.cpp', 'return shown < wanted;', 'return shown <= wanted;'),
+    # Document and pages.
+    ('document', 'document/purged_lines.cpp', 'while (all.size() < lines.rows[i])', 'while (all.size() + 1 < lines.rows[i])'),
+    ('document', 'document/document.cpp', 'purged->PutBack(); // what is in memory stays as the user left it\n', ''),
+    ('document', 'document/document.cpp', '    UndoStack().setClean();\n', ''),
+    ('document', 'document/list_rows.cpp', 'row > 0 ? row - 1 : 0, std::move(block)', 'row, std::move(block)'),
+    ('pages', 'pages/resistance_formula.cpp', 'Put(tools.MinRes, Inverse(largest));',
+     'Put(tools.MinRes, Inverse(largest < smallest ? largest : smallest));'),
+    ('pages', 'pages/location_loader.cpp', 'if (!m_taken.insert(key).second)', 'if (false)'),
+    ('pages', 'pages/location_loader.cpp', '!std::isfinite(value) || columns[c].IsLocked(m_rows->At(row))',
+     '!std::isfinite(value)'),
+    # Messages.
+    ('module', 'module/data_exchange.cpp', 'if (!exchange.mayLeave && exchange.ListPage())', 'if (false)'),
+    ('module', 'module/data_exchange.cpp', 's_busy = true;', 's_busy = false;'),
+    ('module', 'module/data_exchange.cpp', '|| !std::isfinite(exchange.item.chainage))', ')'),
+    # The other editors.
+    ('network', 'editors/network/linear_reference.cpp', 'std::lerp(line.along[i], line.along[i + 1], part)',
+     'line.along[i]'),
+    ('network', 'editors/network/linear_reference.cpp', 'part >= -rounding && part <= 1 + rounding', 'part >= rounding && part <= 1 - rounding'),
+    ('network', 'editors/network/join_lines.cpp', 'ends.size() == 2 &&', 'ends.size() >= 2 &&'),
+    ('network', 'editors/network/join_lines.cpp', '(to.line.empty() ? 0 : 1)', '0'),
+    ('cross_sections', 'editors/cross_sections/section_rules.cpp', 'section.points[i].offset <',
+     'section.points[i].offset <='),
+    ('cross_sections', 'editors/cross_sections/section_rules.cpp', 'if (section.width < 0)', 'if (section.width < -1)'),
+    # The host.
+    ('shell', 'shell/recent_files.cpp', 'files.removeAll(clean);\n', ''),
+    ('shell', 'shell/recent_files.cpp', 'Write(files.mid(0, Longest));', 'Write(files);'),
+]

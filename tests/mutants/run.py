@@ -1,0 +1,89 @@
+#!/usr/bin/python3
+"""run.py [ROOM|NUMBER...]: puts one fault after the other into the sources and sees whether a test notices.
+
+Every fault of mutants.py replaces a text that stands in its file once; the room's test programs are built and run,
+those that are quickest first, and the file gets its own text back. A fault that no test notices has survived: a test is
+missing, or weaker than it looks. Works on build/dev, where everything is built already; by hand, for it takes a while.
+"""
+import contextlib
+import os
+import subprocess
+import sys
+import time
+
+from mutants import MUTANTS
+
+ROOT = os.path.abspath(os.path.join(os.path.dirname(os.path.abspath(__file__)), '../..'))
+BUILD = f'{ROOT}/build/dev'
+PROGRAMS = {'tql': ['tql_test'], 'files': ['data_test'], 'data': ['data_test', 'cli_test'], 'cli': ['cli_test'],
+            'ks': ['ks_test', 'pages_test', 'shell_test'], 'grid': ['pages_test', 'sheet_pages_test'],
+            'document': ['pages_test', 'sheet_pages_test', 'module_test'], 'pages': ['pages_test', 'sheet_pages_test'],
+            'module': ['module_test'], 'network': ['network_test'], 'cross_sections': ['cross_sections_test'],
+            'shell': ['shell_test']}
+MINUTES = 10  # a test that hangs has noticed, too
+
+
+@contextlib.contextmanager
+def fault(path, text, wrong):
+    """The file with another text, while the block lasts."""
+    with open(path, encoding='utf-8') as file:
+        own = file.read()
+    if own.count(text) != 1:
+        raise ValueError(f'stands {own.count(text)} times in the file')
+    try:
+        write(path, own.replace(text, wrong))
+        yield
+    finally:
+        write(path, own)
+
+
+def write(path, text):
+    with open(path, 'w', encoding='utf-8') as file:
+        file.write(text)
+
+
+def run(*command):
+    return subprocess.run(command, cwd=ROOT, capture_output=True, text=True, timeout=60 * MINUTES,
+                          env={**os.environ, 'QT_QPA_PLATFORM': 'offscreen'}, errors='replace')
+
+
+def notices(program):
+    """The first test of the program that fails, if one does."""
+    if run('ninja', '-C', BUILD, program).returncode:
+        raise ValueError('does not compile')
+    try:
+        result = run(f'{BUILD}/bin/{program}', '--gtest_brief=1', '--gtest_fail_fast')
+    except subprocess.TimeoutExpired:
+        return f'{program} hangs'
+    if result.returncode == 0:
+        return ''
+    return next((line for line in result.stdout.splitlines() if 'FAILED  ]' in line), f'{program} breaks off').strip()
+
+
+def main():
+    wanted = sys.argv[1:]
+    noticed, survived, unusable = 0, [], []
+    for number, (room, file, text, wrong) in enumerate(MUTANTS, 1):
+        if wanted and room not in wanted and str(number) not in wanted:
+            continue
+        start, said = time.monotonic(), ''
+        name = f'{number} {room}, {file}: ' + ' '.join((wrong or 'without ' + text).split())
+        try:
+            with fault(f'{ROOT}/src/{file}', text, wrong):
+                said = next(filter(None, map(notices, PROGRAMS[room])), '')
+            noticed += bool(said)
+            if not said:
+                survived.append(name)
+        except (ValueError, OSError) as error:
+            said = str(error)
+            unusable.append(name)
+        print(f'{name}\n    {said or "SURVIVED"} ({time.monotonic() - start:.0f} s)', flush=True)
+    print(f'{noticed} of {noticed + len(survived)} faults noticed')
+    for title, names in (('survived', survived), ('no longer usable', unusable)):
+        for name in names:
+            print(f'{title}: {name}')
+    return 1 if survived or unusable else 0
+
+
+if __name__ == '__main__':
+    sys.exit(main())
