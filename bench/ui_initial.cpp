@@ -3,7 +3,7 @@
 #include "bench/page_view.h"
 #include "bench/report.h"
 #include "grid/gen_grid.h"
-#include "pages/init_page.h"
+#include "pages/page_table.h"
 
 #include <QApplication>
 #include <QTableView>
@@ -41,9 +41,9 @@ void Fill(CKavo0_hdDoc& document, int lines)
 
 double ShowPage(CKavo0_hdDoc& document)
 {
-    std::unique_ptr<CInitPage> page;
+    std::unique_ptr<CGenPropertyPage> page;
     return Milliseconds([&] {
-        page = std::make_unique<CInitPage>(&document);
+        page = MakeInitPage(&document);
         page->OnSetActive();
         Show(*page);
     });
@@ -65,7 +65,7 @@ struct Edited
     explicit Edited(int lines)
     {
         Fill(document, lines);
-        page = std::make_unique<CInitPage>(&document);
+        page = MakeInitPage(&document);
         view = std::make_unique<PageView>(document, *page);
         page->OnSetActive();
         Show(*page);
@@ -86,7 +86,7 @@ struct Edited
     }
 
     CKavo0_hdDoc document;
-    std::unique_ptr<CInitPage> page;
+    std::unique_ptr<CGenPropertyPage> page;
     std::unique_ptr<PageView> view;
     CGenGrid* grid = nullptr;
     int row = 0;

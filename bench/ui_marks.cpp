@@ -3,7 +3,7 @@
 #include "bench/page_view.h"
 #include "bench/report.h"
 #include "grid/gen_grid.h"
-#include "pages/wl_mark_page.h"
+#include "pages/page_table.h"
 
 #include <QScrollBar>
 #include <string>
@@ -29,7 +29,7 @@ struct Marks
             mark.MarkLevels.assign(std::size_t(titles), 10 + i * 1e-4);
             parameters.WaterLevelMarkList.Add(std::move(mark));
         }
-        page = std::make_unique<CWLMarkPage>(&document);
+        page = MakeWLMarkPage(&document);
         view = std::make_unique<PageView>(document, *page);
         page->OnSetActive();
         Show(*page);
@@ -59,7 +59,7 @@ struct Marks
     }
 
     CKavo0_hdDoc document;
-    std::unique_ptr<CWLMarkPage> page;
+    std::unique_ptr<CGenPropertyPage> page;
     std::unique_ptr<PageView> view;
     CGenGrid* grid = nullptr;
     int row = 0;

@@ -119,7 +119,7 @@ void CDlgPropertySheet::AddPage(Str caption, MakePage make)
         m_active = 0;
 }
 
-CGenPropertyPage* CDlgPropertySheet::PageAt(int tab) const
+CGenPropertyPage* CDlgPropertySheet::PageAt(int tab)
 {
     if (tab < 0 || tab >= count())
         return nullptr;
@@ -140,13 +140,13 @@ CGenPropertyPage* CDlgPropertySheet::PageAt(int tab) const
     return entry.page;
 }
 
-bool CDlgPropertySheet::MakeNextPage() const
+bool CDlgPropertySheet::MakeNextPage()
 {
     const auto next = std::find_if(m_tabs.begin(), m_tabs.end(), [](const Tab& tab) { return !tab.page; });
     return next != m_tabs.end() && PageAt(int(next - m_tabs.begin()));
 }
 
-CGenPropertyPage* CDlgPropertySheet::ActivePage() const
+CGenPropertyPage* CDlgPropertySheet::ActivePage()
 {
     return PageAt(m_active);
 }

@@ -19,10 +19,11 @@ public:
 
     /// Adds a tab. Its page is made when it is first asked for, and belongs to the widget tree.
     void AddPage(Str caption, MakePage make);
-    CGenPropertyPage* ActivePage() const;
-    CGenPropertyPage* PageAt(int tab) const;
+    // These make the page when nobody has asked for it before.
+    CGenPropertyPage* ActivePage();
+    CGenPropertyPage* PageAt(int tab);
     /// Makes the next page that has not been made; false when all have.
-    bool MakeNextPage() const;
+    bool MakeNextPage();
     int PageCount() const { return count(); }
     /// Switches to a tab: the active page is asked, and only then anything changes. False when it refuses to be left.
     bool SetActivePage(int tab);
@@ -43,6 +44,6 @@ private:
     };
     void TabChanged(int tab);
 
-    mutable std::vector<Tab> m_tabs; // in the order of the tab bar
+    std::vector<Tab> m_tabs; // in the order of the tab bar
     int m_active = -1;
 };

@@ -1,11 +1,11 @@
 #include "module/view.h"
 
+#include "grid/gen_grid.h"
 #include "ks/fc/after_paint.h"
 #include "module/file_bar.h"
-#include "module/page_table.h"
 #include "module/sheet.h"
-#include "grid/gen_grid.h"
 #include "pages/framework/page.h"
+#include "pages/page_table.h"
 #include "res/strings.h"
 
 #include <QTimer>

@@ -1,51 +1,57 @@
-#include "pages/bed_page.h"
-
+// "Bed Resist.": resistance of the bed, of the whole section or of its three zones.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "pages/resistance_formula.h"
 #include "ui_bed_page.h"
 
-CBedPage::CBedPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, &HD_Parameters::BedList, parent), m_ui(std::make_unique<Ui::CBedPage>())
+namespace {
+
+class CBedPage : public CDialogPage<Ui::CBedPage, CLocationPage>
 {
-    m_ui->setupUi(this);
-    HD_Global_Var& globals = Globals();
-    const auto usesZones = [&globals] { return globals.ResisZone == 1; };
-    const auto isUniform = [&globals] { return globals.ResisZone != 1; };
-    const auto unit = [&globals] { return ResistanceUnit(globals.resist_num); };
+public:
+    explicit CBedPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::BedList)
+    {
+        HD_Global_Var& globals = Globals();
+        const auto usesZones = [&globals] { return globals.ResisZone == 1; };
+        const auto isUniform = [&globals] { return globals.ResisZone != 1; };
+        const auto unit = [&globals] { return ResistanceUnit(globals.resist_num); };
 
-    using G = HD_Global_Var;
-    Bindings().Add(m_ui->formula_1300, globals.resist_num, [this](std::int32_t chosen) {
-        StoreToDocument(); // what is typed is meant in the formula that stood there
-        SwitchResistanceFormula(*GetDocument(), chosen, *m_ui->formula_1300);
-    });
-    Bind({m_ui->uniform_1301, m_ui->zones_1302}, &G::ResisZone);
-    Bind(m_ui->resistance_1303, &G::G_resistance, {.unitText = unit, .unitLabel = m_ui->unit_1303});
-    Bind(m_ui->zone_1304, &G::ZoneResistance1, {.unitText = unit, .unitLabel = m_ui->unit_1304});
-    Bind(m_ui->zone_1305, &G::ZoneResistance2, {.unitText = unit, .unitLabel = m_ui->unit_1305});
-    Bind(m_ui->zone_1306, &G::ZoneResistance3, {.unitText = unit, .unitLabel = m_ui->unit_1306});
-    Bindings().EnableWhen(isUniform, {m_ui->resistanceLabel_1303, m_ui->resistance_1303, m_ui->unit_1303});
-    Bindings().EnableWhen(usesZones,
-                          {m_ui->zoneLabel_1304, m_ui->zone_1304, m_ui->unit_1304, m_ui->zoneLabel_1305,
-                           m_ui->zone_1305, m_ui->unit_1305, m_ui->zoneLabel_1306, m_ui->zone_1306, m_ui->unit_1306});
+        using G = HD_Global_Var;
+        Bindings().Add(m_ui.formula_1300, globals.resist_num, [this](std::int32_t chosen) {
+            StoreToDocument(); // what is typed is meant in the formula that stood there
+            SwitchResistanceFormula(*GetDocument(), chosen, *m_ui.formula_1300);
+        });
+        Bind({m_ui.uniform_1301, m_ui.zones_1302}, &G::ResisZone);
+        Bind(m_ui.resistance_1303, &G::G_resistance, {.unitText = unit, .unitLabel = m_ui.unit_1303});
+        Bind(m_ui.zone_1304, &G::ZoneResistance1, {.unitText = unit, .unitLabel = m_ui.unit_1304});
+        Bind(m_ui.zone_1305, &G::ZoneResistance2, {.unitText = unit, .unitLabel = m_ui.unit_1305});
+        Bind(m_ui.zone_1306, &G::ZoneResistance3, {.unitText = unit, .unitLabel = m_ui.unit_1306});
+        Bindings().EnableWhen(isUniform, {m_ui.resistanceLabel_1303, m_ui.resistance_1303, m_ui.unit_1303});
+        Bindings().EnableWhen(usesZones,
+                              {m_ui.zoneLabel_1304, m_ui.zone_1304, m_ui.unit_1304, m_ui.zoneLabel_1305, m_ui.zone_1305,
+                               m_ui.unit_1305, m_ui.zoneLabel_1306, m_ui.zone_1306, m_ui.unit_1306});
 
-    // The values of the approach not in use are kept.
-    const auto column = [&](const double& global, bool ofZones) {
-        return ColumnOptions{.fill = &global,
-                             .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
-                             .unitText = unit};
-    };
-    using R = HD_Resistfact;
-    Grid(m_ui->grid_1307)
-        .BranchName({.width = 110})
-        .Chainage({})
-        .Value(&R::Resistance, column(globals.G_resistance, false))
-        .Value(&R::ZoneResistance1, column(globals.ZoneResistance1, true))
-        .Value(&R::ZoneResistance2, column(globals.ZoneResistance2, true))
-        .Value(&R::ZoneResistance3, column(globals.ZoneResistance3, true));
-}
+        // The values of the approach not in use are kept.
+        const auto column = [&](const double& global, bool ofZones) {
+            return ColumnOptions{.fill = &global,
+                                 .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
+                                 .unitText = unit};
+        };
+        using R = HD_Resistfact;
+        Grid(m_ui.grid_1307)
+            .BranchName({.width = 110})
+            .Chainage({})
+            .Value(&R::Resistance, column(globals.G_resistance, false))
+            .Value(&R::ZoneResistance1, column(globals.ZoneResistance1, true))
+            .Value(&R::ZoneResistance2, column(globals.ZoneResistance2, true))
+            .Value(&R::ZoneResistance3, column(globals.ZoneResistance3, true));
+    }
+};
 
-CBedPage::~CBedPage() = default;
+} // namespace
 
-void CBedPage::Retranslate()
+std::unique_ptr<CGenPropertyPage> MakeBedPage(CKavo0_hdDoc* document)
 {
-    m_ui->retranslateUi(this);
+    return std::make_unique<CBedPage>(document);
 }

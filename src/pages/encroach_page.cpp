@@ -1,5 +1,7 @@
-#include "pages/encroach_page.h"
-
+// "Encroachment": set-ups of narrowed flood plains, each a list of locations.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "pages/setup_command.h"
 #include "ui_encroach_page.h"
 
@@ -44,28 +46,50 @@ bool IsUsed(std::string_view field, const HDEncroach& line)
     return method == TargetLevelAndEnergy || (method == TargetLevel && field == "EncValues2.4");
 }
 
-} // namespace
-
-CEncroachPage::CEncroachPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, nullptr, parent), m_ui(std::make_unique<Ui::CEncroachPage>())
+class CEncroachPage : public CDialogPage<Ui::CEncroachPage, CLocationPage>
 {
-    m_ui->setupUi(this);
-    Bind(m_ui->maxIter_1340, &HD_Global_Var::Max_no_iter);
-    Bindings().EnableWhen([this] { return HasSetup(); },
-                          {m_ui->setupLabel, m_ui->setup_1341, m_ui->duplicate_1345, m_ui->delete_1346});
-    Bindings().EnableWhen([this] { return m_current > 0; }, {m_ui->previous_1342});
-    Bindings().EnableWhen([this] { return m_current + 1 < Setups().GetCount(); }, {m_ui->next_1343});
+public:
+    explicit CEncroachPage(CKavo0_hdDoc* document);
+    void LoadFromDocument(CKavo0_hdDoc* document) override;
+    bool Shows(const ChangePlace& place) const override;
+    void Reveal(const ChangePlace& place, bool focus) override;
 
-    connect(m_ui->setup_1341, &QComboBox::activated, this, [this](int setup) { GoTo(std::size_t(setup)); });
-    connect(m_ui->previous_1342, &QPushButton::clicked, this, [this] { GoTo(m_current - 1); });
-    connect(m_ui->next_1343, &QPushButton::clicked, this, [this] { GoTo(m_current + 1); });
-    connect(m_ui->add_1344, &QPushButton::clicked, this, [this] {
+private:
+    using Setup = CGenParamList<HDEncroach>;
+    CGenMetaList<HDEncroach>& Setups() const;
+    std::size_t SetupOf(const void* list) const;
+    bool HasSetup() const { return m_current < Setups().GetCount(); }
+
+    void DeclareColumns();
+    /// Stores what is being edited and shows another set-up.
+    void GoTo(std::size_t setup);
+    /// Puts a new set-up behind the current one.
+    void Insert(std::unique_ptr<Setup> setup);
+    std::unique_ptr<Setup> NewSetup() const;
+    void Delete();
+    void ShowSetups();
+
+    std::size_t m_current = 0; // the set-up in the grid
+};
+
+CEncroachPage::CEncroachPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
+{
+    Bind(m_ui.maxIter_1340, &HD_Global_Var::Max_no_iter);
+    Bindings().EnableWhen([this] { return HasSetup(); },
+                          {m_ui.setupLabel, m_ui.setup_1341, m_ui.duplicate_1345, m_ui.delete_1346});
+    Bindings().EnableWhen([this] { return m_current > 0; }, {m_ui.previous_1342});
+    Bindings().EnableWhen([this] { return m_current + 1 < Setups().GetCount(); }, {m_ui.next_1343});
+
+    connect(m_ui.setup_1341, &QComboBox::activated, this, [this](int setup) { GoTo(std::size_t(setup)); });
+    connect(m_ui.previous_1342, &QPushButton::clicked, this, [this] { GoTo(m_current - 1); });
+    connect(m_ui.next_1343, &QPushButton::clicked, this, [this] { GoTo(m_current + 1); });
+    connect(m_ui.add_1344, &QPushButton::clicked, this, [this] {
         auto setup = NewSetup();
         for (std::size_t line = 0; line < NewSetupLines; ++line)
             setup->Add();
         Insert(std::move(setup));
     });
-    connect(m_ui->duplicate_1345, &QPushButton::clicked, this, [this] {
+    connect(m_ui.duplicate_1345, &QPushButton::clicked, this, [this] {
         StoreToDocument();
         auto setup = NewSetup();
         const Setup& original = Setups().GetAt(m_current);
@@ -73,15 +97,13 @@ CEncroachPage::CEncroachPage(CKavo0_hdDoc* document, QWidget* parent)
             setup->Add(original.GetAt(line));
         Insert(std::move(setup));
     });
-    connect(m_ui->delete_1346, &QPushButton::clicked, this, &CEncroachPage::Delete);
+    connect(m_ui.delete_1346, &QPushButton::clicked, this, &CEncroachPage::Delete);
     DeclareColumns();
 }
 
-CEncroachPage::~CEncroachPage() = default;
-
 void CEncroachPage::DeclareColumns()
 {
-    GridColumns columns = Grid(m_ui->grid_1348);
+    GridColumns columns = Grid(m_ui.grid_1348);
     columns.BranchName({.width = 110}).Chainage({});
     for (const Field& field : HDEncroach::DeclaredFields()) {
         ColumnOptions options{
@@ -125,7 +147,7 @@ void CEncroachPage::LoadFromDocument(CKavo0_hdDoc* document)
 
 void CEncroachPage::ShowSetups()
 {
-    QComboBox& box = *m_ui->setup_1341;
+    QComboBox& box = *m_ui.setup_1341;
     box.clear();
     for (std::size_t setup = 1; setup <= Setups().GetCount(); ++setup)
         box.addItem(LoadString(Str::SetupNumber).arg(setup));
@@ -136,7 +158,7 @@ void CEncroachPage::ShowSetups()
         status = LoadString(Str::NoSetups);
     else if (!CGenMetaList<HDEncroach>::IsWorthKeeping(Setups().GetAt(m_current)))
         status = LoadString(Str::SetupNotSaved);
-    m_ui->status_1347->setText(status);
+    m_ui.status_1347->setText(status);
 }
 
 void CEncroachPage::GoTo(std::size_t setup)
@@ -190,7 +212,9 @@ void CEncroachPage::Reveal(const ChangePlace& place, bool focus)
     CLocationPage::Reveal(place, focus);
 }
 
-void CEncroachPage::Retranslate()
+} // namespace
+
+std::unique_ptr<CGenPropertyPage> MakeEncroachPage(CKavo0_hdDoc* document)
 {
-    m_ui->retranslateUi(this);
+    return std::make_unique<CEncroachPage>(document);
 }

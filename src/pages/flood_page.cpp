@@ -1,22 +1,28 @@
-#include "pages/flood_page.h"
-
+// "Flood Plain Resist.": the resistance of the flood plains, global and per location.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "ui_flood_page.h"
 
-CFloodPage::CFloodPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, &HD_Parameters::FloodList, parent), m_ui(std::make_unique<Ui::CFloodPage>())
+namespace {
+
+class CFloodPage : public CDialogPage<Ui::CFloodPage, CLocationPage>
 {
-    m_ui->setupUi(this);
-    Bind(m_ui->resistance_1040, &HD_Global_Var::G_flood_plan_res, {});
+public:
+    explicit CFloodPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::FloodList)
+    {
+        Bind(m_ui.resistance_1040, &HD_Global_Var::G_flood_plan_res, {});
 
-    Grid(m_ui->grid_1043)
-        .BranchName({.width = 100})
-        .Chainage({.width = 72})
-        .Value(&HD_Flood_resist::FloodPlainResistance);
-}
+        Grid(m_ui.grid_1043)
+            .BranchName({.width = 100})
+            .Chainage({.width = 72})
+            .Value(&HD_Flood_resist::FloodPlainResistance);
+    }
+};
 
-CFloodPage::~CFloodPage() = default;
+} // namespace
 
-void CFloodPage::Retranslate()
+std::unique_ptr<CGenPropertyPage> MakeFloodPage(CKavo0_hdDoc* document)
 {
-    m_ui->retranslateUi(this);
+    return std::make_unique<CFloodPage>(document);
 }

@@ -1,31 +1,37 @@
-#include "pages/heat_balance_page.h"
-
+// "Heat Balance": whether the heat balance is calculated, and its parameters.
+#include "pages/framework/dialog_page.h"
+#include "pages/page_table.h"
+#include "res/strings.h"
 #include "ui_heat_balance_page.h"
 
-CHeatBalancePage::CHeatBalancePage(CKavo0_hdDoc* document, QWidget* parent)
-    : CGenPropertyPage(document, parent), m_ui(std::make_unique<Ui::CHeatBalancePage>())
-{
-    m_ui->setupUi(this);
-    HDHeatBalance& heat = Globals().HeatBalance;
-    Bindings().Add(m_ui->included_1148, heat.Calc);
-    Bindings().Add(m_ui->latitude_1149, heat.Latitude, {.unitLabel = m_ui->unit_1149});
-    Bindings().Add(m_ui->longitude_1150, heat.Longitude, {.unitLabel = m_ui->unit_1150});
-    Bindings().Add(m_ui->timeMeridian_1151, heat.TimeZone, {.unitLabel = m_ui->unit_1151});
-    Bindings().Add(m_ui->displacement_1152, heat.DisTime, {.unitLabel = m_ui->unit_1152});
-    Bindings().Add(m_ui->lightAttenuation_1153, heat.LightAtt, {.unitLabel = m_ui->unit_1153});
-    Bindings().Add(m_ui->beer_1154, heat.betaBeer);
-    Bindings().Add(m_ui->radiationA_1155, heat.RadA);
-    Bindings().Add(m_ui->radiationB_1156, heat.RadB);
-    Bindings().Add(m_ui->vaporizationA_1157, heat.VapA);
-    Bindings().Add(m_ui->vaporizationB_1158, heat.VapB);
-    // With a group its fields and labels are disabled; they keep their values.
-    Bindings().EnableWhen([&heat] { return heat.Calc; },
-                          {m_ui->location, m_ui->solarAbsorption, m_ui->radiation, m_ui->vaporization});
-}
+namespace {
 
-CHeatBalancePage::~CHeatBalancePage() = default;
-
-void CHeatBalancePage::Retranslate()
+class CHeatBalancePage : public CDialogPage<Ui::CHeatBalancePage, CGenPropertyPage>
 {
-    m_ui->retranslateUi(this);
+public:
+    explicit CHeatBalancePage(CKavo0_hdDoc* document) : CDialogPage(document)
+    {
+        HDHeatBalance& heat = Globals().HeatBalance;
+        Bindings().Add(m_ui.included_1148, heat.Calc);
+        Bindings().Add(m_ui.latitude_1149, heat.Latitude, {.unitLabel = m_ui.unit_1149});
+        Bindings().Add(m_ui.longitude_1150, heat.Longitude, {.unitLabel = m_ui.unit_1150});
+        Bindings().Add(m_ui.timeMeridian_1151, heat.TimeZone, {.unitLabel = m_ui.unit_1151});
+        Bindings().Add(m_ui.displacement_1152, heat.DisTime, {.unitLabel = m_ui.unit_1152});
+        Bindings().Add(m_ui.lightAttenuation_1153, heat.LightAtt, {.unitLabel = m_ui.unit_1153});
+        Bindings().Add(m_ui.beer_1154, heat.betaBeer);
+        Bindings().Add(m_ui.radiationA_1155, heat.RadA);
+        Bindings().Add(m_ui.radiationB_1156, heat.RadB);
+        Bindings().Add(m_ui.vaporizationA_1157, heat.VapA);
+        Bindings().Add(m_ui.vaporizationB_1158, heat.VapB);
+        // With a group its fields and labels are disabled; they keep their values.
+        Bindings().EnableWhen([&heat] { return heat.Calc; },
+                              {m_ui.location, m_ui.solarAbsorption, m_ui.radiation, m_ui.vaporization});
+    }
+};
+
+} // namespace
+
+std::unique_ptr<CGenPropertyPage> MakeHeatBalancePage(CKavo0_hdDoc* document)
+{
+    return std::make_unique<CHeatBalancePage>(document);
 }

@@ -1,30 +1,36 @@
-#include "pages/klr_init_page.h"
-
+// "KLR Initial": initial values of the two layers, global and per location.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "ui_klr_init_page.h"
 
-CKlrInitPage::CKlrInitPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, &HD_Parameters::KlrInitList, parent), m_ui(std::make_unique<Ui::CKlrInitPage>())
+namespace {
+
+class CKlrInitPage : public CDialogPage<Ui::CKlrInitPage, CLocationPage>
 {
-    m_ui->setupUi(this);
-    // Eight digits: millimetres and litres also of large levels and discharges.
-    HDKlrInitial& klr = Globals().KlrInit;
-    Bindings().Add(m_ui->waterLevel_1183, klr.h1, {.unitLabel = m_ui->unit_1183});
-    Bindings().Add(m_ui->interfaceLevel_1184, klr.h0, {.unitLabel = m_ui->unit_1184});
-    Bindings().Add(m_ui->topDischarge_1185, klr.Q1, {.unitLabel = m_ui->unit_1185});
-    Bindings().Add(m_ui->bottomDischarge_1161, klr.Q0, {.unitLabel = m_ui->unit_1161});
+public:
+    explicit CKlrInitPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::KlrInitList)
+    {
+        // Eight digits: millimetres and litres also of large levels and discharges.
+        HDKlrInitial& klr = Globals().KlrInit;
+        Bindings().Add(m_ui.waterLevel_1183, klr.h1, {.unitLabel = m_ui.unit_1183});
+        Bindings().Add(m_ui.interfaceLevel_1184, klr.h0, {.unitLabel = m_ui.unit_1184});
+        Bindings().Add(m_ui.topDischarge_1185, klr.Q1, {.unitLabel = m_ui.unit_1185});
+        Bindings().Add(m_ui.bottomDischarge_1161, klr.Q0, {.unitLabel = m_ui.unit_1161});
 
-    Grid(m_ui->grid_1186)
-        .BranchName({.width = 100})
-        .Chainage({.width = 100})
-        .Value(&HDKlrInit::h1, {.width = 50})
-        .Value(&HDKlrInit::h0, {.width = 50})
-        .Value(&HDKlrInit::Q1, {.width = 50})
-        .Value(&HDKlrInit::Q0, {.width = 50});
-}
+        Grid(m_ui.grid_1186)
+            .BranchName({.width = 100})
+            .Chainage({.width = 100})
+            .Value(&HDKlrInit::h1, {.width = 50})
+            .Value(&HDKlrInit::h0, {.width = 50})
+            .Value(&HDKlrInit::Q1, {.width = 50})
+            .Value(&HDKlrInit::Q0, {.width = 50});
+    }
+};
 
-CKlrInitPage::~CKlrInitPage() = default;
+} // namespace
 
-void CKlrInitPage::Retranslate()
+std::unique_ptr<CGenPropertyPage> MakeKlrInitPage(CKavo0_hdDoc* document)
 {
-    m_ui->retranslateUi(this);
+    return std::make_unique<CKlrInitPage>(document);
 }

@@ -1,27 +1,33 @@
-#include "pages/leakage_page.h"
-
+// "Groundwater Leakage": whether water leaks to or from the groundwater, and how easily.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "ui_leakage_page.h"
 
-CLeakagePage::CLeakagePage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, &HD_Parameters::LeakageList, parent), m_ui(std::make_unique<Ui::CLeakagePage>())
+namespace {
+
+class CLeakagePage : public CDialogPage<Ui::CLeakagePage, CLocationPage>
 {
-    m_ui->setupUi(this);
-    HDLeakageGlobal& leakage = Globals().Leakage;
-    const auto included = [&leakage] { return leakage.IncludeLeakage; };
-    Bindings().Add(m_ui->includeLeakage_1228, leakage.IncludeLeakage);
-    Bindings().Add(m_ui->coefficient_1238, leakage.LeakageCoefficient);
-    Bindings().EnableWhen(included, {m_ui->globalCoefficient, m_ui->localCoefficients_1262});
-    Bindings().ShowWhen(included, {m_ui->grid_1186});
+public:
+    explicit CLeakagePage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::LeakageList)
+    {
+        HDLeakageGlobal& leakage = Globals().Leakage;
+        const auto included = [&leakage] { return leakage.IncludeLeakage; };
+        Bindings().Add(m_ui.includeLeakage_1228, leakage.IncludeLeakage);
+        Bindings().Add(m_ui.coefficient_1238, leakage.LeakageCoefficient);
+        Bindings().EnableWhen(included, {m_ui.globalCoefficient, m_ui.localCoefficients_1262});
+        Bindings().ShowWhen(included, {m_ui.grid_1186});
 
-    Grid(m_ui->grid_1186)
-        .BranchName({.width = 100})
-        .Chainage({.width = 72})
-        .Value(&HDLeakage::LeakageCoefficient, {.width = 82});
-}
+        Grid(m_ui.grid_1186)
+            .BranchName({.width = 100})
+            .Chainage({.width = 72})
+            .Value(&HDLeakage::LeakageCoefficient, {.width = 82});
+    }
+};
 
-CLeakagePage::~CLeakagePage() = default;
+} // namespace
 
-void CLeakagePage::Retranslate()
+std::unique_ptr<CGenPropertyPage> MakeLeakagePage(CKavo0_hdDoc* document)
 {
-    m_ui->retranslateUi(this);
+    return std::make_unique<CLeakagePage>(document);
 }

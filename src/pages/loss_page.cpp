@@ -1,22 +1,28 @@
-#include "pages/loss_page.h"
-
+// "Water Loss": four loss coefficients per location. The sheet does not show this page.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "ui_loss_page.h"
 
-CLossPage::CLossPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, &HD_Parameters::WaterList, parent), m_ui(std::make_unique<Ui::CLossPage>())
-{
-    m_ui->setupUi(this);
-    auto columns = Grid(m_ui->grid);
-    columns.BranchName({.width = 100}).Chainage({.width = 72});
-    int number = 0;
-    for (const Field& field : HD_Waterloss::DeclaredFields())
-        columns.Value(field,
-                      {.header = [n = ++number] { return LoadString(Str::WaterLossNumber).arg(n); }, .width = 82});
-}
+namespace {
 
-CLossPage::~CLossPage() = default;
-
-void CLossPage::Retranslate()
+class CLossPage : public CDialogPage<Ui::CLossPage, CLocationPage>
 {
-    m_ui->retranslateUi(this);
+public:
+    explicit CLossPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::WaterList)
+    {
+        auto columns = Grid(m_ui.grid);
+        columns.BranchName({.width = 100}).Chainage({.width = 72});
+        int number = 0;
+        for (const Field& field : HD_Waterloss::DeclaredFields())
+            columns.Value(field,
+                          {.header = [n = ++number] { return LoadString(Str::WaterLossNumber).arg(n); }, .width = 82});
+    }
+};
+
+} // namespace
+
+std::unique_ptr<CGenPropertyPage> MakeLossPage(CKavo0_hdDoc* document)
+{
+    return std::make_unique<CLossPage>(document);
 }

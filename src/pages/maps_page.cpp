@@ -1,5 +1,7 @@
-#include "pages/maps_page.h"
-
+// "Maps": the result maps that the simulation writes, and the topography that they are made with.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "ui_maps_page.h"
 
 #include <algorithm>
@@ -31,45 +33,51 @@ bool HasNoFile(const void* row)
     return static_cast<const T*>(row)->FileName.empty();
 }
 
-} // namespace
-
-CMapsPage::CMapsPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, nullptr, parent), m_ui(std::make_unique<Ui::CMapsPage>())
+class CMapsPage : public CDialogPage<Ui::CMapsPage, CLocationPage>
 {
-    m_ui->setupUi(this);
+public:
+    explicit CMapsPage(CKavo0_hdDoc* document);
+    void LoadFromDocument(CKavo0_hdDoc* document) override;
+    void ButtonClicked(CGenGrid& grid, int row, int column) override;
+
+private:
+    void DeclareMaps();
+    void ShowStatus();
+};
+
+CMapsPage::CMapsPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
+{
     HDMapOutput& maps = Globals().MapOutput;
-    Bindings().Add(m_ui->generate_1228, maps.GenerateOutput);
-    Bindings().Add(m_ui->groundElevation_1239, maps.ApplyDemGroundElevation);
-    Bindings().Add(m_ui->riverXsec_1237, maps.ApplyDemInRiverXsec);
-    Bindings().Add(m_ui->geoDb_1240, maps.MapAreaGeoDb);
-    Bindings().Add(m_ui->helpGrid_1241, maps.GeoDb, GridFile(false));
+    Bindings().Add(m_ui.generate_1228, maps.GenerateOutput);
+    Bindings().Add(m_ui.groundElevation_1239, maps.ApplyDemGroundElevation);
+    Bindings().Add(m_ui.riverXsec_1237, maps.ApplyDemInRiverXsec);
+    Bindings().Add(m_ui.geoDb_1240, maps.MapAreaGeoDb);
+    Bindings().Add(m_ui.helpGrid_1241, maps.GeoDb, GridFile(false));
 
     const auto writesMaps = [&maps] { return maps.GenerateOutput; };
     const auto usesDem = [&maps] { return maps.GenerateOutput && maps.ApplyDemGroundElevation; };
-    Bindings().ShowWhen(writesMaps, {m_ui->maps_1226, m_ui->status_1229});
-    Bindings().EnableWhen(writesMaps, {m_ui->groundElevation_1239});
-    Bindings().EnableWhen(usesDem, {m_ui->riverXsec_1237, m_ui->geoDb_1240});
-    Bindings().ShowWhen(usesDem, {m_ui->dem_1227});
+    Bindings().ShowWhen(writesMaps, {m_ui.maps_1226, m_ui.status_1229});
+    Bindings().EnableWhen(writesMaps, {m_ui.groundElevation_1239});
+    Bindings().EnableWhen(usesDem, {m_ui.riverXsec_1237, m_ui.geoDb_1240});
+    Bindings().ShowWhen(usesDem, {m_ui.dem_1227});
     Bindings().EnableWhen([usesDem, &maps] { return usesDem() && maps.MapAreaGeoDb; },
-                          {m_ui->helpGridLabel_1243, m_ui->helpGrid_1241});
+                          {m_ui.helpGridLabel_1243, m_ui.helpGrid_1241});
 
-    m_ui->maps_1226->SetLineChoice(LineChoice::CurrentLine);
-    m_ui->dem_1227->SetLineChoice(LineChoice::CurrentLine);
+    m_ui.maps_1226->SetLineChoice(LineChoice::CurrentLine);
+    m_ui.dem_1227->SetLineChoice(LineChoice::CurrentLine);
     DeclareMaps();
-    ItemsGrid(m_ui->dem_1227, maps.DemInputFiles)
+    ItemsGrid(m_ui.dem_1227, maps.DemInputFiles)
         .Value(&CMapsInput::FileName, {.width = 150})
         .Button({.header = LineOf(Str::DemColumns, 1), .width = 20})
         .Value(&CMapsInput::ItemNo)
         .Value(&CMapsInput::Order);
 }
 
-CMapsPage::~CMapsPage() = default;
-
 void CMapsPage::DeclareMaps()
 {
     const auto isDem = [](const void* row) { return Map(row).Item == DemItem; };
     using M = CMapsOutput;
-    GridColumns columns = ItemsGrid(m_ui->maps_1226, Globals().MapOutput.MapOutputFiles);
+    GridColumns columns = ItemsGrid(m_ui.maps_1226, Globals().MapOutput.MapOutputFiles);
     for (double M::*number : {&M::XOrigin, &M::YOrigin, &M::Rotation, &M::GridSize})
         columns.Value(number, {.width = 50});
     for (std::int32_t M::*cells : {&M::JCells, &M::KCells})
@@ -88,11 +96,11 @@ void CMapsPage::DeclareMaps()
 
 void CMapsPage::LoadFromDocument(CKavo0_hdDoc* document)
 {
-    document->AtSave({.rows = m_ui->maps_1226->Model()->Rows(),
+    document->AtSave({.rows = m_ui.maps_1226->Model()->Rows(),
                       .isIncomplete = &HasNoFile<CMapsOutput>,
                       .oneDropped = Str::DroppedFile,
                       .manyDropped = Str::DroppedFiles});
-    document->AtSave({.rows = m_ui->dem_1227->Model()->Rows(),
+    document->AtSave({.rows = m_ui.dem_1227->Model()->Rows(),
                       .isIncomplete = &HasNoFile<CMapsInput>,
                       .oneDropped = Str::DroppedFile,
                       .manyDropped = Str::DroppedFiles});
@@ -108,16 +116,18 @@ void CMapsPage::ShowStatus()
         return std::count_if(rows.begin(), rows.end(), [](const auto& row) { return row.FileName.empty(); });
     };
     const auto count = nameless(maps.MapOutputFiles) + nameless(maps.DemInputFiles);
-    m_ui->status_1229->setText(count > 0 ? LoadString(Str::RowsWithoutFile).arg(count) : QString());
+    m_ui.status_1229->setText(count > 0 ? LoadString(Str::RowsWithoutFile).arg(count) : QString());
 }
 
 void CMapsPage::ButtonClicked(CGenGrid& grid, int row, int /*column*/)
 {
-    const bool isMap = &grid == m_ui->maps_1226;
+    const bool isMap = &grid == m_ui.maps_1226;
     BrowseInto(grid, row, isMap ? MapFileColumn : DemFileColumn, GridFile(isMap));
 }
 
-void CMapsPage::Retranslate()
+} // namespace
+
+std::unique_ptr<CGenPropertyPage> MakeMapsPage(CKavo0_hdDoc* document)
 {
-    m_ui->retranslateUi(this);
+    return std::make_unique<CMapsPage>(document);
 }

@@ -1,5 +1,6 @@
-#include "pages/output_page.h"
-
+// "Add. Output": which quantities a computation stores besides water level and discharge.
+#include "pages/framework/dialog_page.h"
+#include "pages/page_table.h"
 #include "ui_output_page.h"
 
 namespace {
@@ -35,35 +36,48 @@ constexpr struct
     {&Boxes::timeStep_1200, &HDAddOutput::TimeStep},
 };
 
-} // namespace
-
-COutputPage::COutputPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CGenPropertyPage(document, parent), m_ui(std::make_unique<Ui::COutputPage>())
+class COutputPage : public CDialogPage<Ui::COutputPage, CGenPropertyPage>
 {
-    m_ui->setupUi(this);
+public:
+    explicit COutputPage(CKavo0_hdDoc* document);
+
+protected:
+    void Retranslate() override;
+
+private:
+    void NameBoxes();
+};
+
+COutputPage::COutputPage(CKavo0_hdDoc* document) : CDialogPage(document)
+{
     for (const auto& [box, flag] : Flags)
-        Bindings().Add(m_ui.get()->*box, Globals().AddOutput.*flag);
+        Bindings().Add(m_ui.*box, Globals().AddOutput.*flag);
     NameBoxes();
 }
 
 void COutputPage::NameBoxes()
 {
     // A box has no text of its own; its row and its column say what it is.
-    const QGridLayout& cells = *m_ui->matrixLayout;
+    const QGridLayout& cells = *m_ui.matrixLayout;
     const auto textAt = [&cells](int row, int column) {
         return qobject_cast<const QLabel*>(cells.itemAtPosition(row, column)->widget())->text();
     };
     for (const auto& [box, flag] : Flags) {
         int row = 0, column = 0, rows = 0, columns = 0;
-        cells.getItemPosition(cells.indexOf(m_ui.get()->*box), &row, &column, &rows, &columns);
-        (m_ui.get()->*box)->setAccessibleName(textAt(row, 0) + ", " + textAt(0, column));
+        cells.getItemPosition(cells.indexOf(m_ui.*box), &row, &column, &rows, &columns);
+        (m_ui.*box)->setAccessibleName(textAt(row, 0) + ", " + textAt(0, column));
     }
 }
 
-COutputPage::~COutputPage() = default;
-
 void COutputPage::Retranslate()
 {
-    m_ui->retranslateUi(this);
+    CDialogPage::Retranslate();
     NameBoxes();
+}
+
+} // namespace
+
+std::unique_ptr<CGenPropertyPage> MakeOutputPage(CKavo0_hdDoc* document)
+{
+    return std::make_unique<COutputPage>(document);
 }

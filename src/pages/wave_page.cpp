@@ -1,29 +1,31 @@
-#include "pages/wave_page.h"
-
+// "Wave Approx": which approximation of the momentum equation is used, everywhere and in reaches.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
+#include "pages/page_table.h"
 #include "ui_wave_page.h"
 
 namespace {
 
 constexpr std::int32_t FullyDynamic = 1, KinematicWave = 3;
 
+class CWavePage : public CDialogPage<Ui::CWavePage, CLocationPage>
+{
+public:
+    explicit CWavePage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::WaveList)
+    {
+        Bind(m_ui.wave_1010, &HD_Global_Var::G_wave);
+        Grid(m_ui.grid_1011)
+            .BranchName({.width = 110})
+            .Chainage({.caption = Str::UpstreamChainage})
+            .Value(&HD_Wavetype::DownstreamChainage, {.emptyIsNotGiven = true})
+            .Value(&HD_Wavetype::WaveApproximation,
+                   {.width = 150, .choice = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
+    }
+};
+
 } // namespace
 
-CWavePage::CWavePage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, &HD_Parameters::WaveList, parent), m_ui(std::make_unique<Ui::CWavePage>())
+std::unique_ptr<CGenPropertyPage> MakeWavePage(CKavo0_hdDoc* document)
 {
-    m_ui->setupUi(this);
-    Bind(m_ui->wave_1010, &HD_Global_Var::G_wave);
-    Grid(m_ui->grid_1011)
-        .BranchName({.width = 110})
-        .Chainage({.caption = Str::UpstreamChainage})
-        .Value(&HD_Wavetype::DownstreamChainage, {.emptyIsNotGiven = true})
-        .Value(&HD_Wavetype::WaveApproximation,
-               {.width = 150, .choice = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
-}
-
-CWavePage::~CWavePage() = default;
-
-void CWavePage::Retranslate()
-{
-    m_ui->retranslateUi(this);
+    return std::make_unique<CWavePage>(document);
 }

@@ -1,6 +1,8 @@
-#include "pages/wl_mark_page.h"
-
+// "User Def. Marks": titles of water level marks, and a level a title at locations.
+#include "pages/framework/dialog_page.h"
+#include "pages/framework/location_page.h"
 #include "pages/mark_title_rows.h"
+#include "pages/page_table.h"
 #include "ui_wl_mark_page.h"
 
 #include <algorithm>
@@ -76,22 +78,29 @@ CellAccess LevelAccess(std::size_t title)
             }};
 }
 
-} // namespace
-
-CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document, QWidget* parent)
-    : CLocationPage(document, &HD_Parameters::WaterLevelMarkList, parent), m_ui(std::make_unique<Ui::CWLMarkPage>())
+class CWLMarkPage : public CDialogPage<Ui::CWLMarkPage, CLocationPage>
 {
-    m_ui->setupUi(this);
-    m_ui->grid_1074->SetLineChoice(LineChoice::CurrentLine);
-    Grid(m_ui->grid_1074).BranchName({.width = 71}).Chainage({.width = 71});
-    RowsGrid(m_ui->titles_1075, MakeMarkTitleRows(*document))
+public:
+    explicit CWLMarkPage(CKavo0_hdDoc* document);
+    void AppendLine() override;
+    void DeleteLines() override;
+    void LoadFromDocument(CKavo0_hdDoc* document) override;
+
+private:
+    void ShowLevelColumns();
+    void ShowStatus();
+};
+
+CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::WaterLevelMarkList)
+{
+    m_ui.grid_1074->SetLineChoice(LineChoice::CurrentLine);
+    Grid(m_ui.grid_1074).BranchName({.width = 71}).Chainage({.width = 71});
+    RowsGrid(m_ui.titles_1075, MakeMarkTitleRows(*document))
         .Value(TitleAccess(), {.name = "Title", .kind = FieldKind::Text},
                {.caption = Str::MarkTitle, .width = 300, .upperCase = true})
         .Value(InterpolateAccess(), {.name = "Interpolate", .kind = FieldKind::Boolean},
                {.caption = Str::MarkInterpolate, .width = 50});
 }
-
-CWLMarkPage::~CWLMarkPage() = default;
 
 /// One column of levels a title.
 void CWLMarkPage::ShowLevelColumns()
@@ -112,7 +121,7 @@ void CWLMarkPage::ShowLevelColumns()
 
 void CWLMarkPage::LoadFromDocument(CKavo0_hdDoc* document)
 {
-    document->AtSave({.rows = m_ui->titles_1075->Model()->Rows(),
+    document->AtSave({.rows = m_ui.titles_1075->Model()->Rows(),
                       .isIncomplete = &IsUntitled,
                       .oneDropped = Str::DroppedTitle,
                       .manyDropped = Str::DroppedTitles});
@@ -126,7 +135,7 @@ void CWLMarkPage::ShowStatus()
 {
     const auto& titles = Globals().MarkTitles;
     const auto count = std::count(titles.begin(), titles.end(), std::string());
-    m_ui->status_1076->setText(count > 0 ? LoadString(Str::MarksWithoutTitle).arg(count) : QString());
+    m_ui.status_1076->setText(count > 0 ? LoadString(Str::MarksWithoutTitle).arg(count) : QString());
 }
 
 void CWLMarkPage::AppendLine()
@@ -139,12 +148,14 @@ void CWLMarkPage::DeleteLines()
 {
     StoreToDocument();
     const CGenGrid* grid = LinesGrid();
-    if (grid == m_ui->titles_1075 && grid->RowCount() <= 1)
+    if (grid == m_ui.titles_1075 && grid->RowCount() <= 1)
         return; // there is always a title to name
     CLocationPage::DeleteLines();
 }
 
-void CWLMarkPage::Retranslate()
+} // namespace
+
+std::unique_ptr<CGenPropertyPage> MakeWLMarkPage(CKavo0_hdDoc* document)
 {
-    m_ui->retranslateUi(this);
+    return std::make_unique<CWLMarkPage>(document);
 }

@@ -1,9 +1,9 @@
 #include "random_user.h"
 
-#include "module/data_tables.h"
-#include "module/sheet.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_editors.h"
+#include "module/data_tables.h"
+#include "module/sheet.h"
 #include "pages/framework/page.h"
 
 #include <QAbstractButton>
@@ -26,7 +26,7 @@ bool IsUsable(const QWidget* widget)
 
 QString NameOf(const QWidget& page, const QWidget& control)
 {
-    return QString::fromLatin1(page.metaObject()->className()) + '.' + control.objectName();
+    return page.objectName() + '.' + control.objectName();
 }
 
 } // namespace
@@ -91,7 +91,7 @@ void RandomUser::DoSomething()
 void RandomUser::ChangePage()
 {
     GoToPage(Pick(m_view.Sheet()->PageCount()));
-    m_done = QString("show ") + Page().metaObject()->className();
+    m_done = QString("show ") + Page().objectName();
 }
 
 CGenGrid* RandomUser::SomeGrid()
@@ -209,7 +209,7 @@ void RandomUser::ActOnControl()
     QList<QWidget*> controls;
     for (auto* button : Page().findChildren<QAbstractButton*>())
         if (IsUsable(button) && (qobject_cast<QCheckBox*>(button) || qobject_cast<QRadioButton*>(button) ||
-                                 button->parent()->metaObject()->className() == QLatin1String("CEncroachPage")))
+                                 button->parent()->objectName() == QLatin1String("CEncroachPage")))
             controls << button;
     for (auto* list : Page().findChildren<QComboBox*>())
         if (IsUsable(list) && !qobject_cast<CGenGrid*>(list->parent()->parent()))

@@ -1,7 +1,7 @@
 #include "page_fixture.h"
+#include "pages/page_table.h"
 
 #include "grid/grid_clipboard.h"
-#include "pages/init_page.h"
 
 #include <QClipboard>
 
@@ -33,7 +33,7 @@ protected:
     {
         Add("A", 1.25, 0.1, 20);
         Add("B", NotGiven, 11, 21);
-        Open<CInitPage>();
+        Open(&MakeInitPage);
         grid->setFocus();
     }
     void Select(int top, int left, int bottom, int right)

@@ -5,9 +5,9 @@
 #include "data/hd_support.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/units/edit_fields.h"
-#include "module/page_table.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"
+#include "pages/page_table.h"
 
 #include <QCheckBox>
 #include <QRadioButton>

@@ -1,7 +1,6 @@
 // Encroachment set-ups: stepping through them, making and deleting them, and what a save makes of them.
 #include "flow_page_fixture.h"
-
-#include "pages/encroach_page.h"
+#include "pages/page_table.h"
 
 #include <QAbstractButton>
 
@@ -59,7 +58,7 @@ TEST_F(EncroachPageTest, EveryFieldHasItsColumn)
         line.EncValues1[i] = i;
         line.EncValues2[i] = 10 + i;
     }
-    Open<CEncroachPage>();
+    Open(&MakeEncroachPage);
     EXPECT_EQ(Headers().join('|'), "River Name|Chainage|Method|Banks|Left offset|Right offset|Left position|"
                                    "Right position|Width|Reduction|Total reduction|Left reduction|Right reduction|"
                                    "Target level|Target energy");
@@ -81,7 +80,7 @@ TEST_F(EncroachPageTest, TheMethodLocksWhatItDoesNotUse)
 {
     AddSetup({"A", "B"});
     HDEncroach& line = setups.GetAt(0).GetAt(0);
-    Open<CEncroachPage>();
+    Open(&MakeEncroachPage);
     const struct
     {
         int method, reduction;
@@ -107,7 +106,7 @@ TEST_F(EncroachPageTest, TheMethodLocksWhatItDoesNotUse)
 
 TEST_F(EncroachPageTest, StepAddDuplicateDelete)
 {
-    Open<CEncroachPage>();
+    Open(&MakeEncroachPage);
     EXPECT_EQ(Shown(), "--a--  ");
     EXPECT_FALSE(grid->isEnabled());
     view->page->AppendLine(); // nowhere to go
@@ -157,7 +156,7 @@ TEST_F(EncroachPageTest, TellsWhatASaveWouldLeaveOut)
     } cases[] = {{{}, false}, {{"A"}, false}, {{"A", ""}, false}, {{"", "B"}, true}, {{"", "", "C"}, true}};
     for (const auto& c : cases)
         AddSetup(c.names);
-    Open<CEncroachPage>();
+    Open(&MakeEncroachPage);
     QComboBox* box = view->page->findChild<QComboBox*>("setup_1341");
     int written = 0;
     for (const auto& c : cases) {
@@ -183,7 +182,7 @@ TEST_F(EncroachPageTest, AWrongCellKeepsTheSetup)
 {
     AddSetup({"A", "B"});
     AddSetup({"C", "D"});
-    Open<CEncroachPage>();
+    Open(&MakeEncroachPage);
     Type(1, 7, "1."); // a position
     Click("next_1343");
     EXPECT_EQ(boxes.value(0), "Floating point number required");

@@ -1,8 +1,7 @@
 #include "page_fixture.h"
+#include "pages/page_table.h"
 
 #include "grid/name_offers.h"
-
-#include "pages/init_page.h"
 
 class GridEditTest : public PageTest
 {
@@ -11,7 +10,7 @@ protected:
     {
         Add("A", 1, 10, 20);
         Add("B", 2, 11, 21);
-        Open<CInitPage>();
+        Open(&MakeInitPage);
         grid->setFocus();
     }
     void Click(int row, int column)

@@ -1,7 +1,7 @@
 #include "page_fixture.h"
+#include "pages/page_table.h"
 
 #include "grid/grid_keys.h"
-#include "pages/init_page.h"
 
 #include <QClipboard>
 #include <QKeyEvent>
@@ -26,7 +26,7 @@ protected:
     {
         Add("A", 1, 10, 20);
         Add("B", 2, 11, 21);
-        Open<CInitPage>();
+        Open(&MakeInitPage);
         grid->setFocus();
     }
     void Press(Qt::Key key, Qt::KeyboardModifiers held = {}) { QTest::keyClick(grid, key, held); }

@@ -1,6 +1,6 @@
-#include "pages/init_page.h"
 
 #include "page_fixture.h"
+#include "pages/page_table.h"
 
 #include "pages/framework/ctrl_edit.h"
 
@@ -25,7 +25,7 @@ TEST_F(InitPageTest, EmptyListShowsTheGlobalValues)
 {
     globals.G_waterlevel = 1.5;
     globals.G_discharge = 30;
-    Open<CInitPage>();
+    Open(&MakeInitPage);
     EXPECT_TRUE(view->linesMenu);
     EXPECT_EQ(Texts(1), "||1.500|30.000");
     EXPECT_EQ(Current(), std::pair(1, 1));
@@ -45,7 +45,7 @@ TEST_F(InitPageTest, EmptyListShowsTheGlobalValues)
 TEST_F(InitPageTest, TheLineOfAnEmptyListFollowsTheGlobalValuesUntilItIsTouched)
 {
     globals.G_waterlevel = 3.5;
-    Open<CInitPage>();
+    Open(&MakeInitPage);
     auto* level = Find<CCtrlEdit>("levelOrDepth_1001");
     level->setFocus();
     level->selectAll();
@@ -67,7 +67,7 @@ TEST_F(InitPageTest, LevelOrDepth)
 {
     globals.G_waterlevel = 2;
     Add("A", 1, 2, 3);
-    Open<CInitPage>();
+    Open(&MakeInitPage);
     const auto shows = [&](bool depth) {
         EXPECT_EQ(Find("levelLabel_1203")->isVisible(), !depth);
         EXPECT_EQ(Find("depthLabel_1204")->isVisible(), depth);
@@ -91,7 +91,7 @@ TEST_F(InitPageTest, UnitsAreLive)
 {
     globals.G_waterlevel = 3.048;
     Add("A", 304.8, 3.048, 28.316846592);
-    Open<CInitPage>();
+    Open(&MakeInitPage);
     const QString before = Stored();
     auto* level = Find<CCtrlEdit>("levelOrDepth_1001");
     const auto tip = [&](int column) {
@@ -115,7 +115,7 @@ TEST_F(InitPageTest, UnitsAreLive)
 
 TEST_F(InitPageTest, GlobalFieldsAreStoredWhenLeft)
 {
-    Open<CInitPage>();
+    Open(&MakeInitPage);
     auto* discharge = Find<CCtrlEdit>("discharge_1002");
     discharge->setFocus();
     discharge->selectAll();
@@ -138,7 +138,7 @@ TEST_F(InitPageTest, GlobalFieldsAreStoredWhenLeft)
 TEST_F(InitPageTest, LocationsOfOtherEditors)
 {
     Add("A", 1, 2, 3);
-    auto& page = Open<CInitPage>();
+    auto& page = Open(&MakeInitPage);
     page.InsertLocation("side", "12.5");
     EXPECT_EQ(Texts(2), "SIDE|12|0.000|0.000");
     EXPECT_EQ(init.GetAt(1).Chainage, 12.5);
@@ -160,7 +160,7 @@ TEST_F(InitPageTest, LocationsOfOtherEditors)
 
 TEST_F(InitPageTest, ReachableByKeyboardAndByName)
 {
-    Open<CInitPage>();
+    Open(&MakeInitPage);
     const char* order[] = {"level_1201", "levelOrDepth_1001", "discharge_1002", "grid_1003"};
     Find(order[0])->setFocus();
     for (const char* name : order) {

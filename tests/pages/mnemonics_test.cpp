@@ -2,7 +2,7 @@
 #include "page_fixture.h"
 
 #include "ks/language/language.h"
-#include "module/page_table.h"
+#include "pages/page_table.h"
 
 #include <QAbstractButton>
 #include <QGroupBox>

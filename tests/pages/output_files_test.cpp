@@ -1,13 +1,12 @@
 // The pages of time series output and maps: lists without locations, files to browse for, dates, locks of a row.
 #include "page_fixture.h"
+#include "pages/page_table.h"
 
 #include "data/hd_file.h"
+#include "grid/date_time_text.h"
 #include "ks/fc/file_dialog.h"
 #include "pages/framework/date_time_edit.h"
-#include "grid/date_time_text.h"
 #include "pages/framework/file_browse.h"
-#include "pages/maps_page.h"
-#include "pages/text_output_page.h"
 
 #include <QCheckBox>
 #include <QFile>
@@ -55,7 +54,7 @@ protected:
 
 TEST_F(OutputFilesTest, NewRowsAndTheGridWithTheFocus)
 {
-    Open<CTextOutputPage>();
+    Open(&MakeTextOutputPage);
     CGenGrid &items = Part("items_1216"), &files = Part("files_1226");
     EXPECT_EQ(items.RowCount(), 1);
     EXPECT_EQ(items.TextAt(1, 1) + '|' + items.TextAt(1, 3), "Water level|2");
@@ -89,7 +88,7 @@ TEST_F(OutputFilesTest, BrowsingStartsAtTheFileNamed)
     QDir(folder.path()).mkdir("out");
     QFile(folder.filePath("out/there.kvt0")).open(QIODevice::WriteOnly);
     text.OutputFiles.resize(2);
-    Open<CTextOutputPage>();
+    Open(&MakeTextOutputPage);
     CGenGrid& files = Part("files_1226");
     const struct
     {
@@ -126,7 +125,7 @@ TEST_F(OutputFilesTest, DoubtfulFilesAreAskedAbout)
     const QString there = folder.filePath("there.kvt2"), missing = folder.filePath("missing.kvt2");
     QFile(there).open(QIODevice::WriteOnly);
     maps.GenerateOutput = maps.ApplyDemGroundElevation = maps.MapAreaGeoDb = true;
-    Open<CMapsPage>();
+    Open(&MakeMapsPage);
     auto* help = view->page->findChild<CGeoFileEdit*>("helpGrid_1241");
     const struct
     {
@@ -168,7 +167,7 @@ TEST_F(OutputFilesTest, DatesAreKeptUnlessTheyAreTyped)
 {
     text.LimitedPeriodStart = {2024, 13, 5, 7, 8, 9};
     text.LimitedPeriodEnd = {2024, 2, 29, 18, 30, 5};
-    Open<CTextOutputPage>();
+    Open(&MakeTextOutputPage);
     const std::string before = Text();
     auto* start = view->page->findChild<CDateTimeEdit*>("start_1223");
     auto* end = view->page->findChild<CDateTimeEdit*>("end_1225");
@@ -232,7 +231,7 @@ TEST_F(OutputFilesTest, TypeAndItemLockTheOtherCellsOfARow)
 {
     maps.GenerateOutput = true;
     maps.MapOutputFiles.resize(2);
-    Open<CMapsPage>();
+    Open(&MakeMapsPage);
     CGenGrid& cells = Part("maps_1226");
     const struct
     {
@@ -265,7 +264,7 @@ TEST_F(OutputFilesTest, TypeAndItemLockTheOtherCellsOfARow)
 
 TEST_F(OutputFilesTest, WhatIsShownAndEnabled)
 {
-    Open<CMapsPage>();
+    Open(&MakeMapsPage);
     const char* boxNames[] = {"generate_1228", "groundElevation_1239", "geoDb_1240"};
     const struct
     {
@@ -292,7 +291,7 @@ TEST_F(OutputFilesTest, WhatIsShownAndEnabled)
 TEST_F(OutputFilesTest, RowsWithoutAFileAreAnnouncedAndLeftOut)
 {
     maps.GenerateOutput = maps.ApplyDemGroundElevation = true;
-    Open<CMapsPage>();
+    Open(&MakeMapsPage);
     auto* status = view->page->findChild<QLabel*>("status_1229");
     CGenGrid& cells = Part("maps_1226");
     ASSERT_TRUE(document.OnSaveDocument(folder.filePath("maps.HDKV")));

@@ -1,7 +1,6 @@
 // The page of additional output: a box a keyword.
 #include "flow_page_fixture.h"
-
-#include "pages/output_page.h"
+#include "pages/page_table.h"
 
 #include <QCheckBox>
 #include <QScrollArea>
@@ -47,7 +46,7 @@ TEST_F(OutputPageTest, EveryOutputBoxIsOneKeyword)
 {
     globals.AddOutput.ReducedOut = 3;
     globals.AddOutput.Topo_print = globals.AddOutput.Test_print = true;
-    Open<COutputPage>();
+    Open(&MakeOutputPage);
     EXPECT_FALSE(view->linesMenu);
     EXPECT_EQ(view->page->findChildren<QCheckBox*>().size(), int(std::size(OutputBoxes)));
     QPoint last;
@@ -66,7 +65,7 @@ TEST_F(OutputPageTest, EveryOutputBoxIsOneKeyword)
 
 TEST_F(OutputPageTest, TheOutputMatrixScrollsToTheFocusWhenThePageIsLow)
 {
-    Open<COutputPage>();
+    Open(&MakeOutputPage);
     view->resize(500, 200);
     QTest::qWait(0);
     const auto* area = view->page->findChild<QScrollArea*>();

@@ -1,8 +1,8 @@
 // A page in an active window, hosted as the program's view hosts it, with recorded calls and message boxes.
 #pragma once
 
-#include "ks/fc/message_box.h"
 #include "grid/grid_editors.h"
+#include "ks/fc/message_box.h"
 #include "pages/framework/location_page.h"
 
 #include <QComboBox>
@@ -61,7 +61,7 @@ public:
     CKavo0_hdDoc& document;
     CGenPropertyPage* page;
     QLineEdit* other; // something else to focus
-    int edited = 0; // lines
+    int edited = 0;   // lines
     QList<int> locations, commands, revealed;
     QStringList branches;
     bool linesMenu = false;
@@ -99,7 +99,15 @@ protected:
         KsSetMessageBoxHandler({});
         KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
     }
-    /// Shows a page; it lives as long as the test.
+    /// Shows a page of the sheet; it lives as long as the test.
+    CGenPropertyPage& Open(std::unique_ptr<CGenPropertyPage> (*make)(CKavo0_hdDoc*))
+    {
+        auto* page = make(&document).release();
+        view = std::make_unique<TestView>(document, page);
+        grid = page->GetGrid();
+        return *page;
+    }
+    /// Likewise a page of the test's own.
     template <typename Page, typename... Args>
     Page& Open(Args&&... args)
     {

@@ -1,8 +1,6 @@
 // The further grids of the pages: pairs of the file as a whole, and of the current line.
 #include "flow_page_fixture.h"
-
-#include "pages/bed_toolbox_page.h"
-#include "pages/mixing_coef_page.h"
+#include "pages/page_table.h"
 
 #include <QClipboard>
 #include <QTemporaryDir>
@@ -21,7 +19,7 @@ protected:
     void OpenToolbox()
     {
         globals.BedResist.Method = 9; // unknown: may use anything
-        Open<CBedToolboxPage>();
+        Open(&MakeBedToolboxPage);
         global = Find<CGenGrid>(1318);
         line = Find<CGenGrid>(1320);
     }
@@ -171,7 +169,7 @@ TEST_F(PairsGridTest, MixingPairs)
 {
     document.Parameters().MixingCoefList.Add().CoefPairs = {{20, 0.11}, {40, 0.16}};
     globals.Mixing.CoefPairs = {{10, 0.5}};
-    Open<CMixingCoefPage>();
+    Open(&MakeMixingCoefPage);
     for (const auto& [number, rows] : {std::pair(1334, 1), std::pair(1336, 2)}) {
         auto* pairs = Find<CGenGrid>(number);
         EXPECT_EQ(pairs->RowCount(), rows);

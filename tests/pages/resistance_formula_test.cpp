@@ -1,8 +1,6 @@
 // Switching the resistance formula: what it asks, what it converts, and that it is one step.
 #include "flow_page_fixture.h"
-
-#include "pages/bed_page.h"
-#include "pages/bed_toolbox_page.h"
+#include "pages/page_table.h"
 
 #include <QComboBox>
 
@@ -26,7 +24,7 @@ protected:
         tool.MaxRes = 50; // no minimum
         tool.VeloRes = {{1, 16}};
         document.Parameters().BedResistanceToolboxList.Add(tool);
-        Open<CBedPage>();
+        Open(&MakeBedPage);
     }
     /// Chooses a formula as the keyboard does, answering the question that comes.
     void Choose(Qt::Key key, QMessageBox::StandardButton pressed)
@@ -100,7 +98,7 @@ TEST_F(ResistanceFormulaTest, ChezyIsNotConverted)
 
 TEST_F(ResistanceFormulaTest, TheToolboxLocksWhatItsMethodDoesNotUse)
 {
-    Open<CBedToolboxPage>();
+    Open(&MakeBedToolboxPage);
     const auto open = [this] {
         QString text;
         for (int control : {1311, 1314, 1316})

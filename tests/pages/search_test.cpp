@@ -1,7 +1,7 @@
 #include "page_fixture.h"
+#include "pages/page_table.h"
 
 #include "grid/grid_search.h"
-#include "pages/init_page.h"
 
 class SearchTest : public PageTest
 {
@@ -12,7 +12,7 @@ protected:
         Add("MYRIVER", 200.5);
         Add("RIVER2", 300);
         Add("RIV", NotGiven);
-        Open<CInitPage>();
+        Open(&MakeInitPage);
     }
     /// The rows found one after the other, as "search" and "search again" do.
     QList<int> Found(const LineQuery& query, int from = 0)
@@ -62,7 +62,8 @@ TEST_F(SearchTest, ComparesWhatIsShownAndWhatWasTyped)
     const double wanted = CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(1234.5, 0);
     EXPECT_EQ(Found({"", wanted, ChainageMatch::Equal}), QList<int>{1});
     grid->Model()->setData(grid->Model()->index(1, 0), "typed", Qt::EditRole);
-    EXPECT_EQ(Found({"TYPED", 0, ChainageMatch::Any, NameMatch::Whole}), QList<int>{2}) << "a line that is not stored yet";
+    EXPECT_EQ(Found({"TYPED", 0, ChainageMatch::Any, NameMatch::Whole}), QList<int>{2})
+        << "a line that is not stored yet";
 }
 
 TEST_F(SearchTest, GotoLine)
