@@ -14,7 +14,10 @@
 #include <algorithm>
 
 CGenGrid::CGenGrid(QWidget* parent)
-    : QTableView(parent), m_model(new CGridModel(this)), m_delegate(new CGridDelegate(this))
+    : QTableView(parent),
+      m_model(new CGridModel(this)),
+      m_delegate(new CGridDelegate(this)),
+      m_widths(new CGridWidths(*this))
 {
     setFont(KsLangGetUserFont());
     setModel(m_model);
@@ -27,7 +30,6 @@ CGenGrid::CGenGrid(QWidget* parent)
     QSizePolicy policy = sizePolicy();
     policy.setRetainSizeWhenHidden(true); // a hidden grid leaves the rest of the page where it is
     setSizePolicy(policy);
-    m_widths = new CGridWidths(*this);
     // A click on a header moves the current cell as one on a cell does.
     for (QWidget* part : {verticalHeader()->viewport(), horizontalHeader()->viewport()})
         part->installEventFilter(this);

@@ -3,6 +3,8 @@
 #include "grid/grid_keys.h"
 #include "grid/grid_widths.h"
 
+#include <QApplication>
+#include <QHeaderView>
 #include <QLabel>
 #include <QSplitter>
 #include <QUndoStack>
@@ -22,6 +24,7 @@ CGenGrid* CTablesView::AddTable(QSplitter& side, QLabel*& title, const char* nam
     auto* table = new CGenGrid;
     table->setObjectName(QString::fromLatin1(name));
     table->SetHost(this);
+    table->horizontalHeader()->setStretchLastSection(true);
     table->SetInsertsBelow(true);
     table->SetLineChoice(LineChoice::LinesOfCells);
     title = new QLabel;
@@ -84,6 +87,11 @@ void CTablesView::changeEvent(QEvent* event)
 bool CTablesView::IsEditing() const
 {
     return std::any_of(m_tables.begin(), m_tables.end(), [](const CGenGrid* table) { return table->IsEditing(); });
+}
+
+bool CTablesView::HasFocus(const CGenGrid& table) const
+{
+    return table.hasFocus() || table.isAncestorOf(QApplication::focusWidget());
 }
 
 bool CTablesView::MayLeave(KsLeave)

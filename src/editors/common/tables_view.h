@@ -36,6 +36,7 @@ protected:
     /// The table that had the focus last: commands are about its lines.
     CGenGrid& Lines() const { return *m_lines; }
     bool IsEditing() const;
+    bool HasFocus(const CGenGrid& table) const;
     /// The document, the units or the language are other ones: everything is shown as it is now.
     virtual void ShowDocument() = 0;
     /// The one whose lines have a branch and a chainage.

@@ -5,7 +5,6 @@
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
 
-#include <QApplication>
 #include <QFileInfo>
 #include <algorithm>
 #include <iterator>
@@ -65,7 +64,7 @@ bool CNetworkView::IsCommandEnabled(int id) const
     case Command::InsertLine:
         return CurrentBranch() >= 0;
     case Command::DeleteLine: // the key means something else on the map
-        return Lines().isAncestorOf(QApplication::focusWidget()) && CTablesView::IsCommandEnabled(id);
+        return HasFocus(Lines()) && CTablesView::IsCommandEnabled(id);
     case NetworkCommand::FitAll:
     case NetworkCommand::ZoomIn:
     case NetworkCommand::ZoomOut:

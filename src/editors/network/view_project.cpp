@@ -169,7 +169,7 @@ void CNetworkView::PickedChanged()
 {
     const auto picked = m_map->Picked();
     const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
-    if (branch >= 0 && branch != CurrentBranch())
+    if (branch >= 0 && branch != CurrentBranch() && !IsEditing()) // what is refused stays in its cell
         m_branches->SetCurrentCell(branch + 1, BranchName + 1);
 }
 

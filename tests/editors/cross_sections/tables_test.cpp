@@ -288,7 +288,8 @@ TEST_F(CrossSectionTest, TheContextMenuIsAboutTheTableItWasAskedFor)
         menu->actions().at(0)->trigger();
         menu->close();
     });
-    QContextMenuEvent asked(QContextMenuEvent::Mouse, {5, 5}); // the focus is in the other table
+    const QPoint at(5, 5); // the focus is in the other table
+    QContextMenuEvent asked(QContextMenuEvent::Mouse, at, view->Points()->mapToGlobal(at));
     QApplication::sendEvent(view->Points()->viewport(), &asked);
     EXPECT_EQ(view->Points()->model()->rowCount(), 3);
     EXPECT_EQ(view->Sections()->model()->rowCount(), SmallRows);

@@ -107,7 +107,7 @@ TEST_F(NetworkTest, TheLegendCoversNoBranchWhenAllIsShown)
     branch.name = "CREEK";
     branch.line = {{0, 0}, {1000, 0}, {1000, 600}, {950, 600}}; // ends in the upper right corner
     branch.end = branch.Length();
-    document.AppendBranches({branch}, {});
+    document.AppendBranches({branch}, {}, {});
     CNetworkMap map(document);
     for (const QSize size : {QSize(1200, 500), QSize(420, 700), QSize(800, 600), QSize(260, 200)}) {
         SCOPED_TRACE(size.width());
