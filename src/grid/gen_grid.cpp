@@ -6,6 +6,7 @@
 #include "grid/grid_keys.h"
 #include "grid/grid_texts.h"
 #include "grid/grid_widths.h"
+#include "grid/typing.h"
 #include "ks/language/language.h"
 
 #include <QApplication>
@@ -36,7 +37,11 @@ CGenGrid::CGenGrid(QWidget* parent)
     connect(selectionModel(), &QItemSelectionModel::selectionChanged, this,
             [this] { m_linesChosen = m_choosingLines; });
     connect(m_model, &CGridModel::CellModified, this, [this] { m_modified = true; });
-    connect(m_model, &CGridModel::layoutChanged, this, [this] { m_lastRow = CurrentRow(); });
+    connect(m_model, &CGridModel::layoutChanged, this, [this] {
+        m_lastRow = CurrentRow();
+        if (m_lastRow > 0)
+            m_currentLine = m_model->NameOf(m_lastRow - 1);
+    });
 }
 
 CGenGrid::~CGenGrid()
@@ -67,20 +72,42 @@ QString CGenGrid::LineText() const
 
 void CGenGrid::Refresh()
 {
+    const int row = CurrentRow(), column = CurrentColumn();
     m_model->Sync();
+    FollowLine(row, column);
     m_widths->Update();
+}
+
+/// Where lines came or went - with a save, by another editor - the current cell goes with its line. When that is gone no
+/// other line takes its place: whoever types on would change one that nobody chose.
+void CGenGrid::FollowLine(int row, int column)
+{
+    if (!m_currentLine || row == 0)
+        return;
+    const int now = m_model->RowNamed(*m_currentLine, row - 1) + 1;
+    if (now > 0) {
+        m_currentLine = m_model->NameOf(now - 1);
+        if (now != CurrentRow())
+            SetCurrentCell(now, column);
+    } else {
+        m_currentLine.reset();
+        m_lineGone = true;
+        clearSelection();
+        selectionModel()->clearCurrentIndex();
+    }
 }
 
 void CGenGrid::Reload()
 {
     Refresh();
-    if (!currentIndex().isValid() && RowCount() > 0)
+    if (!currentIndex().isValid() && RowCount() > 0 && !m_lineGone)
         SetCurrentCell(1, 1);
 }
 
 void CGenGrid::ShowRows(CKsDoc& document, std::shared_ptr<IRowSource> rows)
 {
-    m_modified = false;
+    m_modified = m_lineGone = false;
+    m_currentLine.reset();
     m_model->SetSource(document, std::move(rows));
 }
 
@@ -165,6 +192,10 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
     QTableView::currentChanged(current, previous); // closes an editor, whose text the cell takes
     if (!m_model->IsSyncing())
         StoreEditedLine();
+    if (!m_model->IsSyncing() && currentIndex().isValid()) {
+        m_currentLine = m_model->NameOf(currentIndex().row());
+        m_lineGone = false;
+    }
     if (m_host && !m_model->IsSyncing())
         m_host->CellCurrent(*this);
     const int row = CurrentRow();

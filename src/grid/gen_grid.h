@@ -103,6 +103,7 @@ private:
     std::optional<QItemSelectionRange> LinesToDelete() const;
     bool LeaveField();
     bool MayGrow() const { return m_model->Rows() && m_model->Rows()->MayGrow(); }
+    void FollowLine(int row, int column);
     void NextCell();
     void PreviousCell();
     void Ask(GridAction action);
@@ -111,8 +112,10 @@ private:
     CGridDelegate* m_delegate; // child
     CGridWidths* m_widths;     // child
     IGridHost* m_host = nullptr;
-    int m_lastRow = 0;       // current at the last cell move
-    bool m_modified = false; // since the last cell move
+    int m_lastRow = 0;                   // current at the last cell move
+    std::optional<RowKey> m_currentLine; // its name; nothing where the line is gone
+    bool m_lineGone = false;             // and nobody has chosen another one yet
+    bool m_modified = false;             // since the last cell move
     int m_branchNameColumn = 0;
     bool m_insertsBelow = false;
     LineChoice m_lineChoice = LineChoice::WholeLines;

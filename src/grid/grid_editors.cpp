@@ -305,6 +305,9 @@ bool CGridDelegate::eventFilter(QObject* object, QEvent* event)
     case QEvent::FocusOut:
         LostFocus(event);
         return false;
+    case QEvent::Wheel: // scrolls the table; an entry is taken on purpose only
+        event->ignore();
+        return true;
     case QEvent::ShortcutOverride:
     case QEvent::KeyPress: {
         const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));

@@ -66,6 +66,8 @@ void CGenGrid::Ask(GridAction action)
 
 void CGenGrid::NextCell()
 {
+    if (m_lineGone)
+        return; // the next cell of none
     if (CurrentColumn() < ColumnCount())
         SetCurrentCell(CurrentRow(), CurrentColumn() + 1);
     else if (CurrentRow() < RowCount())
@@ -78,6 +80,8 @@ void CGenGrid::NextCell()
 
 void CGenGrid::PreviousCell()
 {
+    if (m_lineGone)
+        return;
     if (CurrentColumn() > 1)
         SetCurrentCell(CurrentRow(), CurrentColumn() - 1);
     else if (CurrentRow() > 1)

@@ -111,6 +111,17 @@ RowKey CGridModel::KeyOf(int row) const
     return IsOffered(row) ? OfferedKey : m_rows->KeyAt(std::size_t(row));
 }
 
+int CGridModel::RowNamed(RowKey name, int row) const
+{
+    const std::size_t found = m_rows && name != OfferedKey ? m_rows->RowOf(name, std::size_t(std::max(row, 0)))
+                                                           : std::size_t(StoredRows());
+    if (found < std::size_t(StoredRows()))
+        return int(found);
+    if (name == OfferedKey && IsRow(row))
+        return row; // it has become a line
+    return OffersRow() ? StoredRows() : -1;
+}
+
 int CGridModel::rowCount(const QModelIndex& parent) const
 {
     return parent.isValid() ? 0 : m_rowCount;

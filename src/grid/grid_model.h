@@ -64,6 +64,12 @@ public:
     /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
     bool HidesDigits(int row, int column) const;
 
+    /// Names the line of a row for as long as the source has it.
+    RowKey NameOf(int row) const { return KeyOf(row); }
+    /// Where the line of that name stands, looked for at `row` first; where it is gone, the row that is offered instead
+    /// of lines, or -1.
+    int RowNamed(RowKey name, int row) const;
+
     /// Rows of the source, without the offered one.
     int StoredRows() const { return m_rows ? int(m_rows->Count()) : 0; }
     /// Writes what the row's cells hold into an object of the source's kind.
