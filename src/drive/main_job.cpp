@@ -162,9 +162,9 @@ void SaveCloseReopen(Robot& robot, const QString& file, int row)
 
     robot.Did("Close the document and open it again from the recent files");
     robot.Choose("actionClose");
-    const auto windows = robot.Frame().MdiArea().subWindowList();
+    const auto windows = robot.Frame().Windows().All();
     robot.Verify(std::none_of(windows.begin(), windows.end(),
-                              [&](QMdiSubWindow* window) { return window->windowTitle().contains(".HDKV"); }),
+                              [](const QMdiSubWindow* window) { return window->windowTitle().contains(".HDKV"); }),
                  "the document is closed");
     const bool reopened = OpenRecent(robot, saved);
     robot.Verify(reopened, "the saved file is among the recent files");

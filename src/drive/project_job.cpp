@@ -32,9 +32,8 @@ public:
 
     CView* View(const char* extension) const
     {
-        for (QMdiSubWindow* window : m_robot.Frame().MdiArea().subWindowList()) {
-            const auto* child = qobject_cast<CKsMDIChildWnd*>(window);
-            CView* view = child ? child->GetActiveView() : nullptr;
+        for (const CKsMDIChildWnd* window : m_robot.Frame().Windows().All()) {
+            CView* view = window->GetActiveView();
             if (view && view->GetDocument()->GetPathName().endsWith(QLatin1String(extension), Qt::CaseInsensitive))
                 return view;
         }
@@ -42,11 +41,8 @@ public:
     }
     void Activate(const char* extension)
     {
-        for (QMdiSubWindow* window : m_robot.Frame().MdiArea().subWindowList()) {
-            const auto* child = qobject_cast<CKsMDIChildWnd*>(window);
-            if (child && child->GetActiveView() == View(extension))
-                m_robot.Click(window, QPoint(window->width() / 3, TitleMiddle));
-        }
+        if (auto* window = CKsMDIChildWnd::Of(View(extension)))
+            m_robot.Click(window, QPoint(window->width() / 3, TitleMiddle));
     }
     QTableView* Page(int tab, int grid)
     {

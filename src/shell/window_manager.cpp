@@ -81,12 +81,15 @@ void CWindowManager::PlaceSideBySide()
     for (QMdiSubWindow* window : windows)
         window->showNormal();
     const QRect area(QPoint(), Area().viewport()->size());
-    const QRect place = windows.isEmpty() ? area : FirstPlace();
-    const int width = place.width();
+    QRect place = windows.isEmpty() ? area : FirstPlace();
     first->setGeometry(place);
-    for (qsizetype i = 0; i < windows.size(); ++i) {
-        const int top = int(area.height() * i / windows.size()), bottom = int(area.height() * (i + 1) / windows.size());
-        windows[i]->setGeometry(width, top, area.width() - width, bottom - top);
+    place.setLeft(place.right() + 1);
+    place.setRight(area.right());
+    const auto count = static_cast<int>(windows.size());
+    for (int i = 0; i < count; ++i) {
+        place.setTop(area.height() * i / count);
+        place.setBottom(area.height() * (i + 1) / count - 1);
+        windows[i]->setGeometry(place);
     }
     Area().setActiveSubWindow(first);
 }

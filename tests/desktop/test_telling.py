@@ -26,6 +26,8 @@ class StatusBar(Case):
         self.assert_status('of 4')
         editor.press('ctrl+z')
         self.assert_status('of 3')
+        editor.menu('Edit', 'Redo')
+        self.assert_status('of 4')
 
     def test_insertion_and_deletion_are_said(self):
         editor = self.open()

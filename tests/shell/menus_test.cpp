@@ -1,6 +1,7 @@
 #include "ks/fc/frames.h"
 #include "shell_fixture.h"
 
+#include <QStatusBar>
 #include <set>
 
 TEST_F(ShellTest, MnemonicsAreUniqueInEveryMenuAndShortcutsInTheWindow)
@@ -137,4 +138,18 @@ TEST_F(ShellTest, AnEditorsToolBarShowsWithItsView)
     Start();
     frame->OpenFile(Path("a.tst"));
     EXPECT_FALSE(frame->findChild<CKsToolBarEx*>()) << "for good";
+}
+
+TEST_F(ShellTest, WhatIsToldOutlastsTheTipsOfMenus)
+{
+    frame->OpenFile(Write("a.tst"));
+    QMenu* edit = Menu(1);
+    edit->popup(frame->mapToGlobal(QPoint(60, 40)));
+    edit->setActiveAction(Action("actionPaste"));
+    EXPECT_EQ(frame->statusBar()->currentMessage(), Action("actionPaste")->statusTip());
+    frame->TellStatus("done");
+    edit->close();
+    EXPECT_EQ(frame->statusBar()->currentMessage(), "done");
+    frame->OpenFile(Write("b.tst"));
+    EXPECT_EQ(frame->statusBar()->currentMessage(), "") << "it was about the other window";
 }

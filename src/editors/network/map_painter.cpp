@@ -11,7 +11,8 @@ CMapPainter::CMapPainter(const CMapScene& scene, const CMapStyle& style, int cur
     : m_scene(scene), m_style(style), m_currentBranch(currentBranch), m_pictures(pictures)
 {
     for (int kind = 0; kind < HDDataTypeCount; ++kind)
-        m_symbols[std::size_t(kind)] = LocationKindSymbol(kind, CMapScene::SymbolSize * scene.Ratio(), style.outline);
+        m_symbols[static_cast<std::size_t>(kind)] =
+            LocationKindSymbol(kind, CMapScene::SymbolSize * scene.Ratio(), style.outline);
 }
 
 void CMapPainter::Paint(QPainter& painter, const QRect& part, const QPoint& offset) const
@@ -86,7 +87,7 @@ void CMapPainter::PaintSymbols(QPainter& painter, const QRectF& part) const
         if (!near.contains(symbol.at))
             continue;
         // On whole pixels, so that it looks the same wherever it is.
-        const QPixmap& pixmap = m_symbols[std::size_t(symbol.kind)];
+        const QPixmap& pixmap = m_symbols[static_cast<std::size_t>(symbol.kind)];
         painter.drawPixmap(static_cast<int>(std::floor(symbol.at.x() - pixmap.width() / 2.0 + 0.5)),
                            static_cast<int>(std::floor(symbol.at.y() - pixmap.height() / 2.0 + 0.5)), pixmap);
     }

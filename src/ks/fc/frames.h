@@ -160,12 +160,11 @@ public:
     void SetBarStyle(unsigned style) { m_style = style; }
     /// Lets the bar dock on the given sides and docks it at the top.
     void EnableDocking(unsigned sides);
-    unsigned ControlId() const { return m_controlId; }
 
 private:
     void UpdateButtons();
     QPointer<CKsMDIFrameWnd> m_frame;
-    unsigned m_style = 0, m_controlId = 0;
+    unsigned m_style = 0;
 };
 
 inline constexpr unsigned CBRS_TOOLTIPS = 0x10, CBRS_FLYBY = 0x20, CBRS_SIZE_DYNAMIC = 0x4;

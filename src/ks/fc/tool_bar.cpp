@@ -5,13 +5,12 @@
 
 CKsToolBarEx::CKsToolBarEx(QWidget* parent) : QToolBar(parent) {}
 
-bool CKsToolBarEx::Create(CKsMDIFrameWnd* frame, unsigned style, unsigned controlId)
+bool CKsToolBarEx::Create(CKsMDIFrameWnd* frame, unsigned style, unsigned)
 {
     if (!frame)
         return false;
     m_frame = frame;
     m_style = style;
-    m_controlId = controlId;
     setIconSize(QSize(16, 16));
     connect(frame, &CKsMDIFrameWnd::CommandStateChanged, this, &CKsToolBarEx::UpdateButtons);
     return true;
