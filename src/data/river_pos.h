@@ -1,6 +1,7 @@
 // The base of every record that is tied to a location in the river network.
 #pragma once
 
+#include "base/not_given.h"
 #include "files/extra_params.h"
 #include "files/field.h"
 #include "tql/tql.h"
@@ -9,9 +10,6 @@
 #include <string>
 
 class LoadReport;
-
-/// Marks a chainage (or another number of a table) that has not been given; compared exactly.
-inline constexpr double NotGiven = 1.0e10;
 
 class HD_RiverPos
 {

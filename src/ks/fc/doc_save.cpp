@@ -1,4 +1,5 @@
 // How a document is saved: by name, under a new name, and before it is closed.
+#include "files/safe_file.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/file_dialog.h"
@@ -7,18 +8,6 @@
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
-
-namespace {
-
-bool SameFile(const CString& a, const CString& b)
-{
-    if (a.isEmpty() || b.isEmpty())
-        return false;
-    const CString first = QFileInfo(a).canonicalFilePath(), second = QFileInfo(b).canonicalFilePath();
-    return first.isEmpty() || second.isEmpty() ? QDir::cleanPath(a) == QDir::cleanPath(b) : first == second;
-}
-
-} // namespace
 
 CString CKsDoc::SavePathFor(const CString& path) const
 {
@@ -90,7 +79,7 @@ CString CKsDoc::AskSavePath()
         }
         // A name that differs from the file written by its case only is one that the user takes for that file.
         const CString taken = QFileInfo::exists(written) || !QFileInfo::exists(path) ? written : path;
-        if (!QFileInfo::exists(taken) || SameFile(taken, m_path) ||
+        if (!QFileInfo::exists(taken) || SameFile(taken.toStdString(), m_path.toStdString()) ||
             KsMessageBox(tr("%1 exists already. Replace it?").arg(QDir::toNativeSeparators(taken)),
                          QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
             return path;

@@ -123,4 +123,47 @@
             <translation>%1.</translation>
         </message>
     </context>
+    <context>
+        <name>ParameterFile</name>
+        <message>
+            <source>%1, line %2: %3</source>
+            <translation>%1, line %2: %3</translation>
+        </message>
+        <message>
+            <source>%1 is no file of this kind: it has no section [%2].</source>
+            <translation>%1 is no file of this kind: it has no section [%2].</translation>
+        </message>
+        <message>
+            <source>expected a section [%1].</source>
+            <translation>expected a section [%1].</translation>
+        </message>
+        <message>
+            <source>expected only one %1 in [%2].</source>
+            <translation>expected only one %1 in [%2].</translation>
+        </message>
+        <message>
+            <source>expected a text, %1 = &quot;...&quot;.</source>
+            <translation>expected a text, %1 = &quot;...&quot;.</translation>
+        </message>
+        <message>
+            <source>expected a file name after &quot;%1 =&quot;.</source>
+            <translation>expected a file name after &quot;%1 =&quot;.</translation>
+        </message>
+        <message>
+            <source>expected true or false after &quot;%1 =&quot;.</source>
+            <translation>expected true or false after &quot;%1 =&quot;.</translation>
+        </message>
+        <message>
+            <source>expected a number after &quot;%1 =&quot;.</source>
+            <translation>expected a number after &quot;%1 =&quot;.</translation>
+        </message>
+        <message>
+            <source>expected %1 numbers after &quot;%2 =&quot;.</source>
+            <translation>expected %1 numbers after &quot;%2 =&quot;.</translation>
+        </message>
+        <message>
+            <source>The new content is complete in &quot;%1&quot;.</source>
+            <translation>The new content is complete in &quot;%1&quot;.</translation>
+        </message>
+    </context>
 </TS>

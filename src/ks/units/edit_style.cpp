@@ -1,15 +1,12 @@
 #include "ks/units/edit_style.h"
 
+#include "base/not_given.h"
 #include "ks/units/unit_groups.h"
 
 #include <QCoreApplication>
 #include <QLocale>
 #include <cmath>
 #include <limits>
-
-namespace {
-constexpr double NotGiven = 1e10; // a value that has not been entered, in whatever unit
-} // namespace
 
 KsUnits& KsUnits::Instance()
 {

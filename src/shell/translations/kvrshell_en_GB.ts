@@ -451,17 +451,6 @@ Shell of the river model editors.</translation>
         </message>
     </context>
     <context>
-        <name>Projects</name>
-        <message>
-            <source>%1 is no project: it has no section [%2].</source>
-            <translation>%1 is no project: it has no section [%2].</translation>
-        </message>
-        <message>
-            <source>%1, line %2: expected a file name after "File =".</source>
-            <translation>%1, line %2: expected a file name after "File =".</translation>
-        </message>
-    </context>
-    <context>
         <name>ShellMain</name>
         <message>
             <source>Shell of the river model editors</source>

@@ -234,33 +234,6 @@ Delete Lines</translation>
         </message>
     </context>
     <context>
-        <name>SectionFile</name>
-        <message>
-            <source>expected the chainage, Chainage = a number.</source>
-            <translation>expected the chainage, Chainage = a number.</translation>
-        </message>
-        <message>
-            <source>expected only one %1 in a cross section.</source>
-            <translation>expected only one %1 in a cross section.</translation>
-        </message>
-        <message>
-            <source>expected a text, %1 = "...".</source>
-            <translation>expected a text, %1 = "...".</translation>
-        </message>
-        <message>
-            <source>expected a number after "%1 =".</source>
-            <translation>expected a number after "%1 =".</translation>
-        </message>
-        <message>
-            <source>expected an offset and a bed level, two numbers, after "%1 =".</source>
-            <translation>expected an offset and a bed level, two numbers, after "%1 =".</translation>
-        </message>
-        <message>
-            <source>%1 holds no cross sections: it has no section [%2].</source>
-            <translation>%1 holds no cross sections: it has no section [%2].</translation>
-        </message>
-    </context>
-    <context>
         <name>SectionRules</name>
         <message>
             <source>a cross section needs the name of its branch.</source>
@@ -293,13 +266,6 @@ Delete Lines</translation>
 %2</source>
             <translation>%1 could not be saved.
 %2</translation>
-        </message>
-    </context>
-    <context>
-        <name>ParameterFile</name>
-        <message>
-            <source>%1, line %2: %3</source>
-            <translation>%1, line %2: %3</translation>
         </message>
     </context>
 </TS>

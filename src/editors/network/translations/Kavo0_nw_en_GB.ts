@@ -552,22 +552,6 @@
             <source>the chainages of the two ends have to differ.</source>
             <translation>the chainages of the two ends have to differ.</translation>
         </message>
-        <message>
-            <source>expected true or false.</source>
-            <translation>expected true or false.</translation>
-        </message>
-        <message>
-            <source>expected %1 numbers after &quot;%2 =&quot;.</source>
-            <translation>expected %1 numbers after &quot;%2 =&quot;.</translation>
-        </message>
-        <message>
-            <source>%1 is no river network: it has no section [%2].</source>
-            <translation>%1 is no river network: it has no section [%2].</translation>
-        </message>
-        <message>
-            <source>expected the name of a coordinate system, CoordinateSystem = &quot;EPSG:...&quot;.</source>
-            <translation>expected the name of a coordinate system, CoordinateSystem = &quot;EPSG:...&quot;.</translation>
-        </message>
     </context>
     <context>
         <name>NetworkTexts</name>
@@ -614,13 +598,6 @@ Zoom Out</translation>
 Import Branches</source>
             <translation>Reads lines of a GIS file as branches
 Import Branches</translation>
-        </message>
-    </context>
-    <context>
-        <name>ParameterFile</name>
-        <message>
-            <source>%1, line %2: %3</source>
-            <translation>%1, line %2: %3</translation>
         </message>
     </context>
     <context>

@@ -1,0 +1,32 @@
+#include "files/structure.h"
+
+namespace {
+
+Result<TqlStructure> Checked(TqlStructure structure)
+{
+    TqlSyntaxError report;
+    if (!tqlGetSyntaxErr(structure.Get(), &report))
+        return structure;
+    tqlGetErrorGlb(); // taken: the report says it all
+    return Error{report.message};
+}
+
+} // namespace
+
+Result<TqlStructure> ParseFile(const std::string& path)
+{
+    return Checked(TqlStructure(tqlLoadFile(path)));
+}
+
+Result<TqlStructure> ParseText(std::string text, const std::string& name)
+{
+    return Checked(TqlStructure(tqlLoadText(std::move(text), name)));
+}
+
+Result<void> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options)
+{
+    const std::string_view text = tqlGetText(built);
+    if (text.empty()) // the library refuses what no reader could take back
+        return Error{"Could not write \"" + path + "\": the content cannot be expressed in a parameter file."};
+    return WriteFileSafely(path, text, options);
+}
