@@ -1,5 +1,5 @@
-// The mark of a number that has not been given.
+// The mark of a number that has not been given, in files, tables and packages alike.
 #pragma once
 
-/// Stands for a chainage (or another number of a table) that has not been given; compared exactly.
+/// Compared exactly, and in whatever unit.
 inline constexpr double NotGiven = 1.0e10;

@@ -1,17 +1,5 @@
 #include "data/hd_file.h"
 
-Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report)
-{
-    TqlStructure structure(tqlLoadFile(path, 1));
-    TqlSyntaxError error;
-    if (!tqlGetSyntaxErr(structure.Get(), &error))
-        return structure;
-    tqlGetErrorGlb(); // taken: the report says it all
-    if (report)
-        *report = error;
-    return Error{error.message};
-}
-
 Result<HD_Parameters> LoadHDFile(const std::string& path)
 {
     const Result<TqlStructure> structure = ParseFile(path);
@@ -41,8 +29,5 @@ std::string HDFileText(const HD_Parameters& parameters, bool everySet)
 Result<void> SaveHDFile(const HD_Parameters& parameters, const std::string& path, const SaveOptions& options)
 {
     const TqlStructure structure = Build(parameters, options.everySet);
-    const std::string_view text = tqlGetText(structure.Get());
-    if (text.empty()) // the library refuses what no reader could take back
-        return Error{"Could not write \"" + path + "\": the content cannot be expressed in a parameter file."};
-    return WriteFileSafely(path, text, {.sync = options.sync});
+    return SaveStructure(structure.Get(), path, {.sync = options.sync});
 }

@@ -120,6 +120,10 @@ constexpr GroupAccess MakeAccess()
     }
     return access;
 }
+inline FieldList NoFields()
+{
+    return {};
+}
 template <const Field& element>
 FieldList ElementList()
 {
@@ -210,6 +214,15 @@ constexpr Field Group(std::string_view name)
     using Container = typename field_detail::Path<Path...>::Type;
     Field field = field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Group, name);
     field.group = &field_detail::Access<Container, &Container::value_type::DeclaredFields>;
+    return field;
+}
+/// Elements that sections of a file hold, which are declared there (declared_section.h).
+template <auto... Path>
+constexpr Field SectionGroup(std::string_view name)
+{
+    using Container = typename field_detail::Path<Path...>::Type;
+    Field field = field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Group, name);
+    field.group = &field_detail::Access<Container, &field_detail::NoFields>;
     return field;
 }
 /// The one field of elements that are plain values.

@@ -118,6 +118,7 @@ struct Field
     const GroupAccess* group = nullptr; // Group only
     UnitGroup unit = UnitGroup::None;
     bool optionalTail = false; // read only when the keyword has parameters left; always written
+    bool mayBeUnknown = false; // a number: not a number stands for one that is not known
     bool padWhenEmpty = false; // an empty group is followed by one element with default values
     TextLine title{};
     Str choices{};                              // the texts of the indices, one a line; for a text what it may be
@@ -156,6 +157,12 @@ struct Field
     {
         Field field = *this;
         field.optionalTail = true;
+        return field;
+    }
+    constexpr Field MayBeUnknown() const
+    {
+        Field field = *this;
+        field.mayBeUnknown = true;
         return field;
     }
     constexpr Field PadWhenEmpty() const

@@ -1,6 +1,7 @@
 #include "files/field_io.h"
 
 #include "files/extra_params.h"
+#include "files/structure.h"
 
 #include <algorithm>
 #include <bit>
@@ -309,13 +310,12 @@ void ReadExtra(ParamCursor& params, ExtraParams& extra)
 std::string ParamsText(FieldList fields, const void* object)
 {
     constexpr std::string_view mark = "x = ";
-    tqlHandle structure = tqlCreate();
-    tqlAddTarget(structure, "X");
-    tqlAddKeyword(structure, "x");
-    WriteFields(structure, fields, object);
-    tqlEndSection(structure);
-    std::string text(tqlGetText(structure));
-    tqlClose(&structure);
+    const TqlStructure structure(tqlCreate());
+    tqlAddTarget(structure.Get(), "X");
+    tqlAddKeyword(structure.Get(), "x");
+    WriteFields(structure.Get(), fields, object);
+    tqlEndSection(structure.Get());
+    std::string text(tqlGetText(structure.Get()));
     text.erase(0, text.find(mark) + mark.size());
     return text.substr(0, text.find('\n'));
 }

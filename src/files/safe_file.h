@@ -1,8 +1,8 @@
 // Writing a file so that at every moment either its old or its new content is there whole.
 #pragma once
 
-#include "files/platform_file.h"
 #include "base/result.h"
+#include "files/platform_file.h"
 
 #include <string>
 #include <string_view>
@@ -31,5 +31,6 @@ Result<std::string> KeepOriginal(const std::string& path, std::string_view why, 
 /// The content of a file, byte for byte.
 Result<std::string> ReadWholeFile(const std::string& path);
 
-/// Whether both paths name one existing file.
+/// Whether both paths name one existing file on the disk. Where a name is meant that a user gave, in whatever case, ask
+/// the shell's library (KsSameFile).
 bool SameFile(const std::string& a, const std::string& b);

@@ -17,6 +17,8 @@ struct UnknownNode
     bool IsSection = false;
     std::string Params;                // of a keyword, in file notation
     std::vector<UnknownNode> Children; // of a section: keywords, then sections
+
+    bool operator==(const UnknownNode&) const = default;
 };
 using UnknownNodes = std::vector<UnknownNode>;
 

@@ -1,9 +1,9 @@
 #include "shell/project_respell.h"
 
-#include "tql/tql.h"
+#include "files/structure.h"
+#include "shell/project_file.h"
 
 #include <QDir>
-#include <QFile>
 #include <QFileInfo>
 
 namespace {
@@ -21,21 +21,18 @@ qsizetype OffsetOf(const QByteArray& text, const TqlPosition& place)
 QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text, const QString& path)
 {
     QList<qsizetype> offsets;
-    tqlHandle structure = tqlLoadText(text.toStdString(), projectPath.toStdString());
-    tqlGetErrorGlb(); // one that cannot be read has no entries
-    const tqlHandle section = tqlSectionByNameNum(tqlTargetByNameNum(structure, "KVR_PROJECT", 1), "Members", 1);
+    const auto structure = ParseText(text.toStdString(), projectPath.toStdString());
+    ProjectFile project;
+    if (!structure || ReadDeclared(structure.value().Get(), DeclaredProjectFile(), &project))
+        return {};
     const QDir folder = QFileInfo(projectPath).absoluteDir();
-    for (int number = 1, count = tqlGetNoKeywords(section, "File"); number <= count; ++number) {
-        const tqlHandle param = tqlParamByNum(tqlKeywordByNameNum(section, "File", number), 1);
-        std::string name;
-        if (!tqlGetString(param, &name))
+    for (std::size_t i = 0; i < project.members.size(); ++i) {
+        if (project.members[i].PathIn(folder) != QDir::cleanPath(path))
             continue;
-        const QString member = folder.absoluteFilePath(QString::fromStdString(name).replace(u'\\', u'/'));
+        const tqlHandle param = tqlParamByNum(MemberKeyword(structure.value().Get(), int(i) + 1), 1);
         const auto length = qsizetype(tqlGetRawParam(param).size()) - 1 - QFileInfo(path).suffix().size();
-        if (QDir::cleanPath(member) == QDir::cleanPath(path))
-            offsets << OffsetOf(text, tqlGetPosition(structure, param)) + length;
+        offsets << OffsetOf(text, tqlGetPosition(structure.value().Get(), param)) + length;
     }
-    tqlClose(&structure);
     return offsets;
 }
 
@@ -48,12 +45,17 @@ void RespellMember(const QString& projectPath, const QString& oldPath, const QSt
     const bool isRespelt = oldPath != newPath && old != extension && before.path() == after.path() &&
                            before.completeBaseName() == after.completeBaseName() &&
                            before.suffix().compare(after.suffix(), Qt::CaseInsensitive) == 0;
-    QFile file(projectPath);
-    if (!isRespelt || !file.open(QIODevice::ReadWrite | QIODevice::ExistingOnly))
+    const Result<std::string> content = isRespelt ? ReadWholeFile(projectPath.toStdString()) : Error{};
+    if (!content)
         return;
-    const QByteArray text = file.readAll();
+    QByteArray text = QByteArray::fromStdString(content.value());
+    bool isChanged = false;
     for (const qsizetype offset : ExtensionsOf(projectPath, text, oldPath)) {
-        if (text.mid(offset, old.size()) == old && file.seek(offset))
-            file.write(extension);
+        if (text.mid(offset, old.size()) != old)
+            continue;
+        text.replace(offset, old.size(), extension);
+        isChanged = true;
     }
+    if (isChanged && !WriteFileSafely(projectPath.toStdString(), text.toStdString()))
+        return; // read-only: its members are found all the same
 }

@@ -2,10 +2,9 @@
 
 #include "ks/fc/exchange.h"
 #include "ks/fc/file_name.h"
-#include "ks/fc/syntax_error.h"
-#include "tql/tql.h"
+#include "ks/fc/parameter_file.h"
+#include "shell/project_file.h"
 
-#include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
@@ -13,54 +12,16 @@
 
 namespace {
 
-/// A parameter file under reading; closes itself.
-class ParameterFile
-{
-public:
-    explicit ParameterFile(const QString& path) : m_handle(tqlLoadFile(path.toStdString())) {}
-    ~ParameterFile() { tqlClose(&m_handle); }
-    ParameterFile(const ParameterFile&) = delete;
-    ParameterFile& operator=(const ParameterFile&) = delete;
-    tqlHandle Get() const { return m_handle; }
-
-private:
-    tqlHandle m_handle;
-};
-
-struct Projects
-{
-    Q_DECLARE_TR_FUNCTIONS(Projects)
-};
-
 bool ReadMembers(CProject& project, QString& error)
 {
-    const ParameterFile file(project.path);
-    if (TqlSyntaxError report; tqlGetSyntaxErr(file.Get(), &report)) {
-        tqlGetErrorGlb();
-        error = KsSyntaxErrorText(report);
+    ProjectFile read;
+    const CKsParameterFile source(project.path, DeclaredProjectFile(), &read);
+    error = source.Error();
+    if (!error.isEmpty())
         return false;
-    }
-    const tqlHandle target = tqlTargetByNameNum(file.Get(), "KVR_PROJECT", 1);
-    const tqlHandle section = tqlSectionByNameNum(target, "Members", 1);
-    if (!section) {
-        error = Projects::tr("%1 is no project: it has no section [%2].")
-                    .arg(QFileInfo(project.path).fileName(), QString::fromLatin1(target ? "Members" : "KVR_PROJECT"));
-        return false;
-    }
     const QDir folder = QFileInfo(project.path).absoluteDir();
-    for (int i = 1, count = tqlGetNoKeywords(section, "File"); i <= count; ++i) {
-        std::string member;
-        if (!tqlGetParam(section, "File", &member, i)) {
-            const TqlPosition place = tqlGetPosition(tqlKeywordByNameNum(section, "File", i));
-            error = Projects::tr("%1, line %2: expected a file name after \"File =\".")
-                        .arg(QFileInfo(project.path).fileName())
-                        .arg(place.line);
-            return false;
-        }
-        // Written on either platform, read on either.
-        const QString name = QString::fromStdString(member).replace(u'\\', u'/');
-        project.members << QDir::cleanPath(folder.absoluteFilePath(name));
-    }
+    for (const ProjectMember& member : read.members)
+        project.members << member.PathIn(folder);
     project.members.removeDuplicates();
     return true;
 }

@@ -189,6 +189,23 @@ TEST_F(Hdkv, ShowFormats)
         EXPECT_EQ(Run(std::string("show a.hdkv ") + c.arguments), 0) << err;
         EXPECT_EQ(out, c.printed);
     }
+    EXPECT_EQ(Run("show a.hdkv Enc_Simulation --format json"), 0) << err;
+    EXPECT_TRUE(out.starts_with("[\n  {\"Set\": 1, \"RiverName\": \"E\", ")) << out;
+}
+
+TEST_F(Hdkv, ShowEscapesWhatItsFormatsCannotHold)
+{
+    HD_Parameters parameters;
+    for (const char* name : {"\"", "a\x0F\x10\x1F\x7F"}) {
+        HD_Windfact record;
+        record.RiverName = name;
+        parameters.WindList.Add(record);
+    }
+    ASSERT_TRUE(SaveHDFile(parameters, Path("e.hdkv")));
+    EXPECT_EQ(Run("show e.hdkv WindList --format csv"), 0) << err;
+    EXPECT_EQ(out, "RiverName,Chainage,WindFactor\n\"\"\"\",1e+10,0\na\x0F\x10\x1F\x7F,1e+10,0\n");
+    EXPECT_EQ(Run("show e.hdkv WindList --format json"), 0) << err;
+    EXPECT_NE(out.find("\"a\\u000f\\u0010\\u001f\x7F\""), std::string::npos) << out;
 }
 
 TEST_F(Hdkv, FmtAndNewWriteCanonicalFiles)

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "data/hd_file.h"
+#include "test_folder.h"
 #include "files/field_io.h"
 
 #include <filesystem>
@@ -88,20 +89,6 @@ void ForEachList(HD_Parameters& a, HD_Parameters& b, Visit visit)
 class FolderTest : public testing::Test
 {
 protected:
-    FolderTest()
-    {
-        const auto* info = testing::UnitTest::GetInstance()->current_test_info();
-        m_folder = std::filesystem::temp_directory_path() /
-                   (std::string("kvr-") + info->test_suite_name() + "-" + info->name());
-        std::filesystem::remove_all(m_folder);
-        std::filesystem::create_directories(m_folder);
-    }
-    ~FolderTest() override
-    {
-        std::error_code error;
-        std::filesystem::permissions(m_folder, std::filesystem::perms::owner_all, error);
-        std::filesystem::remove_all(m_folder, error);
-    }
     std::string Path(const char* name) const { return (m_folder / name).string(); }
     void Write(const char* name, std::string_view text) const
     {
@@ -113,5 +100,9 @@ protected:
         return static_cast<std::size_t>(std::distance(std::filesystem::directory_iterator(m_folder), {}));
     }
 
-    std::filesystem::path m_folder;
+private:
+    const TestFolder m_owner;
+
+protected:
+    const std::filesystem::path m_folder = m_owner.Path();
 };

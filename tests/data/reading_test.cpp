@@ -70,6 +70,19 @@ TEST(Reading, CountsAreCheckedAgainstTheParameters)
     }
 }
 
+TEST(Reading, AGroupStartsAfreshWhateverItHeld)
+{
+    HD_Parameters parameters;
+    parameters.Global.Mixing.CoefPairs = {{7, 8}, {9, 10}};
+    const TqlStructure structure =
+        Parsed("[KAVO0_HD]\n[Global_Variables]\n[MixingCoefficients]\nMixingCoef = 1, \"x\", 2, "
+               "3, 4, 5, 6\n[/MixingCoefficients]\n[/Global_Variables]\n[/KAVO0_HD]\n");
+    parameters.Load(structure.Get());
+    ASSERT_EQ(parameters.Global.Mixing.CoefPairs.size(), 1u);
+    EXPECT_EQ(parameters.Global.Mixing.CoefPairs[0].First, 0) << "not what stood there before";
+    EXPECT_EQ(parameters.Global.Mixing.CoefPairs[0].Second, 2);
+}
+
 TEST(Reading, MarkTitlesArePaddedWhenEmpty)
 {
     const HD_Parameters empty;

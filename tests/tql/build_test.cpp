@@ -1,3 +1,4 @@
+#include "test_folder.h"
 #include "tql/tql_support.h"
 
 #include <filesystem>
@@ -65,7 +66,8 @@ TEST(Building, WhatCannotBeReadBackIsNotWritten)
         tqlAddTarget(out, "T");
         add(out);
         tqlEndSection(out);
-        const std::string path = testing::TempDir() + "refused.hdkv";
+        const TestFolder folder;
+        const std::string path = folder.Path("refused.hdkv");
         EXPECT_FALSE(tqlAppend(out, path));
         EXPECT_EQ(tqlGetErrorGlb(), static_cast<int>(TqlError::Write));
         EXPECT_FALSE(std::filesystem::exists(path));
@@ -95,8 +97,8 @@ TEST(Building, WhatCannotBeReadBackIsNotWritten)
 
 TEST(Building, AppendAddsToTheFileAndReportsFailure)
 {
-    const std::string path = testing::TempDir() + "\xE6\xB2\xB3.hdkv";
-    std::filesystem::remove(std::filesystem::u8path(path));
+    const TestFolder folder;
+    const std::string path = folder.Path("\xE6\xB2\xB3.hdkv");
     const Structure out(tqlCreate());
     tqlAddTarget(out, "T");
     tqlEndSection(out);
@@ -106,7 +108,7 @@ TEST(Building, AppendAddsToTheFileAndReportsFailure)
     const std::string content{std::istreambuf_iterator<char>(in), {}};
     EXPECT_EQ(content, std::string(tqlGetText(out)) + std::string(tqlGetText(out)));
 
-    EXPECT_FALSE(tqlAppend(out, testing::TempDir() + "no such folder/x.hdkv"));
+    EXPECT_FALSE(tqlAppend(out, folder.Path("no such folder/x.hdkv")));
     EXPECT_EQ(tqlPeekErrorGlb(), static_cast<int>(TqlError::Write));
     EXPECT_EQ(tqlGetErrorGlb(), static_cast<int>(TqlError::Write));
     EXPECT_EQ(tqlGetErrorGlb(), 0);

@@ -1,3 +1,4 @@
+#include "test_folder.h"
 #include "tql/tql_support.h"
 
 #include <filesystem>
@@ -19,9 +20,9 @@ TqlSyntaxError LoadError(const std::string& path)
     return error;
 }
 
-std::string WriteFile(const std::string& name, const std::string& content)
+std::string WriteFile(const TestFolder& folder, const std::string& name, const std::string& content)
 {
-    const std::string path = testing::TempDir() + name;
+    const std::string path = folder.Path(name);
     std::ofstream(fs::u8path(path), std::ios::binary) << content;
     return path;
 }
@@ -46,13 +47,13 @@ TEST(Loading, LayoutIsFree)
 
 TEST(Loading, FilesThatCannotBeReadSayWhy)
 {
-    const std::string folder = testing::TempDir();
-    const TqlSyntaxError missing = LoadError(folder + "nowhere.hdkv");
+    const TestFolder folder;
+    const TqlSyntaxError missing = LoadError(folder.Path("nowhere.hdkv"));
     EXPECT_EQ(missing.code, TqlError::Unreadable);
     EXPECT_EQ(missing.file, "nowhere.hdkv");
     EXPECT_EQ(missing.line, 0u);
-    EXPECT_EQ(missing.message, folder + "nowhere.hdkv cannot be read: there is no such file");
-    EXPECT_NE(LoadError(folder).message.find("it is a folder"), std::string::npos);
+    EXPECT_EQ(missing.message, folder.Path("nowhere.hdkv") + " cannot be read: there is no such file");
+    EXPECT_NE(LoadError(folder.Path("")).message.find("it is a folder"), std::string::npos);
     EXPECT_EQ(LoadError("").code, TqlError::Unreadable);
     if (fs::exists("/dev/zero")) {
         EXPECT_EQ(LoadError("/dev/zero").code, TqlError::Unreadable) << "endless";
@@ -60,7 +61,7 @@ TEST(Loading, FilesThatCannotBeReadSayWhy)
     if (fs::exists("/proc/self/mem")) { // opens, but reading its front fails
         EXPECT_EQ(LoadError("/proc/self/mem").code, TqlError::Unreadable);
     }
-    const std::string secret = WriteFile("secret.hdkv", "[T]\n[/T]\n");
+    const std::string secret = WriteFile(folder, "secret.hdkv", "[T]\n[/T]\n");
     fs::permissions(secret, fs::perms::none);
     if (!std::ifstream(secret)) { // the administrator may read everything
         EXPECT_EQ(LoadError(secret).code, TqlError::Unreadable);
@@ -73,7 +74,8 @@ TEST(Loading, AFileIsReadWholeWhateverItsName)
     std::string text = "[T]\n";
     for (int i = 0; i < 100000; ++i)
         text += "K = " + std::to_string(i) + "\n";
-    const std::string path = WriteFile("\xE6\xB2\xB3 1.hdkv", text + "[/T]");
+    const TestFolder folder;
+    const std::string path = WriteFile(folder, "\xE6\xB2\xB3 1.hdkv", text + "[/T]");
     const Structure structure(tqlLoadFile(path));
     std::int32_t last = 0;
     EXPECT_TRUE(tqlGetParam(tqlTargetByNameNum(structure, "T", 1), "K", &last, 100000));
@@ -82,9 +84,10 @@ TEST(Loading, AFileIsReadWholeWhateverItsName)
 
 TEST(Loading, TheLastLoadDecidesTheGlobalError)
 {
-    EXPECT_EQ(LoadError(WriteFile("bad.hdkv", "[T]\n")).code, TqlError::Syntax);
+    const TestFolder folder;
+    EXPECT_EQ(LoadError(WriteFile(folder, "bad.hdkv", "[T]\n")).code, TqlError::Syntax);
     EXPECT_NE(tqlPeekErrorGlb(), 0);
-    EXPECT_EQ(LoadError(WriteFile("good.hdkv", "[T]\n[/T]\n")).code, TqlError::None);
+    EXPECT_EQ(LoadError(WriteFile(folder, "good.hdkv", "[T]\n[/T]\n")).code, TqlError::None);
     EXPECT_EQ(tqlPeekErrorGlb(), 0);
 }
 

@@ -98,6 +98,8 @@ const Case Cases[] = {
     {"[T]\nK = \"M\xFCller\"\n", "line 2, column 7: expected text in UTF-8, found the byte 0xFC", TqlError::Encoding},
     {"// \xED\xA0\x80\n", "line 1, column 4: expected text in UTF-8, found the byte 0xED", TqlError::Encoding},
     {"// \xC0\xAF\n", "line 1, column 4: expected text in UTF-8, found the byte 0xC0", TqlError::Encoding},
+    {"// \xE0\x9F\xBF\n", "line 1, column 4: expected text in UTF-8, found the byte 0xE0", TqlError::Encoding},
+    {"// \xF0\x8F\xBF\xBF\n", "line 1, column 4: expected text in UTF-8, found the byte 0xF0", TqlError::Encoding},
     {"// \xF4\x90\x80\x80\n", "line 1, column 4: expected text in UTF-8, found the byte 0xF4", TqlError::Encoding},
     {"// \xE5\xB7", "line 1, column 4: expected text in UTF-8, found the byte 0xE5", TqlError::Encoding},
     {std::string("\xFF\xFE[\0T\0", 6), "line 1, column 1: expected text in UTF-8, found UTF-16", TqlError::Encoding},

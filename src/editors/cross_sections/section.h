@@ -1,7 +1,8 @@
 // A cross section: the ground across the river at a place of a branch.
 #pragma once
 
-#include "editors/common/parameter_file.h"
+#include "files/field.h"
+#include "files/unknown_content.h"
 #include "ks/fc/exchange.h"
 
 #include <QString>
@@ -14,6 +15,8 @@ struct CSectionPoint
     double offset = 0; // across the section from its left end, looking downstream; metres
     double level = 0;  // of the ground; metres above datum
     bool operator==(const CSectionPoint&) const = default;
+
+    static FieldList DeclaredFields();
 };
 
 /// Metres; KsUnset for what is not known.
@@ -25,7 +28,7 @@ struct CCrossSection
     double radius = KsUnset;           // of curvature
     double width = KsUnset;            // of the water surface
     std::vector<CSectionPoint> points; // from left to right; offsets do not decrease
-    CKeptSection kept, keptProfile;    // what the file says beyond that, and among the points
+    UnknownNodes kept, keptProfile;    // what the file says beyond that, and among the points
 
     /// Branch, survey and PlaceOf(chainage): no two sections share it.
     std::tuple<QString, QString, double> Key() const;
@@ -37,13 +40,11 @@ double PlaceOf(double chainage);
 struct CCrossSections
 {
     std::vector<CCrossSection> sections;
-    std::vector<CKeptSection> keptTargets;
-    CKeptSection kept; // of the sections' own target
+    UnknownNodes kept, keptTargets; // what the file says beyond that, and its other targets
 
     /// Whether a section but the one at `except` (-1: any) has the key of `section`.
     bool IsTaken(const CCrossSection& section, int except = -1) const;
-    /// The section of the branch nearest to the chainage; -1 without any. Names are compared exactly, as in the HD
-    /// parameters.
+    /// The section of the branch nearest to the chainage; -1 without any.
     int Nearest(const QString& branch, double chainage) const;
     /// The branches in the order in which they are first met.
     QStringList Branches() const;

@@ -1,201 +1,114 @@
 #include "editors/cross_sections/section_file.h"
 
 #include "editors/cross_sections/section_rules.h"
+#include "ks/fc/parameter_file.h"
 
-#include <QCoreApplication>
-#include <QFileInfo>
-#include <cmath>
+#include <iterator>
 #include <set>
 
 namespace {
 
-struct SectionFile
+using U = UnitGroup;
+
+// What the file holds, with its texts as fields take them.
+struct FileSection
 {
-    Q_DECLARE_TR_FUNCTIONS(SectionFile)
+    std::string branch, topoId;
+    CCrossSection section; // all else
+};
+struct FileSections
+{
+    std::vector<FileSection> sections;
+    UnknownNodes kept, keptTargets;
 };
 
-// Names of the file.
-constexpr const char* Target = "KVR_CROSS_SECTIONS";
-constexpr const char* Section = "CrossSection";
-constexpr const char* Branch = "Branch";
-constexpr const char* TopoId = "TopoID";
-constexpr const char* Chainage = "Chainage";
-constexpr const char* Radius = "Radius";
-constexpr const char* Width = "Width";
-constexpr const char* Profile = "Profile";
-constexpr const char* Point = "Point";
+// The names of the file.
+constexpr const char *SectionName = "CrossSection", *ProfileName = "Profile";
+constexpr const char *BranchKeyword = "Branch", *WidthKeyword = "Width", *PointKeyword = "Point";
 
-/// Reads sections until something is wrong, and then says what.
-class CReader
+using F = FileSection;
+using C = CCrossSection;
+constexpr auto branch = FieldsOf<F>({Text<&F::branch>("Branch")});
+constexpr auto topoId = FieldsOf<F>({Text<&F::topoId>("TopoID")});
+constexpr auto chainage = FieldsOf<F>({Number<&F::section, &C::chainage>("Chainage", U::Chainage)});
+constexpr auto radius = FieldsOf<F>({Number<&F::section, &C::radius>("Radius", U::Radius).MayBeUnknown()});
+constexpr auto width = FieldsOf<F>({Number<&F::section, &C::width>("Width", U::Width).MayBeUnknown()});
+constexpr auto points = FieldsOf<F>({Group<&F::section, &C::points>("Point")});
+constexpr DeclaredKeyword sectionKeywords[] = {{BranchKeyword, branch, Presence::Optional}, // a rule asks for it
+                                               {"TopoID", topoId, Presence::Optional},
+                                               {"Chainage", chainage},
+                                               {"Radius", radius, Presence::Optional},
+                                               {WidthKeyword, width, Presence::Optional}};
+constexpr DeclaredKeyword profileKeywords[] = {{PointKeyword, points}};
+constexpr DeclaredSection sectionSections[] = {
+    {.name = ProfileName, .kept = Keeps<&F::section, &C::keptProfile>(), .keywords = profileKeywords}};
+
+constexpr Field each = SectionGroup<&FileSections::sections>(SectionName);
+constexpr DeclaredSection targetSections[] = {{.name = SectionName,
+                                               .kept = Keeps<&F::section, &C::kept>(),
+                                               .keywords = sectionKeywords,
+                                               .sections = sectionSections,
+                                               .sectionCount = std::size(sectionSections),
+                                               .each = &each}};
+constexpr DeclaredFile file{{.name = "KVR_CROSS_SECTIONS",
+                             .kept = Keeps<&FileSections::kept>(),
+                             .sections = targetSections,
+                             .sectionCount = std::size(targetSections)},
+                            Keeps<&FileSections::keptTargets>()};
+
+/// What is wrong stands in this line.
+tqlHandle FaultyNode(tqlHandle node, const CSectionFault& fault)
 {
-public:
-    explicit CReader(const QString& path) : m_path(path) {}
-    const QString& Error() const { return m_error; }
-
-    void ReadTarget(tqlHandle target, CCrossSections& read)
-    {
-        read.kept = KeepUnknown(target, {Section});
-        for (int i = 1, count = tqlGetNoSections(target); i <= count && m_error.isEmpty(); ++i) {
-            const tqlHandle node = tqlSectionByNum(target, i);
-            if (tqlName(node) != Section)
-                continue;
-            CCrossSection section = ReadSection(node);
-            if (m_error.isEmpty() && !m_keys.insert(section.Key()).second)
-                Fail(node, WhyTaken(section));
-            read.sections.push_back(std::move(section));
-        }
+    switch (fault.field) {
+    case CSectionFault::Point:
+        return tqlKeywordByNameNum(tqlSectionByNameNum(node, ProfileName, 1), PointKeyword, fault.point + 1);
+    case CSectionFault::Width:
+        return CKsParameterFile::PlaceOf(node, WidthKeyword);
+    default:
+        return CKsParameterFile::PlaceOf(node, BranchKeyword);
     }
-
-private:
-    void Fail(tqlHandle node, const QString& what)
-    {
-        if (m_error.isEmpty())
-            m_error = CParameterFile::ErrorAt(m_path, node, what);
-    }
-
-    CCrossSection ReadSection(tqlHandle node)
-    {
-        CCrossSection section;
-        RefuseSecond(node);
-        section.branch = ReadText(node, Branch);
-        section.topoId = ReadText(node, TopoId);
-        if (tqlGetNoKeywords(node, Chainage) == 0)
-            Fail(node, SectionFile::tr("expected the chainage, Chainage = a number."));
-        for (const auto& [name, value] : {std::pair(Chainage, &section.chainage), std::pair(Radius, &section.radius),
-                                          std::pair(Width, &section.width)}) {
-            if (tqlGetNoKeywords(node, name))
-                ReadNumbers(node, name, 1, {value}, value != &section.chainage);
-        }
-        ReadPoints(tqlSectionByNameNum(node, Profile, 1), section);
-        if (const CSectionFault fault = FindFault(section); fault.field != CSectionFault::Nothing)
-            Fail(FaultyNode(node, fault), fault.text);
-        section.kept = KeepUnknown(node, {Branch, TopoId, Chainage, Radius, Width, Profile});
-        return section;
-    }
-
-    /// A value said twice would be lost when the file is saved.
-    void RefuseSecond(tqlHandle node)
-    {
-        for (const char* name : {Branch, TopoId, Chainage, Radius, Width}) {
-            if (const tqlHandle second = tqlKeywordByNameNum(node, name, 2))
-                Fail(second, SectionFile::tr("expected only one %1 in a cross section.").arg(QLatin1String(name)));
-        }
-        if (const tqlHandle second = tqlSectionByNameNum(node, Profile, 2))
-            Fail(second, SectionFile::tr("expected only one %1 in a cross section.").arg(QLatin1String(Profile)));
-    }
-
-    void ReadPoints(tqlHandle profile, CCrossSection& section)
-    {
-        for (int i = 1, count = tqlGetNoKeywords(profile, Point); i <= count && m_error.isEmpty(); ++i) {
-            CSectionPoint point;
-            ReadNumbers(profile, Point, i, {&point.offset, &point.level}, false);
-            section.points.push_back(point);
-        }
-        if (profile)
-            section.keptProfile = KeepUnknown(profile, {Point});
-    }
-
-    /// What is wrong stands in this line.
-    static tqlHandle FaultyNode(tqlHandle node, const CSectionFault& fault)
-    {
-        tqlHandle line = nullptr;
-        if (fault.field == CSectionFault::Point)
-            line = tqlKeywordByNameNum(tqlSectionByNameNum(node, Profile, 1), Point, fault.point + 1);
-        else if (fault.field == CSectionFault::Width)
-            line = tqlKeywordByNameNum(node, Width, 1);
-        else if (fault.field == CSectionFault::Branch)
-            line = tqlKeywordByNameNum(node, Branch, 1);
-        return line ? line : node;
-    }
-
-    /// Empty when the keyword is missing.
-    QString ReadText(tqlHandle node, const char* name)
-    {
-        std::string text;
-        if (tqlGetNoKeywords(node, name) && !tqlGetParam(node, name, &text))
-            Fail(tqlKeywordByNameNum(node, name, 1),
-                 SectionFile::tr("expected a text, %1 = \"...\".").arg(QLatin1String(name)));
-        return QString::fromStdString(text);
-    }
-
-    /// All parameters of a keyword, each a number, or "nan" where `unset` is allowed.
-    void ReadNumbers(tqlHandle node, const char* name, int number, const std::vector<double*>& values, bool unset)
-    {
-        const tqlHandle keyword = tqlKeywordByNameNum(node, name, number);
-        tqlHandle param = tqlParamByNum(keyword, 1);
-        bool good = tqlGetNoParams(keyword) == static_cast<int>(values.size());
-        for (std::size_t i = 0; good && i < values.size(); ++i)
-            good = tqlTake(&param, values[i]) && (std::isfinite(*values[i]) || (unset && std::isnan(*values[i])));
-        if (!good)
-            Fail(keyword, values.size() == 1
-                              ? SectionFile::tr("expected a number after \"%1 =\".").arg(QLatin1String(name))
-                              : SectionFile::tr("expected an offset and a bed level, two numbers, after \"%1 =\".")
-                                    .arg(QLatin1String(name)));
-    }
-
-    QString m_path, m_error;
-    std::set<decltype(CCrossSection().Key())> m_keys;
-};
-
-void WriteSection(tqlHandle file, const CCrossSection& section)
-{
-    tqlAddSection(file, Section);
-    tqlPutParam(file, Branch, std::string_view(section.branch.toStdString()));
-    tqlPutParam(file, TopoId, std::string_view(section.topoId.toStdString()));
-    tqlPutParam(file, Chainage, section.chainage);
-    tqlPutParam(file, Radius, section.radius);
-    tqlPutParam(file, Width, section.width);
-    tqlAddSection(file, Profile);
-    for (const CSectionPoint& point : section.points) {
-        tqlAddKeyword(file, Point);
-        tqlAddDouble(file, point.offset);
-        tqlAddDouble(file, point.level);
-    }
-    WriteKept(file, section.keptProfile);
-    tqlEndSection(file);
-    WriteKept(file, section.kept);
-    tqlEndSection(file);
 }
 
 } // namespace
 
+FieldList CSectionPoint::DeclaredFields()
+{
+    using P = CSectionPoint;
+    static constexpr auto fields =
+        FieldsOf<P>({Number<&P::offset>("offset", U::Width), Number<&P::level>("level", U::WaterLevel)});
+    return fields;
+}
+
 QString ReadCrossSections(const QString& path, CCrossSections& sections)
 {
-    const CParameterFile file(tqlLoadFile(path.toStdString()));
-    if (const QString error = file.SyntaxError(); !error.isEmpty())
-        return error;
-    const tqlHandle target = tqlTargetByNameNum(file.Get(), Target, 1);
-    if (!target)
-        return SectionFile::tr("%1 holds no cross sections: it has no section [%2].")
-            .arg(QFileInfo(path).fileName(), QLatin1String(Target));
-    CCrossSections read;
-    CReader reader(path);
-    reader.ReadTarget(target, read);
-    if (!reader.Error().isEmpty())
-        return reader.Error();
-    bool own = true; // the first target of the name has the sections
-    for (int i = 1, count = tqlGetNoSections(file.Get()); i <= count; ++i) {
-        const tqlHandle other = tqlSectionByNum(file.Get(), i);
-        if (tqlName(other) != Target || !std::exchange(own, false))
-            read.keptTargets.push_back(KeepUnknown(other, {}));
+    FileSections read;
+    CKsParameterFile source(path, file, &read);
+    CCrossSections taken;
+    std::set<decltype(CCrossSection().Key())> keys;
+    for (std::size_t i = 0; i < read.sections.size() && source.Error().isEmpty(); ++i) {
+        CCrossSection section = std::move(read.sections[i].section);
+        section.branch = QString::fromStdString(read.sections[i].branch);
+        section.topoId = QString::fromStdString(read.sections[i].topoId);
+        const tqlHandle node = tqlSectionByNameNum(source.Target(), SectionName, int(i) + 1);
+        if (const CSectionFault fault = FindFault(section); fault.field != CSectionFault::Nothing)
+            source.Fail(FaultyNode(node, fault), fault.text);
+        else if (!keys.insert(section.Key()).second)
+            source.Fail(node, WhyTaken(section));
+        taken.sections.push_back(std::move(section));
     }
-    read.SortByPlace();
-    sections = std::move(read);
+    if (!source.Error().isEmpty())
+        return source.Error();
+    taken.kept = std::move(read.kept);
+    taken.keptTargets = std::move(read.keptTargets);
+    taken.SortByPlace();
+    sections = std::move(taken);
     return {};
 }
 
 QString WriteCrossSections(const QString& path, const CCrossSections& sections)
 {
-    const CParameterFile file(tqlCreate());
-    tqlAddTarget(file.Get(), Target);
+    FileSections written{{}, sections.kept, sections.keptTargets};
     for (const CCrossSection& section : sections.sections)
-        WriteSection(file.Get(), section);
-    WriteKept(file.Get(), sections.kept);
-    tqlEndSection(file.Get());
-    for (const CKeptSection& target : sections.keptTargets) {
-        tqlAddTarget(file.Get(), target.name);
-        WriteKept(file.Get(), target);
-        tqlEndSection(file.Get());
-    }
-    return WriteParameterFile(path, file.Get());
+        written.sections.push_back({section.branch.toStdString(), section.topoId.toStdString(), section});
+    return KsWriteParameterFile(path, file, &written);
 }

@@ -1,5 +1,6 @@
 #include "editors/network/location_source.h"
 
+#include "base/not_given.h"
 #include "ks/fc/exports.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/hd_messages.h"
@@ -16,8 +17,7 @@ bool IsHDView(const CView* view)
 /// A line that the user has not completed is no location.
 bool IsComplete(const CKvr_CBE_ModelDataItem& item)
 {
-    constexpr double notGiven = 1e10; // as HD documents say it
-    return !item.branch.trimmed().isEmpty() && std::isfinite(item.chainage) && item.chainage != notGiven;
+    return !item.branch.trimmed().isEmpty() && std::isfinite(item.chainage) && item.chainage != NotGiven;
 }
 
 std::unique_ptr<CKvr_CBE_ModelDataItem> ItemOf(const CMapLocation& location)

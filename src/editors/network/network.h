@@ -1,7 +1,8 @@
 // The river network: branches with their course on the map and the channel along them.
 #pragma once
 
-#include "editors/common/parameter_file.h"
+#include "files/field.h"
+#include "files/unknown_content.h"
 #include "ks/fc/exchange.h"
 
 #include <QPointF>
@@ -15,16 +16,18 @@ struct CChannelRow
     double chainage = 0;
     double radius = KsUnset; // of curvature
     double width = KsUnset;  // of the water surface
+
+    static FieldList DeclaredFields();
 };
 
 struct CNetworkBranch
 {
     QString name;
-    double start = 0, end = 0;        // chainages of the first and the last vertex, metres; they differ
-    bool downstream = true;           // water flows towards increasing chainage
-    std::vector<QPointF> line;        // map coordinates, metres: x to the east, y to the north
-    std::vector<CChannelRow> channel; // by increasing chainage
-    CKeptSection kept;                // what the file says beyond that
+    double start = 0, end = 0;                // chainages of the first and the last vertex, metres; they differ
+    bool downstream = true;                   // water flows towards increasing chainage
+    std::vector<QPointF> line;                // map coordinates, metres: x to the east, y to the north
+    std::vector<CChannelRow> channel;         // by increasing chainage
+    UnknownNodes kept, keptLine, keptChannel; // what the file says beyond that, and among the vertices and the rows
 
     /// Whether water flows from the first vertex to the last.
     bool FlowsAlongLine() const { return downstream == (end >= start); }
@@ -37,8 +40,7 @@ struct CNetwork
 {
     std::vector<CNetworkBranch> branches;
     QString system; // that the coordinates lie in, as "EPSG:25832" or in WKT; empty when the file names none
-    std::vector<CKeptSection> keptTargets;
-    CKeptSection kept; // of the network's own target
+    UnknownNodes kept, keptTargets; // what the file says beyond that, and its other targets
 
     /// -1 for none.
     int FindBranch(const QString& name) const;

@@ -1,8 +1,9 @@
 #include "editors/network/network_file.h"
 
+#include "ks/fc/parameter_file.h"
+
 #include <QCoreApplication>
-#include <QFileInfo>
-#include <cmath>
+#include <iterator>
 
 namespace {
 
@@ -11,171 +12,132 @@ struct NetworkFile
     Q_DECLARE_TR_FUNCTIONS(NetworkFile)
 };
 
-// Names of the file.
-constexpr const char* Target = "KVR_NETWORK";
-constexpr const char* System = "CoordinateSystem";
-constexpr const char* Branch = "Branch";
-constexpr const char* Name = "Name";
-constexpr const char* Chainage = "Chainage";
-constexpr const char* Downstream = "FlowsDownstream"; // towards increasing chainage
-constexpr const char* Line = "Line";
-constexpr const char* Vertex = "Vertex";
-constexpr const char* Channel = "Channel";
-constexpr const char* Data = "DATA";
+using U = UnitGroup;
 
-/// Reads branches until something is wrong, and then says what.
-class CReader
+// What the file holds, with its texts and points as fields take them.
+struct Vertex
 {
-public:
-    explicit CReader(const QString& path) : m_path(path) {}
-    const QString& Error() const { return m_error; }
+    double x = 0, y = 0;
 
-    void ReadTarget(tqlHandle target, CNetwork& network)
+    static FieldList DeclaredFields()
     {
-        network.kept = KeepUnknown(target, {System, Branch});
-        std::string system;
-        if (tqlGetNoKeywords(target, System) && !tqlGetParam(target, System, &system))
-            Fail(Place(target, System),
-                 NetworkFile::tr("expected the name of a coordinate system, CoordinateSystem = \"EPSG:...\"."));
-        network.system = QString::fromStdString(system);
-        const int count = tqlGetNoSections(target);
-        for (int i = 1; i <= count && m_error.isEmpty(); ++i) {
-            const tqlHandle section = tqlSectionByNum(target, i);
-            if (tqlName(section) != Branch)
-                continue;
-            CNetworkBranch branch = ReadBranch(section);
-            if (m_error.isEmpty() && network.FindBranch(branch.name) >= 0)
-                Fail(tqlKeywordByNameNum(section, Name, 1),
-                     NetworkFile::tr("there is a branch \"%1\" already.").arg(branch.name));
-            network.branches.push_back(std::move(branch));
-        }
+        static constexpr auto fields =
+            FieldsOf<Vertex>({Number<&Vertex::x>("x", U::Coordinate), Number<&Vertex::y>("y", U::Coordinate)});
+        return fields;
     }
-
-private:
-    void Fail(tqlHandle node, const QString& what)
-    {
-        if (m_error.isEmpty())
-            m_error = CParameterFile::ErrorAt(m_path, node, what);
-    }
-
-    CNetworkBranch ReadBranch(tqlHandle section)
-    {
-        CNetworkBranch branch;
-        std::string name;
-        if (!tqlGetParam(section, Name, &name) || name.empty())
-            Fail(Place(section, Name), NetworkFile::tr("expected the branch's name, Name = \"...\"."));
-        branch.name = QString::fromStdString(name);
-        ReadNumbers(section, Chainage, 1, {&branch.start, &branch.end}, false);
-        if (branch.start == branch.end)
-            Fail(Place(section, Chainage), NetworkFile::tr("the chainages of the two ends have to differ."));
-        if (tqlGetNoKeywords(section, Downstream) && !tqlGetParam(section, Downstream, &branch.downstream))
-            Fail(Place(section, Downstream), NetworkFile::tr("expected true or false."));
-        const tqlHandle line = tqlSectionByNameNum(section, Line, 1);
-        for (int i = 1, count = tqlGetNoKeywords(line, Vertex); i <= count && m_error.isEmpty(); ++i) {
-            double x = 0, y = 0;
-            ReadNumbers(line, Vertex, i, {&x, &y}, false);
-            branch.line.emplace_back(x, y);
-        }
-        const tqlHandle channel = tqlSectionByNameNum(section, Channel, 1);
-        for (int i = 1, count = tqlGetNoKeywords(channel, Data); i <= count && m_error.isEmpty(); ++i) {
-            CChannelRow row;
-            ReadNumbers(channel, Data, i, {&row.chainage, &row.radius, &row.width}, true);
-            branch.channel.push_back(row);
-        }
-        branch.SortChannel();
-        branch.kept = KeepUnknown(section, {Name, Chainage, Downstream, Line, Channel});
-        return branch;
-    }
-
-    /// The keyword's place; the section's when it is missing.
-    static tqlHandle Place(tqlHandle section, const char* keyword)
-    {
-        const tqlHandle node = tqlKeywordByNameNum(section, keyword, 1);
-        return node ? node : section;
-    }
-
-    /// All parameters of a keyword, each a number; behind the first they may be "nan" where `unset` is allowed.
-    void ReadNumbers(tqlHandle section, const char* name, int number, const std::vector<double*>& values, bool unset)
-    {
-        const tqlHandle keyword = tqlKeywordByNameNum(section, name, number);
-        tqlHandle param = tqlParamByNum(keyword, 1);
-        bool good = keyword && tqlGetNoParams(keyword) == static_cast<int>(values.size());
-        for (std::size_t i = 0; good && i < values.size(); ++i)
-            good =
-                tqlTake(&param, values[i]) && (std::isfinite(*values[i]) || (unset && i > 0 && std::isnan(*values[i])));
-        if (!good)
-            Fail(keyword ? keyword : section,
-                 NetworkFile::tr("expected %1 numbers after \"%2 =\".").arg(values.size()).arg(QLatin1String(name)));
-    }
-
-    QString m_path, m_error;
+};
+struct FileBranch
+{
+    std::string name;
+    std::vector<Vertex> line;
+    CNetworkBranch branch; // all else
+};
+struct FileNetwork
+{
+    std::string system;
+    std::vector<FileBranch> branches;
+    UnknownNodes kept, keptTargets;
 };
 
-void WriteNumbers(tqlHandle file, const char* name, std::initializer_list<double> values)
+// The names of the file.
+constexpr const char *BranchSection = "Branch", *NameKeyword = "Name", *ChainageKeyword = "Chainage";
+
+using B = FileBranch;
+using N = CNetworkBranch;
+constexpr auto name = FieldsOf<B>({Text<&B::name>("Name")});
+constexpr auto ends = FieldsOf<B>({Number<&B::branch, &N::start>("first vertex", U::Chainage),
+                                   Number<&B::branch, &N::end>("last vertex", U::Chainage)});
+constexpr auto downstream = FieldsOf<B>({Boolean<&B::branch, &N::downstream>("FlowsDownstream")});
+constexpr auto vertices = FieldsOf<B>({Group<&B::line>("Vertex")});
+constexpr auto rows = FieldsOf<B>({Group<&B::branch, &N::channel>("DATA")});
+constexpr DeclaredKeyword lineKeywords[] = {{"Vertex", vertices}}, channelKeywords[] = {{"DATA", rows}};
+constexpr DeclaredSection branchSections[] = {
+    {.name = "Line", .kept = Keeps<&B::branch, &N::keptLine>(), .keywords = lineKeywords},
+    {.name = "Channel", .kept = Keeps<&B::branch, &N::keptChannel>(), .keywords = channelKeywords}};
+constexpr DeclaredKeyword branchKeywords[] = {
+    {NameKeyword, name}, {ChainageKeyword, ends}, {"FlowsDownstream", downstream, Presence::Optional}};
+
+constexpr auto coordinates = FieldsOf<FileNetwork>({Text<&FileNetwork::system>("CoordinateSystem")});
+constexpr Field branches = SectionGroup<&FileNetwork::branches>(BranchSection);
+constexpr DeclaredKeyword networkKeywords[] = {{"CoordinateSystem", coordinates, Presence::WhenSet}};
+constexpr DeclaredSection networkSections[] = {{.name = BranchSection,
+                                                .kept = Keeps<&B::branch, &N::kept>(),
+                                                .keywords = branchKeywords,
+                                                .sections = branchSections,
+                                                .sectionCount = std::size(branchSections),
+                                                .each = &branches}};
+constexpr DeclaredFile file{{.name = "KVR_NETWORK",
+                             .kept = Keeps<&FileNetwork::kept>(),
+                             .keywords = networkKeywords,
+                             .sections = networkSections,
+                             .sectionCount = std::size(networkSections)},
+                            Keeps<&FileNetwork::keptTargets>()};
+
+CNetworkBranch Taken(FileBranch& read)
 {
-    tqlAddKeyword(file, name);
-    for (const double value : values)
-        tqlAddDouble(file, value);
+    CNetworkBranch branch = std::move(read.branch);
+    branch.name = QString::fromStdString(read.name);
+    for (const Vertex& at : read.line)
+        branch.line.emplace_back(at.x, at.y);
+    branch.SortChannel();
+    return branch;
 }
 
-void WriteBranch(tqlHandle file, const CNetworkBranch& branch)
+FileBranch ForFile(const CNetworkBranch& branch)
 {
-    tqlAddSection(file, Branch);
-    tqlPutParam(file, Name, std::string_view(branch.name.toStdString()));
-    WriteNumbers(file, Chainage, {branch.start, branch.end});
-    tqlPutParam(file, Downstream, branch.downstream);
-    tqlAddSection(file, Line);
+    FileBranch written{branch.name.toStdString(), {}, branch};
     for (const QPointF& at : branch.line)
-        WriteNumbers(file, Vertex, {at.x(), at.y()});
-    tqlEndSection(file);
-    tqlAddSection(file, Channel);
-    for (const CChannelRow& row : branch.channel)
-        WriteNumbers(file, Data, {row.chainage, row.radius, row.width});
-    tqlEndSection(file);
-    WriteKept(file, branch.kept);
-    tqlEndSection(file);
+        written.line.push_back({at.x(), at.y()});
+    return written;
+}
+
+/// What a branch of the file has to fulfil beside its declaration.
+void Check(CKsParameterFile& source, tqlHandle section, const CNetworkBranch& branch, const CNetwork& before)
+{
+    const tqlHandle named = CKsParameterFile::PlaceOf(section, NameKeyword);
+    if (branch.name.isEmpty())
+        source.Fail(named, NetworkFile::tr("expected the branch's name, Name = \"...\"."));
+    else if (branch.start == branch.end)
+        source.Fail(CKsParameterFile::PlaceOf(section, ChainageKeyword),
+                    NetworkFile::tr("the chainages of the two ends have to differ."));
+    else if (before.FindBranch(branch.name) >= 0)
+        source.Fail(named, NetworkFile::tr("there is a branch \"%1\" already.").arg(branch.name));
 }
 
 } // namespace
 
+FieldList CChannelRow::DeclaredFields()
+{
+    using R = CChannelRow;
+    static constexpr auto fields = FieldsOf<R>({Number<&R::chainage>("chainage", U::Chainage),
+                                                Number<&R::radius>("radius", U::Radius).MayBeUnknown(),
+                                                Number<&R::width>("width", U::Width).MayBeUnknown()});
+    return fields;
+}
+
 QString ReadNetwork(const QString& path, CNetwork& network)
 {
-    const CParameterFile file(tqlLoadFile(path.toStdString()));
-    if (const QString error = file.SyntaxError(); !error.isEmpty())
-        return error;
-    const tqlHandle target = tqlTargetByNameNum(file.Get(), Target, 1);
-    if (!target)
-        return NetworkFile::tr("%1 is no river network: it has no section [%2].")
-            .arg(QFileInfo(path).fileName(), QLatin1String(Target));
-    CNetwork read;
-    CReader reader(path);
-    reader.ReadTarget(target, read);
-    if (!reader.Error().isEmpty())
-        return reader.Error();
-    bool own = true; // the first target of the name is the network
-    for (int i = 1, count = tqlGetNoSections(file.Get()); i <= count; ++i) {
-        const tqlHandle other = tqlSectionByNum(file.Get(), i);
-        if (tqlName(other) != Target || !std::exchange(own, false))
-            read.keptTargets.push_back(KeepUnknown(other, {}));
+    FileNetwork read;
+    CKsParameterFile source(path, file, &read);
+    CNetwork taken;
+    for (std::size_t i = 0; i < read.branches.size() && source.Error().isEmpty(); ++i) {
+        CNetworkBranch branch = Taken(read.branches[i]);
+        Check(source, tqlSectionByNameNum(source.Target(), BranchSection, int(i) + 1), branch, taken);
+        taken.branches.push_back(std::move(branch));
     }
-    network = std::move(read);
+    if (!source.Error().isEmpty())
+        return source.Error();
+    taken.system = QString::fromStdString(read.system);
+    taken.kept = std::move(read.kept);
+    taken.keptTargets = std::move(read.keptTargets);
+    network = std::move(taken);
     return {};
 }
 
 QString WriteNetwork(const QString& path, const CNetwork& network)
 {
-    const CParameterFile file(tqlCreate());
-    tqlAddTarget(file.Get(), Target);
-    if (!network.system.isEmpty())
-        tqlPutParam(file.Get(), System, std::string_view(network.system.toStdString()));
+    FileNetwork written{network.system.toStdString(), {}, network.kept, network.keptTargets};
     for (const CNetworkBranch& branch : network.branches)
-        WriteBranch(file.Get(), branch);
-    WriteKept(file.Get(), network.kept);
-    tqlEndSection(file.Get());
-    for (const CKeptSection& target : network.keptTargets) {
-        tqlAddTarget(file.Get(), target.name);
-        WriteKept(file.Get(), target);
-        tqlEndSection(file.Get());
-    }
-    return WriteParameterFile(path, file.Get());
+        written.branches.push_back(ForFile(branch));
+    return KsWriteParameterFile(path, file, &written);
 }

@@ -1,4 +1,5 @@
 // How a document is saved: by name, under a new name, and before it is closed.
+#include "files/safe_file.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/file_dialog.h"

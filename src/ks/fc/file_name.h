@@ -9,5 +9,6 @@
 KS_API CString KsExistingSpelling(const CString& path);
 /// Names a file, whichever of its paths is given: another spelling, a way through other folders, a link to it.
 KS_API CString KsFileKey(const CString& path);
-/// Whether two paths name one file; an empty path names none.
+/// Whether two paths name one file as a user means it, in whatever case; an empty path names none. SameFile of
+/// files/safe_file.h tells apart what the file system does.
 KS_API bool KsSameFile(const CString& a, const CString& b);

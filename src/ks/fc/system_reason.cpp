@@ -50,7 +50,19 @@ CString QuotaText()
     return SystemReason::tr("your disk quota is used up");
 }
 
+CString Sentence(CString phrase)
+{
+    if (!phrase.isEmpty())
+        phrase.front() = phrase.front().toUpper();
+    return SystemReason::tr("%1.").arg(phrase);
+}
+
 } // namespace
+
+CString KsSystemSentence(std::error_code error)
+{
+    return Sentence(KsSystemReason(error));
+}
 
 CString KsSystemReason(std::error_code error)
 {
@@ -72,7 +84,5 @@ CString KsSystemReason(const QFileDevice& file)
             phrase = Translated(reason.text);
     if (QuotaExceeded != 0 && text == qt_error_string(QuotaExceeded))
         phrase = QuotaText();
-    if (!phrase.isEmpty())
-        phrase.front() = phrase.front().toUpper();
-    return SystemReason::tr("%1.").arg(phrase);
+    return Sentence(phrase);
 }

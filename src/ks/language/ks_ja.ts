@@ -278,4 +278,47 @@
         <translation>制御文字 U+%1</translation>
     </message>
 </context>
+<context>
+    <name>ParameterFile</name>
+    <message>
+        <source>%1, line %2: %3</source>
+        <translation>%1、%2行目: %3</translation>
+    </message>
+    <message>
+        <source>%1 is no file of this kind: it has no section [%2].</source>
+        <translation>%1はこの種類のファイルではありません: セクション[%2]がありません。</translation>
+    </message>
+    <message>
+        <source>expected a section [%1].</source>
+        <translation>セクション[%1]が必要です。</translation>
+    </message>
+    <message>
+        <source>expected only one %1 in [%2].</source>
+        <translation>[%2]の中の%1は1つだけにしてください。</translation>
+    </message>
+    <message>
+        <source>expected a text, %1 = &quot;...&quot;.</source>
+        <translation>文字列(%1 = &quot;...&quot;)が必要です。</translation>
+    </message>
+    <message>
+        <source>expected a file name after &quot;%1 =&quot;.</source>
+        <translation>「%1 =」の後にファイル名が必要です。</translation>
+    </message>
+    <message>
+        <source>expected true or false after &quot;%1 =&quot;.</source>
+        <translation>「%1 =」の後にtrueまたはfalseが必要です。</translation>
+    </message>
+    <message>
+        <source>expected a number after &quot;%1 =&quot;.</source>
+        <translation>「%1 =」の後に数値が必要です。</translation>
+    </message>
+    <message>
+        <source>expected %1 numbers after &quot;%2 =&quot;.</source>
+        <translation>「%2 =」の後に%1個の数値が必要です。</translation>
+    </message>
+    <message>
+        <source>The new content is complete in &quot;%1&quot;.</source>
+        <translation>新しい内容は「%1」にすべて残っています。</translation>
+    </message>
+</context>
 </TS>

@@ -463,17 +463,6 @@ Shell of the river model editors.</source>
     </message>
 </context>
 <context>
-    <name>Projects</name>
-    <message>
-        <source>%1 is no project: it has no section [%2].</source>
-        <translation>%1 はプロジェクトではありません。セクション [%2] がありません。</translation>
-    </message>
-    <message>
-        <source>%1, line %2: expected a file name after &quot;File =&quot;.</source>
-        <translation>%1 の %2 行目: 「File =」の後にファイル名が必要です。</translation>
-    </message>
-</context>
-<context>
     <name>ShellMain</name>
     <message>
         <source>Shell of the river model editors</source>

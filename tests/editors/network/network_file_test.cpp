@@ -10,8 +10,12 @@ using testing::HasSubstr;
 
 TEST_F(NetworkTest, AFileIsReadAndWrittenBackWithWhatTheEditorDoesNotKnow)
 {
+    QByteArray source = SmallNetwork;
+    source.replace("    [/Line]\n    [Channel]\n      DATA = 2000",
+                   "      Datum = \"NHN\"\n    [/Line]\n    [Channel]\n"
+                   "      [Gauge]\n        Zero = 98.5\n      [/Gauge]\n      DATA = 2000");
     CNetwork network;
-    ASSERT_EQ(ReadNetwork(Write("a.kvnw", SmallNetwork), network).toStdString(), "");
+    ASSERT_EQ(ReadNetwork(Write("a.kvnw", source), network).toStdString(), "");
     ASSERT_EQ(network.branches.size(), 2u);
     const CNetworkBranch& main = network.branches[0];
     EXPECT_EQ(main.name, "MAIN");
@@ -28,7 +32,8 @@ TEST_F(NetworkTest, AFileIsReadAndWrittenBackWithWhatTheEditorDoesNotKnow)
     ASSERT_EQ(WriteNetwork(copy, network), "");
     const QByteArray text = Read(copy);
     for (const char* kept : {"Survey = \"2019\", 3", "Owner = <C:\\\\data\\\\owner.txt>", "At = 2500, \"RAILWAY\"",
-                             "[Piers]", "Count = 2", "[OTHER_PROGRAM]", "Colour = 7", "DATA = 4000, nan, 50"})
+                             "[Piers]", "Count = 2", "Datum = \"NHN\"\n    [/Line]", "[Gauge]\n        Zero = 98.5",
+                             "[OTHER_PROGRAM]", "Colour = 7", "DATA = 4000, nan, 50"})
         EXPECT_THAT(text.toStdString(), HasSubstr(kept));
     CNetwork again;
     ASSERT_EQ(ReadNetwork(copy, again), "");
@@ -51,14 +56,18 @@ TEST_F(NetworkTest, ABadFileSaysWhereAndWhat)
     };
     const Case cases[] = {
         {"[/Channel]\n    [Bridges]", "[Bridges]", "bad.kvnw, line "},
-        {"KVR_NETWORK", "KAVO0_HD", "bad.kvnw is no river network: it has no section [KVR_NETWORK]."},
-        {"Name = \"MAIN\"", "Title = \"MAIN\"", "line 3: expected the branch's name"},
+        {"KVR_NETWORK", "KAVO0_HD", "bad.kvnw is no file of this kind: it has no section [KVR_NETWORK]."},
+        {"Name = \"MAIN\"", "Title = \"MAIN\"", "line 3: expected a text, Name = \"...\"."},
+        {"Name = \"SIDE\"", "Name = \"\"", "line 26: expected the branch's name, Name = \"...\"."},
         {"Name = \"SIDE\"", "Name = \"MAIN\"", "line 26: there is a branch \"MAIN\" already."},
         {"Chainage = 1000, 8000", "Chainage = 1000", "line 5: expected 2 numbers after \"Chainage =\"."},
         {"Chainage = 1000, 8000", "Chainage = 8, 8.0", "line 5: the chainages of the two ends have to differ."},
-        {"FlowsDownstream = true", "FlowsDownstream = 1", "line 6: expected true or false."},
-        {"Survey = \"2019\", 3", "CoordinateSystem = 25832",
-         "line 2: expected the name of a coordinate system, CoordinateSystem = \"EPSG:...\"."},
+        {"FlowsDownstream = true", "FlowsDownstream = 1",
+         "line 6: expected true or false after \"FlowsDownstream =\"."},
+        {"FlowsDownstream = true", "FlowsDownstream = true\n    FlowsDownstream = false",
+         "line 7: expected only one FlowsDownstream in [Branch]."},
+        {"    [Channel]\n", "    [Line]\n    [/Line]\n    [Channel]\n", "line 13: expected only one Line in [Branch]."},
+        {"Survey = \"2019\", 3", "CoordinateSystem = 25832", "line 2: expected a text, CoordinateSystem = \"...\"."},
         {"Vertex = 3000, 0\n", "Vertex = 3000, \"north\"\n", "line 10: expected 2 numbers after \"Vertex =\"."},
         {"Vertex = 3000, 4000", "Vertex = inf, 4000", "line 11: expected 2 numbers"},
         {"DATA = 2000, 400, 30", "DATA = nan, 400, 30", "line 14: expected 3 numbers after \"DATA =\"."},

@@ -169,40 +169,6 @@ Delete Lines</source>
     </message>
 </context>
 <context>
-    <name>ParameterFile</name>
-    <message>
-        <source>%1, line %2: %3</source>
-        <translation>%1、%2行目: %3</translation>
-    </message>
-</context>
-<context>
-    <name>SectionFile</name>
-    <message>
-        <source>expected the chainage, Chainage = a number.</source>
-        <translation>追加距離(Chainage = 数値)が必要です。</translation>
-    </message>
-    <message>
-        <source>expected only one %1 in a cross section.</source>
-        <translation>%1は1つの横断面に1つだけ指定できます。</translation>
-    </message>
-    <message>
-        <source>expected a text, %1 = &quot;...&quot;.</source>
-        <translation>文字列(%1 = &quot;...&quot;)が必要です。</translation>
-    </message>
-    <message>
-        <source>expected a number after &quot;%1 =&quot;.</source>
-        <translation>「%1 =」の後に数値が必要です。</translation>
-    </message>
-    <message>
-        <source>expected an offset and a bed level, two numbers, after &quot;%1 =&quot;.</source>
-        <translation>「%1 =」の後に横断距離と河床高の2つの数値が必要です。</translation>
-    </message>
-    <message>
-        <source>%1 holds no cross sections: it has no section [%2].</source>
-        <translation>%1は横断面のファイルではありません: セクション[%2]がありません。</translation>
-    </message>
-</context>
-<context>
     <name>SectionRules</name>
     <message>
         <source>a cross section needs the name of its branch.</source>

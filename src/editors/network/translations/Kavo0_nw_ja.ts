@@ -597,22 +597,6 @@
         <source>the chainages of the two ends have to differ.</source>
         <translation>両端の追加距離は異なる値でなければなりません。</translation>
     </message>
-    <message>
-        <source>expected true or false.</source>
-        <translation>trueまたはfalseが必要です。</translation>
-    </message>
-    <message>
-        <source>expected %1 numbers after &quot;%2 =&quot;.</source>
-        <translation>「%2 =」の後に%1個の数値が必要です。</translation>
-    </message>
-    <message>
-        <source>%1 is no river network: it has no section [%2].</source>
-        <translation>%1は河道網ではありません: セクション[%2]がありません。</translation>
-    </message>
-    <message>
-        <source>expected the name of a coordinate system, CoordinateSystem = &quot;EPSG:...&quot;.</source>
-        <translation>座標系の名前 CoordinateSystem = &quot;EPSG:...&quot; が必要です。</translation>
-    </message>
 </context>
 <context>
     <name>NetworkTables</name>
@@ -722,13 +706,6 @@ Zoom Out</source>
 Import Branches</source>
         <translation>GISファイルの線を河川として読み込みます
 河川の取り込み</translation>
-    </message>
-</context>
-<context>
-    <name>ParameterFile</name>
-    <message>
-        <source>%1, line %2: %3</source>
-        <translation>%1、%2行目: %3</translation>
     </message>
 </context>
 </TS>

@@ -1,0 +1,34 @@
+#include "files/structure.h"
+
+namespace {
+
+Result<TqlStructure> Checked(TqlStructure structure, TqlSyntaxError* report)
+{
+    TqlSyntaxError error;
+    if (!tqlGetSyntaxErr(structure.Get(), &error))
+        return structure;
+    tqlGetErrorGlb(); // taken: the report says it all
+    if (report)
+        *report = error;
+    return Error{error.message};
+}
+
+} // namespace
+
+Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report)
+{
+    return Checked(TqlStructure(tqlLoadFile(path)), report);
+}
+
+Result<TqlStructure> ParseText(std::string text, const std::string& name)
+{
+    return Checked(TqlStructure(tqlLoadText(std::move(text), name)), nullptr);
+}
+
+Result<void> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options)
+{
+    const std::string_view text = tqlGetText(built);
+    if (text.empty()) // the library refuses what no reader could take back
+        return Error{"Could not write \"" + path + "\": the content cannot be expressed in a parameter file."};
+    return WriteFileSafely(path, text, options);
+}

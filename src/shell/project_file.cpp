@@ -1,0 +1,41 @@
+#include "shell/project_file.h"
+
+#include <QDir>
+#include <iterator>
+
+namespace {
+
+constexpr const char *TargetName = "KVR_PROJECT", *MembersName = "Members", *MemberName = "File";
+
+using P = ProjectFile;
+constexpr auto members = FieldsOf<P>({Group<&P::members>(MemberName)});
+constexpr DeclaredKeyword memberKeywords[] = {{MemberName, members}};
+constexpr DeclaredSection sections[] = {
+    {.name = MembersName, .kept = Keeps<&P::keptMembers>(), .keywords = memberKeywords, .required = true}};
+constexpr DeclaredFile file{
+    {.name = TargetName, .kept = Keeps<&P::kept>(), .sections = sections, .sectionCount = std::size(sections)},
+    Keeps<&P::keptTargets>()};
+
+} // namespace
+
+FieldList ProjectMember::DeclaredFields()
+{
+    static constexpr auto fields = FieldsOf<ProjectMember>({FileName<&ProjectMember::file>(MemberName)});
+    return fields;
+}
+
+QString ProjectMember::PathIn(const QDir& folder) const
+{
+    return QDir::cleanPath(folder.absoluteFilePath(QString::fromStdString(file).replace(u'\\', u'/')));
+}
+
+const DeclaredFile& DeclaredProjectFile()
+{
+    return file;
+}
+
+tqlHandle MemberKeyword(tqlHandle structure, int number)
+{
+    const tqlHandle target = tqlTargetByNameNum(structure, TargetName, 1);
+    return tqlKeywordByNameNum(tqlSectionByNameNum(target, MembersName, 1), MemberName, number);
+}

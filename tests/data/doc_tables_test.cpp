@@ -1,0 +1,127 @@
+// The tables of docs/hdkv.md are what the declarations say. KVR_UPDATE_DOCS=1 writes them anew.
+#include "hd_support.h"
+#include "texts/text_numbers.h"
+
+#include <cstdlib>
+#include <sstream>
+
+namespace {
+
+std::string EnglishText(Str number)
+{
+#define QT_TRANSLATE_NOOP(context, text) text
+#define KVR_STRING(id, name, text)                                                                                     \
+    if (number == Str::name)                                                                                           \
+        return text;
+#include "texts/string_table.inc"
+#undef KVR_STRING
+#undef QT_TRANSLATE_NOOP
+    return {};
+}
+
+/// " (0.5 to 1)", " (0 Max, 1 Min, 2 Dynamic)": what is known about a value beyond its type.
+std::string Values(const Field& field)
+{
+    const auto number = [](double value) {
+        std::ostringstream text;
+        text << value;
+        return text.str();
+    };
+    std::string known;
+    if (field.minimum || field.maximum)
+        known = !field.maximum   ? "at least " + number(*field.minimum)
+                : !field.minimum ? "at most " + number(*field.maximum)
+                                 : number(*field.minimum) + " to " + number(*field.maximum);
+    std::istringstream entries(EnglishText(field.choices));
+    std::int32_t index = field.firstChoice;
+    for (std::string entry; std::getline(entries, entry); ++index) {
+        const bool isNumbered = entry.starts_with(std::to_string(index) + ' ');
+        known += (known.empty() ? "" : ", ") +
+                 (isNumbered || field.kind == FieldKind::Text ? entry : std::to_string(index) + ' ' + entry);
+    }
+    return known.empty() ? "" : " (" + known + ')';
+}
+
+std::string Described(FieldList fields, std::string_view keyword);
+
+std::string Described(const Field& field, std::string_view keyword)
+{
+    if (field.kind == FieldKind::Group) {
+        const std::string text = "count N, then N x (" + Described(field.group->elements(), {}) + ')';
+        return field.padWhenEmpty ? text + "; one empty element when N is 0" : text;
+    }
+    constexpr const char* kinds[] = {"float", "integer", "integer", "boolean", "string", "file name", "6 integers"};
+    std::string text = kinds[static_cast<int>(field.kind)];
+    if (field.name != keyword)
+        text += ' ' + std::string(field.name);
+    return text + (field.optionalTail ? "?" : "") + Values(field);
+}
+
+std::string Described(FieldList fields, std::string_view keyword)
+{
+    std::string text;
+    for (const Field& field : fields) // the name of the only one is the keyword's
+        text += (text.empty() ? "" : ", ") + Described(field, fields.size() == 1 ? keyword : std::string_view());
+    return text;
+}
+
+std::string Default(FieldList fields, const void* object)
+{
+    return fields.front().kind == FieldKind::DateTime ? "time of creation" : ParamsText(fields, object);
+}
+
+std::string GlobalTable()
+{
+    const HD_Global_Var global;
+    std::string table = "| Section | Keyword | Parameters | Default |\n|---|---|---|---|\n";
+    for (const GlobalSection& section : HDGlobalSections()) {
+        std::string name = '`' + std::string(section.name) + '`';
+        for (const GlobalKeyword& row : section.keywords) {
+            table += "| " + name + " | `" + std::string(row.name) + "` | " + Described(row.Fields(), row.name) + " | " +
+                     Default(row.Fields(), &global) + " |\n";
+            name.clear();
+        }
+        for (const Field& items : section.items)
+            table += "| " + name + "| sub-section `" + std::string(items.name) + "`: keywords `" +
+                     std::string(HDItemKeyword) + "` | " + Described(items.group->elements(), {}) + " | none |\n";
+    }
+    return table;
+}
+
+std::string ListTable()
+{
+    HD_Parameters parameters;
+    std::string table = "| Section | Parameters behind branch name and chainage | Default |\n|---|---|---|\n";
+    for (const ListEntry& entry : HDLists()) {
+        CGenParamListBase& list = entry.list ? *entry.list(parameters) : parameters.EncroachList.Add();
+        table += "| `" + std::string(entry.section) + "` | " + Described(list.Fields(), {}) + " | " +
+                 Default(list.Fields(), list.NewRecord().get()) + " |\n";
+    }
+    return table;
+}
+
+/// The document with the text between two of its marks replaced.
+std::string WithTable(std::string document, const std::string& name, const std::string& table)
+{
+    const std::string begin = "<!-- generated: " + name + " -->\n", end = "<!-- end of " + name + " -->\n";
+    const std::size_t from = document.find(begin), to = document.find(end);
+    if (from == std::string::npos || to == std::string::npos) {
+        ADD_FAILURE() << "no marks of " << name;
+        return document;
+    }
+    return document.replace(from + begin.size(), to - from - begin.size(), table);
+}
+
+} // namespace
+
+TEST(DocumentTables, AreWhatTheDeclarationsSay)
+{
+    const char* const path = KVR_SOURCE_DIR "/docs/hdkv.md";
+    const std::string is = ReadText(path);
+    const std::string should =
+        WithTable(WithTable(is, "global values", GlobalTable()), "location records", ListTable());
+    if (std::getenv("KVR_UPDATE_DOCS"))
+        std::ofstream(path, std::ios::binary) << should;
+    else
+        EXPECT_EQ(is, should) << "ninja update_docs writes the tables anew";
+}
