@@ -62,7 +62,7 @@ QString EditText(const ColumnSpec& column, const CellValue& value)
     if (IsEmpty(column, value))
         return {};
     if (const auto* number = std::get_if<double>(&value))
-        return KsShortestNumber(column.style.UnitConvertFromBase(*number, 1));
+        return column.style.FullText(*number);
     if (const auto* integer = std::get_if<std::int32_t>(&value))
         return column.Kind() == CellKind::Choice ? column.choices.TextOf(*integer) : QString::number(*integer);
     if (const auto* time = std::get_if<HDDateTime>(&value))

@@ -125,6 +125,33 @@ TEST_F(CtrlEditTest, ARefusedTextGoesWithItsField)
     EXPECT_TRUE(field.hasFocus());
 }
 
+TEST_F(CtrlEditTest, ATextWhoseEndDoesNotFitIsRefused)
+{
+    Type("1.234567890123456e-10");
+    Leave();
+    EXPECT_EQ(value, 1.23456789);
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(boxes.front().startsWith("At most 20 characters fit")) << boxes.front().toStdString();
+    QTest::keyClick(&field, Qt::Key_End);
+    QTest::keyClick(&field, Qt::Key_Backspace); // by somebody who sees what stands there
+    QTest::keyClicks(&field, "9");
+    Leave();
+    EXPECT_EQ(value, 1.234567890123456e-9);
+    EXPECT_EQ(boxes.size(), 1);
+}
+
+TEST_F(CtrlEditTest, AMenuInFrontLeavesTheTextAsItIs)
+{
+    Type("4");
+    field.setCursorPosition(1);
+    other.setFocus(Qt::MenuBarFocusReason);
+    QTest::qWait(1);
+    EXPECT_EQ(value, 1.23456789);
+    field.setFocus(Qt::MenuBarFocusReason);
+    QTest::keyClicks(&field, "5");
+    EXPECT_EQ(field.text(), "45");
+}
+
 TEST_F(CtrlEditTest, ADisabledFieldShowsWhatIsStored)
 {
     for (const char* typed : {"7", "7e"}) {

@@ -70,6 +70,19 @@ TEST_F(DigitsTest, AConversionHidesOnlyWhatItHas)
     EXPECT_TRUE(Tip(2, 2).startsWith("Full value: 4923.228346456"));
 }
 
+TEST_F(DigitsTest, WhatWasTypedInAnotherUnitReadsAsItWasTyped)
+{
+    Add("A", 0);
+    Open<FamilyPage>(init);
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    for (const char* typed : {"7", "3.3", "1000.25", "0.1", "123456.789", "1e-07"}) {
+        for (const int column : {2, 3, 4}) {
+            Enter(1, column, typed);
+            EXPECT_EQ(Cell(1, column).data(Qt::EditRole).toString(), typed) << column;
+        }
+    }
+}
+
 TEST_F(DigitsTest, AllDigitsShowsEveryCellAndFieldInFull)
 {
     Add("A", 1500.6, 0.1 + 0.2, 1e-7);

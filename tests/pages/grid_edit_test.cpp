@@ -35,6 +35,36 @@ TEST_F(GridEditTest, AMoveStoresTheLine)
     EXPECT_EQ(Stored(), "NECKAR 1 4.25 20, B 2 11 21");
 }
 
+TEST_F(GridEditTest, TheCurrentCellGoesWithItsLine)
+{
+    Add("C", 3, 12, 22);
+    view->page->LoadFromDocument(&document);
+    grid->SetCurrentCell(2, 3);
+    init.RemoveAt(0); // a save that drops lines does so, and other editors
+    view->page->LoadFromDocument(&document);
+    EXPECT_EQ(grid->TextAt(grid->CurrentRow(), 1), "B");
+    EXPECT_EQ(grid->CurrentColumn(), 3);
+    init.RemoveAt(0);
+    view->page->LoadFromDocument(&document);
+    for (const auto key : {Qt::Key_7, Qt::Key_Tab, Qt::Key_8, Qt::Key_Return, Qt::Key_9, Qt::Key_Backtab})
+        QTest::keyClick(grid, key);
+    EXPECT_EQ(Stored(), "C 3 12 22") << "typed on where no line is";
+    Click(1, 3);
+    EXPECT_EQ(grid->CurrentRow(), 1);
+}
+
+TEST_F(GridEditTest, AWheelOverACellTakesNoEntry)
+{
+    view->branches = {"NECKAR", "MAIN"};
+    grid->SetBranchNameColumn(1);
+    Type(1, 1, "brook");
+    QWheelEvent turn(QPointF(5, 5), Editor()->mapToGlobal(QPointF(5, 5)), {}, {0, -120}, Qt::NoButton, {},
+                     Qt::NoScrollPhase, false);
+    QApplication::sendEvent(Editor(), &turn);
+    QTest::keyClick(Editor(), Qt::Key_Tab);
+    EXPECT_EQ(init.GetAt(0).RiverName, "BROOK");
+}
+
 TEST_F(GridEditTest, TheSameNumberSpeltAnewIsNoStep)
 {
     Enter(1, 3, "10.0");

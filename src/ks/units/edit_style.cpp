@@ -54,9 +54,16 @@ CString CKsEditStyle::UnitConvertFromBase_T(double value, int flag) const
     return KsFormatNumber(m_format, UnitConvertFromBase(value, flag));
 }
 
+/// The shortest number that is the stored one when it is typed: what a conversion makes of the last place nobody typed.
 CString CKsEditStyle::FullText(double value) const
 {
-    return KsShortestNumber(UnitConvertFromBase(value, 1));
+    const double full = UnitConvertFromBase(value, 1);
+    for (int digits = 14; digits <= 16 && !Conversion().IsIdentity() && std::isfinite(full); ++digits) {
+        const double typed = KsFormatNumber(QStringLiteral("%.%1lg").arg(digits), full).toDouble();
+        if (UnitConvertFromBase(typed, 0) == value)
+            return KsShortestNumber(typed);
+    }
+    return KsShortestNumber(full);
 }
 
 CString CKsEditStyle::ShownText(double value) const
