@@ -90,7 +90,7 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
     UndoStack().setClean();
 
     m_isReadOnly = false;
-    SetPathName(target);
+    SetPathName(m_file.Path());
     UpdateAllViews(nullptr, CKsDoc::ReloadHint);
     SetModifiedFlag(false);
     emit FileStateChanged();

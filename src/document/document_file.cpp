@@ -120,18 +120,19 @@ bool CDocumentFile::Write(const HD_Parameters& parameters, const CString& target
     const bool renames =
         entry != target && QFileInfo::exists(entry) && !SameFile(entry.toStdString(), target.toStdString());
     const std::string written = (renames ? entry : target).toStdString();
-    Result<void> saved = SaveHDFile(parameters, written);
-    if (saved && renames)
-        saved = RenameFile(written, target.toStdString());
-    if (!saved) {
+    if (const Result<void> saved = SaveHDFile(parameters, written); !saved) {
         Tell(saved.error());
         return false;
     }
-    const CString renamed = renames ? LoadString(Str::FileIsNow).arg(NameOf(entry), NameOf(target)) : CString();
+    const Result<void> renamed = renames ? RenameFile(written, target.toStdString()) : Result<void>();
     const CString kept = replaces ? m_keptCopy : CString();
     *this = {};
-    m_path = target;
-    m_renamed = renamed;
+    m_path = renamed ? target : entry;
     m_keptCopy = kept;
+    if (!renamed) // it is saved, and keeps its name
+        KsMessageBox(LoadString(Str::KeepsItsName)
+                         .arg(NameOf(entry), NameOf(target), KsSystemReason(renamed.error().code)));
+    else if (renames)
+        m_renamed = LoadString(Str::FileIsNow).arg(NameOf(entry), NameOf(target));
     return true;
 }

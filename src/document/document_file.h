@@ -17,8 +17,8 @@ public:
     void Read(const CString& path, HD_Parameters& parameters);
     /// Whether the file may be replaced by a save to `target`: asks when it holds what the document does not.
     bool MayReplace(const CString& target) const;
-    /// Writes to `target`, the file's own name with its extension in capitals, or another. On failure the user has been
-    /// told. What the file held that the document does not is kept in a copy beside it.
+    /// Writes to `target`, the file's own name with its extension in capitals, or another; Path() says what the file is
+    /// called then, for where it cannot be renamed it keeps its name. On failure the user has been told. What the file held that the document does not is kept in a copy beside it.
     bool Write(const HD_Parameters& parameters, const CString& target);
 
     const CString& Path() const { return m_path; }

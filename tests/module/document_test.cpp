@@ -216,6 +216,24 @@ TEST_F(DocumentTest, AsksBeforeReplacingAnotherFileThatDiffersInCaseOnly)
     EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files), QStringList("river.HDKV"));
 }
 
+TEST_F(DocumentTest, AFileThatCannotBeRenamedKeepsItsNameAndHoldsWhatWasSaved)
+{
+    const CString path = Path("b.hdkv");
+    Write(path, SmallFile);
+    if (!QDir(folder.path()).mkdir("b.HDKV"))
+        GTEST_SKIP() << "the file system ignores case";
+    ASSERT_TRUE(document.OnOpenDocument(path));
+    document.SetPathName(path);
+    document.Parameters().Global.G_waterlevel = 4.5;
+    document.SetModifiedFlag(true);
+    answer = QMessageBox::Yes;
+    EXPECT_TRUE(document.OnSaveDocument(path));
+    EXPECT_EQ(document.GetPathName(), path);
+    EXPECT_FALSE(document.IsModified()) << "nothing is left to discard";
+    EXPECT_TRUE(Read(path).contains("G_waterlevel = 4.5"));
+    EXPECT_TRUE(boxes.back().contains("could not be renamed to b.HDKV")) << qPrintable(boxes.back());
+}
+
 TEST_F(DocumentTest, DeleteContentsKeepsTheGlobalValues)
 {
     Write(Path("river.hdkv"), SmallFile);

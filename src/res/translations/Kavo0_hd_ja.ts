@@ -1892,6 +1892,10 @@ The simulation will look for it. Use this name?</source>
         <translation>%1 は %2 になりました</translation>
     </message>
     <message>
+        <source>The changes are saved in %1, which could not be renamed to %2: %3.</source>
+        <translation>変更は %1 に保存しましたが、名前を %2 に変更できませんでした: %3。</translation>
+    </message>
+    <message>
         <source>%1 could not be read when it was opened; what is shown is not its content.
 Saving replaces it. As it is now it stays in a copy beside it, %2.
 Save?</source>
