@@ -12,6 +12,21 @@
 
 // ---- keys and menu -----------------------------------------------------------------------------
 
+/// The selection grows from its other end to a cell. The table itself would select from where a key or the mouse went
+/// last, which the grid's own moves are not.
+static void GrowSelection(CGenGrid& grid, const QModelIndex& to)
+{
+    const QItemSelectionRange selected = grid.SelectedBlock().value_or(QItemSelectionRange(grid.currentIndex()));
+    const int row = grid.CurrentRow() - 1, column = grid.CurrentColumn() - 1;
+    const int fromRow = row == selected.top() ? selected.bottom() : selected.top();
+    const int fromColumn = column == selected.left() ? selected.right() : selected.left();
+    const auto cell = [&](int r, int c) { return grid.model()->index(r, c); };
+    grid.selectionModel()->setCurrentIndex(to, QItemSelectionModel::NoUpdate);
+    grid.selectionModel()->select({cell(std::min(fromRow, to.row()), std::min(fromColumn, to.column())),
+                                   cell(std::max(fromRow, to.row()), std::max(fromColumn, to.column()))},
+                                  QItemSelectionModel::ClearAndSelect);
+}
+
 bool CGenGrid::event(QEvent* event)
 {
     // The grid's own keys come before menu shortcuts of the same name.
@@ -23,6 +38,19 @@ bool CGenGrid::event(QEvent* event)
     if (event->type() == QEvent::KeyPress) {
         if (const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event))) {
             Run(key->action);
+            event->accept();
+            return true;
+        }
+        const auto& key = *static_cast<QKeyEvent*>(event);
+        constexpr std::pair<Qt::Key, CursorAction> moves[] = {
+            {Qt::Key_Up, MoveUp},         {Qt::Key_Down, MoveDown},         {Qt::Key_Left, MoveLeft},
+            {Qt::Key_Right, MoveRight},   {Qt::Key_Home, MoveHome},         {Qt::Key_End, MoveEnd},
+            {Qt::Key_PageUp, MovePageUp}, {Qt::Key_PageDown, MovePageDown},
+        };
+        const auto* move = std::ranges::find(moves, key.key(), [](const auto& each) { return int(each.first); });
+        if (move != std::end(moves) && key.modifiers().testFlag(Qt::ShiftModifier) && currentIndex().isValid()) {
+            const QScopedValueRollback choosing(m_choosingLines, m_linesChosen); // whole lines grow by whole lines
+            GrowSelection(*this, moveCursor(move->second, key.modifiers()));
             event->accept();
             return true;
         }

@@ -95,7 +95,8 @@ void CCrossSectionView::RevealChange(const ChangePlace& place)
 {
     const void* sections = &Document()->Sections().sections;
     const bool isPoint = place.list == sections;
-    if ((!isPoint && place.data != sections) || (!IsActive() && Document()->Views().size() > 1))
+    if ((!isPoint && place.data != sections) || IsEditing() ||
+        (!IsActive() && Document()->Views().size() > 1))
         return;
     const int column = std::max(place.column, 1);
     m_sections->SetCurrentCell(isPoint ? place.listRow : place.row, isPoint ? m_sections->CurrentColumn() : column);

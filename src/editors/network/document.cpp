@@ -40,8 +40,8 @@ void CNetworkDoc::DeleteContents()
 void CNetworkDoc::UpdateAll(CView* sender, int hint, CHint* object)
 {
     m_reference.reset();
+    emit NetworkChanged(); // the map first: the views show on it what is current in their tables
     CParameterDoc::UpdateAll(sender, hint, object);
-    emit NetworkChanged();
 }
 
 void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QString& system, const QString& text)

@@ -92,7 +92,7 @@ void CNetworkView::ShowChannel()
 void CNetworkView::RevealChange(const ChangePlace& place)
 {
     const bool isChannel = place.list == &Document()->Network().branches;
-    if (!isChannel && place.data != &Document()->Network().branches)
+    if (IsEditing() || (!isChannel && place.data != &Document()->Network().branches))
         return;
     const int column = std::max(place.column, 1);
     m_branches->SetCurrentCell(isChannel ? place.listRow : place.row, isChannel ? m_branches->CurrentColumn() : column);
