@@ -1,11 +1,13 @@
 #include "cli/field_text.h"
 
 #include "files/field_io.h"
+#include "files/read_number.h"
 
 #include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <iterator>
+#include <limits>
 
 namespace {
 
@@ -80,23 +82,32 @@ private:
         return {std::string(name) + " should be " + expected + ", found \"" + m_texts[m_next] + '"'};
     }
 
-    Result<void> ParseValue(std::string_view name, double& value) { return ParseNumber(name, value, "a number"); }
+    Result<void> ParseValue(std::string_view name, double& value)
+    {
+        return TakeNumber(name, value, "a number", &ReadArgument);
+    }
     Result<void> ParseValue(std::string_view name, std::int32_t& value)
     {
-        return ParseNumber(name, value, "an integer");
+        return TakeNumber(name, value, "an integer", &ReadWhole);
+    }
+
+    static std::optional<std::int32_t> ReadWhole(std::string_view text)
+    {
+        std::int32_t value = 0;
+        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+        return error == std::errc() && end == text.data() + text.size() ? std::optional(value) : std::nullopt;
     }
 
     template <typename T>
-    Result<void> ParseNumber(std::string_view name, T& value, const char* expected)
+    Result<void> TakeNumber(std::string_view name, T& value, const char* expected,
+                            std::optional<T> (*read)(std::string_view))
     {
         if (AtEnd())
             return Missing(name, expected);
-        const std::string& text = m_texts[m_next];
-        T read{};
-        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), read);
-        if (error != std::errc() || end != text.data() + text.size())
+        const std::optional<T> number = read(m_texts[m_next]);
+        if (!number)
             return Wrong(name, expected);
-        value = read;
+        value = *number;
         ++m_next;
         return {};
     }
@@ -218,6 +229,18 @@ std::vector<std::string> ParamTexts(FieldList fields, const void* object)
                         },
                         [&](const auto&) { texts.push_back(ScalarText(field, object)); }});
     return texts;
+}
+
+std::optional<double> ReadArgument(std::string_view text)
+{
+    const bool negative = text.starts_with('-');
+    const std::string_view word = text.substr(negative);
+    if (word == "nan" || word == "inf") {
+        const double value = word == "nan" ? std::numeric_limits<double>::quiet_NaN()
+                                           : std::numeric_limits<double>::infinity();
+        return negative ? -value : value;
+    }
+    return ReadNumber(text);
 }
 
 Result<void> ParseParams(FieldList fields, const std::vector<std::string>& texts, void* object)

@@ -4,7 +4,9 @@
 #include "files/field.h"
 #include "base/result.h"
 
+#include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 /// The field's value as one cell, numbers in the shortest text that reads back to the same bits, whatever the locale;
@@ -13,6 +15,9 @@ std::string CellText(const Field& field, const void* object);
 /// The field's value in JSON; a number that JSON cannot express is null.
 std::string JsonText(const Field& field, const void* object);
 std::string JsonString(std::string_view text);
+
+/// A number of a command line: as cells take it, or the file's words for what is none.
+std::optional<double> ReadArgument(std::string_view text);
 
 /// One text a parameter, in file order: a group gives its count first, a date-time its six integers.
 std::vector<std::string> ParamTexts(FieldList fields, const void* object);

@@ -1,23 +1,16 @@
 // hdkv: HD parameter files on the command line.
+#include "cli/field_text.h"
 #include "cli/commands.h"
 #include "cli/open_file.h"
 
 #include <CLI/CLI.hpp>
 
 #include <algorithm>
-#include <charconv>
 #include <iostream>
 #include <map>
 #include <memory>
 
 namespace {
-
-bool IsNumber(const std::string& text)
-{
-    double value = 0;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    return error == std::errc() && end == text.data() + text.size();
-}
 
 /// The words behind "--" of the command "set", which are values whatever they look like; they leave argv.
 std::vector<std::string> SplitLiterals(int& argc, char** argv)
@@ -35,7 +28,7 @@ bool TakeValues(const std::vector<std::string>& words, const std::vector<std::st
                 std::vector<std::string>& values)
 {
     for (const std::string& word : words) {
-        if (word.size() > 1 && word[0] == '-' && !IsNumber(word)) {
+        if (word.size() > 1 && word[0] == '-' && !ReadArgument(word)) {
             Complain("There is no option " + word + ". Put -- before values that begin with a dash.", Exit::Usage);
             return false;
         }

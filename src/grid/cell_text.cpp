@@ -3,7 +3,7 @@
 #include "base/not_given.h"
 #include "grid/date_time_text.h"
 #include "grid/grid_texts.h"
-#include "grid/number_syntax.h"
+#include "files/read_number.h"
 #include "grid/typing.h"
 
 #include <cmath>

@@ -5,7 +5,7 @@
 #include "grid/gen_grid.h"
 #include "grid/goto_dlg.h"
 #include "grid/grid_texts.h"
-#include "grid/number_syntax.h"
+#include "files/read_number.h"
 #include "grid/search_dlg.h"
 #include "ks/fc/message_box.h"
 

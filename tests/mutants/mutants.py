@@ -38,7 +38,7 @@ MUTANTS = [
     ('ks', 'ks/fc/doc_save.cpp', 'case QMessageBox::Discard:\n        return true;',
      'case QMessageBox::Discard:\n        return false;'),
     # The grid.
-    ('grid', 'grid/number_syntax.cpp', 'return IsTiny(text) ? std::optional(0.0) : std::nullopt;', 'return IsTiny(text) ? std::nullopt : std::optional(0.0);'),
+    ('files', 'files/read_number.cpp', 'return IsTiny(text) ? std::optional(0.0) : std::nullopt;', 'return IsTiny(text) ? std::nullopt : std::optional(0.0);'),
     ('grid', 'grid/grid_clipboard.cpp', "c == u'\\t' || c == u'\\n' || c == u'\\r' || c == u'\"'; });",
      "c == u'\\t' || c == u'\\n' || c == u'\\r'; });"),
     ('grid', 'grid/grid_clipboard.cpp', "text.indexOf(u'\"', at + 1) >= 0", 'true'),

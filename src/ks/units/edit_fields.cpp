@@ -1,9 +1,7 @@
 #include "ks/units/edit_fields.h"
 
+#include "files/read_number.h"
 #include "ks/fc/message_box.h"
-
-#include <QLocale>
-#include <cmath>
 
 namespace {
 
@@ -61,12 +59,11 @@ bool DDX_KSedit(bool save, QLineEdit& edit, double& value, const CKsEditStyle& s
     const CString text = edit.text().trimmed();
     if (text.isEmpty())
         return true;
-    bool isNumber = false;
-    const double number = QLocale::c().toDouble(text, &isNumber);
-    if (!isNumber || !std::isfinite(number) || text.contains(u',')) {
+    const auto number = ReadNumber(text.toStdString());
+    if (!number) {
         Refuse(edit, CKsEditLong::tr("Enter a number."));
         return false;
     }
-    value = number;
+    value = *number;
     return true;
 }

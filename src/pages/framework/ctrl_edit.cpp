@@ -2,7 +2,7 @@
 
 #include "grid/column_spec.h"
 #include "grid/digits_mark.h"
-#include "grid/number_syntax.h"
+#include "files/read_number.h"
 #include "res/strings.h"
 
 #include <QPainter>

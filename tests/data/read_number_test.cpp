@@ -1,4 +1,4 @@
-#include "grid/number_syntax.h"
+#include "files/read_number.h"
 
 #include <gtest/gtest.h>
 #include <limits>
