@@ -30,7 +30,7 @@ public:
 private:
     static void Write(QtMsgType, const QMessageLogContext&, const QString& text)
     {
-        s_count += text.startsWith("HD data exchange");
+        s_count += text.startsWith("HD data exchange") || text.contains(" without a package");
     }
     static inline int s_count = 0;
     QtMessageHandler m_old;
