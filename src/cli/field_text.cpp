@@ -137,7 +137,9 @@ private:
         HDDateTime date;
         std::int32_t* const parts[] = {&date.Year, &date.Month, &date.Day, &date.Hour, &date.Minute, &date.Second};
         for (std::int32_t* part : parts)
-            if (Result<void> read = ParseNumber(name, *part, "six integers: year month day hour minute second"); !read)
+            if (Result<void> read =
+                    TakeNumber(name, *part, "six integers: year month day hour minute second", &ReadWhole);
+                !read)
                 return read;
         if (!date.IsValid())
             return Error{std::string(name) + " should be a date and time, found " + DateText(date)};
@@ -149,7 +151,7 @@ private:
     {
         const std::string what = "the number of " + std::string(name);
         std::int32_t count = 0;
-        if (Result<void> read = ParseNumber(what, count, "an integer"); !read)
+        if (Result<void> read = TakeNumber(what, count, "an integer", &ReadWhole); !read)
             return read;
         const std::size_t given = m_texts.size() - m_next;
         if (!CountFits(group.Elements(), count, static_cast<int>(given)))
@@ -236,8 +238,8 @@ std::optional<double> ReadArgument(std::string_view text)
     const bool negative = text.starts_with('-');
     const std::string_view word = text.substr(negative);
     if (word == "nan" || word == "inf") {
-        const double value = word == "nan" ? std::numeric_limits<double>::quiet_NaN()
-                                           : std::numeric_limits<double>::infinity();
+        const double value =
+            word == "nan" ? std::numeric_limits<double>::quiet_NaN() : std::numeric_limits<double>::infinity();
         return negative ? -value : value;
     }
     return ReadNumber(text);

@@ -1,6 +1,6 @@
 // hdkv: HD parameter files on the command line.
-#include "cli/field_text.h"
 #include "cli/commands.h"
+#include "cli/field_text.h"
 #include "cli/open_file.h"
 
 #include <CLI/CLI.hpp>
