@@ -106,6 +106,22 @@ TEST_F(NetworkTest, ASaveThatFailsTellsWhyAndLeavesTheDocumentModified)
     EXPECT_THAT(Read(folder.filePath("river.kvnw")).toStdString(), HasSubstr("Name = \"OTHER\""));
 }
 
+#ifndef Q_OS_WIN
+TEST_F(NetworkTest, ASaveKeepsWhatIsAboutTheFile)
+{
+    CNetwork network;
+    const QString file = Write("own.kvnw", SmallNetwork), link = folder.filePath("link.kvnw");
+    ASSERT_EQ(ReadNetwork(file, network), "");
+    const auto ofOwner = QFile::ReadOwner | QFile::WriteOwner;
+    ASSERT_TRUE(QFile::setPermissions(file, ofOwner) && QFile::link("own.kvnw", link));
+    network.branches[0].name = "OTHER";
+    ASSERT_EQ(WriteNetwork(link, network), "");
+    EXPECT_TRUE(QFileInfo(link).isSymLink());
+    EXPECT_TRUE(Read(file).contains("OTHER"));
+    EXPECT_FALSE(QFile::permissions(file) & (QFile::ReadGroup | QFile::ReadOther));
+}
+#endif
+
 TEST_F(NetworkTest, TheSampleNetworkFitsTheSampleParameters)
 {
     const QString committed = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.kvnw");
