@@ -49,6 +49,7 @@ public:
     {
         const UnitGroup group = column.style.GetEumUnitBaseGroup();
         column.control = control;
+        column.width = 0; // beside a picture there is room for what the texts need
         column.header = [header, group] { return group == UnitGroup::None ? header() : WithUnit(header(), group); };
         column.access = std::make_shared<CellAccess>(std::move(access));
         m_model.AddColumn(std::move(column));

@@ -25,6 +25,8 @@ CGenGrid* CTablesView::AddTable(QSplitter& side, QLabel*& title, const char* nam
     table->setObjectName(QString::fromLatin1(name));
     table->SetHost(this);
     table->horizontalHeader()->setStretchLastSection(true);
+    constexpr int least = 36; // letters, row numbers included: two columns are in sight beside the smallest picture
+    table->setMinimumWidth(least * table->fontMetrics().averageCharWidth());
     table->SetInsertsBelow(true);
     table->SetLineChoice(LineChoice::LinesOfCells);
     title = new QLabel;
