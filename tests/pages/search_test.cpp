@@ -62,7 +62,8 @@ TEST_F(SearchTest, ComparesWhatIsShownAndWhatWasTyped)
     const double wanted = CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(1234.5, 0);
     EXPECT_EQ(Found({"", wanted, ChainageMatch::Equal}), QList<int>{1});
     grid->Model()->setData(grid->Model()->index(1, 0), "typed", Qt::EditRole);
-    EXPECT_EQ(Found({"TYPED", 0, ChainageMatch::Any, NameMatch::Whole}), QList<int>{2}) << "a line that is not stored yet";
+    EXPECT_EQ(Found({"TYPED", 0, ChainageMatch::Any, NameMatch::Whole}), QList<int>{2})
+        << "a line that is not stored yet";
 }
 
 TEST_F(SearchTest, GotoLine)
