@@ -34,7 +34,10 @@ ChangePlace CInsertLines::Revert()
 }
 
 CDeleteLines::CDeleteLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count)
-    : CDocumentCommand(document, GridTexts::tr("Deletion of lines")), m_rows(std::move(rows)), m_row(row), m_count(count)
+    : CDocumentCommand(document, GridTexts::tr("Deletion of lines")),
+      m_rows(std::move(rows)),
+      m_row(row),
+      m_count(count)
 {
 }
 

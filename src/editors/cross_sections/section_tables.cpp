@@ -17,8 +17,7 @@ struct SectionTables
 class CSectionRows : public VectorRows<CCrossSection>
 {
 public:
-    explicit CSectionRows(CCrossSectionDoc& document)
-        : VectorRows(document.Sections().sections), m_document(document)
+    explicit CSectionRows(CCrossSectionDoc& document) : VectorRows(document.Sections().sections), m_document(document)
     {
     }
 
@@ -102,7 +101,8 @@ public:
                 continue;
             const CSectionPoint before = i > 0 ? *static_cast<CSectionPoint*>(rows.At(i - 1)) : points[at - 1];
             if (at < points.size())
-                point = {std::midpoint(before.offset, points[at].offset), std::midpoint(before.level, points[at].level)};
+                point = {std::midpoint(before.offset, points[at].offset),
+                         std::midpoint(before.level, points[at].level)};
             else
                 point = {before.offset + (at > 1 ? points[at - 1].offset - points[at - 2].offset : step), before.level};
         }

@@ -13,8 +13,8 @@ std::vector<CKsMenuCommand> CCrossSectionView::LinesMenu() const
         {}};
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
-    menu.push_back({CrossSectionCommand::Previous, tr("P&revious Cross Section"), QKeySequence(Qt::ALT | Qt::Key_PageUp),
-                    tr("Shows the cross section above")});
+    menu.push_back({CrossSectionCommand::Previous, tr("P&revious Cross Section"),
+                    QKeySequence(Qt::ALT | Qt::Key_PageUp), tr("Shows the cross section above")});
     menu.push_back({CrossSectionCommand::Next, tr("&Next Cross Section"), QKeySequence(Qt::ALT | Qt::Key_PageDown),
                     tr("Shows the cross section below")});
     return menu;

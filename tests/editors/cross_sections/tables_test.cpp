@@ -12,7 +12,6 @@
 
 namespace {
 
-
 TEST_F(CrossSectionTest, TablesShowTheSectionsInTheUsersUnits)
 {
     CCrossSectionView* view = Open();
@@ -215,7 +214,8 @@ TEST_F(CrossSectionTest, LinesGoToASpreadsheetAndPointsComeBack)
         {"1\t110\r\n2\t109\r\n3\t100\r\n4\t100\r\n5\t110\r\n", nullptr, 5},
         {"0\t110\nend\t1\n", "Nothing was pasted. Line 2, column \"Offset [m]\" cannot take \"end\"", 4},
         {"0\t110\t3", "Nothing was pasted. The copied cells are 3 columns wide", 4},
-        {"0\t1\n9\t1\n8\t1", "Nothing was pasted. Line 3, column \"Offset [m]\" cannot take \"8  1\":\nexpected offsets", 4},
+        {"0\t1\n9\t1\n8\t1",
+         "Nothing was pasted. Line 3, column \"Offset [m]\" cannot take \"8  1\":\nexpected offsets", 4},
         {"11\t110", "Nothing was pasted. Line 1, column \"Offset [m]\" cannot take \"11  110\":\nexpected offsets", 4}};
     for (const Case& each : cases) {
         Select(table, 0);
