@@ -72,7 +72,7 @@ TEST_F(ClipboardTest, PastesRectangles)
     EXPECT_EQ(Stored(), "A 1.25 0.1 20, B 7 8 21");
     Paste(2, 1, "rhine\t1\t2\t3\r\nmain\t\t5\t6\r\nneckar\t9\t\t\r\n"); // past the end
     EXPECT_EQ(Stored(), "A 1.25 0.1 20, RHINE 1 2 3, MAIN 10000000000 5 6, NECKAR 9 0 0");
-    EXPECT_EQ(document.UndoStack().undoText(), LoadString(Str::UndoPaste));
+    EXPECT_EQ(document.UndoStack().undoText(), "Paste");
     document.UndoStack().undo();
     EXPECT_EQ(Stored(), "A 1.25 0.1 20, B 7 8 21") << "one step";
     document.UndoStack().redo();
