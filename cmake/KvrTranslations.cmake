@@ -1,6 +1,9 @@
 # The texts in the sources are American English. A module has a Japanese file with all of them, and a British one with
 # those that differ, if any do; what a file lacks stays as it is in the sources.
 set(KVR_TRANSLATIONS_DIR ${CMAKE_BINARY_DIR}/bin/translations)
+# TQL_TEXT marks texts where Qt is not known.
+set(KVR_LUPDATE_OPTIONS -silent -locations none -extensions cpp,h,inc,ui -tr-function-alias QT_TRANSLATE_NOOP+=TQL_TEXT
+                        -I ${KVR_SRC})
 
 # kvr_translations(<target> <module> <file>.ts...): builds the *.qm files of a module with its target, named
 # <module>_<language>.qm as the language library looks for them, into the translations folder beside the programs.
@@ -25,6 +28,7 @@ function(kvr_translations target module)
 endfunction()
 
 # The folders whose sources make a target, those of its static libraries included that have no translations themselves.
+# The texts of a library that several modules link are one module's, which the library names as KVR_TRANSLATED_BY.
 function(kvr_source_folders target result)
   set(folders)
   get_target_property(base ${target} SOURCE_DIR)
@@ -42,7 +46,11 @@ function(kvr_source_folders target result)
     if(TARGET ${library})
       get_target_property(type ${library} TYPE)
       get_target_property(own ${library} KVR_TRANSLATIONS)
-      if(type STREQUAL STATIC_LIBRARY AND NOT own)
+      get_target_property(elsewhere ${library} KVR_TRANSLATED_BY)
+      if(elsewhere STREQUAL module)
+        set(elsewhere FALSE)
+      endif()
+      if(type STREQUAL STATIC_LIBRARY AND NOT own AND NOT elsewhere)
         kvr_source_folders(${library} more)
         list(APPEND folders ${more})
       elseif(type STREQUAL INTERFACE_LIBRARY)
@@ -60,11 +68,12 @@ endfunction()
 function(kvr_update_translations)
   get_property(targets GLOBAL PROPERTY KVR_TRANSLATED)
   foreach(target IN LISTS targets)
+    set(module ${target})
     kvr_source_folders(${target} folders)
     get_target_property(files ${target} KVR_TRANSLATIONS)
     string(APPEND modules "${target}|${files}|${folders}\n")
     list(FILTER files INCLUDE REGEX "_ja\\.ts$")
-    list(APPEND commands COMMAND Qt6::lupdate -silent -no-obsolete -locations none -extensions cpp,h,inc,ui -I ${KVR_SRC}
+    list(APPEND commands COMMAND Qt6::lupdate ${KVR_LUPDATE_OPTIONS} -no-obsolete
       ${folders} -ts ${files})
   endforeach()
   add_custom_target(update_translations ${commands} VERBATIM)

@@ -190,11 +190,12 @@ void CGenGrid::GotoLine(int row)
 void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& previous)
 {
     QTableView::currentChanged(current, previous); // closes an editor, whose text the cell takes
-    if (!m_model->IsSyncing())
+    if (!m_model->IsSyncing()) {
+        if (currentIndex().isValid()) { // storing shows the rows afresh, with this line as the current one
+            m_currentLine = m_model->NameOf(currentIndex().row());
+            m_lineGone = false;
+        }
         StoreEditedLine();
-    if (!m_model->IsSyncing() && currentIndex().isValid()) {
-        m_currentLine = m_model->NameOf(currentIndex().row());
-        m_lineGone = false;
     }
     if (m_host && !m_model->IsSyncing())
         m_host->CellCurrent(*this);

@@ -32,9 +32,11 @@ const char* tqlPhraseText(TqlPhrase phrase)
 {
     static constexpr const char* texts[] = {
         "",
+#define TQL_TEXT(context, english) english
 #define TQL_PHRASE(name, english) english,
 #include "tql/phrases.inc"
 #undef TQL_PHRASE
+#undef TQL_TEXT
     };
     return texts[static_cast<std::size_t>(phrase)];
 }

@@ -90,8 +90,7 @@ protected:
         EXPECT_TRUE(QFile::copy(file, copy));
         QProcess update;
         update.start(QStringLiteral(KVR_LUPDATE),
-                     QStringList{"-silent", "-locations", "none", "-extensions", "cpp,h,inc,ui", "-I", KVR_SOURCE_DIR "/src"} + GetParam().folders +
-                         QStringList{"-ts", copy});
+                     QString(KVR_LUPDATE_OPTIONS).split(u'|') + GetParam().folders + QStringList{"-ts", copy});
         EXPECT_TRUE(update.waitForFinished(60000));
         EXPECT_EQ(update.exitCode(), 0);
         EXPECT_EQ(update.readAllStandardError().toStdString(), "") << "texts of a context that nobody can tell";
