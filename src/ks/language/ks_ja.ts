@@ -255,7 +255,7 @@
     </message>
     <message>
         <source>%1</source>
-        <translation>%1</translation>%1。 {1?}</translation>
+        <translation>%1</translation>
     </message>
 </context>
 <context>
