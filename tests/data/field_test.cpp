@@ -85,7 +85,10 @@ constexpr bool TakesElement = requires
 {
     PlainGroup<element, &HDWLMark::MarkLevels>("x");
 };
-static_assert(TakesElement<plainNumber> && !TakesElement<plainText>);
+static_assert(TakesElement<plainNumber>);
+#ifndef __SANITIZE_ADDRESS__ // where addresses are instrumented, it is no constant that two of them differ
+static_assert(!TakesElement<plainText>);
+#endif
 
 } // namespace
 
