@@ -179,8 +179,10 @@ std::string CellText(const Field& field, const void* object)
     for (std::size_t i = 0; i < group.size(); ++i) {
         text += i ? "; " : "";
         const FieldList parts = group.Elements();
-        for (const Field& part : parts)
-            text += (&part == parts.data() ? "" : " ") + ScalarText(part, group[i]);
+        for (const Field& part : parts) {
+            text += &part == parts.data() ? "" : " ";
+            text += ScalarText(part, group[i]);
+        }
     }
     return text;
 }

@@ -44,7 +44,7 @@ MUTANTS = [
     ('grid', 'grid/grid_clipboard.cpp', "text.indexOf(u'\"', at + 1) >= 0", 'true'),
     ('grid', 'grid/grid_model.cpp', 'if (Same(before, after))\n            continue;', ''),
     ('grid', 'grid/grid_model.cpp', 'rule == BlankRule::Fill && spec.fill ?', 'rule == BlankRule::Zero && spec.fill ?'),
-    ('grid', 'grid/grid_model.cpp', 'm_document->UndoStack().beginMacro(step);\n', 'm_document->UndoStack().beginMacro(step.left(1));\n'),
+    ('grid', 'grid/grid_model.cpp', 'undo.beginMacro(step);', 'undo.beginMacro(step.left(1));'),
     ('grid', 'grid/typing.cpp', 'm_before + m_after < m_length', 'm_before + m_after <= m_length'),
     ('grid', 'grid/typing.cpp', 'if (!m_field->isVisible() || !m_field->isEnabled()) { // a setting took it away', 'if (false) {'),
     ('grid', 'grid/grid_search.cpp', 'return shown < wanted;', 'return shown <= wanted;'),
