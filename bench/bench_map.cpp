@@ -72,7 +72,7 @@ int main(int argc, char** argv)
         qputenv("QT_QPA_PLATFORM", "offscreen");
     QApplication app(argc, argv);
     CNetworkDoc document;
-    document.AppendBranches(MakeBranches(), {});
+    document.AppendBranches(MakeBranches(), {}, {});
     CNetworkMap map(document);
     map.resize(1600, 1000);
     map.SetLocations(MakeLocations(document.Network()));
