@@ -135,7 +135,7 @@ TEST(MetaList, ASetNeedsAFilledLineBehindItsFirst)
     EXPECT_TRUE(all.EncroachList.IsEmpty());
 }
 
-TEST(Lists, ThirteenAreCleanedAtSave)
+TEST(Lists, ThoseThatSayItAreCleanedAtSave)
 {
     HD_Parameters parameters;
     parameters.EncroachList.Add();
@@ -145,14 +145,9 @@ TEST(Lists, ThirteenAreCleanedAtSave)
     });
     bool asked = true;
     EXPECT_TRUE(parameters.RemoveIncompleteLines(asked));
-    int cleaned = 0;
-    for (const ListEntry& entry : HDLists()) {
-        cleaned += entry.purgedAtSave;
-        EXPECT_EQ(!entry.list || !entry.list(parameters)->IsEmpty(), !entry.purgedAtSave) << entry.section;
-    }
-    EXPECT_EQ(cleaned, 13);
-    EXPECT_EQ(parameters.WLCurveList.GetCount() + parameters.WLSandBarsList.GetCount() +
-                  parameters.OutputGridPoints.GetCount() + parameters.LeakageList.GetCount(),
-              8u);
+    for (const ListEntry& entry : HDLists())
+        if (entry.list) {
+            EXPECT_EQ(entry.list(parameters)->GetCount(), entry.purgedAtSave ? 0u : 2u) << entry.section;
+        }
     EXPECT_EQ(parameters.EncroachList.GetAt(0).GetCount(), 2u);
 }

@@ -145,7 +145,6 @@ TEST(Layout, NamesInTheTablesAreUnique)
             entry.list ? entry.list(parameters)->SectionName() : parameters.EncroachList.OuterSectionName();
         EXPECT_EQ(own, entry.section);
     }
-    EXPECT_EQ(HDLists().size(), 18u);
 }
 
 TEST(Layout, EverySectionAndKeywordIsDocumented)
