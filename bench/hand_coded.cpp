@@ -11,9 +11,9 @@ namespace {
 std::string_view NextLine(const char*& p, const char* end)
 {
     const char* const start = p;
-    const char* const feed = static_cast<const char*>(std::memchr(p, '\n', static_cast<std::size_t>(end - p)));
+    const char* const feed = static_cast<const char*>(std::memchr(p, '\n', std::size_t(end - p)));
     p = feed ? feed + 1 : end;
-    std::string_view line(start, static_cast<std::size_t>((feed ? feed : end) - start));
+    std::string_view line(start, std::size_t((feed ? feed : end) - start));
     line.remove_prefix(std::min(line.find_first_not_of(' '), line.size()));
     return line;
 }
@@ -51,7 +51,7 @@ void AppendNumber(std::string& text, double value)
 std::string ReadText(const std::string& path)
 {
     std::ifstream in(path, std::ios::binary | std::ios::ate);
-    std::string text(static_cast<std::size_t>(in.tellg()), '\0');
+    std::string text(std::size_t(in.tellg()), '\0');
     in.seekg(0);
     in.read(text.data(), static_cast<std::streamsize>(text.size()));
     return text;

@@ -42,7 +42,7 @@ struct Files
 HD_Parameters MakeParameters(int count)
 {
     HD_Parameters parameters;
-    parameters.InitList.Reserve(static_cast<std::size_t>(count));
+    parameters.InitList.Reserve(std::size_t(count));
     for (int i = 0; i < count; ++i) {
         HD_Initial record;
         record.RiverName = "BRANCH_" + std::to_string(i / 5000 + 1);
@@ -152,7 +152,7 @@ int MeasurePeak(const Files& files, const std::string& program)
 {
     const auto peakMiB = [&](const char* what, const std::string& file) {
         const std::string command = "\"" + program + "\" --peak " + what + " \"" + file + "\"";
-        return static_cast<double>(PeakMemoryOf(command, files.scratch)) / (1024 * 1024);
+        return double(PeakMemoryOf(command, files.scratch)) / (1024 * 1024);
     };
     Table table("Peak memory of that load", "MiB");
     table.Row("hand-coded reader", peakMiB("hand", files.hdkv));
@@ -230,7 +230,7 @@ int Run(const Options& options, const std::string& program)
         }
     }
     std::printf("%d locations and all global values, %.1f MiB, medians of %d rounds\n", options.records,
-                static_cast<double>(fs::file_size(files.hdkv)) / (1024 * 1024), options.rounds);
+                double(fs::file_size(files.hdkv)) / (1024 * 1024), options.rounds);
     if (!AllAgree(files)) {
         std::fprintf(stderr, "the candidates read different records\n");
         return 2;

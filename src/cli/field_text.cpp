@@ -154,10 +154,10 @@ private:
         if (Result<void> read = TakeNumber(what, count, "an integer", &ReadWhole); !read)
             return read;
         const std::size_t given = m_texts.size() - m_next;
-        if (!CountFits(group.Elements(), count, static_cast<int>(given)))
+        if (!CountFits(group.Elements(), count, int(given)))
             return Error{what + " is " + Shortest(count) + ", which does not fit the " + std::to_string(given) +
                          " values behind it"};
-        group.Renew(static_cast<std::size_t>(count));
+        group.Renew(std::size_t(count));
         for (std::size_t i = 0; i < group.size(); ++i)
             if (Result<void> read = Parse(group.Elements(), group[i]); !read)
                 return read;

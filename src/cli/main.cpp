@@ -19,7 +19,7 @@ std::vector<std::string> SplitLiterals(int& argc, char** argv)
         return {};
     char** const end = argv + argc;
     char** const mark = std::find_if(argv, end, [](const char* word) { return std::string_view(word) == "--"; });
-    argc = static_cast<int>(mark - argv);
+    argc = int(mark - argv);
     return mark == end ? std::vector<std::string>() : std::vector<std::string>(mark + 1, end);
 }
 

@@ -9,7 +9,7 @@ namespace {
 /// Width on screen, taking every code point for one column.
 std::size_t Width(std::string_view text)
 {
-    return static_cast<std::size_t>(
+    return std::size_t(
         std::ranges::count_if(text, [](char c) { return (static_cast<unsigned char>(c) & 0xC0) != 0x80; }));
 }
 
@@ -59,7 +59,7 @@ void RecordTable::AddSets(const CGenMetaList<HDEncroach>& sets)
     m_withSet = true;
     SetFields({LocationFields(), HDEncroach::DeclaredFields()});
     for (std::size_t index = 0; index < sets.GetCount(); ++index)
-        AddList(sets.GetAt(index), static_cast<int>(index + 1));
+        AddList(sets.GetAt(index), int(index + 1));
 }
 
 void RecordTable::AddItems(GroupValue<const void> items)

@@ -53,7 +53,7 @@ std::vector<OverviewRow> Overview(const HD_Parameters& parameters)
 {
     std::vector<OverviewRow> rows;
     const auto add = [&rows](std::string_view section, const char* contents, std::size_t count) {
-        rows.push_back({std::string(section), contents, static_cast<std::int32_t>(count)});
+        rows.push_back({std::string(section), contents, std::int32_t(count)});
     };
     for (const GlobalSection& section : HDGlobalSections()) {
         add(section.name, "keywords", section.keywords.size());

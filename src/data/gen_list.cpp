@@ -16,13 +16,13 @@ HD_RiverPos& CGenList::AddTail(std::unique_ptr<HD_RiverPos> record)
 
 void CGenList::InsertAt(std::size_t index, std::unique_ptr<HD_RiverPos> record)
 {
-    m_records.insert(m_records.begin() + static_cast<std::ptrdiff_t>(index), std::move(record));
+    m_records.insert(m_records.begin() + std::ptrdiff_t(index), std::move(record));
     ++m_revision;
 }
 
 void CGenList::InsertAt(std::size_t index, std::vector<std::unique_ptr<HD_RiverPos>> records)
 {
-    m_records.insert(m_records.begin() + static_cast<std::ptrdiff_t>(index), std::move_iterator(records.begin()),
+    m_records.insert(m_records.begin() + std::ptrdiff_t(index), std::move_iterator(records.begin()),
                      std::move_iterator(records.end()));
     ++m_revision;
 }
@@ -30,15 +30,15 @@ void CGenList::InsertAt(std::size_t index, std::vector<std::unique_ptr<HD_RiverP
 std::unique_ptr<HD_RiverPos> CGenList::RemoveAt(std::size_t index)
 {
     auto record = std::move(m_records[index]);
-    m_records.erase(m_records.begin() + static_cast<std::ptrdiff_t>(index));
+    m_records.erase(m_records.begin() + std::ptrdiff_t(index));
     ++m_revision;
     return record;
 }
 
 std::vector<std::unique_ptr<HD_RiverPos>> CGenList::RemoveAt(std::size_t index, std::size_t count)
 {
-    const auto first = m_records.begin() + static_cast<std::ptrdiff_t>(index);
-    const auto last = first + static_cast<std::ptrdiff_t>(count);
+    const auto first = m_records.begin() + std::ptrdiff_t(index);
+    const auto last = first + std::ptrdiff_t(count);
     std::vector<std::unique_ptr<HD_RiverPos>> removed{std::make_move_iterator(first), std::make_move_iterator(last)};
     m_records.erase(first, last);
     ++m_revision;
@@ -116,7 +116,7 @@ void CGenParamListBase::Load(tqlHandle parent, int number, LoadReport* report)
     if (report)
         report->InSection(m_sectionName);
     const int records = tqlGetNoKeywords(section, "DATA");
-    Reserve(GetCount() + static_cast<std::size_t>(records));
+    Reserve(GetCount() + std::size_t(records));
     for (int occurrence = 1; occurrence <= records; ++occurrence) {
         auto record = NewRecord();
         const tqlHandle keyword = tqlKeywordByNameNum(section, "DATA", occurrence);

@@ -2,8 +2,8 @@
 // in constant time.
 #pragma once
 
-#include "files/finding.h"
 #include "data/river_pos.h"
+#include "files/finding.h"
 #include "files/unknown_content.h"
 
 #include <cstddef>
@@ -17,7 +17,7 @@ class CGenList
 {
 public:
     /// A position past the last record.
-    static constexpr std::size_t End = static_cast<std::size_t>(-1);
+    static constexpr std::size_t End = std::size_t(-1);
 
     CGenList() = default;
     CGenList(const CGenList&) = delete;
@@ -122,12 +122,12 @@ public:
     std::unique_ptr<CGenParamList<T>> RemoveAt(std::size_t index)
     {
         auto list = std::move(m_lists[index]);
-        m_lists.erase(m_lists.begin() + static_cast<std::ptrdiff_t>(index));
+        m_lists.erase(m_lists.begin() + std::ptrdiff_t(index));
         return list;
     }
     void InsertAt(std::size_t index, std::unique_ptr<CGenParamList<T>> list)
     {
-        m_lists.insert(m_lists.begin() + static_cast<std::ptrdiff_t>(index), std::move(list));
+        m_lists.insert(m_lists.begin() + std::ptrdiff_t(index), std::move(list));
     }
     void RemoveAllRecords() { m_lists.clear(); }
     void ClearUnknown() { m_unknown.clear(); }

@@ -8,10 +8,10 @@ namespace {
 
 void LoadItems(tqlHandle section, GroupValue<void> items, LoadReport* report)
 {
-    const auto count = static_cast<std::size_t>(tqlGetNoKeywords(section, HDItemKeyword));
+    const auto count = std::size_t(tqlGetNoKeywords(section, HDItemKeyword));
     items.Renew(count);
     for (std::size_t index = 0; index < count; ++index) {
-        ParamCursor params(tqlKeywordByNameNum(section, HDItemKeyword, static_cast<int>(index) + 1), report);
+        ParamCursor params(tqlKeywordByNameNum(section, HDItemKeyword, int(index) + 1), report);
         ReadFields(params, items.Elements(), items[index]);
         ReadExtra(params, *items.ExtraOf(index));
     }
@@ -91,7 +91,7 @@ void HD_Global_Var::LoadKeyword(tqlHandle keyword, const GlobalKeyword& row, Loa
     if (report && row.Fields().front().address(this) == &MarkInterpolate && MarkInterpolate.size() > MarkTitles.size())
         report->Add(keyword, keyword,
                     {.kind = Finding::SurplusFlags,
-                     .behind = static_cast<int>(MarkTitles.size()),
+                     .behind = int(MarkTitles.size()),
                      .found = std::string(tqlGetRawParams(keyword)),
                      .used = std::to_string(MarkTitles.size())});
 }

@@ -128,9 +128,9 @@ void ShowInJapanese(Robot& robot)
 
 bool HoldsNewLine(const HD_Parameters& parameters, int row)
 {
-    if (static_cast<int>(parameters.InitList.GetCount()) <= row)
+    if (int(parameters.InitList.GetCount()) <= row)
         return false;
-    const HD_Initial& line = parameters.InitList.GetAt(static_cast<std::size_t>(row));
+    const HD_Initial& line = parameters.InitList.GetAt(std::size_t(row));
     return line.RiverName == NewLine.river.toUpper().toStdString() && line.Chainage == 1234.5 &&
            line.InitialH == 2.75 && line.InitialQ == 18.25;
 }
@@ -184,7 +184,7 @@ void SaveCloseReopen(Robot& robot, const QString& file, int row)
         return;
     robot.Verify(HoldsNewLine(parameters.value(), row), "the typed line is in the file, bit for bit");
     robot.Verify(parameters.value().Global.G_waterlevel == level, "the global water level is in the file");
-    robot.Verify(static_cast<int>(parameters.value().InitList.GetCount()) == grid->model()->rowCount(),
+    robot.Verify(int(parameters.value().InitList.GetCount()) == grid->model()->rowCount(),
                  "the file has as many lines as the grid");
 }
 

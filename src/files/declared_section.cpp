@@ -23,7 +23,7 @@ bool TakeExactly(tqlHandle* param, const Field& field, void* object)
 
 Fault ReadKeyword(tqlHandle keyword, FieldList fields, void* object)
 {
-    bool good = tqlGetNoParams(keyword) == static_cast<int>(fields.size());
+    bool good = tqlGetNoParams(keyword) == int(fields.size());
     tqlHandle param = tqlParamByNum(keyword, 1);
     for (const Field& field : fields)
         good = good && TakeExactly(&param, field, object);
@@ -41,9 +41,9 @@ Fault ReadKeywords(tqlHandle section, const DeclaredKeyword& declared, void* obj
 {
     if (IsRepeated(declared)) {
         const auto group = declared.fields.front().GroupIn(object);
-        group.Renew(static_cast<std::size_t>(tqlGetNoKeywords(section, declared.name)));
+        group.Renew(std::size_t(tqlGetNoKeywords(section, declared.name)));
         for (std::size_t i = 0; i < group.size(); ++i) {
-            const tqlHandle keyword = tqlKeywordByNameNum(section, declared.name, static_cast<int>(i) + 1);
+            const tqlHandle keyword = tqlKeywordByNameNum(section, declared.name, int(i) + 1);
             if (const Fault fault = ReadKeyword(keyword, group.Elements(), group[i]))
                 return fault;
         }
@@ -64,12 +64,12 @@ Fault ReadSections(tqlHandle parent, const DeclaredSection& declared, void* obje
 {
     if (declared.each) {
         std::size_t count = 0;
-        while (tqlSectionByNameNum(parent, declared.name, static_cast<int>(count) + 1))
+        while (tqlSectionByNameNum(parent, declared.name, int(count) + 1))
             ++count;
         const auto group = declared.each->GroupIn(object);
         group.Renew(count);
         for (std::size_t i = 0; i < count; ++i) {
-            const tqlHandle section = tqlSectionByNameNum(parent, declared.name, static_cast<int>(i) + 1);
+            const tqlHandle section = tqlSectionByNameNum(parent, declared.name, int(i) + 1);
             if (const Fault fault = ReadSection(section, declared, group[i]))
                 return fault;
         }

@@ -19,7 +19,7 @@ bool GetWhole(tqlHandle param, std::int32_t* value)
     if (!tqlGetDouble(param, &number) || std::trunc(number) != number ||
         std::abs(number) > std::numeric_limits<std::int32_t>::max())
         return false;
-    *value = static_cast<std::int32_t>(number);
+    *value = std::int32_t(number);
     return true;
 }
 
@@ -136,7 +136,7 @@ bool ReadGroup(ParamCursor& params, const Field& field, GroupValue<void> group)
     if ((!isInteger && !GetWhole(at, &elements)) || !CountFits(group.Elements(), elements, params.Left() - 1))
         return false;
     params.Next();
-    group.Renew(static_cast<std::size_t>(elements));
+    group.Renew(std::size_t(elements));
     if (!isInteger && params.report)
         params.report->Add(at, params.keyword,
                            {.kind = Finding::OtherType,
@@ -147,8 +147,8 @@ bool ReadGroup(ParamCursor& params, const Field& field, GroupValue<void> group)
                             .found = std::string(tqlGetRawParam(at)),
                             .used = std::to_string(elements)});
     for (std::int32_t i = 0; i < elements; ++i)
-        ReadFields(params, group.Elements(), group[static_cast<std::size_t>(i)]);
-    const int size = static_cast<int>(ParamsOf(group.Elements()));
+        ReadFields(params, group.Elements(), group[std::size_t(i)]);
+    const int size = int(ParamsOf(group.Elements()));
     if (elements == 0 && field.padWhenEmpty && params.Left() >= size)
         params.Skip(size);
     return true;
@@ -208,7 +208,7 @@ void WritePadding(tqlHandle structure, FieldList fields)
 
 void WriteGroup(tqlHandle structure, const Field& field, GroupValue<const void> group)
 {
-    tqlAddInt(structure, static_cast<std::int32_t>(group.size()));
+    tqlAddInt(structure, std::int32_t(group.size()));
     for (std::size_t i = 0; i < group.size(); ++i)
         WriteFields(structure, group.Elements(), group[i]);
     if (group.size() == 0 && field.padWhenEmpty)
@@ -259,7 +259,7 @@ std::size_t ParamsOf(FieldList fields)
 
 bool CountFits(FieldList elements, std::int32_t count, int paramsLeft)
 {
-    return count >= 0 && count <= paramsLeft / static_cast<int>(ParamsOf(elements));
+    return count >= 0 && count <= paramsLeft / int(ParamsOf(elements));
 }
 
 bool ReadFields(ParamCursor& params, FieldList fields, void* object)
@@ -269,8 +269,7 @@ bool ReadFields(ParamCursor& params, FieldList fields, void* object)
         if (!params.param) {
             // An optional tail is there whole or not at all.
             if (!field.optionalTail || inTail)
-                ReportMissing(params, fields.subspan(static_cast<std::size_t>(&field - fields.data())), object,
-                              behindCount);
+                ReportMissing(params, fields.subspan(std::size_t(&field - fields.data())), object, behindCount);
             return false;
         }
         inTail = field.optionalTail;
@@ -292,7 +291,7 @@ bool ReadFields(ParamCursor& params, FieldList fields, void* object)
                                                 return true;
                                             }});
         if (!isRead) {
-            ReportCount(params, fields.subspan(static_cast<std::size_t>(&field - fields.data())), object);
+            ReportCount(params, fields.subspan(std::size_t(&field - fields.data())), object);
             params.ToEnd();
             return true; // told
         }

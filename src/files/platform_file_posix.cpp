@@ -38,9 +38,9 @@ bool IsForeign(int error)
 std::error_code CopyAttribute(int file, const char* from, const char* name)
 {
     const ssize_t size = ::getxattr(from, name, nullptr, 0);
-    std::string value(size > 0 ? static_cast<std::size_t>(size) : 0, '\0');
+    std::string value(size > 0 ? std::size_t(size) : 0, '\0');
     const ssize_t read = size == -1 ? -1 : ::getxattr(from, name, value.data(), value.size());
-    const bool copied = read != -1 && ::fsetxattr(file, name, value.data(), static_cast<std::size_t>(read), 0) == 0;
+    const bool copied = read != -1 && ::fsetxattr(file, name, value.data(), std::size_t(read), 0) == 0;
     return copied || errno == ENODATA || IsForeign(errno) ? std::error_code() : LastError();
 }
 
@@ -49,11 +49,11 @@ std::error_code CopyAttributes(int file, const char* from)
 {
     ::fremovexattr(file, AccessControlList); // the folder may have given it one
     const ssize_t size = ::listxattr(from, nullptr, 0);
-    std::string names(size > 0 ? static_cast<std::size_t>(size) : 0, '\0');
+    std::string names(size > 0 ? std::size_t(size) : 0, '\0');
     const ssize_t read = size == -1 ? -1 : ::listxattr(from, names.data(), names.size());
     if (read == -1)
         return IsForeign(errno) ? std::error_code() : LastError();
-    names.resize(static_cast<std::size_t>(read));
+    names.resize(std::size_t(read));
     for (std::size_t begin = 0; begin < names.size(); begin += std::char_traits<char>::length(&names[begin]) + 1)
         if (const std::error_code error = CopyAttribute(file, from, &names[begin]))
             return error;
@@ -80,7 +80,7 @@ public:
     std::error_code Write(Handle file, std::string_view text, std::size_t& written) override
     {
         const ssize_t count = Retry([&] { return ::write(Fd(file), text.data(), text.size()); });
-        written = count == -1 ? 0 : static_cast<std::size_t>(count);
+        written = count == -1 ? 0 : std::size_t(count);
         if (count == -1)
             return LastError();
         return count == 0 ? std::make_error_code(std::errc::no_space_on_device) : std::error_code();
@@ -139,7 +139,7 @@ public:
     }
 
 private:
-    static int Fd(Handle file) { return static_cast<int>(file); }
+    static int Fd(Handle file) { return int(file); }
 };
 
 } // namespace

@@ -8,7 +8,7 @@ namespace {
 
 std::error_code LastError()
 {
-    return {static_cast<int>(::GetLastError()), std::system_category()};
+    return {int(::GetLastError()), std::system_category()};
 }
 
 std::error_code Outcome(BOOL succeeded)
@@ -31,9 +31,8 @@ public:
     {
         constexpr std::size_t largest = std::size_t(1) << 30; // a DWORD must hold the length
         DWORD count = 0;
-        const BOOL done =
-            ::WriteFile(AsHandle(file), text.data(), static_cast<DWORD>(text.size() < largest ? text.size() : largest),
-                        &count, nullptr);
+        const BOOL done = ::WriteFile(AsHandle(file), text.data(), DWORD(text.size() < largest ? text.size() : largest),
+                                      &count, nullptr);
         written = count;
         if (done && count == 0)
             return std::make_error_code(std::errc::no_space_on_device);

@@ -204,8 +204,8 @@ Result<std::string> ReadWholeFile(const std::string& path)
         return NotRead(path, error);
     errno = 0;
     std::ifstream stream(file, std::ios::binary);
-    std::string content(static_cast<std::size_t>(size), '\0');
-    if (!stream.read(content.data(), static_cast<std::streamsize>(content.size())))
+    std::string content(std::size_t(size), '\0');
+    if (!stream.read(content.data(), std::streamsize(content.size())))
         return NotRead(path,
                        std::make_error_code(errno == EACCES ? std::errc::permission_denied : std::errc::io_error));
     return content;

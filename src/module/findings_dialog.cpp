@@ -114,7 +114,7 @@ CFindingsModel::CFindingsModel(std::vector<Finding> findings, QObject* parent)
 
 int CFindingsModel::rowCount(const QModelIndex& parent) const
 {
-    return parent.isValid() ? 0 : static_cast<int>(m_findings.size());
+    return parent.isValid() ? 0 : int(m_findings.size());
 }
 
 int CFindingsModel::columnCount(const QModelIndex& parent) const
@@ -126,7 +126,7 @@ QVariant CFindingsModel::data(const QModelIndex& index, int role) const
 {
     if (!index.isValid() || (role != Qt::DisplayRole && role != Qt::ToolTipRole))
         return {};
-    return CellText(m_findings[static_cast<std::size_t>(index.row())], index.column());
+    return CellText(m_findings[std::size_t(index.row())], index.column());
 }
 
 QVariant CFindingsModel::headerData(int section, Qt::Orientation orientation, int role) const
@@ -142,7 +142,7 @@ QString CFindingsModel::Text(const QModelIndexList& rows) const
     for (const QModelIndex& row : rows) {
         QStringList cells;
         for (int column = 0; column < Columns; ++column)
-            cells << CellText(m_findings[static_cast<std::size_t>(row.row())], column);
+            cells << CellText(m_findings[std::size_t(row.row())], column);
         text += cells.join(u'\t') + u'\n';
     }
     return text;

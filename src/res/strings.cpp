@@ -29,7 +29,7 @@ QString LoadString(int number)
 
 QString LoadString(Str id)
 {
-    return LoadString(static_cast<int>(id));
+    return LoadString(int(id));
 }
 
 QString LoadCounted(std::size_t count, Str one, Str many)

@@ -67,7 +67,7 @@ void CEditorBars::Update()
         Bar& bar = m_bars[i];
         const bool visible = bar.toggle->isChecked() && m_shown[bar.plugin];
         if (visible && !bar.bar) {
-            bar.bar = bar.plugin->KsCreateToolbar(&m_frame, 0, FirstBarId + static_cast<unsigned>(i), bar.index);
+            bar.bar = bar.plugin->KsCreateToolbar(&m_frame, 0, FirstBarId + unsigned(i), bar.index);
             if (!bar.bar)
                 continue;
             bar.bar->setObjectName(bar.toggle->objectName());

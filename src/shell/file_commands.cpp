@@ -67,7 +67,7 @@ void CFileCommands::New()
         chosen = accepted ? names.indexOf(name) : -1;
     }
     if (chosen >= 0)
-        templates[static_cast<std::size_t>(chosen)]->OpenDocumentFile(&m_frame, {});
+        templates[std::size_t(chosen)]->OpenDocumentFile(&m_frame, {});
 }
 
 QString CFileCommands::AskName(const QString& title, const QString& filters) const

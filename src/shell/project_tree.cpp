@@ -41,7 +41,7 @@ void CProjectTree::Show(const CProjects& projects, const State& state)
     m_tree->clear();
     for (const auto& project : projects.All()) {
         auto* root = new QTreeWidgetItem(m_tree, {project->name});
-        root->setData(0, HandleRole, static_cast<qlonglong>(project->handle));
+        root->setData(0, HandleRole, qlonglong(project->handle));
         root->setToolTip(0, QDir::toNativeSeparators(project->path));
         for (const QString& member : project->members)
             AddMember(*root, member, state(*project, member));

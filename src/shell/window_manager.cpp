@@ -85,7 +85,7 @@ void CWindowManager::PlaceSideBySide()
     first->setGeometry(place);
     place.setLeft(place.right() + 1);
     place.setRight(area.right());
-    const auto count = static_cast<int>(windows.size());
+    const auto count = int(windows.size());
     for (int i = 0; i < count; ++i) {
         place.setTop(area.height() * i / count);
         place.setBottom(area.height() * (i + 1) / count - 1);

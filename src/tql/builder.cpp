@@ -271,7 +271,7 @@ bool tqlAppend(tqlHandle structure, const std::string& path)
     bool good = !text.empty();
     if (good) {
         std::ofstream out(std::filesystem::u8path(path), std::ios::binary | std::ios::app);
-        out.write(text.data(), static_cast<std::streamsize>(text.size()));
+        out.write(text.data(), std::streamsize(text.size()));
         out.flush();
         out.close();
         good = out.good();

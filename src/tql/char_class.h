@@ -39,7 +39,7 @@ inline constexpr auto CharClasses = [] {
             flags |= StringStop;
         if (control || c == '>' || c == '\\')
             flags |= FileStop;
-        table[static_cast<std::size_t>(c)] = static_cast<std::uint8_t>(flags);
+        table[std::size_t(c)] = std::uint8_t(flags);
     }
     return table;
 }();

@@ -38,5 +38,5 @@ const char* tqlPhraseText(TqlPhrase phrase)
 #undef TQL_PHRASE
 #undef TQL_TEXT
     };
-    return texts[static_cast<std::size_t>(phrase)];
+    return texts[std::size_t(phrase)];
 }

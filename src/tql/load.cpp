@@ -87,8 +87,8 @@ bool ReadAll(std::ifstream& in, std::size_t expectedSize, Text& text)
     text = Text(expectedSize + 1); // one byte more shows the end without growing
     std::size_t size = 0;
     for (;;) {
-        in.read(text.Data() + size, static_cast<std::streamsize>(text.Size() - size));
-        size += static_cast<std::size_t>(in.gcount());
+        in.read(text.Data() + size, std::streamsize(text.Size() - size));
+        size += std::size_t(in.gcount());
         if (in.eof())
             break;
         if (!in)
@@ -110,7 +110,7 @@ bool ReadFile(Structure& structure, const std::string& path)
     const auto size = std::filesystem::file_size(native, code);
     errno = 0;
     std::ifstream in(native, std::ios::binary);
-    if (!code && in && ReadAll(in, static_cast<std::size_t>(size), structure.text))
+    if (!code && in && ReadAll(in, std::size_t(size), structure.text))
         return true;
     if (!code)
         code = errno ? std::error_code(errno, std::generic_category()) : std::make_error_code(std::errc::io_error);
@@ -157,7 +157,7 @@ tqlHandle tqlLoadText(std::string text, const std::string& name)
 
 int tqlPeekErrorGlb()
 {
-    return static_cast<int>(globalError);
+    return int(globalError);
 }
 
 int tqlGetErrorGlb()

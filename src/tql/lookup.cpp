@@ -37,7 +37,7 @@ const NameIndex& KeywordIndex(Section& section)
 // Position from 0 of a number from 1.
 std::size_t PositionOf(int number, std::size_t count)
 {
-    return number >= 1 && static_cast<std::size_t>(number) <= count ? static_cast<std::size_t>(number) - 1 : NotFound;
+    return number >= 1 && std::size_t(number) <= count ? std::size_t(number) - 1 : NotFound;
 }
 
 bool HasOneName(const Section& section)
@@ -58,7 +58,7 @@ const char* TextOf(tqlHandle node)
 
 std::size_t ColumnOf(const char* lineStart, const char* at)
 {
-    return CountCharacters({lineStart, static_cast<std::size_t>(at - lineStart)}) + 1;
+    return CountCharacters({lineStart, std::size_t(at - lineStart)}) + 1;
 }
 
 const std::vector<std::size_t>& LineStarts(Structure& structure)
@@ -68,8 +68,8 @@ const std::vector<std::size_t>& LineStarts(Structure& structure)
     const char* const end = structure.text.end();
     if (starts.empty())
         for (const char* p = begin; p && p <= end;) {
-            starts.push_back(static_cast<std::size_t>(p - begin));
-            p = static_cast<const char*>(std::memchr(p, '\n', static_cast<std::size_t>(end - p)));
+            starts.push_back(std::size_t(p - begin));
+            p = static_cast<const char*>(std::memchr(p, '\n', std::size_t(end - p)));
             p += p != nullptr;
         }
     return starts;
@@ -127,13 +127,13 @@ tqlHandle tqlNextParam(tqlHandle param)
 int tqlGetNoSections(tqlHandle parent)
 {
     const Section* const section = AsParent(parent);
-    return section ? static_cast<int>(section->sections.size()) : 0;
+    return section ? int(section->sections.size()) : 0;
 }
 
 int tqlGetNoKeywords(tqlHandle section)
 {
     const Section* const node = AsParent(section);
-    return node ? static_cast<int>(node->keywords.size()) : 0;
+    return node ? int(node->keywords.size()) : 0;
 }
 
 int tqlGetNoKeywords(tqlHandle handle, std::string_view name)
@@ -149,7 +149,7 @@ int tqlGetNoKeywords(tqlHandle handle, std::string_view name)
 int tqlGetNoParams(tqlHandle keyword)
 {
     const Keyword* const node = AsKeyword(keyword);
-    return node ? static_cast<int>(node->ParamCount()) : 0;
+    return node ? int(node->ParamCount()) : 0;
 }
 
 tqlHandle tqlSectionByNum(tqlHandle parent, int number)
@@ -195,9 +195,9 @@ TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node)
     if (!whole || !at)
         return {};
     const auto& starts = LineStarts(*whole);
-    const auto offset = static_cast<std::size_t>(at - whole->text.begin());
+    const auto offset = std::size_t(at - whole->text.begin());
     const auto next = std::upper_bound(starts.begin(), starts.end(), offset);
-    return {static_cast<std::size_t>(next - starts.begin()), ColumnOf(whole->text.begin() + next[-1], at)};
+    return {std::size_t(next - starts.begin()), ColumnOf(whole->text.begin() + next[-1], at)};
 }
 
 namespace {
@@ -207,7 +207,7 @@ std::string_view RawFrom(const char* begin)
     const char* last = begin;
     while (const char* const next = NextParam(last))
         last = next;
-    return {begin, static_cast<std::size_t>(SkipParam(last) - begin)};
+    return {begin, std::size_t(SkipParam(last) - begin)};
 }
 
 } // namespace
@@ -227,5 +227,5 @@ std::string_view tqlGetRawParamsFrom(tqlHandle handle)
 std::string_view tqlGetRawParam(tqlHandle handle)
 {
     const char* const param = AsParam(handle);
-    return param ? std::string_view(param, static_cast<std::size_t>(SkipParam(param) - param)) : std::string_view();
+    return param ? std::string_view(param, std::size_t(SkipParam(param) - param)) : std::string_view();
 }

@@ -14,22 +14,22 @@ NameIndex::NameIndex(const std::vector<std::string_view>& names) : m_order(names
     }
     for (std::size_t i = 0; i < names.size(); ++i) {
         Run& run = m_runs[names[i]];
-        m_order[run.first + run.count++] = static_cast<std::uint32_t>(i);
+        m_order[run.first + run.count++] = std::uint32_t(i);
     }
 }
 
 std::size_t NameIndex::Find(std::string_view name, int number) const
 {
     const auto run = m_runs.find(name);
-    if (run == m_runs.end() || number < 1 || static_cast<std::size_t>(number) > run->second.count)
+    if (run == m_runs.end() || number < 1 || std::size_t(number) > run->second.count)
         return NotFound;
-    return m_order[run->second.first + static_cast<std::size_t>(number) - 1];
+    return m_order[run->second.first + std::size_t(number) - 1];
 }
 
 int NameIndex::Count(std::string_view name) const
 {
     const auto run = m_runs.find(name);
-    return run == m_runs.end() ? 0 : static_cast<int>(run->second.count);
+    return run == m_runs.end() ? 0 : int(run->second.count);
 }
 
 } // namespace tql

@@ -13,7 +13,7 @@ namespace tql {
 class NameIndex
 {
 public:
-    static constexpr std::size_t NotFound = static_cast<std::size_t>(-1);
+    static constexpr std::size_t NotFound = std::size_t(-1);
 
     explicit NameIndex(const std::vector<std::string_view>& names);
 

@@ -43,7 +43,7 @@ NumberScan ScanNumber(const char* const p)
     const char* const digits = p + negative;
     if (*digits == 'n' || *digits == 'i') {
         const char* const end = WordEndAt(digits);
-        const std::string_view word(digits, static_cast<std::size_t>(end - digits));
+        const std::string_view word(digits, std::size_t(end - digits));
         if (word == "nan" || word == "inf")
             return {end, TqlType::Double};
         return {end, TqlType::None, TqlPhrase::Number};
@@ -78,8 +78,8 @@ const char* ReadInt(const char* p, std::int32_t& value)
     const bool negative = *p == '-';
     std::uint64_t digits = 0;
     p = ReadDigits(p + negative, digits);
-    const auto number = static_cast<std::int64_t>(digits);
-    value = static_cast<std::int32_t>(negative ? -number : number);
+    const auto number = std::int64_t(digits);
+    value = std::int32_t(negative ? -number : number);
     return p;
 }
 
@@ -123,18 +123,18 @@ const char* ReadDouble(const char* const p, double& value)
         const std::uint64_t kept = (std::uint64_t{1} << whole * 8) - 1;
         digits = DigitsValue((block & kept) | (block >> 8 * point & ~kept), whole + fraction);
         end += whole + point + fraction;
-        places = static_cast<std::size_t>(fraction);
+        places = std::size_t(fraction);
     } else {
         end = ReadDigits(end, digits);
         if (*end == '.') {
             const char* const first = end + 1;
             end = ReadDigits(first, digits);
-            places = static_cast<std::size_t>(end - first);
+            places = std::size_t(end - first);
         }
     }
     if (!Is(*end, WordEnd) || end - p > noOverflow || digits > exactLimit || (negative && digits == 0))
         return ReadAnyDouble(p, value);
-    const double quotient = static_cast<double>(digits) / ExactPowers[places];
+    const double quotient = double(digits) / ExactPowers[places];
     value = negative ? -quotient : quotient;
     return end;
 }
@@ -143,7 +143,7 @@ void AppendInt(std::string& out, std::int32_t value)
 {
     char buffer[16];
     const auto result = std::to_chars(buffer, buffer + sizeof buffer, value);
-    out.append(buffer, static_cast<std::size_t>(result.ptr - buffer));
+    out.append(buffer, std::size_t(result.ptr - buffer));
 }
 
 void AppendDouble(std::string& out, double value)
@@ -155,7 +155,7 @@ void AppendDouble(std::string& out, double value)
     char buffer[40 + ReadAhead];
     char* const end = std::to_chars(buffer, buffer + sizeof buffer - ReadAhead, value).ptr;
     std::memset(end, 0, ReadAhead);
-    out.append(buffer, static_cast<std::size_t>(end - buffer));
+    out.append(buffer, std::size_t(end - buffer));
     // Whole numbers look like integers; these must be ones, or say that they are floats.
     const char* const digits = buffer + (buffer[0] == '-');
     if (SkipDigits(digits) != end)

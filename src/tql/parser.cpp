@@ -70,7 +70,7 @@ bool Parser::Run()
 {
     const char* const end = m_structure.text.end();
     for (const char* p = m_structure.text.begin(); p < end;) {
-        const char* const feed = static_cast<const char*>(std::memchr(p, '\n', static_cast<std::size_t>(end - p) + 1));
+        const char* const feed = static_cast<const char*>(std::memchr(p, '\n', std::size_t(end - p) + 1));
         m_line = p;
         m_lineEnd = feed > p && feed[-1] == '\r' ? feed - 1 : feed;
         ++m_lineNumber;
@@ -89,7 +89,7 @@ bool Parser::Run()
 
 bool Parser::CheckLine()
 {
-    if (static_cast<std::size_t>(m_lineEnd - m_line) > MaxLineLength)
+    if (std::size_t(m_lineEnd - m_line) > MaxLineLength)
         return Fail(TqlError::TooLarge, m_line, {TqlPhrase::LineOfLimit}, {TqlPhrase::LongerLine});
     const char* const bad = FindBadByte(m_line, m_lineEnd);
     return bad == m_lineEnd || FailEncoding(bad);
@@ -123,7 +123,7 @@ bool Parser::ExpectEnd(const char* p, TqlPhrase expected)
     p = SkipBlanks(p);
     if (!AtEnd(p))
         return Fail(p, expected);
-    const auto* const cr = static_cast<const char*>(std::memchr(p, '\r', static_cast<std::size_t>(m_lineEnd - p)));
+    const auto* const cr = static_cast<const char*>(std::memchr(p, '\r', std::size_t(m_lineEnd - p)));
     return !cr || Fail(cr, TqlPhrase::LineFeed);
 }
 
@@ -139,7 +139,7 @@ bool Parser::ParseBracket(const char* p)
         return Fail(p, TqlPhrase::Name);
     if (*p != ']')
         return Fail(p, TqlPhrase::BracketBehindName);
-    const std::string_view name(begin, static_cast<std::size_t>(p - begin));
+    const std::string_view name(begin, std::size_t(p - begin));
     return ExpectEnd(p + 1) && (closes ? Close(name, bracket) : Open(name, bracket));
 }
 
@@ -168,13 +168,13 @@ bool Parser::Close(std::string_view name, const char* at)
 const char* Parser::SkipKeywordName(const char* p)
 {
     const std::size_t length = m_lastName.size();
-    if (length <= static_cast<std::size_t>(m_lineEnd - p) && std::memcmp(p, m_lastName.data(), length) == 0 &&
+    if (length <= std::size_t(m_lineEnd - p) && std::memcmp(p, m_lastName.data(), length) == 0 &&
         !Is(p[length], NameChar))
         return p + length;
     const char* const begin = p;
     while (Is(*p, NameChar))
         ++p;
-    m_lastName = {begin, static_cast<std::size_t>(p - begin)};
+    m_lastName = {begin, std::size_t(p - begin)};
     return p;
 }
 
@@ -182,7 +182,7 @@ bool Parser::ParseKeyword(const char* p)
 {
     const char* const begin = p;
     p = SkipKeywordName(p);
-    const std::string_view name(begin, static_cast<std::size_t>(p - begin));
+    const std::string_view name(begin, std::size_t(p - begin));
     if (m_open.empty())
         return Fail(TqlError::Syntax, begin, {TqlPhrase::TargetFirst}, Found(begin));
     p = SkipBlanks(p);
@@ -223,8 +223,8 @@ void Parser::ReserveKeywords(Section& section)
     const std::size_t count = section.keywords.size();
     if (count < longList || count < section.keywords.capacity())
         return;
-    const auto soFar = static_cast<std::size_t>(m_line - section.name.data());
-    const auto left = static_cast<std::size_t>(m_structure.text.end() - m_line);
+    const auto soFar = std::size_t(m_line - section.name.data());
+    const auto left = std::size_t(m_structure.text.end() - m_line);
     const std::size_t likely = count + left / (soFar / count + 1) + 1;
     section.keywords.reserve(std::clamp(likely, 2 * count, 8 * count));
 }
@@ -237,16 +237,16 @@ void Parser::AddKeyword(std::string_view name, const char* params, std::size_t c
     ReserveKeywords(section);
     Keyword& keyword = section.keywords.emplace_back();
     if (count <= Keyword::MaxParams && name.size() <= std::numeric_limits<std::uint16_t>::max()) {
-        keyword.paramCount = static_cast<std::uint8_t>(count);
-        keyword.nameLength = static_cast<std::uint16_t>(name.size());
-        keyword.paramsOffset = static_cast<std::uint32_t>(params - name.data());
+        keyword.paramCount = std::uint8_t(count);
+        keyword.nameLength = std::uint16_t(name.size());
+        keyword.paramsOffset = std::uint32_t(params - name.data());
         keyword.name = name.data();
         return;
     }
     LongKeyword& more = m_structure.longKeywords.emplace_back(LongKeyword{name, params, {}});
     more.starts.reserve(count);
     for (const char* p = params; more.starts.size() < count; p = NextParam(p))
-        more.starts.push_back(static_cast<std::uint32_t>(p - params));
+        more.starts.push_back(std::uint32_t(p - params));
     keyword.kind = Kind::LongKeyword;
     keyword.more = &more;
 }
@@ -269,7 +269,7 @@ TqlTerm Parser::Found(const char* at) const
     for (std::size_t characters = 0; p < m_lineEnd && characters < longest; ++characters) {
         if (p != at && (Is(*p, Blank) || *p == ',' || *p == '='))
             break;
-        p += SequenceLength({p, static_cast<std::size_t>(m_lineEnd - p)});
+        p += SequenceLength({p, std::size_t(m_lineEnd - p)});
     }
     return {TqlPhrase::Text, std::string(at, p)};
 }
@@ -280,7 +280,7 @@ bool Parser::Fail(TqlError code, const char* at, TqlTerm expected, TqlTerm found
     error.code = code;
     error.file = m_file;
     error.line = m_lineNumber;
-    error.column = CountCharacters({m_line, static_cast<std::size_t>(at - m_line)}) + 1;
+    error.column = CountCharacters({m_line, std::size_t(at - m_line)}) + 1;
     error.message = m_file + ", line " + std::to_string(error.line) + ", column " + std::to_string(error.column) +
                     ": expected " + TermText(expected) + ", found " + TermText(found);
     error.expected = std::move(expected);

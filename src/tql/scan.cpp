@@ -23,7 +23,7 @@ bool IsHex(char c)
 
 std::uint32_t HexValue(char c)
 {
-    return static_cast<std::uint32_t>(Is(c, Digit) ? c - '0' : (c | 0x20) - 'a' + 10);
+    return std::uint32_t(Is(c, Digit) ? c - '0' : (c | 0x20) - 'a' + 10);
 }
 
 // `p` behind "\u"; on success the end, and the character. Null when it is no \u{...} of a character.
@@ -228,7 +228,7 @@ const char* UnescapeParam(const char* p, std::string& out)
     const Quoting& quoting = QuotingOf(*p);
     const char* run = p + 1;
     p = FindQuoteEnd(run, quoting.close);
-    out.assign(run, static_cast<std::size_t>(p - run));
+    out.assign(run, std::size_t(p - run));
     while (*p != quoting.close) {
         ++p;
         if (*p == quoting.close || *p == '\\') {
@@ -243,7 +243,7 @@ const char* UnescapeParam(const char* p, std::string& out)
         }
         run = p;
         p = FindQuoteEnd(run, quoting.close);
-        out.append(run, static_cast<std::size_t>(p - run));
+        out.append(run, std::size_t(p - run));
     }
     return p + 1;
 }

@@ -51,7 +51,7 @@ const char* FindBadByte(const char* p, const char* end)
     if (IsPlain(p, end))
         return end;
     while (p < end) {
-        const std::size_t length = SequenceLength({p, static_cast<std::size_t>(end - p)});
+        const std::size_t length = SequenceLength({p, std::size_t(end - p)});
         if (length == 0 || *p == '\0')
             return p;
         p += length;
@@ -69,7 +69,7 @@ std::size_t CountCharacters(std::string_view text)
 
 void AppendCodePoint(std::string& out, std::uint32_t c)
 {
-    const auto put = [&](std::uint32_t byte) { out.push_back(static_cast<char>(byte)); };
+    const auto put = [&](std::uint32_t byte) { out.push_back(char(byte)); };
     if (c < 0x80) {
         put(c);
     } else if (c < 0x800) {

@@ -51,7 +51,7 @@ std::string Described(const Field& field, std::string_view keyword)
         return field.padWhenEmpty ? text + "; one empty element when N is 0" : text;
     }
     constexpr const char* kinds[] = {"float", "integer", "integer", "boolean", "string", "file name", "6 integers"};
-    std::string text = kinds[static_cast<int>(field.kind)];
+    std::string text = kinds[int(field.kind)];
     if (field.name != keyword)
         text += ' ' + std::string(field.name);
     return text + (field.optionalTail ? "?" : "") + Values(field);

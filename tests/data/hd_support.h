@@ -2,8 +2,8 @@
 #pragma once
 
 #include "data/hd_file.h"
-#include "test_folder.h"
 #include "files/field_io.h"
+#include "test_folder.h"
 
 #include <filesystem>
 #include <fstream>
@@ -48,15 +48,14 @@ inline void Disturb(FieldList fields, void* object, int& seed)
         ++seed;
         Visit(field, object,
               Overloads{[&](double& value) {
-                            value = value == 0
-                                        ? -1.0 / seed
-                                        : value + numbers[static_cast<std::size_t>(seed) % std::size(numbers)] + seed;
+                            value = value == 0 ? -1.0 / seed
+                                               : value + numbers[std::size_t(seed) % std::size(numbers)] + seed;
                         },
                         [&](std::int32_t& value) { value += 100 + seed; }, [](bool& value) { value = !value; },
                         [&](std::string& value) { value += "\"<M\xC3\x9CHLE>\\\n\t" + std::to_string(seed); },
                         [&](HDDateTime& value) { value = {1900 + seed, 13, -1, 25, 61, seed}; }, // kept, though no date
                         [&](GroupValue<void> group) {
-                            group.Renew(2 + static_cast<std::size_t>(seed % 3));
+                            group.Renew(2 + std::size_t(seed % 3));
                             for (std::size_t i = 0; i < group.size(); ++i)
                                 Disturb(group.Elements(), group[i], seed);
                         }});
@@ -97,7 +96,7 @@ protected:
     std::string Text(const char* name) const { return ReadText(m_folder / name); }
     std::size_t FileCount() const
     {
-        return static_cast<std::size_t>(std::distance(std::filesystem::directory_iterator(m_folder), {}));
+        return std::size_t(std::distance(std::filesystem::directory_iterator(m_folder), {}));
     }
 
 private:

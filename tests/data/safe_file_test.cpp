@@ -172,7 +172,7 @@ TEST_F(SafeFile, TheNewContentIsNeverOpenToOthers)
         std::error_code Write(Handle file, std::string_view text, std::size_t& written) override
         {
             struct stat status;
-            ::fstat(static_cast<int>(file), &status);
+            ::fstat(int(file), &status);
             mode = status.st_mode & 07777;
             return FaultyPlatform::Write(file, text, written);
         }

@@ -69,7 +69,7 @@ TEST(Building, WhatCannotBeReadBackIsNotWritten)
         const TestFolder folder;
         const std::string path = folder.Path("refused.hdkv");
         EXPECT_FALSE(tqlAppend(out, path));
-        EXPECT_EQ(tqlGetErrorGlb(), static_cast<int>(TqlError::Write));
+        EXPECT_EQ(tqlGetErrorGlb(), int(TqlError::Write));
         EXPECT_FALSE(std::filesystem::exists(path));
         return tqlGetText(out).empty();
     };
@@ -109,8 +109,8 @@ TEST(Building, AppendAddsToTheFileAndReportsFailure)
     EXPECT_EQ(content, std::string(tqlGetText(out)) + std::string(tqlGetText(out)));
 
     EXPECT_FALSE(tqlAppend(out, folder.Path("no such folder/x.hdkv")));
-    EXPECT_EQ(tqlPeekErrorGlb(), static_cast<int>(TqlError::Write));
-    EXPECT_EQ(tqlGetErrorGlb(), static_cast<int>(TqlError::Write));
+    EXPECT_EQ(tqlPeekErrorGlb(), int(TqlError::Write));
+    EXPECT_EQ(tqlGetErrorGlb(), int(TqlError::Write));
     EXPECT_EQ(tqlGetErrorGlb(), 0);
     if (std::filesystem::exists("/dev/full")) {
         EXPECT_FALSE(tqlAppend(out, "/dev/full"));

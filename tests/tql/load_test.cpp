@@ -15,7 +15,7 @@ TqlSyntaxError LoadError(const std::string& path)
     TqlSyntaxError error;
     const bool failed = tqlGetSyntaxErr(structure, &error);
     EXPECT_EQ(failed, error.code != TqlError::None);
-    EXPECT_EQ(tqlPeekErrorGlb(), static_cast<int>(error.code));
+    EXPECT_EQ(tqlPeekErrorGlb(), int(error.code));
     EXPECT_EQ(tqlGetNoSections(structure), error.code == TqlError::None ? 1 : 0);
     return error;
 }
@@ -114,7 +114,7 @@ TEST(Loading, LimitsAreExact)
         tqlGetSyntaxErr(structure, &error);
         EXPECT_EQ(error.code, line ? TqlError::TooLarge : TqlError::None) << error.message;
         EXPECT_EQ(error.line, line);
-        EXPECT_EQ(tqlPeekErrorGlb(), static_cast<int>(error.code));
+        EXPECT_EQ(tqlPeekErrorGlb(), int(error.code));
     }
 }
 

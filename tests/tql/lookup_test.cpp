@@ -84,7 +84,7 @@ TEST(LookUp, ManyParametersByNumberInAnyOrder)
     const Params p(line);
     ASSERT_EQ(tqlGetNoParams(p.Keyword()), 300000);
     for (int i = 0; i < 300000; ++i) {
-        const int number = static_cast<int>(i * 7919LL % 300000) + 1;
+        const int number = int(i * 7919LL % 300000) + 1;
         std::int32_t value = -1;
         ASSERT_TRUE(tqlGetInt(p[number], &value));
         ASSERT_EQ(value, number - 1);
@@ -106,7 +106,7 @@ TEST(LookUp, PositionsAreLinesAndCharacters)
                                                                {nullptr, {0, 0}}};
     for (const auto& [handle, expected] : cases)
         for (const TqlPosition at : {tqlGetPosition(handle), tqlGetPosition(file, handle)})
-            EXPECT_EQ(std::pair(static_cast<int>(at.line), static_cast<int>(at.column)), expected);
+            EXPECT_EQ(std::pair(int(at.line), int(at.column)), expected);
 }
 
 // A look-up that walked from the front would take minutes here.
@@ -126,7 +126,7 @@ TEST(LookUp, CostsTheSameInAnyOrderAndMixture)
         ASSERT_EQ(tqlGetNoKeywords(target, "DATA"), count);
         const auto start = std::chrono::steady_clock::now();
         for (int i = 0; i < count; ++i) {
-            const int number = static_cast<int>((i * 99991LL + 17) % count);
+            const int number = int((i * 99991LL + 17) % count);
             std::int32_t value = -1;
             ASSERT_TRUE(tqlGetParam(target, "DATA", &value, number + 1));
             ASSERT_EQ(value, number);

@@ -119,7 +119,7 @@ TEST(SyntaxErrors, AreReportedInOneSentenceAndLeaveNothing)
         EXPECT_EQ(error.code, c.code) << error.message;
         const std::string place = "line " + std::to_string(error.line) + ", column " + std::to_string(error.column);
         EXPECT_EQ(error.message.find("river.hdkv, " + place), 0u) << error.message;
-        EXPECT_EQ(tqlPeekErrorGlb(), static_cast<int>(c.code));
+        EXPECT_EQ(tqlPeekErrorGlb(), int(c.code));
         EXPECT_EQ(tqlGetNoSections(structure), 0);
         EXPECT_EQ(tqlTargetByNameNum(structure, "T", 1), nullptr);
     }

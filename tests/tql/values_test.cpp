@@ -133,7 +133,7 @@ TEST(Values, FloatsRoundTripToTheBit)
         if (const double value = std::bit_cast<double>(random()); !std::isnan(value))
             values.push_back(value);
     for (int i = 0; i < 5000; ++i) // what modellers type
-        values.push_back(static_cast<double>(static_cast<std::int64_t>(random() % 2000000) - 1000000) / 1000);
+        values.push_back(double(std::int64_t(random() % 2000000) - 1000000) / 1000);
     const Structure out(tqlCreate());
     tqlAddTarget(out, "T");
     for (const double value : values)
@@ -143,7 +143,7 @@ TEST(Values, FloatsRoundTripToTheBit)
     const tqlHandle target = tqlTargetByNameNum(in, "T", 1);
     for (std::size_t i = 0; i < values.size(); ++i) {
         double value = 99;
-        ASSERT_TRUE(tqlGetParam(target, "K", &value, static_cast<int>(i) + 1));
+        ASSERT_TRUE(tqlGetParam(target, "K", &value, int(i) + 1));
         ASSERT_EQ(std::bit_cast<std::uint64_t>(value), std::bit_cast<std::uint64_t>(values[i])) << values[i];
     }
 }
@@ -183,7 +183,7 @@ TEST(Values, EveryCharacterRoundTripsInStringsAndFileNames)
 {
     std::string all;
     for (int c = 0; c < 128; ++c)
-        all += static_cast<char>(c);
+        all += char(c);
     all += "\xE6\xB2\xB3\xE5\xB7\x9D \xF0\x9F\x8C\x8A \xEF\xBB\xBF \xC2\x85";
     const Structure out(tqlCreate());
     tqlAddTarget(out, "T");

@@ -28,7 +28,7 @@ CPlotAxis CPlotAxis::Around(UnitGroup group, double from, double to, int most)
     const double low = unit.UnitConvertFromBase(axis.low, 1), high = unit.UnitConvertFromBase(axis.high, 1);
     const int count = std::max(most, 2);
     const double step = Round125((high - low) / count);
-    const int decimals = std::max(0, -static_cast<int>(std::floor(std::log10(step) + 1e-9)));
+    const int decimals = std::max(0, -int(std::floor(std::log10(step) + 1e-9)));
     const double first = std::ceil(low / step);
     for (int i = 0; i <= count && (first + i) * step <= high; ++i) {
         const double value = (first + i) * step;

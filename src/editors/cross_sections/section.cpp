@@ -22,7 +22,7 @@ std::tuple<QString, QString, double> CCrossSection::Key() const
 bool CCrossSections::IsTaken(const CCrossSection& section, int except) const
 {
     for (std::size_t i = 0; i < sections.size(); ++i) {
-        if (static_cast<int>(i) != except && sections[i].Key() == section.Key())
+        if (int(i) != except && sections[i].Key() == section.Key())
             return true;
     }
     return false;
@@ -36,7 +36,7 @@ int CCrossSections::Nearest(const QString& branch, double chainage) const
         const double distance = std::abs(sections[i].chainage - chainage);
         if (distance < least && KsSameBranch(sections[i].branch, branch)) {
             least = distance;
-            nearest = static_cast<int>(i);
+            nearest = int(i);
         }
     }
     return nearest;
@@ -111,7 +111,7 @@ std::optional<CWaterSurface> WaterSurface(const CCrossSection& section)
         return {};
     const auto lowest =
         std::min_element(points.begin(), points.end(), [](const auto& a, const auto& b) { return a.level < b.level; });
-    const auto deepest = static_cast<std::size_t>(lowest - points.begin());
+    const auto deepest = std::size_t(lowest - points.begin());
     const auto surface = [&](double level) {
         return CWaterSurface{level, Shore(points, deepest, -1, level), Shore(points, deepest, 1, level)};
     };

@@ -112,7 +112,7 @@ int CSectionPlot::PointNear(const QPointF& at) const
         const double distance = QLineF(at, WindowPoint(m_section->points[i])).length();
         if (distance < least) {
             least = distance;
-            nearest = static_cast<int>(i);
+            nearest = int(i);
         }
     }
     return nearest;
@@ -149,7 +149,7 @@ void CSectionPlot::keyPressEvent(QKeyEvent* event)
     } else if (key->section) {
         emit SectionStep(key->section);
     } else if (HasPoints()) {
-        const int last = static_cast<int>(m_section->points.size()) - 1;
+        const int last = int(m_section->points.size()) - 1;
         emit PointPicked(std::clamp(m_point + key->point, 0, last));
     }
 }

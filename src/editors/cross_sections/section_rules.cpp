@@ -21,7 +21,7 @@ CSectionFault FindFault(const CCrossSection& section)
         return {CSectionFault::Width, -1, SectionRules::tr("expected a width that is not negative.")};
     for (std::size_t i = 1; i < section.points.size(); ++i) {
         if (section.points[i].offset < section.points[i - 1].offset)
-            return {CSectionFault::Point, static_cast<int>(i),
+            return {CSectionFault::Point, int(i),
                     SectionRules::tr("expected offsets that do not decrease from point to point.")};
     }
     return {};

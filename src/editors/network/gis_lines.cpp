@@ -28,7 +28,7 @@ QString GeometryName(OGRwkbGeometryType type)
 CGisLine LineOf(const OGRLineString& geometry, bool swapped)
 {
     CGisLine line;
-    line.reserve(static_cast<std::size_t>(geometry.getNumPoints()));
+    line.reserve(std::size_t(geometry.getNumPoints()));
     for (int i = 0; i < geometry.getNumPoints(); ++i) {
         const QPointF at(geometry.getX(i), geometry.getY(i));
         line.push_back(swapped ? at.transposed() : at);

@@ -63,8 +63,8 @@ bool Transform(const Transformation& transformation, CGisLine& line)
         y.push_back(at.y());
     }
     std::vector<int> good(line.size());
-    const bool done = line.empty() || transformation->Transform(static_cast<int>(line.size()), x.data(), y.data(),
-                                                                nullptr, good.data());
+    const bool done =
+        line.empty() || transformation->Transform(int(line.size()), x.data(), y.data(), nullptr, good.data());
     for (std::size_t i = 0; i < line.size(); ++i)
         line[i] = {x[i], y[i]};
     return done && std::all_of(good.begin(), good.end(), [](int each) { return each != 0; }) &&

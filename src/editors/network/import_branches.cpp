@@ -13,13 +13,13 @@
 
 int CGisLayer::Lines() const
 {
-    return static_cast<int>(std::count_if(features.begin(), features.end(),
-                                          [](const CGisFeature& feature) { return !feature.parts.empty(); }));
+    return int(std::count_if(features.begin(), features.end(),
+                             [](const CGisFeature& feature) { return !feature.parts.empty(); }));
 }
 
 bool CGisLayer::IsComplete() const
 {
-    return errors.isEmpty() && announced <= static_cast<qint64>(features.size()) &&
+    return errors.isEmpty() && announced <= qint64(features.size()) &&
            std::all_of(features.begin(), features.end(),
                        [](const CGisFeature& feature) { return feature.error.isEmpty(); });
 }

@@ -90,7 +90,7 @@ CImportDialog::CImportDialog(const QString& name, const CGisFile& file, const CG
 void CImportDialog::MakeLayers(const CGisFile& file)
 {
     m_layers->setColumnCount(LayerColumns);
-    m_layers->setRowCount(static_cast<int>(file.layers.size()));
+    m_layers->setRowCount(int(file.layers.size()));
     m_layers->setHorizontalHeaderLabels(
         {tr("Layer"), tr("Geometry"), tr("Lines"), tr("Coordinate system"), tr("Remark")});
     m_layers->verticalHeader()->hide();
@@ -180,7 +180,7 @@ int CImportDialog::FirstLayer() const
 {
     for (std::size_t i = 0; i < m_file.layers.size(); ++i) {
         if (m_file.layers[i].Lines() > 0)
-            return static_cast<int>(i);
+            return int(i);
     }
     return 0;
 }

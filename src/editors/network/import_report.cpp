@@ -57,7 +57,7 @@ void AddScale(const CGisMap& map, std::vector<CImportRemark>& remarks)
 
 QString MissingFeatures(const CGisLayer& layer)
 {
-    const auto read = static_cast<qint64>(layer.features.size());
+    const auto read = qint64(layer.features.size());
     return read < layer.announced
                ? Text::tr("The file counts %1 features, but only %2 could be read.").arg(layer.announced).arg(read)
                : QString();

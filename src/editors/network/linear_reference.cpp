@@ -95,7 +95,7 @@ std::optional<CNetworkPlace> CLinearReference::Nearest(const QPointF& point, dou
                 Search(line, chunk, point, best, found);
         }
         if (found && (!hadOne || best.distance < before))
-            best.branch = static_cast<int>(i);
+            best.branch = int(i);
     }
     return best.branch >= 0 ? std::optional(best) : std::nullopt;
 }
@@ -119,7 +119,7 @@ std::optional<QPointF> CLinearReference::PointAt(int branch, double chainage) co
         return std::nullopt;
     const Line& line = m_lines[std::size_t(branch)];
     const auto after = std::upper_bound(line.along.begin() + 1, line.along.end() - 1, *distance);
-    const auto i = static_cast<std::size_t>(after - line.along.begin());
+    const auto i = std::size_t(after - line.along.begin());
     const double step = line.along[i] - line.along[i - 1];
     const double part = step > 0 ? (*distance - line.along[i - 1]) / step : 0;
     return line.points[i - 1] + std::clamp(part, 0.0, 1.0) * (line.points[i] - line.points[i - 1]);

@@ -83,18 +83,18 @@ const std::array<KindRow, HDDataTypeCount>& Kinds()
 
 QString LocationKindName(int kind)
 {
-    return LocationKinds::tr(Kinds().at(static_cast<std::size_t>(kind)).name);
+    return LocationKinds::tr(Kinds().at(std::size_t(kind)).name);
 }
 
 QColor LocationKindColour(int kind)
 {
-    return QColor(Kinds().at(static_cast<std::size_t>(kind)).colour);
+    return QColor(Kinds().at(std::size_t(kind)).colour);
 }
 
 QPixmap LocationKindSymbol(int kind, double size, const QColor& outline)
 {
     const double line = size / 9;
-    QPixmap symbol(static_cast<int>(std::ceil(size)), static_cast<int>(std::ceil(size)));
+    QPixmap symbol(int(std::ceil(size)), int(std::ceil(size)));
     symbol.fill(Qt::transparent);
     QPainter painter(&symbol);
     painter.setRenderHint(QPainter::Antialiasing);
@@ -103,6 +103,6 @@ QPixmap LocationKindSymbol(int kind, double size, const QColor& outline)
     painter.scale(radius, radius);
     painter.setPen(QPen(outline, line / radius, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
     painter.setBrush(LocationKindColour(kind));
-    painter.drawPath(Kinds().at(static_cast<std::size_t>(kind)).shape());
+    painter.drawPath(Kinds().at(std::size_t(kind)).shape());
     return symbol;
 }

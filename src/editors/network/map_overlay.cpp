@@ -59,8 +59,7 @@ QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend&
     int names = 0, numbers = 0;
     for (int kind = 0; kind < HDDataTypeCount; ++kind) {
         names = std::max(names, metrics.horizontalAdvance(LocationKindName(kind)));
-        numbers = std::max(numbers,
-                           metrics.horizontalAdvance(QString::number(legend.counts[static_cast<std::size_t>(kind)])));
+        numbers = std::max(numbers, metrics.horizontalAdvance(QString::number(legend.counts[std::size_t(kind)])));
     }
     const int inner = std::max(LegendSymbol + names + gap + numbers, metrics.horizontalAdvance(Elsewhere(legend)));
     const int rows = HDDataTypeCount + (legend.elsewhere > 0 ? 1 : 0);
@@ -79,13 +78,12 @@ void PaintLegend(QPainter& painter, const CMapStyle& style, const QRect& window,
         QPixmap picture = LocationKindSymbol(kind, CMapScene::SymbolSize * ratio, style.outline);
         picture.setDevicePixelRatio(ratio);
         const QSizeF size = QSizeF(picture.size()) / ratio;
-        painter.setOpacity(legend.counts[static_cast<std::size_t>(kind)] ? 1 : 0.5);
+        painter.setOpacity(legend.counts[std::size_t(kind)] ? 1 : 0.5);
         painter.drawPixmap(QPointF(line.left(), line.center().y() - size.height() / 2), picture);
         painter.setPen(style.text);
         painter.drawText(line.adjusted(LegendSymbol, 0, 0, 0), Qt::AlignVCenter | Qt::AlignLeft,
                          LocationKindName(kind));
-        painter.drawText(line, Qt::AlignVCenter | Qt::AlignRight,
-                         QString::number(legend.counts[static_cast<std::size_t>(kind)]));
+        painter.drawText(line, Qt::AlignVCenter | Qt::AlignRight, QString::number(legend.counts[std::size_t(kind)]));
     }
     painter.setOpacity(1);
     painter.setPen(style.mark);
@@ -102,8 +100,7 @@ void PaintScaleBar(QPainter& painter, const CMapStyle& style, const QRect& windo
     const QString text = kilometres ? KsShortestNumber(shown / 1000) + QStringLiteral(" km")
                                     : KsShortestNumber(shown) + u' ' + unit.UnitSymbol();
     const int height = painter.fontMetrics().height();
-    const double box =
-        std::max(width, static_cast<double>(painter.fontMetrics().horizontalAdvance(text))) + 2 * Padding;
+    const double box = std::max(width, double(painter.fontMetrics().horizontalAdvance(text))) + 2 * Padding;
     const QRectF panel(window.left() + Margin, window.bottom() - Margin - height - 20, box, height + 20);
     PaintPanel(painter, style, panel);
     const double left = std::round(panel.center().x() - width / 2) + 0.5, right = left + std::round(width);

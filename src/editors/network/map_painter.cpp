@@ -11,8 +11,7 @@ CMapPainter::CMapPainter(const CMapScene& scene, const CMapStyle& style, int cur
     : m_scene(scene), m_style(style), m_currentBranch(currentBranch), m_pictures(pictures)
 {
     for (int kind = 0; kind < HDDataTypeCount; ++kind)
-        m_symbols[static_cast<std::size_t>(kind)] =
-            LocationKindSymbol(kind, CMapScene::SymbolSize * scene.Ratio(), style.outline);
+        m_symbols[std::size_t(kind)] = LocationKindSymbol(kind, CMapScene::SymbolSize * scene.Ratio(), style.outline);
 }
 
 void CMapPainter::Paint(QPainter& painter, const QRect& part, const QPoint& offset) const
@@ -38,7 +37,7 @@ void CMapPainter::PaintLines(QPainter& painter, const QRectF& part) const
     for (std::size_t i = 0; i < lines.size(); ++i) {
         std::vector<QPolygonF> parts;
         lines[i].Clip(near, parts);
-        const bool current = static_cast<int>(i) == m_currentBranch;
+        const bool current = int(i) == m_currentBranch;
         const double width = current ? CurrentWidth : LineWidth;
         // The ground's colour around a line shows which of two crossing branches is above.
         for (const auto& [colour, extra] :
@@ -87,9 +86,9 @@ void CMapPainter::PaintSymbols(QPainter& painter, const QRectF& part) const
         if (!near.contains(symbol.at))
             continue;
         // On whole pixels, so that it looks the same wherever it is.
-        const QPixmap& pixmap = m_symbols[static_cast<std::size_t>(symbol.kind)];
-        painter.drawPixmap(static_cast<int>(std::floor(symbol.at.x() - pixmap.width() / 2.0 + 0.5)),
-                           static_cast<int>(std::floor(symbol.at.y() - pixmap.height() / 2.0 + 0.5)), pixmap);
+        const QPixmap& pixmap = m_symbols[std::size_t(symbol.kind)];
+        painter.drawPixmap(int(std::floor(symbol.at.x() - pixmap.width() / 2.0 + 0.5)),
+                           int(std::floor(symbol.at.y() - pixmap.height() / 2.0 + 0.5)), pixmap);
     }
 }
 
@@ -101,7 +100,7 @@ void CMapPainter::PaintLabels(QPainter& painter, const QRectF& part) const
     for (std::size_t i = 0; i < labels.size(); ++i) {
         if (!near.intersects(labels[i].box))
             continue;
-        if (static_cast<int>(labels[i].branch) == m_currentBranch) {
+        if (int(labels[i].branch) == m_currentBranch) {
             PaintLabel(painter, labels[i], m_style.chosen);
             continue;
         }

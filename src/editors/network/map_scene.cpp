@@ -23,7 +23,7 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
     const CNetwork& network = document.Network();
     QHash<QString, int> branches;
     for (std::size_t i = 0; i < network.branches.size(); ++i)
-        branches.insert(KsBranchKey(network.branches[i].name), static_cast<int>(i));
+        branches.insert(KsBranchKey(network.branches[i].name), int(i));
     std::vector<CPlacedLocation> placed;
     placed.reserve(locations.size());
     QString name; // of the location before: most follow one of the same branch
@@ -37,7 +37,7 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
         const auto point = document.Reference().PointAt(branch, location.chainage);
         if (!point)
             continue;
-        const CNetworkBranch& on = network.branches[static_cast<std::size_t>(branch)];
+        const CNetworkBranch& on = network.branches[std::size_t(branch)];
         placed.push_back({i, location.kind, branch, (location.chainage - on.start) / (on.end - on.start), *point});
     }
     std::stable_sort(placed.begin(), placed.end(), [](const auto& a, const auto& b) { return a.kind < b.kind; });
@@ -73,8 +73,8 @@ public:
         ForCells(box, [&](const Cell& cell) {
             const auto found = m_boxes.constFind(cell);
             if (found != m_boxes.constEnd())
-                count += static_cast<int>(std::count_if(found->begin(), found->end(),
-                                                        [&](const QRectF& each) { return each.intersects(box); }));
+                count += int(std::count_if(found->begin(), found->end(),
+                                           [&](const QRectF& each) { return each.intersects(box); }));
         });
         return count;
     }
@@ -84,7 +84,7 @@ private:
     template <typename Action>
     void ForCells(const QRectF& box, Action action) const
     {
-        const auto cell = [this](double value) { return static_cast<int>(std::floor(value / m_cell)); };
+        const auto cell = [this](double value) { return int(std::floor(value / m_cell)); };
         for (int x = cell(box.left()); x <= cell(box.right()); ++x) {
             for (int y = cell(box.top()); y <= cell(box.bottom()); ++y)
                 action(Cell(x, y));
@@ -117,27 +117,25 @@ void CMapScene::AddSymbols(const std::vector<CPlacedLocation>& placed, const CMa
 {
     std::array<int, HDDataTypeCount> counts{};
     for (const CPlacedLocation& each : placed)
-        ++counts.at(static_cast<std::size_t>(each.kind));
+        ++counts.at(std::size_t(each.kind));
     std::array<double, HDDataTypeCount> offsets{};
-    const auto kinds =
-        static_cast<int>(std::count_if(counts.begin(), counts.end(), [](int count) { return count > 0; }));
+    const auto kinds = int(std::count_if(counts.begin(), counts.end(), [](int count) { return count > 0; }));
     int lane = 0;
     for (std::size_t kind = 0; kind < counts.size(); ++kind) {
         if (counts[kind] > 0)
             offsets[kind] = (lane++ - (kinds - 1) / 2.0) * LaneWidth * m_ratio;
     }
     m_lanes = kinds > 0 ? (kinds - 1) / 2.0 * LaneWidth * m_ratio + SymbolSize / 2 * m_ratio : 0;
-    m_leaders = kinds > 1 && m_length * kinds > LeaderSpacing * m_ratio * static_cast<double>(placed.size());
+    m_leaders = kinds > 1 && m_length * kinds > LeaderSpacing * m_ratio * double(placed.size());
 
     m_symbols.reserve(placed.size());
     for (const CPlacedLocation& each : placed) {
-        const CPlaneLine& line = m_lines[static_cast<std::size_t>(each.branch)];
+        const CPlaneLine& line = m_lines[std::size_t(each.branch)];
         const double distance = each.part * line.Length();
         const QPointF direction = line.Direction(distance, 2 * m_lanes + m_ratio);
         const QPointF normal(-direction.y(), direction.x());
         const QPointF foot = projection.ToPlane(each.map);
-        m_symbols.push_back(
-            {foot, foot + offsets[static_cast<std::size_t>(each.kind)] * normal, each.kind, each.location});
+        m_symbols.push_back({foot, foot + offsets[std::size_t(each.kind)] * normal, each.kind, each.location});
     }
 }
 

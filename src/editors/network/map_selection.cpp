@@ -79,7 +79,7 @@ std::optional<std::size_t> CMapSelection::Next(int step) const
                                       [this](const CPlacedLocation& each) { return each.location == m_selected; });
     const auto count = std::ssize(order);
     const std::ptrdiff_t from = present == order.end() ? (step > 0 ? -1 : count) : present - order.begin();
-    return order[static_cast<std::size_t>((from + step + count) % count)].location;
+    return order[std::size_t((from + step + count) % count)].location;
 }
 
 QString CMapSelection::Text() const

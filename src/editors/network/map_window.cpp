@@ -14,9 +14,9 @@ QString CNetworkMap::LocationText(const CMapLocation& location) const
 
 CLegend CNetworkMap::Legend() const
 {
-    CLegend legend{.elsewhere = static_cast<int>(Locations().size() - PlacedCount())};
+    CLegend legend{.elsewhere = int(Locations().size() - PlacedCount())};
     for (const CPlacedLocation& each : m_marks.Placed())
-        ++legend.counts.at(static_cast<std::size_t>(each.kind));
+        ++legend.counts.at(std::size_t(each.kind));
     return legend;
 }
 

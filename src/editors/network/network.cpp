@@ -23,7 +23,7 @@ int CNetwork::FindBranch(const QString& name) const
 {
     const auto found = std::find_if(branches.begin(), branches.end(),
                                     [&](const CNetworkBranch& each) { return KsSameBranch(each.name, name); });
-    return found == branches.end() ? -1 : static_cast<int>(found - branches.begin());
+    return found == branches.end() ? -1 : int(found - branches.begin());
 }
 
 QRectF CNetwork::Extent() const

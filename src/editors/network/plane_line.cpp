@@ -37,7 +37,7 @@ bool Meets(const QRectF& a, const QRectF& b)
 CPlaneLine::CPlaneLine(const std::vector<QPointF>& line, const CMapProjection& projection)
 {
     QPolygonF all;
-    all.reserve(static_cast<qsizetype>(line.size()));
+    all.reserve(qsizetype(line.size()));
     for (std::size_t i = 0; i < line.size(); ++i) {
         const QPointF at = projection.ToPlane(line[i]);
         if (i == 0 || i + 1 == line.size() || Distance(at, all.back()) >= Thin)
@@ -58,7 +58,7 @@ void CPlaneLine::Simplify(const QPolygonF& all)
         m_points = all;
         return;
     }
-    std::vector<bool> kept(static_cast<std::size_t>(all.size()), false);
+    std::vector<bool> kept(std::size_t(all.size()), false);
     kept.front() = kept.back() = true;
     std::vector<std::pair<qsizetype, qsizetype>> ranges{{0, all.size() - 1}};
     while (!ranges.empty()) {
@@ -76,12 +76,12 @@ void CPlaneLine::Simplify(const QPolygonF& all)
         }
         if (at < 0)
             continue;
-        kept[static_cast<std::size_t>(at)] = true;
+        kept[std::size_t(at)] = true;
         ranges.emplace_back(first, at);
         ranges.emplace_back(at, last);
     }
     for (qsizetype i = 0; i < all.size(); ++i) {
-        if (kept[static_cast<std::size_t>(i)])
+        if (kept[std::size_t(i)])
             m_points.append(all[i]);
     }
 }

@@ -125,7 +125,7 @@ void CNetworkView::Import(const QString& path)
     if (dialog.exec() != QDialog::Accepted)
         return;
     const QString report = ImportReport(dialog.Import(), Document()->Network());
-    const auto first = static_cast<int>(Document()->Network().branches.size());
+    const auto first = int(Document()->Network().branches.size());
     Document()->AppendBranches(dialog.Import().plan.branches, dialog.NetworkSystem(), tr("Import Branches"));
     m_branches->SetCurrentCell(first + 1, BranchName + 1);
     m_branches->Widths().MakeRoom();

@@ -179,7 +179,7 @@ void CKsMDIFrameWnd::ShowWindow(CKsMDIChildWnd* window)
     if (m_area->viewMode() == QMdiArea::SubWindowView) {
         // One behind the other, every title in sight.
         const int step = window->style()->pixelMetric(QStyle::PM_TitleBarHeight), places = 6;
-        const int place = static_cast<int>(m_area->subWindowList().size() - 1) % places;
+        const int place = int(m_area->subWindowList().size() - 1) % places;
         window->move(place * step, place * step);
     }
     m_area->setActiveSubWindow(window);

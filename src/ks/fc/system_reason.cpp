@@ -80,7 +80,7 @@ CString KsSystemReason(const QFileDevice& file)
     const CString text = file.errorString();
     CString phrase = text;
     for (const Reason& reason : reasons)
-        if (text == qt_error_string(static_cast<int>(reason.condition)))
+        if (text == qt_error_string(int(reason.condition)))
             phrase = Translated(reason.text);
     if (QuotaExceeded != 0 && text == qt_error_string(QuotaExceeded))
         phrase = QuotaText();
