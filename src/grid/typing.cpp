@@ -4,7 +4,6 @@
 #include "grid/column_spec.h"
 #include "grid/grid_texts.h"
 
-#include <QAccessible>
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QPointer>
@@ -14,16 +13,6 @@
 #include <algorithm>
 
 namespace {
-
-/// The name of a field as a user reads it.
-QString NameOf(QWidget& field)
-{
-    QAccessibleInterface* accessible = QAccessible::queryAccessibleInterface(&field);
-    QString name = accessible ? accessible->text(QAccessible::Name).remove(u'&').trimmed() : QString();
-    if (name.endsWith(u':'))
-        name.chop(1);
-    return name;
-}
 
 qsizetype CommonStart(const QString& a, const QString& b)
 {
@@ -152,7 +141,7 @@ bool CTyping::Take()
     const QScopedValueRollback telling(m_telling, true);
     const auto text = [](const std::function<QString()>& make) { return make ? make() : QString(); };
     TellRefusal(*m_field, complaint,
-                RefusalDetails(NameOf(*m_field), m_field->text(), text(m_what.allowed), text(m_what.unit)));
+                RefusalDetails(m_field->accessibleName(), m_field->text(), text(m_what.allowed), text(m_what.unit)));
     m_field->selectAll();
     return false;
 }

@@ -17,20 +17,17 @@ public:
         const auto isUniform = [&globals] { return globals.ResisZone != 1; };
         const auto unit = [&globals] { return ResistanceUnit(globals.resist_num); };
 
-        using G = HD_Global_Var;
         Bindings().Add(m_ui.formula_1300, globals.resist_num, [this](std::int32_t chosen) {
             StoreToDocument(); // what is typed is meant in the formula that stood there
             SwitchResistanceFormula(*GetDocument(), chosen, *m_ui.formula_1300);
         });
-        Bind({m_ui.uniform_1301, m_ui.zones_1302}, &G::ResisZone);
-        Bind(m_ui.resistance_1303, &G::G_resistance, {.unitText = unit, .unitLabel = m_ui.unit_1303});
-        Bind(m_ui.zone_1304, &G::ZoneResistance1, {.unitText = unit, .unitLabel = m_ui.unit_1304});
-        Bind(m_ui.zone_1305, &G::ZoneResistance2, {.unitText = unit, .unitLabel = m_ui.unit_1305});
-        Bind(m_ui.zone_1306, &G::ZoneResistance3, {.unitText = unit, .unitLabel = m_ui.unit_1306});
-        Bindings().EnableWhen(isUniform, {m_ui.resistanceLabel_1303, m_ui.resistance_1303, m_ui.unit_1303});
-        Bindings().EnableWhen(usesZones,
-                              {m_ui.zoneLabel_1304, m_ui.zone_1304, m_ui.unit_1304, m_ui.zoneLabel_1305, m_ui.zone_1305,
-                               m_ui.unit_1305, m_ui.zoneLabel_1306, m_ui.zone_1306, m_ui.unit_1306});
+        Bindings().Add({m_ui.uniform_1301, m_ui.zones_1302}, globals.ResisZone);
+        Bindings().Add(m_ui.resistance_1303, globals.G_resistance, {.unitText = unit});
+        Bindings().Add(m_ui.zone_1304, globals.ZoneResistance1, {.unitText = unit});
+        Bindings().Add(m_ui.zone_1305, globals.ZoneResistance2, {.unitText = unit});
+        Bindings().Add(m_ui.zone_1306, globals.ZoneResistance3, {.unitText = unit});
+        Bindings().EnableWhen(isUniform, {m_ui.resistance_1303});
+        Bindings().EnableWhen(usesZones, {m_ui.zone_1304, m_ui.zone_1305, m_ui.zone_1306});
 
         // The values of the approach not in use are kept.
         const auto column = [&](const double& global, bool ofZones) {
@@ -51,7 +48,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeBedPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CBedPage>(document);
-}
+const PageMaker MakeBedPage = &MakePage<CBedPage>;

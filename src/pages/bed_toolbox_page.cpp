@@ -19,9 +19,6 @@ class CBedToolboxPage : public CDialogPage<Ui::CBedToolboxPage, CLocationPage>
 {
 public:
     explicit CBedToolboxPage(CKavo0_hdDoc* document);
-
-protected:
-    void Retranslate() override;
 };
 
 CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document)
@@ -38,13 +35,11 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document)
     Bindings().EnableWhen([&tools] { return tools.Method != NotUsed; },
                           {m_ui.zonesLabel, m_ui.zone1_1311, m_ui.zone2_1312, m_ui.zone3_1313});
     Bindings().EnableWhen([uses] { return uses(Coefficients); },
-                          {m_ui.coefALabel, m_ui.coefA_1314, m_ui.coefBLabel, m_ui.coefB_1315, m_ui.minLabel,
-                           m_ui.minRes_1316, m_ui.unit_1316, m_ui.maxLabel, m_ui.maxRes_1317, m_ui.unit_1317,
-                           m_ui.formulaLabel});
+                          {m_ui.coefA_1314, m_ui.coefB_1315, m_ui.minRes_1316, m_ui.maxRes_1317, m_ui.formulaLabel});
     Bindings().Add(m_ui.coefA_1314, tools.CoefA);
     Bindings().Add(m_ui.coefB_1315, tools.CoefB);
-    Bindings().Add(m_ui.minRes_1316, tools.MinRes, {.unitText = unit, .unitLabel = m_ui.unit_1316});
-    Bindings().Add(m_ui.maxRes_1317, tools.MaxRes, {.unitText = unit, .unitLabel = m_ui.unit_1317});
+    Bindings().Add(m_ui.minRes_1316, tools.MinRes, {.unitText = unit});
+    Bindings().Add(m_ui.maxRes_1317, tools.MaxRes, {.unitText = unit});
 
     const auto lockUnless = [uses](Method method) { return [uses, method](const void*) { return !uses(method); }; };
     const auto coefficient = [&](const double& global) {
@@ -70,18 +65,9 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document)
     for (GridColumns pairs : {PairsGrid(m_ui.pairs_1318, tools.VeloRes), PairsGrid(m_ui.linePairs_1320, &R::VeloRes)})
         pairs.Value(&CBRTVeloRes::Velocity, {.locked = lockUnless(Table)})
             .Value(&CBRTVeloRes::ResValue, {.locked = lockUnless(Table), .unitText = unit});
-    m_ui.formulaLabel->setText(LoadString(Str::CoefFormula));
-}
-
-void CBedToolboxPage::Retranslate()
-{
-    CDialogPage::Retranslate();
-    m_ui.formulaLabel->setText(LoadString(Str::CoefFormula));
+    Bindings().Always([this] { m_ui.formulaLabel->setText(LoadString(Str::CoefFormula)); });
 }
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeBedToolboxPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CBedToolboxPage>(document);
-}
+const PageMaker MakeBedToolboxPage = &MakePage<CBedToolboxPage>;

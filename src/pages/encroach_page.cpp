@@ -74,7 +74,7 @@ private:
 
 CEncroachPage::CEncroachPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
 {
-    Bind(m_ui.maxIter_1340, &HD_Global_Var::Max_no_iter);
+    Bindings().Add(m_ui.maxIter_1340, Globals().Max_no_iter);
     Bindings().EnableWhen([this] { return HasSetup(); },
                           {m_ui.setupLabel, m_ui.setup_1341, m_ui.duplicate_1345, m_ui.delete_1346});
     Bindings().EnableWhen([this] { return m_current > 0; }, {m_ui.previous_1342});
@@ -214,7 +214,4 @@ void CEncroachPage::Reveal(const ChangePlace& place, bool focus)
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeEncroachPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CEncroachPage>(document);
-}
+const PageMaker MakeEncroachPage = &MakePage<CEncroachPage>;

@@ -11,7 +11,7 @@ class CFloodPage : public CDialogPage<Ui::CFloodPage, CLocationPage>
 public:
     explicit CFloodPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::FloodList)
     {
-        Bind(m_ui.resistance_1040, &HD_Global_Var::G_flood_plan_res, {});
+        Bindings().Add(m_ui.resistance_1040, Globals().G_flood_plan_res);
 
         Grid(m_ui.grid_1043)
             .BranchName({.width = 100})
@@ -22,7 +22,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeFloodPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CFloodPage>(document);
-}
+const PageMaker MakeFloodPage = &MakePage<CFloodPage>;

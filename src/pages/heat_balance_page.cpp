@@ -1,23 +1,22 @@
 // "Heat Balance": whether the heat balance is calculated, and its parameters.
 #include "pages/framework/dialog_page.h"
 #include "pages/page_table.h"
-#include "res/strings.h"
 #include "ui_heat_balance_page.h"
 
 namespace {
 
-class CHeatBalancePage : public CDialogPage<Ui::CHeatBalancePage, CGenPropertyPage>
+class CHeatBalancePage : public CDialogPage<Ui::CHeatBalancePage>
 {
 public:
     explicit CHeatBalancePage(CKavo0_hdDoc* document) : CDialogPage(document)
     {
         HDHeatBalance& heat = Globals().HeatBalance;
         Bindings().Add(m_ui.included_1148, heat.Calc);
-        Bindings().Add(m_ui.latitude_1149, heat.Latitude, {.unitLabel = m_ui.unit_1149});
-        Bindings().Add(m_ui.longitude_1150, heat.Longitude, {.unitLabel = m_ui.unit_1150});
-        Bindings().Add(m_ui.timeMeridian_1151, heat.TimeZone, {.unitLabel = m_ui.unit_1151});
-        Bindings().Add(m_ui.displacement_1152, heat.DisTime, {.unitLabel = m_ui.unit_1152});
-        Bindings().Add(m_ui.lightAttenuation_1153, heat.LightAtt, {.unitLabel = m_ui.unit_1153});
+        Bindings().Add(m_ui.latitude_1149, heat.Latitude);
+        Bindings().Add(m_ui.longitude_1150, heat.Longitude);
+        Bindings().Add(m_ui.timeMeridian_1151, heat.TimeZone);
+        Bindings().Add(m_ui.displacement_1152, heat.DisTime);
+        Bindings().Add(m_ui.lightAttenuation_1153, heat.LightAtt);
         Bindings().Add(m_ui.beer_1154, heat.betaBeer);
         Bindings().Add(m_ui.radiationA_1155, heat.RadA);
         Bindings().Add(m_ui.radiationB_1156, heat.RadB);
@@ -31,7 +30,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeHeatBalancePage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CHeatBalancePage>(document);
-}
+const PageMaker MakeHeatBalancePage = &MakePage<CHeatBalancePage>;

@@ -11,15 +11,13 @@ class CInitPage : public CDialogPage<Ui::CInitPage, CLocationPage>
 public:
     explicit CInitPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::InitList)
     {
-        auto& globals = Globals();
+        HD_Global_Var& globals = Globals();
         const auto isDepth = [&globals] { return globals.iLevelDepth == 1; };
-        const auto isLevel = [&globals] { return globals.iLevelDepth != 1; };
 
-        Bind({m_ui.level_1201, m_ui.depth_1202}, &HD_Global_Var::iLevelDepth);
-        Bind(m_ui.levelOrDepth_1001, &HD_Global_Var::G_waterlevel, {.unitLabel = m_ui.unit_1001});
-        Bind(m_ui.discharge_1002, &HD_Global_Var::G_discharge, {.unitLabel = m_ui.unit_1002});
-        Bindings().ShowWhen(isLevel, {m_ui.levelLabel_1203});
-        Bindings().ShowWhen(isDepth, {m_ui.depthLabel_1204});
+        Bindings().Add({m_ui.level_1201, m_ui.depth_1202}, globals.iLevelDepth);
+        Bindings().Add(m_ui.levelOrDepth_1001, globals.G_waterlevel,
+                       {.title = [isDepth] { return isDepth() ? Str::GlobalWaterDepth : Str::GlobalWaterLevel; }});
+        Bindings().Add(m_ui.discharge_1002, globals.G_discharge);
 
         Grid(m_ui.grid_1003)
             .BranchName({.width = 71})
@@ -34,7 +32,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeInitPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CInitPage>(document);
-}
+const PageMaker MakeInitPage = &MakePage<CInitPage>;

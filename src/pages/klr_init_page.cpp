@@ -13,10 +13,10 @@ public:
     {
         // Eight digits: millimetres and litres also of large levels and discharges.
         HDKlrInitial& klr = Globals().KlrInit;
-        Bindings().Add(m_ui.waterLevel_1183, klr.h1, {.unitLabel = m_ui.unit_1183});
-        Bindings().Add(m_ui.interfaceLevel_1184, klr.h0, {.unitLabel = m_ui.unit_1184});
-        Bindings().Add(m_ui.topDischarge_1185, klr.Q1, {.unitLabel = m_ui.unit_1185});
-        Bindings().Add(m_ui.bottomDischarge_1161, klr.Q0, {.unitLabel = m_ui.unit_1161});
+        Bindings().Add(m_ui.waterLevel_1183, klr.h1);
+        Bindings().Add(m_ui.interfaceLevel_1184, klr.h0);
+        Bindings().Add(m_ui.topDischarge_1185, klr.Q1);
+        Bindings().Add(m_ui.bottomDischarge_1161, klr.Q0);
 
         Grid(m_ui.grid_1186)
             .BranchName({.width = 100})
@@ -30,7 +30,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeKlrInitPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CKlrInitPage>(document);
-}
+const PageMaker MakeKlrInitPage = &MakePage<CKlrInitPage>;

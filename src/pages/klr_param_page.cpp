@@ -13,9 +13,9 @@ public:
     {
         HDKlrConstants& klr = Globals().Klr;
         Bindings().Add(m_ui.frictionFactor_1006, klr.fricfac);
-        Bindings().Add(m_ui.maxVolume_1153, klr.maxvol, {.unitLabel = m_ui.unit_1153});
-        Bindings().Add(m_ui.maxVelocity_1154, klr.maxvelo, {.unitLabel = m_ui.unit_1154});
-        Bindings().Add(m_ui.minThickness_1155, klr.minthick, {.unitLabel = m_ui.unit_1155});
+        Bindings().Add(m_ui.maxVolume_1153, klr.maxvol);
+        Bindings().Add(m_ui.maxVelocity_1154, klr.maxvelo);
+        Bindings().Add(m_ui.minThickness_1155, klr.minthick);
         Bindings().Add(m_ui.densityDifference_1156, klr.densdiff);
         Bindings().Add(m_ui.action_1182, klr.action);
         Bindings().Add(m_ui.upward_1157, klr.R1);
@@ -32,7 +32,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeKlrParamPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CKlrParamPage>(document);
-}
+const PageMaker MakeKlrParamPage = &MakePage<CKlrParamPage>;

@@ -27,7 +27,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeLeakagePage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CLeakagePage>(document);
-}
+const PageMaker MakeLeakagePage = &MakePage<CLeakagePage>;

@@ -1,26 +1,11 @@
 #include "pages/load_option_dlg.h"
 
-#include "ks/fc/message_box.h"
 #include "document/document.h"
+#include "ks/fc/message_box.h"
 #include "pages/framework/page.h"
 #include "pages/location_loader.h"
 #include "res/strings.h"
 #include "ui_load_option_dlg.h"
-
-CEditorsLoadOptionDlg::CEditorsLoadOptionDlg(QWidget* parent)
-    : QDialog(parent), m_ui(std::make_unique<Ui::CEditorsLoadOptionDlg>())
-{
-    m_ui->setupUi(this);
-    m_ui->branch_1105->setChecked(true);
-}
-
-CEditorsLoadOptionDlg::~CEditorsLoadOptionDlg() = default;
-
-void CEditorsLoadOptionDlg::accept()
-{
-    m_option = m_ui->width_1107->isChecked() ? 2 : m_ui->radius_1106->isChecked() ? 1 : 0;
-    QDialog::accept();
-}
 
 void AskForLocations(CGenPropertyPage& page)
 {
@@ -29,16 +14,20 @@ void AskForLocations(CGenPropertyPage& page)
         KsMessageBox(LoadString(Str::LoadNeedsProject), QMessageBox::Ok, &page);
         return;
     }
-    CEditorsLoadOptionDlg dialog(&page);
+    QDialog dialog(&page);
+    Ui::CEditorsLoadOptionDlg ui;
+    ui.setupUi(&dialog);
+    ui.branch_1105->setChecked(true);
     if (dialog.exec() != QDialog::Accepted)
         return;
-    const WPARAM request = dialog.Option() == 0 ? KsRequest::LoadLocations : KsRequest::LoadLocationsAndChannel;
+    const bool withWidth = ui.width_1107->isChecked(), withRadius = withWidth || ui.radius_1106->isChecked();
+    const WPARAM request = withRadius ? KsRequest::LoadLocationsAndChannel : KsRequest::LoadLocations;
     CObList places;
     if (!document.AskProject(request, page.GetHost() ? page.GetHost()->HostView() : nullptr, &places)) {
         KsMessageBox(LoadString(Str::LoadNoAnswer), QMessageBox::Ok, &page);
         return;
     }
-    const LoadedLocations loaded = LoadLocations(page, places, {dialog.Option() >= 1, dialog.Option() == 2});
+    const LoadedLocations loaded = LoadLocations(page, places, {withRadius, withWidth});
     document.Say(loaded.changed
                      ? LoadString(Str::LocationsLoadedChanged).arg(loaded.added).arg(loaded.known).arg(loaded.changed)
                      : LoadString(Str::LocationsLoaded).arg(loaded.added).arg(loaded.known));

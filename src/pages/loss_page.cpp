@@ -22,7 +22,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeLossPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CLossPage>(document);
-}
+const PageMaker MakeLossPage = &MakePage<CLossPage>;

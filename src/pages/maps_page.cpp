@@ -60,8 +60,7 @@ CMapsPage::CMapsPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
     Bindings().EnableWhen(writesMaps, {m_ui.groundElevation_1239});
     Bindings().EnableWhen(usesDem, {m_ui.riverXsec_1237, m_ui.geoDb_1240});
     Bindings().ShowWhen(usesDem, {m_ui.dem_1227});
-    Bindings().EnableWhen([usesDem, &maps] { return usesDem() && maps.MapAreaGeoDb; },
-                          {m_ui.helpGridLabel_1243, m_ui.helpGrid_1241});
+    Bindings().EnableWhen([usesDem, &maps] { return usesDem() && maps.MapAreaGeoDb; }, {m_ui.helpGrid_1241});
 
     m_ui.maps_1226->SetLineChoice(LineChoice::CurrentLine);
     m_ui.dem_1227->SetLineChoice(LineChoice::CurrentLine);
@@ -127,7 +126,4 @@ void CMapsPage::ButtonClicked(CGenGrid& grid, int row, int /*column*/)
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeMapsPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CMapsPage>(document);
-}
+const PageMaker MakeMapsPage = &MakePage<CMapsPage>;

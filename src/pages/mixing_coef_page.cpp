@@ -38,7 +38,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeMixingCoefPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CMixingCoefPage>(document);
-}
+const PageMaker MakeMixingCoefPage = &MakePage<CMixingCoefPage>;

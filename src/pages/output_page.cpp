@@ -5,79 +5,38 @@
 
 namespace {
 
-using Boxes = Ui::COutputPage;
-constexpr struct
-{
-    QCheckBox* Ui_COutputPage::*box;
-    bool HDAddOutput::*flag;
-} Flags[] = {
-    {&Boxes::velocity_1037, &HDAddOutput::Velo_H},
-    {&Boxes::velocityStructures_1056, &HDAddOutput::Velo_struc},
-    {&Boxes::discharge_1039, &HDAddOutput::Discharge_H},
-    {&Boxes::crossSectionArea_1042, &HDAddOutput::CrossSec_H},
-    {&Boxes::flowWidth_1044, &HDAddOutput::FlowWidth_H},
-    {&Boxes::radius_1046, &HDAddOutput::Radius_H},
-    {&Boxes::resistance_1047, &HDAddOutput::Resistance_H},
-    {&Boxes::conveyance_1048, &HDAddOutput::Conveyance_H},
-    {&Boxes::froudeNumber_1049, &HDAddOutput::FroudeNum_H},
-    {&Boxes::volume_1055, &HDAddOutput::Volume_H},
-    {&Boxes::volumeTotal_1057, &HDAddOutput::Volume_Total},
-    {&Boxes::floodArea_1050, &HDAddOutput::FloodArea_H},
-    {&Boxes::floodAreaTotal_1054, &HDAddOutput::FloodArea_Total},
-    {&Boxes::massError_1051, &HDAddOutput::MassError_H},
-    {&Boxes::massErrorTotal_1053, &HDAddOutput::MassError_Total},
-    {&Boxes::accumulatedMassError_1052, &HDAddOutput::AcumMassError_Total},
-    {&Boxes::lateralInflows_1180, &HDAddOutput::LatInflows_H},
-    {&Boxes::waterLevelSlope_1181, &HDAddOutput::WaterSlope},
-    {&Boxes::energyLevelSlope_1182, &HDAddOutput::EnergySlope},
-    {&Boxes::energyLevel_1183, &HDAddOutput::EnergyLevel},
-    {&Boxes::bedShearStress_1184, &HDAddOutput::BedShearStress},
-    {&Boxes::groundwaterHead_1228, &HDAddOutput::GroundwaterHead},
-    {&Boxes::timeStep_1200, &HDAddOutput::TimeStep},
-};
-
-class COutputPage : public CDialogPage<Ui::COutputPage, CGenPropertyPage>
+class COutputPage : public CDialogPage<Ui::COutputPage>
 {
 public:
-    explicit COutputPage(CKavo0_hdDoc* document);
-
-protected:
-    void Retranslate() override;
-
-private:
-    void NameBoxes();
-};
-
-COutputPage::COutputPage(CKavo0_hdDoc* document) : CDialogPage(document)
-{
-    for (const auto& [box, flag] : Flags)
-        Bindings().Add(m_ui.*box, Globals().AddOutput.*flag);
-    NameBoxes();
-}
-
-void COutputPage::NameBoxes()
-{
-    // A box has no text of its own; its row and its column say what it is.
-    const QGridLayout& cells = *m_ui.matrixLayout;
-    const auto textAt = [&cells](int row, int column) {
-        return qobject_cast<const QLabel*>(cells.itemAtPosition(row, column)->widget())->text();
-    };
-    for (const auto& [box, flag] : Flags) {
-        int row = 0, column = 0, rows = 0, columns = 0;
-        cells.getItemPosition(cells.indexOf(m_ui.*box), &row, &column, &rows, &columns);
-        (m_ui.*box)->setAccessibleName(textAt(row, 0) + ", " + textAt(0, column));
+    explicit COutputPage(CKavo0_hdDoc* document) : CDialogPage(document)
+    {
+        HDAddOutput& output = Globals().AddOutput;
+        Bindings().Add(m_ui.velocity_1037, output.Velo_H);
+        Bindings().Add(m_ui.velocityStructures_1056, output.Velo_struc);
+        Bindings().Add(m_ui.discharge_1039, output.Discharge_H);
+        Bindings().Add(m_ui.crossSectionArea_1042, output.CrossSec_H);
+        Bindings().Add(m_ui.flowWidth_1044, output.FlowWidth_H);
+        Bindings().Add(m_ui.radius_1046, output.Radius_H);
+        Bindings().Add(m_ui.resistance_1047, output.Resistance_H);
+        Bindings().Add(m_ui.conveyance_1048, output.Conveyance_H);
+        Bindings().Add(m_ui.froudeNumber_1049, output.FroudeNum_H);
+        Bindings().Add(m_ui.volume_1055, output.Volume_H);
+        Bindings().Add(m_ui.volumeTotal_1057, output.Volume_Total);
+        Bindings().Add(m_ui.floodArea_1050, output.FloodArea_H);
+        Bindings().Add(m_ui.floodAreaTotal_1054, output.FloodArea_Total);
+        Bindings().Add(m_ui.massError_1051, output.MassError_H);
+        Bindings().Add(m_ui.massErrorTotal_1053, output.MassError_Total);
+        Bindings().Add(m_ui.accumulatedMassError_1052, output.AcumMassError_Total);
+        Bindings().Add(m_ui.lateralInflows_1180, output.LatInflows_H);
+        Bindings().Add(m_ui.waterLevelSlope_1181, output.WaterSlope);
+        Bindings().Add(m_ui.energyLevelSlope_1182, output.EnergySlope);
+        Bindings().Add(m_ui.energyLevel_1183, output.EnergyLevel);
+        Bindings().Add(m_ui.bedShearStress_1184, output.BedShearStress);
+        Bindings().Add(m_ui.groundwaterHead_1228, output.GroundwaterHead);
+        Bindings().Add(m_ui.timeStep_1200, output.TimeStep);
     }
-}
-
-void COutputPage::Retranslate()
-{
-    CDialogPage::Retranslate();
-    NameBoxes();
-}
+};
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeOutputPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<COutputPage>(document);
-}
+const PageMaker MakeOutputPage = &MakePage<COutputPage>;

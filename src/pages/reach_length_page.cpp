@@ -12,7 +12,7 @@ class CReachLengthPage : public CDialogPage<Ui::CReachLengthPage, CLocationPage>
 public:
     explicit CReachLengthPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::QSSReachLengthsList)
     {
-        Bind(m_ui.energyEquation_1187, &HD_Global_Var::EnergyEquation);
+        Bindings().Add(m_ui.energyEquation_1187, Globals().EnergyEquation);
         const auto usesEnergy = [this] { return Globals().EnergyEquation; };
         Bindings().ShowWhen(usesEnergy, {m_ui.loadBranches_1104, m_ui.grid_1186});
         connect(m_ui.loadBranches_1104, &QPushButton::clicked, this, [this] { AskForLocations(*this); });
@@ -27,7 +27,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeReachLengthPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CReachLengthPage>(document);
-}
+const PageMaker MakeReachLengthPage = &MakePage<CReachLengthPage>;

@@ -1,12 +1,11 @@
 // "Stratification": layers, densities, turbulence models and reductions of stratified flow.
 #include "pages/framework/dialog_page.h"
 #include "pages/page_table.h"
-#include "res/strings.h"
 #include "ui_stratification_page.h"
 
 namespace {
 
-class CStratificationPage : public CDialogPage<Ui::CStratificationPage, CGenPropertyPage>
+class CStratificationPage : public CDialogPage<Ui::CStratificationPage>
 {
 public:
     explicit CStratificationPage(CKavo0_hdDoc* document) : CDialogPage(document)
@@ -14,7 +13,7 @@ public:
         HDStratification& flow = Globals().Stratification;
         Bindings().Add(m_ui.layers_1175, flow.npv);
         Bindings().Add(m_ui.densities_1148, flow.dens);
-        Bindings().Add(m_ui.viscosity_1176, flow.visc, {.unitLabel = m_ui.unit_1176});
+        Bindings().Add(m_ui.viscosity_1176, flow.visc);
         Bindings().Add(m_ui.fluidModel_1177, flow.vmf);
         Bindings().Add(m_ui.bedModel_1178, flow.vmb);
         Bindings().Add(m_ui.richardson_1179, flow.Rich);
@@ -31,7 +30,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeStratificationPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CStratificationPage>(document);
-}
+const PageMaker MakeStratificationPage = &MakePage<CStratificationPage>;

@@ -29,8 +29,7 @@ CTextOutputPage::CTextOutputPage(CKavo0_hdDoc* document) : CDialogPage(document,
     Bindings().Add(m_ui.limited_1221, output.LimitedPeriod);
     Bindings().Add(m_ui.start_1223, output.LimitedPeriodStart);
     Bindings().Add(m_ui.end_1225, output.LimitedPeriodEnd);
-    Bindings().EnableWhen([&output] { return output.LimitedPeriod; },
-                          {m_ui.startLabel_1222, m_ui.start_1223, m_ui.endLabel_1224, m_ui.end_1225});
+    Bindings().EnableWhen([&output] { return output.LimitedPeriod; }, {m_ui.start_1223, m_ui.end_1225});
     Bindings().Add({m_ui.all_1218, m_ui.only_1219, m_ui.except_1220}, output.GridPointOutputType);
 
     for (CGenGrid* grid : {m_ui.grid_1217, m_ui.items_1216, m_ui.files_1226})
@@ -67,7 +66,4 @@ void CTextOutputPage::ButtonClicked(CGenGrid& grid, int row, int /*column*/)
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeTextOutputPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CTextOutputPage>(document);
-}
+const PageMaker MakeTextOutputPage = &MakePage<CTextOutputPage>;

@@ -13,7 +13,7 @@ class CWavePage : public CDialogPage<Ui::CWavePage, CLocationPage>
 public:
     explicit CWavePage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::WaveList)
     {
-        Bind(m_ui.wave_1010, &HD_Global_Var::G_wave);
+        Bindings().Add(m_ui.wave_1010, Globals().G_wave);
         Grid(m_ui.grid_1011)
             .BranchName({.width = 110})
             .Chainage({.caption = Str::UpstreamChainage})
@@ -25,7 +25,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeWavePage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CWavePage>(document);
-}
+const PageMaker MakeWavePage = &MakePage<CWavePage>;

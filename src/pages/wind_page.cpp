@@ -11,9 +11,9 @@ class CWindPage : public CDialogPage<Ui::CWindPage, CLocationPage>
 public:
     explicit CWindPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::WindList)
     {
-        Bind(m_ui.includeWind_1159, &HD_Global_Var::wind_shear_stress);
-        Bind(m_ui.topographical_1004, &HD_Global_Var::G_wind_factor, {});
-        Bind(m_ui.friction_1006, &HD_Global_Var::G_friction_factor, {});
+        Bindings().Add(m_ui.includeWind_1159, Globals().wind_shear_stress);
+        Bindings().Add(m_ui.topographical_1004, Globals().G_wind_factor);
+        Bindings().Add(m_ui.friction_1006, Globals().G_friction_factor);
 
         Grid(m_ui.grid_1005)
             .BranchName({.width = 80})
@@ -24,7 +24,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeWindPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CWindPage>(document);
-}
+const PageMaker MakeWindPage = &MakePage<CWindPage>;

@@ -62,7 +62,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeWLCurvePage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CWLCurvePage>(document);
-}
+const PageMaker MakeWLCurvePage = &MakePage<CWLCurvePage>;

@@ -155,7 +155,4 @@ void CWLMarkPage::DeleteLines()
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeWLMarkPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CWLMarkPage>(document);
-}
+const PageMaker MakeWLMarkPage = &MakePage<CWLMarkPage>;

@@ -43,7 +43,4 @@ public:
 
 } // namespace
 
-std::unique_ptr<CGenPropertyPage> MakeWLSandBarsPage(CKavo0_hdDoc* document)
-{
-    return std::make_unique<CWLSandBarsPage>(document);
-}
+const PageMaker MakeWLSandBarsPage = &MakePage<CWLSandBarsPage>;

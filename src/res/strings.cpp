@@ -32,6 +32,11 @@ QString LoadString(Str id)
     return LoadString(int(id));
 }
 
+QString LoadLine(Str id, int line)
+{
+    return line < 0 ? LoadString(id) : LoadString(id).split(u'\n').value(line);
+}
+
 QString LoadCounted(std::size_t count, Str one, Str many)
 {
     return count == 1 ? LoadString(one) : LoadString(many).arg(count);

@@ -35,11 +35,22 @@ std::string Values(const Field& field)
     std::istringstream entries(EnglishText(field.choices));
     std::int32_t index = field.firstChoice;
     for (std::string entry; std::getline(entries, entry); ++index) {
+        entry = PlainText(entry);
         const bool isNumbered = entry.starts_with(std::to_string(index) + ' ');
         known += (known.empty() ? "" : ", ") +
                  (isNumbered || field.kind == FieldKind::Text ? entry : std::to_string(index) + ' ' + entry);
     }
     return known.empty() ? "" : " (" + known + ')';
+}
+
+/// " "Delta"": what the value is called on its page.
+std::string Title(const Field& field)
+{
+    std::istringstream lines(EnglishText(field.title.text));
+    std::string title;
+    for (int line = std::max(field.title.line, 0); line >= 0; --line)
+        std::getline(lines, title);
+    return title.empty() ? "" : " \"" + PlainText(title) + '"';
 }
 
 std::string Described(FieldList fields, std::string_view keyword);
@@ -54,7 +65,7 @@ std::string Described(const Field& field, std::string_view keyword)
     std::string text = kinds[int(field.kind)];
     if (field.name != keyword)
         text += ' ' + std::string(field.name);
-    return text + (field.optionalTail ? "?" : "") + Values(field);
+    return text + (field.optionalTail ? "?" : "") + Title(field) + Values(field);
 }
 
 std::string Described(FieldList fields, std::string_view keyword)

@@ -242,7 +242,7 @@ TEST_F(ExchangeClientTest, LocationsAreLoadedIntoThePage)
     ASSERT_TRUE(view->Sheet()->SetActivePage(tab));
     const auto load = [&](const char* option) {
         QTimer::singleShot(0, view, [option] {
-            auto* dialog = qobject_cast<CEditorsLoadOptionDlg*>(QApplication::activeModalWidget());
+            auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
             ASSERT_NE(dialog, nullptr);
             if (option)
                 dialog->findChild<QRadioButton*>(option)->setChecked(true);

@@ -4,6 +4,8 @@
 #include "pages/framework/ctrl_edit.h"
 
 #include <QCheckBox>
+#include <QGridLayout>
+#include <QLabel>
 #include <QRadioButton>
 
 class BoundPage : public CGenPropertyPage
@@ -11,15 +13,16 @@ class BoundPage : public CGenPropertyPage
 public:
     explicit BoundPage(CKavo0_hdDoc* doc) : CGenPropertyPage(doc)
     {
-        list.addItems({"none", "one", "two"});
-        auto* column = new QVBoxLayout(this);
+        auto* cells = new QGridLayout(this);
+        int row = 0;
         for (QWidget* widget : std::initializer_list<QWidget*>{&box, &integer, &list, &level, &depth, &number, &hidden})
-            column->addWidget(widget);
-        Bind(&box, &HD_Global_Var::wind_shear_stress);
-        Bind(&integer, &HD_Global_Var::no_iter);
-        Bind(&list, &HD_Global_Var::G_wave);
-        Bind({&level, &depth}, &HD_Global_Var::iLevelDepth);
-        Bind(&number, &HD_Global_Var::zeta_min);
+            cells->addWidget(widget, row++, 1);
+        HD_Global_Var& globals = Globals();
+        Bindings().Add(&box, globals.wind_shear_stress);
+        Bindings().Add(&integer, globals.no_iter);
+        Bindings().Add(&list, globals.G_wave);
+        Bindings().Add({&level, &depth}, globals.iLevelDepth);
+        Bindings().Add(&number, globals.delh);
         Bindings().EnableWhen([this] { return box.isChecked(); }, {&number});
         Bindings().ShowWhen([this] { return Globals().iLevelDepth == 1; }, {&hidden});
     }
@@ -61,6 +64,32 @@ TEST_F(BindingTest, ControlsFollowValuesAndBack)
     EXPECT_EQ(page.list.currentIndex(), globals.G_wave);
 }
 
+TEST_F(BindingTest, ControlsAreCalledAsTheirValuesAreDeclared)
+{
+    auto& page = Open<BoundPage>();
+    EXPECT_EQ(page.box.text(), "&Include wind");
+    EXPECT_EQ(page.level.text() + '|' + page.depth.text(), "Wa&ter Level|Water &Depth");
+    EXPECT_EQ(page.list.itemText(3), "Kinematic Wave");
+    const auto beside = [&page](const QWidget& widget, int column) {
+        auto& cells = static_cast<QGridLayout&>(*page.layout());
+        int row = 0, at = 0, rows = 0, columns = 0;
+        cells.getItemPosition(cells.indexOf(&widget), &row, &at, &rows, &columns);
+        auto* item = cells.itemAtPosition(row, column);
+        return item ? qobject_cast<QLabel*>(item->widget()) : nullptr;
+    };
+    ASSERT_TRUE(beside(page.number, 0) && beside(page.number, 2));
+    EXPECT_EQ(beside(page.number, 0)->buddy(), &page.number);
+    EXPECT_EQ(beside(page.number, 0)->text(), "&Delh:");
+    EXPECT_EQ(page.number.accessibleName(), "Delh");
+    EXPECT_EQ(beside(page.number, 2)->text(), "m");
+    EXPECT_EQ(beside(page.integer, 2), nullptr) << "no unit";
+    for (int column : {0, 2})
+        EXPECT_EQ(beside(page.number, column)->isEnabled(), page.box.isChecked()) << "with its field";
+    page.box.click();
+    for (int column : {0, 2})
+        EXPECT_EQ(beside(page.number, column)->isEnabled(), page.box.isChecked());
+}
+
 TEST_F(BindingTest, TheWheelTurnsOnlyTheListThatHasTheFocus)
 {
     auto& page = Open<BoundPage>();
@@ -86,12 +115,12 @@ TEST_F(BindingTest, UnknownNumbersAreKept)
     EXPECT_EQ(page.list.currentText(), "17");
     EXPECT_FALSE(page.level.isChecked() || page.depth.isChecked());
     page.StoreToDocument();
-    emit page.list.activated(3);
+    emit page.list.activated(4);
     EXPECT_EQ(globals.G_wave, 17);
     EXPECT_EQ(globals.iLevelDepth, 5);
     emit page.list.activated(1);
-    EXPECT_EQ(page.list.count(), 3) << "the number is gone once another entry is chosen";
-    EXPECT_EQ(page.list.currentText(), "one");
+    EXPECT_EQ(page.list.count(), 4) << "the number is gone once another entry is chosen";
+    EXPECT_EQ(page.list.currentText(), "Fully Dynamic");
     EXPECT_EQ(document.UndoStack().count(), 1);
 }
 
@@ -131,7 +160,7 @@ TEST_F(BindingTest, EscapeAndDisablingTakeBackWhatWasTyped)
     EXPECT_EQ(page.integer.text(), integer);
     page.number.setFocus();
     page.number.selectAll();
-    QTest::keyClicks(&page.number, "-7"); // below its minimum
+    QTest::keyClicks(&page.number, "7e"); // no number
     page.box.setFocus(Qt::MouseFocusReason);
     page.box.click();
     QTest::qWait(1);

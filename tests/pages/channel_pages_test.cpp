@@ -31,18 +31,18 @@ protected:
 TEST_F(ChannelPagesTest, ControlsChangeTheirKeywords)
 {
     globals.G_wave = 3;
-    Open(&MakeWavePage);
+    Open(MakeWavePage);
     EachChangesItsKeyword({{1010, "up", "G_wave = 2"}});
     globals.resist_num = 3; // unknown, so there is nothing to ask
-    Open(&MakeBedPage);
+    Open(MakeBedPage);
     EachChangesItsKeyword({{1300, "up", "resist_num = 2"}, {1303, "32.5", "G_resistance = 32.5"}});
     globals.ResisZone = 1;
-    Open(&MakeBedPage);
+    Open(MakeBedPage);
     EachChangesItsKeyword({{1304, "35", "ResisZone = 1, 35, 25, 20"},
                            {1305, "0.03", "ResisZone = 1, 35, 0.03, 20"},
                            {1306, "15", "ResisZone = 1, 35, 0.03, 15"}});
     globals.BedResist.Method = 2;
-    Open(&MakeBedToolboxPage);
+    Open(MakeBedToolboxPage);
     EachChangesItsKeyword({{1310, "up", "BRTools = 1, false, false, false, 0, 0, 0, 0, 0"},
                            {1311, " ", "BRTools = 1, true, false, false, 0, 0, 0, 0, 0"},
                            {1312, " ", "BRTools = 1, true, true, false, 0, 0, 0, 0, 0"},
@@ -51,13 +51,13 @@ TEST_F(ChannelPagesTest, ControlsChangeTheirKeywords)
                            {1315, "-2", "BRTools = 1, true, true, true, 0, 1.5, -2, 0, 0"},
                            {1316, "3", "BRTools = 1, true, true, true, 0, 1.5, -2, 3, 0"},
                            {1317, "44", "BRTools = 1, true, true, true, 0, 1.5, -2, 3, 44"}});
-    Open(&MakeMixingCoefPage);
+    Open(MakeMixingCoefPage);
     EachChangesItsKeyword({{1330, "0.5", "MixingCoef = 0, 0.5, 0.04, 0.1, 0.03"},
                            {1331, "0.25", "MixingCoef = 0, 0.5, 0.25, 0.1, 0.03"},
                            {1332, "0.125", "MixingCoef = 0, 0.5, 0.25, 0.125, 0.03"},
                            {1333, "2", "MixingCoef = 0, 0.5, 0.25, 0.125, 2"}});
     globals.FrictionSlope = 3;
-    Open(&MakeQuasiPage);
+    Open(MakeQuasiPage);
     EachChangesItsKeyword({{1024, "0.75", "relax = 0.75"},
                            {1028, "1e-09", "beta_limit = 1e-09"},
                            {1030, "3", "fac_0 = 3"},
@@ -74,25 +74,25 @@ TEST_F(ChannelPagesTest, ControlsChangeTheirKeywords)
                            {1194, "up", "EnergyEquation = true, 2"},
                            {1042, "0.25", "G_ContractExpansion = 0.25, 0.3"},
                            {1043, "0.5", "G_ContractExpansion = 0.25, 0.5"}});
-    Open(&MakeEncroachPage);
+    Open(MakeEncroachPage);
     EachChangesItsKeyword({{1340, "7", "Max_no_iter = 7"}});
 }
 
 TEST_F(ChannelPagesTest, Columns)
 {
     const auto show = [this] { return Headers().join('|') + " / " + Texts(1); };
-    Open(&MakeWavePage);
+    Open(MakeWavePage);
     EXPECT_EQ(show(), "River Name|UpStr. Chainage|DnStr. Chainage|Approx. / |||Fully Dynamic");
-    Open(&MakeBedPage);
+    Open(MakeBedPage);
     EXPECT_EQ(show(), "River Name|Chainage|Resistance|Zone 1|Zone 2|Zone 3 / ||30|30|25|20");
     globals.G_Expansion = 0.5;
     globals.EnergyEquation = true;
-    Open(&MakeQuasiPage);
+    Open(MakeQuasiPage);
     EXPECT_EQ(show(), "River Name|Chainage|Contraction|Expansion / ||0.100|0.500");
-    Open(&MakeMixingCoefPage);
+    Open(MakeMixingCoefPage);
     EXPECT_EQ(show(), "River Name|Chainage|f1|f2|f3|f4 / ||0.17|0.04|0.1|0.03");
     globals.BedResist.MaxRes = 42;
-    Open(&MakeBedToolboxPage);
+    Open(MakeBedToolboxPage);
     EXPECT_EQ(show(), "River Name|Chainage|Coef. a|Coef. b|Minimum|Maximum / ||0|0|0|42");
     EXPECT_FALSE(document.IsModified()) << "a line that stands for an empty table is no change";
 }
@@ -102,7 +102,7 @@ TEST_F(ChannelPagesTest, ApproximationsAreChosenFromAList)
     auto& list = document.Parameters().WaveList;
     AddTo(list, "A", 100).WaveApproximation = 9;
     AddTo(list, "B", 200).DownstreamChainage = 300;
-    Open(&MakeWavePage);
+    Open(MakeWavePage);
     EXPECT_EQ(Texts(1), "A|100|0|9") << "an index without entry shows as its number";
     EXPECT_EQ(Texts(2), "B|200|300|High Order Fully Dynamic");
     grid->setFocus();
@@ -148,7 +148,7 @@ TEST_F(ChannelPagesTest, ResistanceApproachAndFormula)
     AddTo(document.Parameters().BedList, "A", 1).Resistance = 33;
     globals.ResisZone = 7;
     globals.resist_num = 5;
-    Open(&MakeBedPage);
+    Open(MakeBedPage);
     auto* formula = Find<QComboBox>(1300);
     auto *uniform = Find<QRadioButton>(1301), *zones = Find<QRadioButton>(1302);
     EXPECT_EQ(formula->currentText(), "5") << "kept, though nobody knows it";
@@ -205,11 +205,11 @@ TEST_F(ChannelPagesTest, EnergyEquationEnablesItsOptions)
 {
     AddTo(document.Parameters().QSSContractionExpansionList, "A", 1);
     globals.FrictionSlope = 3;
-    Open(&MakeQuasiPage);
+    Open(MakeQuasiPage);
     const auto expectUsed = [&](bool used) {
         for (int number : {1188, 1189, 1190, 1191, 1194, 1042, 1043, 1104})
             EXPECT_EQ(Find(number)->isEnabled(), used) << number;
-        for (const char* label : {"frictionSlopeLabel_1193", "contractionLabel_1198", "expansionLabel_1199"})
+        for (const char* label : {"label_1194", "label_1042", "label_1043"})
             EXPECT_EQ(view->page->findChild<QLabel*>(label)->isEnabled(), used) << label;
         EXPECT_EQ(grid->isVisible(), used);
         for (int number : {1024, 1028, 1030, 1032, 1034, 1036, 1038, 1041, 1187})
@@ -247,7 +247,7 @@ struct ProjectShell : CKsWindow
 TEST_F(ChannelPagesTest, LoadingLocationsSaysWhyItCannot)
 {
     globals.EnergyEquation = true;
-    Open(&MakeQuasiPage);
+    Open(MakeQuasiPage);
     Find<QAbstractButton>(1104)->click();
     ASSERT_EQ(boxes.size(), 1);
     EXPECT_TRUE(boxes[0].contains("belongs to no project"));
@@ -263,7 +263,7 @@ TEST_F(ChannelPagesTest, LoadingLocationsSaysWhyItCannot)
         boxes.clear();
         shell.requests.clear();
         QTimer::singleShot(0, [&] {
-            auto* dialog = qobject_cast<CEditorsLoadOptionDlg*>(QApplication::activeModalWidget());
+            auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
             ASSERT_TRUE(dialog);
             EXPECT_EQ(dialog->windowTitle(), "Load Branch and Chainage");
             EXPECT_TRUE(dialog->findChild<QRadioButton*>("branch_1105")->isChecked());

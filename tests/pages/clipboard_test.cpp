@@ -33,7 +33,7 @@ protected:
     {
         Add("A", 1.25, 0.1, 20);
         Add("B", NotGiven, 11, 21);
-        Open(&MakeInitPage);
+        Open(MakeInitPage);
         grid->setFocus();
     }
     void Select(int top, int left, int bottom, int right)

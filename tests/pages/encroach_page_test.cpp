@@ -58,7 +58,7 @@ TEST_F(EncroachPageTest, EveryFieldHasItsColumn)
         line.EncValues1[i] = i;
         line.EncValues2[i] = 10 + i;
     }
-    Open(&MakeEncroachPage);
+    Open(MakeEncroachPage);
     EXPECT_EQ(Headers().join('|'), "River Name|Chainage|Method|Banks|Left offset|Right offset|Left position|"
                                    "Right position|Width|Reduction|Total reduction|Left reduction|Right reduction|"
                                    "Target level|Target energy");
@@ -80,7 +80,7 @@ TEST_F(EncroachPageTest, TheMethodLocksWhatItDoesNotUse)
 {
     AddSetup({"A", "B"});
     HDEncroach& line = setups.GetAt(0).GetAt(0);
-    Open(&MakeEncroachPage);
+    Open(MakeEncroachPage);
     const struct
     {
         int method, reduction;
@@ -106,7 +106,7 @@ TEST_F(EncroachPageTest, TheMethodLocksWhatItDoesNotUse)
 
 TEST_F(EncroachPageTest, StepAddDuplicateDelete)
 {
-    Open(&MakeEncroachPage);
+    Open(MakeEncroachPage);
     EXPECT_EQ(Shown(), "--a--  ");
     EXPECT_FALSE(grid->isEnabled());
     view->page->AppendLine(); // nowhere to go
@@ -156,7 +156,7 @@ TEST_F(EncroachPageTest, TellsWhatASaveWouldLeaveOut)
     } cases[] = {{{}, false}, {{"A"}, false}, {{"A", ""}, false}, {{"", "B"}, true}, {{"", "", "C"}, true}};
     for (const auto& c : cases)
         AddSetup(c.names);
-    Open(&MakeEncroachPage);
+    Open(MakeEncroachPage);
     QComboBox* box = view->page->findChild<QComboBox*>("setup_1341");
     int written = 0;
     for (const auto& c : cases) {
@@ -182,7 +182,7 @@ TEST_F(EncroachPageTest, AWrongCellKeepsTheSetup)
 {
     AddSetup({"A", "B"});
     AddSetup({"C", "D"});
-    Open(&MakeEncroachPage);
+    Open(MakeEncroachPage);
     Type(1, 7, "1."); // a position
     Click("next_1343");
     EXPECT_EQ(boxes.value(0), "Floating point number required");

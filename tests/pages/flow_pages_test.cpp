@@ -10,11 +10,11 @@
 
 TEST_F(FlowPagesTest, ControlsChangeTheirKeywords)
 {
-    Open(&MakeWindPage);
+    Open(MakeWindPage);
     EachChangesItsKeyword({{1159, " ", "wind_shear_stress = true"},
                            {1004, "0.875", "G_wind_factor = 0.875"},
                            {1006, "0.003", "G_friction_factor = 0.003"}});
-    Open(&MakeDefaultPage);
+    Open(MakeDefaultPage);
     EachChangesItsKeyword({{1012, "0.75", "delta = 0.75"},
                            {1013, "0.0125", "delhs = 0.0125"},
                            {1014, "0.25", "delh = 0.25"},
@@ -29,7 +29,7 @@ TEST_F(FlowPagesTest, ControlsChangeTheirKeywords)
                            {1026, "2147483647", "max_iter = 2147483647"},
                            {1027, "0.75", "froude_max = 0.75"},
                            {1028, "2", "froude_exp = 2"}});
-    Open(&MakeHeatBalancePage);
+    Open(MakeHeatBalancePage);
     EachChangesItsKeyword({{1148, " ", "Calc = true"},
                            {1149, "-33.5", "Latitude = -33.5"},
                            {1150, "12.25", "Longitude = 12.25"},
@@ -41,7 +41,7 @@ TEST_F(FlowPagesTest, ControlsChangeTheirKeywords)
                            {1156, "0.625", "RadB = 0.625"},
                            {1157, "1.25", "VapA = 1.25"},
                            {1158, "1.5", "VapB = 1.5"}});
-    Open(&MakeStratificationPage);
+    Open(MakeStratificationPage);
     EachChangesItsKeyword({{1175, "12", "npv = 12"},
                            {1176, "0.25", "visc = 0.25"},
                            {1177, "up", "vmf = 2"},
@@ -54,16 +54,16 @@ TEST_F(FlowPagesTest, ControlsChangeTheirKeywords)
                            {1186, "0.875", "uwc = 0.875"},
                            {1182, "1.25", "dfx = 1.25"},
                            {1183, "1.5", "dfz = 1.5"}});
-    Open(&MakeLeakagePage);
+    Open(MakeLeakagePage);
     EachChangesItsKeyword({{1228, " ", "IncludeLeakage = true"}, {1238, "4e-07", "LeakageCoefficient = 4e-07"}});
-    Open(&MakeFloodPage);
+    Open(MakeFloodPage);
     EachChangesItsKeyword({{1040, "25", "G_flood_plan_res = 25"}});
 }
 
 TEST_F(FlowPagesTest, ControlsShowTheDefaults)
 {
     globals.struc_fac = 0.26;
-    Open(&MakeDefaultPage);
+    Open(MakeDefaultPage);
     const std::pair<int, const char*> shown[] = {{1012, "0.5"}, {1013, "0.01"}, {1016, "1"},  {1017, "0.0001"},
                                                  {1020, "0.3"}, {1021, "10"},   {1027, "-1"}, {1024, "1"}};
     for (const auto& [number, text] : shown)
@@ -82,7 +82,7 @@ TEST_F(FlowPagesTest, ControlsShowTheDefaults)
 
 TEST_F(FlowPagesTest, Ranges)
 {
-    Open(&MakeDefaultPage);
+    Open(MakeDefaultPage);
     const struct
     {
         int control;
@@ -110,7 +110,7 @@ TEST_F(FlowPagesTest, Ranges)
 
 TEST_F(FlowPagesTest, AWrongIntegerKeepsThePage)
 {
-    Open(&MakeDefaultPage);
+    Open(MakeDefaultPage);
     for (const char* wrong : {"x", "1.5", "2147483648", "-", ""}) {
         SCOPED_TRACE(wrong);
         boxes.clear();
@@ -165,7 +165,7 @@ TEST_F(FlowPagesTest, TheSheetStaysOnAPageWithAWrongEntry)
 
 TEST_F(FlowPagesTest, TheOnlyNodeCompatibilityIsWaterLevel)
 {
-    Open(&MakeDefaultPage);
+    Open(MakeDefaultPage);
     EXPECT_FALSE(view->linesMenu);
     const QStringList before = Lines();
     auto* list = Find<QComboBox>(1025);
@@ -182,7 +182,7 @@ TEST_F(FlowPagesTest, TheOnlyNodeCompatibilityIsWaterLevel)
 
 TEST_F(FlowPagesTest, HeatBalanceIsEnabledAsAWhole)
 {
-    Open(&MakeHeatBalancePage);
+    Open(MakeHeatBalancePage);
     const auto enabled = [&] {
         QStringList names;
         for (QWidget* widget : view->page->findChildren<QWidget*>())
@@ -205,7 +205,7 @@ TEST_F(FlowPagesTest, Stratification)
 {
     globals.Stratification.vmf = 1;
     globals.Stratification.vmb = 7;
-    Open(&MakeStratificationPage);
+    Open(MakeStratificationPage);
     EXPECT_EQ(Find<QComboBox>(1177)->currentText(), "mixing-length");
     auto* bed = Find<QComboBox>(1178);
     EXPECT_EQ(bed->currentText(), "7") << "a model that this list does not name";
@@ -227,7 +227,7 @@ TEST_F(FlowPagesTest, Stratification)
 TEST_F(FlowPagesTest, LeakageShowsItsTableWhenIncluded)
 {
     auto& list = document.Parameters().LeakageList;
-    Open(&MakeLeakagePage);
+    Open(MakeLeakagePage);
     EXPECT_FALSE(grid->isVisible());
     EXPECT_FALSE(view->linesMenu);
     EXPECT_FALSE(Find(1238)->isEnabled());
@@ -275,13 +275,13 @@ TEST_F(FlowPagesTest, TablesShowTheirFields)
     loss.WaterLoss1 = 0.0052;
     loss.WaterLoss4 = 4;
     const QStringList location{"River Name", "Chainage"};
-    Open(&MakeWindPage);
+    Open(MakeWindPage);
     EXPECT_EQ(Headers(), location + QStringList{"Topographical factor"});
     EXPECT_EQ(Texts(1), "A|1501|0.123");
-    Open(&MakeFloodPage);
+    Open(MakeFloodPage);
     EXPECT_EQ(Headers(), location + QStringList{"Flood Pl. Res"});
     EXPECT_EQ(Texts(1), "A|1501|12.500");
-    Open(&MakeLossPage);
+    Open(MakeLossPage);
     EXPECT_EQ(Headers(), location + QStringList({"Water Loss 1", "Water Loss 2", "Water Loss 3", "Water Loss 4"}));
     EXPECT_EQ(Texts(1), "A|1501|0.0052|0|0|4");
     Enter(1, 5, "2.5");
@@ -294,7 +294,7 @@ TEST_F(FlowPagesTest, WhatBlankCellsBecome)
 {
     auto& all = document.Parameters();
     globals.G_wind_factor = 0.75;
-    Open(&MakeWindPage);
+    Open(MakeWindPage);
     EXPECT_EQ(Texts(1), "||0.750") << "an empty list shows a line with the global factor";
     Type(1, 3, "");
     EXPECT_TRUE(view->page->OnKillActive());
@@ -311,7 +311,7 @@ TEST_F(FlowPagesTest, WhatBlankCellsBecome)
     EXPECT_TRUE(view->page->OnKillActive());
     EXPECT_EQ(globals.G_wind_factor, 0.75);
 
-    Open(&MakeFloodPage);
+    Open(MakeFloodPage);
     EXPECT_EQ(Find<QLineEdit>(1040)->text(), "-99");
     EXPECT_EQ(grid->RowCount(), 1);
     Enter(1, 3, "25");

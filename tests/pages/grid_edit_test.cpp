@@ -10,7 +10,7 @@ protected:
     {
         Add("A", 1, 10, 20);
         Add("B", 2, 11, 21);
-        Open(&MakeInitPage);
+        Open(MakeInitPage);
         grid->setFocus();
     }
     void Click(int row, int column)

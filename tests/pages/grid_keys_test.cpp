@@ -26,7 +26,7 @@ protected:
     {
         Add("A", 1, 10, 20);
         Add("B", 2, 11, 21);
-        Open(&MakeInitPage);
+        Open(MakeInitPage);
         grid->setFocus();
     }
     void Press(Qt::Key key, Qt::KeyboardModifiers held = {}) { QTest::keyClick(grid, key, held); }

@@ -28,7 +28,7 @@ using LayerPagesTest = FlowPagesTest;
 
 TEST_F(LayerPagesTest, ControlsChangeTheirKeywords)
 {
-    Open(&MakeKlrParamPage);
+    Open(MakeKlrParamPage);
     globals.Klr.action = 1;
     view->page->LoadFromDocument(&document);
     EachChangesItsKeyword({{1006, "0.004", "fricfac = 0.004"},
@@ -40,15 +40,15 @@ TEST_F(LayerPagesTest, ControlsChangeTheirKeywords)
                            {1157, "0.0625", "R1 = 0.0625"},
                            {1158, "0.075", "R2 = 0.075"},
                            {1159, "0.175", "Rs = 0.175"}});
-    EXPECT_EQ(view->page->findChild<QLabel*>("downwardLabel_1158")->text().remove('&'), "R1 downward entrainment");
-    Open(&MakeKlrInitPage);
+    EXPECT_EQ(view->page->findChild<QLabel*>("label_1158")->text().remove('&'), "R1 downward entrainment");
+    Open(MakeKlrInitPage);
     EachChangesItsKeyword({{1183, "12.5", "h1 = 12.5"},
                            {1184, "-3.25", "h0 = -3.25"},
                            {1185, "12345.678", "Q1 = 12345.678"},
                            {1161, "1e-05", "Q0 = 1e-05"}});
     EXPECT_EQ(Find<QLineEdit>(1185)->text(), "12345.678");
     EXPECT_EQ(globals.G_friction_factor, 0.0024) << "of the same section, but of another page";
-    Open(&MakeReachLengthPage);
+    Open(MakeReachLengthPage);
     globals.FrictionSlope = 3;
     EachChangesItsKeyword({{1187, " ", "EnergyEquation = true, 3"}});
 }
@@ -59,7 +59,7 @@ TEST_F(LayerPagesTest, UnitsAndActions)
         {0, "Nothing"}, {1, "Moving interface up"}, {2, "Moving interface down"}, {7, "7"}, {-1, "-1"}};
     for (const auto& [action, text] : actions) {
         globals.Klr.action = action;
-        Open(&MakeKlrParamPage);
+        Open(MakeKlrParamPage);
         EXPECT_EQ(Find<QComboBox>(1182)->currentText(), text);
     }
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
@@ -103,12 +103,12 @@ TEST_F(LayerPagesTest, AnEmptyTableShowsOneLineThatIsSavedOnceItIsEdited)
         EXPECT_EQ(records.GetAt(0).*value, 0.0375);
     };
     using P = HD_Parameters;
-    Open(&MakeKlrParamPage);
+    Open(MakeKlrParamPage);
     visit(&P::KlrParamList, "||0.050|0.050", &HDKlrParam::R2);
-    Open(&MakeKlrInitPage);
+    Open(MakeKlrInitPage);
     visit(&P::KlrInitList, "||0.000|0.000|0.000|0.000", &HDKlrInit::h0);
     globals.EnergyEquation = true;
-    Open(&MakeReachLengthPage);
+    Open(MakeReachLengthPage);
     visit(&P::QSSReachLengthsList, "||0.000|0.000", &HDReachLength::ReachLength2);
 }
 
@@ -131,19 +131,19 @@ TEST_F(LayerPagesTest, TablesShowTheirFields)
     reach.ReachLength1 = 105;
     reach.ReachLength2 = 98.5;
     const QStringList location{"River Name", "Chainage"};
-    Open(&MakeKlrParamPage);
+    Open(MakeKlrParamPage);
     EXPECT_EQ(Headers(), location + QStringList({"R1", "R2"}));
     EXPECT_EQ(Texts(1), "A|1501|0.050|0.043");
     EXPECT_TRUE(view->linesMenu);
     EXPECT_TRUE(view->page->OnKillActive());
     EXPECT_EQ(all.KlrParamList.GetAt(0).R2, 0.0425) << "whatever is shown of it";
-    Open(&MakeKlrInitPage);
+    Open(MakeKlrInitPage);
     EXPECT_EQ(Headers(), location + QStringList({"h1", "h0", "Q1", "Q0"}));
     EXPECT_EQ(Texts(1), "A|1501|12.500|3.000|1234.568|-1.000");
     Enter(1, 5, "7");
     EXPECT_EQ(initial.Q1, 7);
     globals.EnergyEquation = true;
-    Open(&MakeReachLengthPage);
+    Open(MakeReachLengthPage);
     EXPECT_EQ(Headers(), location + QStringList({"Left bank", "Right bank"}));
     EXPECT_EQ(Texts(1), "A|1501|105.000|98.500");
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
@@ -158,7 +158,7 @@ TEST_F(LayerPagesTest, ReachLengthsShowWithTheEnergyEquation)
     auto& record = list.Add();
     record.RiverName = "A";
     record.Chainage = 10;
-    Open(&MakeReachLengthPage);
+    Open(MakeReachLengthPage);
     auto* uses = Find<QCheckBox>(1187);
     auto* load = Find<QAbstractButton>(1104);
     const auto shown = [&](bool expected) {
@@ -221,13 +221,13 @@ TEST_F(LayerPagesTest, TextsFollowTheLanguage)
         EXPECT_EQ(translated.count('['), QString(expected).count(", ") + 1) << translated.toStdString();
         EXPECT_EQ(text(), expected);
     };
-    Open(&MakeOutputPage);
+    Open(MakeOutputPage);
     follows([&] { return Find(1037)->accessibleName(); }, "Velocity, H and Q points");
-    Open(&MakeKlrParamPage);
+    Open(MakeKlrParamPage);
     follows([&] { return Find<QComboBox>(1182)->itemText(2); }, "Moving interface down");
-    Open(&MakeKlrInitPage);
+    Open(MakeKlrInitPage);
     follows([&] { return Headers().back(); }, "Q0");
-    Open(&MakeReachLengthPage);
+    Open(MakeReachLengthPage);
     follows([&] { return Headers().back(); }, "Right bank");
     follows([&] { return Find<QAbstractButton>(1104)->text(); }, "Load &branch and chainages");
 }

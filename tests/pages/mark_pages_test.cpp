@@ -23,7 +23,7 @@ protected:
     }
     CGenGrid& OpenMarks()
     {
-        Open(&MakeWLMarkPage);
+        Open(MakeWLMarkPage);
         return *view->page->findChild<CGenGrid*>("titles_1075");
     }
     QStringList Headers() const
@@ -172,7 +172,7 @@ TEST_F(MarkPagesTest, TheGlobalRowIsNoLineOfTheList)
     record.CurveValue2 = 250;
     document.Parameters().WLCurveList.Add(record);
     g.CurveIncrement = {.Enabled = true, .Range = 1, .Width = 40, .Radius = 300, .Velocity = 1.25};
-    Open(&MakeWLCurvePage);
+    Open(MakeWLCurvePage);
     EXPECT_EQ(Texts(1), "Global||Single|40.000|300.000|1.250");
     EXPECT_EQ(Texts(2), "A|10|Multiple ½||250.000|0.000");
 
@@ -218,7 +218,7 @@ TEST_F(MarkPagesTest, TheGlobalRowIsNoLineOfTheList)
 TEST_F(MarkPagesTest, CurveSwitchesTakeEachOtherAlong)
 {
     g.CurveIncrement.Enabled = true;
-    Open(&MakeWLCurvePage);
+    Open(MakeWLCurvePage);
     const struct
     {
         const char* box;
@@ -254,7 +254,7 @@ TEST_F(MarkPagesTest, CurveSwitchesTakeEachOtherAlong)
     EXPECT_FALSE(view->page->findChild<QCheckBox*>("velocity_1102")->isEnabled());
 
     g.SandBarIncrement.Enabled = true;
-    Open(&MakeWLSandBarsPage);
+    Open(MakeWLSandBarsPage);
     EXPECT_EQ(locked(1), "6");
     view->page->findChild<QRadioButton*>("observed_1109")->click();
     EXPECT_EQ(g.SandBarIncrement.Method, 1);
@@ -272,7 +272,7 @@ TEST_F(MarkPagesTest, PlacesAreLoadedBelowTheGlobalRow)
     place->width = 42;
     places.push_back(std::move(place));
     g.CurveIncrement = {.Enabled = true, .Width = 7, .Radius = 8};
-    Open(&MakeWLCurvePage);
+    Open(MakeWLCurvePage);
     EXPECT_EQ(LoadLocations(*view->page, places, {true, true}).added, 1);
     EXPECT_EQ(Texts(1), "Global||None|7.000|8.000|0.000");
     EXPECT_EQ(Texts(2), "MAIN|125|None|42.000|300.000|") << "instead of the line that the empty list showed";
@@ -281,7 +281,7 @@ TEST_F(MarkPagesTest, PlacesAreLoadedBelowTheGlobalRow)
     EXPECT_EQ(Texts(2), "||None|||");
     EXPECT_EQ(g.CurveIncrement.Width, 7);
     g.SandBarIncrement.Enabled = true;
-    Open(&MakeWLSandBarsPage);
+    Open(MakeWLSandBarsPage);
     EXPECT_EQ(LoadLocations(*view->page, places, {true, true}).added, 1);
     EXPECT_EQ(Texts(2), "MAIN|125||42.000||");
 }

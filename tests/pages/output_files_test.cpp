@@ -54,7 +54,7 @@ protected:
 
 TEST_F(OutputFilesTest, NewRowsAndTheGridWithTheFocus)
 {
-    Open(&MakeTextOutputPage);
+    Open(MakeTextOutputPage);
     CGenGrid &items = Part("items_1216"), &files = Part("files_1226");
     EXPECT_EQ(items.RowCount(), 1);
     EXPECT_EQ(items.TextAt(1, 1) + '|' + items.TextAt(1, 3), "Water level|2");
@@ -88,7 +88,7 @@ TEST_F(OutputFilesTest, BrowsingStartsAtTheFileNamed)
     QDir(folder.path()).mkdir("out");
     QFile(folder.filePath("out/there.kvt0")).open(QIODevice::WriteOnly);
     text.OutputFiles.resize(2);
-    Open(&MakeTextOutputPage);
+    Open(MakeTextOutputPage);
     CGenGrid& files = Part("files_1226");
     const struct
     {
@@ -125,7 +125,7 @@ TEST_F(OutputFilesTest, DoubtfulFilesAreAskedAbout)
     const QString there = folder.filePath("there.kvt2"), missing = folder.filePath("missing.kvt2");
     QFile(there).open(QIODevice::WriteOnly);
     maps.GenerateOutput = maps.ApplyDemGroundElevation = maps.MapAreaGeoDb = true;
-    Open(&MakeMapsPage);
+    Open(MakeMapsPage);
     auto* help = view->page->findChild<CGeoFileEdit*>("helpGrid_1241");
     const struct
     {
@@ -167,7 +167,7 @@ TEST_F(OutputFilesTest, DatesAreKeptUnlessTheyAreTyped)
 {
     text.LimitedPeriodStart = {2024, 13, 5, 7, 8, 9};
     text.LimitedPeriodEnd = {2024, 2, 29, 18, 30, 5};
-    Open(&MakeTextOutputPage);
+    Open(MakeTextOutputPage);
     const std::string before = Text();
     auto* start = view->page->findChild<CDateTimeEdit*>("start_1223");
     auto* end = view->page->findChild<CDateTimeEdit*>("end_1225");
@@ -177,7 +177,7 @@ TEST_F(OutputFilesTest, DatesAreKeptUnlessTheyAreTyped)
     EXPECT_FALSE(start->isEnabled());
     limited->click();
     EXPECT_TRUE(start->isEnabled());
-    EXPECT_TRUE(view->page->findChild<QLabel*>("endLabel_1224")->isEnabled());
+    EXPECT_TRUE(view->page->findChild<QLabel*>("label_1225")->isEnabled());
     limited->click();
     EXPECT_EQ(Text(), before);
     limited->click();
@@ -231,7 +231,7 @@ TEST_F(OutputFilesTest, TypeAndItemLockTheOtherCellsOfARow)
 {
     maps.GenerateOutput = true;
     maps.MapOutputFiles.resize(2);
-    Open(&MakeMapsPage);
+    Open(MakeMapsPage);
     CGenGrid& cells = Part("maps_1226");
     const struct
     {
@@ -264,7 +264,7 @@ TEST_F(OutputFilesTest, TypeAndItemLockTheOtherCellsOfARow)
 
 TEST_F(OutputFilesTest, WhatIsShownAndEnabled)
 {
-    Open(&MakeMapsPage);
+    Open(MakeMapsPage);
     const char* boxNames[] = {"generate_1228", "groundElevation_1239", "geoDb_1240"};
     const struct
     {
@@ -291,7 +291,7 @@ TEST_F(OutputFilesTest, WhatIsShownAndEnabled)
 TEST_F(OutputFilesTest, RowsWithoutAFileAreAnnouncedAndLeftOut)
 {
     maps.GenerateOutput = maps.ApplyDemGroundElevation = true;
-    Open(&MakeMapsPage);
+    Open(MakeMapsPage);
     auto* status = view->page->findChild<QLabel*>("status_1229");
     CGenGrid& cells = Part("maps_1226");
     ASSERT_TRUE(document.OnSaveDocument(folder.filePath("maps.HDKV")));

@@ -46,7 +46,7 @@ TEST_F(OutputPageTest, EveryOutputBoxIsOneKeyword)
 {
     globals.AddOutput.ReducedOut = 3;
     globals.AddOutput.Topo_print = globals.AddOutput.Test_print = true;
-    Open(&MakeOutputPage);
+    Open(MakeOutputPage);
     EXPECT_FALSE(view->linesMenu);
     EXPECT_EQ(view->page->findChildren<QCheckBox*>().size(), int(std::size(OutputBoxes)));
     QPoint last;
@@ -65,7 +65,7 @@ TEST_F(OutputPageTest, EveryOutputBoxIsOneKeyword)
 
 TEST_F(OutputPageTest, TheOutputMatrixScrollsToTheFocusWhenThePageIsLow)
 {
-    Open(&MakeOutputPage);
+    Open(MakeOutputPage);
     view->resize(500, 200);
     QTest::qWait(0);
     const auto* area = view->page->findChild<QScrollArea*>();

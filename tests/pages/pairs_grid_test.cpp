@@ -19,7 +19,7 @@ protected:
     void OpenToolbox()
     {
         globals.BedResist.Method = 9; // unknown: may use anything
-        Open(&MakeBedToolboxPage);
+        Open(MakeBedToolboxPage);
         global = Find<CGenGrid>(1318);
         line = Find<CGenGrid>(1320);
     }
@@ -169,7 +169,7 @@ TEST_F(PairsGridTest, MixingPairs)
 {
     document.Parameters().MixingCoefList.Add().CoefPairs = {{20, 0.11}, {40, 0.16}};
     globals.Mixing.CoefPairs = {{10, 0.5}};
-    Open(&MakeMixingCoefPage);
+    Open(MakeMixingCoefPage);
     for (const auto& [number, rows] : {std::pair(1334, 1), std::pair(1336, 2)}) {
         auto* pairs = Find<CGenGrid>(number);
         EXPECT_EQ(pairs->RowCount(), rows);

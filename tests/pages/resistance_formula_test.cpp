@@ -24,7 +24,7 @@ protected:
         tool.MaxRes = 50; // no minimum
         tool.VeloRes = {{1, 16}};
         document.Parameters().BedResistanceToolboxList.Add(tool);
-        Open(&MakeBedPage);
+        Open(MakeBedPage);
     }
     /// Chooses a formula as the keyboard does, answering the question that comes.
     void Choose(Qt::Key key, QMessageBox::StandardButton pressed)
@@ -98,7 +98,7 @@ TEST_F(ResistanceFormulaTest, ChezyIsNotConverted)
 
 TEST_F(ResistanceFormulaTest, TheToolboxLocksWhatItsMethodDoesNotUse)
 {
-    Open(&MakeBedToolboxPage);
+    Open(MakeBedToolboxPage);
     const auto open = [this] {
         QString text;
         for (int control : {1311, 1314, 1316})

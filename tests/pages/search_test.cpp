@@ -12,7 +12,7 @@ protected:
         Add("MYRIVER", 200.5);
         Add("RIVER2", 300);
         Add("RIV", NotGiven);
-        Open(&MakeInitPage);
+        Open(MakeInitPage);
     }
     /// The rows found one after the other, as "search" and "search again" do.
     QList<int> Found(const LineQuery& query, int from = 0)

@@ -19,7 +19,7 @@ TEST_F(UndoTest, RandomSequences)
         document.UndoStack().clear();
         for (int i = 0; i < 5; ++i)
             Add("R", i, i * 0.1, i * 0.3);
-        Open(&MakeInitPage);
+        Open(MakeInitPage);
         QStringList states{Stored()}; // state i: after i steps
         for (int step = 0; step < 60; ++step) {
             SCOPED_TRACE(step);
@@ -79,7 +79,7 @@ TEST_F(UndoTest, RandomSequences)
 
 TEST_F(UndoTest, TheLineOfAnEmptyListIsNoChange)
 {
-    Open(&MakeInitPage);
+    Open(MakeInitPage);
     EXPECT_EQ(grid->RowCount(), 1);
     EXPECT_EQ(init.GetCount(), 0u);
     EXPECT_FALSE(document.IsModified());
@@ -89,7 +89,7 @@ TEST_F(UndoTest, TheLineOfAnEmptyListIsNoChange)
     EXPECT_EQ(init.GetCount(), 0u);
     EXPECT_FALSE(document.IsModified());
     // The pages of the sheet come and go between the steps.
-    Open(&MakeInitPage);
+    Open(MakeInitPage);
     document.UndoStack().redo();
     EXPECT_EQ(Stored(), "A 10000000000 0 0");
     EXPECT_EQ(grid->RowCount(), 1);
@@ -98,7 +98,7 @@ TEST_F(UndoTest, TheLineOfAnEmptyListIsNoChange)
 TEST_F(UndoTest, ASaveThatDroppedLinesIsRedoneAsItWas)
 {
     QTemporaryDir folder;
-    Open(&MakeInitPage);
+    Open(MakeInitPage);
     Add("A", 1);
     Add("", 2, 7);
     Add("B", 3);
@@ -120,7 +120,7 @@ TEST_F(UndoTest, ASaveThatDroppedLinesIsRedoneAsItWas)
 TEST_F(UndoTest, TheSavedStateIsUnmodifiedFromBothSides)
 {
     QTemporaryDir folder;
-    Open(&MakeInitPage);
+    Open(MakeInitPage);
     Enter(1, 1, "a");
     ASSERT_TRUE(document.OnSaveDocument(folder.filePath("new.HDKV"))); // the line has no chainage: dropped
     EXPECT_FALSE(document.IsModified());

@@ -6,11 +6,13 @@
 #include "ks/units/edit_fields.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"
+#include "pages/framework/output_matrix.h"
 #include "res/strings.h"
 
 #include <QButtonGroup>
 #include <QCheckBox>
 #include <QComboBox>
+#include <QGridLayout>
 #include <QKeyEvent>
 #include <QLabel>
 #include <QRadioButton>
@@ -19,20 +21,44 @@
 
 namespace {
 
-constexpr int UsualDigits = 6;
-
-/// The declaration of a global value; one without a name for a number that is none.
-Field Declaration(const HD_Global_Var& globals, const double& value)
+/// A new label in the cell left (-1) or right (1) of the control; null for a control that stands in no cells.
+QLabel* LabelBeside(QWidget& control, int side, const char* name)
 {
-    for (const GlobalSection& section : HDGlobalSections())
-        for (const GlobalKeyword& keyword : section.keywords)
-            for (const Field& field : keyword.Fields())
-                if (field.constAddress(&globals) == &value)
-                    return field;
-    return {};
+    if (!control.parentWidget())
+        return nullptr;
+    for (auto* cells : control.parentWidget()->findChildren<QGridLayout*>()) {
+        const int index = cells->indexOf(&control);
+        if (index < 0)
+            continue;
+        int row = 0, column = 0, rows = 0, columns = 0;
+        cells->getItemPosition(index, &row, &column, &rows, &columns);
+        auto* label = new QLabel(control.parentWidget());
+        label->setObjectName(name + control.objectName().section(u'_', -1)); // with the control's number
+        cells->addWidget(label, row, side < 0 ? column - 1 : column + columns);
+        return label;
+    }
+    return nullptr;
 }
 
 } // namespace
+
+void SetAccessibleName(QWidget& widget, const QString& name)
+{
+    if (widget.accessibleName() != name)
+        widget.setAccessibleName(name);
+}
+
+/// One that says nothing for a value that is none of the global ones.
+const Field& CBindings::Declaration(const void* value) const
+{
+    static constexpr Field none;
+    for (const GlobalSection& section : HDGlobalSections())
+        for (const GlobalKeyword& keyword : section.keywords)
+            for (const Field& field : keyword.Fields())
+                if (field.constAddress(&m_document->Parameters().Global) == value)
+                    return field;
+    return none;
+}
 
 template <typename T>
 void CBindings::Store(T& target, T value)
@@ -47,6 +73,26 @@ void CBindings::ApplyRules()
         rule();
 }
 
+void CBindings::Always(std::function<void()> rule)
+{
+    rule();
+    m_rules.push_back(std::move(rule));
+}
+
+void CBindings::AddLabel(QWidget* control, const void* value, std::function<Str()> title)
+{
+    const TextLine declared = Declaration(value).title;
+    QLabel* label = declared ? LabelBeside(*control, -1, "label_") : nullptr;
+    if (!label)
+        return;
+    label->setBuddy(control);
+    m_beside.emplace(control, label);
+    Always([control, label, declared, title] {
+        label->setText(LoadLine(title ? title() : declared.text, declared.line));
+        SetAccessibleName(*control, QString::fromStdString(PlainText(label->text().toStdString())));
+    });
+}
+
 void CBindings::Add(QWidget* control, const void* value, std::function<void()> show)
 {
     m_controls.push_back({control, value, std::move(show)});
@@ -56,6 +102,7 @@ void CBindings::AddTyped(QLineEdit* field, const void* value, TypedField what)
 {
     auto* typing = new CTyping(field, std::move(what));
     m_typed.push_back(typing);
+    AddLabel(field, value);
     Add(field, value, [typing] {
         if (!typing->IsTyped()) // a text that has not been taken yet stays
             typing->Revert();
@@ -76,17 +123,18 @@ QWidget* CBindings::ControlFor(const void* value) const
 
 void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options)
 {
-    const Field declared = Declaration(m_document->Parameters().Global, value);
-    field->Setup(&value, options.textLimit, declared.digits ? declared.digits : UsualDigits, true, declared.unit);
-    field->SetRange(declared.minimum.has_value(), declared.minimum.value_or(0), declared.maximum.has_value(),
-                    declared.maximum.value_or(0));
+    field->Setup(value, Declaration(&value), [this, &value](double number) { Store(value, number); });
     field->SetUnitText(options.unitText);
-    field->SetStore([this](double& target, double number) { Store(target, number); });
     m_typed.push_back(&field->Typing());
-    Add(field, &value, [field, label = options.unitLabel] {
+    AddLabel(field, &value, options.title);
+    const bool hasUnit = options.unitText || !field->UnitSymbol().isEmpty();
+    QLabel* unit = hasUnit ? LabelBeside(*field, 1, "unit_") : nullptr;
+    if (unit)
+        m_beside.emplace(field, unit);
+    Add(field, &value, [field, unit] {
         field->Show();
-        if (label)
-            label->setText(field->UnitSymbol());
+        if (unit)
+            unit->setText(field->UnitSymbol());
     });
 }
 
@@ -116,6 +164,7 @@ void CBindings::Add(CGeoFileEdit* field, std::string& value, const FileKind& kin
 {
     field->SetUp(*m_document, kind);
     Add(field->Field(), value);
+    AddLabel(field, &value);
     connect(field, &CGeoFileEdit::Chosen, this,
             [this, field, &value] { Store(value, field->Field()->text().toStdString()); });
 }
@@ -128,29 +177,27 @@ void CBindings::Add(CDateTimeEdit* field, HDDateTime& value)
               .show = [field, &value] { field->SetValue(value); }});
 }
 
-template <typename T>
-void CBindings::AddFlag(QCheckBox* box, T& value, std::function<void(bool checked)> consequences)
+void CBindings::Add(QCheckBox* box, bool& value, std::function<void(bool checked)> consequences)
 {
-    Add(box, &value, [box, &value] { box->setChecked(value != T(0)); });
+    Add(box, &value, [box, &value] { box->setChecked(value); });
+    if (const TextLine title = Declaration(&value).title) {
+        Always([box, title] {
+            const QString text = LoadLine(title.text, title.line);
+            if (auto* matrix = qobject_cast<COutputMatrix*>(box->parentWidget()))
+                matrix->SetTitle(*box, text);
+            else
+                box->setText(text);
+        });
+    }
     connect(box, &QCheckBox::clicked, this, [this, &value, consequences](bool checked) {
         if (!consequences)
-            return Store(value, T(checked));
+            return Store(value, checked);
         QUndoStack& steps = m_document->UndoStack();
         steps.beginMacro(LoadString(Str::UndoValue));
-        Store(value, T(checked));
+        Store(value, checked);
         consequences(checked);
         steps.endMacro();
     });
-}
-
-void CBindings::Add(QCheckBox* box, bool& value, std::function<void(bool checked)> consequences)
-{
-    AddFlag(box, value, std::move(consequences));
-}
-
-void CBindings::Add(QCheckBox* box, std::int32_t& flag)
-{
-    AddFlag(box, flag);
 }
 
 void CBindings::Add(QComboBox* box, std::int32_t& index)
@@ -160,6 +207,19 @@ void CBindings::Add(QComboBox* box, std::int32_t& index)
 
 void CBindings::Add(QComboBox* box, std::int32_t& index, std::function<void(std::int32_t chosen)> choose)
 {
+    AddLabel(box, &index);
+    if (const Str choices = Declaration(&index).choices; choices != Str::None) {
+        Always([box, choices] {
+            int entry = 0;
+            for (const QString& text : LoadString(choices).split(u'\n')) {
+                if (entry == box->count())
+                    box->addItem(text);
+                else if (box->itemText(entry) != text)
+                    box->setItemText(entry, text);
+                ++entry;
+            }
+        });
+    }
     const int entries = box->count();
     box->setFocusPolicy(Qt::StrongFocus); // not by the wheel
     box->installEventFilter(this);
@@ -185,6 +245,12 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
     for (QRadioButton* button : buttons) {
         Add(button, &value, [] {}); // shown by its group
         group->addButton(button, id++);
+    }
+    if (const Str choices = Declaration(&value).choices; choices != Str::None) {
+        Always([group, choices] {
+            for (QAbstractButton* button : group->buttons())
+                button->setText(LoadLine(choices, group->id(button)));
+        });
     }
     Add(*buttons.begin(), nullptr, [group, &value] {
         group->setExclusive(false); // else a pressed button could not be released
@@ -222,10 +288,13 @@ bool CBindings::eventFilter(QObject* object, QEvent* event)
 void CBindings::AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets,
                         void (QWidget::*apply)(bool))
 {
-    m_rules.push_back([rule = std::move(rule), widgets = std::vector(widgets), apply] {
+    m_rules.push_back([this, rule = std::move(rule), widgets = std::vector(widgets), apply] {
         const bool holds = rule();
-        for (QWidget* widget : widgets)
+        for (QWidget* widget : widgets) {
             (widget->*apply)(holds);
+            const auto [first, last] = m_beside.equal_range(widget);
+            std::for_each(first, last, [&](const auto& pair) { (pair.second->*apply)(holds); });
+        }
     });
 }
 

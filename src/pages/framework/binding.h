@@ -1,5 +1,9 @@
 // Controls bound to values of the document, and rules that enable and show them. The document is written as soon as the
 // user has changed a control, each change being an undo step; nothing is written that nobody changed.
+//
+// A control says what its value is called as the value's declaration does, in the user's language: a check box by its
+// own text, any other by a label in the cell to its left. The unit of a number stands in the cell to its right. Lists
+// and radio buttons have the declared choices.
 #pragma once
 
 #include "files/field.h"
@@ -10,6 +14,7 @@
 #include <cstdint>
 #include <functional>
 #include <initializer_list>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -19,18 +24,19 @@ class CKavo0_hdDoc;
 class CKsEditLong;
 class QCheckBox;
 class QComboBox;
-class QLabel;
 class QLineEdit;
 class QRadioButton;
 class QWidget;
 
-/// How a number is edited in a single field, beyond what its declaration says.
+/// What depends on a setting and so is more than a number's declaration says.
 struct FieldOptions
 {
-    int textLimit = 20;
-    std::function<QString()> unitText = {}; // symbol of a unit that depends on a setting
-    QLabel* unitLabel = nullptr;            // shows the unit beside the field
+    std::function<QString()> unitText = {}; // symbol of the unit
+    std::function<Str()> title = {};
 };
+
+/// Assistive programs are told of every setting, so of a new name only.
+void SetAccessibleName(QWidget& widget, const QString& name);
 
 class CBindings : public QObject
 {
@@ -45,7 +51,6 @@ public:
     void Add(CDateTimeEdit* field, HDDateTime& value);
     /// `consequences` of a click are part of the same undo step.
     void Add(QCheckBox* box, bool& value, std::function<void(bool checked)> consequences = {});
-    void Add(QCheckBox* box, std::int32_t& flag);
     /// By index of the entry. An index without an entry is kept, and shown as its number.
     void Add(QComboBox* box, std::int32_t& index);
     /// Likewise; `choose` is what the user's choice of an entry does. The list then shows what the document has.
@@ -55,13 +60,17 @@ public:
     /// A list that stands for no value: whatever is chosen, it shows its first entry when the page is shown afresh.
     void AddUnbound(QComboBox* box);
 
-    /// The widgets are enabled, or visible, exactly while the rule holds; it is asked whenever the page is shown
-    /// afresh.
+    /// The widgets, with label and unit beside them, are enabled, or visible, exactly while the rule holds; it is asked
+    /// whenever the page is shown afresh.
     void EnableWhen(std::function<bool()> rule, std::initializer_list<QWidget*> widgets);
     void ShowWhen(std::function<bool()> rule, std::initializer_list<QWidget*> widgets);
+    /// A rule of another kind, that applies already.
+    void Always(std::function<void()> rule);
 
     /// Controls show the document's values, and the rules apply.
     void Show();
+    /// The rules apply: after a change of the document, or of the language.
+    void ApplyRules();
     /// Takes what was typed; false when a field refuses it (the user has been told).
     bool Take();
     /// Likewise while the page stays: a text that may wait for the page is let be.
@@ -83,13 +92,13 @@ private:
     void AddTyped(QLineEdit* field, const void* value, TypedField what);
     template <typename T>
     void Store(T& target, T value);
-    void ApplyRules();
-    template <typename T>
-    void AddFlag(QCheckBox* box, T& value, std::function<void(bool checked)> consequences = {});
+    const Field& Declaration(const void* value) const;
+    void AddLabel(QWidget* control, const void* value, std::function<Str()> title = {});
     void AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets, void (QWidget::*apply)(bool));
 
     CKavo0_hdDoc* m_document;
     std::vector<Control> m_controls;
     std::vector<CTyping*> m_typed; // children of their fields
     std::vector<std::function<void()>> m_rules;
+    std::multimap<const QWidget*, QWidget*> m_beside; // label and unit of a control
 };

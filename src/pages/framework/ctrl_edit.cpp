@@ -1,13 +1,19 @@
 #include "pages/framework/ctrl_edit.h"
 
+#include "files/read_number.h"
 #include "grid/column_spec.h"
 #include "grid/digits_mark.h"
-#include "files/read_number.h"
 #include "res/strings.h"
 
 #include <QPainter>
 #include <QStyle>
 #include <algorithm>
+
+namespace {
+
+constexpr int UsualDigits = 6, TextLimit = 20;
+
+} // namespace
 
 CCtrlEdit::CCtrlEdit(QWidget* parent)
     : QLineEdit(parent),
@@ -21,31 +27,14 @@ CCtrlEdit::CCtrlEdit(QWidget* parent)
     setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed); // a number needs no more room in a wide window
 }
 
-void CCtrlEdit::Setup(double* value, int textLimit, int decimals, bool generalNotation, UnitGroup group, int unit)
+void CCtrlEdit::Setup(const double& value, const Field& declared, std::function<void(double value)> store)
 {
-    m_textLimit = textLimit;
-    m_decimals = decimals;
-    m_generalNotation = generalNotation;
-    m_group = group;
-    m_unit = unit;
-    m_style.SetEumUnitBaseGroup(group, unit);
-    m_style.SetFormat((generalNotation ? QStringLiteral("%.%1g") : QStringLiteral("%-.%1E")).arg(decimals));
-    setMaxLength(textLimit);
-    m_value = value;
-    ShowValue();
-}
-
-void CCtrlEdit::SetRange(bool hasMinimum, double minimum, bool hasMaximum, double maximum)
-{
-    m_hasMinimum = hasMinimum;
-    m_minimum = minimum;
-    m_hasMaximum = hasMaximum;
-    m_maximum = maximum;
-}
-
-void CCtrlEdit::SetValue(double value)
-{
-    *m_value = value;
+    m_style = CKsEditStyle(declared.unit);
+    m_style.SetFormat(QStringLiteral("%.%1g").arg(declared.digits ? declared.digits : UsualDigits));
+    m_minimum = declared.minimum;
+    m_maximum = declared.maximum;
+    m_store = std::move(store);
+    m_value = &value;
     ShowValue();
 }
 
@@ -62,7 +51,7 @@ void CCtrlEdit::ShowValue()
     if (!m_value) // the page has gone
         return;
     m_shown = m_style.ShownText(*m_value);
-    setMaxLength(std::max(m_textLimit, int(m_shown.size()))); // a number is never cut
+    setMaxLength(std::max(TextLimit, int(m_shown.size()))); // a number is never cut
     if (text() != m_shown)
         setText(m_shown);
     if (!hasFocus())
@@ -85,7 +74,7 @@ std::optional<double> CCtrlEdit::Typed() const
 
 bool CCtrlEdit::InRange(double value) const
 {
-    return !(m_hasMinimum && value < m_minimum) && !(m_hasMaximum && value > m_maximum);
+    return !(m_minimum && value < *m_minimum) && !(m_maximum && value > *m_maximum);
 }
 
 /// An empty text is none: the value stays.
@@ -101,21 +90,17 @@ QString CCtrlEdit::Complaint() const
 
 QString CCtrlEdit::Allowed() const
 {
-    const auto bound = [this](bool is, double value) {
-        return is ? KsShortestNumber(m_style.UnitConvertFromBase(value, 1)) : QString();
+    const auto bound = [this](const std::optional<double>& value) {
+        return value ? KsShortestNumber(m_style.UnitConvertFromBase(*value, 1)) : QString();
     };
-    return AllowedRange(bound(m_hasMinimum, m_minimum), bound(m_hasMaximum, m_maximum));
+    return AllowedRange(bound(m_minimum), bound(m_maximum));
 }
 
 void CCtrlEdit::Store()
 {
     const auto value = m_value && !text().isEmpty() ? Typed() : std::nullopt;
-    if (value && *value != *m_value) {
-        if (m_store)
-            m_store(*m_value, *value);
-        else
-            *m_value = *value;
-    }
+    if (value && *value != *m_value)
+        m_store(*value);
     ShowValue();
 }
 

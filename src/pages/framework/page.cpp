@@ -1,12 +1,13 @@
 #include "pages/framework/page.h"
 
 #include "document/document.h"
-#include "pages/framework/ctrl_edit.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_keys.h"
+#include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page_help.h"
 
 #include <QApplication>
+#include <QGroupBox>
 #include <QKeyEvent>
 #include <QScrollArea>
 #include <QUndoStack>
@@ -36,13 +37,16 @@ HD_Global_Var& CGenPropertyPage::Globals() const
 void CGenPropertyPage::SetGrid(CGenGrid* grid)
 {
     m_grid = grid;
-    grid->SetHost(this);
+    AddPartGrid(grid);
 }
 
 void CGenPropertyPage::AddPartGrid(CGenGrid* grid)
 {
-    m_partGrids.push_back(grid);
+    m_grids.push_back(grid);
     grid->SetHost(this);
+    // Unless the dialog calls it otherwise, a grid is called as the group that it fills.
+    if (const auto* group = qobject_cast<QGroupBox*>(grid->parentWidget()); group && grid->accessibleName().isEmpty())
+        m_bindings.Always([grid, group] { SetAccessibleName(*grid, group->title()); });
 }
 
 void CGenPropertyPage::InsertLocation(const QString&, const QString&) {}
@@ -57,8 +61,8 @@ void CGenPropertyPage::DeleteLines()
 
 bool CGenPropertyPage::CommitGrids()
 {
-    bool taken = !m_grid || m_grid->CommitEditor();
-    for (CGenGrid* grid : m_partGrids)
+    bool taken = true;
+    for (CGenGrid* grid : m_grids)
         taken = grid->CommitEditor() && taken;
     return taken;
 }
@@ -71,7 +75,7 @@ bool CGenPropertyPage::LeaveField()
 CGenGrid* CGenPropertyPage::LinesGrid() const
 {
     const QWidget* focus = QApplication::focusWidget();
-    for (CGenGrid* grid : m_partGrids)
+    for (CGenGrid* grid : m_grids)
         if (grid == focus || grid->isAncestorOf(focus))
             return grid;
     return m_grid;
@@ -87,12 +91,10 @@ void CGenPropertyPage::GotoLine(int row)
 CGenGrid* CGenPropertyPage::GridOf(const void* table) const
 {
     const auto isOver = [table](const CGenGrid* grid) {
-        return grid && table && grid->Model()->Rows() && grid->Model()->Rows()->Data() == table;
+        return table && grid->Model()->Rows() && grid->Model()->Rows()->Data() == table;
     };
-    if (isOver(m_grid))
-        return m_grid;
-    const auto part = std::find_if(m_partGrids.begin(), m_partGrids.end(), isOver);
-    return part == m_partGrids.end() ? nullptr : *part;
+    const auto found = std::ranges::find_if(m_grids, isOver);
+    return found == m_grids.end() ? nullptr : *found;
 }
 
 bool CGenPropertyPage::Shows(const ChangePlace& place) const
@@ -126,9 +128,8 @@ void CGenPropertyPage::LoadFromDocument(CKavo0_hdDoc*)
     if (!m_host)
         return;
     // A rule may have shown or hidden a grid.
-    const auto isShown = [this](const CGenGrid* grid) { return grid && grid->isVisibleTo(this); };
-    m_host->EnableLinesMenu(isShown(m_grid) ||
-                            (!m_grid && std::any_of(m_partGrids.begin(), m_partGrids.end(), isShown)));
+    const auto isShown = [this](const CGenGrid* grid) { return grid->isVisibleTo(this); };
+    m_host->EnableLinesMenu(m_grid ? isShown(m_grid) : std::ranges::any_of(m_grids, isShown));
 }
 
 void CGenPropertyPage::StoreToDocument()
@@ -187,7 +188,7 @@ QStringList CGenPropertyPage::BranchNames()
 void CGenPropertyPage::OnHelp()
 {
     const QPoint middle(width() / 3, height() / 4);
-    QWhatsThis::showText(mapToGlobal(middle), PageHelpText(m_grid || !m_partGrids.empty()), this);
+    QWhatsThis::showText(mapToGlobal(middle), PageHelpText(!m_grids.empty()), this);
 }
 
 void CGenPropertyPage::UndoRedo(bool undo)
@@ -236,6 +237,7 @@ void CGenPropertyPage::changeEvent(QEvent* event)
     if (event->type() != QEvent::LanguageChange)
         return;
     Retranslate();
+    m_bindings.ApplyRules();
     if (isVisible())
         LoadFromDocument(m_document);
 }

@@ -32,7 +32,7 @@ public:
     /// The page's location grid, null on a page without one.
     CGenGrid* GetGrid() const { return m_grid; }
     void SetGrid(CGenGrid* grid);
-    /// Further grids of the page.
+    /// A further grid of the page.
     void AddPartGrid(CGenGrid* grid);
     /// The grid that inserting and deleting lines mean: a further grid while it has the focus, else the
     /// page's grid; null on a page without one.
@@ -82,21 +82,6 @@ protected:
     /// Texts again, in the user's language; the dialog's own texts are the concrete page's.
     virtual void Retranslate() {}
 
-    // Binding controls to values of the document: a line a control. The member is one of HD_Global_Var; a value inside
-    // a nested struct is bound by reference.
-    template <typename Widget, typename T, typename... Options>
-    void Bind(Widget* control, T HD_Global_Var::*member, Options&&... options)
-    {
-        m_bindings.Add(control, Globals().*member, std::forward<Options>(options)...);
-    }
-    void Bind(CCtrlEdit* field, double HD_Global_Var::*member, const FieldOptions& options)
-    {
-        m_bindings.Add(field, Globals().*member, options);
-    }
-    void Bind(std::initializer_list<QRadioButton*> buttons, std::int32_t HD_Global_Var::*member)
-    {
-        m_bindings.Add(buttons, Globals().*member);
-    }
     CBindings& Bindings() { return m_bindings; }
     HD_Global_Var& Globals() const;
 
@@ -110,7 +95,7 @@ private:
     CKavo0_hdDoc* m_document;
     IPageHost* m_host = nullptr;
     CGenGrid* m_grid = nullptr;
-    std::vector<CGenGrid*> m_partGrids;
+    std::vector<CGenGrid*> m_grids; // with the further ones
     CBindings m_bindings;
     KsUnitSystem m_shownUnits; // what the texts on the page are in
 };

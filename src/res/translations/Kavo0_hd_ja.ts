@@ -12,52 +12,12 @@
         <translation>抵抗則</translation>
     </message>
     <message>
-        <source>Manning&apos;s M</source>
-        <translation>マニングのM(粗度係数の逆数)</translation>
-    </message>
-    <message>
-        <source>Manning&apos;s n</source>
-        <translation>マニングの粗度係数n</translation>
-    </message>
-    <message>
-        <source>Chezy</source>
-        <translation>シェジー係数</translation>
-    </message>
-    <message>
         <source>Global Values</source>
         <translation>全体値</translation>
     </message>
     <message>
-        <source>&amp;Uniform section</source>
-        <translation>断面一様(&amp;U)</translation>
-    </message>
-    <message>
-        <source>&amp;Resistance:</source>
-        <translation>抵抗値(&amp;R):</translation>
-    </message>
-    <message>
-        <source>&amp;Three zones</source>
-        <translation>3区分(&amp;T)</translation>
-    </message>
-    <message>
-        <source>Zone &amp;1 (main channel):</source>
-        <translation>区分1(低水路)(&amp;1):</translation>
-    </message>
-    <message>
-        <source>Zone &amp;2 (transition):</source>
-        <translation>区分2(遷移部)(&amp;2):</translation>
-    </message>
-    <message>
-        <source>Zone &amp;3 (flood plain):</source>
-        <translation>区分3(高水敷)(&amp;3):</translation>
-    </message>
-    <message>
         <source>Local Values</source>
         <translation>地点別の値</translation>
-    </message>
-    <message>
-        <source>Re&amp;sistance formula:</source>
-        <translation>抵抗則(&amp;S):</translation>
     </message>
 </context>
 <context>
@@ -71,52 +31,8 @@
         <translation>全体値</translation>
     </message>
     <message>
-        <source>&amp;Method:</source>
-        <translation>方法(&amp;M):</translation>
-    </message>
-    <message>
-        <source>Not used</source>
-        <translation>使用しない</translation>
-    </message>
-    <message>
-        <source>Coefficients a and b</source>
-        <translation>係数aとb</translation>
-    </message>
-    <message>
-        <source>Table over velocity</source>
-        <translation>流速に対する表</translation>
-    </message>
-    <message>
         <source>Apply in:</source>
         <translation>適用範囲:</translation>
-    </message>
-    <message>
-        <source>Zone &amp;1</source>
-        <translation>区分1(&amp;1)</translation>
-    </message>
-    <message>
-        <source>Zone &amp;2</source>
-        <translation>区分2(&amp;2)</translation>
-    </message>
-    <message>
-        <source>Zone &amp;3</source>
-        <translation>区分3(&amp;3)</translation>
-    </message>
-    <message>
-        <source>Coefficient &amp;a:</source>
-        <translation>係数a(&amp;A):</translation>
-    </message>
-    <message>
-        <source>Coefficient &amp;b:</source>
-        <translation>係数b(&amp;B):</translation>
-    </message>
-    <message>
-        <source>Mi&amp;nimum resistance:</source>
-        <translation>最小抵抗値(&amp;N):</translation>
-    </message>
-    <message>
-        <source>Ma&amp;ximum resistance:</source>
-        <translation>最大抵抗値(&amp;X):</translation>
     </message>
     <message>
         <source>Local Values</source>
@@ -138,58 +54,6 @@
         <translation>計算スキーム</translation>
     </message>
     <message>
-        <source>Del&amp;ta:</source>
-        <translation>Delta(&amp;T):</translation>
-    </message>
-    <message>
-        <source>Delh&amp;s:</source>
-        <translation>Delhs(&amp;S):</translation>
-    </message>
-    <message>
-        <source>&amp;Delh:</source>
-        <translation>Delh(&amp;D):</translation>
-    </message>
-    <message>
-        <source>&amp;Alpha:</source>
-        <translation>Alpha(&amp;A):</translation>
-    </message>
-    <message>
-        <source>E&amp;ps:</source>
-        <translation>Eps(&amp;P):</translation>
-    </message>
-    <message>
-        <source>Dh N&amp;ode:</source>
-        <translation>Dh Node(&amp;O):</translation>
-    </message>
-    <message>
-        <source>&amp;Zeta Min:</source>
-        <translation>Zeta Min(&amp;Z):</translation>
-    </message>
-    <message>
-        <source>St&amp;ruc Fac:</source>
-        <translation>Struc Fac(&amp;R):</translation>
-    </message>
-    <message>
-        <source>&amp;Inter1Max:</source>
-        <translation>Inter1Max(&amp;I):</translation>
-    </message>
-    <message>
-        <source>&amp;NoIter:</source>
-        <translation>NoIter(&amp;N):</translation>
-    </message>
-    <message>
-        <source>&amp;MaxIterSteady:</source>
-        <translation>MaxIterSteady(&amp;M):</translation>
-    </message>
-    <message>
-        <source>Fro&amp;udeMax:</source>
-        <translation>FroudeMax(&amp;U):</translation>
-    </message>
-    <message>
-        <source>FroudeE&amp;xp:</source>
-        <translation>FroudeExp(&amp;X):</translation>
-    </message>
-    <message>
         <source>Switches</source>
         <translation>スイッチ</translation>
     </message>
@@ -204,10 +68,6 @@
     <message>
         <source>(Energy - Not Avail.)</source>
         <translation>(エネルギー - 利用不可)</translation>
-    </message>
-    <message>
-        <source>Theta:</source>
-        <translation>Theta:</translation>
     </message>
 </context>
 <context>
@@ -242,10 +102,6 @@
     <message>
         <source>Iteration</source>
         <translation>反復計算</translation>
-    </message>
-    <message>
-        <source>&amp;Maximum number of iterations:</source>
-        <translation>最大反復回数(&amp;M):</translation>
     </message>
     <message>
         <source>Encroachment set-ups</source>
@@ -291,10 +147,6 @@
         <translation>全体値</translation>
     </message>
     <message>
-        <source>Flood Plain &amp;Resistance:</source>
-        <translation>高水敷の抵抗(&amp;R):</translation>
-    </message>
-    <message>
         <source>Local Values</source>
         <translation>地点別の値</translation>
     </message>
@@ -306,64 +158,20 @@
         <translation>熱収支計算</translation>
     </message>
     <message>
-        <source>&amp;Included</source>
-        <translation>計算する(&amp;I)</translation>
-    </message>
-    <message>
         <source>Location</source>
         <translation>位置</translation>
-    </message>
-    <message>
-        <source>L&amp;atitude (N pos.)</source>
-        <translation>緯度(北緯を正)(&amp;A)</translation>
-    </message>
-    <message>
-        <source>L&amp;ongitude (W pos.)</source>
-        <translation>経度(西経を正)(&amp;O)</translation>
-    </message>
-    <message>
-        <source>&amp;Time meridian zone (W pos.)</source>
-        <translation>標準時子午線(西経を正)(&amp;T)</translation>
-    </message>
-    <message>
-        <source>&amp;Displacement in time</source>
-        <translation>時刻のずれ(&amp;D)</translation>
     </message>
     <message>
         <source>Solar absorption</source>
         <translation>日射の吸収</translation>
     </message>
     <message>
-        <source>Li&amp;ght attenuation</source>
-        <translation>光の減衰(&amp;G)</translation>
-    </message>
-    <message>
-        <source>&amp;Constant in Beer&apos;s law</source>
-        <translation>ベールの法則の定数(&amp;C)</translation>
-    </message>
-    <message>
         <source>Radiation under cloudy skies</source>
         <translation>曇天時の放射</translation>
     </message>
     <message>
-        <source>&amp;Parameter A</source>
-        <translation>パラメータA(&amp;P)</translation>
-    </message>
-    <message>
-        <source>Parameter &amp;B</source>
-        <translation>パラメータB(&amp;B)</translation>
-    </message>
-    <message>
         <source>Vaporization</source>
         <translation>蒸発</translation>
-    </message>
-    <message>
-        <source>Pa&amp;rameter A</source>
-        <translation>パラメータA(&amp;R)</translation>
-    </message>
-    <message>
-        <source>Para&amp;meter B</source>
-        <translation>パラメータB(&amp;M)</translation>
     </message>
 </context>
 <context>
@@ -377,28 +185,8 @@
         <translation>全体値</translation>
     </message>
     <message>
-        <source>Water &amp;Depth</source>
-        <translation>水深(&amp;D)</translation>
-    </message>
-    <message>
         <source>Local Values</source>
         <translation>地点別の値</translation>
-    </message>
-    <message>
-        <source>Wa&amp;ter Level</source>
-        <translation>水位(&amp;T)</translation>
-    </message>
-    <message>
-        <source>Wate&amp;r Level</source>
-        <translation>水位(&amp;R)</translation>
-    </message>
-    <message>
-        <source>Water De&amp;pth</source>
-        <translation>水深(&amp;P)</translation>
-    </message>
-    <message>
-        <source>Di&amp;scharge:</source>
-        <translation>流量(&amp;S):</translation>
     </message>
 </context>
 <context>
@@ -412,24 +200,8 @@
         <translation>全体値</translation>
     </message>
     <message>
-        <source>&amp;Interface level (h0)</source>
-        <translation>界面の標高(h0)(&amp;I)</translation>
-    </message>
-    <message>
-        <source>Discharge &amp;toplayer (Q1)</source>
-        <translation>上層の流量(Q1)(&amp;T)</translation>
-    </message>
-    <message>
-        <source>Discharge &amp;bottom layer (Q0)</source>
-        <translation>下層の流量(Q0)(&amp;B)</translation>
-    </message>
-    <message>
         <source>Local values</source>
         <translation>地点別の値</translation>
-    </message>
-    <message>
-        <source>Wate&amp;r level (h1)</source>
-        <translation>水位(h1)(&amp;R)</translation>
     </message>
 </context>
 <context>
@@ -437,34 +209,6 @@
     <message>
         <source>Model Constants</source>
         <translation>モデル定数</translation>
-    </message>
-    <message>
-        <source>&amp;Interface Friction Factor</source>
-        <translation>界面摩擦係数(&amp;I)</translation>
-    </message>
-    <message>
-        <source>Minimum layer &amp;thickness for entrainment cutoff</source>
-        <translation>連行を打ち切る最小層厚(&amp;T)</translation>
-    </message>
-    <message>
-        <source>Minimum relative &amp;density difference</source>
-        <translation>最小相対密度差(&amp;D)</translation>
-    </message>
-    <message>
-        <source>&amp;Action for disappearing interface</source>
-        <translation>界面消失時の処理(&amp;A)</translation>
-    </message>
-    <message>
-        <source>Nothing</source>
-        <translation>処理なし</translation>
-    </message>
-    <message>
-        <source>Moving interface up</source>
-        <translation>界面を上へ移動</translation>
-    </message>
-    <message>
-        <source>Moving interface down</source>
-        <translation>界面を下へ移動</translation>
     </message>
     <message>
         <source>Richardsens Bulk Flux No.</source>
@@ -475,43 +219,15 @@
         <translation>全体値</translation>
     </message>
     <message>
-        <source>R1 &amp;upward entrainment</source>
-        <translation>R1 上向きの連行(&amp;U)</translation>
-    </message>
-    <message>
-        <source>R1 d&amp;ownward entrainment</source>
-        <translation>R1 下向きの連行(&amp;O)</translation>
-    </message>
-    <message>
-        <source>&amp;Rs upward entrainment at controls</source>
-        <translation>Rs 支配断面での上向きの連行(&amp;R)</translation>
-    </message>
-    <message>
         <source>Local values</source>
         <translation>地点別の値</translation>
-    </message>
-    <message>
-        <source>&amp;Maximum volume of entrainment</source>
-        <translation>最大連行量(&amp;M)</translation>
-    </message>
-    <message>
-        <source>Ma&amp;ximum entrainment velocity</source>
-        <translation>最大連行速度(&amp;X)</translation>
     </message>
 </context>
 <context>
     <name>CLeakagePage</name>
     <message>
-        <source>&amp;Include Leakage</source>
-        <translation>漏水を考慮する(&amp;I)</translation>
-    </message>
-    <message>
         <source>Global Leakage Coefficient</source>
         <translation>漏水係数の全体値</translation>
-    </message>
-    <message>
-        <source>&amp;Coefficient:</source>
-        <translation>係数(&amp;C):</translation>
     </message>
     <message>
         <source>Local Leakage Coefficients</source>
@@ -528,10 +244,6 @@
 <context>
     <name>CMapsPage</name>
     <message>
-        <source>&amp;Generate maps</source>
-        <translation>マップを作成する(&amp;G)</translation>
-    </message>
-    <message>
         <source>Output</source>
         <translation>出力</translation>
     </message>
@@ -544,24 +256,8 @@
         <translation>入力地形</translation>
     </message>
     <message>
-        <source>Apply DEM data between river &amp;cross-sections</source>
-        <translation>河川横断面の間にもDEMデータを使用する(&amp;C)</translation>
-    </message>
-    <message>
         <source>DEM input files</source>
         <translation>DEM入力ファイル</translation>
-    </message>
-    <message>
-        <source>&amp;Map additional flooded areas using help grid from KVR GIS</source>
-        <translation>KVR GISの補助グリッドで追加の浸水域を表示する(&amp;M)</translation>
-    </message>
-    <message>
-        <source>&amp;Apply DEM input data for ground elevations</source>
-        <translation>地盤高にDEM入力データを使用する(&amp;A)</translation>
-    </message>
-    <message>
-        <source>Hel&amp;p grid</source>
-        <translation>補助グリッド(&amp;P)</translation>
     </message>
 </context>
 <context>
@@ -573,22 +269,6 @@
     <message>
         <source>Global Values</source>
         <translation>全体値</translation>
-    </message>
-    <message>
-        <source>Mixing coefficient f&amp;1:</source>
-        <translation>混合係数f1(&amp;1):</translation>
-    </message>
-    <message>
-        <source>Mixing coefficient f&amp;2:</source>
-        <translation>混合係数f2(&amp;2):</translation>
-    </message>
-    <message>
-        <source>Mixing coefficient f&amp;3:</source>
-        <translation>混合係数f3(&amp;3):</translation>
-    </message>
-    <message>
-        <source>Mixing coefficient f&amp;4:</source>
-        <translation>混合係数f4(&amp;4):</translation>
     </message>
     <message>
         <source>Local Values</source>
@@ -621,82 +301,6 @@
         <source>Structures</source>
         <translation>構造物</translation>
     </message>
-    <message>
-        <source>Velocity</source>
-        <translation>流速</translation>
-    </message>
-    <message>
-        <source>Discharge</source>
-        <translation>流量</translation>
-    </message>
-    <message>
-        <source>Cross Section Area</source>
-        <translation>流水断面積</translation>
-    </message>
-    <message>
-        <source>Flow Width</source>
-        <translation>水面幅</translation>
-    </message>
-    <message>
-        <source>Radius</source>
-        <translation>径深</translation>
-    </message>
-    <message>
-        <source>Resistance</source>
-        <translation>抵抗値</translation>
-    </message>
-    <message>
-        <source>Conveyance</source>
-        <translation>通水能</translation>
-    </message>
-    <message>
-        <source>Froude Number</source>
-        <translation>フルード数</translation>
-    </message>
-    <message>
-        <source>Volume</source>
-        <translation>貯水量</translation>
-    </message>
-    <message>
-        <source>Flood Area</source>
-        <translation>氾濫面積</translation>
-    </message>
-    <message>
-        <source>Mass Error</source>
-        <translation>質量誤差</translation>
-    </message>
-    <message>
-        <source>Accumulated Mass Error</source>
-        <translation>累積質量誤差</translation>
-    </message>
-    <message>
-        <source>Lateral Inflows</source>
-        <translation>横流入量</translation>
-    </message>
-    <message>
-        <source>Water level slope</source>
-        <translation>水面勾配</translation>
-    </message>
-    <message>
-        <source>Energy level slope</source>
-        <translation>エネルギー勾配</translation>
-    </message>
-    <message>
-        <source>Energy level</source>
-        <translation>エネルギー水位</translation>
-    </message>
-    <message>
-        <source>Bed shear stress</source>
-        <translation>河床せん断応力</translation>
-    </message>
-    <message>
-        <source>Groundwater head</source>
-        <translation>地下水頭</translation>
-    </message>
-    <message>
-        <source>Time Step</source>
-        <translation>計算時間間隔</translation>
-    </message>
 </context>
 <context>
     <name>CQuasiPage</name>
@@ -705,100 +309,16 @@
         <translation>計算パラメータ</translation>
     </message>
     <message>
-        <source>&amp;Relax:</source>
-        <translation>Relax(&amp;R):</translation>
-    </message>
-    <message>
-        <source>&amp;Beta_Limit:</source>
-        <translation>Beta_Limit(&amp;B):</translation>
-    </message>
-    <message>
-        <source>&amp;Qconv_Factor:</source>
-        <translation>Qconv_Factor(&amp;Q):</translation>
-    </message>
-    <message>
-        <source>&amp;Min_Hconv_In_Branch:</source>
-        <translation>Min_Hconv_In_Branch(&amp;M):</translation>
-    </message>
-    <message>
-        <source>Q_&amp;struc_Factor:</source>
-        <translation>Q_struc_Factor(&amp;S):</translation>
-    </message>
-    <message>
-        <source>Hs&amp;top:</source>
-        <translation>Hstop(&amp;T):</translation>
-    </message>
-    <message>
         <source>Steady State Options</source>
         <translation>定常計算のオプション</translation>
-    </message>
-    <message>
-        <source>&amp;Use energy equation</source>
-        <translation>エネルギー式を用いる(&amp;U)</translation>
-    </message>
-    <message>
-        <source>&amp;Allow upstream slope</source>
-        <translation>上流向きの水面勾配を許す(&amp;A)</translation>
-    </message>
-    <message>
-        <source>&amp;No suppression of convective terms</source>
-        <translation>移流項を抑制しない(&amp;N)</translation>
-    </message>
-    <message>
-        <source>Default</source>
-        <translation>既定</translation>
-    </message>
-    <message>
-        <source>Average conveyance</source>
-        <translation>通水能の平均</translation>
-    </message>
-    <message>
-        <source>Average friction</source>
-        <translation>摩擦勾配の算術平均</translation>
-    </message>
-    <message>
-        <source>Geometric mean</source>
-        <translation>幾何平均</translation>
-    </message>
-    <message>
-        <source>Harmonic mean</source>
-        <translation>調和平均</translation>
     </message>
     <message>
         <source>Contraction expansion coefficients</source>
         <translation>急縮・急拡損失係数</translation>
     </message>
     <message>
-        <source>&amp;Contraction</source>
-        <translation>急縮(&amp;C)</translation>
-    </message>
-    <message>
-        <source>E&amp;xpansion</source>
-        <translation>急拡(&amp;X)</translation>
-    </message>
-    <message>
         <source>Load branch an&amp;d chainages</source>
         <translation>河川名と追加距離の読み込み(&amp;D)</translation>
-    </message>
-    <message>
-        <source>Fac_&amp;0:</source>
-        <translation>Fac_0(&amp;0):</translation>
-    </message>
-    <message>
-        <source>Hc&amp;onv_Factor:</source>
-        <translation>Hconv_Factor(&amp;O):</translation>
-    </message>
-    <message>
-        <source>Model contraction and ex&amp;pansion losses</source>
-        <translation>急縮・急拡損失を考慮する(&amp;P)</translation>
-    </message>
-    <message>
-        <source>Velocit&amp;y distribution coefficient based on conveyance</source>
-        <translation>通水能から流速分布係数を求める(&amp;Y)</translation>
-    </message>
-    <message>
-        <source>Fr&amp;iction slope evaluation</source>
-        <translation>摩擦勾配の評価(&amp;I)</translation>
     </message>
 </context>
 <context>
@@ -808,10 +328,6 @@
         <translation>高水敷の区間長</translation>
     </message>
     <message>
-        <source>&amp;Use energy equation</source>
-        <translation>エネルギー式を用いる(&amp;U)</translation>
-    </message>
-    <message>
         <source>Load &amp;branch and chainages</source>
         <translation>河川名と追加距離の読み込み(&amp;B)</translation>
     </message>
@@ -819,104 +335,28 @@
 <context>
     <name>CStratificationPage</name>
     <message>
-        <source>&amp;No. of layers</source>
-        <translation>層の数(&amp;N)</translation>
-    </message>
-    <message>
-        <source>&amp;Densities calculated</source>
-        <translation>密度を計算する(&amp;D)</translation>
-    </message>
-    <message>
         <source>Turbulence model</source>
         <translation>乱流モデル</translation>
-    </message>
-    <message>
-        <source>V&amp;iscosity</source>
-        <translation>粘性係数(&amp;I)</translation>
-    </message>
-    <message>
-        <source>Turb&amp;ulence model in fluid</source>
-        <translation>流体中の乱流モデル(&amp;U)</translation>
-    </message>
-    <message>
-        <source>constant</source>
-        <translation>一定</translation>
-    </message>
-    <message>
-        <source>mixing-length</source>
-        <translation>混合距離</translation>
-    </message>
-    <message>
-        <source>k model</source>
-        <translation>kモデル</translation>
-    </message>
-    <message>
-        <source>k-eps model</source>
-        <translation>k-εモデル</translation>
-    </message>
-    <message>
-        <source>Turbulence model at &amp;bed</source>
-        <translation>河床の乱流モデル(&amp;B)</translation>
-    </message>
-    <message>
-        <source>drag coefficient</source>
-        <translation>抗力係数</translation>
     </message>
     <message>
         <source>Corrections (reductions)</source>
         <translation>補正(低減)</translation>
     </message>
     <message>
-        <source>&amp;Richardson numbers correction</source>
-        <translation>リチャードソン数による補正(&amp;R)</translation>
-    </message>
-    <message>
         <source>Baroclinic Pressure</source>
         <translation>傾圧項</translation>
-    </message>
-    <message>
-        <source>Fa&amp;ctor</source>
-        <translation>係数(&amp;C)</translation>
-    </message>
-    <message>
-        <source>L&amp;ocal bed slope</source>
-        <translation>局所河床勾配(&amp;O)</translation>
     </message>
     <message>
         <source>Convection / Advection</source>
         <translation>移流</translation>
     </message>
     <message>
-        <source>Factor hori&amp;zontal momentum</source>
-        <translation>水平運動量の係数(&amp;Z)</translation>
-    </message>
-    <message>
-        <source>Factor vertical &amp;momentum</source>
-        <translation>鉛直運動量の係数(&amp;M)</translation>
-    </message>
-    <message>
-        <source>Factor &amp;advection</source>
-        <translation>移流の係数(&amp;A)</translation>
-    </message>
-    <message>
         <source>Dispersion</source>
         <translation>分散</translation>
-    </message>
-    <message>
-        <source>Factor horizontal vi&amp;scosity</source>
-        <translation>水平渦動粘性の係数(&amp;S)</translation>
-    </message>
-    <message>
-        <source>Factor vertical viscosit&amp;y</source>
-        <translation>鉛直渦動粘性の係数(&amp;Y)</translation>
     </message>
 </context>
 <context>
     <name>CTextOutputPage</name>
-    <message>
-        <source>&amp;Generate time series output files</source>
-        <translation>時系列出力ファイルを作成する(&amp;G)</translation>
-    </message>
     <message>
         <source>Output files</source>
         <translation>出力ファイル</translation>
@@ -924,10 +364,6 @@
     <message>
         <source>Text file settings</source>
         <translation>テキストファイルの設定</translation>
-    </message>
-    <message>
-        <source>&amp;Delimiter in output file</source>
-        <translation>区切り文字(&amp;D)</translation>
     </message>
     <message>
         <source>&amp;Minimum</source>
@@ -950,10 +386,6 @@
         <translation>出力期間</translation>
     </message>
     <message>
-        <source>&amp;Start</source>
-        <translation>開始(&amp;S)</translation>
-    </message>
-    <message>
         <source>Items in output</source>
         <translation>出力項目</translation>
     </message>
@@ -965,30 +397,6 @@
         <source>Selected grid points in output</source>
         <translation>出力する格子点の選択</translation>
     </message>
-    <message>
-        <source>&amp;All</source>
-        <translation>すべて(&amp;A)</translation>
-    </message>
-    <message>
-        <source>Only from the l&amp;ist</source>
-        <translation>一覧のもののみ(&amp;I)</translation>
-    </message>
-    <message>
-        <source>All ex&amp;cepted those from the list</source>
-        <translation>一覧のものを除くすべて(&amp;C)</translation>
-    </message>
-    <message>
-        <source>Width of col&amp;umns</source>
-        <translation>列幅(&amp;U)</translation>
-    </message>
-    <message>
-        <source>Limited output &amp;period</source>
-        <translation>出力期間を限定する(&amp;P)</translation>
-    </message>
-    <message>
-        <source>E&amp;nd</source>
-        <translation>終了(&amp;N)</translation>
-    </message>
 </context>
 <context>
     <name>CWLCurvePage</name>
@@ -997,32 +405,12 @@
         <translation>システムで決定</translation>
     </message>
     <message>
-        <source>Average &amp;Range</source>
-        <translation>平均範囲(&amp;R)</translation>
-    </message>
-    <message>
-        <source>&amp;Curvature Radius</source>
-        <translation>曲率半径(&amp;C)</translation>
-    </message>
-    <message>
         <source>Values</source>
         <translation>値</translation>
     </message>
     <message>
         <source>Water level increment due to curve</source>
         <translation>湾曲による水位上昇</translation>
-    </message>
-    <message>
-        <source>Enabling water level &amp;increment due to curve</source>
-        <translation>湾曲による水位上昇を考慮する(&amp;I)</translation>
-    </message>
-    <message>
-        <source>Water &amp;Surface width</source>
-        <translation>水面幅(&amp;S)</translation>
-    </message>
-    <message>
-        <source>Veloci&amp;ty</source>
-        <translation>流速(&amp;T)</translation>
     </message>
     <message>
         <source>Load &amp;Branch &amp;&amp; Chainage</source>
@@ -1047,24 +435,12 @@
         <translation>方法</translation>
     </message>
     <message>
-        <source>&amp;Slope / Low Water channel Width / Water Area of Annual Max Discharge</source>
-        <translation>河床勾配・低水路幅・年最大流量時の流積(&amp;S)</translation>
-    </message>
-    <message>
-        <source>&amp;dH (Observed)</source>
-        <translation>dH(実測値)(&amp;D)</translation>
-    </message>
-    <message>
         <source>Values</source>
         <translation>値</translation>
     </message>
     <message>
         <source>Water level increment due to sand bars</source>
         <translation>砂州による水位上昇</translation>
-    </message>
-    <message>
-        <source>Enabling water level &amp;increment due to sand bars</source>
-        <translation>砂州による水位上昇を考慮する(&amp;I)</translation>
     </message>
     <message>
         <source>Load &amp;Branch &amp;&amp; Chainage</source>
@@ -1082,28 +458,8 @@
         <translation>全体値</translation>
     </message>
     <message>
-        <source>High Order Fully Dynamic</source>
-        <translation>高次ダイナミックウェーブ</translation>
-    </message>
-    <message>
-        <source>Fully Dynamic</source>
-        <translation>ダイナミックウェーブ</translation>
-    </message>
-    <message>
-        <source>Diffusive Wave</source>
-        <translation>拡散波近似</translation>
-    </message>
-    <message>
-        <source>Kinematic Wave</source>
-        <translation>キネマティックウェーブ近似</translation>
-    </message>
-    <message>
         <source>Local Values</source>
         <translation>地点別の値</translation>
-    </message>
-    <message>
-        <source>Wave &amp;Approximation:</source>
-        <translation>波動近似(&amp;A):</translation>
     </message>
 </context>
 <context>
@@ -1113,20 +469,8 @@
         <translation>風の係数</translation>
     </message>
     <message>
-        <source>&amp;Include wind</source>
-        <translation>風を考慮する(&amp;I)</translation>
-    </message>
-    <message>
         <source>Global Factor</source>
         <translation>全体の係数</translation>
-    </message>
-    <message>
-        <source>To&amp;pographical Factor</source>
-        <translation>地形係数(&amp;P)</translation>
-    </message>
-    <message>
-        <source>Fri&amp;ction Factor</source>
-        <translation>摩擦係数(&amp;C)</translation>
     </message>
     <message>
         <source>Local Factors</source>
@@ -2084,6 +1428,586 @@ true または false
 ターゲット [%1]
 より多くのパラメータ、またはより小さい個数
 この名前は 1 つだけ (最初のものが有効)</translation>
+    </message>
+    <message>
+        <source>&amp;Resistance:</source>
+        <translation>抵抗値(&amp;R):</translation>
+    </message>
+    <message>
+        <source>Zone &amp;1 (main channel):</source>
+        <translation>区分1(低水路)(&amp;1):</translation>
+    </message>
+    <message>
+        <source>Zone &amp;2 (transition):</source>
+        <translation>区分2(遷移部)(&amp;2):</translation>
+    </message>
+    <message>
+        <source>Zone &amp;3 (flood plain):</source>
+        <translation>区分3(高水敷)(&amp;3):</translation>
+    </message>
+    <message>
+        <source>&amp;Uniform section
+&amp;Three zones</source>
+        <translation>断面一様(&amp;U)
+3区分(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Re&amp;sistance formula:</source>
+        <translation>抵抗則(&amp;S):</translation>
+    </message>
+    <message>
+        <source>Manning&apos;s M
+Manning&apos;s n
+Chezy</source>
+        <translation>マニングのM(粗度係数の逆数)
+マニングの粗度係数n
+シェジー係数</translation>
+    </message>
+    <message>
+        <source>&amp;Method:</source>
+        <translation>方法(&amp;M):</translation>
+    </message>
+    <message>
+        <source>Not used
+Coefficients a and b
+Table over velocity</source>
+        <translation>使用しない
+係数aとb
+流速に対する表</translation>
+    </message>
+    <message>
+        <source>Zone &amp;1</source>
+        <translation>区分1(&amp;1)</translation>
+    </message>
+    <message>
+        <source>Zone &amp;2</source>
+        <translation>区分2(&amp;2)</translation>
+    </message>
+    <message>
+        <source>Zone &amp;3</source>
+        <translation>区分3(&amp;3)</translation>
+    </message>
+    <message>
+        <source>Coefficient &amp;a:</source>
+        <translation>係数a(&amp;A):</translation>
+    </message>
+    <message>
+        <source>Coefficient &amp;b:</source>
+        <translation>係数b(&amp;B):</translation>
+    </message>
+    <message>
+        <source>Mi&amp;nimum resistance:</source>
+        <translation>最小抵抗値(&amp;N):</translation>
+    </message>
+    <message>
+        <source>Ma&amp;ximum resistance:</source>
+        <translation>最大抵抗値(&amp;X):</translation>
+    </message>
+    <message>
+        <source>Del&amp;ta:</source>
+        <translation>Delta(&amp;T):</translation>
+    </message>
+    <message>
+        <source>Delh&amp;s:</source>
+        <translation>Delhs(&amp;S):</translation>
+    </message>
+    <message>
+        <source>&amp;Delh:</source>
+        <translation>Delh(&amp;D):</translation>
+    </message>
+    <message>
+        <source>&amp;Alpha:</source>
+        <translation>Alpha(&amp;A):</translation>
+    </message>
+    <message>
+        <source>Theta:</source>
+        <translation>Theta:</translation>
+    </message>
+    <message>
+        <source>E&amp;ps:</source>
+        <translation>Eps(&amp;P):</translation>
+    </message>
+    <message>
+        <source>Dh N&amp;ode:</source>
+        <translation>Dh Node(&amp;O):</translation>
+    </message>
+    <message>
+        <source>&amp;Zeta Min:</source>
+        <translation>Zeta Min(&amp;Z):</translation>
+    </message>
+    <message>
+        <source>St&amp;ruc Fac:</source>
+        <translation>Struc Fac(&amp;R):</translation>
+    </message>
+    <message>
+        <source>Fro&amp;udeMax:</source>
+        <translation>FroudeMax(&amp;U):</translation>
+    </message>
+    <message>
+        <source>FroudeE&amp;xp:</source>
+        <translation>FroudeExp(&amp;X):</translation>
+    </message>
+    <message>
+        <source>&amp;Inter1Max:</source>
+        <translation>Inter1Max(&amp;I):</translation>
+    </message>
+    <message>
+        <source>&amp;MaxIterSteady:</source>
+        <translation>MaxIterSteady(&amp;M):</translation>
+    </message>
+    <message>
+        <source>&amp;NoIter:</source>
+        <translation>NoIter(&amp;N):</translation>
+    </message>
+    <message>
+        <source>&amp;Maximum number of iterations:</source>
+        <translation>最大反復回数(&amp;M):</translation>
+    </message>
+    <message>
+        <source>Flood Plain &amp;Resistance:</source>
+        <translation>高水敷の抵抗(&amp;R):</translation>
+    </message>
+    <message>
+        <source>&amp;Included</source>
+        <translation>計算する(&amp;I)</translation>
+    </message>
+    <message>
+        <source>L&amp;atitude (N pos.)</source>
+        <translation>緯度(北緯を正)(&amp;A)</translation>
+    </message>
+    <message>
+        <source>L&amp;ongitude (W pos.)</source>
+        <translation>経度(西経を正)(&amp;O)</translation>
+    </message>
+    <message>
+        <source>&amp;Time meridian zone (W pos.)</source>
+        <translation>標準時子午線(西経を正)(&amp;T)</translation>
+    </message>
+    <message>
+        <source>&amp;Displacement in time</source>
+        <translation>時刻のずれ(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Li&amp;ght attenuation</source>
+        <translation>光の減衰(&amp;G)</translation>
+    </message>
+    <message>
+        <source>&amp;Constant in Beer&apos;s law</source>
+        <translation>ベールの法則の定数(&amp;C)</translation>
+    </message>
+    <message>
+        <source>&amp;Parameter A</source>
+        <translation>パラメータA(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Parameter &amp;B</source>
+        <translation>パラメータB(&amp;B)</translation>
+    </message>
+    <message>
+        <source>Pa&amp;rameter A</source>
+        <translation>パラメータA(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Para&amp;meter B</source>
+        <translation>パラメータB(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Wate&amp;r Level</source>
+        <translation>水位(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Water De&amp;pth</source>
+        <translation>水深(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Di&amp;scharge:</source>
+        <translation>流量(&amp;S):</translation>
+    </message>
+    <message>
+        <source>Wa&amp;ter Level
+Water &amp;Depth</source>
+        <translation>水位(&amp;T)
+水深(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Wate&amp;r level (h1)</source>
+        <translation>水位(h1)(&amp;R)</translation>
+    </message>
+    <message>
+        <source>&amp;Interface level (h0)</source>
+        <translation>界面の標高(h0)(&amp;I)</translation>
+    </message>
+    <message>
+        <source>Discharge &amp;toplayer (Q1)</source>
+        <translation>上層の流量(Q1)(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Discharge &amp;bottom layer (Q0)</source>
+        <translation>下層の流量(Q0)(&amp;B)</translation>
+    </message>
+    <message>
+        <source>&amp;Interface Friction Factor</source>
+        <translation>界面摩擦係数(&amp;I)</translation>
+    </message>
+    <message>
+        <source>&amp;Maximum volume of entrainment</source>
+        <translation>最大連行量(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Ma&amp;ximum entrainment velocity</source>
+        <translation>最大連行速度(&amp;X)</translation>
+    </message>
+    <message>
+        <source>Minimum layer &amp;thickness for entrainment cutoff</source>
+        <translation>連行を打ち切る最小層厚(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Minimum relative &amp;density difference</source>
+        <translation>最小相対密度差(&amp;D)</translation>
+    </message>
+    <message>
+        <source>&amp;Action for disappearing interface</source>
+        <translation>界面消失時の処理(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Nothing
+Moving interface up
+Moving interface down</source>
+        <translation>処理なし
+界面を上へ移動
+界面を下へ移動</translation>
+    </message>
+    <message>
+        <source>R1 &amp;upward entrainment</source>
+        <translation>R1 上向きの連行(&amp;U)</translation>
+    </message>
+    <message>
+        <source>R1 d&amp;ownward entrainment</source>
+        <translation>R1 下向きの連行(&amp;O)</translation>
+    </message>
+    <message>
+        <source>&amp;Rs upward entrainment at controls</source>
+        <translation>Rs 支配断面での上向きの連行(&amp;R)</translation>
+    </message>
+    <message>
+        <source>&amp;Include Leakage</source>
+        <translation>漏水を考慮する(&amp;I)</translation>
+    </message>
+    <message>
+        <source>&amp;Coefficient:</source>
+        <translation>係数(&amp;C):</translation>
+    </message>
+    <message>
+        <source>&amp;Generate maps</source>
+        <translation>マップを作成する(&amp;G)</translation>
+    </message>
+    <message>
+        <source>&amp;Apply DEM input data for ground elevations</source>
+        <translation>地盤高にDEM入力データを使用する(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Apply DEM data between river &amp;cross-sections</source>
+        <translation>河川横断面の間にもDEMデータを使用する(&amp;C)</translation>
+    </message>
+    <message>
+        <source>&amp;Map additional flooded areas using help grid from KVR GIS</source>
+        <translation>KVR GISの補助グリッドで追加の浸水域を表示する(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Hel&amp;p grid</source>
+        <translation>補助グリッド(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Mixing coefficient f&amp;1:</source>
+        <translation>混合係数f1(&amp;1):</translation>
+    </message>
+    <message>
+        <source>Mixing coefficient f&amp;2:</source>
+        <translation>混合係数f2(&amp;2):</translation>
+    </message>
+    <message>
+        <source>Mixing coefficient f&amp;3:</source>
+        <translation>混合係数f3(&amp;3):</translation>
+    </message>
+    <message>
+        <source>Mixing coefficient f&amp;4:</source>
+        <translation>混合係数f4(&amp;4):</translation>
+    </message>
+    <message>
+        <source>&amp;Relax:</source>
+        <translation>Relax(&amp;R):</translation>
+    </message>
+    <message>
+        <source>&amp;Beta_Limit:</source>
+        <translation>Beta_Limit(&amp;B):</translation>
+    </message>
+    <message>
+        <source>Fac_&amp;0:</source>
+        <translation>Fac_0(&amp;0):</translation>
+    </message>
+    <message>
+        <source>&amp;Qconv_Factor:</source>
+        <translation>Qconv_Factor(&amp;Q):</translation>
+    </message>
+    <message>
+        <source>Hc&amp;onv_Factor:</source>
+        <translation>Hconv_Factor(&amp;O):</translation>
+    </message>
+    <message>
+        <source>&amp;Min_Hconv_In_Branch:</source>
+        <translation>Min_Hconv_In_Branch(&amp;M):</translation>
+    </message>
+    <message>
+        <source>Q_&amp;struc_Factor:</source>
+        <translation>Q_struc_Factor(&amp;S):</translation>
+    </message>
+    <message>
+        <source>Hs&amp;top:</source>
+        <translation>Hstop(&amp;T):</translation>
+    </message>
+    <message>
+        <source>&amp;Use energy equation</source>
+        <translation>エネルギー式を用いる(&amp;U)</translation>
+    </message>
+    <message>
+        <source>Model contraction and ex&amp;pansion losses</source>
+        <translation>急縮・急拡損失を考慮する(&amp;P)</translation>
+    </message>
+    <message>
+        <source>&amp;Allow upstream slope</source>
+        <translation>上流向きの水面勾配を許す(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Velocit&amp;y distribution coefficient based on conveyance</source>
+        <translation>通水能から流速分布係数を求める(&amp;Y)</translation>
+    </message>
+    <message>
+        <source>&amp;No suppression of convective terms</source>
+        <translation>移流項を抑制しない(&amp;N)</translation>
+    </message>
+    <message>
+        <source>Fr&amp;iction slope evaluation</source>
+        <translation>摩擦勾配の評価(&amp;I)</translation>
+    </message>
+    <message>
+        <source>Default
+Average conveyance
+Average friction
+Geometric mean
+Harmonic mean</source>
+        <translation>既定
+通水能の平均
+摩擦勾配の算術平均
+幾何平均
+調和平均</translation>
+    </message>
+    <message>
+        <source>&amp;Contraction</source>
+        <translation>急縮(&amp;C)</translation>
+    </message>
+    <message>
+        <source>E&amp;xpansion</source>
+        <translation>急拡(&amp;X)</translation>
+    </message>
+    <message>
+        <source>&amp;No. of layers</source>
+        <translation>層の数(&amp;N)</translation>
+    </message>
+    <message>
+        <source>&amp;Densities calculated</source>
+        <translation>密度を計算する(&amp;D)</translation>
+    </message>
+    <message>
+        <source>V&amp;iscosity</source>
+        <translation>粘性係数(&amp;I)</translation>
+    </message>
+    <message>
+        <source>Turb&amp;ulence model in fluid</source>
+        <translation>流体中の乱流モデル(&amp;U)</translation>
+    </message>
+    <message>
+        <source>constant
+mixing-length
+k model
+k-eps model</source>
+        <translation>一定
+混合距離
+kモデル
+k-εモデル</translation>
+    </message>
+    <message>
+        <source>Turbulence model at &amp;bed</source>
+        <translation>河床の乱流モデル(&amp;B)</translation>
+    </message>
+    <message>
+        <source>drag coefficient</source>
+        <translation>抗力係数</translation>
+    </message>
+    <message>
+        <source>&amp;Richardson numbers correction</source>
+        <translation>リチャードソン数による補正(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Fa&amp;ctor</source>
+        <translation>係数(&amp;C)</translation>
+    </message>
+    <message>
+        <source>L&amp;ocal bed slope</source>
+        <translation>局所河床勾配(&amp;O)</translation>
+    </message>
+    <message>
+        <source>Factor hori&amp;zontal momentum</source>
+        <translation>水平運動量の係数(&amp;Z)</translation>
+    </message>
+    <message>
+        <source>Factor vertical &amp;momentum</source>
+        <translation>鉛直運動量の係数(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Factor &amp;advection</source>
+        <translation>移流の係数(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Factor horizontal vi&amp;scosity</source>
+        <translation>水平渦動粘性の係数(&amp;S)</translation>
+    </message>
+    <message>
+        <source>Factor vertical viscosit&amp;y</source>
+        <translation>鉛直渦動粘性の係数(&amp;Y)</translation>
+    </message>
+    <message>
+        <source>&amp;Generate time series output files</source>
+        <translation>時系列出力ファイルを作成する(&amp;G)</translation>
+    </message>
+    <message>
+        <source>&amp;Delimiter in output file</source>
+        <translation>区切り文字(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Width of col&amp;umns</source>
+        <translation>列幅(&amp;U)</translation>
+    </message>
+    <message>
+        <source>Limited output &amp;period</source>
+        <translation>出力期間を限定する(&amp;P)</translation>
+    </message>
+    <message>
+        <source>&amp;Start</source>
+        <translation>開始(&amp;S)</translation>
+    </message>
+    <message>
+        <source>E&amp;nd</source>
+        <translation>終了(&amp;N)</translation>
+    </message>
+    <message>
+        <source>&amp;All
+Only from the l&amp;ist
+All ex&amp;cepted those from the list</source>
+        <translation>すべて(&amp;A)
+一覧のもののみ(&amp;I)
+一覧のものを除くすべて(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Wave &amp;Approximation:</source>
+        <translation>波動近似(&amp;A):</translation>
+    </message>
+    <message>
+        <source>&amp;Include wind</source>
+        <translation>風を考慮する(&amp;I)</translation>
+    </message>
+    <message>
+        <source>To&amp;pographical Factor</source>
+        <translation>地形係数(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Fri&amp;ction Factor</source>
+        <translation>摩擦係数(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Enabling water level &amp;increment due to curve</source>
+        <translation>湾曲による水位上昇を考慮する(&amp;I)</translation>
+    </message>
+    <message>
+        <source>Average &amp;Range</source>
+        <translation>平均範囲(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Water &amp;Surface width</source>
+        <translation>水面幅(&amp;S)</translation>
+    </message>
+    <message>
+        <source>&amp;Curvature Radius</source>
+        <translation>曲率半径(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Veloci&amp;ty</source>
+        <translation>流速(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Enabling water level &amp;increment due to sand bars</source>
+        <translation>砂州による水位上昇を考慮する(&amp;I)</translation>
+    </message>
+    <message>
+        <source>&amp;Slope / Low Water channel Width / Water Area of Annual Max Discharge
+&amp;dH (Observed)</source>
+        <translation>河床勾配・低水路幅・年最大流量時の流積(&amp;S)
+dH(実測値)(&amp;D)</translation>
+    </message>
+    <message>
+        <source>&amp;Minimum</source>
+        <translation>最小値(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Ma&amp;ximum</source>
+        <translation>最大値(&amp;X)</translation>
+    </message>
+    <message>
+        <source>Time &amp;of minimum</source>
+        <translation>最小値の時刻(&amp;O)</translation>
+    </message>
+    <message>
+        <source>&amp;Time of maximum</source>
+        <translation>最大値の時刻(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Velocity
+Discharge
+Cross Section Area
+Flow Width
+Radius
+Resistance
+Conveyance
+Froude Number
+Volume
+Flood Area
+Mass Error
+Accumulated Mass Error
+Lateral Inflows
+Water level slope
+Energy level slope
+Energy level
+Bed shear stress
+Groundwater head
+Time Step</source>
+        <translation>流速
+流量
+流水断面積
+水面幅
+径深
+抵抗値
+通水能
+フルード数
+貯水量
+氾濫面積
+質量誤差
+累積質量誤差
+横流入量
+水面勾配
+エネルギー勾配
+エネルギー水位
+河床せん断応力
+地下水頭
+計算時間間隔</translation>
     </message>
 </context>
 </TS>

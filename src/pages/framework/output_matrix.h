@@ -3,11 +3,16 @@
 
 #include <QWidget>
 
+class QCheckBox;
+
 class COutputMatrix : public QWidget
 {
     Q_OBJECT
 public:
     explicit COutputMatrix(QWidget* parent = nullptr);
+
+    /// A box has no text of its own: its row is called so, and it by its row and column.
+    void SetTitle(QCheckBox& box, const QString& title);
 
 protected:
     void paintEvent(QPaintEvent* event) override;
