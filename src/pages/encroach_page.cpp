@@ -1,8 +1,8 @@
 // "Encroachment": set-ups of narrowed flood plains, each a list of locations.
+#include "ks/fc/doc_command.h"
 #include "pages/framework/dialog_page.h"
 #include "pages/framework/location_page.h"
 #include "pages/page_table.h"
-#include "pages/setup_command.h"
 #include "ui_encroach_page.h"
 
 #include <QUndoStack>
@@ -45,6 +45,41 @@ bool IsUsed(std::string_view field, const HDEncroach& line)
         return method == ConveyanceReduction && (line.EncOption3 < 1 || line.EncOption3 >= BankByBank);
     return method == TargetLevelAndEnergy || (method == TargetLevel && field == "EncValues2.4");
 }
+
+/// A set-up more, or one less.
+class CSetupCommand : public CDocumentCommand
+{
+public:
+    /// Puts `setup` in at `index`; null takes the set-up out that stands there.
+    CSetupCommand(CKavo0_hdDoc& document, std::size_t index, std::unique_ptr<CGenParamList<HDEncroach>> setup)
+        : CDocumentCommand(document, LoadString(setup ? Str::UndoAddSetup : Str::UndoDeleteSetup)),
+          m_setups(document.Parameters().EncroachList),
+          m_index(index),
+          m_setup(std::move(setup))
+    {
+    }
+
+protected:
+    ChangePlace Apply() override { return Exchange(); }
+    ChangePlace Revert() override { return Exchange(); }
+
+private:
+    ChangePlace Exchange()
+    {
+        if (m_setup)
+            m_setups.InsertAt(m_index, std::move(m_setup));
+        else
+            m_setup = m_setups.RemoveAt(m_index);
+        if (m_setups.IsEmpty())
+            return {&m_setups};
+        CGenList& shown = m_setups.GetAt(std::min(m_index, m_setups.GetCount() - 1));
+        return {&shown, 1, 1, &shown, 1};
+    }
+
+    CGenMetaList<HDEncroach>& m_setups;
+    std::size_t m_index;
+    std::unique_ptr<CGenParamList<HDEncroach>> m_setup; // while it is out of the document
+};
 
 class CEncroachPage : public CDialogPage<Ui::CEncroachPage, CLocationPage>
 {

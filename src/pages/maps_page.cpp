@@ -4,8 +4,6 @@
 #include "pages/page_table.h"
 #include "ui_maps_page.h"
 
-#include <algorithm>
-
 namespace {
 
 constexpr int MapFileColumn = 7, DemFileColumn = 1;
@@ -37,12 +35,10 @@ class CMapsPage : public CDialogPage<Ui::CMapsPage, CLocationPage>
 {
 public:
     explicit CMapsPage(CKavo0_hdDoc* document);
-    void LoadFromDocument(CKavo0_hdDoc* document) override;
     void ButtonClicked(CGenGrid& grid, int row, int column) override;
 
 private:
     void DeclareMaps();
-    void ShowStatus();
 };
 
 CMapsPage::CMapsPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
@@ -70,6 +66,8 @@ CMapsPage::CMapsPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
         .Button({.header = LineOf(Str::DemColumns, 1), .width = 20})
         .Value(&CMapsInput::ItemNo)
         .Value(&CMapsInput::Order);
+    LeaveOut({{m_ui.maps_1226, &HasNoFile<CMapsOutput>}, {m_ui.dem_1227, &HasNoFile<CMapsInput>}}, m_ui.status_1229,
+             Str::RowsWithoutFile, Str::DroppedFile, Str::DroppedFiles);
 }
 
 void CMapsPage::DeclareMaps()
@@ -91,31 +89,6 @@ void CMapsPage::DeclareMaps()
         .Value(&M::DefaultPeriod, {.width = 20, .locked = IsNotDynamic})
         .Value(&M::StartTime, {.width = 110, .locked = IsNotDynamic})
         .Value(&M::EndTime, {.width = 110, .locked = IsNotDynamic});
-}
-
-void CMapsPage::LoadFromDocument(CKavo0_hdDoc* document)
-{
-    document->AtSave({.rows = m_ui.maps_1226->Model()->Rows(),
-                      .isIncomplete = &HasNoFile<CMapsOutput>,
-                      .oneDropped = Str::DroppedFile,
-                      .manyDropped = Str::DroppedFiles});
-    document->AtSave({.rows = m_ui.dem_1227->Model()->Rows(),
-                      .isIncomplete = &HasNoFile<CMapsInput>,
-                      .oneDropped = Str::DroppedFile,
-                      .manyDropped = Str::DroppedFiles});
-    CLocationPage::LoadFromDocument(document);
-    ShowStatus();
-}
-
-/// Rows without a file mean nothing to the simulation: a save leaves them out, and says so beforehand.
-void CMapsPage::ShowStatus()
-{
-    const HDMapOutput& maps = Globals().MapOutput;
-    const auto nameless = [](const auto& rows) {
-        return std::count_if(rows.begin(), rows.end(), [](const auto& row) { return row.FileName.empty(); });
-    };
-    const auto count = nameless(maps.MapOutputFiles) + nameless(maps.DemInputFiles);
-    m_ui.status_1229->setText(count > 0 ? LoadString(Str::RowsWithoutFile).arg(count) : QString());
 }
 
 void CMapsPage::ButtonClicked(CGenGrid& grid, int row, int /*column*/)

@@ -1,8 +1,9 @@
 #include "pages/resistance_formula.h"
 
+#include "document/document.h"
+#include "ks/fc/doc_command.h"
 #include "ks/fc/message_box.h"
 #include "ks/units/edit_style.h"
-#include "document/document.h"
 #include "res/strings.h"
 
 #include <QComboBox>
@@ -29,37 +30,43 @@ double Inverse(double resistance)
     return resistance > 0 ? 1 / resistance : resistance;
 }
 
-} // namespace
-
-// Units as in V. T. Chow, Open-Channel Hydraulics (1959), sections 5-4 and 5-6, in SI; M = 1/n is Strickler's form.
-QString ResistanceUnit(std::int32_t formula)
+/// Another formula, and other resistances with it.
+class CSwitchFormula : public CDocumentCommand
 {
-    switch (formula) {
-    case ManningM:
-        return QStringLiteral("m^(1/3)/s");
-    case ManningN:
-        return QStringLiteral("s/m^(1/3)");
-    case Chezy:
-        return QStringLiteral("m^(1/2)/s");
-    default:
-        return {};
-    }
-}
+public:
+    CSwitchFormula(CKavo0_hdDoc& document, std::int32_t formula, bool convert);
+    /// Numbers that the conversion between M and n changes.
+    std::size_t ChangeCount() const { return m_changes.size(); }
 
-double& CSwitchFormula::Change::Target() const
-{
-    return table ? (*table)[row].ResValue : *value;
-}
+protected:
+    ChangePlace Apply() override { return Set(m_after, &Change::after); }
+    ChangePlace Revert() override { return Set(m_before, &Change::before); }
+
+private:
+    /// A number of the document: in place as long as its record exists, or in a table whose rows may move.
+    struct Change
+    {
+        double* value;
+        std::vector<CBRTVeloRes>* table;
+        std::size_t row;
+        double before, after;
+        double& Target() const { return table ? (*table)[row].ResValue : *value; }
+    };
+    template <typename Tools>
+    void ConvertTools(Tools& tools);
+    ChangePlace Set(std::int32_t formula, double Change::*value);
+    void Put(double& value, double after);
+    void Invert(double& value) { Put(value, Inverse(value)); }
+
+    std::int32_t& m_formula; // of the document
+    std::int32_t m_before, m_after;
+    std::vector<Change> m_changes;
+};
 
 void CSwitchFormula::Put(double& value, double after)
 {
     if (value != after)
         m_changes.push_back({&value, nullptr, 0, value, after});
-}
-
-void CSwitchFormula::Invert(double& value)
-{
-    Put(value, Inverse(value));
 }
 
 template <typename Tools>
@@ -102,20 +109,29 @@ CSwitchFormula::CSwitchFormula(CKavo0_hdDoc& document, std::int32_t formula, boo
         ConvertTools(parameters.BedResistanceToolboxList.GetAt(line));
 }
 
-ChangePlace CSwitchFormula::Apply()
+ChangePlace CSwitchFormula::Set(std::int32_t formula, double Change::*value)
 {
-    m_formula = m_after;
+    m_formula = formula;
     for (const Change& change : m_changes)
-        change.Target() = change.after;
+        change.Target() = change.*value;
     return {};
 }
 
-ChangePlace CSwitchFormula::Revert()
+} // namespace
+
+// Units as in V. T. Chow, Open-Channel Hydraulics (1959), sections 5-4 and 5-6, in SI; M = 1/n is Strickler's form.
+QString ResistanceUnit(std::int32_t formula)
 {
-    m_formula = m_before;
-    for (const Change& change : m_changes)
-        change.Target() = change.before;
-    return {};
+    switch (formula) {
+    case ManningM:
+        return QStringLiteral("m^(1/3)/s");
+    case ManningN:
+        return QStringLiteral("s/m^(1/3)");
+    case Chezy:
+        return QStringLiteral("m^(1/2)/s");
+    default:
+        return {};
+    }
 }
 
 void SwitchResistanceFormula(CKavo0_hdDoc& document, std::int32_t formula, QComboBox& box)

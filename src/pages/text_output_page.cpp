@@ -13,7 +13,6 @@ class CTextOutputPage : public CDialogPage<Ui::CTextOutputPage, CLocationPage>
 {
 public:
     explicit CTextOutputPage(CKavo0_hdDoc* document);
-    void LoadFromDocument(CKavo0_hdDoc* document) override;
     void ButtonClicked(CGenGrid& grid, int row, int column) override;
 };
 
@@ -47,14 +46,9 @@ CTextOutputPage::CTextOutputPage(CKavo0_hdDoc* document) : CDialogPage(document,
         .Value(&CTextAutoFile::AutoName, {.width = 35})
         .Value(&CTextAutoFile::FileName, {.width = 185})
         .Button({.header = LineOf(Str::OutputFileColumns, 3), .width = 20});
-}
-
-void CTextOutputPage::LoadFromDocument(CKavo0_hdDoc* document)
-{
     // What the empty tables show is what a new file gets.
     for (const CGenGrid* grid : {m_ui.items_1216, m_ui.files_1226})
-        document->AtSave({.rows = grid->Model()->Rows(), .writesFirstRow = true});
-    CLocationPage::LoadFromDocument(document);
+        AtSave({.rows = grid->Model()->Rows(), .writesFirstRow = true});
 }
 
 void CTextOutputPage::ButtonClicked(CGenGrid& grid, int row, int /*column*/)

@@ -84,11 +84,9 @@ public:
     explicit CWLMarkPage(CKavo0_hdDoc* document);
     void AppendLine() override;
     void DeleteLines() override;
-    void LoadFromDocument(CKavo0_hdDoc* document) override;
 
 private:
     void ShowLevelColumns();
-    void ShowStatus();
 };
 
 CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::WaterLevelMarkList)
@@ -100,6 +98,10 @@ CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Par
                {.caption = Str::MarkTitle, .width = 300, .upperCase = true})
         .Value(InterpolateAccess(), {.name = "Interpolate", .kind = FieldKind::Boolean},
                {.caption = Str::MarkInterpolate, .width = 50});
+    Bindings().Always([this] { ShowLevelColumns(); });
+    // With an untitled column go its levels.
+    LeaveOut({{m_ui.titles_1075, &IsUntitled}}, m_ui.status_1076, Str::MarksWithoutTitle, Str::DroppedTitle,
+             Str::DroppedTitles);
 }
 
 /// One column of levels a title.
@@ -117,25 +119,6 @@ void CWLMarkPage::ShowLevelColumns()
                         title] { return title < titles.size() ? QString::fromStdString(titles[title]) : QString(); },
              .width = 62,
              .emptyIsNotGiven = true});
-}
-
-void CWLMarkPage::LoadFromDocument(CKavo0_hdDoc* document)
-{
-    document->AtSave({.rows = m_ui.titles_1075->Model()->Rows(),
-                      .isIncomplete = &IsUntitled,
-                      .oneDropped = Str::DroppedTitle,
-                      .manyDropped = Str::DroppedTitles});
-    ShowLevelColumns();
-    CLocationPage::LoadFromDocument(document);
-    ShowStatus();
-}
-
-/// An untitled column means nothing to the simulation: a save leaves it out with its levels, and says so beforehand.
-void CWLMarkPage::ShowStatus()
-{
-    const auto& titles = Globals().MarkTitles;
-    const auto count = std::count(titles.begin(), titles.end(), std::string());
-    m_ui.status_1076->setText(count > 0 ? LoadString(Str::MarksWithoutTitle).arg(count) : QString());
 }
 
 void CWLMarkPage::AppendLine()

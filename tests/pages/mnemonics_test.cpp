@@ -25,6 +25,20 @@ QString TextOf(const QWidget* widget)
     return {};
 }
 
+/// All that a page says.
+QStringList TextsOf(const QWidget& page)
+{
+    QStringList texts;
+    for (const QWidget* widget : page.findChildren<QWidget*>()) {
+        const auto* label = qobject_cast<const QLabel*>(widget);
+        texts << widget->objectName() + ": " + (label ? label->text() : TextOf(widget)) + '|' + widget->accessibleName();
+        if (const auto* list = qobject_cast<const QComboBox*>(widget))
+            for (int entry = 0; entry < list->count(); ++entry)
+                texts << list->itemText(entry);
+    }
+    return texts;
+}
+
 } // namespace
 
 class MnemonicsTest : public PageTest, public testing::WithParamInterface<const char*>
@@ -66,6 +80,20 @@ TEST_P(MnemonicsTest, NoLetterTwiceOnAPageAndNoneOfTheMenuBar)
         }
     }
     EXPECT_GT(found, 100);
+}
+
+TEST_P(MnemonicsTest, APageThatIsOpenSaysItAsANewOne)
+{
+    for (const PageEntry& entry : PageTable()) {
+        KsLanguage::Instance().SetCurrent("en_US");
+        const auto page = entry.make(&document);
+        KsLanguage::Instance().SetCurrent(GetParam());
+        QEvent change(QEvent::LanguageChange);
+        for (QWidget* widget : page->findChildren<QWidget*>())
+            QApplication::sendEvent(widget, &change);
+        QApplication::sendEvent(page.get(), &change);
+        EXPECT_EQ(TextsOf(*page).join('\n').toStdString(), TextsOf(*entry.make(&document)).join('\n').toStdString());
+    }
 }
 
 TEST_P(MnemonicsTest, EveryTabIsInTheLanguage)

@@ -165,6 +165,7 @@ void CBindings::Add(CGeoFileEdit* field, std::string& value, const FileKind& kin
     field->SetUp(*m_document, kind);
     Add(field->Field(), value);
     AddLabel(field, &value);
+    Always([field] { field->Retranslate(); });
     connect(field, &CGeoFileEdit::Chosen, this,
             [this, field, &value] { Store(value, field->Field()->text().toStdString()); });
 }

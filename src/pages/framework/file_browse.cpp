@@ -1,8 +1,9 @@
 #include "pages/framework/file_browse.h"
 
+#include "document/document.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
-#include "document/document.h"
+#include "pages/framework/binding.h"
 #include "res/strings.h"
 
 #include <QDir>
@@ -48,7 +49,6 @@ CGeoFileEdit::CGeoFileEdit(QWidget* parent)
     setFocusProxy(m_field);
     m_button->setText(QStringLiteral("..."));
     connect(m_button, &QToolButton::clicked, this, &CGeoFileEdit::Browse);
-    Retranslate();
 }
 
 void CGeoFileEdit::SetUp(const CKavo0_hdDoc& document, FileKind kind)
@@ -67,14 +67,7 @@ void CGeoFileEdit::Browse()
 
 void CGeoFileEdit::Retranslate()
 {
-    m_field->setAccessibleName(LoadString(Str::FileName));
-    m_button->setAccessibleName(LoadString(Str::BrowseTitle));
+    SetAccessibleName(*m_field, LoadString(Str::FileName));
+    SetAccessibleName(*m_button, LoadString(Str::BrowseTitle));
     m_button->setToolTip(LoadString(Str::BrowseTitle));
-}
-
-void CGeoFileEdit::changeEvent(QEvent* event)
-{
-    QWidget::changeEvent(event);
-    if (event->type() == QEvent::LanguageChange)
-        Retranslate();
 }

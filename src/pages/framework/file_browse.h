@@ -30,18 +30,16 @@ public:
 
     /// The document outlives the field.
     void SetUp(const CKavo0_hdDoc& document, FileKind kind);
+    /// The names of its parts, in the user's language.
+    void Retranslate();
     QLineEdit* Field() const { return m_field; }
 
 signals:
     /// The user chose another file with the button; the field has its name.
     void Chosen();
 
-protected:
-    void changeEvent(QEvent* event) override;
-
 private:
     void Browse();
-    void Retranslate();
 
     QLineEdit* m_field;    // child
     QToolButton* m_button; // child

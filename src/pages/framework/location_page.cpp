@@ -4,6 +4,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/wnd_resizer.h"
 
+#include <QLabel>
 #include <QUndoStack>
 
 std::function<QString()> LineOf(Str text, int line)
@@ -205,6 +206,8 @@ void CLocationPage::ShowParts()
 
 void CLocationPage::LoadFromDocument(CKavo0_hdDoc* document)
 {
+    for (const auto& shown : m_atSave)
+        document->AtSave(shown);
     CGenPropertyPage::LoadFromDocument(document);
     if (auto* grid = GetGrid())
         grid->Reload();
@@ -234,6 +237,20 @@ bool CLocationPage::OnKillActive()
     Store(BlankRule::Fill);
     StoreToDocument();
     return true;
+}
+
+void CLocationPage::LeaveOut(const std::vector<Incomplete>& tables, QLabel* status, Str warning, Str oneDropped,
+                             Str manyDropped)
+{
+    for (const auto& [table, isIncomplete] : tables)
+        AtSave({table->Model()->Rows(), isIncomplete, oneDropped, manyDropped});
+    Bindings().Always([tables, status, warning] {
+        std::size_t count = 0;
+        for (const auto& [table, isIncomplete] : tables)
+            for (std::size_t row = 0; row < table->Model()->Rows()->Count(); ++row)
+                count += isIncomplete(table->Model()->Rows()->At(row));
+        status->setText(count > 0 ? LoadString(warning).arg(count) : QString());
+    });
 }
 
 void CLocationPage::BrowseInto(CGenGrid& grid, int row, int column, const FileKind& kind)

@@ -62,6 +62,8 @@ private:
     const void* m_globals;
 };
 
+class QLabel;
+
 class CLocationPage : public CGenPropertyPage
 {
     Q_OBJECT
@@ -113,6 +115,16 @@ protected:
             return std::make_shared<VectorRows<T>>(static_cast<Record&>(record).*pairs, owner);
         });
     }
+    /// What a save makes of a table, once it has been shown.
+    void AtSave(CKavo0_hdDoc::ShownRows shown) { m_atSave.push_back(std::move(shown)); }
+    /// Rows of these tables that mean nothing to the simulation. A save leaves them out; `status` says so beforehand,
+    /// with their number.
+    struct Incomplete
+    {
+        CGenGrid* table;
+        bool (*isIncomplete)(const void* row);
+    };
+    void LeaveOut(const std::vector<Incomplete>& tables, QLabel* status, Str warning, Str oneDropped, Str manyDropped);
     /// Has the user choose the file that a cell names.
     void BrowseInto(CGenGrid& grid, int row, int column, const FileKind& kind);
     /// Shows another list in the page's grid; null for none.
@@ -136,4 +148,5 @@ private:
     CGenList* m_list;
     void* m_globals = nullptr; // of the row "Global"
     std::vector<Part> m_parts;
+    std::vector<CKavo0_hdDoc::ShownRows> m_atSave;
 };
