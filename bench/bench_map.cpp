@@ -23,7 +23,7 @@ std::vector<CNetworkBranch> MakeBranches()
     std::vector<CNetworkBranch> branches;
     for (int i = 0; i < Branches; ++i) {
         CNetworkBranch branch;
-        branch.name = QStringLiteral("RIVER %1").arg(i + 1);
+        branch.name = QStringLiteral("RIVER %1").arg(i + 1).toStdString();
         QPointF at(between(0, 100'000), between(0, 62'000));
         double direction = between(0, 2 * std::numbers::pi);
         for (int vertex = 0; vertex < Vertices; ++vertex) {
@@ -43,7 +43,7 @@ std::vector<CMapLocation> MakeLocations(const CNetwork& network)
     for (int i = 0; i < Locations; ++i) {
         const CNetworkBranch& branch = network.branches[std::size_t(i % Branches)];
         const double part = double(i / Branches) / (double(Locations) / Branches);
-        locations.push_back({branch.name, part * branch.end, i % HDDataTypeCount, QStringLiteral("a.hdkv"), KsUnset});
+        locations.push_back({branch.Name(), part * branch.end, i % HDDataTypeCount, QStringLiteral("a.hdkv"), KsUnset});
     }
     return locations;
 }

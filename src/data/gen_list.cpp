@@ -5,33 +5,28 @@
 void CGenList::RemoveAll()
 {
     m_records.clear();
-    ++m_revision;
 }
 
 HD_RiverPos& CGenList::AddTail(std::unique_ptr<HD_RiverPos> record)
 {
-    ++m_revision;
     return *m_records.emplace_back(std::move(record));
 }
 
 void CGenList::InsertAt(std::size_t index, std::unique_ptr<HD_RiverPos> record)
 {
     m_records.insert(m_records.begin() + std::ptrdiff_t(index), std::move(record));
-    ++m_revision;
 }
 
 void CGenList::InsertAt(std::size_t index, std::vector<std::unique_ptr<HD_RiverPos>> records)
 {
     m_records.insert(m_records.begin() + std::ptrdiff_t(index), std::move_iterator(records.begin()),
                      std::move_iterator(records.end()));
-    ++m_revision;
 }
 
 std::unique_ptr<HD_RiverPos> CGenList::RemoveAt(std::size_t index)
 {
     auto record = std::move(m_records[index]);
     m_records.erase(m_records.begin() + std::ptrdiff_t(index));
-    ++m_revision;
     return record;
 }
 
@@ -41,7 +36,6 @@ std::vector<std::unique_ptr<HD_RiverPos>> CGenList::RemoveAt(std::size_t index, 
     const auto last = first + std::ptrdiff_t(count);
     std::vector<std::unique_ptr<HD_RiverPos>> removed{std::make_move_iterator(first), std::make_move_iterator(last)};
     m_records.erase(first, last);
-    ++m_revision;
     return removed;
 }
 
@@ -57,7 +51,6 @@ bool CGenList::RemoveIncompleteLines(bool& asked, const std::function<bool()>& a
     asked = true;
     // One pass over the rest: each kept record moves once, however many go.
     std::erase_if(m_records, [](const std::unique_ptr<HD_RiverPos>& record) { return record->IsBlank(); });
-    ++m_revision;
     return true;
 }
 

@@ -45,9 +45,6 @@ public:
     std::vector<std::unique_ptr<HD_RiverPos>> RemoveAt(std::size_t index, std::size_t count);
     void Reserve(std::size_t count) { m_records.reserve(count); }
 
-    /// Counts every change of the list's length or order, so that a view knows when its rows are stale.
-    std::uint64_t GetRevision() const { return m_revision; }
-
     /// Removes and deletes every blank record, head to tail. Unless `asked` is set, `ask` is called at the first one;
     /// its answer false stops with false (nothing more is removed), true sets `asked`. Without `ask` nobody can agree,
     /// which counts as false.
@@ -61,7 +58,6 @@ public:
 
 private:
     std::vector<std::unique_ptr<HD_RiverPos>> m_records;
-    std::uint64_t m_revision = 0;
 };
 
 /// A list that is stored as one section of keywords "DATA".

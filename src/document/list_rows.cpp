@@ -30,7 +30,6 @@ public:
 
     std::size_t Count() const override { return m_list.GetCount(); }
     void* At(std::size_t row) override { return &m_list.GetAt(row); }
-    std::uint64_t Revision() const override { return m_list.GetRevision(); }
 
     // Records stay where they are in memory, so their address names them.
     RowKey KeyAt(std::size_t row) override { return reinterpret_cast<RowKey>(At(row)); }
@@ -81,7 +80,6 @@ public:
     std::size_t FixedRows() const override { return 1; }
     std::size_t Count() const override { return 1 + m_lines->Count(); }
     void* At(std::size_t row) override { return row == 0 ? m_globals : m_lines->At(row - 1); }
-    std::uint64_t Revision() const override { return m_lines->Revision(); }
 
     RowKey KeyAt(std::size_t row) override { return row == 0 ? GlobalKey() : m_lines->KeyAt(row - 1); }
     void* Object(RowKey key) override { return key == GlobalKey() ? m_globals : m_lines->Object(key); }

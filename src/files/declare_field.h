@@ -207,23 +207,25 @@ consteval std::array<Field, Count> FieldsOf(const Field (&fields)[Count])
     return checked;
 }
 
+/// A repeated group; `Elements()` lists the fields of one element.
+template <auto Elements, auto... Path>
+constexpr Field GroupOf(std::string_view name)
+{
+    Field field = field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Group, name);
+    field.group = &field_detail::Access<typename field_detail::Path<Path...>::Type, Elements>;
+    return field;
+}
 /// A repeated group of structs: `Element::DeclaredFields()` lists the fields of one.
 template <auto... Path>
 constexpr Field Group(std::string_view name)
 {
-    using Container = typename field_detail::Path<Path...>::Type;
-    Field field = field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Group, name);
-    field.group = &field_detail::Access<Container, &Container::value_type::DeclaredFields>;
-    return field;
+    return GroupOf<&field_detail::Path<Path...>::Type::value_type::DeclaredFields, Path...>(name);
 }
 /// Elements that sections of a file hold, which are declared there (declared_section.h).
 template <auto... Path>
 constexpr Field SectionGroup(std::string_view name)
 {
-    using Container = typename field_detail::Path<Path...>::Type;
-    Field field = field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Group, name);
-    field.group = &field_detail::Access<Container, &field_detail::NoFields>;
-    return field;
+    return GroupOf<&field_detail::NoFields, Path...>(name);
 }
 /// The one field of elements that are plain values.
 template <typename T>
@@ -241,8 +243,5 @@ template <const Field& element, auto... Path>
 requires(element.owner == &field_detail::Tag<typename field_detail::Path<Path...>::Type::value_type>) constexpr Field
     PlainGroup(std::string_view name)
 {
-    using Container = typename field_detail::Path<Path...>::Type;
-    Field field = field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Group, name);
-    field.group = &field_detail::Access<Container, &field_detail::ElementList<element>>;
-    return field;
+    return GroupOf<&field_detail::ElementList<element>, Path...>(name);
 }

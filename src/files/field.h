@@ -61,6 +61,7 @@ struct TextLine
 
     Str text{};
     int line = Whole;
+    const char* source = nullptr; // the text itself, to be translated, where an editor has no numbers for its texts
 
     explicit constexpr operator bool() const { return text != Str{}; }
 };
@@ -131,6 +132,12 @@ struct Field
     {
         Field field = *this;
         field.title = {text, line};
+        return field;
+    }
+    constexpr Field Title(const char* source) const
+    {
+        Field field = *this;
+        field.title.source = source;
         return field;
     }
     constexpr Field Choices(Str texts, std::int32_t first = 0) const

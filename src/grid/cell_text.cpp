@@ -28,7 +28,7 @@ QString ShownText(const ColumnSpec& column, const CellValue& value)
     if (!number || IsEmpty(column, value))
         return EditText(column, value);
     // Decimals are those of the number itself; cut to significant digits first, it would end in zeros that it has not.
-    const int decimals = FindControl(column.control).decimals;
+    const int decimals = column.control.decimals;
     if (decimals == AsFormatted || KsUnits::Instance().AllDigits())
         return column.style.ShownText(*number);
     if (decimals == UpToThousandths)
@@ -72,8 +72,10 @@ QString EditText(const ColumnSpec& column, const CellValue& value)
 
 CellReading ReadCell(const ColumnSpec& column, const QString& text)
 {
-    if (column.Kind() == CellKind::Text)
-        return {(FindControl(column.control).upperCase ? text.toUpper() : text).toStdString(), {}};
+    if (column.Kind() == CellKind::Text) {
+        const QString taken = column.control.trimmed ? text.trimmed() : text;
+        return {(column.control.upperCase ? taken.toUpper() : taken).toStdString(), {}};
+    }
     if (text.isEmpty())
         return {{}, column.isRequired ? GridTexts::tr("Floating point number required") : QString()};
     if (column.Kind() == CellKind::Button)

@@ -5,33 +5,7 @@
 #include "grid/typing.h"
 
 #include <QCoreApplication>
-#include <algorithm>
-#include <iterator>
-
-namespace {
-
-constexpr GridControl Controls[] = {
-    {Control::Integer, CellKind::Integer, 0, "edit"},
-    {Control::Formatted, CellKind::Number, AsFormatted, "doubleEdit"},
-    {Control::Number, CellKind::Number, 3, "doubleEdit_1110"},
-    {Control::Text, CellKind::Text, 0, "stringEdit_1111", true},
-    {Control::FreeText, CellKind::Text, 0, "textEdit"},
-    {Control::DropDown, CellKind::Choice, 0, "dropDown"},
-    {Control::DropDownList, CellKind::TextChoice, 0, "dropDownList"},
-    {Control::CheckBox, CellKind::Flag, 0, "checkBox"},
-    {Control::PushButton, CellKind::Button, 0, "pushButton"},
-    {Control::DateTime, CellKind::DateTime, 0, "dateTimeEdit"},
-    {Control::Measured, CellKind::Number, UpToThousandths, "doubleEdit"},
-    {Control::Chainage, CellKind::Number, 0, "doubleEdit_1112"},
-};
-
-} // namespace
-
-const GridControl& FindControl(int id)
-{
-    return *std::find_if(std::begin(Controls), std::end(Controls) - 1,
-                         [id](const GridControl& control) { return control.id == id; });
-}
+#include <cmath>
 
 CellAccess FieldAccess(const Field& field)
 {
@@ -42,6 +16,15 @@ CellAccess FieldAccess(const Field& field)
             return {[field](const void* row) -> CellValue { return std::int32_t(field.In<bool>(row)); },
                     [field](void* row, const CellValue& value) {
                         field.In<bool>(row) = std::get<std::int32_t>(value) != 0;
+                    }};
+        else if (std::is_same_v<T, double> && field.mayBeUnknown)
+            return {[field](const void* row) -> CellValue {
+                        const double value = field.In<double>(row);
+                        return std::isnan(value) ? NotGiven : value;
+                    },
+                    [field](void* row, const CellValue& value) {
+                        const double given = std::get<double>(value);
+                        field.In<double>(row) = given == NotGiven ? std::nan("") : given;
                     }};
         else
             return {[field](const void* row) -> CellValue { return field.In<T>(row); },
@@ -87,6 +70,11 @@ QString NumberText(const QString& number, const QString& unit)
     return unit.isEmpty() ? number : number + u' ' + unit;
 }
 
+QString WithUnit(const QString& name, UnitGroup group)
+{
+    return QStringLiteral("%1 [%2]").arg(name, CKsEditStyle(group).UnitSymbol());
+}
+
 QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit)
 {
     const QString unitTip = UnitToolTip(unit);
@@ -94,11 +82,6 @@ QString NumberToolTip(const CKsEditStyle& style, double value, const QString& sh
         return unitTip;
     const QString full = GridTexts::tr("Full value: %1").arg(NumberText(style.FullText(value), unit));
     return unitTip.isEmpty() ? full : full + u'\n' + unitTip;
-}
-
-CellValue ColumnSpec::FillValue() const
-{
-    return style.UnitConvertFromBase(*fill, 0);
 }
 
 CellValue ColumnSpec::EmptyValue() const
@@ -131,22 +114,12 @@ CellValue ColumnSpec::NewLineValue() const
     return emptyIsNotGiven ? CellValue(NotGiven) : CellValue();
 }
 
-QString ColumnSpec::UnitSymbol() const
-{
-    return unitText ? unitText() : style.UnitSymbol();
-}
-
 QString ColumnSpec::Allowed() const
 {
     const auto text = [this](std::optional<double> bound) {
         return bound ? KsShortestNumber(style.UnitConvertFromBase(*bound, 1)) : QString();
     };
     return AllowedRange(text(minimum), text(maximum));
-}
-
-bool ColumnSpec::IsAllowed(double value) const
-{
-    return !(minimum && value < *minimum) && !(maximum && value > *maximum);
 }
 
 QString ColumnSpec::ToolTip(bool isHeader) const

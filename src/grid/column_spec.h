@@ -22,7 +22,7 @@ struct CellAccess
     std::function<std::function<void(void* row)>(const void* row)> restore = {};
 };
 
-/// Access to a declared field.
+/// Access to a declared field. A number that is not known is the mark for "not given" in its cell.
 CellAccess FieldAccess(const Field& field);
 
 enum class CellKind
@@ -42,30 +42,30 @@ inline constexpr int AsFormatted = -1;
 /// Likewise with the decimals that it has, up to thousandths.
 inline constexpr int UpToThousandths = -2;
 
-/// The cell editors by number, in one table.
+/// The editor of cells.
 struct GridControl
 {
-    int id;
     CellKind kind;
-    int decimals;           // of a number that is not being edited; AsFormatted, UpToThousandths
     const char* editorName; // object name of the editor
+    int decimals = 0;       // of a number that is not being edited; AsFormatted, UpToThousandths
     bool upperCase = false; // of a text
+    bool trimmed = false;   // blanks around a text are no part of it
 };
 namespace Control {
-inline constexpr int Integer = 0;     // the plain edit control
-inline constexpr int Formatted = 1;   // a number of any magnitude
-inline constexpr int Number = 5042;   // three decimals
-inline constexpr int Text = 5043;     // upper case
-inline constexpr int Chainage = 5044; // whole numbers shown
-inline constexpr int DropDown = 52517;
-inline constexpr int DropDownList = 52518; // texts to choose from
-inline constexpr int FreeText = 52519;     // as it is typed
-inline constexpr int CheckBox = 52520;
-inline constexpr int PushButton = 52521;
-inline constexpr int DateTime = 52522;
-inline constexpr int Measured = 52523; // a number without zeros behind its last digit
+inline constexpr GridControl Integer{CellKind::Integer, "edit"};
+inline constexpr GridControl Formatted{CellKind::Number, "doubleEdit", AsFormatted}; // of any magnitude
+inline constexpr GridControl Number{CellKind::Number, "doubleEdit_1110", 3};
+inline constexpr GridControl Chainage{CellKind::Number, "doubleEdit_1112"}; // whole numbers shown
+inline constexpr GridControl Measured{CellKind::Number, "doubleEdit", UpToThousandths};
+inline constexpr GridControl Text{.kind = CellKind::Text, .editorName = "stringEdit_1111", .upperCase = true};
+inline constexpr GridControl FreeText{CellKind::Text, "textEdit"}; // as it is typed
+inline constexpr GridControl TrimmedText{.kind = CellKind::Text, .editorName = "textEdit", .trimmed = true};
+inline constexpr GridControl DropDown{CellKind::Choice, "dropDown"};
+inline constexpr GridControl DropDownList{CellKind::TextChoice, "dropDownList"};
+inline constexpr GridControl CheckBox{CellKind::Flag, "checkBox"};
+inline constexpr GridControl PushButton{CellKind::Button, "pushButton"};
+inline constexpr GridControl DateTime{CellKind::DateTime, "dateTimeEdit"};
 } // namespace Control
-const GridControl& FindControl(int id);
 
 /// What the cells of a drop-down column can be. A stored index without entry is kept, and shown as its number.
 struct Choices
@@ -87,6 +87,8 @@ struct Choices
 QString UnitToolTip(const QString& unit);
 /// "1500.6 m".
 QString NumberText(const QString& number, const QString& unit);
+/// "Width [m]".
+QString WithUnit(const QString& name, UnitGroup group);
 /// The unit of a number and, where `shown` leaves some of its digits out, the whole number.
 QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit);
 
@@ -100,36 +102,44 @@ enum class LocationValue
 
 struct ColumnSpec
 {
-    int control = Control::Number;
-    std::function<QString()> header;
+    // What a table says about its column, where that is not what the field says; see field_columns.h.
+    std::function<QString()> header = {};
+    Str caption{};                // the number of the header's text
     int width = 72;               // pixels at the original font size; the grid scales it
-    CKsEditStyle style;           // unit group and format
+    bool asFormatted = false;     // a number stands with six decimals, not with the control's
+    const double* fill = nullptr; // enters new lines, and blank cells when the page is left; as it is, not converted
+    bool emptyIsNotGiven = false; // an empty cell is stored as the mark for "not given", and the mark shows as empty
+    std::function<bool(const void* row)> locked = {}; // the cell of this row cannot be edited
+    Choices choices = {};                             // of a drop-down column
+    std::function<QString()> unitText = {}; // symbol instead of the style's, where the unit depends on a setting
+    std::function<QString()> hint = {};     // what the column is, for the tool tip of its header
+    bool upperCase = false;                 // of a text
+    LocationValue locationValue = LocationValue::None;
+    double* globalNumber = nullptr; // what a first row for global values shows; without, its cell is locked
+    std::int32_t* globalIndex = nullptr;
+
+    // What follows from the field.
+    GridControl control = Control::Number;
+    CKsEditStyle style = {};                          // unit group and format
     std::optional<double> minimum = {}, maximum = {}; // of a number, base units
     bool isRequired = false;                          // an empty cell is refused
-    bool emptyIsNotGiven = false; // an empty cell is stored as the mark for "not given", and the mark shows as empty
-    Choices choices;              // of a drop-down column
-    std::function<QString()> unitText; // symbol instead of the style's, where the unit depends on a setting
-    std::function<QString()> hint;     // what the column is, for the tool tip of its header
-    const double* fill = nullptr; // enters new lines, and blank cells when the page is left; as it is, not converted
-    std::function<bool(const void* row)> locked; // the cell of this row cannot be edited
-    LocationValue locationValue = LocationValue::None;
-    std::shared_ptr<const CellAccess> access;
+    std::shared_ptr<const CellAccess> access = {};
 
-    CellKind Kind() const { return FindControl(control).kind; }
+    CellKind Kind() const { return control.kind; }
     bool IsRightAligned() const { return Kind() == CellKind::Number || Kind() == CellKind::Integer; }
     /// The cells have no editor: a click or the space bar acts at once.
     bool ActsAtOnce() const { return Kind() == CellKind::Flag || Kind() == CellKind::Button; }
     bool IsLocked(const void* row) const { return locked && locked(row); }
     /// `fill` as the stored value that a cell with that text has.
-    CellValue FillValue() const;
+    CellValue FillValue() const { return style.UnitConvertFromBase(*fill, 0); }
     /// What an emptied cell is stored as when nothing fills it.
     CellValue EmptyValue() const;
     /// What a new line holds; nothing where the record's own default stands.
     CellValue NewLineValue() const;
-    QString UnitSymbol() const;
+    QString UnitSymbol() const { return unitText ? unitText() : style.UnitSymbol(); }
     /// "at least 0", in the user's unit; empty without bounds.
     QString Allowed() const;
-    bool IsAllowed(double value) const;
+    bool IsAllowed(double value) const { return !(minimum && value < *minimum) && !(maximum && value > *maximum); }
     /// Unit of the cells, and on a header also what the column is.
     QString ToolTip(bool header) const;
 };

@@ -3,6 +3,7 @@
 #include "grid/cell_text.h"
 #include "grid/grid_editors.h"
 #include "grid/grid_host.h"
+#include "grid/grid_input.h"
 #include "grid/grid_keys.h"
 #include "grid/grid_texts.h"
 #include "grid/grid_widths.h"
@@ -23,6 +24,8 @@ CGenGrid::CGenGrid(QWidget* parent)
     setFont(KsLangGetUserFont());
     setModel(m_model);
     setItemDelegate(m_delegate);
+    m_selection = new CGridSelection(*this);
+    m_input = new CGridInput(*this);
     setTabKeyNavigation(false); // the key table moves
     setEditTriggers(DoubleClicked | EditKeyPressed | AnyKeyPressed);
     setSelectionMode(ContiguousSelection);
@@ -34,9 +37,11 @@ CGenGrid::CGenGrid(QWidget* parent)
     // A click on a header moves the current cell as one on a cell does.
     for (QWidget* part : {verticalHeader()->viewport(), horizontalHeader()->viewport()})
         part->installEventFilter(this);
-    connect(selectionModel(), &QItemSelectionModel::selectionChanged, this,
-            [this] { m_linesChosen = m_choosingLines; });
     connect(m_model, &CGridModel::CellModified, this, [this] { m_modified = true; });
+    connect(m_model, &CGridModel::modelReset, this, [this] { // other rows, none of which is current
+        m_modified = m_lineGone = false;
+        m_currentLine.reset();
+    });
     connect(m_model, &CGridModel::layoutChanged, this, [this] {
         m_lastRow = CurrentRow();
         if (m_lastRow > 0)
@@ -53,11 +58,6 @@ CGenGrid::~CGenGrid()
 
 // ---- what it shows -----------------------------------------------------------------------------
 
-QString CGenGrid::TextAt(int row, int column) const
-{
-    return m_model->index(row - 1, column - 1).data().toString();
-}
-
 QString CGenGrid::LineText() const
 {
     const int fixed = m_model->FixedRows(), line = CurrentRow() - fixed, column = CurrentColumn() - 1;
@@ -65,7 +65,7 @@ QString CGenGrid::LineText() const
         return {};
     if (!m_model->HidesDigits(CurrentRow() - 1, column))
         return GridTexts::tr("Line %1 of %2").arg(line).arg(RowCount() - fixed);
-    const ColumnSpec& spec = m_model->Columns()[std::size_t(column)];
+    const ColumnSpec& spec = m_model->Column(column);
     const QString number = FullText(spec, m_model->Value(CurrentRow() - 1, column));
     return GridTexts::tr("Line %1 of %2, %3: %4").arg(line).arg(RowCount() - fixed).arg(spec.header(), number);
 }
@@ -78,8 +78,8 @@ void CGenGrid::Refresh()
     m_widths->Update();
 }
 
-/// Where lines came or went - with a save, by another editor - the current cell goes with its line. When that is gone no
-/// other line takes its place: whoever types on would change one that nobody chose.
+/// Where lines came or went - with a save, by another editor - the current cell goes with its line. When that is gone
+/// no other line takes its place: whoever types on would change one that nobody chose.
 void CGenGrid::FollowLine(int row, int column)
 {
     if (!m_currentLine || row == 0)
@@ -102,13 +102,6 @@ void CGenGrid::Reload()
     Refresh();
     if (!currentIndex().isValid() && RowCount() > 0 && !m_lineGone)
         SetCurrentCell(1, 1);
-}
-
-void CGenGrid::ShowRows(CKsDoc& document, std::shared_ptr<IRowSource> rows)
-{
-    m_modified = m_lineGone = false;
-    m_currentLine.reset();
-    m_model->SetSource(document, std::move(rows));
 }
 
 void CGenGrid::paintEvent(QPaintEvent* event)
@@ -159,7 +152,7 @@ void CGenGrid::StoreEditedLine(BlankRule blanks)
 void CGenGrid::ActOn(int row, int column)
 {
     const QModelIndex cell = m_model->index(row - 1, column - 1);
-    const ColumnSpec& spec = m_model->Columns()[std::size_t(cell.column())];
+    const ColumnSpec& spec = m_model->Column(cell.column());
     if (!spec.ActsAtOnce() || m_model->IsLocked(cell.row(), cell.column()))
         return;
     if (spec.Kind() == CellKind::Flag) {
@@ -180,11 +173,6 @@ void CGenGrid::SetCurrentCell(int row, int column)
     // Not setCurrentIndex, which would extend the selection while the user happens to hold Ctrl or Shift.
     selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect);
     scrollTo(currentIndex()); // a line that was stored meanwhile may have gone to another place
-}
-
-void CGenGrid::GotoLine(int row)
-{
-    SetCurrentCell(row, columnAt(0) + 1);
 }
 
 void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& previous)
@@ -221,7 +209,44 @@ void CGenGrid::focusInEvent(QFocusEvent* event)
         m_host->CellCurrent(*this);
 }
 
-// ---- mouse -------------------------------------------------------------------------------------
+// ---- lines that come and go --------------------------------------------------------------------
+
+int CGenGrid::InsertLine()
+{
+    const int line = m_model->InsertRow(m_selection->PlaceOfNewLine(m_model->FixedRows())) + 1;
+    m_widths->Update();
+    clearSelection();
+    SetCurrentCell(line, 1);
+    return line;
+}
+
+bool CGenGrid::DeleteSelectedLines()
+{
+    const auto lines = m_selection->Lines(m_model->FixedRows());
+    if (!lines)
+        return false;
+    const int row = lines->top(), column = CurrentColumn();
+    m_model->RemoveRows(row, lines->height());
+    clearSelection();
+    SetCurrentCell(row + 1, column);
+    return true;
+}
+
+// ---- keys and mouse ----------------------------------------------------------------------------
+
+void CGenGrid::keyPressEvent(QKeyEvent* event)
+{
+    constexpr std::pair<Qt::Key, CursorAction> moves[] = {
+        {Qt::Key_Up, MoveUp},         {Qt::Key_Down, MoveDown},         {Qt::Key_Left, MoveLeft},
+        {Qt::Key_Right, MoveRight},   {Qt::Key_Home, MoveHome},         {Qt::Key_End, MoveEnd},
+        {Qt::Key_PageUp, MovePageUp}, {Qt::Key_PageDown, MovePageDown},
+    };
+    const auto* move = std::ranges::find(moves, event->key(), [](const auto& each) { return int(each.first); });
+    if (move != std::end(moves) && event->modifiers().testFlag(Qt::ShiftModifier) && currentIndex().isValid())
+        m_selection->GrowTo(moveCursor(move->second, event->modifiers()));
+    else
+        QTableView::keyPressEvent(event);
+}
 
 void CGenGrid::mousePressEvent(QMouseEvent* event)
 {
@@ -232,7 +257,7 @@ void CGenGrid::mousePressEvent(QMouseEvent* event)
 void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
 {
     if (RowCount() == 0 && MayGrow())
-        return Run(GridAction::AppendLine);
+        return m_input->Run(GridAction::AppendLine);
     // Two clicks with keys between them may be a double click, and the keys have moved on from the cell clicked first.
     const QModelIndex cell = indexAt(event->position().toPoint());
     if (cell.isValid() && cell != currentIndex()) {
@@ -243,15 +268,15 @@ void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
     QTableView::mouseDoubleClickEvent(event);
 }
 
+void CGenGrid::contextMenuEvent(QContextMenuEvent* event)
+{
+    if (CommitEditor())
+        m_input->ShowMenu(event->globalPos());
+}
+
+/// Of the headers.
 bool CGenGrid::eventFilter(QObject* object, QEvent* event)
 {
-    if (event->type() == QEvent::MouseButtonPress && object != viewport() && !CommitEditor())
-        return true;
-    if (object == verticalHeader()->viewport()) {
-        if (event->type() == QEvent::MouseButtonPress)
-            m_choosingLines = m_linesChosen = true;
-        else if (event->type() == QEvent::MouseButtonRelease)
-            m_choosingLines = false;
-    }
-    return QTableView::eventFilter(object, event);
+    const bool isClick = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick;
+    return (isClick && object != viewport() && !CommitEditor()) || QTableView::eventFilter(object, event);
 }

@@ -2,6 +2,7 @@
 
 #include "grid/cell_text.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_host.h"
 #include "grid/grid_texts.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/message_box.h"
@@ -72,24 +73,14 @@ std::vector<QStringList> ReadTable(const QString& text)
     return rows;
 }
 
-namespace {
-
-std::size_t CountOf(const std::vector<QStringList>& cells)
+bool CanCopyCells(const CGenGrid& grid)
 {
-    return std::accumulate(cells.begin(), cells.end(), std::size_t(0),
-                           [](std::size_t count, const QStringList& row) { return count + std::size_t(row.size()); });
-}
-
-} // namespace
-
-bool CGenGrid::CanCopy() const
-{
-    return selectionModel()->hasSelection() || currentIndex().isValid();
+    return grid.selectionModel()->hasSelection() || grid.currentIndex().isValid();
 }
 
 void CopyCells(const CGenGrid& grid)
 {
-    if (!grid.CanCopy())
+    if (!CanCopyCells(grid))
         return;
     const QItemSelection selection = grid.selectionModel()->selection();
     const QItemSelectionRange range =
@@ -99,22 +90,22 @@ void CopyCells(const CGenGrid& grid)
     for (int row = range.top(); row <= range.bottom(); ++row) {
         QStringList& cells = rows.emplace_back();
         for (int column = range.left(); column <= range.right(); ++column)
-            cells << EditText(grid.Model()->Columns()[std::size_t(column)], grid.Model()->Value(row, column));
+            cells << EditText(grid.Model()->Column(column), grid.Model()->Value(row, column));
     }
     QGuiApplication::clipboard()->setText(WriteTable(rows));
 }
 
-bool CGenGrid::CanPaste() const
+bool CanPasteCells(const CGenGrid& grid)
 {
     const QMimeData* content = QGuiApplication::clipboard()->mimeData();
-    return content && content->hasText() && !content->text().isEmpty() && m_model->Rows() &&
-           (currentIndex().isValid() || RowCount() == 0);
+    return content && content->hasText() && !content->text().isEmpty() && grid.Model()->Rows() &&
+           (grid.currentIndex().isValid() || grid.RowCount() == 0);
 }
 
 /// Why the cells cannot go to row `top` and column `left`; empty when they can.
 static QString PasteRefusal(const CGridModel& model, int top, int left, const std::vector<QStringList>& cells)
 {
-    const auto header = [&](int column) { return model.Columns()[std::size_t(column)].header(); };
+    const auto header = [&](int column) { return model.Column(column).header(); };
     const auto refused = [&](int row, int column, const QString& text, const QString& reason) {
         return GridTexts::tr("Nothing was pasted. Line %1, column \"%2\" cannot take \"%3\":\n%4")
             .arg(QString::number(row + 1), header(column), text, reason);
@@ -142,26 +133,28 @@ static QString PasteRefusal(const CGridModel& model, int top, int left, const st
     return {};
 }
 
-bool CGenGrid::Paste()
+bool PasteCells(CGenGrid& grid)
 {
-    if (!CanPaste())
+    if (!CanPasteCells(grid))
         return false;
-    const auto selected = SelectedBlock();
-    const int top = selected ? selected->top() : std::max(0, currentIndex().row());
-    const int left = selected ? selected->left() : std::max(0, currentIndex().column());
+    const auto selected = grid.SelectedBlock();
+    const int top = selected ? selected->top() : std::max(0, grid.currentIndex().row());
+    const int left = selected ? selected->left() : std::max(0, grid.currentIndex().column());
     auto cells = ReadTable(QGuiApplication::clipboard()->text());
     if (selected && cells.size() == 1 && cells.front().size() == 1) // one copied cell fills the selection
         cells.assign(std::size_t(selected->height()), QStringList(selected->width(), cells.front().front()));
-    if (const QString refusal = PasteRefusal(*m_model, top, left, cells); !refusal.isEmpty()) {
-        KsMessageBox(refusal, QMessageBox::Ok, this);
+    if (const QString refusal = PasteRefusal(*grid.Model(), top, left, cells); !refusal.isEmpty()) {
+        KsMessageBox(refusal, QMessageBox::Ok, &grid);
         return false;
     }
-    StoreEditedLine();
-    m_model->Paste(top, left, cells, GridTexts::tr("Paste"));
-    m_model->Document()->Say(
-        GridTexts::Counted(CountOf(cells), GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted")));
-    m_modified = true; // the host tells the project when locations came in
-    StoreEditedLine();
-    Reload();
+    grid.StoreEditedLine();
+    grid.Model()->Paste(top, left, cells, GridTexts::tr("Paste"));
+    const auto count = std::accumulate(cells.begin(), cells.end(), std::size_t(0),
+                                       [](std::size_t sum, const auto& row) { return sum + std::size_t(row.size()); });
+    grid.Model()->Document()->Say(
+        GridTexts::Counted(count, GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted")));
+    if (grid.Host())
+        grid.Host()->LineEdited(grid); // the project is told when locations came in
+    grid.Reload();
     return true;
 }

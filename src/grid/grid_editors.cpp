@@ -3,6 +3,7 @@
 #include "grid/digits_mark.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_host.h"
+#include "grid/grid_input.h"
 #include "grid/grid_keys.h"
 #include "grid/grid_model.h"
 #include "grid/grid_texts.h"
@@ -10,7 +11,9 @@
 #include "grid/typing.h"
 
 #include <QApplication>
+#include <QComboBox>
 #include <QKeyEvent>
+#include <QLineEdit>
 #include <QMdiSubWindow>
 #include <QPainter>
 #include <QScopedValueRollback>
@@ -34,12 +37,31 @@ QWidget* ViewAround(QWidget* widget)
     return widget;
 }
 
+QLineEdit* MakeLineEdit(const GridControl& control, QWidget* parent)
+{
+    auto* edit = new QLineEdit(parent);
+    edit->setFrame(false);
+    if (control.kind == CellKind::Number || control.kind == CellKind::Integer)
+        edit->setAlignment(Qt::AlignRight);
+    if (!control.upperCase)
+        return edit;
+    QObject::connect(edit, &QLineEdit::textEdited, edit, [edit](const QString& text) {
+        const QString upper = text.toUpper();
+        if (upper == text)
+            return;
+        const int cursor = edit->cursorPosition() + int(upper.size() - text.size());
+        edit->setText(upper);
+        edit->setCursorPosition(cursor);
+    });
+    return edit;
+}
+
 /// The branch names of the network, to choose from; another name can still be typed.
 QWidget* MakeBranchList(const QStringList& names, QWidget* parent, QWidget* view)
 {
     auto* list = new QComboBox(parent);
     list->setEditable(true);
-    list->setLineEdit(new CGridStringEdit(list));
+    list->setLineEdit(MakeLineEdit(Control::Text, list));
     list->setInsertPolicy(QComboBox::NoInsert);
     list->addItems(names);
     list->setMaxVisibleItems(DropDownHeight / list->fontMetrics().lineSpacing());
@@ -47,78 +69,34 @@ QWidget* MakeBranchList(const QStringList& names, QWidget* parent, QWidget* view
     return list;
 }
 
+/// One of a column's entries, by pop-up, arrow keys or first letters; Backspace empties the cell.
+QWidget* MakeChoice(const QStringList& entries, QWidget* parent)
+{
+    auto* list = new QComboBox(parent);
+    list->addItems(entries);
+    // Opened by the mouse the entries are what the user wants to see next.
+    if (QApplication::mouseButtons() != Qt::NoButton)
+        QTimer::singleShot(0, list, &QComboBox::showPopup);
+    return list;
+}
+
 QWidget* MakeEditor(const ColumnSpec& column, QWidget* parent)
 {
-    switch (column.Kind()) {
-    case CellKind::Choice:
-    case CellKind::TextChoice:
-        return new CGridChoiceEdit(column.choices.entries(), parent);
-    case CellKind::Number:
-    case CellKind::Integer:
-        return new CGridDoubleEdit(parent);
-    default:
-        break;
-    }
-    if (FindControl(column.control).upperCase)
-        return new CGridStringEdit(parent);
-    auto* edit = new QLineEdit(parent);
-    edit->setFrame(false);
-    return edit;
+    const bool isChoice = column.Kind() == CellKind::Choice || column.Kind() == CellKind::TextChoice;
+    return isChoice ? MakeChoice(column.choices.entries(), parent) : MakeLineEdit(column.control, parent);
 }
 
 } // namespace
-
-CGridDoubleEdit::CGridDoubleEdit(QWidget* parent) : QLineEdit(parent)
-{
-    setFrame(false);
-    setAlignment(Qt::AlignRight);
-}
-
-CGridStringEdit::CGridStringEdit(QWidget* parent) : QLineEdit(parent)
-{
-    setFrame(false);
-    connect(this, &QLineEdit::textEdited, this, [this](const QString& text) {
-        const QString upper = text.toUpper();
-        if (upper == text)
-            return;
-        const int cursor = cursorPosition() + int(upper.size() - text.size());
-        setText(upper);
-        setCursorPosition(cursor);
-    });
-}
-
-CGridChoiceEdit::CGridChoiceEdit(const QStringList& entries, QWidget* parent) : QComboBox(parent)
-{
-    addItems(entries);
-    // Opened by the mouse the entries are what the user wants to see next.
-    if (QApplication::mouseButtons() != Qt::NoButton)
-        QTimer::singleShot(0, this, &QComboBox::showPopup);
-}
-
-void CGridChoiceEdit::SetText(const QString& text)
-{
-    if (!text.isEmpty() && findText(text) < 0)
-        addItem(text);
-    setCurrentIndex(findText(text));
-}
-
-void CGridChoiceEdit::keyPressEvent(QKeyEvent* event)
-{
-    if (event->key() == Qt::Key_Backspace)
-        setCurrentIndex(-1);
-    else
-        QComboBox::keyPressEvent(event);
-}
 
 CGridDelegate::CGridDelegate(CGenGrid* grid) : QStyledItemDelegate(grid), m_grid(grid) {}
 
 QWidget* CGridDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem&, const QModelIndex& index) const
 {
-    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
+    const ColumnSpec& column = m_grid->Model()->Column(index.column());
     const bool offersNames = index.column() + 1 == m_grid->BranchNameColumn() && m_grid->Host();
     const QStringList names = offersNames ? m_grid->Host()->BranchNames() : QStringList();
     QWidget* editor = names.isEmpty() ? MakeEditor(column, parent) : MakeBranchList(names, parent, ViewAround(m_grid));
-    editor->setObjectName(FindControl(column.control).editorName);
+    editor->setObjectName(column.control.editorName);
     editor->setAccessibleName(column.header());
     editor->setAutoFillBackground(true);
     m_editor = editor;
@@ -133,13 +111,16 @@ void CGridDelegate::setEditorData(QWidget* editor, const QModelIndex& index) con
         return;
     editor->setProperty("opened", true);
     const QString text = index.data(Qt::EditRole).toString();
-    if (auto* choice = qobject_cast<CGridChoiceEdit*>(editor)) {
-        choice->SetText(text);
-    } else if (auto* list = qobject_cast<QComboBox*>(editor)) {
+    auto* list = qobject_cast<QComboBox*>(editor);
+    if (!list) {
+        static_cast<QLineEdit*>(editor)->setText(text);
+    } else if (list->isEditable()) {
         list->setCurrentText(text);
         list->lineEdit()->selectAll();
     } else {
-        static_cast<QLineEdit*>(editor)->setText(text);
+        if (!text.isEmpty() && list->findText(text) < 0)
+            list->addItem(text); // one that is no entry is one as long as the editor is open
+        list->setCurrentIndex(list->findText(text));
     }
 }
 
@@ -157,7 +138,7 @@ void CGridDelegate::destroyEditor(QWidget* editor, const QModelIndex& index) con
 
 void CGridDelegate::PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
 {
-    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(index.column())];
+    const ColumnSpec& column = m_grid->Model()->Column(index.column());
     const QStyle& style = *m_grid->style();
     const bool locked = m_grid->Model()->IsLocked(index.row(), index.column());
     QStyleOptionButton button;
@@ -196,7 +177,7 @@ void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cel
         text = cell.fontMetrics.elidedText(text, cell.textElideMode, inside.width());
         width = cell.fontMetrics.horizontalAdvance(text);
     }
-    const bool isRight = m_grid->Model()->Columns()[std::size_t(index.column())].IsRightAligned();
+    const bool isRight = m_grid->Model()->Column(index.column()).IsRightAligned();
     const int x = isRight ? inside.right() + 1 - width : inside.left();
     const int y = inside.top() + (inside.height() - cell.fontMetrics.height() + 1) / 2 + cell.fontMetrics.ascent();
     const bool enabled = cell.state.testFlag(QStyle::State_Enabled);
@@ -207,7 +188,7 @@ void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cel
 void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const
 {
     constexpr QStyle::State special = QStyle::State_Selected | QStyle::State_HasFocus | QStyle::State_MouseOver;
-    const bool isText = !m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce();
+    const bool isText = !m_grid->Model()->Column(index.column()).ActsAtOnce();
     if (isText) {
         if (!(option.state & special) && option.direction == Qt::LeftToRight)
             PaintText(painter, option, index);
@@ -227,7 +208,7 @@ void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
 bool CGridDelegate::editorEvent(QEvent* event, QAbstractItemModel*, const QStyleOptionViewItem& option,
                                 const QModelIndex& index)
 {
-    if (!m_grid->Model()->Columns()[std::size_t(index.column())].ActsAtOnce())
+    if (!m_grid->Model()->Column(index.column()).ActsAtOnce())
         return false;
     switch (event->type()) {
     case QEvent::MouseButtonRelease: {
@@ -267,7 +248,7 @@ bool CGridDelegate::Commit()
         return true;
     }
     const QScopedValueRollback telling(m_telling, true);
-    const ColumnSpec& column = m_grid->Model()->Columns()[std::size_t(m_index.column())];
+    const ColumnSpec& column = m_grid->Model()->Column(m_index.column());
     const QString place = GridTexts::tr("%1, line %2").arg(column.header()).arg(m_index.row() + 1);
     TellRefusal(*editor, refusal, RefusalDetails(place, TextOf(editor), column.Allowed(), column.UnitSymbol()));
     return false;
@@ -310,12 +291,18 @@ bool CGridDelegate::eventFilter(QObject* object, QEvent* event)
         return true;
     case QEvent::ShortcutOverride:
     case QEvent::KeyPress: {
-        const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
+        const auto& pressed = *static_cast<QKeyEvent*>(event);
+        auto* list = qobject_cast<QComboBox*>(m_editor);
+        if (list && !list->isEditable() && pressed.key() == Qt::Key_Backspace && event->type() == QEvent::KeyPress) {
+            list->setCurrentIndex(-1);
+            return true;
+        }
+        const GridKey* key = FindGridKey(pressed);
         if (!key || !key->whileEditing)
             break;
         event->accept();
         if (event->type() == QEvent::KeyPress && Commit())
-            m_grid->Run(key->action);
+            m_grid->Input().Run(key->action);
         return true;
     }
     default:

@@ -1,41 +1,10 @@
 // The cell editors and the delegate that opens them.
 #pragma once
 
-#include <QComboBox>
-#include <QLineEdit>
 #include <QPointer>
 #include <QStyledItemDelegate>
 
 class CGenGrid;
-
-/// Edits a number. The grid shows it with so many decimals when it is not being edited.
-class CGridDoubleEdit : public QLineEdit
-{
-    Q_OBJECT
-public:
-    explicit CGridDoubleEdit(QWidget* parent = nullptr);
-};
-
-/// Edits a text that is kept in upper case.
-class CGridStringEdit : public QLineEdit
-{
-    Q_OBJECT
-public:
-    explicit CGridStringEdit(QWidget* parent = nullptr);
-};
-
-/// Chooses one of a column's entries: by pop-up, arrow keys or first letters; Backspace empties the cell.
-class CGridChoiceEdit : public QComboBox
-{
-    Q_OBJECT
-public:
-    CGridChoiceEdit(const QStringList& entries, QWidget* parent = nullptr);
-    /// Shows a text; one that is no entry is one as long as the editor is open.
-    void SetText(const QString& text);
-
-protected:
-    void keyPressEvent(QKeyEvent* event) override;
-};
 
 /// Opens the editor that a column asks for, and keeps it open while its text is no value of the column.
 class CGridDelegate : public QStyledItemDelegate

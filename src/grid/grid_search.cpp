@@ -3,10 +3,9 @@
 #include "base/not_given.h"
 #include "grid/cell_text.h"
 #include "grid/gen_grid.h"
-#include "grid/goto_dlg.h"
 #include "grid/grid_texts.h"
+#include "grid/line_dialogs.h"
 #include "files/read_number.h"
-#include "grid/search_dlg.h"
 #include "ks/fc/message_box.h"
 
 #include <algorithm>
@@ -37,17 +36,8 @@ bool NamePasses(const std::string& name, const std::string& wanted, NameMatch ma
 
 bool ChainagePasses(double shown, double wanted, ChainageMatch match)
 {
-    switch (match) {
-    case ChainageMatch::Less:
-        return shown < wanted;
-    case ChainageMatch::Equal:
-        return shown == wanted;
-    case ChainageMatch::Greater:
-        return shown > wanted;
-    case ChainageMatch::Any:
-        break;
-    }
-    return true;
+    return match == ChainageMatch::Any || (match == ChainageMatch::Less && shown < wanted) ||
+           (match == ChainageMatch::Equal && shown == wanted) || (match == ChainageMatch::Greater && shown > wanted);
 }
 
 } // namespace
@@ -57,7 +47,7 @@ bool SearchRows(CGenGrid& grid, int& row, const LineQuery& query)
     constexpr int NameColumn = 0, ChainageColumn = 1;
     const CGridModel& model = *grid.Model();
     const std::string wantedName = query.name.toUpper().toStdString(); // as the column stores them
-    const ColumnSpec& chainageColumn = model.Columns()[ChainageColumn];
+    const ColumnSpec& chainageColumn = model.Column(ChainageColumn);
     const double wanted = AsShown(chainageColumn, query.chainage);
     for (row = std::max(row, model.FixedRows() + 1); row <= grid.RowCount();) {
         const int line = row++ - 1;

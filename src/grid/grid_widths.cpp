@@ -3,6 +3,7 @@
 #include "grid/gen_grid.h"
 
 #include <QHeaderView>
+#include <QMouseEvent>
 #include <algorithm>
 
 namespace {
@@ -20,6 +21,20 @@ class RowNumbers : public QHeaderView
 public:
     explicit RowNumbers(QWidget* parent) : QHeaderView(Qt::Vertical, parent) { setSectionsClickable(true); }
     QSize sizeHint() const override { return {minimumWidth(), QHeaderView::minimumSizeHint().height()}; }
+
+protected:
+    /// A click close to the border of a line is one on the line, which the base would take for the wish to make it
+    /// higher.
+    void mousePressEvent(QMouseEvent* event) override
+    {
+        const int line = logicalIndexAt(event->position().toPoint());
+        const QPointF middle(event->position().x(), sectionViewportPosition(line) + sectionSize(line) / 2.0);
+        QMouseEvent press(QEvent::MouseButtonPress, middle, event->scenePosition(), event->globalPosition(),
+                          event->button(), event->buttons(), event->modifiers(), event->pointingDevice());
+        QHeaderView::mousePressEvent(line < 0 ? event : &press);
+    }
+    /// Two clicks with a key between them, which deletes lines, say, are two clicks.
+    void mouseDoubleClickEvent(QMouseEvent* event) override { mousePressEvent(event); }
 };
 
 double FontScale(const QWidget& widget)
@@ -67,7 +82,7 @@ void CGridWidths::Update()
 {
     UpdateRowNumbers();
     for (int column = std::min(m_columnsSet, m_grid.ColumnCount()); column < m_grid.ColumnCount(); ++column) {
-        const int width = int(m_grid.Model()->Columns()[std::size_t(column)].width * FontScale(m_grid));
+        const int width = int(m_grid.Model()->Column(column).width * FontScale(m_grid));
         m_grid.setColumnWidth(column, std::max(width, WidthOfTexts(column, RowsAtStart)));
     }
     m_columnsSet = m_grid.ColumnCount();
@@ -92,7 +107,7 @@ void CGridWidths::MakeRoom()
 int CGridWidths::WidthOfTexts(int column, int most) const
 {
     const QFontMetrics font = m_grid.fontMetrics();
-    int width = font.horizontalAdvance(m_grid.Model()->Columns()[std::size_t(column)].header());
+    int width = font.horizontalAdvance(m_grid.Model()->Column(column).header());
     qsizetype longest = 0;
     const auto measure = [&](int row) {
         const QString text = m_grid.TextAt(row, column + 1);

@@ -2,116 +2,144 @@
 
 #include "grid/grid_texts.h"
 
+#include <QUndoStack>
 #include <algorithm>
 
 ChangePlace PlaceOf(const IRowSource& rows, std::size_t row, int column)
 {
-    const std::size_t last = std::max<std::size_t>(rows.Count(), 1) - 1;
-    row = std::min(row, last);
+    row = std::min(row, std::max<std::size_t>(rows.Count(), 1) - 1);
     return {rows.Data(), int(row) + 1, column, rows.List(), int(rows.ListRow(row)) + 1};
 }
 
-CInsertLines::CInsertLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row,
-                           std::unique_ptr<IRowBlock> lines, const QString& text)
-    : CDocumentCommand(document, text.isEmpty() ? GridTexts::tr("Insertion of lines") : text),
-      m_rows(std::move(rows)),
-      m_row(row),
-      m_count(lines->Count()),
-      m_lines(std::move(lines))
-{
-}
+namespace {
 
-ChangePlace CInsertLines::Apply()
+template <typename Change>
+class CRowCommand : public CDocumentCommand
 {
-    m_row = m_rows->Put(m_row, std::move(m_lines));
-    return PlaceOf(*m_rows, m_row, 1);
-}
-
-ChangePlace CInsertLines::Revert()
-{
-    m_lines = m_rows->TakeBack(m_row, m_count);
-    return PlaceOf(*m_rows, m_row, 1);
-}
-
-CDeleteLines::CDeleteLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count)
-    : CDocumentCommand(document, GridTexts::tr("Deletion of lines")),
-      m_rows(std::move(rows)),
-      m_row(row),
-      m_count(count)
-{
-}
-
-ChangePlace CDeleteLines::Apply()
-{
-    m_lines = m_rows->Take(m_row, m_count);
-    return PlaceOf(*m_rows, m_row, 1);
-}
-
-ChangePlace CDeleteLines::Revert()
-{
-    m_row = m_rows->Put(m_row, std::move(m_lines));
-    return PlaceOf(*m_rows, m_row, 1);
-}
-
-CArrangeLines::CArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<std::size_t> order,
-                             std::size_t row)
-    : CDocumentCommand(document, {}),
-      m_rows(std::move(rows)),
-      m_order(std::move(order)),
-      m_places(m_order.size()),
-      m_row(row)
-{
-    for (std::size_t place = 0; place < m_order.size(); ++place)
-        m_places[m_order[place]] = place;
-}
-
-ChangePlace CArrangeLines::Apply()
-{
-    m_rows->Rearrange(m_order);
-    return PlaceOf(*m_rows, m_places[m_row], 1);
-}
-
-ChangePlace CArrangeLines::Revert()
-{
-    m_rows->Rearrange(m_places);
-    return PlaceOf(*m_rows, m_row, 1);
-}
-
-CSetCells::CSetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<CellChange> changes,
-                     std::size_t row)
-    : CDocumentCommand(document, GridTexts::tr("Change of cells")),
-      m_rows(std::move(rows)),
-      m_changes(std::move(changes)),
-      m_row(row)
-{
-}
-
-ChangePlace CSetCells::Apply()
-{
-    for (CellChange& change : m_changes) {
-        void* row = m_rows->Object(change.row);
-        if (change.access->restore)
-            change.restore = change.access->restore(row);
-        change.access->set(row, change.after);
+public:
+    CRowCommand(CKsDoc& document, const QString& text, Change change)
+        : CDocumentCommand(document, text), m_change(std::move(change))
+    {
     }
-    return Place();
+
+protected:
+    ChangePlace Apply() override { return m_change.Apply(); }
+    ChangePlace Revert() override { return m_change.Revert(); }
+
+private:
+    Change m_change;
+};
+
+template <typename Change>
+void Push(CKsDoc& document, const QString& text, Change change)
+{
+    document.UndoStack().push(new CRowCommand<Change>(document, text, std::move(change)));
 }
 
-ChangePlace CSetCells::Revert()
+struct Lines
 {
-    for (auto change = m_changes.rbegin(); change != m_changes.rend(); ++change) {
-        void* row = m_rows->Object(change->row);
-        if (change->restore)
-            change->restore(row);
-        else
-            change->access->set(row, change->before);
+    std::shared_ptr<IRowSource> rows;
+    std::size_t row, count;
+    std::unique_ptr<IRowBlock> block = {}; // while they are not in the list
+
+    ChangePlace Put()
+    {
+        row = rows->Put(row, std::move(block));
+        return PlaceOf(*rows, row);
     }
-    return Place();
+    ChangePlace Hold(std::unique_ptr<IRowBlock> taken)
+    {
+        block = std::move(taken);
+        return PlaceOf(*rows, row);
+    }
+};
+struct Insertion : Lines
+{
+    ChangePlace Apply() { return Put(); }
+    ChangePlace Revert() { return Hold(rows->TakeBack(row, count)); }
+};
+struct Deletion : Lines
+{
+    ChangePlace Apply() { return Hold(rows->Take(row, count)); }
+    ChangePlace Revert() { return Put(); }
+};
+
+struct Arrangement
+{
+    std::shared_ptr<IRowSource> rows;
+    std::vector<std::size_t> order, places; // the row at each place; the place of each row
+    std::size_t row;
+
+    ChangePlace Apply()
+    {
+        rows->Rearrange(order);
+        return PlaceOf(*rows, places[row]);
+    }
+    ChangePlace Revert()
+    {
+        rows->Rearrange(places);
+        return PlaceOf(*rows, row);
+    }
+};
+
+struct Cells
+{
+    std::shared_ptr<IRowSource> rows;
+    std::vector<CellChange> changes;
+    std::size_t row;
+
+    ChangePlace Apply()
+    {
+        for (CellChange& change : changes) {
+            void* object = rows->Object(change.row);
+            if (change.access->restore)
+                change.restore = change.access->restore(object);
+            change.access->set(object, change.after);
+        }
+        return Place();
+    }
+    ChangePlace Revert()
+    {
+        for (auto change = changes.rbegin(); change != changes.rend(); ++change) {
+            void* object = rows->Object(change->row);
+            if (change->restore)
+                change->restore(object);
+            else
+                change->access->set(object, change->before);
+        }
+        return Place();
+    }
+    ChangePlace Place()
+    {
+        row = rows->RowOf(changes.front().row, row);
+        return PlaceOf(*rows, row, changes.front().column);
+    }
+};
+
+} // namespace
+
+void InsertLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::unique_ptr<IRowBlock> lines,
+                 const QString& text)
+{
+    const std::size_t count = lines->Count();
+    Push(document, text.isEmpty() ? GridTexts::tr("Insertion of lines") : text,
+         Insertion{{std::move(rows), row, count, std::move(lines)}});
 }
 
-ChangePlace CSetCells::Place()
+void DeleteLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count)
 {
-    const CellChange& first = m_changes.front();
-    m_row = m_rows->RowOf(first.row, m_row);
-    return PlaceOf(*m_rows, m_row, first.column);
+    Push(document, GridTexts::tr("Deletion of lines"), Deletion{{std::move(rows), row, count}});
+}
+
+void ArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<std::size_t> order, std::size_t row)
+{
+    std::vector<std::size_t> places(order.size());
+    for (std::size_t place = 0; place < order.size(); ++place)
+        places[order[place]] = place;
+    Push(document, {}, Arrangement{std::move(rows), std::move(order), std::move(places), row});
+}
+
+void SetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<CellChange> changes, std::size_t row)
+{
+    Push(document, GridTexts::tr("Change of cells"), Cells{std::move(rows), std::move(changes), row});
 }

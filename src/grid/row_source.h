@@ -28,8 +28,6 @@ public:
     virtual std::size_t Count() const = 0;
     /// The object that the columns of the grid read and write.
     virtual void* At(std::size_t row) = 0;
-    /// Changes whenever rows come, go or move.
-    virtual std::uint64_t Revision() const = 0;
 
     virtual RowKey KeyAt(std::size_t row) = 0;
     virtual void* Object(RowKey key) = 0;
@@ -66,7 +64,6 @@ public:
     virtual bool HasRules() const { return false; }
     /// Where rows stand in an order of their own: for each place the row that belongs there; empty when all do.
     virtual std::vector<std::size_t> Order() const { return {}; }
-    virtual bool IsOrdered() const { return false; }
     virtual void Rearrange(const std::vector<std::size_t>& /*order*/) {}
 
     /// The list or table of the document that the rows are kept in.

@@ -42,9 +42,6 @@ public:
 
     std::size_t Count() const override { return m_rows().size(); }
     void* At(std::size_t row) override { return &m_rows()[row]; }
-    /// With places as keys, only rows behind the end are stale.
-    std::uint64_t Revision() const override { return Count(); }
-
     RowKey KeyAt(std::size_t row) override { return row; }
     void* Object(RowKey key) override { return At(key); }
     std::size_t RowOf(RowKey key, std::size_t) override { return std::min(std::size_t(key), Count()); }

@@ -187,7 +187,7 @@ void Insert(Exchange& exchange)
     record.Chainage = exchange.item.chainage;
     if (exchange.table.fill)
         exchange.table.fill(record, exchange.document.Parameters().Global, exchange.item);
-    exchange.document.UndoStack().push(new CInsertLines(exchange.document, rows, rows->Count(), std::move(lines)));
+    InsertLines(exchange.document, rows, rows->Count(), std::move(lines));
     if (auto* page = shown ? exchange.ListPage() : nullptr)
         page->GotoLine(int(exchange.list.GetCount()));
 }
@@ -202,7 +202,7 @@ void Delete(Exchange& exchange)
         return;
     exchange.Show(exchange.table.deleted);
     const auto rows = MakeListRows(exchange.list);
-    exchange.document.UndoStack().push(new CDeleteLines(exchange.document, rows, row, 1));
+    DeleteLines(exchange.document, rows, row, 1);
 }
 
 void Select(Exchange& exchange)

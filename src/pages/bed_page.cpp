@@ -31,7 +31,7 @@ public:
 
         // The values of the approach not in use are kept.
         const auto column = [&](const double& global, bool ofZones) {
-            return ColumnOptions{.fill = &global,
+            return ColumnSpec{.fill = &global,
                                  .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
                                  .unitText = unit};
         };

@@ -43,14 +43,14 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document)
 
     const auto lockUnless = [uses](Method method) { return [uses, method](const void*) { return !uses(method); }; };
     const auto coefficient = [&](const double& global) {
-        return ColumnOptions{.width = 60, .fill = &global, .locked = lockUnless(Coefficients)};
+        return ColumnSpec{.width = 60, .fill = &global, .locked = lockUnless(Coefficients)};
     };
-    const auto explained = [&](ColumnOptions options) {
+    const auto explained = [&](ColumnSpec options) {
         options.hint = [] { return LoadString(Str::CoefFormula); };
         return options;
     };
     const auto bound = [&](const double& global) {
-        ColumnOptions options = coefficient(global);
+        ColumnSpec options = coefficient(global);
         options.unitText = unit;
         return options;
     };

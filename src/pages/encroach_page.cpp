@@ -141,7 +141,7 @@ void CEncroachPage::DeclareColumns()
     GridColumns columns = Grid(m_ui.grid_1348);
     columns.BranchName({.width = 110}).Chainage({});
     for (const Field& field : HDEncroach::DeclaredFields()) {
-        ColumnOptions options{
+        ColumnSpec options{
             .locked =
                 [name = field.name](const void* row) {
                     const auto* record = static_cast<const HD_RiverPos*>(row);
@@ -153,7 +153,7 @@ void CEncroachPage::DeclareColumns()
                 }};
         if (field.kind == FieldKind::Choice) {
             options.width = 130;
-            options.choice = {.whenEmptied = field.firstChoice};
+            options.choices = {.whenEmptied = field.firstChoice};
         }
         columns.Value(field, std::move(options));
     }

@@ -110,9 +110,9 @@ private:
         CKavo0_hdDoc& document = *m_page.GetDocument();
         document.UndoStack().beginMacro(LoadString(Str::UndoLoad));
         if (!m_changes.empty())
-            document.UndoStack().push(new CSetCells(document, m_rows, std::move(m_changes), m_firstChanged));
+            SetCells(document, m_rows, std::move(m_changes), m_firstChanged);
         if (!m_new.empty())
-            document.UndoStack().push(new CInsertLines(document, m_rows, m_rows->Count(), NewLines()));
+            InsertLines(document, m_rows, m_rows->Count(), NewLines());
         document.UndoStack().endMacro();
     }
 

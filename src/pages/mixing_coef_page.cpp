@@ -18,7 +18,7 @@ public:
         Bindings().Add(m_ui.coef_1333, mixing.MixCoef4);
 
         const auto coefficient = [](int number, const double& global) {
-            return ColumnOptions{.header = [number] { return LoadString(Str::MixCoefNumber).arg(number); },
+            return ColumnSpec{.header = [number] { return LoadString(Str::MixCoefNumber).arg(number); },
                                  .width = 60,
                                  .fill = &global};
         };

@@ -19,7 +19,7 @@ public:
             .Chainage({.caption = Str::UpstreamChainage})
             .Value(&HD_Wavetype::DownstreamChainage, {.emptyIsNotGiven = true})
             .Value(&HD_Wavetype::WaveApproximation,
-                   {.width = 150, .choice = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
+                   {.width = 150, .choices = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
     }
 };
 

@@ -22,7 +22,7 @@ public:
 
         const auto number = [&sand](double& global) {
             const bool isObserved = &global == &sand.Observed;
-            return ColumnOptions{
+            return ColumnSpec{
                 .width = 62,
                 .asFormatted = &global == &sand.Slope, // slopes are far below one, three decimals show nothing of them
                 .emptyIsNotGiven = true,

@@ -210,9 +210,12 @@ class Editor:
         self.click(self.in_sight(table, table.cell(line, column)), **more)
 
     def click_line(self, line, table=None, **more):
-        """On its number."""
+        """On its number, which is beside the line's cells: the place that it tells itself forgets how far the table is
+        scrolled."""
         table = table or self.table()
-        self.click(self.in_sight(table, table.line_number(line)), **more)
+        y = self.in_sight(table, table.cell(line, 1)).middle[1]
+        self.hands.click(table.line_number(line).middle[0], y, **more)
+        self.settle(0.05)
 
     def in_sight(self, table, part):
         """The part of a table, after the wheel was turned until its line is shown."""

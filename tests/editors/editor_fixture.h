@@ -113,7 +113,7 @@ protected:
     /// Takes lines out of a table's rows, as one step.
     static void Remove(CKsDoc& document, const std::shared_ptr<IRowSource>& rows, std::size_t row, std::size_t count)
     {
-        document.UndoStack().push(new CDeleteLines(document, rows, row, count));
+        DeleteLines(document, rows, row, count);
     }
 
     /// What the shell asks of the plug-in KVR_PLUGIN, which has one document template and one tool bar.

@@ -1,5 +1,6 @@
 // The pages of bed resistance, wave approximation, the quasi-steady solver and mixing.
 #include "flow_page_fixture.h"
+#include "grid/grid_clipboard.h"
 #include "pages/page_table.h"
 
 #include "ks/fc/messages.h"
@@ -24,7 +25,7 @@ protected:
     {
         QGuiApplication::clipboard()->setText(text);
         grid->SetCurrentCell(row, column);
-        return grid->Paste();
+        return PasteCells(*grid);
     }
 };
 

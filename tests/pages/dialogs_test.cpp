@@ -1,7 +1,6 @@
 #include "page_fixture.h"
 
-#include "grid/goto_dlg.h"
-#include "grid/search_dlg.h"
+#include "grid/line_dialogs.h"
 
 #include <QRadioButton>
 

@@ -4,6 +4,7 @@
 #include "grid/grid_keys.h"
 
 #include <QClipboard>
+#include <QHeaderView>
 #include <QKeyEvent>
 #include <QSignalSpy>
 
@@ -109,6 +110,31 @@ TEST_F(GridKeyTest, CommandsGoToTheView)
     EXPECT_FALSE(Editor());
     EXPECT_EQ(view->commands.size(), 4);
     EXPECT_EQ(init.GetAt(0).RiverName, "X");
+}
+
+TEST_F(GridKeyTest, DeletesTheLineWhoseNumberIsClicked)
+{
+    Add("C", 3);
+    view->page->LoadFromDocument(&document);
+    const QHeaderView& numbers = *grid->verticalHeader();
+    const int top = numbers.sectionViewportPosition(1), height = numbers.sectionSize(1);
+    for (const int y : {top, top + height / 2, top + height - 1}) { // a border belongs to its line
+        grid->SetCurrentCell(1, 1);
+        QTest::mouseClick(numbers.viewport(), Qt::LeftButton, {}, {5, y});
+        EXPECT_EQ(Current().first, 2) << y;
+        EXPECT_TRUE(grid->HasLinesToDelete()) << y;
+    }
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(init.GetCount(), 2u);
+    // The next click may come so soon that it is told as the second of a double click.
+    const QPointF at(5, top + height / 2.0);
+    for (const auto type : {QEvent::MouseButtonDblClick, QEvent::MouseButtonRelease}) {
+        QMouseEvent event(type, at, numbers.viewport()->mapToGlobal(at), Qt::LeftButton, Qt::LeftButton, {});
+        QApplication::sendEvent(numbers.viewport(), &event);
+    }
+    Press(Qt::Key_Delete);
+    ASSERT_EQ(init.GetCount(), 1u);
+    EXPECT_EQ(init.GetAt(0).RiverName, "A");
 }
 
 TEST_F(GridKeyTest, DeletesWholeLinesOfOneRange)

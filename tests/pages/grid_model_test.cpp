@@ -128,7 +128,7 @@ TEST_F(ModelTest, TextsOfNumbers)
     {
         double value;
         const char* format;
-        int control;
+        GridControl control;
         const char *shown, *edited;
     } const cases[] = {
         {1234.5, "%-lf", Control::Chainage, "1234", "1234.5"}, // half to even, as the platform rounds

@@ -1,5 +1,6 @@
 // The further grids of the pages: pairs of the file as a whole, and of the current line.
 #include "flow_page_fixture.h"
+#include "grid/grid_clipboard.h"
 #include "pages/page_table.h"
 
 #include <QClipboard>
@@ -71,11 +72,11 @@ TEST_F(PairsGridTest, KeyboardAlone)
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "0.5 26, 1 29");
     QGuiApplication::clipboard()->setText("2\t3\n4\t5");
     global->SetCurrentCell(2, 1);
-    EXPECT_TRUE(global->Paste());
+    EXPECT_TRUE(PasteCells(*global));
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "0.5 26, 2 3, 4 5");
     UndoAll();
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "");
-    EXPECT_TRUE(global->Paste()) << "also into an empty table";
+    EXPECT_TRUE(PasteCells(*global)) << "also into an empty table";
     EXPECT_EQ(Pairs(globals.BedResist.VeloRes), "2 3, 4 5");
     EXPECT_FALSE(line->isEnabled()) << "there is no line yet";
     Enter(1, 1, "main");

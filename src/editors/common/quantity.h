@@ -5,12 +5,6 @@
 
 #include <cmath>
 
-/// "Width [m]"
-inline QString WithUnit(const QString& name, UnitGroup group)
-{
-    return QStringLiteral("%1 [%2]").arg(name, CKsEditStyle(group).UnitSymbol());
-}
-
 /// "12.5 m", to a thousandth of the unit; only the unit for a value that is not set.
 inline QString WithSymbol(UnitGroup group, double value)
 {

@@ -27,7 +27,6 @@ CGenGrid* CTablesView::AddTable(QSplitter& side, QLabel*& title, const char* nam
     table->horizontalHeader()->setStretchLastSection(true);
     constexpr int least = 36; // letters, row numbers included: two columns are in sight beside the smallest picture
     table->setMinimumWidth(least * table->fontMetrics().averageCharWidth());
-    table->SetInsertsBelow(true);
     table->SetLineChoice(LineChoice::LinesOfCells);
     title = new QLabel;
     title->setWordWrap(true);

@@ -1,6 +1,7 @@
 // How the plot of a cross section is painted.
 #include "editors/common/quantity.h"
 #include "editors/cross_sections/section_plot.h"
+#include "grid/column_spec.h"
 
 #include <QPainter>
 #include <algorithm>

@@ -16,7 +16,7 @@ double PlaceOf(double chainage)
 
 std::tuple<QString, QString, double> CCrossSection::Key() const
 {
-    return {KsBranchKey(branch), topoId, PlaceOf(chainage)};
+    return {KsBranchKey(Branch()), TopoId(), PlaceOf(chainage)};
 }
 
 bool CCrossSections::IsTaken(const CCrossSection& section, int except) const
@@ -32,9 +32,10 @@ int CCrossSections::Nearest(const QString& branch, double chainage) const
 {
     int nearest = -1;
     double least = HUGE_VAL;
+    const std::string wanted = branch.toStdString();
     for (std::size_t i = 0; i < sections.size(); ++i) {
         const double distance = std::abs(sections[i].chainage - chainage);
-        if (distance < least && KsSameBranch(sections[i].branch, branch)) {
+        if (distance < least && KsSameBranch(sections[i].branch, wanted)) {
             least = distance;
             nearest = int(i);
         }
@@ -47,9 +48,9 @@ QStringList CCrossSections::Branches() const
     QStringList branches;
     QSet<QString> known;
     for (const CCrossSection& section : sections) {
-        if (const QString key = KsBranchKey(section.branch); !known.contains(key)) {
+        if (const QString key = KsBranchKey(section.Branch()); !known.contains(key)) {
             known << key;
-            branches << section.branch;
+            branches << section.Branch();
         }
     }
     return branches;
@@ -61,7 +62,7 @@ std::vector<int> CCrossSections::ByPlace() const
     std::vector<std::pair<std::size_t, double>> places;
     for (const CCrossSection& section : sections) {
         const std::size_t next = branches.size();
-        places.emplace_back(branches.emplace(KsBranchKey(section.branch), next).first->second, section.chainage);
+        places.emplace_back(branches.emplace(KsBranchKey(section.Branch()), next).first->second, section.chainage);
     }
     std::vector<int> order(sections.size());
     std::iota(order.begin(), order.end(), 0);

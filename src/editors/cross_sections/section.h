@@ -22,14 +22,17 @@ struct CSectionPoint
 /// Metres; KsUnset for what is not known.
 struct CCrossSection
 {
-    QString branch;
+    std::string branch;
     double chainage = 0;
-    QString topoId;                    // names the survey; several may have measured the same place
+    std::string topoId;                // names the survey; several may have measured the same place
     double radius = KsUnset;           // of curvature
     double width = KsUnset;            // of the water surface
     std::vector<CSectionPoint> points; // from left to right; offsets do not decrease
     UnknownNodes kept, keptProfile;    // what the file says beyond that, and among the points
 
+    static FieldList DeclaredFields();
+    QString Branch() const { return QString::fromStdString(branch); }
+    QString TopoId() const { return QString::fromStdString(topoId); }
     /// Branch, survey and PlaceOf(chainage): no two sections share it.
     std::tuple<QString, QString, double> Key() const;
 };

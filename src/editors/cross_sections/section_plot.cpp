@@ -48,15 +48,15 @@ void CSectionPlot::SetCurrentPoint(int point)
 QString CSectionPlot::Title() const
 {
     return m_section
-               ? QStringLiteral("%1  %2").arg(m_section->branch, WithSymbol(UnitGroup::Chainage, m_section->chainage))
+               ? QStringLiteral("%1  %2").arg(m_section->Branch(), WithSymbol(UnitGroup::Chainage, m_section->chainage))
                : QString();
 }
 
 QString CSectionPlot::Caption() const
 {
     QStringList parts;
-    if (!m_section->topoId.isEmpty())
-        parts << tr("Topo ID %1").arg(m_section->topoId);
+    if (!m_section->topoId.empty())
+        parts << tr("Topo ID %1").arg(m_section->TopoId());
     if (!std::isnan(m_section->radius))
         parts << tr("Radius %1").arg(WithSymbol(UnitGroup::Radius, m_section->radius));
     if (!std::isnan(m_section->width) && !m_water) { // otherwise it stands at the marker

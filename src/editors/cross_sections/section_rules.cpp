@@ -15,14 +15,13 @@ struct SectionRules
 
 CSectionFault FindFault(const CCrossSection& section)
 {
-    if (section.branch.isEmpty())
-        return {CSectionFault::Branch, -1, SectionRules::tr("a cross section needs the name of its branch.")};
+    if (section.branch.empty())
+        return {SectionRules::tr("a cross section needs the name of its branch."), "Branch"};
     if (section.width < 0)
-        return {CSectionFault::Width, -1, SectionRules::tr("expected a width that is not negative.")};
+        return {SectionRules::tr("expected a width that is not negative."), "Width"};
     for (std::size_t i = 1; i < section.points.size(); ++i) {
         if (section.points[i].offset < section.points[i - 1].offset)
-            return {CSectionFault::Point, int(i),
-                    SectionRules::tr("expected offsets that do not decrease from point to point.")};
+            return {SectionRules::tr("expected offsets that do not decrease from point to point."), {}, int(i)};
     }
     return {};
 }
@@ -31,5 +30,5 @@ QString WhyTaken(const CCrossSection& section)
 {
     return SectionRules::tr(
                "there is a cross section of branch \"%1\" at chainage %2 m with the topo ID \"%3\" already.")
-        .arg(section.branch, KsShortestNumber(section.chainage), section.topoId);
+        .arg(section.Branch(), KsShortestNumber(section.chainage), section.TopoId());
 }

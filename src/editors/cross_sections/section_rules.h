@@ -6,16 +6,9 @@
 /// What is wrong with a section.
 struct CSectionFault
 {
-    enum Field
-    {
-        Nothing,
-        Branch,
-        Width,
-        Point
-    };
-    Field field = Nothing;
-    int point = -1; // of Field::Point
-    QString text{}; // for the user: a sentence that says what was expected
+    QString text{};                // for the user: a sentence that says what was expected; empty for nothing
+    std::string_view keyword = {}; // of the file, where it stands
+    int point = -1;                // or this point
 };
 
 CSectionFault FindFault(const CCrossSection& section);

@@ -1,7 +1,7 @@
 #include "editors/cross_sections/section_tables.h"
 
-#include "editors/common/columns.h"
 #include "editors/cross_sections/document.h"
+#include "grid/field_columns.h"
 #include "grid/vector_rows.h"
 
 #include <numeric>
@@ -29,7 +29,7 @@ public:
             auto& line = *static_cast<CCrossSection*>(rows.At(i));
             const auto* before = i > 0 ? static_cast<CCrossSection*>(rows.At(i - 1)) : Above(at, 1);
             if (!before) {
-                line.branch = m_document.NewBranch();
+                line.branch = m_document.NewBranch().toStdString();
                 continue;
             }
             line.branch = before->branch;
@@ -55,7 +55,7 @@ public:
         }
         for (std::size_t i = 0; i < rows.Count(); ++i) {
             const auto& section = *static_cast<const CCrossSection*>(rows.At(i));
-            if (section.branch.isEmpty())
+            if (section.branch.empty())
                 return Fault{i, ::FindFault(section).text};
             if (!taken.insert(section.Key()).second)
                 return Fault{i, WhyTaken(section)};
@@ -111,13 +111,13 @@ public:
     std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
     {
         CCrossSection section;
-        section.branch = QStringLiteral("-");
+        section.branch = "-";
         section.points = Rows();
         section.points.resize(std::max(section.points.size(), first + rows.Count()));
         for (std::size_t i = 0; i < rows.Count(); ++i)
             section.points[first + i] = *static_cast<const CSectionPoint*>(rows.At(i));
         const CSectionFault fault = ::FindFault(section);
-        if (fault.field == CSectionFault::Nothing)
+        if (fault.text.isEmpty())
             return std::nullopt;
         const std::size_t at = std::size_t(std::max(fault.point, 0)); // or it is the point above that is too far
         return Fault{std::min(at > first ? at - first : 0, rows.Count() - 1), fault.text};
@@ -136,21 +136,22 @@ std::shared_ptr<IRowSource> MakePointRows(CCrossSectionDoc& document, int sectio
     return document.Section(section) ? std::make_shared<CPointRows>(document, std::size_t(section)) : nullptr;
 }
 
+static constexpr TableStyle Tables{.text = [](const TextLine& line) { return SectionTables::tr(line.source); },
+                                   .besideAPicture = true};
+
 void AddSectionColumns(CGridModel& model)
 {
-    ColumnSpec width;
-    width.minimum = 0;
-    TableColumns<CCrossSection>(model)
-        .Text([] { return SectionTables::tr("Branch"); }, &CCrossSection::branch)
-        .Number([] { return SectionTables::tr("Chainage"); }, &CCrossSection::chainage, UnitGroup::Chainage)
-        .Known([] { return SectionTables::tr("Radius"); }, &CCrossSection::radius, UnitGroup::Radius)
-        .Known([] { return SectionTables::tr("Width"); }, &CCrossSection::width, UnitGroup::Width, width)
-        .Text([] { return SectionTables::tr("Topo ID"); }, &CCrossSection::topoId);
+    using C = CCrossSection;
+    FieldColumns(model, Tables)
+        .Value(&C::branch)
+        .Value(&C::chainage)
+        .Value(&C::radius)
+        .Value(&C::width)
+        .Value(&C::topoId);
 }
 
 void AddPointColumns(CGridModel& model)
 {
-    TableColumns<CSectionPoint>(model)
-        .Number([] { return SectionTables::tr("Offset"); }, &CSectionPoint::offset, UnitGroup::Width)
-        .Number([] { return SectionTables::tr("Bed level"); }, &CSectionPoint::level, UnitGroup::WaterLevel);
+    using P = CSectionPoint;
+    FieldColumns(model, Tables).Value(&P::offset).Value(&P::level);
 }

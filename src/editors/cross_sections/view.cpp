@@ -41,7 +41,7 @@ void CCrossSectionView::MakeTables(QSplitter* splitter)
     AddSectionColumns(*m_sections->Model());
     AddPointColumns(*m_points->Model());
     m_points->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
-    m_sections->ShowRows(*Document(), MakeSectionRows(*Document()));
+    m_sections->Model()->SetSource(*Document(), MakeSectionRows(*Document()));
     splitter->addWidget(side);
 }
 
@@ -75,7 +75,7 @@ void CCrossSectionView::ShowSection()
 {
     const int section = CurrentSection();
     if (std::exchange(m_pointsOf, section) != section)
-        m_points->ShowRows(*Document(), MakePointRows(*Document(), section));
+        m_points->Model()->SetSource(*Document(), MakePointRows(*Document(), section));
     m_points->setEnabled(section >= 0);
     m_plot->Show(Document()->Section(section));
     m_points->Refresh();

@@ -38,7 +38,7 @@ LRESULT CCrossSectionView::LoadLocations(CObList& objects) const
     for (const int index : all.ByPlace()) {
         const CCrossSection& section = all.sections[std::size_t(index)];
         auto item = std::make_unique<CKvrCBELocation>();
-        item->branch = section.branch;
+        item->branch = section.Branch();
         item->chainage = section.chainage;
         objects.push_back(std::move(item));
     }
@@ -50,7 +50,7 @@ LRESULT CCrossSectionView::FillChannel(const CObList& objects) const
 {
     std::multimap<std::pair<QString, double>, const CCrossSection*> places;
     for (const CCrossSection& section : Document()->Sections().sections)
-        places.emplace(std::pair(KsBranchKey(section.branch), PlaceOf(section.chainage)), &section);
+        places.emplace(std::pair(KsBranchKey(section.Branch()), PlaceOf(section.chainage)), &section);
     bool filled = false;
     for (const auto& object : objects) {
         auto* item = dynamic_cast<CKvrCBELocation*>(object.get());
@@ -98,9 +98,9 @@ LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
 void CCrossSectionView::TellLocation()
 {
     const CCrossSection* section = Document()->Section(CurrentSection());
-    if (!section || (section->branch == m_toldBranch && section->chainage == m_toldChainage))
+    if (!section || (section->Branch() == m_toldBranch && section->chainage == m_toldChainage))
         return;
-    m_toldBranch = section->branch;
+    m_toldBranch = section->Branch();
     m_toldChainage = section->chainage;
     if (m_showing || m_telling)
         return;

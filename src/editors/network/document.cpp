@@ -57,6 +57,6 @@ void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QSt
     UndoStack().beginMacro(text);
     if (system != m_network.system)
         UndoStack().push(new CSetValue<QString>(*this, text, m_network.system, system));
-    UndoStack().push(new CInsertLines(*this, rows, rows->Count(), std::move(added)));
+    InsertLines(*this, rows, rows->Count(), std::move(added));
     UndoStack().endMacro();
 }

@@ -79,7 +79,7 @@ public:
     CPlanner(const CImportOptions& options, const CNetwork& network) : m_options(options)
     {
         for (const CNetworkBranch& branch : network.branches)
-            m_taken << KsBranchKey(branch.name);
+            m_taken << KsBranchKey(branch.Name());
     }
 
     void Add(const CGisFeature& feature, std::vector<CGisLine> parts)
@@ -177,10 +177,10 @@ private:
     CNetworkBranch& NewBranch(const QString& wanted, const CGisLine& line)
     {
         CNetworkBranch& branch = plan.branches.emplace_back();
-        branch.name = FreeName(wanted);
+        branch.name = FreeName(wanted).toStdString();
         branch.line = line;
         branch.end = branch.Length();
-        m_taken << KsBranchKey(branch.name);
+        m_taken << KsBranchKey(branch.Name());
         return branch;
     }
 
@@ -188,9 +188,9 @@ private:
     {
         CNetworkBranch& branch = NewBranch(m_name.isEmpty() ? ImportBranches::tr("Branch") : m_name, line);
         if (m_name.isEmpty())
-            Change(ImportBranches::tr("has no name and becomes \"%1\".").arg(branch.name));
-        else if (branch.name != m_name)
-            Change(ImportBranches::tr("this name is taken; the branch becomes \"%1\".").arg(branch.name));
+            Change(ImportBranches::tr("has no name and becomes \"%1\".").arg(branch.Name()));
+        else if (branch.Name() != m_name)
+            Change(ImportBranches::tr("this name is taken; the branch becomes \"%1\".").arg(branch.Name()));
         if (const auto chainages = Chainages(feature, branch.end)) {
             branch.start = chainages->first;
             branch.end = chainages->second;
@@ -248,7 +248,7 @@ private:
                 branch.end = std::lerp(first, last, after / whole);
             }
             before = after;
-            names << ImportBranches::tr("\"%1\" (%2)").arg(branch.name, Metres(LengthOf(each.line)));
+            names << ImportBranches::tr("\"%1\" (%2)").arg(branch.Name(), Metres(LengthOf(each.line)));
         }
         const QString how = chainages ? ImportBranches::tr("The chainages of the line are shared out among them.")
                                       : ImportBranches::tr("Each goes from 0 to its length.");

@@ -140,7 +140,7 @@ QString ImportReport(const CImport& import, const CNetwork& network)
     for (const CNetworkBranch& branch : plan.branches)
         lines << QStringLiteral("  ") +
                      Text::tr("%1: %2 long, chainages from %3 to %4")
-                         .arg(branch.name, Length(branch.Length()), Length(branch.start), Length(branch.end));
+                         .arg(branch.Name(), Length(branch.Length()), Length(branch.start), Length(branch.end));
     return lines.join(u'\n') + u'\n';
 }
 

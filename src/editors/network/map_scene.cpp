@@ -23,7 +23,7 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
     const CNetwork& network = document.Network();
     QHash<QString, int> branches;
     for (std::size_t i = 0; i < network.branches.size(); ++i)
-        branches.insert(KsBranchKey(network.branches[i].name), int(i));
+        branches.insert(KsBranchKey(network.branches[i].Name()), int(i));
     std::vector<CPlacedLocation> placed;
     placed.reserve(locations.size());
     QString name; // of the location before: most follow one of the same branch
@@ -50,7 +50,7 @@ std::vector<QPainterPath> NameOutlines(const CNetwork& network, const QFont& fon
     outlines.reserve(network.branches.size());
     for (const CNetworkBranch& branch : network.branches) {
         QPainterPath text;
-        text.addText(0, 0, font, branch.name);
+        text.addText(0, 0, font, branch.Name());
         outlines.push_back(QTransform::fromScale(ratio, ratio).map(text));
         outlines.back().translate(-outlines.back().boundingRect().center());
     }

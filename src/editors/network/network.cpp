@@ -21,8 +21,8 @@ void CNetworkBranch::SortChannel()
 
 int CNetwork::FindBranch(const QString& name) const
 {
-    const auto found = std::find_if(branches.begin(), branches.end(),
-                                    [&](const CNetworkBranch& each) { return KsSameBranch(each.name, name); });
+    const auto isIt = [wanted = name.toStdString()](const auto& each) { return KsSameBranch(each.name, wanted); };
+    const auto found = std::find_if(branches.begin(), branches.end(), isIt);
     return found == branches.end() ? -1 : int(found - branches.begin());
 }
 

@@ -22,13 +22,15 @@ struct CChannelRow
 
 struct CNetworkBranch
 {
-    QString name;
+    std::string name;
     double start = 0, end = 0;                // chainages of the first and the last vertex, metres; they differ
     bool downstream = true;                   // water flows towards increasing chainage
     std::vector<QPointF> line;                // map coordinates, metres: x to the east, y to the north
     std::vector<CChannelRow> channel;         // by increasing chainage
     UnknownNodes kept, keptLine, keptChannel; // what the file says beyond that, and among the vertices and the rows
 
+    static FieldList DeclaredFields();
+    QString Name() const { return QString::fromStdString(name); }
     /// Whether water flows from the first vertex to the last.
     bool FlowsAlongLine() const { return downstream == (end >= start); }
     /// Metres along the line.

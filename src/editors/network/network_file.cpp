@@ -14,104 +14,97 @@ struct NetworkFile
 
 using U = UnitGroup;
 
-// What the file holds, with its texts and points as fields take them.
-struct Vertex
-{
-    double x = 0, y = 0;
+using N = CNetworkBranch;
 
-    static FieldList DeclaredFields()
-    {
-        static constexpr auto fields =
-            FieldsOf<Vertex>({Number<&Vertex::x>("x", U::Coordinate), Number<&Vertex::y>("y", U::Coordinate)});
-        return fields;
-    }
-};
-struct FileBranch
+/// A coordinate of a point, which gives it by a function.
+template <auto reach>
+constexpr Field Coordinate(std::string_view name)
 {
-    std::string name;
-    std::vector<Vertex> line;
-    CNetworkBranch branch; // all else
-};
+    return {.name = name,
+            .owner = &field_detail::Tag<QPointF>,
+            .address = [](void* point) -> void* { return &(static_cast<QPointF*>(point)->*reach)(); },
+            .constAddress = [](const void* point) -> const void* {
+                return &(static_cast<QPointF*>(const_cast<void*>(point))->*reach)();
+            },
+            .unit = U::Coordinate};
+}
+FieldList VertexFields()
+{
+    static constexpr auto fields = FieldsOf<QPointF>({Coordinate<&QPointF::rx>("x"), Coordinate<&QPointF::ry>("y")});
+    return fields;
+}
+
+// What the file holds.
 struct FileNetwork
 {
     std::string system;
-    std::vector<FileBranch> branches;
-    UnknownNodes kept, keptTargets;
+    CNetwork network; // all else
 };
 
 // The names of the file.
 constexpr const char *BranchSection = "Branch", *NameKeyword = "Name", *ChainageKeyword = "Chainage";
 
-using B = FileBranch;
-using N = CNetworkBranch;
-constexpr auto name = FieldsOf<B>({Text<&B::name>("Name")});
-constexpr auto ends = FieldsOf<B>({Number<&B::branch, &N::start>("first vertex", U::Chainage),
-                                   Number<&B::branch, &N::end>("last vertex", U::Chainage)});
-constexpr auto downstream = FieldsOf<B>({Boolean<&B::branch, &N::downstream>("FlowsDownstream")});
-constexpr auto vertices = FieldsOf<B>({Group<&B::line>("Vertex")});
-constexpr auto rows = FieldsOf<B>({Group<&B::branch, &N::channel>("DATA")});
+constexpr auto branchFields =
+    FieldsOf<N>({Text<&N::name>("Name").Title(QT_TRANSLATE_NOOP("NetworkTables", "Branch")),
+                 Number<&N::start>("first vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "From")),
+                 Number<&N::end>("last vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "To")),
+                 Boolean<&N::downstream>("FlowsDownstream").Title(QT_TRANSLATE_NOOP("NetworkTables", "Flow"))});
+constexpr auto vertices = FieldsOf<N>({GroupOf<&VertexFields, &N::line>("Vertex")});
+constexpr auto rows = FieldsOf<N>({Group<&N::channel>("DATA")});
 constexpr DeclaredKeyword lineKeywords[] = {{"Vertex", vertices}}, channelKeywords[] = {{"DATA", rows}};
 constexpr DeclaredSection branchSections[] = {
-    {.name = "Line", .kept = Keeps<&B::branch, &N::keptLine>(), .keywords = lineKeywords},
-    {.name = "Channel", .kept = Keeps<&B::branch, &N::keptChannel>(), .keywords = channelKeywords}};
+    {.name = "Line", .kept = Keeps<&N::keptLine>(), .keywords = lineKeywords},
+    {.name = "Channel", .kept = Keeps<&N::keptChannel>(), .keywords = channelKeywords}};
 constexpr DeclaredKeyword branchKeywords[] = {
-    {NameKeyword, name}, {ChainageKeyword, ends}, {"FlowsDownstream", downstream, Presence::Optional}};
+    {NameKeyword, FieldList(branchFields).subspan(0, 1)},
+    {ChainageKeyword, FieldList(branchFields).subspan(1, 2)},
+    {"FlowsDownstream", FieldList(branchFields).subspan(3), Presence::Optional}};
 
 constexpr auto coordinates = FieldsOf<FileNetwork>({Text<&FileNetwork::system>("CoordinateSystem")});
-constexpr Field branches = SectionGroup<&FileNetwork::branches>(BranchSection);
+constexpr Field branches = SectionGroup<&FileNetwork::network, &CNetwork::branches>(BranchSection);
 constexpr DeclaredKeyword networkKeywords[] = {{"CoordinateSystem", coordinates, Presence::WhenSet}};
 constexpr DeclaredSection networkSections[] = {{.name = BranchSection,
-                                                .kept = Keeps<&B::branch, &N::kept>(),
+                                                .kept = Keeps<&N::kept>(),
                                                 .keywords = branchKeywords,
                                                 .sections = branchSections,
                                                 .sectionCount = std::size(branchSections),
                                                 .each = &branches}};
 constexpr DeclaredFile file{{.name = "KVR_NETWORK",
-                             .kept = Keeps<&FileNetwork::kept>(),
+                             .kept = Keeps<&FileNetwork::network, &CNetwork::kept>(),
                              .keywords = networkKeywords,
                              .sections = networkSections,
                              .sectionCount = std::size(networkSections)},
-                            Keeps<&FileNetwork::keptTargets>()};
-
-CNetworkBranch Taken(FileBranch& read)
-{
-    CNetworkBranch branch = std::move(read.branch);
-    branch.name = QString::fromStdString(read.name);
-    for (const Vertex& at : read.line)
-        branch.line.emplace_back(at.x, at.y);
-    branch.SortChannel();
-    return branch;
-}
-
-FileBranch ForFile(const CNetworkBranch& branch)
-{
-    FileBranch written{branch.name.toStdString(), {}, branch};
-    for (const QPointF& at : branch.line)
-        written.line.push_back({at.x(), at.y()});
-    return written;
-}
+                            Keeps<&FileNetwork::network, &CNetwork::keptTargets>()};
 
 /// What a branch of the file has to fulfil beside its declaration.
-void Check(CKsParameterFile& source, tqlHandle section, const CNetworkBranch& branch, const CNetwork& before)
+void Check(CKsParameterFile& source, const CNetwork& network, int index)
 {
+    const CNetworkBranch& branch = network.branches[std::size_t(index)];
+    const tqlHandle section = tqlSectionByNameNum(source.Target(), BranchSection, index + 1);
     const tqlHandle named = CKsParameterFile::PlaceOf(section, NameKeyword);
-    if (branch.name.isEmpty())
+    if (branch.name.empty())
         source.Fail(named, NetworkFile::tr("expected the branch's name, Name = \"...\"."));
     else if (branch.start == branch.end)
         source.Fail(CKsParameterFile::PlaceOf(section, ChainageKeyword),
                     NetworkFile::tr("the chainages of the two ends have to differ."));
-    else if (before.FindBranch(branch.name) >= 0)
-        source.Fail(named, NetworkFile::tr("there is a branch \"%1\" already.").arg(branch.name));
+    else if (network.FindBranch(branch.Name()) < index)
+        source.Fail(named, NetworkFile::tr("there is a branch \"%1\" already.").arg(branch.Name()));
 }
 
 } // namespace
 
+FieldList CNetworkBranch::DeclaredFields()
+{
+    return branchFields;
+}
+
 FieldList CChannelRow::DeclaredFields()
 {
     using R = CChannelRow;
-    static constexpr auto fields = FieldsOf<R>({Number<&R::chainage>("chainage", U::Chainage),
-                                                Number<&R::radius>("radius", U::Radius).MayBeUnknown(),
-                                                Number<&R::width>("width", U::Width).MayBeUnknown()});
+    static constexpr auto fields = FieldsOf<R>(
+        {Number<&R::chainage>("chainage", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "Chainage")),
+         Number<&R::radius>("radius", U::Radius).MayBeUnknown().Title(QT_TRANSLATE_NOOP("NetworkTables", "Radius")),
+         Number<&R::width>("width", U::Width).MayBeUnknown().Title(QT_TRANSLATE_NOOP("NetworkTables", "Width"))});
     return fields;
 }
 
@@ -119,25 +112,20 @@ QString ReadNetwork(const QString& path, CNetwork& network)
 {
     FileNetwork read;
     CKsParameterFile source(path, file, &read);
-    CNetwork taken;
-    for (std::size_t i = 0; i < read.branches.size() && source.Error().isEmpty(); ++i) {
-        CNetworkBranch branch = Taken(read.branches[i]);
-        Check(source, tqlSectionByNameNum(source.Target(), BranchSection, int(i) + 1), branch, taken);
-        taken.branches.push_back(std::move(branch));
+    CNetwork& taken = read.network;
+    for (std::size_t i = 0; i < taken.branches.size() && source.Error().isEmpty(); ++i) {
+        Check(source, taken, int(i));
+        taken.branches[i].SortChannel();
     }
     if (!source.Error().isEmpty())
         return source.Error();
     taken.system = QString::fromStdString(read.system);
-    taken.kept = std::move(read.kept);
-    taken.keptTargets = std::move(read.keptTargets);
     network = std::move(taken);
     return {};
 }
 
 QString WriteNetwork(const QString& path, const CNetwork& network)
 {
-    FileNetwork written{network.system.toStdString(), {}, network.kept, network.keptTargets};
-    for (const CNetworkBranch& branch : network.branches)
-        written.branches.push_back(ForFile(branch));
+    const FileNetwork written{network.system.toStdString(), network};
     return KsWriteParameterFile(path, file, &written);
 }

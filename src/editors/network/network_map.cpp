@@ -139,7 +139,7 @@ std::optional<CMapPlace> CNetworkMap::Nearest(const QPointF& window, double reac
         m_document.Reference().Nearest(m_projection.ToMap(window * ratio), reach * ratio / m_projection.scale);
     if (!place)
         return std::nullopt;
-    return Place{m_document.Network().branches[std::size_t(place->branch)].name, place->chainage};
+    return Place{m_document.Network().branches[std::size_t(place->branch)].Name(), place->chainage};
 }
 
 void CNetworkMap::PickAt(const QPointF& window)

@@ -1,7 +1,7 @@
 #include "editors/network/network_tables.h"
 
-#include "editors/common/columns.h"
 #include "editors/network/document.h"
+#include "grid/field_columns.h"
 #include "grid/vector_rows.h"
 #include "ks/fc/branch_name.h"
 
@@ -28,15 +28,15 @@ public:
         QSet<QString> taken; // by the others
         for (std::size_t row = 0; row < Count(); ++row) {
             if (row < first || row >= first + rows.Count())
-                taken.insert(KsBranchKey(Rows()[row].name));
+                taken.insert(KsBranchKey(Rows()[row].Name()));
         }
         for (std::size_t i = 0; i < rows.Count(); ++i) {
             const auto& branch = *static_cast<const CNetworkBranch*>(rows.At(i));
-            const QString key = KsBranchKey(branch.name);
+            const QString key = KsBranchKey(branch.Name());
             if (key.isEmpty())
                 return Fault{i, NetworkTables::tr("A branch needs a name.")};
             if (taken.contains(key))
-                return Fault{i, NetworkTables::tr("There is a branch \"%1\" already.").arg(branch.name)};
+                return Fault{i, NetworkTables::tr("There is a branch \"%1\" already.").arg(branch.Name())};
             if (branch.start == branch.end)
                 return Fault{i, NetworkTables::tr("The chainages of the two ends of a branch have to differ.")};
             taken.insert(key);
@@ -99,7 +99,6 @@ public:
         }
         return std::nullopt;
     }
-    bool IsOrdered() const override { return true; }
     std::vector<std::size_t> Order() const override
     {
         const auto& channel = Rows();
@@ -130,33 +129,36 @@ std::shared_ptr<IRowSource> MakeChannelRows(CNetworkDoc& document, int branch)
     return std::make_shared<CChannelRows>(document, std::size_t(branch));
 }
 
+static constexpr TableStyle Tables{.text = [](const TextLine& line) { return NetworkTables::tr(line.source); },
+                                   .besideAPicture = true};
+
 void AddBranchColumns(CGridModel& model)
 {
-    using Columns = TableColumns<CNetworkBranch>;
-    const CellAccess vertices{[](const void* row) -> CellValue { return std::int32_t(Columns::Of(row).line.size()); },
-                              [](void*, const CellValue&) {}};
-    const CellAccess flow{
-        [](const void* row) -> CellValue { return std::int32_t(Columns::Of(row).downstream); },
-        [](void* row, const CellValue& value) { Columns::Of(row).downstream = std::get<std::int32_t>(value) != 0; }};
-    ColumnSpec counted, direction;
-    counted.locked = [](const void*) { return true; };
-    direction.choices.entries = [] {
-        return QStringList{NetworkTables::tr("decreasing"), NetworkTables::tr("increasing")};
+    using N = CNetworkBranch;
+    const CellAccess vertices{
+        [](const void* row) -> CellValue { return std::int32_t(static_cast<const N*>(row)->line.size()); },
+        [](void*, const CellValue&) {}};
+    static constexpr Field counted =
+        Field{.name = "vertices", .kind = FieldKind::Integer}.Title(QT_TRANSLATE_NOOP("NetworkTables", "Vertices"));
+    const Choices directions{
+        .entries =
+            [] {
+                return QStringList{NetworkTables::tr("decreasing"), NetworkTables::tr("increasing")};
+            },
+        .whenEmptied = 1};
+    const auto hint = [] {
+        return NetworkTables::tr("Whether water flows towards increasing or decreasing chainages");
     };
-    direction.choices.whenEmptied = 1;
-    direction.hint = [] { return NetworkTables::tr("Whether water flows towards increasing or decreasing chainages"); };
-    Columns(model)
-        .Text([] { return NetworkTables::tr("Branch"); }, &CNetworkBranch::name)
-        .Number([] { return NetworkTables::tr("From"); }, &CNetworkBranch::start, UnitGroup::Chainage)
-        .Number([] { return NetworkTables::tr("To"); }, &CNetworkBranch::end, UnitGroup::Chainage)
-        .Add(Control::Integer, [] { return NetworkTables::tr("Vertices"); }, counted, vertices)
-        .Add(Control::DropDown, [] { return NetworkTables::tr("Flow"); }, direction, flow);
+    FieldColumns(model, Tables)
+        .Value(&N::name)
+        .Value(&N::start)
+        .Value(&N::end)
+        .Value(vertices, counted, {.locked = [](const void*) { return true; }})
+        .Value(&N::downstream, {.choices = directions, .hint = hint});
 }
 
 void AddChannelColumns(CGridModel& model)
 {
-    TableColumns<CChannelRow>(model)
-        .Number([] { return NetworkTables::tr("Chainage"); }, &CChannelRow::chainage, UnitGroup::Chainage)
-        .Known([] { return NetworkTables::tr("Radius"); }, &CChannelRow::radius, UnitGroup::Radius)
-        .Known([] { return NetworkTables::tr("Width"); }, &CChannelRow::width, UnitGroup::Width);
+    using R = CChannelRow;
+    FieldColumns(model, Tables).Value(&R::chainage).Value(&R::radius).Value(&R::width);
 }

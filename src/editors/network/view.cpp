@@ -54,7 +54,7 @@ void CNetworkView::MakeTables(QSplitter* splitter)
     m_channel = AddTable(*side, m_channelTitle, "channelTable");
     AddBranchColumns(*m_branches->Model());
     AddChannelColumns(*m_channel->Model());
-    m_branches->ShowRows(*Document(), MakeBranchRows(*Document()));
+    m_branches->Model()->SetSource(*Document(), MakeBranchRows(*Document()));
     splitter->addWidget(side);
 }
 
@@ -79,11 +79,11 @@ void CNetworkView::ShowChannel()
 {
     const int branch = CurrentBranch();
     if (std::exchange(m_channelOf, branch) != branch)
-        m_channel->ShowRows(*Document(), MakeChannelRows(*Document(), branch));
+        m_channel->Model()->SetSource(*Document(), MakeChannelRows(*Document(), branch));
     m_channel->setEnabled(branch >= 0);
     m_channel->Refresh();
     m_map->SetCurrentBranch(branch);
-    const QString name = branch >= 0 ? Document()->Network().branches[std::size_t(branch)].name : QString();
+    const QString name = branch >= 0 ? Document()->Network().branches[std::size_t(branch)].Name() : QString();
     m_channelTitle->setText(branch >= 0 ? tr("Cha&nnel of %1").arg(QString(name).replace(u'&', QStringLiteral("&&")))
                                         : tr("Cha&nnel"));
 }

@@ -73,7 +73,7 @@ LRESULT CNetworkView::ListBranches(CObList& objects) const
 {
     QStringList branches;
     for (const CNetworkBranch& branch : Document()->Network().branches)
-        branches << branch.name;
+        branches << branch.Name();
     AppendBranchNames(branches, objects);
     return !branches.isEmpty();
 }
@@ -83,7 +83,7 @@ LRESULT CNetworkView::FillChannel(const CObList& objects) const
 {
     QHash<QString, const CNetworkBranch*> branches;
     for (const CNetworkBranch& branch : Document()->Network().branches)
-        branches.insert(KsBranchKey(branch.name), &branch);
+        branches.insert(KsBranchKey(branch.Name()), &branch);
     bool filled = false;
     for (const auto& object : objects) {
         auto* item = dynamic_cast<CKvrCBELocation*>(object.get());

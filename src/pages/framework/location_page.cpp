@@ -7,126 +7,33 @@
 #include <QLabel>
 #include <QUndoStack>
 
+static QString TextOf(const TextLine& line)
+{
+    const QString text = LoadString(line.text);
+    return line.line == TextLine::Whole ? text : text.split(u'\n').value(line.line);
+}
+
 std::function<QString()> LineOf(Str text, int line)
 {
-    return
-        [text, line] { return line == TextLine::Whole ? LoadString(text) : LoadString(text).split(u'\n').value(line); };
+    return [text, line] { return TextOf({text, line}); };
 }
 
-const Field& GridColumns::FieldAt(FieldList fields, void* object, const void* member)
-{
-    for (const Field& field : fields)
-        if (field.address(object) == member)
-            return field;
-    Q_UNREACHABLE(); // a member that is no parameter of the file
-}
+static constexpr TableStyle OnPages{&TextOf, Str::GlobalRow};
 
-/// The row of the globals reads and writes what the options name; records go on as before.
-void GridColumns::AddGlobalRow(ColumnSpec& column, CellAccess& access, const ColumnOptions& options) const
-{
-    const auto isGlobal = [globals = m_globals](const void* row) { return row == globals; };
-    access.get = [isGlobal, get = access.get, number = options.globalNumber, index = options.globalIndex,
-                  isText = column.Kind() == CellKind::Text](const void* row) -> CellValue {
-        if (!isGlobal(row))
-            return get(row);
-        if (number || index)
-            return number ? CellValue(*number) : CellValue(*index);
-        return isText ? CellValue(LoadString(Str::GlobalRow).toStdString()) : CellValue();
-    };
-    access.set = [isGlobal, set = access.set, number = options.globalNumber,
-                  index = options.globalIndex](void* row, const CellValue& value) {
-        if (!isGlobal(row))
-            set(row, value);
-        else if (number)
-            *number = std::get<double>(value);
-        else if (index)
-            *index = std::get<std::int32_t>(value);
-    };
-    const bool hasGlobal = options.globalNumber || options.globalIndex;
-    column.locked = [isGlobal, hasGlobal, locked = column.locked](const void* row) {
-        return isGlobal(row) ? !hasGlobal || (locked && locked(nullptr)) : locked && locked(row);
-    };
-}
+GridColumns::GridColumns(CGenGrid& grid, const void* globals) : FieldColumns(*grid.Model(), OnPages, globals) {}
 
-GridColumns& GridColumns::Add(int control, const Field& field, CellAccess access, ColumnOptions options)
+GridColumns& GridColumns::BranchName(ColumnSpec column)
 {
-    ColumnSpec column;
-    column.control = control;
-    column.header = std::move(options.header);
-    if (!column.header)
-        column.header = options.caption != Str::None ? LineOf(options.caption, TextLine::Whole)
-                                                     : LineOf(field.title.text, field.title.line);
-    column.width = options.width;
-    column.style = CKsEditStyle(field.unit);
-    if (field.digits)
-        column.style.SetFormat(QStringLiteral("%.%1lg").arg(field.digits));
-    column.minimum = field.minimum;
-    column.maximum = field.maximum;
-    column.emptyIsNotGiven = options.emptyIsNotGiven;
-    column.fill = options.fill;
-    column.locked = options.locked;
-    if (m_globals)
-        AddGlobalRow(column, access, options);
-    column.choices = std::move(options.choice);
-    if (field.choices != Str::None) {
-        column.choices.entries = [entries = field.choices] { return LoadString(entries).split(u'\n'); };
-        column.choices.first = field.firstChoice;
-    }
-    column.unitText = std::move(options.unitText);
-    column.hint = std::move(options.hint);
-    column.locationValue = options.locationValue;
-    column.access = std::make_shared<CellAccess>(std::move(access));
-    m_grid.Model()->AddColumn(std::move(column));
+    column.upperCase = true;
+    Value(LocationFields()[0], std::move(column));
     return *this;
 }
 
-GridColumns& GridColumns::BranchName(ColumnOptions options)
+GridColumns& GridColumns::Chainage(ColumnSpec column)
 {
-    const Field& field = LocationFields()[0];
-    return Add(Control::Text, field, FieldAccess(field), std::move(options));
-}
-
-GridColumns& GridColumns::Chainage(ColumnOptions options)
-{
-    const Field& field = LocationFields()[1];
-    options.emptyIsNotGiven = true;
-    return Add(Control::Chainage, field, FieldAccess(field), std::move(options));
-}
-
-GridColumns& GridColumns::Value(const Field& field, ColumnOptions options)
-{
-    return Value(FieldAccess(field), field, std::move(options));
-}
-
-GridColumns& GridColumns::Value(CellAccess access, const Field& field, ColumnOptions options)
-{
-    const bool hasChoices = field.choices != Str::None;
-    const auto control = [&] {
-        switch (field.kind) {
-        case FieldKind::Text:
-            return hasChoices ? Control::DropDownList : options.upperCase ? Control::Text : Control::FreeText;
-        case FieldKind::FileName:
-            return Control::FreeText;
-        case FieldKind::Integer:
-        case FieldKind::Choice:
-            return hasChoices ? Control::DropDown : Control::Integer;
-        case FieldKind::Boolean:
-            return Control::CheckBox;
-        case FieldKind::DateTime:
-            return Control::DateTime;
-        default:
-            return options.asFormatted || field.digits                            ? Control::Formatted
-                   : options.emptyIsNotGiven && field.unit == UnitGroup::Chainage ? Control::Chainage
-                                                                                  : Control::Number;
-        }
-    }();
-    return Add(control, field, std::move(access), std::move(options));
-}
-
-GridColumns& GridColumns::Button(ColumnOptions options)
-{
-    CellAccess nothing{[](const void*) { return CellValue(); }, [](void*, const CellValue&) {}};
-    return Add(Control::PushButton, {}, std::move(nothing), std::move(options));
+    column.emptyIsNotGiven = true;
+    Value(LocationFields()[1], std::move(column));
+    return *this;
 }
 
 CLocationPage::CLocationPage(CKavo0_hdDoc* document, CGenList& list, QWidget* parent)

@@ -2,64 +2,24 @@
 #pragma once
 
 #include "document/document.h"
+#include "grid/field_columns.h"
 #include "grid/gen_grid.h"
 #include "grid/vector_rows.h"
 #include "pages/framework/page.h"
 #include "res/strings.h"
 
-/// What a column says about itself beyond its field, and where it differs from what that declares.
-struct ColumnOptions
-{
-    std::function<QString()> header = {}; // by default the text of `caption`
-    Str caption = Str::None;              // by default the field's title
-    int width = 72;
-    bool asFormatted = false;     // a number stands with six decimals, not with the control's
-    const double* fill = nullptr; // see ColumnSpec
-    bool emptyIsNotGiven = false;
-    std::function<bool(const void* row)> locked = {};  // see ColumnSpec
-    Choices choice = {};                               // of a drop-down column; the declared entries are put in
-    std::function<QString()> unitText = {};            // see ColumnSpec
-    std::function<QString()> hint = {};                // see ColumnSpec
-    bool upperCase = false;                            // of a text
-    LocationValue locationValue = LocationValue::None; // see ColumnSpec
-    // What the row "Global" of a grid shows in the column, where the grid has one; the cell is locked without.
-    double* globalNumber = nullptr;
-    std::int32_t* globalIndex = nullptr;
-};
-
 /// One line of a text that holds several.
 std::function<QString()> LineOf(Str text, int line);
 
-/// Declares the columns of a grid, from left to right.
-class GridColumns
+/// Declares the columns of a page's grid, from left to right.
+class GridColumns : public FieldColumns
 {
 public:
     /// `globals` is the object of the row "Global"; null for a grid without one.
-    explicit GridColumns(CGenGrid& grid, const void* globals = nullptr) : m_grid(grid), m_globals(globals) {}
+    explicit GridColumns(CGenGrid& grid, const void* globals = nullptr);
 
-    GridColumns& BranchName(ColumnOptions options);
-    GridColumns& Chainage(ColumnOptions options);
-    /// A declared field of the records, or of the elements of a group.
-    GridColumns& Value(const Field& field, ColumnOptions options = {});
-    template <typename Row, typename T>
-    GridColumns& Value(T Row::*member, ColumnOptions options = {})
-    {
-        static Row row;
-        using Object = std::conditional_t<std::is_base_of_v<HD_RiverPos, Row>, HD_RiverPos, Row>;
-        return Value(FieldAt(Row::DeclaredFields(), static_cast<Object*>(&row), &(row.*member)), std::move(options));
-    }
-    /// A value that the rows reach in a way of their own; `field` says the rest.
-    GridColumns& Value(CellAccess access, const Field& field, ColumnOptions options);
-    /// Push buttons; the page answers them (ButtonClicked).
-    GridColumns& Button(ColumnOptions options);
-
-private:
-    static const Field& FieldAt(FieldList fields, void* object, const void* member);
-    GridColumns& Add(int control, const Field& field, CellAccess access, ColumnOptions options);
-    void AddGlobalRow(ColumnSpec& column, CellAccess& access, const ColumnOptions& options) const;
-
-    CGenGrid& m_grid;
-    const void* m_globals;
+    GridColumns& BranchName(ColumnSpec column);
+    GridColumns& Chainage(ColumnSpec column);
 };
 
 class QLabel;

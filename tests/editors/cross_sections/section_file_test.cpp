@@ -91,10 +91,10 @@ TEST_F(CrossSectionTest, TheSampleHasSectionsWithWaterAtTheInitialLevel)
         levels[{at.RiverName, at.Chainage}] = at.InitialH;
     }
     for (const CCrossSection& section : sample.sections) {
-        const auto level = levels.find({section.branch.toStdString(), section.chainage});
-        ASSERT_NE(level, levels.end()) << section.branch.toStdString() << ' ' << section.chainage;
+        const auto level = levels.find({section.branch, section.chainage});
+        ASSERT_NE(level, levels.end()) << section.branch << ' ' << section.chainage;
         const auto water = WaterSurface(section);
-        ASSERT_TRUE(water.has_value()) << section.branch.toStdString() << ' ' << section.chainage;
+        ASSERT_TRUE(water.has_value()) << section.branch << ' ' << section.chainage;
         EXPECT_NEAR(water->level, level->second, 0.02);
         EXPECT_GT(section.radius, section.width);
     }

@@ -8,7 +8,7 @@ QStringList Names(const CNetworkDoc& document)
 {
     QStringList names;
     for (const CNetworkBranch& branch : document.Network().branches)
-        names << branch.name;
+        names << branch.Name();
     return names;
 }
 

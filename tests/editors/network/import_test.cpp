@@ -46,7 +46,7 @@ protected:
     {
         QStringList names;
         for (const CNetworkBranch& branch : plan.branches)
-            names << QString("%1 %2-%3").arg(branch.name).arg(branch.start).arg(branch.end);
+            names << QString("%1 %2-%3").arg(branch.Name()).arg(branch.start).arg(branch.end);
         return names;
     }
     /// What the only layer gives in its own coordinate system.

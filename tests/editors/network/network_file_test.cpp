@@ -129,7 +129,7 @@ TEST_F(NetworkTest, TheSampleNetworkFitsTheSampleParameters)
     CNetwork network;
     ASSERT_EQ(ReadNetwork(committed, network), "");
     for (const CNetworkBranch& branch : network.branches)
-        EXPECT_NEAR(branch.Length(), branch.end, 0.02 * branch.end) << branch.name.toStdString();
+        EXPECT_NEAR(branch.Length(), branch.end, 0.02 * branch.end) << branch.name;
     HD_Parameters parameters = SampleRiver();
     const CLinearReference reference(network);
     for (std::size_t i = 0; i < parameters.InitList.GetCount(); ++i) {

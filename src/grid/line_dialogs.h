@@ -1,29 +1,38 @@
-// "Search": what lines to look for.
+// The dialogs that ask for lines: "Go to grid line" for a number, "Search" for a branch and a chainage.
 #pragma once
 
 #include "grid/grid_search.h"
 #include "ks/units/edit_style.h"
+#include "ui_goto_dlg.h"
+#include "ui_search_dlg.h"
 
 #include <QDialog>
-#include <memory>
 
-namespace Ui {
-class CSearchDlg;
-}
+class CGotoDlg : public QDialog
+{
+public:
+    explicit CGotoDlg(QWidget* parent = nullptr);
+
+    /// The line asked for, 1 or more after OK.
+    int Line() const { return m_line; }
+    void accept() override;
+
+private:
+    Ui::CGotoDlg m_ui;
+    int m_line = 0;
+};
 
 class CSearchDlg : public QDialog
 {
-    Q_OBJECT
 public:
     explicit CSearchDlg(const LineQuery& query, QWidget* parent = nullptr);
-    ~CSearchDlg() override;
 
     /// What was asked for, after OK.
     const LineQuery& Query() const { return m_query; }
     void accept() override;
 
 private:
-    std::unique_ptr<Ui::CSearchDlg> m_ui;
+    Ui::CSearchDlg m_ui;
     CKsEditStyle m_style{UnitGroup::Chainage, "%.10lg"};
     LineQuery m_query;
     double m_shownChainage; // in the user's unit

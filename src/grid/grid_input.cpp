@@ -1,0 +1,110 @@
+#include "grid/grid_input.h"
+
+#include "grid/gen_grid.h"
+#include "grid/grid_clipboard.h"
+#include "grid/grid_host.h"
+#include "grid/grid_keys.h"
+
+#include <QKeyEvent>
+#include <QMenu>
+#include <algorithm>
+
+CGridInput::CGridInput(CGenGrid& grid) : QObject(&grid), m_grid(grid)
+{
+    grid.installEventFilter(this);
+}
+
+bool CGridInput::eventFilter(QObject* object, QEvent* event)
+{
+    // The grid's own keys come before menu shortcuts of the same name, and before Qt's moves of the focus.
+    if (event->type() != QEvent::ShortcutOverride && event->type() != QEvent::KeyPress)
+        return QObject::eventFilter(object, event);
+    const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
+    if (!key)
+        return QObject::eventFilter(object, event);
+    event->accept();
+    if (event->type() == QEvent::KeyPress)
+        Run(key->action);
+    return true;
+}
+
+void CGridInput::Run(GridAction action)
+{
+    switch (action) {
+    case GridAction::NextCell:
+        return NextCell();
+    case GridAction::PreviousCell:
+        return PreviousCell();
+    case GridAction::CopyAndAppend:
+        CopyCells(m_grid);
+        return Ask(GridAction::AppendLine);
+    case GridAction::PasteAndAppend:
+        if (!CanPasteCells(m_grid) || PasteCells(m_grid))
+            Ask(GridAction::AppendLine);
+        return;
+    case GridAction::Copy:
+        return CopyCells(m_grid);
+    case GridAction::Paste:
+        PasteCells(m_grid);
+        return;
+    case GridAction::SelectLine:
+        return m_grid.SelectLines(m_grid.CurrentRow(), m_grid.CurrentRow());
+    default:
+        return Ask(action);
+    }
+}
+
+void CGridInput::Ask(GridAction action)
+{
+    if (action != GridAction::Undo && action != GridAction::Redo)
+        m_grid.StoreEditedLine();
+    if (m_grid.Host())
+        m_grid.Host()->Run(m_grid, action);
+}
+
+void CGridInput::NextCell()
+{
+    if (m_grid.HasLostItsLine())
+        return; // the next cell of none
+    if (m_grid.CurrentColumn() < m_grid.ColumnCount())
+        m_grid.SetCurrentCell(m_grid.CurrentRow(), m_grid.CurrentColumn() + 1);
+    else if (m_grid.CurrentRow() < m_grid.RowCount())
+        m_grid.SetCurrentCell(m_grid.CurrentRow() + 1, 1);
+    else if (m_grid.MayGrow())
+        Ask(GridAction::AppendLine);
+    else
+        m_grid.StoreEditedLine();
+}
+
+void CGridInput::PreviousCell()
+{
+    if (m_grid.HasLostItsLine())
+        return;
+    if (m_grid.CurrentColumn() > 1)
+        m_grid.SetCurrentCell(m_grid.CurrentRow(), m_grid.CurrentColumn() - 1);
+    else if (m_grid.CurrentRow() > 1)
+        m_grid.SetCurrentCell(m_grid.CurrentRow() - 1, m_grid.ColumnCount());
+    else
+        m_grid.LeaveBackwards();
+}
+
+void CGridInput::ShowMenu(const QPoint& at)
+{
+    QMenu menu(&m_grid);
+    const auto add = [&](GridAction action, bool enabled) {
+        const GridKey& key = *std::ranges::find(GridKeys(), action, &GridKey::action);
+        menu.addAction(key.Text(), QKeySequence(QKeyCombination(key.held, key.key)), this,
+                       [this, action] { Run(action); })
+            ->setEnabled(enabled);
+    };
+    add(GridAction::AppendLine, m_grid.Model()->Rows() != nullptr);
+    add(GridAction::DeleteLine, m_grid.HasLinesToDelete());
+    menu.addSeparator();
+    add(GridAction::Copy, CanCopyCells(m_grid));
+    add(GridAction::Paste, CanPasteCells(m_grid));
+    if (m_grid.Host() && m_grid.Host()->CanSearch(m_grid)) {
+        menu.addSeparator();
+        add(GridAction::Search, true);
+    }
+    menu.exec(at);
+}

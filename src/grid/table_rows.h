@@ -1,0 +1,83 @@
+// The cells of a table: the rows of a source under columns. The rows are not copied; what the user typed since the last
+// store lies over them as a small overlay.
+//
+// A source without rows is shown with one to type into, the offered row. It is no part of the document: it shows what a
+// new line would hold now, and enters the source, as a step to undo, when something typed into it is stored.
+#pragma once
+
+#include "grid/column_spec.h"
+#include "grid/row_source.h"
+
+#include <map>
+#include <vector>
+
+/// What an emptied value cell is stored as.
+enum class BlankRule
+{
+    Zero, // as an empty cell converts
+    Fill  // as the column's fill value, where it has one
+};
+
+/// Rows and columns count from 0.
+class CTableRows
+{
+public:
+    const std::vector<ColumnSpec>& Columns() const { return m_columns; }
+    const ColumnSpec& Column(int column) const { return m_columns[std::size_t(column)]; }
+    const std::shared_ptr<IRowSource>& Rows() const { return m_rows; }
+    /// Rows of the source, without the offered one.
+    int StoredRows() const { return m_rows ? int(m_rows->Count()) : 0; }
+    /// Rows at the top that are no lines of the table.
+    int FixedRows() const { return m_rows ? int(m_rows->FixedRows()) : 0; }
+    bool HasPending() const { return !m_pending.empty(); }
+
+    /// What the cell holds, typed or stored.
+    CellValue Value(int row, int column) const;
+    bool IsLocked(int row, int column) const;
+    /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
+    bool HidesDigits(int row, int column) const;
+    /// Writes what the row's cells hold into an object of the source's kind.
+    void CopyRow(int row, void* target) const;
+
+    /// Why the cell would not take the text; empty when it would. What the other rows have to say is asked as well when
+    /// the text goes into this cell alone, and with Fault when it is one of several.
+    QString Refusal(int row, int column, const QString& text, bool isAlone = true) const;
+    /// Why the rows from `row` on could not take these texts from `column` on; see IRowSource::FindFault.
+    std::optional<IRowSource::Fault> Fault(int row, int column, const std::vector<QStringList>& texts) const;
+
+    /// Names the line of a row for as long as the source has it.
+    RowKey NameOf(int row) const;
+    /// Where the line of that name stands, looked for at `row` first; where it is gone, the row that is offered instead
+    /// of lines, or -1.
+    int RowNamed(RowKey name, int row) const;
+
+    /// New lines with the columns' fill values, not in the source; they fit at its end.
+    std::unique_ptr<IRowBlock> NewLines(int count) const { return NewLines(count, StoredRows()); }
+
+protected:
+    using CellKey = std::pair<RowKey, int>;
+    struct Typed
+    {
+        CellValue value;
+        std::size_t row; // where the row was
+    };
+    using Overlay = std::map<CellKey, Typed>;
+    static constexpr RowKey OfferedKey = RowKey(-1); // no place and no address
+
+    bool OffersRow() const { return m_rows && m_rows->IsEmpty() && !m_rows->MayBeEmpty(); }
+    int ShownRows() const { return StoredRows() + OffersRow(); }
+    bool IsRow(int row) const { return row >= 0 && row < ShownRows(); }
+    void* RowObject(int row) const;
+    CellValue Resolved(int column, const CellValue& value, BlankRule rule = BlankRule::Zero) const;
+    std::unique_ptr<IRowBlock> NewLines(int count, int at) const;
+    /// Forgets what was typed into rows that are gone.
+    void PruneOverlay();
+
+    std::vector<ColumnSpec> m_columns;
+    std::shared_ptr<IRowSource> m_rows;
+    Overlay m_pending;
+    mutable std::unique_ptr<IRowBlock> m_offered; // made when it is asked for
+
+private:
+    bool IsOffered(int row) const { return OffersRow() && row == StoredRows(); }
+};
