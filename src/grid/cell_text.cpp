@@ -5,6 +5,7 @@
 #include "grid/grid_texts.h"
 #include "files/read_number.h"
 #include "grid/typing.h"
+#include "ks/fc/branch_name.h"
 
 #include <cmath>
 
@@ -73,7 +74,7 @@ QString EditText(const ColumnSpec& column, const CellValue& value)
 CellReading ReadCell(const ColumnSpec& column, const QString& text)
 {
     if (column.Kind() == CellKind::Text)
-        return {(FindControl(column.control).upperCase ? text.toUpper() : text).toStdString(), {}};
+        return {(FindControl(column.control).upperCase ? KsBranchKey(text) : text).toStdString(), {}};
     if (text.isEmpty())
         return {{}, column.isRequired ? GridTexts::tr("Floating point number required") : QString()};
     if (column.Kind() == CellKind::Button)
