@@ -73,7 +73,7 @@ int main(int argc, char** argv)
     if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
         qputenv("QT_QPA_PLATFORM", "offscreen");
     QApplication app(argc, argv);
-    LoadModuleResources();
+    const CKsEditorResources resources(HDEditor());
 
     Window large(Large), small(Small);
     bool fast = true;
@@ -90,6 +90,5 @@ int main(int argc, char** argv)
             "To \"" + large.view->Sheet()->tabText(tab).toStdString() + "\": 100,000 / 100 records";
         fast = Report(what.c_str(), Median(inLarge), Median(inSmall), 2.0) && fast;
     }
-    FreeModuleResources();
     return fast ? 0 : 1;
 }

@@ -49,10 +49,48 @@ function(kvr_shared_pch name)
   target_precompile_headers(${name} PRIVATE <QtWidgets> <memory> <string> <vector> ${ARGN})
 endfunction()
 
-# A library on Qt Widgets: meta-object code, dialog files and a precompiled header.
+# kvr_qt_library(<name> <kind> [<folder>...]): a library on Qt Widgets with meta-object code, dialog files and a
+# precompiled header. What stands in its folders - by default in the room's own - is the library: no list names it again.
 function(kvr_qt_library name kind)
-  add_library(${name} ${kind} ${ARGN})
+  set(folders ${ARGN})
+  if(NOT folders)
+    set(folders .)
+  endif()
+  foreach(folder IN LISTS folders)
+    if(NOT IS_DIRECTORY ${CMAKE_CURRENT_SOURCE_DIR}/${folder})
+      message(FATAL_ERROR "${name}: ${folder} is no folder")
+    endif()
+  endforeach()
+  list(TRANSFORM folders APPEND /*.cpp OUTPUT_VARIABLE sources)
+  list(TRANSFORM folders APPEND /*.qrc OUTPUT_VARIABLE resources)
+  file(GLOB sources CONFIGURE_DEPENDS ${sources} ${resources})
+  list(FILTER sources EXCLUDE REGEX "/main\\.cpp$") # a program's own
+  add_library(${name} ${kind} ${sources})
   kvr_qt(${name})
+endfunction()
+
+# kvr_editor(<plugin> <core> LINK <library>... TRANSLATIONS <module> <file>.ts... [WITHOUT <source>...]): an editor in the
+# room's folder. All but the exported functions (*exports.cpp) and the pictures is a library, so that tests can link it;
+# the plug-in is these on top.
+function(kvr_editor plugin core)
+  cmake_parse_arguments(E "" "" "LINK;TRANSLATIONS;WITHOUT" ${ARGN})
+  file(GLOB sources CONFIGURE_DEPENDS *.cpp)
+  file(GLOB exported CONFIGURE_DEPENDS *exports.cpp *.qrc)
+  list(TRANSFORM E_WITHOUT PREPEND ${CMAKE_CURRENT_SOURCE_DIR}/)
+  list(REMOVE_ITEM sources ${exported} ${E_WITHOUT})
+  add_library(${core} STATIC ${sources})
+  kvr_qt(${core})
+  target_link_libraries(${core} PUBLIC ${E_LINK})
+
+  add_library(${plugin} MODULE ${exported})
+  kvr_defaults(${plugin})
+  target_link_libraries(${plugin} PRIVATE ${core})
+  if(UNIX AND NOT APPLE)
+    target_link_options(${plugin} PRIVATE -Wl,--exclude-libs,ALL -Wl,-z,defs)
+  endif()
+  set_target_properties(${plugin} PROPERTIES AUTORCC ON PREFIX ""
+                        LIBRARY_OUTPUT_DIRECTORY ${CMAKE_RUNTIME_OUTPUT_DIRECTORY}/plugins)
+  kvr_translations(${plugin} ${E_TRANSLATIONS})
 endfunction()
 
 # kvr_qt(<target> [<precompiled header>])

@@ -5,6 +5,7 @@
 #include "grid/grid_texts.h"
 #include "files/read_number.h"
 #include "grid/typing.h"
+#include "ks/fc/branch_name.h"
 
 #include <cmath>
 
@@ -74,7 +75,7 @@ CellReading ReadCell(const ColumnSpec& column, const QString& text)
 {
     if (column.Kind() == CellKind::Text) {
         const QString taken = column.control.trimmed ? text.trimmed() : text;
-        return {(column.control.upperCase ? taken.toUpper() : taken).toStdString(), {}};
+        return {(column.control.upperCase ? KsBranchKey(taken) : taken).toStdString(), {}};
     }
     if (text.isEmpty())
         return {{}, column.isRequired ? GridTexts::tr("Floating point number required") : QString()};

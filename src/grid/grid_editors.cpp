@@ -99,6 +99,7 @@ QWidget* CGridDelegate::createEditor(QWidget* parent, const QStyleOptionViewItem
     editor->setObjectName(column.control.editorName);
     editor->setAccessibleName(column.header());
     editor->setAutoFillBackground(true);
+    DropLineEnds(*editor);
     m_editor = editor;
     m_index = index;
     return editor;

@@ -55,6 +55,18 @@ QString RefusalDetails(const QString& place, const QString& typed, const QString
     return lines.join(u'\n');
 }
 
+void DropLineEnds(QWidget& widget)
+{
+    auto* field = qobject_cast<QLineEdit*>(&widget);
+    if (!field && !(field = widget.findChild<QLineEdit*>()))
+        return;
+    QObject::connect(field, &QLineEdit::textEdited, field, [field] {
+        const int before = field->cursorPosition() - 1;
+        if (before >= 0 && (field->text()[before] == u'\n' || field->text()[before] == u'\r'))
+            field->backspace(); // and again, should there be another one
+    });
+}
+
 QString OutOfRange()
 {
     return GridTexts::tr("Floating-point value is out of range");
@@ -79,6 +91,7 @@ CTyping::CTyping(QLineEdit* field, TypedField what) : QObject(field), m_field(fi
         m_selected = m_field->selectionStart();
         m_selectedLength = m_field->selectionLength();
     });
+    DropLineEnds(*field); // once the edit is known here
     Shown();
 }
 

@@ -13,6 +13,8 @@ class QLineEdit;
 void TellRefusal(QWidget& widget, const QString& message, const QString& details);
 /// The details of such a message, a line each; `allowed` and `unit` may be empty.
 QString RefusalDetails(const QString& place, const QString& typed, const QString& allowed, const QString& unit);
+/// Has the field, or the one in the widget, take what is pasted without the line end behind it, which nobody sees.
+void DropLineEnds(QWidget& widget);
 /// Why a number that is out of these bounds is not taken.
 QString OutOfRange();
 /// "0.5 to 1", "at least 0" and so on; a bound may be empty.

@@ -1,17 +1,18 @@
 #include "module/data_exchange.h"
 
 #include "data/hd_file.h"
+#include "document/list_rows.h"
+#include "grid/row_commands.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "module/data_tables.h"
 #include "module/kavo0_hd.h"
-#include "document/list_rows.h"
-#include "grid/row_commands.h"
 #include "module/sheet.h"
 #include "module/view.h"
 #include "pages/framework/page.h"
 
 #include <QPointer>
+#include <QScopedValueRollback>
 #include <QUndoStack>
 #include <cmath>
 #include <optional>
@@ -22,31 +23,6 @@ void Log(const char* why)
 {
     qDebug("HD data exchange: %s; nothing is done", why);
 }
-
-/// One change is made at a time: who hears of it, or of a window that comes to the front, might ask for another one
-/// while the table of the first is half changed.
-class OneRequest
-{
-public:
-    OneRequest() : m_entered(!s_busy)
-    {
-        s_busy = true;
-        if (!m_entered)
-            Log("a request inside a request");
-    }
-    ~OneRequest()
-    {
-        if (m_entered)
-            s_busy = false;
-    }
-    OneRequest(const OneRequest&) = delete;
-    OneRequest& operator=(const OneRequest&) = delete;
-    explicit operator bool() const { return m_entered; }
-
-private:
-    static inline bool s_busy = false;
-    bool m_entered;
-};
 
 /// The content of a file that is only looked at.
 std::optional<HD_Parameters> ReadFile(const CString& path)
@@ -93,14 +69,15 @@ CKavo0_hdView* Ready(CView* view)
 /// the two would overwrite each other. A new window is one of the shell's own template, as if the user had opened it.
 CKsDoc* OpenFile(const CString& path, CKsMDIFrameWnd& frame)
 {
-    for (CMultiDocTemplate* documents : CKavo0_hd::Templates()) {
-        if (CKsDoc* document = documents->FindDocument(path))
+    CMultiDocTemplate* documents = nullptr;
+    for (CMultiDocTemplate* each : CMultiDocTemplate::All()) {
+        if (CKsDoc* document = each->FindDocument(path))
             return document;
+        if (!documents && each->ResourceId() == HDEditor().documentResource)
+            documents = each;
     }
     if (!ReadFile(path))
         return nullptr;
-    const auto templates = CKavo0_hd::Templates();
-    CMultiDocTemplate* documents = templates.empty() ? nullptr : templates.front();
     if (!documents) {
         documents = CKavo0_hd::CreateMainDlg();
         documents->setParent(&frame);
@@ -215,14 +192,18 @@ void Select(Exchange& exchange)
 }
 
 /// Whoever is editing is asked before anything changes. The page in front may refuse to be left; what the request then
-/// does is its own matter.
+/// does is its own matter. One change is made at a time: who hears of it, or of a window that comes to the front, might
+/// ask for another one while the table of the first is half changed.
 void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(Exchange& exchange))
 {
+    static bool isBusy = false;
+    if (isBusy)
+        return Log("a request inside a request");
     QPointer<CKavo0_hdView> served;
     CString message;
     {
-        const OneRequest request;
-        const auto* item = request ? FirstItem(items) : nullptr;
+        const QScopedValueRollback busy(isBusy, true);
+        const auto* item = FirstItem(items);
         if (!item)
             return;
         served = view ? Ready(view) : ViewOfFile(path);

@@ -7,39 +7,20 @@
 
 namespace {
 
-CString TextOf(std::string_view name)
-{
-    const auto size = qsizetype(name.size());
-    const bool plain = std::all_of(name.begin(), name.end(), [](char c) { return static_cast<signed char>(c) >= 0; });
-    return plain ? CString::fromLatin1(name.data(), size) : CString::fromUtf8(name.data(), size);
-}
-
-/// Branch names of one list as texts. Neighbours mostly share their branch, and then share one text.
-class BranchTexts
-{
-public:
-    const CString& Of(const std::string& name)
-    {
-        if (name != m_name) {
-            m_name = name;
-            m_text = TextOf(name);
-        }
-        return m_text;
-    }
-
-private:
-    std::string_view m_name; // in the record before
-    CString m_text = QStringLiteral("");
-};
-
 void AppendTable(const HDDataTable& table, int type, HD_Parameters& parameters, CObList& items)
 {
     const CGenList& list = table.list(parameters);
-    BranchTexts branches;
+    // Neighbours mostly share their branch, and then share one text.
+    std::string_view name;
+    CString branch = QStringLiteral("");
     for (std::size_t i = 0; i < list.GetCount(); ++i) {
         const HD_RiverPos& record = list.GetAt(i);
+        if (record.RiverName != name) {
+            name = record.RiverName;
+            branch = CString::fromStdString(record.RiverName);
+        }
         auto item = std::make_unique<CKvr_CBE_ModelDataItem>();
-        item->branch = branches.Of(record.RiverName);
+        item->branch = branch;
         item->chainage = record.Chainage;
         if (table.second)
             item->second = table.second(record);

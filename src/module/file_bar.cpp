@@ -1,11 +1,11 @@
 #include "module/file_bar.h"
 
 #include "ks/fc/after_paint.h"
+#include "ks/fc/file_name.h"
 #include "module/findings_dialog.h"
 #include "res/strings.h"
 
 #include <QEvent>
-#include <QFileInfo>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
@@ -15,7 +15,7 @@ namespace {
 
 CString NameOf(const CString& path)
 {
-    return QFileInfo(path).fileName();
+    return KsShownFileName(path);
 }
 
 } // namespace

@@ -1,11 +1,11 @@
 #include "module/findings_dialog.h"
 
+#include "ks/fc/file_name.h"
 #include "res/strings.h"
 
 #include <QClipboard>
 #include <QDialogButtonBox>
 #include <QEvent>
-#include <QFileInfo>
 #include <QGuiApplication>
 #include <QHeaderView>
 #include <QKeyEvent>
@@ -157,7 +157,7 @@ void CFindingsModel::Retranslate()
 
 CFindingsDialog::CFindingsDialog(const CDocumentFile& file, QWidget* parent)
     : QDialog(parent),
-      m_name(QFileInfo(file.Path()).fileName()),
+      m_name(KsShownFileName(file.Path())),
       m_model(new CFindingsModel(file.Findings(), this)),
       m_text(new QLabel(this)),
       m_table(new QTableView(this))

@@ -1,9 +1,10 @@
 // What the module offers the shell and other editors, as static members; the exported functions call these.
 #pragma once
 
-#include "ks/fc/doc_template.h"
-#include "ks/fc/frames.h"
 #include "ks/fc/package.h"
+#include "ks/fc/single_editor.h"
+
+const KsSingleEditor& HDEditor();
 
 class CKavo0_hd
 {
@@ -27,16 +28,4 @@ public:
     static void ChangeData(const CString& path, CView* view, CObList* items);
     /// Makes that line current on the tab of its table.
     static void SelectData(const CString& path, CView* view, CObList* items);
-
-    /// The document templates that exist, in the order of their making.
-    static std::vector<CMultiDocTemplate*> Templates();
 };
-
-/// Makes the module's texts and pictures available; at load. Unload gives them back.
-void LoadModuleResources();
-void FreeModuleResources();
-
-namespace Resource {
-inline constexpr int Document = 4953; // template string, tool bar, menu, icon
-inline constexpr int EditorBitmap = 4965;
-} // namespace Resource

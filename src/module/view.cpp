@@ -65,11 +65,10 @@ void CKavo0_hdView::OnInitialUpdate()
 void CKavo0_hdView::AddTabs()
 {
     std::vector<const PageEntry*> tabs;
-    for (const PageEntry& entry : PageTable()) {
+    for (const PageEntry& entry : PageTable())
         if (entry.tab != NotOnSheet)
             tabs.push_back(&entry);
-    }
-    std::sort(tabs.begin(), tabs.end(), [](const PageEntry* a, const PageEntry* b) { return a->tab < b->tab; });
+    std::ranges::sort(tabs, {}, &PageEntry::tab);
     for (const PageEntry* entry : tabs)
         m_sheet->AddPage(entry->caption, [this, entry] { return MakePage(*entry); });
 }
@@ -90,10 +89,9 @@ void CKavo0_hdView::MakeOtherPages()
         QTimer::singleShot(0, this, &CKavo0_hdView::MakeOtherPages);
         return;
     }
-    for (const PageEntry& entry : PageTable()) {
+    for (const PageEntry& entry : PageTable())
         if (entry.tab == NotOnSheet)
             m_offSheet.push_back(MakePage(entry));
-    }
 }
 
 void CKavo0_hdView::OnUpdate(CView* sender, int hint, CHint* object)
@@ -179,21 +177,17 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
 
 bool CKavo0_hdView::IsCommandEnabled(int id) const
 {
-    const auto* page = ActivePage();
-    const auto isUsable = [](const CGenGrid* grid) { return grid && grid->isEnabled(); };
-    const bool lines = m_linesEnabled && page && isUsable(page->GetGrid());
-    switch (id) {
-    case Command::InsertLine:
-        return m_linesEnabled && page && isUsable(page->LinesGrid());
-    case Command::DeleteLine:
-        return m_linesEnabled && page && isUsable(page->LinesGrid()) && page->LinesGrid()->HasLinesToDelete();
-    case Command::FetchLocation:
-        return lines && GetDocument()->ProjectHandle();
-    case KsCommand::Help:
+    if (id == KsCommand::Help)
         return true;
-    default:
-        return lines && m_search.CanRun(id, page->GetGrid());
-    }
+    const auto* page = ActivePage();
+    const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine;
+    const CGenGrid* grid = !page ? nullptr : isForLines ? page->LinesGrid() : page->GetGrid();
+    if (!m_linesEnabled || !grid || !grid->isEnabled())
+        return false;
+    return id == Command::InsertLine      ? true
+           : id == Command::DeleteLine    ? grid->HasLinesToDelete()
+           : id == Command::FetchLocation ? GetDocument()->ProjectHandle() != 0
+                                          : m_search.CanRun(id, grid);
 }
 
 bool CKavo0_hdView::OnCommand(int id)
@@ -201,21 +195,15 @@ bool CKavo0_hdView::OnCommand(int id)
     auto* page = ActivePage();
     if (!page || !IsCommandEnabled(id) || !MayLeave(KsLeave::Field))
         return false;
-    switch (id) {
-    case Command::InsertLine:
+    if (id == Command::InsertLine)
         page->AppendLine();
-        return true;
-    case Command::DeleteLine:
+    else if (id == Command::DeleteLine)
         page->DeleteLines();
-        return true;
-    case Command::FetchLocation:
+    else if (id == Command::FetchLocation)
         FetchLocation();
-        return true;
-    case KsCommand::Help:
+    else if (id == KsCommand::Help)
         page->OnHelp();
-        return true;
-    default:
+    else
         m_search.Run(id, *page->GetGrid());
-        return true;
-    }
+    return true;
 }

@@ -11,6 +11,10 @@ class CDlgPropertySheet;
 class CGenPropertyPage;
 struct PageEntry;
 
+class CDlgFrame : public CKsMDIChildWnd
+{
+};
+
 class CKavo0_hdView : public CKsProjectView, public IPageHost
 {
     Q_OBJECT

@@ -46,7 +46,7 @@ bool CFileCommands::Open(const QString& path, bool othersLater)
     if (CMultiDocTemplate* documents = m_plugins.TemplateFor(path))
         return documents->OpenDocumentFile(&m_frame, path) != nullptr;
     QStringList known{QString::fromLatin1(ProjectExtension)};
-    for (const CMultiDocTemplate* documents : m_plugins.Templates())
+    for (const CMultiDocTemplate* documents : CMultiDocTemplate::All())
         known << documents->GetDocString(CMultiDocTemplate::filterExt);
     KsMessageBox(tr("%1 could not be opened: no editor reads files of this kind.\nThe editors read %2.")
                      .arg(QDir::toNativeSeparators(path), known.join(QStringLiteral(", "))));
@@ -55,7 +55,7 @@ bool CFileCommands::Open(const QString& path, bool othersLater)
 
 void CFileCommands::New()
 {
-    const auto templates = m_plugins.Templates();
+    const auto& templates = CMultiDocTemplate::All();
     qsizetype chosen = 0;
     if (templates.size() != 1) {
         QStringList names;
@@ -85,7 +85,7 @@ QString CFileCommands::AskName(const QString& title, const QString& filters) con
 void CFileCommands::AskToOpen()
 {
     QStringList filters;
-    for (const CMultiDocTemplate* documents : m_plugins.Templates())
+    for (const CMultiDocTemplate* documents : CMultiDocTemplate::All())
         filters << documents->FileDialogFilter();
     filters << ProjectFilter() << tr("All files") + QStringLiteral(" (*)");
     const QString path = AskName(tr("Open"), filters.join(QStringLiteral(";;")));

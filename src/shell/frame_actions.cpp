@@ -3,7 +3,6 @@
 #include "ks/units/edit_style.h"
 #include "shell/help_commands.h"
 #include "shell/main_frame.h"
-#include "shell/plugins_dialog.h"
 
 static constexpr bool ShownOnly = true;
 
@@ -44,7 +43,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {WindowMenu},
         {WindowMenu, "actionCloseAll", QT_TR_NOOP("Close &All"), QT_TR_NOOP("Closes all windows"), [](F& f) { f.CloseAllWindows(); }},
         {HelpMenu, "actionContents", QT_TR_NOOP("&Contents"), QT_TR_NOOP("Shows the help of the editor"), [](F& f) { ShowHelp(f); }, K::HelpContents},
-        {HelpMenu, "actionPlugins", QT_TR_NOOP("&Plug-ins..."), QT_TR_NOOP("Lists the editors that were loaded"), [](F& f) { CPluginsDialog(f.Plugins(), &f).exec(); }},
+        {HelpMenu, "actionPlugins", QT_TR_NOOP("&Plug-ins..."), QT_TR_NOOP("Lists the editors that were loaded"), [](F& f) { ShowPlugins(f); }},
         {HelpMenu, "actionAbout", QT_TR_NOOP("&About"), QT_TR_NOOP("Name and version of the program"), [](F& f) { ShowAbout(&f); }},
     };
     // clang-format on

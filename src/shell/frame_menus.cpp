@@ -6,6 +6,7 @@
 #include "shell/help_commands.h"
 #include "shell/lines_menu.h"
 #include "shell/main_frame.h"
+#include "shell/recent_files.h"
 
 #include <QActionGroup>
 #include <QDir>
@@ -166,11 +167,11 @@ void CFrameMenus::Update()
     const bool document = m_frame.ActiveDocument() != nullptr, projects = !m_frame.Projects().Registry().All().empty();
     for (const char* name : {"actionSave", "actionSaveAs", "actionClose"})
         Action(name)->setEnabled(document);
-    Action("actionNew")->setEnabled(!m_frame.Plugins().Templates().empty());
+    Action("actionNew")->setEnabled(!CMultiDocTemplate::All().empty());
     Action("actionCloseProject")->setEnabled(projects);
     Action("actionProjectTree")->setEnabled(projects);
     Action("actionProjectTree")->setChecked(m_frame.Projects().Tree().isVisible());
-    Action("actionOpenRecent")->setEnabled(!m_frame.RecentFiles().Files().isEmpty());
+    Action("actionOpenRecent")->setEnabled(!RecentFiles::All().isEmpty());
     Action("actionAllDigits")->setChecked(KsUnits::Instance().AllDigits());
     const bool usCustomary = KsUnits::Instance().System() == KsUnitSystem::UsCustomary;
     Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);
@@ -202,7 +203,7 @@ void CFrameMenus::FillRecent()
     QMenu* menu = Action("actionOpenRecent")->menu();
     menu->clear();
     int number = 0;
-    for (const QString& file : m_frame.RecentFiles().Files()) {
+    for (const QString& file : RecentFiles::All()) {
         QString text = QDir::toNativeSeparators(file).replace(u'&', QStringLiteral("&&"));
         if (++number < 10)
             text.prepend(QStringLiteral("&%1  ").arg(number));
@@ -210,7 +211,7 @@ void CFrameMenus::FillRecent()
     }
     menu->addSeparator();
     connect(menu->addAction(tr("&Clear List")), &QAction::triggered, this, [this] {
-        m_frame.RecentFiles().Clear();
+        RecentFiles::Clear();
         Update();
     });
 }

@@ -4,9 +4,12 @@
 
 #include <QCoreApplication>
 #include <QDesktopServices>
+#include <QDialogButtonBox>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QTreeWidget>
 #include <QUrl>
+#include <QVBoxLayout>
 
 namespace {
 
@@ -19,7 +22,7 @@ struct HelpCommands
 QString HelpFile(const CMainFrame& frame)
 {
     const CKsDoc* document = frame.ActiveDocument();
-    const auto templates = frame.Plugins().Templates();
+    const auto& templates = CMultiDocTemplate::All();
     const CMultiDocTemplate* documents = document            ? document->GetDocTemplate()
                                          : templates.empty() ? nullptr
                                                              : templates.front();
@@ -43,6 +46,33 @@ void ShowHelp(CMainFrame& frame)
         frame.SendCommand(KsCommand::Help);
     else
         QDesktopServices::openUrl(QUrl::fromLocalFile(file));
+}
+
+void ShowPlugins(CMainFrame& frame)
+{
+    QDialog dialog(&frame);
+    dialog.setObjectName(QStringLiteral("pluginsDialog"));
+    dialog.setWindowTitle(HelpCommands::tr("Plug-ins"));
+    auto* list = new QTreeWidget(&dialog);
+    list->setRootIsDecorated(false);
+    list->setWordWrap(true);
+    list->setHeaderLabels({HelpCommands::tr("Editor"), HelpCommands::tr("File"), HelpCommands::tr("State")});
+    for (const auto& plugin : frame.Plugins().All()) {
+        auto* item = new QTreeWidgetItem(list, {plugin->name, QFileInfo(plugin->file).fileName(),
+                                                plugin->IsUsable() ? HelpCommands::tr("In use") : plugin->error});
+        item->setToolTip(1, plugin->file);
+        item->setToolTip(2, item->text(2));
+        item->setIcon(0, plugin->Icon());
+    }
+    list->resizeColumnToContents(0);
+    list->resizeColumnToContents(1);
+    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Close, &dialog);
+    QObject::connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
+    auto* layout = new QVBoxLayout(&dialog);
+    layout->addWidget(list);
+    layout->addWidget(buttons);
+    dialog.resize(640, 240);
+    dialog.exec();
 }
 
 void ShowAbout(QWidget* parent)

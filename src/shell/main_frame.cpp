@@ -4,6 +4,7 @@
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 #include "shell/project_respell.h"
+#include "shell/recent_files.h"
 #include "shell/settings_keys.h"
 
 #include <QApplication>
@@ -21,7 +22,7 @@
 
 CMainFrame::CMainFrame()
     : m_windows(*this),
-      m_projects(*this, m_windows, m_plugins, m_recent),
+      m_projects(*this, m_windows, m_plugins),
       m_files(*this, m_plugins, m_projects),
       m_bars(*this, m_plugins),
       m_menus(*this),
@@ -97,7 +98,7 @@ void CMainFrame::Follow(const CMultiDocTemplate& documents)
 void CMainFrame::DocumentShown(const CKsDoc* document)
 {
     if (!document->GetPathName().isEmpty())
-        m_recent.Add(document->GetPathName());
+        RecentFiles::Add(document->GetPathName());
     const CPlugin* editor = m_plugins.Of(document->GetDocTemplate());
     for (const CView* view : document->Views()) {
         if (auto* window = m_windows.Of(view); window && editor)
@@ -108,11 +109,10 @@ void CMainFrame::DocumentShown(const CKsDoc* document)
 
 void CMainFrame::DocumentRenamed(const QString& oldPath, const QString& newPath)
 {
-    m_recent.Rename(oldPath, newPath);
-    for (const auto& project : m_projects.Registry().All())
-        RespellMember(project->path, oldPath, newPath);
+    RecentFiles::Rename(oldPath, newPath);
+    RespellMember(m_projects.Registry(), oldPath, newPath);
     if (!newPath.isEmpty())
-        m_recent.Add(newPath);
+        RecentFiles::Add(newPath);
 }
 
 void CMainFrame::ActiveViewChanged(CView* view)
@@ -129,8 +129,8 @@ void CMainFrame::ActiveViewChanged(CView* view)
 void CMainFrame::Retranslate()
 {
     m_menus.Retranslate();
-    MdiArea().SetHint(m_plugins.Templates().empty() ? tr("No editor was found. See Help, Plug-ins.")
-                                                    : tr("Open a file with File, Open, or drop it here."));
+    MdiArea().SetHint(CMultiDocTemplate::All().empty() ? tr("No editor was found. See Help, Plug-ins.")
+                                                       : tr("Open a file with File, Open, or drop it here."));
     UpdatePluginLabel();
     UpdateTitle();
 }

@@ -8,7 +8,6 @@
 #include "shell/frame_menus.h"
 #include "shell/plugin_loader.h"
 #include "shell/project_controller.h"
-#include "shell/recent_files.h"
 #include "shell/window_manager.h"
 
 class QLabel;
@@ -28,7 +27,6 @@ public:
     bool OpenFile(const QString& path, bool othersLater = false) { return m_files.Open(path, othersLater); }
 
     const CPlugins& Plugins() const { return m_plugins; }
-    CRecentFiles& RecentFiles() { return m_recent; }
     CWindowManager& Windows() { return m_windows; }
     CProjectController& Projects() { return m_projects; }
     CFileCommands& Files() { return m_files; }
@@ -58,7 +56,6 @@ private:
 
     // In the order in which they need each other.
     CPlugins m_plugins;
-    CRecentFiles m_recent;
     CWindowManager m_windows;
     CProjectController m_projects;
     CFileCommands m_files;

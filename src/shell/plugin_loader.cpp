@@ -101,19 +101,9 @@ void CPlugins::Clear()
         plugin->templates.clear();
 }
 
-std::vector<CMultiDocTemplate*> CPlugins::Templates() const
-{
-    std::vector<CMultiDocTemplate*> templates;
-    for (const auto& plugin : m_plugins) {
-        for (const auto& documents : plugin->templates)
-            templates.push_back(documents.get());
-    }
-    return templates;
-}
-
 CMultiDocTemplate* CPlugins::TemplateFor(const QString& path) const
 {
-    for (CMultiDocTemplate* documents : Templates()) {
+    for (CMultiDocTemplate* documents : CMultiDocTemplate::All()) {
         if (documents->MatchesExtension(path))
             return documents;
     }

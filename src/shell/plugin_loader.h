@@ -45,7 +45,6 @@ public:
     void Clear();
     /// Those that cannot be used, too.
     const std::vector<std::unique_ptr<CPlugin>>& All() const { return m_plugins; }
-    std::vector<CMultiDocTemplate*> Templates() const;
     /// The one that reads files of this name; null for none.
     CMultiDocTemplate* TemplateFor(const QString& path) const;
     /// The open document of a file; null for none.

@@ -16,9 +16,8 @@ namespace {
 constexpr int ProjectTreeWidth = 190; // pixels, until the user pulls it
 } // namespace
 
-CProjectController::CProjectController(CKsMDIFrameWnd& frame, CWindowManager& windows, const CPlugins& plugins,
-                                       CRecentFiles& recent)
-    : m_frame(frame), m_windows(windows), m_plugins(plugins), m_recent(recent), m_tree(new CProjectTree(&frame))
+CProjectController::CProjectController(CKsMDIFrameWnd& frame, CWindowManager& windows, const CPlugins& plugins)
+    : m_frame(frame), m_windows(windows), m_plugins(plugins), m_tree(new CProjectTree(&frame))
 {
     frame.addDockWidget(Qt::LeftDockWidgetArea, m_tree);
     m_tree->hide(); // until there is a project
@@ -36,7 +35,7 @@ bool CProjectController::Open(const QString& path, bool othersLater)
         return false;
     }
     const CProject project = *opened; // its views change while the members open
-    m_recent.Add(project.path);
+    RecentFiles::Add(project.path);
     Announce(KsRequest::ProjectOpened, project);
     m_tree->show();
     m_frame.resizeDocks({m_tree}, {ProjectTreeWidth}, Qt::Horizontal);

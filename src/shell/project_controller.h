@@ -8,7 +8,6 @@
 
 class CKsMDIFrameWnd;
 class CPlugins;
-class CRecentFiles;
 class CWindowManager;
 
 /// Opens the files of projects in the frame's windows, closes them together, and keeps the tree of their files.
@@ -17,7 +16,7 @@ class CProjectController : public QObject
     Q_OBJECT
 public:
     /// All of them outlive the controller; the tree is the frame's.
-    CProjectController(CKsMDIFrameWnd& frame, CWindowManager& windows, const CPlugins& plugins, CRecentFiles& recent);
+    CProjectController(CKsMDIFrameWnd& frame, CWindowManager& windows, const CPlugins& plugins);
 
     /// Which projects are open, and who belongs to them.
     CProjects& Registry() { return m_projects; }
@@ -52,7 +51,6 @@ private:
     CKsMDIFrameWnd& m_frame;
     CWindowManager& m_windows;
     const CPlugins& m_plugins;
-    CRecentFiles& m_recent;
     CProjects m_projects;
     CProjectTree* m_tree; // the frame's
 };

@@ -1,12 +1,22 @@
 #include "shell/project_respell.h"
 
 #include "files/structure.h"
+#include "ks/fc/message_box.h"
+#include "ks/fc/system_reason.h"
 #include "shell/project_file.h"
+#include "shell/projects.h"
 
+#include <QApplication>
 #include <QDir>
 #include <QFileInfo>
+#include <QTimer>
 
 namespace {
+
+struct ProjectRespell
+{
+    Q_DECLARE_TR_FUNCTIONS(ProjectRespell)
+};
 
 /// Byte of a place in the text of a file.
 qsizetype OffsetOf(const QByteArray& text, const TqlPosition& place)
@@ -36,26 +46,37 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
     return offsets;
 }
 
+Result<void> Respell(const QString& projectPath, const QString& path, const QByteArray& extension)
+{
+    const Result<std::string> content = ReadWholeFile(projectPath.toStdString());
+    if (!content)
+        return content.error();
+    QByteArray text = QByteArray::fromStdString(content.value());
+    for (const qsizetype offset : ExtensionsOf(projectPath, text, path))
+        if (text.mid(offset, extension.size()).compare(extension, Qt::CaseInsensitive) == 0)
+            text.replace(offset, extension.size(), extension);
+    return WriteFileSafely(projectPath.toStdString(), text.toStdString());
+}
+
 } // namespace
 
-void RespellMember(const QString& projectPath, const QString& oldPath, const QString& newPath)
+void RespellMember(const CProjects& projects, const QString& oldPath, const QString& newPath)
 {
     const QFileInfo before(oldPath), after(newPath);
-    const QByteArray extension = after.suffix().toUtf8(), old = before.suffix().toUtf8();
-    const bool isRespelt = oldPath != newPath && old != extension && before.path() == after.path() &&
-                           before.completeBaseName() == after.completeBaseName() &&
-                           before.suffix().compare(after.suffix(), Qt::CaseInsensitive) == 0;
-    const Result<std::string> content = isRespelt ? ReadWholeFile(projectPath.toStdString()) : Error{};
-    if (!content)
+    if (before.suffix() == after.suffix() || before.path() != after.path() ||
+        before.completeBaseName() != after.completeBaseName() ||
+        before.suffix().compare(after.suffix(), Qt::CaseInsensitive) != 0)
         return;
-    QByteArray text = QByteArray::fromStdString(content.value());
-    bool isChanged = false;
-    for (const qsizetype offset : ExtensionsOf(projectPath, text, oldPath)) {
-        if (text.mid(offset, old.size()) != old)
+    for (const auto& project : projects.All()) {
+        if (!project->members.contains(QDir::cleanPath(oldPath)))
             continue;
-        text.replace(offset, old.size(), extension);
-        isChanged = true;
+        const Result<void> respelt = Respell(project->path, oldPath, after.suffix().toUtf8());
+        if (respelt)
+            continue;
+        const QString text =
+            ProjectRespell::tr(
+                "The project %1 still names %2 and could not be changed: %3.\nThe file is found all the same.")
+                .arg(project->name, before.fileName(), KsSystemReason(respelt.error().code));
+        QTimer::singleShot(0, qApp, [text] { KsMessageBox(text); }); // when the save is over
     }
-    if (isChanged && !WriteFileSafely(projectPath.toStdString(), text.toStdString()))
-        return; // read-only: its members are found all the same
 }

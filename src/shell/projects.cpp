@@ -52,8 +52,7 @@ void CProjects::Close(CProjectHandle handle)
 
 CProject* CProjects::FindForChange(CProjectHandle handle)
 {
-    const auto found = std::find_if(m_projects.begin(), m_projects.end(),
-                                    [handle](const auto& project) { return project->handle == handle; });
+    const auto found = std::ranges::find(m_projects, handle, [](const auto& project) { return project->handle; });
     return found == m_projects.end() ? nullptr : found->get();
 }
 

@@ -28,7 +28,7 @@ void Write(const QStringList& files)
 
 } // namespace
 
-QStringList CRecentFiles::Files()
+QStringList RecentFiles::All()
 {
     QStringList files = Read();
     if (files.removeIf([](const QString& file) { return !QFileInfo::exists(file); }))
@@ -36,7 +36,7 @@ QStringList CRecentFiles::Files()
     return files;
 }
 
-void CRecentFiles::Add(const QString& path)
+void RecentFiles::Add(const QString& path)
 {
     QStringList files = Read();
     const QString clean = QDir::cleanPath(path);
@@ -45,7 +45,7 @@ void CRecentFiles::Add(const QString& path)
     Write(files.mid(0, Longest));
 }
 
-void CRecentFiles::Rename(const QString& oldPath, const QString& newPath)
+void RecentFiles::Rename(const QString& oldPath, const QString& newPath)
 {
     QStringList files = Read();
     const auto index = files.indexOf(QDir::cleanPath(oldPath));
@@ -56,7 +56,7 @@ void CRecentFiles::Rename(const QString& oldPath, const QString& newPath)
     Write(files);
 }
 
-void CRecentFiles::Clear()
+void RecentFiles::Clear()
 {
     Write({});
 }

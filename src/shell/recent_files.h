@@ -3,16 +3,14 @@
 
 #include <QStringList>
 
-class CRecentFiles
-{
-public:
-    static constexpr int Longest = 10;
+namespace RecentFiles {
+inline constexpr int Longest = 10;
 
-    /// Those that still exist; the others are forgotten.
-    QStringList Files();
-    /// Puts a file first. Paths are absolute.
-    void Add(const QString& path);
-    /// A file goes by another name now. Does nothing when the old one is not in the list.
-    void Rename(const QString& oldPath, const QString& newPath);
-    void Clear();
-};
+/// Those that still exist; the others are forgotten.
+QStringList All();
+/// Puts a file first. Paths are absolute.
+void Add(const QString& path);
+/// A file goes by another name now. Does nothing when the old one is not in the list.
+void Rename(const QString& oldPath, const QString& newPath);
+void Clear();
+} // namespace RecentFiles

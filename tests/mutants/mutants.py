@@ -32,8 +32,8 @@ MUTANTS = [
     ('cli', 'cli/field_text.cpp', '(text.size() == 1 ? "0" : "")', '""'),
     # The shell's libraries.
     ('ks', 'ks/units/number_format.cpp', 'magnitude >= 1e-5 && magnitude < 1e15', 'magnitude >= 1e-3 && magnitude < 1e15'),
-    ('ks', 'ks/units/number_format.cpp', 'format.zeros && std::isfinite(value) ?', 'format.zeros ?'),
-    ('ks', 'ks/fc/branch_name.cpp', 'return a.size() == b.size();', 'return true;'),
+    ('ks', 'ks/units/number_format.cpp', 'isGiven ? precision : 6', 'precision'),
+    ('ks', 'ks/fc/branch_name.cpp', 'return key.trimmed().toUpper();', 'return key.toUpper();'),
     ('ks', 'ks/fc/file_name.cpp', 'Qt::CaseInsensitive', 'Qt::CaseSensitive'),
     ('ks', 'ks/fc/doc_save.cpp', 'case QMessageBox::Discard:\n        return true;',
      'case QMessageBox::Discard:\n        return false;'),
@@ -60,7 +60,7 @@ MUTANTS = [
      '!std::isfinite(value)'),
     # Messages.
     ('module', 'module/data_exchange.cpp', 'if (!exchange.mayLeave && exchange.ListPage())', 'if (false)'),
-    ('module', 'module/data_exchange.cpp', 's_busy = true;', 's_busy = false;'),
+    ('module', 'module/data_exchange.cpp', 'QScopedValueRollback busy(isBusy, true)', 'QScopedValueRollback busy(isBusy, false)'),
     ('module', 'module/data_exchange.cpp', '|| !std::isfinite(exchange.item.chainage))', ')'),
     # The other editors.
     ('network', 'editors/network/linear_reference.cpp', 'std::lerp(line.along[i], line.along[i + 1], part)',

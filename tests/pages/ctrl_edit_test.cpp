@@ -48,6 +48,17 @@ TEST_F(CtrlEditTest, ShowsTheDeclaredDigits)
     EXPECT_EQ(field.text(), "1.23e+07");
 }
 
+TEST_F(CtrlEditTest, APastedLineEndIsNoPartOfTheNumber)
+{
+    for (const auto& [pasted, expected] : {std::pair("2.5\n", 2.5), std::pair("7\r\n\n", 7.0)}) {
+        Type("");
+        QGuiApplication::clipboard()->setText(pasted);
+        field.paste();
+        EXPECT_TRUE(field.Typing().Take()) << pasted;
+        EXPECT_EQ(value, expected);
+    }
+}
+
 TEST_F(CtrlEditTest, AnUntouchedTextChangesNothing)
 {
     const double before = value;

@@ -189,6 +189,21 @@ TEST_F(GridEditTest, BranchNamesToChooseFrom)
     EXPECT_EQ(init.GetAt(0).RiverName, "X") << "no network: plain text";
 }
 
+TEST_F(GridEditTest, WhatNobodySeesIsNoPartOfABranchName)
+{
+    for (const bool chosen : {false, true}) { // from a list, or not
+        view->branches = chosen ? QStringList("MAIN") : QStringList();
+        grid->SetBranchNameColumn(1);
+        Type(1, 1, "");
+        QGuiApplication::clipboard()->setText(QStringLiteral(" \u202Ainn 2\u202C \r\n"));
+        auto* list = qobject_cast<QComboBox*>(Editor());
+        (list ? list->lineEdit() : qobject_cast<QLineEdit*>(Editor()))->paste();
+        QTest::keyClick(Editor(), Qt::Key_Return);
+        EXPECT_EQ(init.GetAt(0).RiverName, "INN 2");
+        Enter(1, 1, "other");
+    }
+}
+
 TEST_F(GridEditTest, UnitsSwitchedWhileTyping)
 {
     Type(1, 3, "10");

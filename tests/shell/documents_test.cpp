@@ -1,3 +1,4 @@
+#include "shell/recent_files.h"
 #include "shell_fixture.h"
 
 #include <QMimeData>
@@ -17,7 +18,7 @@ TEST_F(ShellTest, OpenSaveAndCloseByTheMenu)
     names << Path("b.tst");
     Action("actionSaveAs")->trigger();
     EXPECT_EQ(frame->ActiveDocument()->GetPathName(), Path("b.tst"));
-    EXPECT_EQ(frame->RecentFiles().Files().mid(0, 1), QStringList(Path("b.tst")));
+    EXPECT_EQ(RecentFiles::All().mid(0, 1), QStringList(Path("b.tst")));
     Action("actionClose")->trigger();
     Settle();
     EXPECT_FALSE(frame->ActiveDocument());

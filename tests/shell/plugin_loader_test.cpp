@@ -1,4 +1,3 @@
-#include "shell/plugins_dialog.h"
 #include "shell_fixture.h"
 
 #include <QLabel>
@@ -35,9 +34,12 @@ TEST_F(ShellTest, WhatIsNoEditorIsNamedAndTheOthersWork)
     const auto* label = frame->findChild<QLabel*>("pluginLabel");
     EXPECT_TRUE(label->isVisible());
     EXPECT_TRUE(label->text().contains("broken_editor"));
-    CPluginsDialog dialog(frame->Plugins());
-    const auto rows = dialog.findChild<QTreeWidget*>()->findItems("", Qt::MatchContains, 2);
-    EXPECT_EQ(rows.size(), 2);
+    QTimer::singleShot(0, frame.get(), [] {
+        QWidget* dialog = QApplication::activeModalWidget();
+        EXPECT_EQ(dialog->findChild<QTreeWidget*>()->findItems("", Qt::MatchContains, 2).size(), 2);
+        dialog->close();
+    });
+    Action("actionPlugins")->trigger();
     EXPECT_TRUE(frame->OpenFile(Write("a.tst")));
 }
 
@@ -61,6 +63,7 @@ TEST_F(ShellTest, AFolderMayHoldAnything)
 
 TEST_F(ShellTest, AShellWithoutEditorsSaysSo)
 {
+    frame.reset();
     CMainFrame empty;
     empty.LoadPlugins(Path("nowhere"));
     EXPECT_FALSE(empty.findChild<QAction*>("actionNew")->isEnabled());

@@ -76,6 +76,23 @@ TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
     document->SetPathName(Path("one/other.TST"));
     file.seek(0);
     EXPECT_FALSE(file.readAll().contains("other")) << "another file is no other spelling";
+    EXPECT_TRUE(asked.isEmpty());
+}
+
+TEST_F(ShellTest, AProjectFileThatCannotFollowIsNamed)
+{
+    Write("a.tst");
+    const QString path = WriteProject("p.kvrp", "File = <a.tst>\n");
+    ASSERT_TRUE(frame->OpenFile(path));
+    ASSERT_TRUE(frame->OpenFile(WriteProject("q.kvrp", "File = <b.tst>\n")));
+    asked.clear(); // b.tst is not there
+    QFile::remove(path);
+    QDir().mkdir(path); // nobody can write that
+    ViewOf("a.tst")->GetDocument()->SetPathName(Path("a.TST"));
+    EXPECT_TRUE(asked.isEmpty()) << "not in the middle of the save";
+    QCoreApplication::processEvents();
+    ASSERT_EQ(asked.size(), 1);
+    EXPECT_TRUE(asked[0].startsWith("The project p still names a.tst")) << qPrintable(asked[0]);
 }
 
 TEST_F(ShellTest, AProjectStandsSideBySideUnlessTheUserChoseTabs)

@@ -62,7 +62,7 @@ protected:
     {
         return Write(name, "[KVR_PROJECT]\n[Members]\n" + members + "[/Members]\n[/KVR_PROJECT]\n");
     }
-    CMultiDocTemplate& Texts() const { return *frame->Plugins().Templates().at(0); }
+    CMultiDocTemplate& Texts() const { return *CMultiDocTemplate::All().at(0); }
     CView* ViewOf(const QString& name) const
     {
         const CKsDoc* document = Texts().FindDocument(Path(name));

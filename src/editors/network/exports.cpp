@@ -1,5 +1,4 @@
 // The functions that the shell calls.
 #include "editors/network/module.h"
-#include "ks/fc/single_editor.h"
 
-KS_SINGLE_EDITOR(NetworkModule)
+KS_SINGLE_EDITOR(NetworkEditor)

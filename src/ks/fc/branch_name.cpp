@@ -1,55 +1,29 @@
 #include "ks/fc/branch_name.h"
 
-#include <QStringView>
 #include <algorithm>
-#include <optional>
 
 namespace {
 
-/// Of two letters at the same place: whether their capitals are the same, as far as that needs no table.
-template <typename Letter>
-std::optional<bool> SameCapital(Letter a, Letter b)
+bool IsDirectionMark(QChar c)
 {
-    if (a == b)
-        return true;
-    const auto isAscii = [](Letter c) { return c < 0x80; };
-    if (!isAscii(a) || !isAscii(b))
-        return std::nullopt; // "ss" is the capital of a single letter, too
-    const auto capital = [](Letter c) { return c >= 'a' && c <= 'z' ? Letter(c - 'a' + 'A') : c; };
-    return capital(a) == capital(b);
-}
-
-/// Most names differ early or are spelt alike: that is told without making their keys. Nothing when it is not enough.
-template <typename Letter, typename Text>
-std::optional<bool> SameAtSight(const Text& a, const Text& b)
-{
-    const auto common = std::min(a.size(), b.size());
-    for (decltype(a.size()) i = 0; i < common; ++i) {
-        const auto same = SameCapital(Letter(a[i]), Letter(b[i]));
-        if (!same || !*same)
-            return same;
-    }
-    return a.size() == b.size();
+    return c == u'\u200E' || c == u'\u200F' || (c >= u'\u202A' && c <= u'\u202E') || (c >= u'\u2066' && c <= u'\u2069');
 }
 
 } // namespace
 
 CString KsBranchKey(const CString& name)
 {
-    return name.toUpper();
+    CString key = name;
+    key.removeIf(IsDirectionMark);
+    return key.trimmed().toUpper();
 }
 
 bool KsSameBranch(const CString& a, const CString& b)
 {
-    const std::u16string_view first(QStringView(a).utf16(), std::size_t(a.size()));
-    const std::u16string_view second(QStringView(b).utf16(), std::size_t(b.size()));
-    const auto same = SameAtSight<char16_t>(first, second);
-    return same ? *same : KsBranchKey(a) == KsBranchKey(b);
-}
-
-bool KsSameBranch(std::string_view a, std::string_view b)
-{
-    const auto same = SameAtSight<unsigned char>(a, b);
-    const auto text = [](std::string_view name) { return CString::fromUtf8(name.data(), qsizetype(name.size())); };
-    return same ? *same : KsBranchKey(text(a)) == KsBranchKey(text(b));
+    // Most names differ in plain letters or digits, which is told without making their keys.
+    const auto [left, right] = std::mismatch(a.begin(), a.end(), b.begin(), b.end());
+    const auto isPlain = [](QChar c) { return c > u' ' && c < u'\x80'; };
+    if (left != a.end() && right != b.end() && isPlain(*left) && isPlain(*right) && left->toUpper() != right->toUpper())
+        return false;
+    return KsBranchKey(a) == KsBranchKey(b);
 }

@@ -4,12 +4,9 @@
 #include "ks/fc/types.h"
 #include "ks/ks_export.h"
 
-#include <string_view>
-
-/// The capitals that a cell for branch names makes of what is typed. Names with the same capitals are one branch, so
-/// this is the key for looking one up.
+/// A name as a cell for branch names stores what was typed or pasted: in capitals, without blanks around it and without
+/// marks of the writing direction, which nobody sees. Names of which this is the same are one branch, so it is the key
+/// for looking one up.
 KS_API CString KsBranchKey(const CString& name);
-/// Whether two names mean one branch; spelt alike they are compared without making their keys.
+/// Whether two names mean one branch.
 KS_API bool KsSameBranch(const CString& a, const CString& b);
-/// Likewise for names as the records hold them, in UTF-8.
-KS_API bool KsSameBranch(std::string_view a, std::string_view b);

@@ -6,10 +6,11 @@
 
 #include <QApplication>
 #include <QDir>
-#include <QFile>
 #include <QFileInfo>
 #include <QUndoStack>
 #include <algorithm>
+#include <cerrno>
+#include <fstream>
 #include <utility>
 
 CKsDoc::CKsDoc() : m_undo(new QUndoStack(this))
@@ -35,12 +36,13 @@ BOOL CKsDoc::OnNewDocument()
 
 BOOL CKsDoc::OnOpenDocument(const CString& path)
 {
-    QFile file(path);
     const QFileInfo info(path);
-    const CString reason = !info.exists()                    ? tr("The file does not exist.")
-                           : !info.isFile()                  ? tr("This is not a file.")
-                           : !file.open(QIODevice::ReadOnly) ? KsSystemReason(file)
-                                                             : CString();
+    errno = 0;
+    const CString reason = !info.exists()   ? tr("The file does not exist.")
+                           : !info.isFile() ? tr("This is not a file.")
+                           : !std::ifstream(info.filesystemFilePath())
+                               ? KsSystemSentence({errno, std::generic_category()})
+                               : CString();
     if (!reason.isEmpty()) {
         KsMessageBox(tr("%1 could not be opened.\n%2").arg(QDir::toNativeSeparators(path), reason));
         return false;

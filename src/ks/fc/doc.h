@@ -123,7 +123,6 @@ signals:
 
 private:
     friend class CMultiDocTemplate;
-    CString AskSavePath();
     void StepMade(int index);
 
     CString m_path, m_title;

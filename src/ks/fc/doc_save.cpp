@@ -10,6 +10,43 @@
 #include <QFileInfo>
 #include <algorithm>
 
+namespace {
+
+/// Asks for a name until it is one that may be written; empty when the user gives up.
+CString AskSavePath(const CKsDoc& document)
+{
+    KsFileQuestion question;
+    question.save = true;
+    question.title = CKsDoc::tr("Save As");
+    question.proposal = document.GetPathName().isEmpty() ? document.GetTitle() : document.GetPathName();
+    const CMultiDocTemplate* const documents = document.GetDocTemplate();
+    if (documents) {
+        question.filters = documents->FileDialogFilter();
+        question.extension = documents->GetDocString(CMultiDocTemplate::filterExt);
+    }
+    while (true) {
+        const CString path = KsAskFileName(question);
+        if (path.isEmpty())
+            return {};
+        const CString written = document.SavePathFor(path);
+        question.proposal = path;
+        const CKsDoc* other = documents ? documents->FindDocument(written) : nullptr;
+        if (other && other != &document) {
+            KsMessageBox(CKsDoc::tr("%1 is open in another window. Choose another name.")
+                             .arg(QDir::toNativeSeparators(written)));
+            continue;
+        }
+        // A file whose name differs in its case only is the one that the user means.
+        const CString taken = KsExistingSpelling(written);
+        if (!QFileInfo::exists(taken) || KsSameFile(taken, document.GetPathName()) ||
+            KsMessageBox(CKsDoc::tr("%1 exists already. Replace it?").arg(QDir::toNativeSeparators(taken)),
+                         QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
+            return path;
+    }
+}
+
+} // namespace
+
 CString CKsDoc::SavePathFor(const CString& path) const
 {
     return path;
@@ -19,7 +56,7 @@ BOOL CKsDoc::DoSave(const CString& path)
 {
     if (!MayLeave())
         return false;
-    const CString target = path.isEmpty() ? AskSavePath() : path;
+    const CString target = path.isEmpty() ? AskSavePath(*this) : path;
     if (target.isEmpty())
         return false;
     m_named = false;
@@ -52,37 +89,5 @@ BOOL CKsDoc::SaveModified()
         return true;
     default:
         return false;
-    }
-}
-
-/// Asks for a name until it is one that may be written; empty when the user gives up.
-CString CKsDoc::AskSavePath()
-{
-    KsFileQuestion question;
-    question.save = true;
-    question.title = tr("Save As");
-    question.proposal = m_path.isEmpty() ? GetTitle() : m_path;
-    if (m_template) {
-        question.filters = m_template->FileDialogFilter();
-        question.extension = m_template->GetDocString(CMultiDocTemplate::filterExt);
-    }
-    while (true) {
-        const CString path = KsAskFileName(question);
-        if (path.isEmpty())
-            return {};
-        const CString written = SavePathFor(path);
-        question.proposal = path;
-        const CKsDoc* other = m_template ? m_template->FindDocument(written) : nullptr;
-        if (other && other != this) {
-            KsMessageBox(
-                tr("%1 is open in another window. Choose another name.").arg(QDir::toNativeSeparators(written)));
-            continue;
-        }
-        // A file whose name differs in its case only is the one that the user means.
-        const CString taken = KsExistingSpelling(written);
-        if (!QFileInfo::exists(taken) || KsSameFile(taken, m_path) ||
-            KsMessageBox(tr("%1 exists already. Replace it?").arg(QDir::toNativeSeparators(taken)),
-                         QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
-            return path;
     }
 }

@@ -9,6 +9,12 @@
 
 namespace {
 
+std::vector<CMultiDocTemplate*>& Templates()
+{
+    static std::vector<CMultiDocTemplate*> templates;
+    return templates;
+}
+
 bool IsClosing(const CKsDoc* document)
 {
     const auto& views = document->Views();
@@ -23,6 +29,7 @@ bool IsClosing(const CKsDoc* document)
 CMultiDocTemplate::CMultiDocTemplate(int resourceId, Strings strings, Classes classes)
     : m_resourceId(resourceId), m_strings(std::move(strings)), m_classes(std::move(classes))
 {
+    Templates().push_back(this);
 }
 
 CMultiDocTemplate::CMultiDocTemplate(int resourceId, const CString& strings, Classes classes)
@@ -35,6 +42,12 @@ CMultiDocTemplate::~CMultiDocTemplate()
 {
     while (!m_documents.empty())
         CloseDocument(m_documents.back());
+    std::erase(Templates(), this);
+}
+
+const std::vector<CMultiDocTemplate*>& CMultiDocTemplate::All()
+{
+    return Templates();
 }
 
 CString CMultiDocTemplate::GetDocString(DocStringIndex index) const

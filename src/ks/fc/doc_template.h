@@ -44,6 +44,8 @@ public:
     CMultiDocTemplate(int resourceId, const CString& strings, Classes classes);
     ~CMultiDocTemplate() override;
 
+    /// All that exist, in the order of their making.
+    static const std::vector<CMultiDocTemplate*>& All();
     int ResourceId() const { return m_resourceId; }
     CString GetDocString(DocStringIndex index) const;
     /// Whether the template's extension fits, whatever its case.

@@ -5,17 +5,11 @@
 #include <QFileInfo>
 #include <utility>
 
-namespace {
-KsFileDialogHandler& Handler()
-{
-    static KsFileDialogHandler handler;
-    return handler;
-}
-} // namespace
+static KsFileDialogHandler g_handler;
 
 CString KsAskFileName(const KsFileQuestion& question, QWidget* parent)
 {
-    if (const auto handler = Handler())
+    if (const auto handler = g_handler)
         return handler(question);
     const QFileInfo proposal(question.proposal);
     QFileDialog dialog(parent ? parent : QApplication::activeWindow(), question.title,
@@ -33,5 +27,5 @@ CString KsAskFileName(const KsFileQuestion& question, QWidget* parent)
 
 KsFileDialogHandler KsSetFileDialogHandler(KsFileDialogHandler handler)
 {
-    return std::exchange(Handler(), std::move(handler));
+    return std::exchange(g_handler, std::move(handler));
 }

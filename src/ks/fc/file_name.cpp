@@ -19,6 +19,13 @@ CString KsExistingSpelling(const CString& path)
     return path;
 }
 
+CString KsShownFileName(const CString& path)
+{
+    constexpr qsizetype Longest = 60, Side = (Longest - 1) / 2; // no place to break a line in them
+    const CString name = QFileInfo(path).fileName();
+    return name.size() <= Longest ? name : name.first(Side) + u'\u2026' + name.last(Side);
+}
+
 CString KsFileKey(const CString& path)
 {
     if (path.isEmpty())

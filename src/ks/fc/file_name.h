@@ -7,6 +7,8 @@
 /// The path as files and folders are spelt on disk: a project or a list may hold another case, and an editor may have
 /// saved a file with its extension in capitals. The path itself when it exists as it stands, or when nothing fits.
 KS_API CString KsExistingSpelling(const CString& path);
+/// The name of a file for a text on the screen: one that is very long is cut in its middle.
+KS_API CString KsShownFileName(const CString& path);
 /// Names a file, whichever of its paths is given: another spelling, a way through other folders, a link to it.
 KS_API CString KsFileKey(const CString& path);
 /// Whether two paths name one file as a user means it, in whatever case; an empty path names none. SameFile of

@@ -4,32 +4,20 @@
 #include <QLabel>
 #include <utility>
 
-namespace {
-KsMessageBoxHandler& Handler()
-{
-    static KsMessageBoxHandler handler;
-    return handler;
-}
-
-CKsKeptMessages* keeper = nullptr; // the innermost one
-
-QMessageBox::Icon IconFor(QMessageBox::StandardButtons buttons)
-{
-    return buttons == QMessageBox::Ok ? QMessageBox::Warning : QMessageBox::Question;
-}
-} // namespace
+static KsMessageBoxHandler g_handler;
+static CKsKeptMessages* g_keeper = nullptr; // the innermost one
 
 QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::StandardButtons buttons, QWidget* parent,
                                          const CString& details, QMessageBox::StandardButton defaultButton)
 {
-    if (keeper && buttons == QMessageBox::Ok) {
-        keeper->m_texts << text;
+    if (g_keeper && buttons == QMessageBox::Ok) {
+        g_keeper->m_texts << text;
         return QMessageBox::Ok;
     }
-    if (const auto handler = Handler())
+    if (const auto handler = g_handler)
         return handler(text, buttons);
-    QMessageBox box(IconFor(buttons), QCoreApplication::applicationName(), text, buttons,
-                    parent ? parent : QApplication::activeWindow());
+    QMessageBox box(buttons == QMessageBox::Ok ? QMessageBox::Warning : QMessageBox::Question,
+                    QCoreApplication::applicationName(), text, buttons, parent ? parent : QApplication::activeWindow());
     box.setDefaultButton(defaultButton);
     box.setTextFormat(Qt::PlainText); // file names may hold anything
     box.setInformativeText(details);
@@ -40,12 +28,12 @@ QMessageBox::StandardButton KsMessageBox(const CString& text, QMessageBox::Stand
 
 KsMessageBoxHandler KsSetMessageBoxHandler(KsMessageBoxHandler handler)
 {
-    return std::exchange(Handler(), std::move(handler));
+    return std::exchange(g_handler, std::move(handler));
 }
 
-CKsKeptMessages::CKsKeptMessages() : m_outer(std::exchange(keeper, this)) {}
+CKsKeptMessages::CKsKeptMessages() : m_outer(std::exchange(g_keeper, this)) {}
 
 CKsKeptMessages::~CKsKeptMessages()
 {
-    keeper = m_outer;
+    g_keeper = m_outer;
 }

@@ -4,8 +4,6 @@
 #include "ks/fc/types.h"
 #include "ks/ks_export.h"
 
-class QWidget;
-
 /// Anything that can be sent a message: the main frame, a view.
 class KS_API CKsWindow
 {
@@ -24,14 +22,20 @@ KS_API LRESULT KsSendMessage(CKsWindow* window, unsigned message, WPARAM wParam,
 KS_API CKsWindow* KsMainWindow();
 KS_API void KsSetMainWindow(CKsWindow* window);
 
+/// A message by its name. Called, it gives the number, and registers the name the first time.
+struct KsNamedMessage
+{
+    const char* name;
+    unsigned operator()() const { return KsRegisterMessage(name); }
+};
 namespace KsMessage {
 // The names are the shell's, the misspelling in the first included.
-KS_API unsigned SwitchBoard();    // "KavoShellSwitchBoardSevice"
-KS_API unsigned BetweenEditors(); // "KavoShellCommunicationBetweenEditors"
-KS_API unsigned ProjectManagement();
-KS_API unsigned ShowToolbar();
-KS_API unsigned HideToolbar();
-KS_API unsigned ProjectMapChanged(); // "KSM_VISUAL_PROJECT_MAP_CHANGED"
+inline constexpr KsNamedMessage SwitchBoard{"KavoShellSwitchBoardSevice"};
+inline constexpr KsNamedMessage BetweenEditors{"KavoShellCommunicationBetweenEditors"};
+inline constexpr KsNamedMessage ProjectManagement{"KavoShellProjectManagement"};
+inline constexpr KsNamedMessage ShowToolbar{"KavoShellShowToolbar"};
+inline constexpr KsNamedMessage HideToolbar{"KavoShellHideToolbar"};
+inline constexpr KsNamedMessage ProjectMapChanged{"KSM_VISUAL_PROJECT_MAP_CHANGED"};
 } // namespace KsMessage
 
 /// Request codes (wParam) of the switchboard and of the messages between editors. lParam is the address of a
@@ -42,10 +46,10 @@ inline constexpr WPARAM LeaveProject = 24;
 inline constexpr WPARAM JoinProject = 25;
 // To the switchboard, which hands them on as messages between editors to the other views of the sender's project. Each
 // view appends to the package's objects what it has, and answers whether it had something; so does the switchboard.
-inline constexpr WPARAM LoadLocations = 40;            // CKvrCBELocation: branch and chainage of each location
-inline constexpr WPARAM LoadLocationsAndChannel = 49;  // likewise; then the views fill in radius and channel width
-inline constexpr WPARAM FetchLocation = 200;           // one CKvrCBELocation: the place picked; the first answer counts
-inline constexpr WPARAM BranchNames = 201;             // CKvrCBEText: the names of the branches
+inline constexpr WPARAM LoadLocations = 40;           // CKvrCBELocation: branch and chainage of each location
+inline constexpr WPARAM LoadLocationsAndChannel = 49; // likewise; then the views fill in radius and channel width
+inline constexpr WPARAM FetchLocation = 200;          // one CKvrCBELocation: the place picked; the first answer counts
+inline constexpr WPARAM BranchNames = 201;            // CKvrCBEText: the names of the branches
 // To the switchboard: appends a CKvrCBEView for every other view of the sender's project.
 inline constexpr WPARAM ProjectViews = 202;
 // Between editors. To a view of the HD parameter editor from another editor's view: 41 appends what KvrMSGGetData

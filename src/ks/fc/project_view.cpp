@@ -1,6 +1,5 @@
 #include "ks/fc/project_view.h"
 
-#include "ks/fc/status.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 
@@ -61,7 +60,7 @@ void CKsProjectView::ShowStatus()
         m_said.clear();
     QStringList parts{place, m_said};
     parts.removeAll(CString());
-    KsTellStatus(*this, parts.join(QStringLiteral("   ")));
+    MainFrame()->TellStatus(parts.join(QStringLiteral("   ")));
 }
 
 void CKsProjectView::MovedOn()

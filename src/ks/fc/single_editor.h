@@ -1,22 +1,46 @@
-// The exported functions of an editor that has one document template and one tool bar.
+// An editor that has one document template and one tool bar: what it is, and the functions that its plug-in exports.
 #pragma once
 
+#include "ks/fc/doc_template.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/plugin.h"
+#include "ks/language/language.h"
 
-#include <memory>
+/// Functions are asked whenever a text is shown, and answer in the user's language of the moment.
+struct KS_API KsSingleEditor
+{
+    const char* texts;        // the module of its translations
+    void (*load)() = nullptr; // makes available what else it needs
+    int documentResource = 0; // numbers
+    int bitmap = 0;
+    CMultiDocTemplate::Strings documentStrings;
+    CMultiDocTemplate::Classes classes;
+    std::function<CString()> name, toolBarName;
+    std::function<std::vector<CKsToolBarButton>()> buttons;
 
-/// Defines them all, and the module's start and end. `Module` is a namespace or class with LoadResources and
-/// FreeResources (texts and pictures, which live as long as the library is loaded), CreateTemplate, EditorName,
-/// ToolBarName, the number Bitmap, and InitToolBar, which is false when the bar cannot be created or filled.
-#define KS_SINGLE_EDITOR(Module)                                                                                       \
-    namespace {                                                                                                        \
-    const struct ModuleState                                                                                           \
-    {                                                                                                                  \
-        ModuleState() { Module::LoadResources(); }                                                                     \
-        ~ModuleState() { Module::FreeResources(); }                                                                    \
-    } g_module;                                                                                                        \
-    }                                                                                                                  \
+    /// A new template, which the caller owns.
+    CMultiDocTemplate* CreateTemplate() const;
+    /// Fills the bar and docks it; false when the bar or the frame is missing, or there are no buttons.
+    bool InitToolBar(CKsToolBarEx* bar, CKsMDIFrameWnd* frame, unsigned style, unsigned controlId) const;
+    CKsToolBarEx* CreateToolBar(CKsMDIFrameWnd* frame, unsigned style, unsigned controlId) const;
+};
+
+/// What an editor needs while its library is loaded.
+class KS_API CKsEditorResources
+{
+public:
+    explicit CKsEditorResources(const KsSingleEditor& editor);
+    ~CKsEditorResources() { KsLangFreeResDll(m_texts); }
+    CKsEditorResources(const CKsEditorResources&) = delete;
+    CKsEditorResources& operator=(const CKsEditorResources&) = delete;
+
+private:
+    KsResourceHandle m_texts = nullptr;
+};
+
+/// Defines the functions that the shell calls. `Editor` is a function that gives the KsSingleEditor, always the same.
+#define KS_SINGLE_EDITOR(Editor)                                                                                       \
+    static const CKsEditorResources g_resources(Editor());                                                             \
     extern "C" {                                                                                                       \
     Q_DECL_EXPORT int KsGetNumDocTemplates()                                                                           \
     {                                                                                                                  \
@@ -24,17 +48,15 @@
     }                                                                                                                  \
     Q_DECL_EXPORT CMultiDocTemplate* KsGetDocTemplatePtr(int index)                                                    \
     {                                                                                                                  \
-        return index == 0 ? Module::CreateTemplate() : nullptr;                                                        \
+        return index == 0 ? Editor().CreateTemplate() : nullptr;                                                       \
     }                                                                                                                  \
     Q_DECL_EXPORT BOOL KsGetEditorString(CString* text)                                                                \
     {                                                                                                                  \
-        if (text)                                                                                                      \
-            *text = Module::EditorName();                                                                              \
-        return text != nullptr;                                                                                        \
+        return text && (*text = Editor().name(), true);                                                                \
     }                                                                                                                  \
     Q_DECL_EXPORT int KsGetBitmapId()                                                                                  \
     {                                                                                                                  \
-        return Module::Bitmap;                                                                                         \
+        return Editor().bitmap;                                                                                        \
     }                                                                                                                  \
     Q_DECL_EXPORT int KsGetNumToolbars()                                                                               \
     {                                                                                                                  \
@@ -42,20 +64,15 @@
     }                                                                                                                  \
     Q_DECL_EXPORT BOOL KsGetToolbarString(CString* text, int index)                                                    \
     {                                                                                                                  \
-        if (index == 0)                                                                                                \
-            *text = Module::ToolBarName();                                                                             \
-        return index == 0;                                                                                             \
+        return index == 0 && (*text = Editor().toolBarName(), true);                                                   \
     }                                                                                                                  \
     Q_DECL_EXPORT BOOL KsInitToolbar(CKsToolBarEx* bar, CKsMDIFrameWnd* frame, unsigned style, unsigned controlId,     \
                                      unsigned index)                                                                   \
     {                                                                                                                  \
-        return index == 0 && Module::InitToolBar(bar, frame, style, controlId);                                        \
+        return index == 0 && Editor().InitToolBar(bar, frame, style, controlId);                                       \
     }                                                                                                                  \
     Q_DECL_EXPORT CKsToolBarEx* KsCreateToolbar(CKsMDIFrameWnd* frame, unsigned style, unsigned controlId, int index)  \
     {                                                                                                                  \
-        if (index != 0)                                                                                                \
-            return nullptr;                                                                                            \
-        auto bar = std::make_unique<CKsToolBarEx>();                                                                   \
-        return Module::InitToolBar(bar.get(), frame, style, controlId) ? bar.release() : nullptr;                      \
+        return index == 0 ? Editor().CreateToolBar(frame, style, controlId) : nullptr;                                 \
     }                                                                                                                  \
     }

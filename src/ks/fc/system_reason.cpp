@@ -1,23 +1,18 @@
 #include "ks/fc/system_reason.h"
 
 #include <QCoreApplication>
-#include <QFileDevice>
+#include <cerrno>
 
 namespace {
 
 struct Reason
 {
-    std::errc condition;
+    std::error_condition condition;
     const char* text;
 };
 
-struct SystemReason
-{
-    Q_DECLARE_TR_FUNCTIONS(SystemReason)
-};
-
 // The texts follow a colon: no capital, no full stop.
-constexpr Reason reasons[] = {
+const Reason reasons[] = {
     {std::errc::no_space_on_device, QT_TRANSLATE_NOOP("SystemReason", "no space is left on the device")},
     {std::errc::read_only_file_system, QT_TRANSLATE_NOOP("SystemReason", "the file system is read-only")},
     {std::errc::permission_denied, QT_TRANSLATE_NOOP("SystemReason", "permission denied")},
@@ -32,57 +27,25 @@ constexpr Reason reasons[] = {
     {std::errc::too_many_symbolic_link_levels, QT_TRANSLATE_NOOP("SystemReason", "the link leads in a circle")},
     {std::errc::too_many_files_open, QT_TRANSLATE_NOOP("SystemReason", "too many files are open")},
     {std::errc::device_or_resource_busy, QT_TRANSLATE_NOOP("SystemReason", "another program is using it")},
+#ifdef EDQUOT // no std::errc stands for it
+    {{EDQUOT, std::generic_category()}, QT_TRANSLATE_NOOP("SystemReason", "your disk quota is used up")},
+#endif
 };
 
-#ifdef EDQUOT
-constexpr int QuotaExceeded = EDQUOT; // no std::errc stands for it
-#else
-constexpr int QuotaExceeded = 0;
-#endif
-
-CString Translated(const char* text)
-{
-    return QCoreApplication::translate("SystemReason", text);
-}
-
-CString QuotaText()
-{
-    return SystemReason::tr("your disk quota is used up");
-}
-
-CString Sentence(CString phrase)
-{
-    if (!phrase.isEmpty())
-        phrase.front() = phrase.front().toUpper();
-    return SystemReason::tr("%1.").arg(phrase);
-}
-
 } // namespace
-
-CString KsSystemSentence(std::error_code error)
-{
-    return Sentence(KsSystemReason(error));
-}
 
 CString KsSystemReason(std::error_code error)
 {
     for (const Reason& reason : reasons)
         if (error == reason.condition)
-            return Translated(reason.text);
-    if (QuotaExceeded != 0 && error.value() == QuotaExceeded && error.category() == std::generic_category())
-        return QuotaText();
+            return QCoreApplication::translate("SystemReason", reason.text);
     return QString::fromLocal8Bit(error.message());
 }
 
-CString KsSystemReason(const QFileDevice& file)
+CString KsSystemSentence(std::error_code error)
 {
-    // Qt keeps the system's text only, not its number.
-    const CString text = file.errorString();
-    CString phrase = text;
-    for (const Reason& reason : reasons)
-        if (text == qt_error_string(int(reason.condition)))
-            phrase = Translated(reason.text);
-    if (QuotaExceeded != 0 && text == qt_error_string(QuotaExceeded))
-        phrase = QuotaText();
-    return Sentence(phrase);
+    CString phrase = KsSystemReason(error);
+    if (!phrase.isEmpty())
+        phrase.front() = phrase.front().toUpper();
+    return QCoreApplication::translate("SystemReason", "%1.").arg(phrase);
 }

@@ -6,11 +6,7 @@
 
 #include <system_error>
 
-class QFileDevice;
-
 /// The reason as a phrase, "no space is left on the device"; of rare ones the system's own text.
 KS_API CString KsSystemReason(std::error_code error);
 /// Likewise as a sentence.
 KS_API CString KsSystemSentence(std::error_code error);
-/// Why the last operation on a file failed, as a sentence.
-KS_API CString KsSystemReason(const QFileDevice& file);

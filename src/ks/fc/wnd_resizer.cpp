@@ -25,27 +25,14 @@ void Stretch(QLayout* layout, int index, bool wide, bool high)
     }
 }
 
-int IndexOf(const QLayout* layout, const QWidget* widget, const QLayout* inner)
-{
-    for (int i = 0; i < layout->count(); ++i) {
-        QLayoutItem* item = layout->itemAt(i);
-        if (inner ? item->layout() == inner : item->widget() == widget)
-            return i;
-    }
-    return -1;
-}
-
 /// The layout, however deep inside `outer`, in which the widget itself stands.
-QLayout* LayoutOf(QLayout* outer, const QWidget* widget)
+QLayout* LayoutOf(QLayout* outer, QWidget* widget)
 {
-    if (!outer || IndexOf(outer, widget, nullptr) >= 0)
+    if (!outer || outer->indexOf(widget) >= 0)
         return outer;
-    for (int i = 0; i < outer->count(); ++i) {
-        if (QLayout* inner = outer->itemAt(i)->layout()) {
-            if (QLayout* found = LayoutOf(inner, widget))
-                return found;
-        }
-    }
+    for (int i = 0; i < outer->count(); ++i)
+        if (QLayout* found = LayoutOf(outer->itemAt(i)->layout(), widget))
+            return found;
     return nullptr;
 }
 
@@ -76,13 +63,11 @@ bool CWndResizer::SetAnchor(QWidget* widget, unsigned mask) const
     widget->setSizePolicy(policy);
     layout->setAlignment(widget, AlignmentFor(mask));
 
-    Stretch(layout, IndexOf(layout, widget, nullptr), wide, high);
-    while (layout != parent->layout()) {
-        QLayout* outer = qobject_cast<QLayout*>(layout->parent());
-        if (!outer)
-            break;
-        Stretch(outer, IndexOf(outer, nullptr, layout), wide, high);
-        layout = outer;
+    Stretch(layout, layout->indexOf(widget), wide, high);
+    for (QLayout* inner = layout; inner != parent->layout();) {
+        auto* outer = static_cast<QLayout*>(inner->parent());
+        Stretch(outer, outer->indexOf(inner), wide, high);
+        inner = outer;
     }
     return true;
 }

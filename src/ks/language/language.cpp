@@ -23,16 +23,6 @@ std::map<QString, KsResourceModule>& Modules()
     return *modules;
 }
 
-std::unique_ptr<QTranslator> LoadTranslator(const QString& name, const QStringList& folders)
-{
-    auto translator = std::make_unique<QTranslator>();
-    for (const QString& folder : folders) {
-        if (translator->load(name, folder))
-            return translator;
-    }
-    return nullptr;
-}
-
 void Uninstall(KsResourceModule& module)
 {
     if (module.translator && QCoreApplication::instance())
@@ -40,29 +30,32 @@ void Uninstall(KsResourceModule& module)
     module.translator.reset();
 }
 
-bool Install(KsResourceModule& module, const QString& code, const QStringList& folders)
+bool Install(KsResourceModule& module)
 {
     Uninstall(module);
-    module.translator = LoadTranslator(module.name + u'_' + code, folders);
-    if (module.translator)
-        QCoreApplication::installTranslator(module.translator.get());
-    return module.translator != nullptr;
+    const auto& language = KsLanguage::Instance();
+    auto translator = std::make_unique<QTranslator>();
+    for (const QString& folder : {language.TranslationFolder(), QLibraryInfo::path(QLibraryInfo::TranslationsPath)}) {
+        if (!translator->load(module.name + u'_' + language.Current(), folder))
+            continue;
+        QCoreApplication::installTranslator(translator.get());
+        module.translator = std::move(translator);
+        return true;
+    }
+    return false;
 }
 
-KsResourceModule& QtModule()
+KsResourceModule& ModuleOf(const QString& name)
 {
-    static auto* module = new KsResourceModule{QStringLiteral("qtbase"), nullptr};
-    return *module;
+    return Modules().try_emplace(name, KsResourceModule{name, nullptr}).first->second;
 }
 
 } // namespace
 
 KsResourceHandle KsLangLoadResDll(const char* name, KsResourceHandle* handle, int)
 {
-    auto& language = KsLanguage::Instance();
-    const QString key = QString::fromUtf8(name);
-    KsResourceModule& module = Modules().try_emplace(key, KsResourceModule{key, nullptr}).first->second;
-    KsResourceHandle result = Install(module, language.Current(), {language.TranslationFolder()}) ? &module : nullptr;
+    KsResourceModule& module = ModuleOf(QString::fromUtf8(name));
+    KsResourceHandle result = Install(module) ? &module : nullptr;
     if (handle)
         *handle = result;
     return result;
@@ -117,8 +110,8 @@ void KsLanguage::SetCurrent(const QString& code)
     if (code == m_current || !Available().contains(code))
         return;
     m_current = code;
-    Install(QtModule(), code, {QLibraryInfo::path(QLibraryInfo::TranslationsPath), m_folder});
+    ModuleOf(QStringLiteral("qtbase")); // the buttons of message boxes
     for (auto& [name, module] : Modules())
-        Install(module, code, {m_folder});
+        Install(module);
     emit Changed();
 }

@@ -26,19 +26,16 @@ void CKsEditLong::SetValue(std::int32_t value)
 
 std::optional<std::int32_t> CKsEditLong::Value() const
 {
-    bool isInteger = false;
-    const int value = text().trimmed().toInt(&isInteger);
-    return isInteger && m_range.Contains(value) ? std::optional<std::int32_t>(value) : std::nullopt;
+    return Complaint().isEmpty() ? std::optional(text().trimmed().toInt()) : std::nullopt;
 }
 
 CString CKsEditLong::Complaint() const
 {
-    if (Value())
-        return {};
     bool isInteger = false;
-    text().trimmed().toInt(&isInteger);
-    return isInteger ? tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high)
-                     : tr("Enter an integer.");
+    const int value = text().trimmed().toInt(&isInteger);
+    return !isInteger                ? tr("Enter an integer.")
+           : m_range.Contains(value) ? CString()
+                                     : tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high);
 }
 
 std::optional<std::int32_t> CKsEditLong::CheckedValue()

@@ -36,17 +36,16 @@ void CKsEditStyle::SetEumUnitBaseGroup(UnitGroup group, int unit)
     m_unit = unit;
 }
 
-KsConversion CKsEditStyle::Conversion() const
+double CKsEditStyle::Factor() const
 {
-    return m_unit == 0 ? KsConversion{} : KsUnitConversion(m_group, KsUnits::Instance().System());
+    return m_unit == 0 ? 1 : KsUnitFactor(m_group, KsUnits::Instance().System());
 }
 
 double CKsEditStyle::UnitConvertFromBase(double value, int flag) const
 {
-    const KsConversion conversion = Conversion();
-    if (conversion.IsIdentity() || value == NotGiven || !std::isfinite(value))
+    if (value == NotGiven || !std::isfinite(value))
         return value;
-    return flag ? value / conversion.toBase : value * conversion.toBase;
+    return flag ? value / Factor() : value * Factor();
 }
 
 CString CKsEditStyle::UnitConvertFromBase_T(double value, int flag) const
@@ -58,7 +57,7 @@ CString CKsEditStyle::UnitConvertFromBase_T(double value, int flag) const
 CString CKsEditStyle::FullText(double value) const
 {
     const double full = UnitConvertFromBase(value, 1);
-    for (int digits = 14; digits <= 16 && !Conversion().IsIdentity() && std::isfinite(full); ++digits) {
+    for (int digits = 14; digits <= 16 && Factor() != 1 && std::isfinite(full); ++digits) {
         const double typed = KsFormatNumber(QStringLiteral("%.%1lg").arg(digits), full).toDouble();
         if (UnitConvertFromBase(typed, 0) == value)
             return KsShortestNumber(typed);
@@ -79,7 +78,7 @@ bool CKsEditStyle::HidesDigits(double value, const CString& shown) const
     const double read = QLocale::c().toDouble(shown, &isNumber);
     if (!isNumber || !std::isfinite(full) || read == full)
         return false;
-    return Conversion().IsIdentity() || std::fabs(read - full) > LastPlaces * std::fabs(full);
+    return Factor() == 1 || std::fabs(read - full) > LastPlaces * std::fabs(full);
 }
 
 CString CKsEditStyle::UnitSymbol() const
@@ -88,7 +87,7 @@ CString CKsEditStyle::UnitSymbol() const
     if (!row)
         return {};
     // Without a conversion the base unit is what is shown.
-    const bool base = m_unit == 0 || Conversion().IsIdentity();
+    const bool base = Factor() == 1;
     return CString::fromUtf8((base ? row->base : row->Display(KsUnits::Instance().System())).symbol);
 }
 

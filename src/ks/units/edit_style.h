@@ -1,9 +1,9 @@
 // How a number of one quantity is shown: unit group, unit of the user's unit system, format.
 #pragma once
 
+#include "base/unit_group.h"
 #include "ks/fc/types.h"
 #include "ks/ks_export.h"
-#include "base/unit_group.h"
 
 #include <QObject>
 
@@ -36,13 +36,6 @@ private:
     bool m_allDigits = false;
 };
 
-/// Between a group's base unit and a display unit: base = display * toBase. No quantity of a group has an offset.
-struct KsConversion
-{
-    double toBase = 1;
-    bool IsIdentity() const { return toBase == 1; }
-};
-
 class KS_API CKsEditStyle
 {
 public:
@@ -73,7 +66,8 @@ public:
     CString UnitSymbol() const;
 
 private:
-    KsConversion Conversion() const;
+    /// Of the display unit, in base units.
+    double Factor() const;
     UnitGroup m_group = UnitGroup::None;
     int m_unit = -1;
     CString m_format = QStringLiteral("%-lf");

@@ -1,8 +1,8 @@
 #include "ks/units/unit_groups.h"
 
 #include <QDebug>
+#include <algorithm>
 #include <array>
-#include <cmath>
 #include <memory>
 #include <udunits2.h>
 
@@ -19,28 +19,26 @@ constexpr KsUnit Degree{"degree", "°"};
 constexpr KsUnit Number{"1", ""};       // a ratio
 constexpr KsUnit AsStored{nullptr, ""}; // the file format leaves the unit open, so nothing may be converted
 
-// The metric display units are the base units: with them what is shown is what is stored.
 constexpr std::array Groups{
-    KsUnitGroupRow{UnitGroup::WaterLevel, "water level or depth", Metre, Metre, Foot},
-    KsUnitGroupRow{UnitGroup::Discharge, "discharge", CubicMetrePerSecond, CubicMetrePerSecond, CubicFootPerSecond},
-    KsUnitGroupRow{UnitGroup::Velocity, "velocity", MetrePerSecond, MetrePerSecond, FootPerSecond},
-    KsUnitGroupRow{UnitGroup::Volume, "volume", CubicMetre, CubicMetre, CubicFoot},
-    KsUnitGroupRow{UnitGroup::Slope, "slope", Number, Number, Number},
-    KsUnitGroupRow{UnitGroup::Area, "area", SquareMetre, SquareMetre, SquareFoot},
-    KsUnitGroupRow{UnitGroup::Radius, "radius", Metre, Metre, Foot},
-    KsUnitGroupRow{UnitGroup::FloodPlainResistance, "flood plain resistance", AsStored, AsStored, AsStored},
-    KsUnitGroupRow{UnitGroup::Viscosity, "kinematic viscosity", SquareMetrePerSecond, SquareMetrePerSecond,
-                   SquareFootPerSecond},
-    KsUnitGroupRow{UnitGroup::Chainage, "chainage", Metre, Metre, Foot},
-    KsUnitGroupRow{UnitGroup::Factor, "factor", Number, Number, Number},
-    KsUnitGroupRow{UnitGroup::Width, "width", Metre, Metre, Foot},
-    KsUnitGroupRow{UnitGroup::GeoAngle, "latitude or longitude", Degree, Degree, Degree},
-    KsUnitGroupRow{UnitGroup::Coordinate, "map coordinate", Metre, Metre, Foot},
-    KsUnitGroupRow{UnitGroup::Rotation, "rotation", Degree, Degree, Degree},
-    KsUnitGroupRow{UnitGroup::GridSize, "grid size", Metre, Metre, Foot},
-    KsUnitGroupRow{UnitGroup::TimeDisplacement, "time displacement", AsStored, AsStored, AsStored},
-    KsUnitGroupRow{UnitGroup::LightAttenuation, "light attenuation", PerMetre, PerMetre, PerFoot},
-    KsUnitGroupRow{UnitGroup::LeakageCoefficient, "leakage coefficient", AsStored, AsStored, AsStored},
+    KsUnitGroupRow{UnitGroup::WaterLevel, "water level or depth", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::Discharge, "discharge", CubicMetrePerSecond, CubicFootPerSecond},
+    KsUnitGroupRow{UnitGroup::Velocity, "velocity", MetrePerSecond, FootPerSecond},
+    KsUnitGroupRow{UnitGroup::Volume, "volume", CubicMetre, CubicFoot},
+    KsUnitGroupRow{UnitGroup::Slope, "slope", Number, Number},
+    KsUnitGroupRow{UnitGroup::Area, "area", SquareMetre, SquareFoot},
+    KsUnitGroupRow{UnitGroup::Radius, "radius", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::FloodPlainResistance, "flood plain resistance", AsStored, AsStored},
+    KsUnitGroupRow{UnitGroup::Viscosity, "kinematic viscosity", SquareMetrePerSecond, SquareFootPerSecond},
+    KsUnitGroupRow{UnitGroup::Chainage, "chainage", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::Factor, "factor", Number, Number},
+    KsUnitGroupRow{UnitGroup::Width, "width", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::GeoAngle, "latitude or longitude", Degree, Degree},
+    KsUnitGroupRow{UnitGroup::Coordinate, "map coordinate", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::Rotation, "rotation", Degree, Degree},
+    KsUnitGroupRow{UnitGroup::GridSize, "grid size", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::TimeDisplacement, "time displacement", AsStored, AsStored},
+    KsUnitGroupRow{UnitGroup::LightAttenuation, "light attenuation", PerMetre, PerFoot},
+    KsUnitGroupRow{UnitGroup::LeakageCoefficient, "leakage coefficient", AsStored, AsStored},
 };
 
 /// Nothing to convert: one spelling, or none at all.
@@ -51,15 +49,15 @@ bool IsSame(const KsUnit& base, const KsUnit& display)
 
 using UnitPtr = std::unique_ptr<ut_unit, decltype(&ut_free)>;
 
-double FactorToBase(ut_system* system, const KsUnitGroupRow& row, const KsUnit& display)
+double FactorToBase(ut_system* system, const KsUnitGroupRow& row)
 {
-    if (IsSame(row.base, display))
+    if (IsSame(row.base, row.usCustomary))
         return 1;
-    const UnitPtr from(ut_parse(system, display.spelling, UT_ASCII), ut_free);
+    const UnitPtr from(ut_parse(system, row.usCustomary.spelling, UT_ASCII), ut_free);
     const UnitPtr to(ut_parse(system, row.base.spelling, UT_ASCII), ut_free);
     cv_converter* converter = from && to ? ut_get_converter(from.get(), to.get()) : nullptr;
     if (!converter) {
-        qDebug("units: no conversion of %s from %s to %s", row.quantity, display.spelling, row.base.spelling);
+        qDebug("units: no conversion of %s from %s to %s", row.quantity, row.usCustomary.spelling, row.base.spelling);
         return 1;
     }
     const double factor = cv_convert_double(converter, 1);
@@ -67,29 +65,20 @@ double FactorToBase(ut_system* system, const KsUnitGroupRow& row, const KsUnit& 
     return factor;
 }
 
-struct Conversions
+/// Of the US customary units, row by row.
+std::array<double, Groups.size()> Factors()
 {
-    struct Pair
-    {
-        KsConversion metric, usCustomary;
-    };
-    std::array<Pair, Groups.size()> pairs;
-
-    Conversions()
-    {
-        ut_set_error_message_handler(ut_ignore);
-        ut_system* system = ut_read_xml(nullptr);
-        if (!system) {
-            qDebug("units: the unit definitions could not be read; values are shown as stored");
-            return;
-        }
-        for (std::size_t i = 0; i < Groups.size(); ++i) {
-            pairs[i].metric.toBase = FactorToBase(system, Groups[i], Groups[i].metric);
-            pairs[i].usCustomary.toBase = FactorToBase(system, Groups[i], Groups[i].usCustomary);
-        }
-        ut_free_system(system);
-    }
-};
+    std::array<double, Groups.size()> factors;
+    factors.fill(1);
+    ut_set_error_message_handler(ut_ignore);
+    ut_system* system = ut_read_xml(nullptr);
+    if (system)
+        std::ranges::transform(Groups, factors.begin(), [system](auto& row) { return FactorToBase(system, row); });
+    else
+        qDebug("units: the unit definitions could not be read; values are shown as stored");
+    ut_free_system(system);
+    return factors;
+}
 
 } // namespace
 
@@ -100,19 +89,15 @@ std::span<const KsUnitGroupRow> KsUnitGroups()
 
 const KsUnitGroupRow* KsFindUnitGroup(UnitGroup group)
 {
-    for (const KsUnitGroupRow& row : Groups) {
-        if (row.group == group)
-            return &row;
-    }
-    return nullptr;
+    const auto* row = std::ranges::find(Groups, group, &KsUnitGroupRow::group);
+    return row == Groups.end() ? nullptr : row;
 }
 
-KsConversion KsUnitConversion(UnitGroup group, KsUnitSystem system)
+double KsUnitFactor(UnitGroup group, KsUnitSystem system)
 {
     const KsUnitGroupRow* row = KsFindUnitGroup(group);
-    if (!row || IsSame(row->base, row->Display(system)))
-        return {};
-    static const Conversions conversions; // reading the unit definitions takes time that metric users need not spend
-    const auto& pair = conversions.pairs[std::size_t(row - Groups.data())];
-    return system == KsUnitSystem::Metric ? pair.metric : pair.usCustomary;
+    if (system == KsUnitSystem::Metric || !row || IsSame(row->base, row->usCustomary))
+        return 1;
+    static const auto factors = Factors(); // reading the unit definitions takes time that metric users need not spend
+    return factors[std::size_t(row - Groups.data())];
 }

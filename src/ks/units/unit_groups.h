@@ -4,7 +4,6 @@
 #include "ks/fc/types.h"
 #include "ks/ks_export.h"
 #include "ks/units/edit_style.h"
-#include "base/unit_group.h"
 
 #include <span>
 
@@ -19,13 +18,14 @@ struct KsUnitGroupRow
 {
     UnitGroup group;
     const char* quantity;
-    KsUnit base, metric, usCustomary;
+    KsUnit base, usCustomary; // metric values are shown as they are stored
 
-    const KsUnit& Display(KsUnitSystem system) const { return system == KsUnitSystem::Metric ? metric : usCustomary; }
+    const KsUnit& Display(KsUnitSystem system) const { return system == KsUnitSystem::Metric ? base : usCustomary; }
 };
 
 KS_API std::span<const KsUnitGroupRow> KsUnitGroups();
 /// Null for UnitGroup::None and numbers that no row has.
 KS_API const KsUnitGroupRow* KsFindUnitGroup(UnitGroup group);
-/// From a group's base unit to its display unit. Computed once; the identity when the unit system cannot be read.
-KS_API KsConversion KsUnitConversion(UnitGroup group, KsUnitSystem system);
+/// Between a group's base unit and its display unit: base = display * factor. No quantity has an offset. Computed once;
+/// 1 when the unit definitions cannot be read.
+KS_API double KsUnitFactor(UnitGroup group, KsUnitSystem system);

@@ -340,29 +340,6 @@ The editors read %2.</source>
     </message>
 </context>
 <context>
-    <name>CPluginsDialog</name>
-    <message>
-        <source>Plug-ins</source>
-        <translation>プラグイン</translation>
-    </message>
-    <message>
-        <source>Editor</source>
-        <translation>エディタ</translation>
-    </message>
-    <message>
-        <source>File</source>
-        <translation>ファイル</translation>
-    </message>
-    <message>
-        <source>State</source>
-        <translation>状態</translation>
-    </message>
-    <message>
-        <source>In use</source>
-        <translation>使用中</translation>
-    </message>
-</context>
-<context>
     <name>CProjectController</name>
     <message>
         <source>The project could not be opened.
@@ -446,6 +423,26 @@ Shell of the river model editors.</source>
 
 河川モデルエディタのシェルです。</translation>
     </message>
+    <message>
+        <source>Plug-ins</source>
+        <translation>プラグイン</translation>
+    </message>
+    <message>
+        <source>Editor</source>
+        <translation>エディタ</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>ファイル</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>状態</translation>
+    </message>
+    <message>
+        <source>In use</source>
+        <translation>使用中</translation>
+    </message>
 </context>
 <context>
     <name>PluginLoader</name>
@@ -479,6 +476,15 @@ Shell of the river model editors.</source>
     <message>
         <source>Files and projects to open.</source>
         <translation>開くファイルまたはプロジェクト</translation>
+    </message>
+</context>
+<context>
+    <name>ProjectRespell</name>
+    <message>
+        <source>The project %1 still names %2 and could not be changed: %3.
+The file is found all the same.</source>
+        <translation>プロジェクト %1 は %2 を指したままで、変更できませんでした: %3。
+ファイルはこのままでも見つかります。</translation>
     </message>
 </context>
 </TS>

@@ -298,7 +298,7 @@ TEST_F(CrossSectionTest, TheContextMenuIsAboutTheTableItWasAskedFor)
 TEST_F(CrossSectionTest, TextsFollowTheLanguage)
 {
     KsLanguage::Instance().SetTranslationFolder(QString(KVR_BUILD_DIR) + "/bin/translations");
-    CrossSectionModule::LoadResources();
+    const CKsEditorResources texts(CrossSectionEditor());
     CCrossSectionView* view = Open();
     const auto header = [&] { return view->Points()->model()->headerData(PointLevel, Qt::Horizontal).toString(); };
     const QString english = view->Sections()->accessibleName();
@@ -311,7 +311,6 @@ TEST_F(CrossSectionTest, TextsFollowTheLanguage)
     QCoreApplication::processEvents();
     EXPECT_EQ(header(), "Bed level [m]");
     EXPECT_EQ(view->Plot()->accessibleName(), "Plot of the cross section");
-    CrossSectionModule::FreeResources();
 }
 
 } // namespace
