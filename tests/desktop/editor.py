@@ -212,7 +212,9 @@ class Editor:
     def click_line(self, line, table=None, **more):
         """On its number."""
         table = table or self.table()
-        self.click(self.in_sight(table, table.line_number(line)), **more)
+        beside = self.in_sight(table, table.cell(line, 1))  # where the number is, is told as if nothing were scrolled
+        self.hands.click(table.line_number(line).middle[0], beside.middle[1], **more)
+        self.settle(0.05)
 
     def in_sight(self, table, part):
         """The part of a table, after the wheel was turned until its line is shown."""

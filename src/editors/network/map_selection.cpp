@@ -82,13 +82,9 @@ std::optional<std::size_t> CMapSelection::Next(int step) const
     return order[std::size_t((from + step + count) % count)].location;
 }
 
-QString CMapSelection::Text() const
+std::optional<CMapPlace> CMapSelection::Marked() const
 {
-    const auto text = [](const QString& branch, double chainage) {
-        return branch + u' ' + QString::number(chainage, 'f', 1);
-    };
-    if (m_selected)
-        return text(m_locations[*m_selected].branch, m_locations[*m_selected].chainage);
-    const auto& place = m_picked ? m_picked : m_shown;
-    return place ? text(place->branch, place->chainage) : QString();
+    if (const auto picked = Picked())
+        return picked;
+    return m_shown && PointOf(*m_shown) ? m_shown : std::nullopt;
 }

@@ -46,8 +46,8 @@ public:
     /// The location that follows the one selected along the branches, or precedes it; none when there are none.
     std::optional<std::size_t> Next(int step) const;
 
-    /// "BRANCH 1234.5" of the location selected, else of the place picked, else of the place shown; in metres.
-    QString Text() const;
+    /// The place picked, else the one shown, while it is in the network.
+    std::optional<CMapPlace> Marked() const;
 
 signals:
     void LocationsChanged();

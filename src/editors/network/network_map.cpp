@@ -17,9 +17,9 @@ CNetworkMap::CNetworkMap(const CNetworkDoc& document, QWidget* parent)
     setAccessibleName(tr("Map of the river network"));
     new CMapInput(*this);
     connect(&document, &CNetworkDoc::NetworkChanged, this, &CNetworkMap::NetworkChanged);
-    connect(&KsUnits::Instance(), &KsUnits::Changed, this, qOverload<>(&QWidget::update));
+    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CNetworkMap::MarksChanged);
     connect(&m_marks, &CMapSelection::LocationsChanged, this, &CNetworkMap::SceneChanged);
-    connect(&m_marks, &CMapSelection::Changed, this, qOverload<>(&QWidget::update));
+    connect(&m_marks, &CMapSelection::Changed, this, &CNetworkMap::MarksChanged);
     connect(&m_marks, &CMapSelection::PickedChanged, this, &CNetworkMap::PickedChanged);
     NetworkChanged();
 }
@@ -38,6 +38,14 @@ void CNetworkMap::SceneChanged()
 {
     m_scene.reset();
     m_buffer.Clear();
+    MarksChanged();
+}
+
+/// A screen reader says what is marked.
+void CNetworkMap::MarksChanged()
+{
+    const auto place = m_marks.Marked();
+    setAccessibleDescription(place ? PlaceText(place->branch, place->chainage) : QString());
     update();
 }
 

@@ -13,9 +13,6 @@ struct CMapWindow;
 class CNetworkMap : public QWidget
 {
     Q_OBJECT
-    // For programs that read the screen, and those that drive it.
-    Q_PROPERTY(QString marked READ MarkedText)
-    Q_PROPERTY(int placedCount READ PlacedCount)
 public:
     /// The document outlives the map.
     explicit CNetworkMap(const CNetworkDoc& document, QWidget* parent = nullptr);
@@ -31,8 +28,6 @@ public:
     void SetPicked(std::optional<Place> place) { m_marks.Pick(std::move(place)); }
     /// The location that is selected; null for none. Valid until the locations change.
     const CMapLocation* Selected() const;
-    /// See CMapSelection::Text.
-    QString MarkedText() const { return m_marks.Text(); }
     /// Marks a place and brings it into sight.
     void ShowPlace(const Place& place);
     void SetCurrentBranch(int branch);
@@ -74,6 +69,7 @@ protected:
 private:
     void NetworkChanged();
     void SceneChanged();
+    void MarksChanged();
     void ScreenChanged();
     const CMapScene& Scene() const;
     CMapWindow Window() const;
