@@ -43,7 +43,7 @@ std::vector<CMapLocation> MakeLocations(const CNetwork& network)
     for (int i = 0; i < Locations; ++i) {
         const CNetworkBranch& branch = network.branches[std::size_t(i % Branches)];
         const double part = double(i / Branches) / (double(Locations) / Branches);
-        locations.push_back({branch.Name(), part * branch.end, i % HDDataTypeCount, QStringLiteral("a.hdkv"), KsUnset});
+        locations.push_back({branch.Name(), part * branch.end, i % HDDataTypeCount, QStringLiteral("a.hdkv")});
     }
     return locations;
 }
@@ -75,9 +75,9 @@ int main(int argc, char** argv)
     document.AppendBranches(MakeBranches(), {}, {});
     CNetworkMap map(document);
     map.resize(1600, 1000);
-    map.SetLocations(MakeLocations(document.Network()));
+    map.Marks().SetLocations(MakeLocations(document.Network()));
     map.FitAll();
-    map.SetPicked(CNetworkMap::Place{QStringLiteral("RIVER 1"), 5000});
+    map.Marks().Pick(CMapPlace{QStringLiteral("RIVER 1"), 5000});
 
     bool fast = true;
     for (const double zoom : {1.0, 6.0}) {

@@ -3,11 +3,10 @@
 
 #include "editors/network/gis_errors.h"
 #include "editors/network/gis_systems.h"
+#include "editors/network/measured_line.h"
 
 #include <QCoreApplication>
 #include <QFileInfo>
-#include <algorithm>
-#include <cmath>
 #include <memory>
 
 #include <ogr_spatialref.h>
@@ -72,11 +71,12 @@ bool IsSwapped(const OGRSpatialReference* reference)
 /// Some formats take a file that names no coordinate system for one in degrees; its numbers may tell otherwise.
 bool AreBeyondDegrees(const CGisLayer& layer)
 {
-    const auto isBeyond = [](const QPointF& at) { return std::abs(at.x()) > 360 || std::abs(at.y()) > 90; };
-    return std::any_of(layer.features.begin(), layer.features.end(), [&](const CGisFeature& feature) {
-        return std::any_of(feature.parts.begin(), feature.parts.end(),
-                           [&](const CGisLine& line) { return std::any_of(line.begin(), line.end(), isBeyond); });
-    });
+    CExtent around;
+    for (const CGisFeature& feature : layer.features) {
+        for (const CGisLine& line : feature.parts)
+            around.Add(line);
+    }
+    return around.left < -360 || around.right > 360 || around.top < -90 || around.bottom > 90;
 }
 
 CGisFeature ReadFeature(OGRFeature& source, bool swapped, CGisErrors& errors)
@@ -110,41 +110,31 @@ CGisLayer ReadLayer(OGRLayer& source, CGisErrors& errors)
     return layer;
 }
 
-class CGdalLibrary : public CGisLibrary
+CGisFile ReadFile(const QString& path)
 {
-public:
-    CGisFile Read(const QString& path) const override
-    {
-        GDALAllRegister();
-        CGisErrors errors;
-        CGisFile file;
-        const std::unique_ptr<GDALDataset> data(
-            GDALDataset::Open(path.toUtf8().constData(), GDAL_OF_VECTOR | GDAL_OF_READONLY));
-        if (!data) {
-            const QString reason = errors.Take().join(u' ');
-            file.error = GisLines::tr("%1 could not be read as a GIS file: %2")
-                             .arg(QFileInfo(path).fileName(),
-                                  reason.isEmpty() ? GisLines::tr("the format is not known.") : reason);
-            return file;
-        }
-        for (OGRLayer* source : data->GetLayers())
-            file.layers.push_back(ReadLayer(*source, errors));
-        if (file.layers.empty())
-            file.error = GisLines::tr("%1 has no layers.").arg(QFileInfo(path).fileName());
+    GDALAllRegister();
+    CGisErrors errors;
+    CGisFile file;
+    const std::unique_ptr<GDALDataset> data(
+        GDALDataset::Open(path.toUtf8().constData(), GDAL_OF_VECTOR | GDAL_OF_READONLY));
+    if (!data) {
+        const QString reason = errors.Take().join(u' ');
+        file.error =
+            GisLines::tr("%1 could not be read as a GIS file: %2")
+                .arg(QFileInfo(path).fileName(), reason.isEmpty() ? GisLines::tr("the format is not known.") : reason);
         return file;
     }
-    CGisSystem FindSystem(const QString& definition) const override { return FindGisSystem(definition); }
-    CGisSystem UtmZone(const CGisLayer& layer) const override { return FindUtmZone(layer); }
-    CGisMap MapOf(const CGisLayer& layer, const CGisSystem& target) const override
-    {
-        return ProjectLayer(layer, target);
-    }
-};
+    for (OGRLayer* source : data->GetLayers())
+        file.layers.push_back(ReadLayer(*source, errors));
+    if (file.layers.empty())
+        file.error = GisLines::tr("%1 has no layers.").arg(QFileInfo(path).fileName());
+    return file;
+}
 
 } // namespace
 
 extern "C" Q_DECL_EXPORT const CGisLibrary* KvrGisLibrary()
 {
-    static const CGdalLibrary library;
+    static constexpr CGisLibrary library{&ReadFile, &FindGisSystem, &FindUtmZone, &ProjectLayer};
     return &library;
 }

@@ -62,19 +62,17 @@ struct CGisMap
 };
 
 /// What the library does.
-class CGisLibrary
+struct CGisLibrary
 {
-public:
-    virtual ~CGisLibrary() = default;
     /// Reads a file in any format, in the units of its coordinate systems.
-    virtual CGisFile Read(const QString& path) const = 0;
+    CGisFile (*Read)(const QString& path);
     /// The system of a definition, or of a code ("EPSG:25832", "25832"); not known when nobody knows it, or when places
     /// on a plane or on the globe are not what it is about.
-    virtual CGisSystem FindSystem(const QString& definition) const = 0;
+    CGisSystem (*FindSystem)(const QString& definition);
     /// The UTM zone in the middle of a layer; not known when the layer's system is not.
-    virtual CGisSystem UtmZone(const CGisLayer& layer) const = 0;
+    CGisSystem (*UtmZone)(const CGisLayer& layer);
     /// `target` may be the layer's own system, or one that is not known: then the numbers stay as they are.
-    virtual CGisMap MapOf(const CGisLayer& layer, const CGisSystem& target) const = 0;
+    CGisMap (*MapOf)(const CGisLayer& layer, const CGisSystem& target);
 };
 
 /// Name of the library, beside the program, and of the function that gives what it does.

@@ -1,6 +1,7 @@
 #include "editors/network/gis_systems.h"
 
 #include "editors/network/gis_errors.h"
+#include "editors/network/measured_line.h"
 
 #include <QCoreApplication>
 #include <algorithm>
@@ -67,9 +68,7 @@ bool Transform(const Transformation& transformation, CGisLine& line)
         line.empty() || transformation->Transform(int(line.size()), x.data(), y.data(), nullptr, good.data());
     for (std::size_t i = 0; i < line.size(); ++i)
         line[i] = {x[i], y[i]};
-    return done && std::all_of(good.begin(), good.end(), [](int each) { return each != 0; }) &&
-           std::all_of(line.begin(), line.end(),
-                       [](const QPointF& at) { return std::isfinite(at.x()) && std::isfinite(at.y()); });
+    return done && std::ranges::all_of(good, std::identity()) && std::ranges::all_of(line, &IsFinite);
 }
 
 /// Compares lengths on the plane with those on the ellipsoid. C. Karney, Algorithms for geodesics, 2013.
@@ -87,12 +86,11 @@ public:
         const double flattening = globe->GetInvFlattening() > 0 ? 1 / globe->GetInvFlattening() : 0;
         geod_init(&m_ellipsoid, globe->GetSemiMajor(), flattening);
     }
-    bool IsReady() const { return m_toGlobe != nullptr; }
 
     /// `line` in the system's units, `planar` its length in metres.
-    void Add(CGisLine line, double planar)
+    void Add(CGisLine line, double planar, CGisMap& map)
     {
-        if (!Transform(m_toGlobe, line))
+        if (!m_toGlobe || !Transform(m_toGlobe, line))
             return;
         double ground = 0;
         for (std::size_t i = 1; i < line.size(); ++i) {
@@ -105,32 +103,17 @@ public:
             return;
         m_ground += ground;
         m_planar += planar;
-        m_least = std::min(m_least, planar / ground);
-        m_largest = std::max(m_largest, planar / ground);
-    }
-    void Tell(CGisMap& map) const
-    {
-        if (!(m_ground > 0))
-            return;
         map.scale = m_planar / m_ground;
-        map.least = m_least;
-        map.largest = m_largest;
+        map.least = std::fmin(map.least, planar / ground); // of a number and none the number
+        map.largest = std::fmax(map.largest, planar / ground);
     }
 
 private:
     Transformation m_toGlobe;
     geod_geodesic m_ellipsoid{};
     double m_degrees = 1; // a unit of the globe's coordinates
-    double m_ground = 0, m_planar = 0, m_least = HUGE_VAL, m_largest = 0;
+    double m_ground = 0, m_planar = 0;
 };
-
-double LengthOf(const CGisLine& line)
-{
-    double length = 0;
-    for (std::size_t i = 1; i < line.size(); ++i)
-        length += std::hypot(line[i].x() - line[i - 1].x(), line[i].y() - line[i - 1].y());
-    return length;
-}
 
 /// The layer's parts as they stand, without numbers that are none.
 std::vector<std::vector<CGisLine>> PartsOf(const CGisLayer& layer)
@@ -140,7 +123,7 @@ std::vector<std::vector<CGisLine>> PartsOf(const CGisLayer& layer)
     for (const CGisFeature& feature : layer.features) {
         parts.push_back(feature.parts);
         for (CGisLine& line : parts.back())
-            std::erase_if(line, [](const QPointF& at) { return !std::isfinite(at.x()) || !std::isfinite(at.y()); });
+            std::erase_if(line, std::not_fn(&IsFinite));
     }
     return parts;
 }
@@ -178,24 +161,19 @@ CGisSystem FindUtmZone(const CGisLayer& layer)
     const Transformation toGlobe = reference && globe ? Between(*reference, *globe) : nullptr;
     if (!toGlobe)
         return {};
-    double west = HUGE_VAL, east = -HUGE_VAL, south = HUGE_VAL, north = -HUGE_VAL;
+    CExtent around;
     for (auto& parts : PartsOf(layer)) {
         for (CGisLine& line : parts) {
-            if (!Transform(toGlobe, line))
-                continue;
-            for (const QPointF& at : line) {
-                west = std::min(west, at.x());
-                east = std::max(east, at.x());
-                south = std::min(south, at.y());
-                north = std::max(north, at.y());
-            }
+            if (Transform(toGlobe, line))
+                around.Add(line);
         }
     }
-    if (west > east)
+    if (around.left > around.right)
         return {};
-    const double zone = std::clamp(std::floor((std::midpoint(west, east) + 180) / zoneWidth) + 1, 1.0, zones);
+    const QPointF middle = around.Box().center();
+    const double zone = std::clamp(std::floor((middle.x() + 180) / zoneWidth) + 1, 1.0, zones);
     constexpr int northern = 32600, southern = 32700; // EPSG codes of WGS 84 / UTM zones
-    return FindGisSystem(QString::number((std::midpoint(south, north) < 0 ? southern : northern) + int(zone)));
+    return FindGisSystem(QString::number((middle.y() < 0 ? southern : northern) + int(zone)));
 }
 
 CGisMap ProjectLayer(const CGisLayer& layer, const CGisSystem& target)
@@ -226,12 +204,10 @@ CGisMap ProjectLayer(const CGisLayer& layer, const CGisSystem& target)
         if (transformation)
             std::erase_if(parts, [&](CGisLine& line) { return !Transform(transformation, line); });
         for (CGisLine& line : parts) {
-            if (meter.IsReady())
-                meter.Add(line, toMetres * LengthOf(line));
+            meter.Add(line, toMetres * LengthOf(line), map);
             for (QPointF& at : line)
                 at *= toMetres;
         }
     }
-    meter.Tell(map);
     return map;
 }

@@ -2,6 +2,7 @@
 
 #include "editors/common/quantity.h"
 #include "editors/network/join_lines.h"
+#include "editors/network/measured_line.h"
 #include "ks/fc/branch_name.h"
 
 #include <QCoreApplication>
@@ -13,15 +14,13 @@
 
 int CGisLayer::Lines() const
 {
-    return int(std::count_if(features.begin(), features.end(),
-                             [](const CGisFeature& feature) { return !feature.parts.empty(); }));
+    return int(std::ranges::count_if(features, [](const CGisFeature& feature) { return !feature.parts.empty(); }));
 }
 
 bool CGisLayer::IsComplete() const
 {
     return errors.isEmpty() && announced <= qint64(features.size()) &&
-           std::all_of(features.begin(), features.end(),
-                       [](const CGisFeature& feature) { return feature.error.isEmpty(); });
+           std::ranges::all_of(features, [](const CGisFeature& feature) { return feature.error.isEmpty(); });
 }
 
 namespace {
@@ -31,29 +30,12 @@ struct ImportBranches
     Q_DECLARE_TR_FUNCTIONS(ImportBranches)
 };
 
-// How such fields are called, in the order of preference.
-const QStringList& NameFields()
+/// `names` in the order of preference.
+int FindField(const CGisLayer& layer, std::initializer_list<const char*> names)
 {
-    static const QStringList names{"branch",     "branchname", "branch_name", "river", "rivername",
-                                   "river_name", "name",       "reach",       "id"};
-    return names;
-}
-const QStringList& StartFields()
-{
-    static const QStringList names{"start", "chainage_start", "start_chainage", "startchainage", "ch_start", "from"};
-    return names;
-}
-const QStringList& EndFields()
-{
-    static const QStringList names{"end", "chainage_end", "end_chainage", "endchainage", "ch_end", "to"};
-    return names;
-}
-
-int FindField(const CGisLayer& layer, const QStringList& names)
-{
-    for (const QString& name : names) {
+    for (const char* name : names) {
         for (int i = 0; i < layer.fields.size(); ++i) {
-            if (layer.fields[i].compare(name, Qt::CaseInsensitive) == 0)
+            if (layer.fields[i].compare(QLatin1String(name), Qt::CaseInsensitive) == 0)
                 return i;
         }
     }
@@ -63,13 +45,6 @@ int FindField(const CGisLayer& layer, const QStringList& names)
 QString Metres(double value)
 {
     return WithSymbol(UnitGroup::Chainage, value);
-}
-
-double LengthOf(const CGisLine& line)
-{
-    CNetworkBranch branch;
-    branch.line = line;
-    return branch.Length();
 }
 
 /// Goes through the lines of a layer.
@@ -105,8 +80,8 @@ public:
     CImportPlan plan;
 
 private:
-    void LeaveOut(const QString& why) { plan.leftOut.push_back({m_who, why}); }
-    void Change(const QString& what) { plan.changed.push_back({m_who, what}); }
+    void LeaveOut(const QString& why) { plan.leftOut << m_who + QStringLiteral(": ") + why; }
+    void Change(const QString& what) { plan.changed << m_who + QStringLiteral(": ") + what; }
 
     /// Why nothing can be made of a feature, whatever its parts are like.
     QString WhyNot(const CGisFeature& feature) const
@@ -125,9 +100,7 @@ private:
     {
         std::ptrdiff_t without = 0;
         for (const CGisLine& line : feature.parts)
-            without += std::count_if(line.begin(), line.end(), [](const QPointF& at) {
-                return !std::isfinite(at.x()) || !std::isfinite(at.y());
-            });
+            without += std::ranges::count_if(line, std::not_fn(&IsFinite));
         if (without > 0)
             Change(ImportBranches::tr("vertices without coordinates, left out: %1.").arg(without));
     }
@@ -138,8 +111,7 @@ private:
         const std::size_t all = feature.parts.size(), outside = all - parts.size();
         for (CGisLine& line : parts)
             line.erase(std::unique(line.begin(), line.end()), line.end());
-        const bool someVertex =
-            std::any_of(parts.begin(), parts.end(), [](const CGisLine& line) { return !line.empty(); });
+        const bool someVertex = std::ranges::any_of(parts, [](const CGisLine& line) { return !line.empty(); });
         const std::size_t flat = std::erase_if(parts, [](const CGisLine& line) { return line.size() < 2; });
         if (parts.empty()) {
             LeaveOut(outside > 0  ? ImportBranches::tr("lies outside the area of the coordinate system.")
@@ -158,9 +130,9 @@ private:
 
     void TellJoined(const CJoinedLine& line)
     {
-        if (line.parts.size() < 2)
+        if (line.parts < 2)
             return;
-        QString text = ImportBranches::tr("its %1 parts meet and become one branch.").arg(line.parts.size());
+        QString text = ImportBranches::tr("its %1 parts meet and become one branch.").arg(line.parts);
         if (line.turned > 0)
             text += u' ' + ImportBranches::tr("Parts that ran the other way, turned: %1.").arg(line.turned);
         Change(text);
@@ -301,8 +273,11 @@ QString GeometryText(const QString& geometry)
 
 CImportFields ProposeFields(const CGisLayer& layer)
 {
-    CImportFields fields{FindField(layer, NameFields()), FindField(layer, StartFields()),
-                         FindField(layer, EndFields())};
+    CImportFields fields{
+        FindField(layer,
+                  {"branch", "branchname", "branch_name", "river", "rivername", "river_name", "name", "reach", "id"}),
+        FindField(layer, {"start", "chainage_start", "start_chainage", "startchainage", "ch_start", "from"}),
+        FindField(layer, {"end", "chainage_end", "end_chainage", "endchainage", "ch_end", "to"})};
     if (fields.start < 0 || fields.end < 0)
         fields.start = fields.end = -1;
     return fields;

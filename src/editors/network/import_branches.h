@@ -26,17 +26,10 @@ struct CImportOptions
     bool unnamed = true; // lines without a name are taken, and numbered
 };
 
-/// What happened to one line of the file, for the user.
-struct CImportNote
-{
-    QString line; // its name and its number in the file
-    QString what;
-};
-
 struct CImportPlan
 {
     std::vector<CNetworkBranch> branches;
-    std::vector<CImportNote> leftOut, changed;
+    QStringList leftOut, changed; // for the user: the line with its number in the file, and what happened to it
 };
 
 /// Whether this build can import.

@@ -1,11 +1,9 @@
 #include "editors/network/import_dialog.h"
 
 #include <QCheckBox>
-#include <QClipboard>
 #include <QComboBox>
 #include <QDialogButtonBox>
 #include <QFormLayout>
-#include <QGuiApplication>
 #include <QHBoxLayout>
 #include <QHeaderView>
 #include <QLabel>
@@ -17,16 +15,6 @@
 #include <cmath>
 
 namespace {
-
-enum LayerColumn
-{
-    LayerName,
-    LayerGeometry,
-    LayerLines,
-    LayerSystem,
-    LayerRemark,
-    LayerColumns
-};
 
 template <typename Box>
 Box* Named(Box* widget, const char* name)
@@ -72,8 +60,7 @@ CImportDialog::CImportDialog(const QString& name, const CGisFile& file, const CG
       m_unnamed(Named(new QCheckBox(tr("Take lines &without a name, too")), "unnamed")),
       m_damaged(Named(new QCheckBox(tr("&Take what could be read of the damaged file")), "damaged")),
       m_declare(Named(new QCheckBox(tr("The branches of the network are in this coordinate s&ystem, too")), "declare")),
-      m_warning(Named(new QLabel, "warning")),
-      m_report(MakeReportField())
+      m_warning(Named(new QLabel, "warning"))
 {
     setObjectName(QStringLiteral("importDialog"));
     setWindowTitle(tr("Import Branches from %1").arg(name));
@@ -89,10 +76,10 @@ CImportDialog::CImportDialog(const QString& name, const CGisFile& file, const CG
 
 void CImportDialog::MakeLayers(const CGisFile& file)
 {
-    m_layers->setColumnCount(LayerColumns);
+    const QStringList headers{tr("Layer"), tr("Geometry"), tr("Lines"), tr("Coordinate system"), tr("Remark")};
+    m_layers->setColumnCount(int(headers.size()));
     m_layers->setRowCount(int(file.layers.size()));
-    m_layers->setHorizontalHeaderLabels(
-        {tr("Layer"), tr("Geometry"), tr("Lines"), tr("Coordinate system"), tr("Remark")});
+    m_layers->setHorizontalHeaderLabels(headers);
     m_layers->verticalHeader()->hide();
     m_layers->horizontalHeader()->setStretchLastSection(true);
     m_layers->horizontalHeader()->setHighlightSections(false);
@@ -106,7 +93,7 @@ void CImportDialog::MakeLayers(const CGisFile& file)
         const CGisLayer& layer = file.layers[std::size_t(row)];
         const QString texts[] = {layer.name, GeometriesOf(layer), QString::number(layer.Lines()),
                                  layer.system.IsKnown() ? layer.system.name : tr("none named"), LayerRemarkText(layer)};
-        for (int column = 0; column < LayerColumns; ++column) {
+        for (int column = 0; column < headers.size(); ++column) {
             auto* item = new QTableWidgetItem(texts[column]);
             item->setFlags(layer.Lines() > 0 ? Qt::ItemIsEnabled | Qt::ItemIsSelectable : Qt::NoItemFlags);
             m_layers->setItem(row, column, item);
@@ -160,16 +147,14 @@ void CImportDialog::MakeButtons(QFormLayout* form)
     bold.setBold(true);
     m_warning->setFont(bold);
     form->addRow(m_warning);
+    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
+    m_ok = buttons->button(QDialogButtonBox::Ok);
+    m_ok->setText(tr("&Import"));
+    m_report = MakeReportField(*buttons);
     auto* report = new QLabel(tr("What the import &gives:"));
     report->setBuddy(m_report);
     form->addRow(report);
     form->addRow(m_report);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
-    m_ok = buttons->button(QDialogButtonBox::Ok);
-    m_ok->setText(tr("&Import"));
-    QPushButton* copy = buttons->addButton(tr("C&opy"), QDialogButtonBox::ActionRole);
-    connect(copy, &QPushButton::clicked, this,
-            [this] { QGuiApplication::clipboard()->setText(m_report->toPlainText()); });
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     form->addRow(buttons);
@@ -178,11 +163,8 @@ void CImportDialog::MakeButtons(QFormLayout* form)
 /// The first one that has lines; the first of all when none has.
 int CImportDialog::FirstLayer() const
 {
-    for (std::size_t i = 0; i < m_file.layers.size(); ++i) {
-        if (m_file.layers[i].Lines() > 0)
-            return int(i);
-    }
-    return 0;
+    const auto found = std::ranges::find_if(m_file.layers, &CGisLayer::Lines);
+    return found == m_file.layers.end() ? 0 : int(found - m_file.layers.begin());
 }
 
 // ---- choices -----------------------------------------------------------------------------------
@@ -220,58 +202,49 @@ void CImportDialog::OfferFields()
 /// Behind those offered, a system may be named by its code.
 void CImportDialog::OfferTargets()
 {
-    const std::vector<Target> targets = Targets();
+    const CGisLayer& layer = *m_import.layer;
+    m_targets.clear();
     m_target->clear();
-    for (const Target& each : targets)
-        m_target->addItem(each.text, each.system.definition);
-    if (!m_own.IsKnown() && m_import.layer->system.IsKnown())
-        m_target->addItem(tr("another one, by its EPSG code:"), QVariant());
-    m_target->setCurrentIndex(ProposedTarget(targets));
+    const auto offer = [this](const QString& text, const CGisSystem& system) {
+        m_target->addItem(text);
+        m_targets.push_back(system);
+    };
+    // Branches that are to lie in one network lie in its coordinate system.
+    if (!layer.system.IsKnown() || m_own.IsKnown()) {
+        offer(layer.system.IsKnown() ? tr("the network's: %1").arg(m_own.name)
+              : m_own.IsKnown()      ? tr("taken as the network's: %1").arg(m_own.name)
+                                     : tr("as in the file, taken as meters"),
+              layer.system.IsKnown() ? m_own : CGisSystem());
+    } else {
+        if (!layer.system.degrees)
+            offer(tr("as in the file: %1").arg(layer.system.name), layer.system);
+        const CGisSystem zone = m_library.UtmZone(layer);
+        if (zone.IsKnown() && zone.definition != layer.system.definition)
+            offer(tr("projected to %1").arg(zone.name), zone);
+        m_target->addItem(tr("another one, by its EPSG code:"));
+    }
+    m_target->setCurrentIndex(ProposedTarget());
     m_target->setEnabled(m_target->count() > 1);
 }
 
-/// Branches that are to lie in one network lie in its coordinate system.
-std::vector<CImportDialog::Target> CImportDialog::Targets() const
-{
-    const CGisLayer& layer = *m_import.layer;
-    if (!layer.system.IsKnown())
-        return {
-            {m_own.IsKnown() ? tr("taken as the network's: %1").arg(m_own.name) : tr("as in the file, taken as meters"),
-             {}}};
-    if (m_own.IsKnown())
-        return {{tr("the network's: %1").arg(m_own.name), m_own}};
-    std::vector<Target> targets;
-    if (!layer.system.degrees)
-        targets.push_back({tr("as in the file: %1").arg(layer.system.name), layer.system});
-    const CGisSystem zone = m_library.UtmZone(layer);
-    if (zone.IsKnown() && zone.definition != layer.system.definition)
-        targets.push_back({tr("projected to %1").arg(zone.name), zone});
-    return targets;
-}
-
 /// The file's own system, unless its lengths are wrong and there is nothing that the lines have to fit.
-int CImportDialog::ProposedTarget(const std::vector<Target>& targets) const
+int CImportDialog::ProposedTarget() const
 {
     constexpr double tolerable = 0.01;
-    if (targets.size() < 2 || !m_network.branches.empty())
+    if (m_targets.size() < 2 || !m_network.branches.empty())
         return 0;
-    const CGisMap map = m_library.MapOf(*m_import.layer, targets[0].system);
+    const CGisMap map = m_library.MapOf(*m_import.layer, m_targets[0]);
     return std::abs(map.scale - 1) > tolerable ? 1 : 0;
-}
-
-CGisSystem CImportDialog::ChosenTarget() const
-{
-    const QVariant chosen = m_target->currentData();
-    return m_library.FindSystem(chosen.isValid() ? chosen.toString() : m_code->text());
 }
 
 void CImportDialog::TargetChanged()
 {
     if (m_filling)
         return;
-    const bool byCode = !m_target->currentData().isValid();
+    const auto chosen = std::size_t(m_target->currentIndex());
+    const bool byCode = chosen >= m_targets.size();
     m_code->setVisible(byCode && m_import.layer);
-    m_import.target = ChosenTarget();
+    m_import.target = byCode ? m_library.FindSystem(m_code->text()) : m_targets[chosen];
     m_import.map = {};
     if (m_import.layer && byCode && !m_import.target.IsKnown())
         m_import.map.error = tr("\"%1\" is no EPSG code of a coordinate system. Expected a number, for example 25832.")

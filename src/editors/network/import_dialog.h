@@ -3,6 +3,8 @@
 
 #include "editors/network/import_report.h"
 
+#include <QDialog>
+
 class QCheckBox;
 class QComboBox;
 class QFormLayout;
@@ -26,11 +28,6 @@ public:
     QString NetworkSystem() const;
 
 private:
-    struct Target
-    {
-        QString text;
-        CGisSystem system;
-    };
     void MakeLayers(const CGisFile& file);
     void MakeFields(QFormLayout* form);
     void MakeButtons(QFormLayout* form);
@@ -38,10 +35,8 @@ private:
     void LayerChanged();
     void OfferFields();
     void OfferTargets();
-    std::vector<Target> Targets() const;
-    int ProposedTarget(const std::vector<Target>& targets) const;
+    int ProposedTarget() const;
     void TargetChanged();
-    CGisSystem ChosenTarget() const;
     void Plan();
     void ShowPlan();
     QString WhyNot() const;
@@ -49,7 +44,8 @@ private:
     const CGisFile& m_file;
     const CGisLibrary& m_library;
     const CNetwork& m_network;
-    CGisSystem m_own; // the network's
+    CGisSystem m_own;                  // the network's
+    std::vector<CGisSystem> m_targets; // offered; behind them one by its code
     CImport m_import;
     bool m_filling = false;
 
@@ -58,6 +54,6 @@ private:
     QLineEdit* m_code;
     QCheckBox *m_unnamed, *m_damaged, *m_declare;
     QLabel* m_warning;
-    QPlainTextEdit* m_report;
+    QPlainTextEdit* m_report = nullptr;
     QPushButton* m_ok = nullptr;
 };

@@ -4,6 +4,7 @@
 
 #include <QClipboard>
 #include <QCoreApplication>
+#include <QDialog>
 #include <QDialogButtonBox>
 #include <QGuiApplication>
 #include <QPlainTextEdit>
@@ -101,13 +102,13 @@ void AddDistance(const CImport& import, const CNetwork& network, std::vector<CIm
              true});
 }
 
-void AddNotes(const QString& title, const std::vector<CImportNote>& notes, QStringList& lines)
+void AddList(const QString& title, const QStringList& entries, QStringList& lines)
 {
-    if (notes.empty())
+    if (entries.isEmpty())
         return;
-    lines << QString() << QStringLiteral("%1 (%2)").arg(title).arg(notes.size());
-    for (const CImportNote& note : notes)
-        lines << QStringLiteral("  %1: %2").arg(note.line, note.what);
+    lines << QString() << QStringLiteral("%1 (%2)").arg(title).arg(entries.size());
+    for (const QString& entry : entries)
+        lines << QStringLiteral("  ") + entry;
 }
 
 } // namespace
@@ -127,24 +128,23 @@ QString ImportReport(const CImport& import, const CNetwork& network)
 {
     const CImportPlan& plan = import.plan;
     double whole = 0;
-    for (const CNetworkBranch& branch : plan.branches)
+    QStringList branches;
+    for (const CNetworkBranch& branch : plan.branches) {
         whole += branch.Length();
+        branches << Text::tr("%1: %2 long, chainages from %3 to %4")
+                        .arg(branch.Name(), Length(branch.Length()), Length(branch.start), Length(branch.end));
+    }
     QStringList lines{Text::tr("%1, layer \"%2\"").arg(import.file, import.layer->name),
                       Text::tr("Branches: %1, in all %2").arg(plan.branches.size()).arg(Length(whole))};
     for (const CImportRemark& remark : ImportRemarks(import, network))
         lines << remark.text;
-    AddNotes(Text::tr("Left out"), plan.leftOut, lines);
-    AddNotes(Text::tr("Changed"), plan.changed, lines);
-    if (!plan.branches.empty())
-        lines << QString() << QStringLiteral("%1 (%2)").arg(Text::tr("Branches")).arg(plan.branches.size());
-    for (const CNetworkBranch& branch : plan.branches)
-        lines << QStringLiteral("  ") +
-                     Text::tr("%1: %2 long, chainages from %3 to %4")
-                         .arg(branch.Name(), Length(branch.Length()), Length(branch.start), Length(branch.end));
+    AddList(Text::tr("Left out"), plan.leftOut, lines);
+    AddList(Text::tr("Changed"), plan.changed, lines);
+    AddList(Text::tr("Branches"), branches, lines);
     return lines.join(u'\n') + u'\n';
 }
 
-QPlainTextEdit* MakeReportField()
+QPlainTextEdit* MakeReportField(QDialogButtonBox& buttons)
 {
     auto* field = new QPlainTextEdit;
     field->setObjectName(QStringLiteral("report"));
@@ -152,24 +152,27 @@ QPlainTextEdit* MakeReportField()
     field->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
     field->setTabChangesFocus(true);
     field->setAccessibleName(Text::tr("Report of the import"));
+    const QPushButton* copy = buttons.addButton(Text::tr("C&opy"), QDialogButtonBox::ActionRole);
+    QObject::connect(copy, &QPushButton::clicked, field,
+                     [field] { QGuiApplication::clipboard()->setText(field->toPlainText()); });
     return field;
 }
 
-CImportReportDialog::CImportReportDialog(const QString& report, QWidget* parent) : QDialog(parent)
+void ShowImportReport(const QString& report, QWidget* parent)
 {
-    setObjectName(QStringLiteral("importReport"));
-    setWindowTitle(tr("Imported Branches"));
-    auto* layout = new QVBoxLayout(this);
-    QPlainTextEdit* field = MakeReportField();
-    field->setPlainText(report);
-    layout->addWidget(field);
+    QDialog dialog(parent);
+    dialog.setObjectName(QStringLiteral("importReport"));
+    dialog.setWindowTitle(Text::tr("Imported Branches"));
     auto* buttons = new QDialogButtonBox;
-    QPushButton* copy = buttons->addButton(tr("C&opy"), QDialogButtonBox::ActionRole);
-    QPushButton* close = buttons->addButton(tr("&Close"), QDialogButtonBox::AcceptRole);
-    connect(copy, &QPushButton::clicked, this, [report] { QGuiApplication::clipboard()->setText(report); });
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
+    QPlainTextEdit* field = MakeReportField(*buttons);
+    field->setPlainText(report);
+    QPushButton* close = buttons->addButton(Text::tr("&Close"), QDialogButtonBox::AcceptRole);
+    QObject::connect(buttons, &QDialogButtonBox::accepted, &dialog, &QDialog::accept);
+    auto* layout = new QVBoxLayout(&dialog);
+    layout->addWidget(field);
     layout->addWidget(buttons);
     close->setDefault(true);
     close->setFocus();
-    resize(680, 420);
+    dialog.resize(680, 420);
+    dialog.exec();
 }

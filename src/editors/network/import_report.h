@@ -3,9 +3,9 @@
 
 #include "editors/network/import_branches.h"
 
-#include <QDialog>
-
+class QDialogButtonBox;
 class QPlainTextEdit;
+class QWidget;
 
 /// Everything an import is about.
 struct CImport
@@ -29,13 +29,7 @@ std::vector<CImportRemark> ImportRemarks(const CImport& import, const CNetwork& 
 /// Remarks, lines left out, lines changed and branches, all by name.
 QString ImportReport(const CImport& import, const CNetwork& network);
 
-/// A text to read and to copy.
-QPlainTextEdit* MakeReportField();
-
+/// A text to read, and to copy with a button more.
+QPlainTextEdit* MakeReportField(QDialogButtonBox& buttons);
 /// Shows what was imported.
-class CImportReportDialog : public QDialog
-{
-    Q_OBJECT
-public:
-    CImportReportDialog(const QString& report, QWidget* parent);
-};
+void ShowImportReport(const QString& report, QWidget* parent);

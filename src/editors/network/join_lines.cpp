@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <cmath>
 #include <map>
-#include <optional>
 
 namespace {
 
@@ -11,79 +10,66 @@ struct End
 {
     std::size_t part;
     bool last; // vertex of it, otherwise the first
-    bool operator==(const End&) const = default;
+    auto operator<=>(const End&) const = default;
 };
 
-/// Ends by where they are, to a millimetre.
-class CEnds
-{
-public:
-    explicit CEnds(const std::vector<CGisLine>& parts)
-    {
-        for (std::size_t i = 0; i < parts.size(); ++i) {
-            if (parts[i].empty())
-                continue;
-            m_ends[Key(parts[i].front())].push_back({i, false});
-            m_ends[Key(parts[i].back())].push_back({i, true});
-        }
-        for (const auto& [key, ends] : m_ends) {
-            if (ends.size() == 2 && ends[0].part != ends[1].part) { // neither a fork nor a ring
-                m_next.emplace(std::pair(ends[0].part, ends[0].last), ends[1]);
-                m_next.emplace(std::pair(ends[1].part, ends[1].last), ends[0]);
-            }
-        }
-    }
-    /// The end that meets this one.
-    std::optional<End> Meets(const End& end) const
-    {
-        const auto found = m_next.find({end.part, end.last});
-        return found == m_next.end() ? std::nullopt : std::optional(found->second);
-    }
+/// For an end the one that it meets.
+using Meetings = std::map<End, End>;
 
-private:
-    using Place = std::pair<double, double>;
-    static Place Key(const QPointF& at) { return {std::round(at.x() * 1000), std::round(at.y() * 1000)}; }
-    std::map<Place, std::vector<End>> m_ends;
-    std::map<std::pair<std::size_t, bool>, End> m_next;
-};
-
-/// The parts that follow an end one after the other, each by the end where it is entered.
-std::vector<End> Follow(const CEnds& ends, End end, std::vector<bool>& used)
+/// Ends meet where they are at the same place, to a millimetre: neither at a fork nor as those of a ring.
+Meetings FindMeetings(const std::vector<CGisLine>& parts)
 {
-    std::vector<End> chain;
-    for (auto next = ends.Meets(end); next && !used[next->part]; next = ends.Meets(end)) {
-        used[next->part] = true;
-        chain.push_back(*next);
-        end = {next->part, !next->last};
+    const auto key = [](const QPointF& at) { return std::pair(std::round(at.x() * 1000), std::round(at.y() * 1000)); };
+    std::map<std::pair<double, double>, std::vector<End>> places;
+    for (std::size_t i = 0; i < parts.size(); ++i) {
+        if (parts[i].empty())
+            continue;
+        places[key(parts[i].front())].push_back({i, false});
+        places[key(parts[i].back())].push_back({i, true});
     }
-    return chain;
+    Meetings meetings;
+    for (const auto& [place, ends] : places) {
+        if (ends.size() == 2 && ends[0].part != ends[1].part) {
+            meetings.emplace(ends[0], ends[1]);
+            meetings.emplace(ends[1], ends[0]);
+        }
+    }
+    return meetings;
 }
 
-void Append(const CGisLine& part, bool turned, CJoinedLine& to)
+/// The parts that follow an end one after the other, each by the end where it is entered.
+std::vector<End> Follow(const Meetings& meetings, End end, std::vector<bool>& used)
 {
-    CGisLine line = part;
-    if (turned)
-        std::reverse(line.begin(), line.end());
-    to.line.insert(to.line.end(), line.begin() + (to.line.empty() ? 0 : 1), line.end());
-    to.turned += turned;
+    std::vector<End> chain;
+    for (auto next = meetings.find(end); next != meetings.end() && !used[next->second.part];
+         next = meetings.find(end)) {
+        end = chain.emplace_back(next->second);
+        used[end.part] = true;
+        end.last = !end.last;
+    }
+    return chain;
 }
 
 } // namespace
 
 std::vector<CJoinedLine> JoinLines(const std::vector<CGisLine>& parts)
 {
-    const CEnds ends(parts);
+    const Meetings meetings = FindMeetings(parts);
     std::vector<bool> used(parts.size());
     std::vector<CJoinedLine> lines;
     for (std::size_t i = 0; i < parts.size(); ++i) {
         if (used[i] || parts[i].empty())
             continue;
         used[i] = true;
-        const std::vector<End> after = Follow(ends, {i, true}, used), before = Follow(ends, {i, false}, used);
+        const std::vector<End> after = Follow(meetings, {i, true}, used), before = Follow(meetings, {i, false}, used);
         CJoinedLine& joined = lines.emplace_back();
         const auto add = [&](std::size_t part, bool turned) {
-            joined.parts.push_back(part);
-            Append(parts[part], turned, joined);
+            CGisLine line = parts[part];
+            if (turned)
+                std::ranges::reverse(line);
+            joined.line.insert(joined.line.end(), line.begin() + (joined.line.empty() ? 0 : 1), line.end());
+            joined.turned += turned;
+            ++joined.parts;
         };
         for (auto each = before.rbegin(); each != before.rend(); ++each)
             add(each->part, !each->last); // entered at its last vertex it runs towards this one

@@ -6,8 +6,8 @@
 struct CJoinedLine
 {
     CGisLine line;
-    std::vector<std::size_t> parts; // that it is made of, in their order along it
-    int turned = 0;                 // how many of them run the other way
+    int parts = 0;  // that it is made of
+    int turned = 0; // how many of them run the other way
 };
 
 /// Parts meet where two of their ends, and no third one, are at the same place. A joined line runs as its first part in

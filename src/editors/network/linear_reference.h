@@ -6,9 +6,9 @@
 // Collision Detection, 2005, section 5.1.2).
 #pragma once
 
+#include "editors/network/measured_line.h"
 #include "editors/network/network.h"
 
-#include <cmath>
 #include <optional>
 
 struct CNetworkPlace
@@ -30,27 +30,13 @@ public:
     std::optional<CNetworkPlace> Nearest(const QPointF& point, double tolerance = HUGE_VAL) const;
     /// Where a chainage is; none outside the branch or for a branch without a line.
     std::optional<QPointF> PointAt(int branch, double chainage) const;
-    /// Metres from the first vertex along the line, under the same conditions.
-    std::optional<double> DistanceAt(int branch, double chainage) const;
 
 private:
-    struct Chunk // some segments that follow one another
+    struct Line : CMeasuredLine
     {
-        std::size_t first, last; // vertices, both included
+        explicit Line(const CNetworkBranch& branch);
+        double start, end;
         QRectF box;
     };
-    struct Line
-    {
-        double start = 0, end = 0;
-        std::vector<QPointF> points;
-        std::vector<double> along; // metres from the first vertex, for each vertex
-        std::vector<Chunk> chunks;
-        QRectF box;
-    };
-    static Line Prepare(const CNetworkBranch& branch);
-    static void Search(const Line& line, const Chunk& chunk, const QPointF& point, CNetworkPlace& best, bool& found);
     std::vector<Line> m_lines; // as the network's branches
 };
-
-/// The point of a segment that is nearest to `point`, as the part of the way from `a` to `b`.
-double NearestPart(const QPointF& point, const QPointF& a, const QPointF& b);

@@ -38,21 +38,10 @@ QPainterPath Circle()
 QPainterPath Plus()
 {
     constexpr double arm = 0.94, half = 0.38;
-    QPainterPath path;
-    path.addPolygon(QPolygonF{{-half, -arm},
-                              {half, -arm},
-                              {half, -half},
-                              {arm, -half},
-                              {arm, half},
-                              {half, half},
-                              {half, arm},
-                              {-half, arm},
-                              {-half, half},
-                              {-arm, half},
-                              {-arm, -half},
-                              {-half, -half}});
-    path.closeSubpath();
-    return path;
+    QPainterPath upright, level;
+    upright.addRect(-half, -arm, 2 * half, 2 * arm);
+    level.addRect(-arm, -half, 2 * arm, 2 * half);
+    return upright.united(level);
 }
 
 struct KindRow

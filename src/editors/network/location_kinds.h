@@ -7,14 +7,20 @@
 #include <QPixmap>
 #include <QString>
 
-/// A location at which an HD parameter is given, copied from an HD document.
-struct CMapLocation
+/// A place on a branch, by name.
+struct CMapPlace
 {
     QString branch;
-    double chainage = 0;     // metres
-    int kind = 0;            // HDDataType
-    QString file;            // path of the HD document
-    double second = KsUnset; // as in the document's item
+    double chainage = 0; // metres
+    bool operator==(const CMapPlace&) const = default;
+};
+
+/// A location at which an HD parameter is given, copied from an HD document.
+struct CMapLocation : CMapPlace
+{
+    int kind = 0; // HDDataType
+    QString file; // path of the HD document
+    bool operator==(const CMapLocation&) const = default;
 };
 
 /// The kind's name in the user's language.

@@ -20,14 +20,15 @@ bool IsComplete(const CKvr_CBE_ModelDataItem& item)
     return !item.branch.trimmed().isEmpty() && std::isfinite(item.chainage) && item.chainage != NotGiven;
 }
 
-std::unique_ptr<CKvr_CBE_ModelDataItem> ItemOf(const CMapLocation& location)
+CObList ItemOf(const CMapLocation& location)
 {
     auto item = std::make_unique<CKvr_CBE_ModelDataItem>();
     item->branch = location.branch;
     item->chainage = location.chainage;
-    item->second = location.second;
     item->type = location.kind;
-    return item;
+    CObList objects;
+    objects.push_back(std::move(item));
+    return objects;
 }
 
 } // namespace
@@ -76,7 +77,7 @@ std::vector<CMapLocation> CLocationSource::Fetch() const
         for (const auto& each : *items) {
             const auto* item = dynamic_cast<const CKvr_CBE_ModelDataItem*>(each.get());
             if (item && item->type >= 0 && item->type < HDDataTypeCount && IsComplete(*item))
-                locations.push_back({item->branch, item->chainage, item->type, file, item->second});
+                locations.push_back({item->branch, item->chainage, item->type, file});
         }
     }
     return locations;
@@ -84,31 +85,15 @@ std::vector<CMapLocation> CLocationSource::Fetch() const
 
 void CLocationSource::Send(WPARAM request, const CMapLocation& location) const
 {
-    CView* receiver = FindView(location.file);
-    if (!receiver)
-        return;
-    CObList objects;
-    objects.push_back(ItemOf(location));
-    m_document.AskView(receiver, request, &m_view, &objects);
-}
-
-void CLocationSource::Delete(const CMapLocation& location) const
-{
-    Send(KsRequest::DeleteData, location);
-}
-
-void CLocationSource::Insert(const CMapLocation& location) const
-{
-    Send(KsRequest::InsertData, location);
+    CObList objects = ItemOf(location);
+    if (CView* receiver = FindView(location.file))
+        m_document.AskView(receiver, request, &m_view, &objects);
 }
 
 void CLocationSource::Show(const CMapLocation& location) const
 {
+    CObList objects = ItemOf(location);
     auto* select = KsFindExportAs<decltype(KvrMSGSelectData)>("KvrMSGSelectData");
-    CView* receiver = select ? FindView(location.file) : nullptr;
-    if (!receiver)
-        return;
-    CObList objects;
-    objects.push_back(ItemOf(location));
-    select(location.file, receiver, &objects);
+    if (CView* receiver = select ? FindView(location.file) : nullptr)
+        select(location.file, receiver, &objects);
 }

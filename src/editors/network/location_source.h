@@ -17,16 +17,14 @@ public:
     /// Paths of the open HD documents.
     QStringList Files() const;
 
-    // Each does nothing when the HD document has been closed.
-    void Delete(const CMapLocation& location) const;
-    void Insert(const CMapLocation& location) const;
-    /// Brings the location's line forward in its document.
+    /// Asks the location's document to insert or to delete it (KsRequest); nothing when that has been closed.
+    void Send(WPARAM request, const CMapLocation& location) const;
+    /// Brings the location's line forward in its document, while that is open.
     void Show(const CMapLocation& location) const;
 
 private:
     std::vector<CView*> HDViews() const;
     CView* FindView(const QString& file) const;
-    void Send(WPARAM request, const CMapLocation& location) const;
 
     const CNetworkDoc& m_document;
     CView& m_view;

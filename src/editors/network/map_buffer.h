@@ -1,9 +1,14 @@
 // The map as it was painted last.
 #pragma once
 
-#include "editors/network/map_painter.h"
+#include "editors/network/map_scene.h"
+#include "editors/network/map_style.h"
 
+#include <QCache>
 #include <QPixmap>
+
+/// Names that were painted already, by their place in the scene; turned outlines are slow to fill. The cost is bytes.
+using LabelPictures = QCache<std::size_t, QPixmap>;
 
 /// Keeps the picture of a map without its marks: what moved is copied, and only what comes into sight is painted.
 class CMapBuffer
@@ -21,6 +26,6 @@ private:
     static constexpr int LabelMemory = 32 << 20; // bytes
     QPixmap m_picture;
     QPoint m_offset;
-    CMapPainter::LabelPictures m_labels{LabelMemory}; // of the present scene
+    LabelPictures m_labels{LabelMemory}; // of the present scene
     bool m_valid = false;
 };

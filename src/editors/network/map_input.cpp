@@ -1,11 +1,14 @@
 #include "editors/network/map_input.h"
 
+#include "editors/network/map_overlay.h"
 #include "editors/network/network_map.h"
 
 #include <QApplication>
 #include <QContextMenuEvent>
+#include <QHelpEvent>
 #include <QKeyEvent>
 #include <QMouseEvent>
+#include <QToolTip>
 #include <QWheelEvent>
 #include <cmath>
 
@@ -40,6 +43,11 @@ constexpr MapKey Keys[] = {
     {Qt::Key_Delete, [](CNetworkMap& map) { emit map.DeleteRequested(); }},
 };
 // clang-format on
+
+QString TipOf(const CMapLocation& location)
+{
+    return LocationKindName(location.kind) + u'\n' + PlaceText(location) + u'\n' + location.file.section(u'/', -1);
+}
 
 } // namespace
 
@@ -76,7 +84,14 @@ bool CMapInput::eventFilter(QObject*, QEvent* event)
     }
     case QEvent::ContextMenu: {
         const auto* menu = static_cast<QContextMenuEvent*>(event);
-        m_map.OpenMenu(menu->reason() == QContextMenuEvent::Mouse ? std::optional(menu->pos()) : std::nullopt);
+        OpenMenu(menu->reason() == QContextMenuEvent::Mouse ? std::optional(menu->pos()) : std::nullopt);
+        return true;
+    }
+    case QEvent::ToolTip: {
+        const auto* help = static_cast<QHelpEvent*>(event);
+        const auto location = m_map.LocationAt(help->pos());
+        QToolTip::showText(help->globalPos(), location ? TipOf(m_map.Marks().Locations()[*location]) : QString(),
+                           &m_map);
         return true;
     }
     default:
@@ -94,6 +109,16 @@ bool CMapInput::Key(const QKeyEvent& event)
         }
     }
     return false;
+}
+
+/// For what is at a position of the window, or, without one, for what is marked.
+void CMapInput::OpenMenu(const std::optional<QPoint>& at)
+{
+    if (at)
+        m_map.PickAt(*at);
+    const auto picked = m_map.Marks().Picked();
+    const auto marked = picked ? m_map.WindowPoint(*picked) : std::nullopt;
+    emit m_map.MenuRequested(m_map.mapToGlobal(at ? *at : marked ? marked->toPoint() : m_map.rect().center()));
 }
 
 void CMapInput::Press(const QMouseEvent& event)

@@ -3,6 +3,7 @@
 
 #include <QObject>
 #include <QPoint>
+#include <optional>
 
 class CNetworkMap;
 class QKeyEvent;
@@ -20,6 +21,7 @@ protected:
 
 private:
     bool Key(const QKeyEvent& event);
+    void OpenMenu(const std::optional<QPoint>& at);
     void Press(const QMouseEvent& event);
     void Move(const QMouseEvent& event);
     void Release(const QMouseEvent& event);

@@ -1,7 +1,5 @@
 #include "editors/network/map_overlay.h"
 
-#include "editors/network/location_kinds.h"
-#include "editors/network/map_scene.h"
 #include "ks/units/edit_style.h"
 
 #include <QCoreApplication>
@@ -30,10 +28,8 @@ QString Elsewhere(const CLegend& legend)
 
 void PaintPanel(QPainter& painter, const CMapStyle& style, const QRectF& box)
 {
-    QColor frame = style.muted;
-    frame.setAlpha(90);
-    painter.setPen(QPen(frame, 1));
-    painter.setBrush(style.Ground(225));
+    painter.setPen(QPen(Faded(style.muted, 90), 1));
+    painter.setBrush(Faded(style.ground, 225));
     painter.drawRoundedRect(box.adjusted(0.5, 0.5, -0.5, -0.5), 5, 5);
 }
 
@@ -43,28 +39,6 @@ double Round125(double value)
     const double power = std::pow(10, std::floor(std::log10(value)));
     const double digits = value / power;
     return (digits >= 5 ? 5 : digits >= 2 ? 2 : 1) * power;
-}
-
-} // namespace
-
-QString PlaceText(const QString& branch, double chainage)
-{
-    const CKsEditStyle style(UnitGroup::Chainage, "%.1lf");
-    return QStringLiteral("%1 %2 %3").arg(branch, style.UnitConvertFromBase_T(chainage, 1), style.UnitSymbol());
-}
-
-QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend& legend)
-{
-    constexpr int gap = 16;
-    int names = 0, numbers = 0;
-    for (int kind = 0; kind < HDDataTypeCount; ++kind) {
-        names = std::max(names, metrics.horizontalAdvance(LocationKindName(kind)));
-        numbers = std::max(numbers, metrics.horizontalAdvance(QString::number(legend.counts[std::size_t(kind)])));
-    }
-    const int inner = std::max(LegendSymbol + names + gap + numbers, metrics.horizontalAdvance(Elsewhere(legend)));
-    const int rows = HDDataTypeCount + (legend.elsewhere > 0 ? 1 : 0);
-    return {window.right() - Margin - inner - 2 * Padding, window.top() + Margin, inner + 2 * Padding,
-            rows * LegendRow(metrics) + 2 * Padding - 3};
 }
 
 void PaintLegend(QPainter& painter, const CMapStyle& style, const QRect& window, const CLegend& legend)
@@ -111,8 +85,7 @@ void PaintScaleBar(QPainter& painter, const CMapStyle& style, const QRect& windo
     painter.drawPolyline(QPolygonF{{left, base - 5}, {left, base}, {right, base}, {right, base - 5}});
 }
 
-void PaintPlaceLabel(QPainter& painter, const CMapStyle& style, const QRect& window, const QPointF& at,
-                     const QString& label)
+void PaintLabel(QPainter& painter, const CMapStyle& style, const QRect& window, const QPointF& at, const QString& label)
 {
     QFont bold = painter.font();
     bold.setBold(true);
@@ -126,15 +99,14 @@ void PaintPlaceLabel(QPainter& painter, const CMapStyle& style, const QRect& win
         box.moveTop(at.y() + 14);
     box.moveLeft(std::max(box.left(), window.left() + 4.0)); // in a narrow window both sides are too small
     painter.setPen(QPen(style.mark, 1.2));
-    painter.setBrush(style.Ground(240));
+    painter.setBrush(Faded(style.ground, 240));
     painter.drawRoundedRect(box, 4, 4);
     painter.setPen(style.text);
     painter.drawText(box, Qt::AlignCenter, label);
     painter.restore();
 }
 
-void PaintPicked(QPainter& painter, const CMapStyle& style, const QRect& window, const QPointF& at,
-                 const QString& label)
+void PaintPicked(QPainter& painter, const CMapStyle& style, const QPointF& at)
 {
     constexpr double arm = 11, hole = 3;
     for (const auto& [colour, width] : {std::pair(style.ground, 4.5), std::pair(style.mark, 2.0)}) {
@@ -142,7 +114,6 @@ void PaintPicked(QPainter& painter, const CMapStyle& style, const QRect& window,
         for (const QPointF& way : {QPointF(1, 0), QPointF(-1, 0), QPointF(0, 1), QPointF(0, -1)})
             painter.drawLine(at + hole * way, at + arm * way);
     }
-    PaintPlaceLabel(painter, style, window, at, label);
 }
 
 void PaintSelected(QPainter& painter, const CMapStyle& style, const QPointF& at)
@@ -156,26 +127,60 @@ void PaintSelected(QPainter& painter, const CMapStyle& style, const QPointF& at)
 
 void PaintShown(QPainter& painter, const CMapStyle& style, const QPointF& at)
 {
-    QColor glow = style.mark;
-    glow.setAlpha(60);
     painter.setPen(QPen(style.mark, 2));
-    painter.setBrush(glow);
+    painter.setBrush(Faded(style.mark, 60));
     painter.drawEllipse(at, 15, 15);
     painter.setBrush(style.mark);
     painter.drawEllipse(at, 3, 3);
 }
 
-void PaintHint(QPainter& painter, const CMapStyle& style, const QRect& window, const QString& text)
+} // namespace
+
+QString PlaceText(const CMapPlace& place)
 {
-    painter.setPen(style.muted);
-    painter.drawText(window, Qt::AlignCenter | Qt::TextWordWrap, text);
+    const CKsEditStyle style(UnitGroup::Chainage, "%.1lf");
+    return QStringLiteral("%1 %2 %3")
+        .arg(place.branch, style.UnitConvertFromBase_T(place.chainage, 1), style.UnitSymbol());
 }
 
-void PaintFocus(QPainter& painter, const CMapStyle& style, const QRect& window)
+CLegend LegendOf(const CMapSelection& marks)
 {
-    QColor frame = style.chosen;
-    frame.setAlpha(150);
-    painter.setPen(QPen(frame, 1));
+    CLegend legend{.elsewhere = int(marks.Locations().size() - marks.Placed().size())};
+    for (const CPlacedLocation& each : marks.Placed())
+        ++legend.counts.at(std::size_t(each.kind));
+    return legend;
+}
+
+QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend& legend)
+{
+    constexpr int gap = 16;
+    int names = 0, numbers = 0;
+    for (int kind = 0; kind < HDDataTypeCount; ++kind) {
+        names = std::max(names, metrics.horizontalAdvance(LocationKindName(kind)));
+        numbers = std::max(numbers, metrics.horizontalAdvance(QString::number(legend.counts[std::size_t(kind)])));
+    }
+    const int inner = std::max(LegendSymbol + names + gap + numbers, metrics.horizontalAdvance(Elsewhere(legend)));
+    const int rows = HDDataTypeCount + (legend.elsewhere > 0 ? 1 : 0);
+    return {window.right() - Margin - inner - 2 * Padding, window.top() + Margin, inner + 2 * Padding,
+            rows * LegendRow(metrics) + 2 * Padding - 3};
+}
+
+void PaintOverlay(QPainter& painter, const CMapStyle& style, const QRect& window, const CMapOverlay& overlay)
+{
+    const auto& [legend, scale, shown, selected, picked, label, hint, focus] = overlay;
+    if (shown)
+        PaintShown(painter, style, *shown);
+    if (selected)
+        PaintSelected(painter, style, *selected);
+    else if (picked)
+        PaintPicked(painter, style, *picked);
+    if (const auto& at = selected ? selected : picked ? picked : shown)
+        PaintLabel(painter, style, window, *at, label);
+    PaintScaleBar(painter, style, window, scale);
+    PaintLegend(painter, style, window, legend);
+    painter.setPen(style.muted);
+    painter.drawText(window, Qt::AlignCenter | Qt::TextWordWrap, hint);
+    painter.setPen(QPen(focus ? Faded(style.chosen, 150) : Qt::transparent, 1));
     painter.setBrush(Qt::NoBrush);
     painter.drawRect(QRectF(window).adjusted(0.5, 0.5, -0.5, -0.5));
 }

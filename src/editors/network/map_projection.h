@@ -3,9 +3,8 @@
 
 #include <QPointF>
 #include <QRectF>
-#include <QSizeF>
-#include <algorithm>
-#include <cmath>
+
+struct CNetwork;
 
 /// A pixel is one of the device. The plane is the whole map at the present scale; a window shows the part of it that
 /// begins at -offset. Everything drawn is computed on the plane, so that moving the window moves it as a whole.
@@ -25,23 +24,10 @@ struct CMapProjection
         const QPointF plane = window - offset;
         return {origin.x() + plane.x() / scale, origin.y() - plane.y() / scale};
     }
-    /// Changes the scale while `window` keeps showing the same place.
-    void ZoomAt(const QPointF& window, double newScale)
-    {
-        const QPointF map = ToMap(window);
-        scale = newScale;
-        offset = (window - ToPlane(map)).toPoint();
-    }
-    void CenterAt(const QPointF& map, const QRectF& window) { offset = (window.center() - ToPlane(map)).toPoint(); }
-    /// Shows all of `extent` in a part of the window, with a margin of so many pixels and at most a scale.
-    void Fit(const QRectF& extent, const QRectF& window, double margin, double mostScale)
-    {
-        const double width = std::max(window.width() - 2 * margin, 1.0);
-        const double height = std::max(window.height() - 2 * margin, 1.0);
-        if (extent.width() > 0 || extent.height() > 0)
-            scale = std::min(extent.width() > 0 ? width / extent.width() : HUGE_VAL,
-                             extent.height() > 0 ? height / extent.height() : HUGE_VAL);
-        scale = std::min(scale, mostScale);
-        CenterAt(extent.center(), window);
-    }
+    /// Shows the whole network: in the whole window, or, when the legend would cover branches, in the larger part
+    /// beside it; but the legend rather covers something than that the network becomes small. `ratio`: device pixels a
+    /// pixel of the user's.
+    void Fit(const CNetwork& network, const QRectF& window, const QRectF& legend, double ratio);
+    /// Zooms around a point of the window, not farther out than half of what shows everything.
+    void Zoom(const CNetwork& network, const QRectF& window, const QPointF& at, double factor, double ratio);
 };

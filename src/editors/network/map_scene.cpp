@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <cmath>
 #include <numbers>
+#include <numeric>
 
 namespace {
 
@@ -40,12 +41,14 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
         const CNetworkBranch& on = network.branches[std::size_t(branch)];
         placed.push_back({i, location.kind, branch, (location.chainage - on.start) / (on.end - on.start), *point});
     }
-    std::stable_sort(placed.begin(), placed.end(), [](const auto& a, const auto& b) { return a.kind < b.kind; });
+    std::ranges::stable_sort(placed, {}, &CPlacedLocation::kind);
     return placed;
 }
 
-std::vector<QPainterPath> NameOutlines(const CNetwork& network, const QFont& font, double ratio)
+std::vector<QPainterPath> NameOutlines(const CNetwork& network, QFont font, double ratio)
 {
+    font.setPointSizeF(font.pointSizeF() > 0 ? font.pointSizeF() : 9);
+    font.setWeight(QFont::DemiBold);
     std::vector<QPainterPath> outlines;
     outlines.reserve(network.branches.size());
     for (const CNetworkBranch& branch : network.branches) {
@@ -73,8 +76,7 @@ public:
         ForCells(box, [&](const Cell& cell) {
             const auto found = m_boxes.constFind(cell);
             if (found != m_boxes.constEnd())
-                count += int(std::count_if(found->begin(), found->end(),
-                                           [&](const QRectF& each) { return each.intersects(box); }));
+                count += int(std::ranges::count_if(*found, [&](const QRectF& each) { return each.intersects(box); }));
         });
         return count;
     }
@@ -119,7 +121,7 @@ void CMapScene::AddSymbols(const std::vector<CPlacedLocation>& placed, const CMa
     for (const CPlacedLocation& each : placed)
         ++counts.at(std::size_t(each.kind));
     std::array<double, HDDataTypeCount> offsets{};
-    const auto kinds = int(std::count_if(counts.begin(), counts.end(), [](int count) { return count > 0; }));
+    const auto kinds = int(std::ranges::count_if(counts, [](int count) { return count > 0; }));
     int lane = 0;
     for (std::size_t kind = 0; kind < counts.size(); ++kind) {
         if (counts[kind] > 0)
@@ -173,10 +175,8 @@ void CMapScene::AddLabels()
     m_labelBoxes = std::make_unique<Boxes>(120 * m_ratio);
     AddObstacles();
     std::vector<std::size_t> order(m_lines.size()); // long branches first: they matter most
-    for (std::size_t i = 0; i < order.size(); ++i)
-        order[i] = i;
-    std::stable_sort(order.begin(), order.end(),
-                     [this](std::size_t a, std::size_t b) { return m_lines[a].Length() > m_lines[b].Length(); });
+    std::iota(order.begin(), order.end(), 0);
+    std::ranges::stable_sort(order, std::greater(), [this](std::size_t branch) { return m_lines[branch].Length(); });
     for (const std::size_t branch : order) {
         const double length = m_lines[branch].Length();
         const QRectF text = m_texts[branch].boundingRect();
@@ -242,7 +242,7 @@ const CMapScene::Symbol* CMapScene::SymbolAt(const QPointF& plane) const
     const Symbol* best = nullptr;
     double nearest = (SymbolSize / 2 + 1) * m_ratio;
     for (const Symbol& symbol : m_symbols) {
-        const double distance = std::hypot(symbol.at.x() - plane.x(), symbol.at.y() - plane.y());
+        const double distance = Distance(symbol.at, plane);
         if (distance <= nearest) {
             nearest = distance;
             best = &symbol;
@@ -253,7 +253,6 @@ const CMapScene::Symbol* CMapScene::SymbolAt(const QPointF& plane) const
 
 const CMapScene::Symbol* CMapScene::SymbolOf(std::size_t location) const
 {
-    const auto found = std::find_if(m_symbols.begin(), m_symbols.end(),
-                                    [location](const Symbol& symbol) { return symbol.location == location; });
+    const auto found = std::ranges::find(m_symbols, location, &Symbol::location);
     return found == m_symbols.end() ? nullptr : &*found;
 }

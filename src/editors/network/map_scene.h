@@ -23,7 +23,7 @@ struct CPlacedLocation
 std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const std::vector<CMapLocation>& locations);
 
 /// The names of the branches as outlines around zero, in device pixels.
-std::vector<QPainterPath> NameOutlines(const CNetwork& network, const QFont& font, double ratio);
+std::vector<QPainterPath> NameOutlines(const CNetwork& network, QFont font, double ratio);
 
 class CMapScene
 {

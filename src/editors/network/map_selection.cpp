@@ -3,17 +3,12 @@
 #include <algorithm>
 #include <utility>
 
-CMapSelection::CMapSelection(const CNetworkDoc& document) : m_document(document) {}
-
 void CMapSelection::SetLocations(std::vector<CMapLocation> locations)
 {
     const auto before = std::exchange(m_locations, std::move(locations));
-    const auto old = std::exchange(m_selected, std::nullopt);
-    for (std::size_t i = 0; old && !m_selected && i < m_locations.size(); ++i) {
-        const CMapLocation &each = m_locations[i], &selected = before[*old];
-        if (each.kind == selected.kind && each.chainage == selected.chainage && each.branch == selected.branch &&
-            each.file == selected.file)
-            m_selected = i;
+    if (m_selected) {
+        const auto found = std::ranges::find(m_locations, before[*m_selected]);
+        m_selected = found == m_locations.end() ? std::nullopt : std::optional(found - m_locations.begin());
     }
     PlaceAll();
 }
@@ -29,9 +24,15 @@ std::optional<QPointF> CMapSelection::PointOf(const CMapPlace& place) const
     return m_document.Reference().PointAt(m_document.Network().FindBranch(place.branch), place.chainage);
 }
 
-std::optional<CMapPlace> CMapSelection::Picked() const
+std::optional<CMapPlace> CMapSelection::InNetwork(const std::optional<CMapPlace>& place) const
 {
-    return m_picked && PointOf(*m_picked) ? m_picked : std::nullopt;
+    return place && PointOf(*place) ? place : std::nullopt;
+}
+
+std::optional<CMapPlace> CMapSelection::Marked() const
+{
+    const auto picked = Picked();
+    return picked ? picked : Shown();
 }
 
 void CMapSelection::Pick(std::optional<CMapPlace> place)
@@ -43,27 +44,18 @@ void CMapSelection::Pick(std::optional<CMapPlace> place)
     emit PickedChanged();
 }
 
-void CMapSelection::SetSelected(std::optional<std::size_t> location)
-{
-    if (std::exchange(m_selected, location) != location)
-        emit Changed();
-}
-
-void CMapSelection::Select(std::size_t location)
-{
-    SetSelected(location);
-    Pick(CMapPlace{m_locations[location].branch, m_locations[location].chainage});
-}
-
-void CMapSelection::Unselect()
-{
-    SetSelected(std::nullopt);
-}
-
 void CMapSelection::Show(std::optional<CMapPlace> place)
 {
     m_shown = std::move(place);
     emit Changed();
+}
+
+void CMapSelection::Select(std::optional<std::size_t> location)
+{
+    if (std::exchange(m_selected, location) != location)
+        emit Changed();
+    if (location)
+        Pick(m_locations[*location]);
 }
 
 std::optional<std::size_t> CMapSelection::Next(int step) const
@@ -71,24 +63,11 @@ std::optional<std::size_t> CMapSelection::Next(int step) const
     if (m_placed.empty())
         return std::nullopt;
     auto order = m_placed;
-    std::stable_sort(order.begin(), order.end(), [this](const CPlacedLocation& a, const CPlacedLocation& b) {
-        return std::pair(a.branch, m_locations[a.location].chainage) <
-               std::pair(b.branch, m_locations[b.location].chainage);
+    std::ranges::stable_sort(order, {}, [this](const CPlacedLocation& each) {
+        return std::pair(each.branch, m_locations[each.location].chainage);
     });
-    const auto present = std::find_if(order.begin(), order.end(),
-                                      [this](const CPlacedLocation& each) { return each.location == m_selected; });
+    const auto present = std::ranges::find(order, m_selected, &CPlacedLocation::location);
     const auto count = std::ssize(order);
     const std::ptrdiff_t from = present == order.end() ? (step > 0 ? -1 : count) : present - order.begin();
     return order[std::size_t((from + step + count) % count)].location;
-}
-
-QString CMapSelection::Text() const
-{
-    const auto text = [](const QString& branch, double chainage) {
-        return branch + u' ' + QString::number(chainage, 'f', 1);
-    };
-    if (m_selected)
-        return text(m_locations[*m_selected].branch, m_locations[*m_selected].chainage);
-    const auto& place = m_picked ? m_picked : m_shown;
-    return place ? text(place->branch, place->chainage) : QString();
 }

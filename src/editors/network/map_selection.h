@@ -6,14 +6,6 @@
 #include <QObject>
 #include <optional>
 
-/// A place on a branch, by name.
-struct CMapPlace
-{
-    QString branch;
-    double chainage = 0; // metres
-    bool operator==(const CMapPlace&) const = default;
-};
-
 /// The locations on a map, and what is marked there: the place that the user picked, the location that he selected, the
 /// place that another editor shows.
 class CMapSelection : public QObject
@@ -21,7 +13,7 @@ class CMapSelection : public QObject
     Q_OBJECT
 public:
     /// The document outlives the selection.
-    explicit CMapSelection(const CNetworkDoc& document);
+    explicit CMapSelection(const CNetworkDoc& document) : m_document(document) {}
 
     const std::vector<CMapLocation>& Locations() const { return m_locations; }
     /// Those that are at a place of the network.
@@ -33,21 +25,20 @@ public:
     /// In map coordinates; none for a place that is not in the network.
     std::optional<QPointF> PointOf(const CMapPlace& place) const;
 
-    /// While it is in the network.
-    std::optional<CMapPlace> Picked() const;
+    /// While they are in the network.
+    std::optional<CMapPlace> Picked() const { return InNetwork(m_picked); }
+    std::optional<CMapPlace> Shown() const { return InNetwork(m_shown); }
     void Pick(std::optional<CMapPlace> place);
-    /// By its place in the list.
-    std::optional<std::size_t> Selected() const { return m_selected; }
-    /// The location is the place picked, too.
-    void Select(std::size_t location);
-    void Unselect();
-    const std::optional<CMapPlace>& Shown() const { return m_shown; }
     void Show(std::optional<CMapPlace> place);
+    /// Null for none. Valid until the locations change.
+    const CMapLocation* Selected() const { return m_selected ? &m_locations[*m_selected] : nullptr; }
+    const std::optional<std::size_t>& SelectedIndex() const { return m_selected; }
+    /// The place picked, else the one shown, while it is in the network.
+    std::optional<CMapPlace> Marked() const;
+    /// One of the list, which is the place picked, too; or none.
+    void Select(std::optional<std::size_t> location);
     /// The location that follows the one selected along the branches, or precedes it; none when there are none.
     std::optional<std::size_t> Next(int step) const;
-
-    /// "BRANCH 1234.5" of the location selected, else of the place picked, else of the place shown; in metres.
-    QString Text() const;
 
 signals:
     void LocationsChanged();
@@ -56,7 +47,7 @@ signals:
     void Changed();
 
 private:
-    void SetSelected(std::optional<std::size_t> location);
+    std::optional<CMapPlace> InNetwork(const std::optional<CMapPlace>& place) const;
 
     const CNetworkDoc& m_document;
     std::vector<CMapLocation> m_locations;

@@ -4,6 +4,12 @@
 #include <QColor>
 #include <QPalette>
 
+inline QColor Faded(QColor colour, int alpha)
+{
+    colour.setAlpha(alpha);
+    return colour;
+}
+
 struct CMapStyle
 {
     explicit CMapStyle(const QPalette& palette)
@@ -17,7 +23,6 @@ struct CMapStyle
           outline(dark ? QColor(0xdd, 0xe3, 0xe8) : QColor(0x2a, 0x30, 0x36))
     {
     }
-    QColor Ground(int alpha) const { return {ground.red(), ground.green(), ground.blue(), alpha}; }
 
     bool dark;
     QColor ground, text;

@@ -1,5 +1,6 @@
 #include "editors/network/network.h"
 
+#include "editors/network/measured_line.h"
 #include "ks/fc/branch_name.h"
 
 #include <algorithm>
@@ -7,16 +8,12 @@
 
 double CNetworkBranch::Length() const
 {
-    double length = 0;
-    for (std::size_t i = 1; i < line.size(); ++i)
-        length += std::hypot(line[i].x() - line[i - 1].x(), line[i].y() - line[i - 1].y());
-    return length;
+    return LengthOf(line);
 }
 
 void CNetworkBranch::SortChannel()
 {
-    std::stable_sort(channel.begin(), channel.end(),
-                     [](const CChannelRow& a, const CChannelRow& b) { return a.chainage < b.chainage; });
+    std::ranges::stable_sort(channel, {}, &CChannelRow::chainage);
 }
 
 int CNetwork::FindBranch(const QString& name) const
@@ -28,16 +25,10 @@ int CNetwork::FindBranch(const QString& name) const
 
 QRectF CNetwork::Extent() const
 {
-    double left = HUGE_VAL, top = HUGE_VAL, right = -HUGE_VAL, bottom = -HUGE_VAL;
-    for (const CNetworkBranch& branch : branches) {
-        for (const QPointF& at : branch.line) {
-            left = std::min(left, at.x());
-            right = std::max(right, at.x());
-            top = std::min(top, at.y());
-            bottom = std::max(bottom, at.y());
-        }
-    }
-    return left > right ? QRectF() : QRectF(QPointF(left, top), QPointF(right, bottom));
+    CExtent around;
+    for (const CNetworkBranch& branch : branches)
+        around.Add(branch.line);
+    return around.Box();
 }
 
 double ChannelValue(const std::vector<CChannelRow>& channel, double CChannelRow::*value, double chainage)

@@ -1,10 +1,10 @@
 #include "editors/network/network_map.h"
 
-#include "editors/network/map_fit.h"
 #include "editors/network/map_input.h"
 #include "editors/network/map_overlay.h"
 #include "ks/units/edit_style.h"
 
+#include <QEvent>
 #include <cmath>
 
 CNetworkMap::CNetworkMap(const CNetworkDoc& document, QWidget* parent)
@@ -17,14 +17,11 @@ CNetworkMap::CNetworkMap(const CNetworkDoc& document, QWidget* parent)
     setAccessibleName(tr("Map of the river network"));
     new CMapInput(*this);
     connect(&document, &CNetworkDoc::NetworkChanged, this, &CNetworkMap::NetworkChanged);
-    connect(&KsUnits::Instance(), &KsUnits::Changed, this, qOverload<>(&QWidget::update));
+    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CNetworkMap::MarksChanged);
     connect(&m_marks, &CMapSelection::LocationsChanged, this, &CNetworkMap::SceneChanged);
-    connect(&m_marks, &CMapSelection::Changed, this, qOverload<>(&QWidget::update));
-    connect(&m_marks, &CMapSelection::PickedChanged, this, &CNetworkMap::PickedChanged);
+    connect(&m_marks, &CMapSelection::Changed, this, &CNetworkMap::MarksChanged);
     NetworkChanged();
 }
-
-CNetworkMap::~CNetworkMap() = default;
 
 void CNetworkMap::NetworkChanged()
 {
@@ -38,17 +35,22 @@ void CNetworkMap::SceneChanged()
 {
     m_scene.reset();
     m_buffer.Clear();
+    MarksChanged();
+}
+
+/// A screen reader says what is marked.
+void CNetworkMap::MarksChanged()
+{
+    const auto place = m_marks.Marked();
+    setAccessibleDescription(place ? PlaceText(*place) : QString());
     update();
 }
 
 const CMapScene& CNetworkMap::Scene() const
 {
     if (!m_scene) {
-        QFont names = font();
-        names.setPointSizeF(names.pointSizeF() > 0 ? names.pointSizeF() : 9);
-        names.setWeight(QFont::DemiBold);
         if (m_names.empty())
-            m_names = NameOutlines(m_document.Network(), names, devicePixelRatioF());
+            m_names = NameOutlines(m_document.Network(), font(), devicePixelRatioF());
         m_scene = std::make_unique<CMapScene>(m_document.Network(), m_marks.Placed(), m_projection, m_names,
                                               devicePixelRatioF());
     }
@@ -57,21 +59,24 @@ const CMapScene& CNetworkMap::Scene() const
 
 // ---- moving ------------------------------------------------------------------------------------
 
-CMapWindow CNetworkMap::Window() const
+/// A part of the window in pixels of the device.
+QRectF CNetworkMap::Device(const QRectF& window) const
 {
-    return {QRectF(rect()), devicePixelRatioF()};
+    return {window.topLeft() * devicePixelRatioF(), window.size() * devicePixelRatioF()};
 }
 
 void CNetworkMap::FitAll()
 {
-    FitNetwork(m_projection, m_document.Network(), Window(), QRectF(LegendBox(fontMetrics(), rect(), Legend())));
+    m_projection.Fit(m_document.Network(), Device(rect()), Device(LegendBox(fontMetrics(), rect(), LegendOf(m_marks))),
+                     devicePixelRatioF());
     m_fitted = true;
     SceneChanged();
 }
 
 void CNetworkMap::ZoomAt(const QPointF& window, double factor)
 {
-    ZoomNetwork(m_projection, m_document.Network(), Window(), window, factor);
+    const double ratio = devicePixelRatioF();
+    m_projection.Zoom(m_document.Network(), Device(rect()), window * ratio, factor, ratio);
     m_fitted = false;
     SceneChanged();
 }
@@ -83,15 +88,15 @@ void CNetworkMap::Pan(const QPoint& distance)
     update();
 }
 
-std::optional<QPointF> CNetworkMap::WindowPoint(const Place& place) const
+std::optional<QPointF> CNetworkMap::WindowPoint(const CMapPlace& place) const
 {
     const auto point = m_marks.PointOf(place);
     return point ? std::optional(m_projection.ToWindow(*point) / devicePixelRatioF()) : std::nullopt;
 }
 
-std::optional<QPointF> CNetworkMap::SymbolPoint(std::size_t location) const
+std::optional<QPointF> CNetworkMap::SymbolPoint(std::optional<std::size_t> location) const
 {
-    const CMapScene::Symbol* symbol = Scene().SymbolOf(location);
+    const CMapScene::Symbol* symbol = location ? Scene().SymbolOf(*location) : nullptr;
     return symbol ? std::optional((symbol->at + m_projection.offset) / devicePixelRatioF()) : std::nullopt;
 }
 
@@ -104,13 +109,7 @@ void CNetworkMap::KeepInSight(const std::optional<QPointF>& window)
 
 // ---- places and locations ----------------------------------------------------------------------
 
-const CMapLocation* CNetworkMap::Selected() const
-{
-    const auto selected = m_marks.Selected();
-    return selected ? &m_marks.Locations()[*selected] : nullptr;
-}
-
-void CNetworkMap::ShowPlace(const Place& place)
+void CNetworkMap::ShowPlace(const CMapPlace& place)
 {
     m_marks.Show(place);
     KeepInSight(WindowPoint(place));
@@ -124,7 +123,6 @@ void CNetworkMap::SetCurrentBranch(int branch)
     update();
 }
 
-/// The location whose symbol is drawn at a window position.
 std::optional<std::size_t> CNetworkMap::LocationAt(const QPointF& window) const
 {
     const CMapScene::Symbol* symbol = Scene().SymbolAt(window * devicePixelRatioF() - m_projection.offset);
@@ -139,19 +137,17 @@ std::optional<CMapPlace> CNetworkMap::Nearest(const QPointF& window, double reac
         m_document.Reference().Nearest(m_projection.ToMap(window * ratio), reach * ratio / m_projection.scale);
     if (!place)
         return std::nullopt;
-    return Place{m_document.Network().branches[std::size_t(place->branch)].Name(), place->chainage};
+    return CMapPlace{m_document.Network().branches[std::size_t(place->branch)].Name(), place->chainage};
 }
 
 void CNetworkMap::PickAt(const QPointF& window)
 {
     constexpr double reach = 12;
     m_marks.Show(std::nullopt);
-    if (const auto location = LocationAt(window)) {
-        m_marks.Select(*location);
-        return;
-    }
-    m_marks.Unselect();
-    m_marks.Pick(Nearest(window, reach));
+    const auto location = LocationAt(window);
+    m_marks.Select(location);
+    if (!location)
+        m_marks.Pick(Nearest(window, reach));
 }
 
 void CNetworkMap::PickMiddle()
@@ -159,7 +155,7 @@ void CNetworkMap::PickMiddle()
     const auto place = Nearest(QRectF(rect()).center(), HUGE_VAL);
     if (!place)
         return;
-    m_marks.Unselect();
+    m_marks.Select(std::nullopt);
     m_marks.Pick(place);
     KeepInSight(WindowPoint(*place));
 }
@@ -169,26 +165,45 @@ void CNetworkMap::StepLocation(int step)
     const auto location = m_marks.Next(step);
     if (!location)
         return;
-    m_marks.Select(*location);
-    KeepInSight(SymbolPoint(*location));
+    m_marks.Select(location);
+    KeepInSight(SymbolPoint(location));
 }
 
 void CNetworkMap::Unmark()
 {
     m_marks.Show(std::nullopt);
-    m_marks.Unselect();
+    m_marks.Select(std::nullopt);
     m_marks.Pick(std::nullopt);
 }
 
-void CNetworkMap::OpenMenu(const std::optional<QPoint>& at)
+// ---- events ------------------------------------------------------------------------------------
+
+/// The pixels of another screen are others.
+void CNetworkMap::ScreenChanged()
 {
-    if (at)
-        PickAt(*at);
-    const auto picked = !at && Picked() ? WindowPoint(*Picked()) : std::nullopt;
-    emit MenuRequested(mapToGlobal(at ? *at : picked ? picked->toPoint() : rect().center()));
+    const double change = devicePixelRatioF() / m_scene->Ratio();
+    m_projection.scale *= change;
+    m_projection.offset = (QPointF(m_projection.offset) * change).toPoint();
+    m_names.clear();
+    SceneChanged();
 }
 
-// ---- events ------------------------------------------------------------------------------------
+void CNetworkMap::paintEvent(QPaintEvent*)
+{
+    if (m_scene && m_scene->Ratio() != devicePixelRatioF())
+        ScreenChanged();
+    const CMapStyle style(palette());
+    QPainter painter(this);
+    painter.drawPixmap(
+        0, 0, m_buffer.Paint(Scene(), style, m_currentBranch, Device(rect()).size().toSize(), m_projection.offset));
+    painter.setRenderHint(QPainter::Antialiasing);
+    const auto point = [this](const auto& place) { return place ? WindowPoint(*place) : std::nullopt; };
+    const bool empty = m_document.Network().branches.empty();
+    PaintOverlay(painter, style, rect(),
+                 {LegendOf(m_marks), m_projection.scale / devicePixelRatioF(), point(m_marks.Shown()),
+                  SymbolPoint(m_marks.SelectedIndex()), point(m_marks.Picked()), accessibleDescription(),
+                  empty ? tr("This network has no branches yet.") : QString(), hasFocus()});
+}
 
 void CNetworkMap::resizeEvent(QResizeEvent* event)
 {
@@ -199,18 +214,13 @@ void CNetworkMap::resizeEvent(QResizeEvent* event)
 
 void CNetworkMap::changeEvent(QEvent* event)
 {
-    switch (event->type()) {
-    case QEvent::LanguageChange:
+    const auto type = event->type();
+    if (type == QEvent::LanguageChange)
         setAccessibleName(tr("Map of the river network"));
-        [[fallthrough]];
-    case QEvent::PaletteChange:
-    case QEvent::FontChange:
-    case QEvent::StyleChange:
+    if (type == QEvent::LanguageChange || type == QEvent::PaletteChange || type == QEvent::FontChange ||
+        type == QEvent::StyleChange) {
         m_names.clear();
         SceneChanged();
-        break;
-    default:
-        break;
     }
     QWidget::changeEvent(event);
 }

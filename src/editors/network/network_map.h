@@ -7,34 +7,18 @@
 
 #include <QWidget>
 
-struct CLegend;
-struct CMapWindow;
-
 class CNetworkMap : public QWidget
 {
     Q_OBJECT
-    // For programs that read the screen, and those that drive it.
-    Q_PROPERTY(QString marked READ MarkedText)
-    Q_PROPERTY(int placedCount READ PlacedCount)
 public:
     /// The document outlives the map.
     explicit CNetworkMap(const CNetworkDoc& document, QWidget* parent = nullptr);
-    ~CNetworkMap() override;
 
-    using Place = CMapPlace;
-    void SetLocations(std::vector<CMapLocation> locations) { m_marks.SetLocations(std::move(locations)); }
-    const std::vector<CMapLocation>& Locations() const { return m_marks.Locations(); }
-    /// How many of them are at a place of the network.
-    std::size_t PlacedCount() const { return m_marks.Placed().size(); }
-    /// What the user picked, while it is in the network.
-    std::optional<Place> Picked() const { return m_marks.Picked(); }
-    void SetPicked(std::optional<Place> place) { m_marks.Pick(std::move(place)); }
-    /// The location that is selected; null for none. Valid until the locations change.
-    const CMapLocation* Selected() const;
-    /// See CMapSelection::Text.
-    QString MarkedText() const { return m_marks.Text(); }
+    /// The locations, and what is picked and selected.
+    CMapSelection& Marks() { return m_marks; }
+    const CMapSelection& Marks() const { return m_marks; }
     /// Marks a place and brings it into sight.
-    void ShowPlace(const Place& place);
+    void ShowPlace(const CMapPlace& place);
     void SetCurrentBranch(int branch);
 
     void FitAll();
@@ -50,17 +34,16 @@ public:
     /// To the next location along the branches, or back.
     void StepLocation(int step);
     void Unmark();
-    /// Opens the menu for what is at a position of the window, or, without one, for what is marked.
-    void OpenMenu(const std::optional<QPoint>& at);
     /// In window coordinates; none for a place that is nowhere.
-    std::optional<QPointF> WindowPoint(const Place& place) const;
+    std::optional<QPointF> WindowPoint(const CMapPlace& place) const;
     /// Where a location's symbol is; none when it is not on the map.
-    std::optional<QPointF> SymbolPoint(std::size_t location) const;
+    std::optional<QPointF> SymbolPoint(std::optional<std::size_t> location) const;
+    /// The location whose symbol is at a position of the window.
+    std::optional<std::size_t> LocationAt(const QPointF& window) const;
 
     QSize sizeHint() const override { return {640, 480}; }
 
 signals:
-    void PickedChanged();
     void DeleteRequested();
     /// The menu for what is picked or selected, at a global position.
     void MenuRequested(const QPoint& position);
@@ -69,19 +52,15 @@ protected:
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void changeEvent(QEvent* event) override;
-    bool event(QEvent* event) override;
 
 private:
     void NetworkChanged();
     void SceneChanged();
+    void MarksChanged();
     void ScreenChanged();
     const CMapScene& Scene() const;
-    CMapWindow Window() const;
-    std::optional<std::size_t> LocationAt(const QPointF& window) const;
-    std::optional<Place> Nearest(const QPointF& window, double reach) const;
-    CLegend Legend() const;
-    QString LocationText(const CMapLocation& location) const;
-    void PaintMarks(QPainter& painter, const CMapStyle& style) const;
+    QRectF Device(const QRectF& window) const;
+    std::optional<CMapPlace> Nearest(const QPointF& window, double reach) const;
     void KeepInSight(const std::optional<QPointF>& window);
 
     const CNetworkDoc& m_document;

@@ -34,7 +34,7 @@ void CNetworkView::OnInitialUpdate()
     layout->addWidget(splitter);
     setFocusProxy(m_map);
 
-    connect(m_map, &CNetworkMap::PickedChanged, this, &CNetworkView::PickedChanged);
+    connect(&m_map->Marks(), &CMapSelection::PickedChanged, this, &CNetworkView::PickedChanged);
     connect(m_map, &CNetworkMap::DeleteRequested, this, &CNetworkView::DeleteLocation);
     connect(m_map, &CNetworkMap::MenuRequested, this, [this](const QPoint& at) {
         if (const auto menu = MapMenu(); !menu->isEmpty())

@@ -9,7 +9,6 @@
 
 #include <QTimer>
 
-class QAction;
 class QLabel;
 class QMenu;
 class QSplitter;
@@ -58,14 +57,15 @@ private:
     void PickedChanged();
     void LocationsChanged();
     void RefreshLocations();
+    void Send(WPARAM request, CMapLocation location);
     void DeleteLocation();
     void AskForImport();
 
     // What other editors ask; each answers whether there was something.
-    LRESULT FetchLocation(CObList& objects) const;
-    LRESULT ListBranches(CObList& objects) const;
-    LRESULT FillChannel(const CObList& objects) const;
-    LRESULT ShowLocation(const CObList& objects);
+    LRESULT FetchLocation(CObList& objects);
+    LRESULT ListBranches(CObList& objects);
+    LRESULT FillChannel(CObList& objects);
+    LRESULT ShowLocation(CObList& objects);
 
     CNetworkMap* m_map = nullptr;
     CGenGrid *m_branches = nullptr, *m_channel = nullptr;

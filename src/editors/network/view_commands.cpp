@@ -21,12 +21,9 @@ QString WhyNoLines(const QString& name, const CGisFile& file)
             return {};
         QString text = QStringLiteral("%1: %2 (%3)")
                            .arg(layer.name, GeometryText(layer.geometry), QString::number(layer.features.size()));
-        for (const CGisFeature& feature : layer.features) {
-            if (!feature.error.isEmpty()) {
-                text += QStringLiteral(" - ") + feature.error;
-                break;
-            }
-        }
+        const auto damaged = std::ranges::find_if_not(layer.features, &QString::isEmpty, &CGisFeature::error);
+        if (damaged != layer.features.end())
+            text += QStringLiteral(" - ") + damaged->error;
         layers << (text + u' ' + layer.errors.join(u' ')).trimmed();
     }
     return CNetworkView::tr("%1 holds no lines. Its layers, with their geometry and the number of features:")
@@ -130,5 +127,5 @@ void CNetworkView::Import(const QString& path)
     m_branches->SetCurrentCell(first + 1, BranchName + 1);
     m_branches->Widths().MakeRoom();
     m_map->FitAll();
-    CImportReportDialog(report, this).exec();
+    ShowImportReport(report, this);
 }

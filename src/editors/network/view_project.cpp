@@ -11,18 +11,7 @@
 #include <cmath>
 
 namespace {
-
 constexpr int PauseFactor = 4; // of the time that the last refresh took
-
-bool SameLocations(const std::vector<CMapLocation>& a, const std::vector<CMapLocation>& b)
-{
-    const auto same = [](double x, double y) { return x == y || (std::isnan(x) && std::isnan(y)); };
-    return std::equal(a.begin(), a.end(), b.begin(), b.end(), [&](const CMapLocation& x, const CMapLocation& y) {
-        return x.kind == y.kind && x.chainage == y.chainage && same(x.second, y.second) && x.branch == y.branch &&
-               x.file == y.file;
-    });
-}
-
 } // namespace
 
 // ---- requests ----------------------------------------------------------------------------------
@@ -35,31 +24,23 @@ LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
         LocationsChanged();
         return 0;
     }
-    if (request == KsRequest::LoadLocations)
-        return 0; // a network has branches, but no list of locations
-    const bool known = request == KsRequest::FetchLocation || request == KsRequest::BranchNames ||
-                       request == KsRequest::LoadLocationsAndChannel || request == KsRequest::LocationShown;
-    if (!known)
+    using Answer = LRESULT (CNetworkView::*)(CObList&);
+    const Answer answer = request == KsRequest::FetchLocation             ? &CNetworkView::FetchLocation
+                          : request == KsRequest::BranchNames             ? &CNetworkView::ListBranches
+                          : request == KsRequest::LoadLocationsAndChannel ? &CNetworkView::FillChannel
+                          : request == KsRequest::LocationShown           ? &CNetworkView::ShowLocation
+                                                                          : nullptr;
+    if (!answer) // a network has branches, but no list of locations
         return CTablesView::OnRequest(request, package);
-    if (!package.objects) {
-        qDebug("network: request %llu without a list", static_cast<unsigned long long>(request));
-        return 0;
-    }
-    switch (request) {
-    case KsRequest::FetchLocation:
-        return FetchLocation(*package.objects);
-    case KsRequest::BranchNames:
-        return ListBranches(*package.objects);
-    case KsRequest::LoadLocationsAndChannel:
-        return FillChannel(*package.objects);
-    default:
-        return ShowLocation(*package.objects);
-    }
+    if (package.objects)
+        return (this->*answer)(*package.objects);
+    qDebug("network: request %llu without a list", static_cast<unsigned long long>(request));
+    return 0;
 }
 
-LRESULT CNetworkView::FetchLocation(CObList& objects) const
+LRESULT CNetworkView::FetchLocation(CObList& objects)
 {
-    const auto picked = m_map->Picked();
+    const auto picked = m_map->Marks().Picked();
     if (!picked)
         return 0;
     auto item = std::make_unique<CKvrCBELocation>();
@@ -69,7 +50,7 @@ LRESULT CNetworkView::FetchLocation(CObList& objects) const
     return 1;
 }
 
-LRESULT CNetworkView::ListBranches(CObList& objects) const
+LRESULT CNetworkView::ListBranches(CObList& objects)
 {
     QStringList branches;
     for (const CNetworkBranch& branch : Document()->Network().branches)
@@ -79,7 +60,7 @@ LRESULT CNetworkView::ListBranches(CObList& objects) const
 }
 
 /// Radius and width where the list lacks them and the tables have them.
-LRESULT CNetworkView::FillChannel(const CObList& objects) const
+LRESULT CNetworkView::FillChannel(CObList& objects)
 {
     QHash<QString, const CNetworkBranch*> branches;
     for (const CNetworkBranch& branch : Document()->Network().branches)
@@ -102,7 +83,7 @@ LRESULT CNetworkView::FillChannel(const CObList& objects) const
     return filled;
 }
 
-LRESULT CNetworkView::ShowLocation(const CObList& objects)
+LRESULT CNetworkView::ShowLocation(CObList& objects)
 {
     const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
     if (item)
@@ -149,25 +130,29 @@ void CNetworkView::RefreshLocations()
     time.start();
     auto locations = m_source->Fetch();
     // Of what the user edits most are values, of which the map shows nothing.
-    if (!SameLocations(locations, m_map->Locations()))
-        m_map->SetLocations(std::move(locations));
+    if (locations != m_map->Marks().Locations())
+        m_map->Marks().SetLocations(std::move(locations));
     // Where that takes long, it waits until there is a pause in the changes.
     m_refresh.setInterval(int(std::max<qint64>(RefreshDelay, PauseFactor * time.elapsed())));
 }
 
+/// A copy, for the map's own list may change meanwhile.
+void CNetworkView::Send(WPARAM request, CMapLocation location)
+{
+    m_source->Send(request, location);
+    LocationsChanged();
+}
+
 void CNetworkView::DeleteLocation()
 {
-    if (!m_map->Selected())
-        return;
-    const CMapLocation location = *m_map->Selected(); // the map's own list may change meanwhile
-    m_source->Delete(location);
-    LocationsChanged();
+    if (const CMapLocation* selected = m_map->Marks().Selected())
+        Send(KsRequest::DeleteData, *selected);
 }
 
 /// The table follows the map.
 void CNetworkView::PickedChanged()
 {
-    const auto picked = m_map->Picked();
+    const auto picked = m_map->Marks().Picked();
     const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
     if (branch >= 0 && branch != CurrentBranch() && !IsEditing()) // what is refused stays in its cell
         m_branches->SetCurrentCell(branch + 1, BranchName + 1);
@@ -176,16 +161,12 @@ void CNetworkView::PickedChanged()
 std::unique_ptr<QMenu> CNetworkView::MapMenu()
 {
     auto menu = std::make_unique<QMenu>(this);
-    if (m_map->Selected()) {
-        const CMapLocation location = *m_map->Selected();
-        connect(menu->addAction(tr("&Show in HD Parameters")), &QAction::triggered, this,
-                [this, location] { m_source->Show(location); });
-        QAction* remove = menu->addAction(tr("&Delete Location"));
-        remove->setShortcut(Qt::Key_Delete);
-        connect(remove, &QAction::triggered, this, &CNetworkView::DeleteLocation);
+    if (const CMapLocation* selected = m_map->Marks().Selected()) {
+        menu->addAction(tr("&Show in HD Parameters"), this, [this, location = *selected] { m_source->Show(location); });
+        menu->addAction(tr("&Delete Location"), Qt::Key_Delete, this, &CNetworkView::DeleteLocation);
         menu->addSeparator();
     }
-    const auto picked = m_map->Picked();
+    const auto picked = m_map->Marks().Picked();
     const QStringList files = picked ? m_source->Files() : QStringList();
     if (files.isEmpty())
         return menu;
@@ -194,12 +175,9 @@ std::unique_ptr<QMenu> CNetworkView::MapMenu()
         // With one HD document there is nothing to choose.
         QMenu* among = files.size() > 1 ? insert->addMenu(LocationKindName(kind)) : insert;
         for (const QString& file : files) {
-            const CMapLocation location{picked->branch, picked->chainage, kind, file, KsUnset};
-            QAction* action = among->addAction(files.size() > 1 ? QFileInfo(file).fileName() : LocationKindName(kind));
-            connect(action, &QAction::triggered, this, [this, location] {
-                m_source->Insert(location);
-                LocationsChanged();
-            });
+            among->addAction(
+                files.size() > 1 ? QFileInfo(file).fileName() : LocationKindName(kind), this,
+                [this, location = CMapLocation{*picked, kind, file}] { Send(KsRequest::InsertData, location); });
         }
     }
     return menu;

@@ -35,12 +35,9 @@ protected:
         MakeGisFile(path.endsWith(".shp") ? "ESRI Shapefile" : "GPKG", path, layers);
         return path;
     }
-    static std::string Notes(const std::vector<CImportNote>& notes)
+    static std::string Notes(const QStringList& notes)
     {
-        QStringList texts;
-        for (const CImportNote& note : notes)
-            texts << note.line + ": " + note.what;
-        return texts.join('\n').toStdString();
+        return notes.join('\n').toStdString();
     }
     static QStringList Names(const CImportPlan& plan)
     {
@@ -117,7 +114,7 @@ TEST_F(ImportTest, EveryLineBecomesABranchOrIsNamedWithAReason)
     const CImportPlan plan = PlanOf(Rivers, {}, network);
     EXPECT_EQ(Names(plan), (QStringList{"Große Elbe 100-600", "MAIN (2) 0-90", "Branch 0-10", "große elbe (2) 0-10"}));
     EXPECT_EQ(plan.branches[1].line.size(), 2u);
-    EXPECT_EQ(plan.leftOut.size(), 4u);
+    EXPECT_EQ(plan.leftOut.size(), 4);
     const std::string left = Notes(plan.leftOut), changed = Notes(plan.changed);
     for (const char* note :
          {"\"LAKE\" (feature 4): is no line (Point).", "\"DRY\" (feature 5): has no geometry.",
@@ -228,7 +225,7 @@ TEST_F(ImportTest, DamagedFilesSayWhichFeaturesAreMissing)
     const CGisLayer shapes = Library().Read(path).layers.at(0);
     EXPECT_FALSE(shapes.IsComplete());
     const CImportPlan plan = PlanImport(shapes, Library().MapOf(shapes, shapes.system), {ProposeFields(shapes)}, {});
-    EXPECT_EQ(plan.branches.size() + plan.leftOut.size(), 20u);
+    EXPECT_EQ(plan.branches.size() + std::size_t(plan.leftOut.size()), 20u);
     EXPECT_THAT(Notes(plan.leftOut), HasSubstr("\"R19\" (feature 19): could not be read: Error in fread()"));
 
     Make("table.shp", {layer});

@@ -30,28 +30,28 @@ TEST_F(NetworkTest, AClickPicksTheNearestPlaceOfABranch)
     CNetworkView* view = Open();
     CNetworkMap* map = view->Map();
     int heard = 0;
-    QObject::connect(map, &CNetworkMap::PickedChanged, [&] { ++heard; });
+    QObject::connect(&map->Marks(), &CMapSelection::PickedChanged, [&] { ++heard; });
     const QPoint at = PointOf(map, "MAIN", 6000).toPoint();
     QTest::mouseClick(map, Qt::LeftButton, {}, at + QPoint(-7, 0)); // west of a stretch to the north
-    ASSERT_TRUE(map->Picked());
-    EXPECT_EQ(map->Picked()->branch, "MAIN");
-    EXPECT_NEAR(map->Picked()->chainage, 6000, 10); // within a pixel
+    ASSERT_TRUE(map->Marks().Picked());
+    EXPECT_EQ(map->Marks().Picked()->branch, "MAIN");
+    EXPECT_NEAR(map->Marks().Picked()->chainage, 6000, 10); // within a pixel
     EXPECT_EQ(heard, 1);
     EXPECT_EQ(view->Branches()->currentIndex().row(), 0);
     Click(map, map->WindowPoint({"SIDE", 100}));
-    EXPECT_EQ(map->Picked()->branch, "SIDE");
+    EXPECT_EQ(map->Marks().Picked()->branch, "SIDE");
     EXPECT_EQ(view->Branches()->currentIndex().row(), 1);            // the table follows
     QTest::mouseClick(map, Qt::LeftButton, {}, at + QPoint(-40, 0)); // too far from everything
-    EXPECT_FALSE(map->Picked());
+    EXPECT_FALSE(map->Marks().Picked());
     Click(map, map->WindowPoint({"SIDE", 100}));
     QTest::mousePress(map, Qt::LeftButton, {}, at); // a drag picks nothing
     QTest::mouseMove(map, at + QPoint(30, 0));
     QTest::mouseMove(map, at + QPoint(50, 10));
     QTest::mouseRelease(map, Qt::LeftButton, {}, at + QPoint(50, 10));
-    EXPECT_EQ(map->Picked()->branch, "SIDE");
+    EXPECT_EQ(map->Marks().Picked()->branch, "SIDE");
     EXPECT_NEAR(PointOf(map, "MAIN", 6000).x(), at.x() + 50, 1);
     QTest::keyClick(map, Qt::Key_Escape);
-    EXPECT_FALSE(map->Picked());
+    EXPECT_FALSE(map->Marks().Picked());
 }
 
 TEST_F(NetworkTest, KeysAndWheelMoveTheMap)
@@ -127,44 +127,44 @@ TEST_F(NetworkTest, TheLegendCoversNoBranchWhenAllIsShown)
 TEST_F(NetworkTest, OnlyLocationsCountAndPlacesAreSaidWithTheirUnit)
 {
     CNetworkView* view = Open();
-    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->PlacedCount() == 2; }));
-    EXPECT_EQ(view->Map()->Locations().size(), 4u) << "two of them are not in this network; blank lines are nowhere";
-    EXPECT_EQ(PlaceText("MAIN", 1234.56), "MAIN 1234.6 m");
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Marks().Placed().size() == 2; }));
+    EXPECT_EQ(view->Map()->Marks().Locations().size(), 4u) << "two of them are not in this network; blank lines are nowhere";
+    EXPECT_EQ(PlaceText({"MAIN", 1234.56}), "MAIN 1234.6 m");
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
-    EXPECT_EQ(PlaceText("MAIN", 304.8), "MAIN 1000.0 ft");
+    EXPECT_EQ(PlaceText({"MAIN", 304.8}), "MAIN 1000.0 ft");
 }
 
 TEST_F(NetworkTest, WithoutAMousePlacesAndLocationsAreReached)
 {
     CNetworkView* view = Open();
     CNetworkMap* map = view->Map();
-    ASSERT_TRUE(QTest::qWaitFor([&] { return map->PlacedCount() == 2; }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return map->Marks().Placed().size() == 2; }));
     QTest::keyClick(map, Qt::Key_Space);
-    ASSERT_TRUE(map->Picked());
-    EXPECT_EQ(map->Picked()->branch, "MAIN");
+    ASSERT_TRUE(map->Marks().Picked());
+    EXPECT_EQ(map->Marks().Picked()->branch, "MAIN");
     const auto step = [&](Qt::Key key) {
         QTest::keyClick(map, key);
-        return map->Selected() ? map->Selected()->chainage : -1;
+        return map->Marks().Selected() ? map->Marks().Selected()->chainage : -1;
     };
     EXPECT_EQ(step(Qt::Key_N), 2000);
     EXPECT_EQ(step(Qt::Key_N), 5000);
     EXPECT_EQ(step(Qt::Key_N), 2000); // around
     EXPECT_EQ(step(Qt::Key_P), 5000);
     QTest::keyClick(map, Qt::Key_Space);
-    EXPECT_EQ(map->Selected(), nullptr);
-    map->SetLocations({});
+    EXPECT_EQ(map->Marks().Selected(), nullptr);
+    map->Marks().SetLocations({});
     QTest::keyClick(map, Qt::Key_N);
-    EXPECT_EQ(map->Selected(), nullptr);
+    EXPECT_EQ(map->Marks().Selected(), nullptr);
 }
 
 TEST_F(NetworkTest, AMovedMapLooksLikeOneThatIsPaintedAnew)
 {
     hdLocations.clear();
     for (int i = 0; i < 70; ++i)
-        hdLocations.push_back({"MAIN", 1000.0 + 100 * i, i % HDDataTypeCount, {}, KsUnset});
+        hdLocations.push_back({"MAIN", 1000.0 + 100 * i, i % HDDataTypeCount, {}});
     CNetworkView* view = Open();
     CNetworkMap* map = view->Map();
-    ASSERT_TRUE(QTest::qWaitFor([&] { return map->PlacedCount() == 70; }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return map->Marks().Placed().size() == 70; }));
     map->Zoom(2.3);
     for (const QPoint& way : {QPoint(60, 0), QPoint(-130, 45), QPoint(0, -200), QPoint(7, 3), QPoint(5000, 0)}) {
         map->Pan(way);
@@ -212,7 +212,7 @@ TEST_F(NetworkTest, AnEmptyNetworkAndOneWithoutExtentCanBeShown)
             QTest::keyClick(view->Map(), key);
         QTest::mouseClick(view->Map(), Qt::LeftButton, {}, view->Map()->rect().center());
         EXPECT_FALSE(Picture(view->Map()).isNull());
-        EXPECT_FALSE(view->Map()->Picked());
+        EXPECT_FALSE(view->Map()->Marks().Picked());
     }
 }
 

@@ -152,11 +152,11 @@ protected:
     inline static NetworkTest* current = nullptr;
     bool hdOpen = true;
     std::vector<CMapLocation> hdLocations{
-        {"MAIN", 2000, HDInitialData, {}, KsUnset}, {"MAIN", 5000, HDBedData, {}, KsUnset},
-        {"MAIN", 9000, HDBedData, {}, KsUnset},                                                  // behind the end
-        {"LOST", 100, HDWindData, {}, KsUnset},     {"SIDE", 250, HDDataTypeCount, {}, KsUnset}, // no such kind
-        {"", 100, HDInitialData, {}, KsUnset}, // lines that are not complete
-        {"MAIN", 1e10, HDInitialData, {}, KsUnset}};
+        {"MAIN", 2000, HDInitialData, {}}, {"MAIN", 5000, HDBedData, {}},
+        {"MAIN", 9000, HDBedData, {}},                                                  // behind the end
+        {"LOST", 100, HDWindData, {}},     {"SIDE", 250, HDDataTypeCount, {}}, // no such kind
+        {"", 100, HDInitialData, {}}, // lines that are not complete
+        {"MAIN", 1e10, HDInitialData, {}}};
     FakeHDDoc hdDoc;
     FakeHDView hdView; // goes before its document
 };

@@ -11,7 +11,7 @@ TEST_F(NetworkTest, ThePickedPlaceIsFetched)
     CObList objects;
     EXPECT_EQ(Ask(view, KsRequest::FetchLocation, &objects), 0); // nothing picked yet
     EXPECT_TRUE(objects.empty());
-    view->Map()->SetPicked(CNetworkMap::Place{"MAIN", 2500});
+    view->Map()->Marks().Pick(CMapPlace{"MAIN", 2500});
     EXPECT_EQ(Ask(view, KsRequest::FetchLocation, &objects), 1);
     ASSERT_EQ(objects.size(), 1u);
     const auto* place = dynamic_cast<const CKvrCBELocation*>(objects[0].get());
@@ -64,10 +64,10 @@ TEST_F(NetworkTest, ABranchIsTheOneWhoseCapitalsAreTheSame)
 {
     QByteArray text(SmallNetwork);
     text.replace("\"MAIN\"", "\"Wei\u00dfe Elster\"").replace("\"SIDE\"", "\"K\u0131z\u0131l\u0131rmak\"");
-    hdLocations = {{"WEISSE ELSTER", 2000, HDInitialData, {}, KsUnset}, {"KIZILIRMAK", 250, HDBedData, {}, KsUnset}};
+    hdLocations = {{"WEISSE ELSTER", 2000, HDInitialData, {}}, {"KIZILIRMAK", 250, HDBedData, {}}};
     CNetworkView* view = Open(text);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Locations().size() == 2; }));
-    EXPECT_EQ(view->Map()->PlacedCount(), 2u) << "none is outside this network";
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Marks().Locations().size() == 2; }));
+    EXPECT_EQ(view->Map()->Marks().Placed().size(), 2u) << "none is outside this network";
     CObList channel, names;
     channel.push_back(Location("WEISSE ELSTER", 2000));
     EXPECT_EQ(Ask(view, KsRequest::LoadLocationsAndChannel, &channel), 1);
@@ -111,38 +111,38 @@ TEST_F(NetworkTest, StrangeRequestsDoNothing)
 TEST_F(NetworkTest, LocationsAreFetchedAtTheStartAndWhenDataChange)
 {
     CNetworkView* view = Open();
-    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Locations().size() == 4; }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Marks().Locations().size() == 4; }));
     EXPECT_TRUE(log.contains("get data 1"));
-    EXPECT_EQ(view->Map()->PlacedCount(), 2u);
-    EXPECT_EQ(view->Map()->Locations()[0].file, hdDoc.GetPathName());
+    EXPECT_EQ(view->Map()->Marks().Placed().size(), 2u);
+    EXPECT_EQ(view->Map()->Marks().Locations()[0].file, hdDoc.GetPathName());
 
-    hdLocations.push_back({"Side", 250, HDMixingData, {}, KsUnset}); // in whatever case
+    hdLocations.push_back({"Side", 250, HDMixingData, {}}); // in whatever case
     log.clear();
     for (int i = 0; i < 5; ++i)
         Ask(view, KsRequest::DataChanged, nullptr);
     EXPECT_FALSE(log.contains("get data 1")); // not within the sender's message
-    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->PlacedCount() == 3; }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Marks().Placed().size() == 3; }));
     EXPECT_EQ(log.count("get data 1"), 1);
 
     hdOpen = false; // closed meanwhile
     Ask(view, KsRequest::DataChanged, nullptr);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Locations().empty(); }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Marks().Locations().empty(); }));
     hdOpen = true;
     KsClearExports(); // no editor for them
     Ask(view, KsRequest::DataChanged, nullptr);
     QTest::qWait(120);
-    EXPECT_TRUE(view->Map()->Locations().empty());
+    EXPECT_TRUE(view->Map()->Marks().Locations().empty());
 }
 
 TEST_F(NetworkTest, ALocationIsDeletedShownAndInsertedInTheDocumentItCameFrom)
 {
     CNetworkView* view = Open();
     CNetworkMap* map = view->Map();
-    ASSERT_TRUE(QTest::qWaitFor([&] { return map->PlacedCount() == 2; }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return map->Marks().Placed().size() == 2; }));
     Click(map, map->SymbolPoint(1));
-    ASSERT_NE(map->Selected(), nullptr);
-    EXPECT_EQ(map->Selected()->kind, HDBedData);
-    EXPECT_EQ(map->Picked(), (CNetworkMap::Place{"MAIN", 5000}));
+    ASSERT_NE(map->Marks().Selected(), nullptr);
+    EXPECT_EQ(map->Marks().Selected()->kind, HDBedData);
+    EXPECT_EQ(map->Marks().Picked(), (CMapPlace{"MAIN", 5000}));
 
     const auto choose = [&](std::initializer_list<const char*> path) {
         const auto menu = view->MapMenu();
@@ -168,13 +168,13 @@ TEST_F(NetworkTest, ALocationIsDeletedShownAndInsertedInTheDocumentItCameFrom)
     // The line is gone from the document; so is the selection, once that is known.
     hdLocations.erase(hdLocations.begin() + 1);
     Ask(view, KsRequest::DataChanged, nullptr);
-    ASSERT_TRUE(QTest::qWaitFor([&] { return map->Selected() == nullptr; }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return map->Marks().Selected() == nullptr; }));
     hdView.requests.clear();
     QTest::keyClick(map, Qt::Key_Delete);
     EXPECT_TRUE(hdView.requests.isEmpty());
 
     Click(map, map->SymbolPoint(0));
-    ASSERT_NE(map->Selected(), nullptr);
+    ASSERT_NE(map->Marks().Selected(), nullptr);
     hdDoc.SetPathName(Write("river.hdkv", "")); // saved in another case, which the map has not heard
     QTest::keyClick(map, Qt::Key_Delete);
     EXPECT_EQ(hdView.requests, QStringList("81 MAIN 2000 0 from networkView"));
@@ -182,7 +182,7 @@ TEST_F(NetworkTest, ALocationIsDeletedShownAndInsertedInTheDocumentItCameFrom)
     hdOpen = false; // its document has been closed, which the map has not heard
     QTest::keyClick(map, Qt::Key_Delete);
     EXPECT_TRUE(hdView.requests.isEmpty());
-    map->SetPicked(std::nullopt);
+    map->Marks().Pick(std::nullopt);
 }
 
 TEST_F(NetworkTest, AShownLocationComesIntoSight)

@@ -209,9 +209,9 @@ TEST_F(NetworkTest, HeldKeysDoNotExtendASelectionThatTheMapMakes)
          {std::pair(Qt::Key_Control, Qt::ControlModifier), std::pair(Qt::Key_Shift, Qt::ShiftModifier)}) {
         Select(view->Branches(), 0);
         QTest::keyPress(view->window()->windowHandle(), key, modifier);
-        view->Map()->SetPicked(CNetworkMap::Place{"SIDE", 100});
+        view->Map()->Marks().Pick(CMapPlace{"SIDE", 100});
         EXPECT_EQ(selected(), "1") << modifier;
-        view->Map()->SetPicked(CNetworkMap::Place{"MAIN", 2000});
+        view->Map()->Marks().Pick(CMapPlace{"MAIN", 2000});
         EXPECT_EQ(selected(), "0") << modifier;
         QTest::keyRelease(view->window()->windowHandle(), key);
     }

@@ -104,10 +104,6 @@
         <translation>インポート(&amp;I)</translation>
     </message>
     <message>
-        <source>C&amp;opy</source>
-        <translation>コピー(&amp;O)</translation>
-    </message>
-    <message>
         <source>(none: numbered)</source>
         <translation>(なし: 番号を付ける)</translation>
     </message>
@@ -158,21 +154,6 @@
     <message>
         <source>The network names the coordinate system &quot;%1&quot;, which is not known here.</source>
         <translation>河道網に記された座標系「%1」は不明です。</translation>
-    </message>
-</context>
-<context>
-    <name>CImportReportDialog</name>
-    <message>
-        <source>Imported Branches</source>
-        <translation>インポートした河川</translation>
-    </message>
-    <message>
-        <source>C&amp;opy</source>
-        <translation>コピー(&amp;O)</translation>
-    </message>
-    <message>
-        <source>&amp;Close</source>
-        <translation>閉じる(&amp;C)</translation>
     </message>
 </context>
 <context>
@@ -543,6 +524,18 @@
     <message>
         <source>Report of the import</source>
         <translation>インポートの報告</translation>
+    </message>
+    <message>
+        <source>Imported Branches</source>
+        <translation>インポートした河川</translation>
+    </message>
+    <message>
+        <source>C&amp;opy</source>
+        <translation>コピー(&amp;O)</translation>
+    </message>
+    <message>
+        <source>&amp;Close</source>
+        <translation>閉じる(&amp;C)</translation>
     </message>
 </context>
 <context>
