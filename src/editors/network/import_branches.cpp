@@ -138,18 +138,13 @@ private:
         Change(text);
     }
 
-    QString FreeName(const QString& wanted) const
-    {
-        QString name = wanted;
-        for (int number = 2; m_taken.contains(KsBranchKey(name)); ++number)
-            name = QStringLiteral("%1 (%2)").arg(wanted).arg(number);
-        return name;
-    }
-
     CNetworkBranch& NewBranch(const QString& wanted, const CGisLine& line)
     {
         CNetworkBranch& branch = plan.branches.emplace_back();
-        branch.name = FreeName(wanted).toStdString();
+        QString name = wanted;
+        for (int number = 2; m_taken.contains(KsBranchKey(name)); ++number)
+            name = QStringLiteral("%1 (%2)").arg(wanted).arg(number);
+        branch.name = name.toStdString();
         branch.line = line;
         branch.end = branch.Length();
         m_taken << KsBranchKey(branch.Name());

@@ -293,15 +293,12 @@ void CImportDialog::ShowPlan()
     if (!m_network.system.isEmpty() && !m_own.IsKnown())
         warnings
             << tr("The network names the coordinate system \"%1\", which is not known here.").arg(m_network.system);
-    if (m_import.layer) {
-        for (const CImportRemark& remark : ImportRemarks(m_import, m_network)) {
-            if (remark.warning && !warnings.contains(remark.text))
-                warnings << remark.text;
-        }
-    }
+    const CImportReport report = m_import.layer ? ReportOf(m_import, m_network) : CImportReport();
+    warnings << report.warnings;
+    warnings.removeDuplicates();
     m_warning->setText(warnings.join(u'\n'));
     m_warning->setVisible(!warnings.isEmpty());
-    m_report->setPlainText(m_import.layer ? ImportReport(m_import, m_network) : QString());
+    m_report->setPlainText(report.text);
     const bool whole = m_import.layer && (m_import.layer->IsComplete() || m_damaged->isChecked());
     m_ok->setEnabled(WhyNot().isEmpty() && whole);
 }

@@ -30,118 +30,123 @@ QString Factor(double value)
     return QString::number(value, 'f', std::abs(value - 1) < 0.01 ? 4 : 2);
 }
 
-CImportRemark SystemRemark(const CImport& import)
+class CTeller
 {
-    const CGisSystem& from = import.layer->system;
-    if (!from.IsKnown())
-        return {Text::tr("The layer names no coordinate system: its numbers are taken as meters on a map."), true};
-    if (from.definition == import.target.definition)
-        return {Text::tr("Coordinate system: %1, as in the file.").arg(from.name)};
-    return {Text::tr("Coordinate system: %1, projected from %2.").arg(import.target.name, from.name)};
-}
+public:
+    CTeller(const CImport& import, const CNetwork& network) : m_import(import), m_network(network) {}
 
-/// How lengths on the map compare with the ground: nothing when that is not known.
-void AddScale(const CGisMap& map, std::vector<CImportRemark>& remarks)
-{
-    constexpr double notable = 0.01, spread = 0.01;
-    if (std::isnan(map.scale))
-        return;
-    QString text = Text::tr("Lengths on this map are %1 times those on the ground").arg(Factor(map.scale));
-    if (map.largest - map.least > spread)
-        text += Text::tr(" (from %1 to %2 by line)").arg(Factor(map.least), Factor(map.largest));
-    text += Text::tr(".");
-    const bool warning = std::max(std::abs(map.least - 1), std::abs(map.largest - 1)) > notable;
-    if (warning)
-        text += u' ' + Text::tr("So are chainages that follow from them. Another coordinate system avoids this.");
-    remarks.push_back({text, warning});
-}
+    CImportReport Report()
+    {
+        Say(Text::tr("%1, layer \"%2\"").arg(m_import.file, m_import.layer->name));
+        double whole = 0;
+        QStringList branches;
+        for (const CNetworkBranch& branch : m_import.plan.branches) {
+            whole += branch.Length();
+            branches << Text::tr("%1: %2 long, chainages from %3 to %4")
+                            .arg(branch.Name(), Length(branch.Length()), Length(branch.start), Length(branch.end));
+        }
+        Say(Text::tr("Branches: %1, in all %2").arg(branches.size()).arg(Length(whole)));
+        if (!m_import.map.error.isEmpty()) {
+            Say(m_import.map.error, true);
+        } else {
+            TellSystem();
+            TellScale();
+            TellErrors();
+            TellDistance();
+        }
+        List(Text::tr("Left out"), m_import.plan.leftOut);
+        List(Text::tr("Changed"), m_import.plan.changed);
+        List(Text::tr("Branches"), branches);
+        return m_report;
+    }
 
-QString MissingFeatures(const CGisLayer& layer)
-{
-    const auto read = qint64(layer.features.size());
-    return read < layer.announced
-               ? Text::tr("The file counts %1 features, but only %2 could be read.").arg(layer.announced).arg(read)
-               : QString();
-}
+private:
+    void Say(const QString& text, bool warning = false)
+    {
+        m_report.text += text + u'\n';
+        if (warning)
+            m_report.warnings << text;
+    }
 
-void AddErrors(const CGisLayer& layer, std::vector<CImportRemark>& remarks)
-{
-    if (layer.IsComplete())
-        return;
-    const auto damaged = std::count_if(layer.features.begin(), layer.features.end(),
-                                       [](const CGisFeature& feature) { return !feature.error.isEmpty(); });
-    QStringList texts{Text::tr("The file is incomplete or damaged.")};
-    if (damaged > 0)
-        texts << Text::tr("Features with errors: %1 of %2.").arg(damaged).arg(layer.features.size());
-    texts << MissingFeatures(layer) << layer.errors;
-    texts.removeAll(QString());
-    remarks.push_back({texts.join(u' '), true});
-}
+    void TellSystem()
+    {
+        const CGisSystem& from = m_import.layer->system;
+        if (!from.IsKnown())
+            Say(Text::tr("The layer names no coordinate system: its numbers are taken as meters on a map."), true);
+        else if (from.definition == m_import.target.definition)
+            Say(Text::tr("Coordinate system: %1, as in the file.").arg(from.name));
+        else
+            Say(Text::tr("Coordinate system: %1, projected from %2.").arg(m_import.target.name, from.name));
+    }
 
-double Gap(double low, double high, double otherLow, double otherHigh)
-{
-    return std::max({0.0, otherLow - high, low - otherHigh});
-}
+    /// How lengths on the map compare with the ground: nothing when that is not known.
+    void TellScale()
+    {
+        constexpr double notable = 0.01, spread = 0.01;
+        const CGisMap& map = m_import.map;
+        if (std::isnan(map.scale))
+            return;
+        QString text = Text::tr("Lengths on this map are %1 times those on the ground").arg(Factor(map.scale));
+        if (map.largest - map.least > spread)
+            text += Text::tr(" (from %1 to %2 by line)").arg(Factor(map.least), Factor(map.largest));
+        text += Text::tr(".");
+        const bool warning = std::max(std::abs(map.least - 1), std::abs(map.largest - 1)) > notable;
+        if (warning)
+            text += u' ' + Text::tr("So are chainages that follow from them. Another coordinate system avoids this.");
+        Say(text, warning);
+    }
 
-/// Branches that lie farther from the network than either is large are hardly in its coordinate system.
-void AddDistance(const CImport& import, const CNetwork& network, std::vector<CImportRemark>& remarks)
-{
-    CNetwork added;
-    added.branches = import.plan.branches;
-    const QRectF there = network.Extent(), here = added.Extent();
-    if (there.isNull() || here.isNull())
-        return;
-    const double gap = std::hypot(Gap(here.left(), here.right(), there.left(), there.right()),
-                                  Gap(here.top(), here.bottom(), there.top(), there.bottom()));
-    const auto across = [](const QRectF& box) { return std::hypot(box.width(), box.height()); };
-    if (gap > std::max(across(here), across(there)))
-        remarks.push_back(
-            {Text::tr("These lines lie %1 away from the branches of the network: they may be in different "
-                      "coordinate systems.")
-                 .arg(Length(std::round(gap))),
-             true});
-}
+    void TellErrors()
+    {
+        const CGisLayer& layer = *m_import.layer;
+        if (layer.IsComplete())
+            return;
+        const auto read = qint64(layer.features.size());
+        const auto good = std::ranges::count_if(layer.features, &QString::isEmpty, &CGisFeature::error);
+        QStringList texts{Text::tr("The file is incomplete or damaged.")};
+        if (good < read)
+            texts << Text::tr("Features with errors: %1 of %2.").arg(read - good).arg(read);
+        if (read < layer.announced)
+            texts << Text::tr("The file counts %1 features, but only %2 could be read.").arg(layer.announced).arg(read);
+        Say((texts + layer.errors).join(u' '), true);
+    }
 
-void AddList(const QString& title, const QStringList& entries, QStringList& lines)
-{
-    if (entries.isEmpty())
-        return;
-    lines << QString() << QStringLiteral("%1 (%2)").arg(title).arg(entries.size());
-    for (const QString& entry : entries)
-        lines << QStringLiteral("  ") + entry;
-}
+    /// Branches that lie farther from the network than either is large are hardly in its coordinate system.
+    void TellDistance()
+    {
+        CNetwork added;
+        added.branches = m_import.plan.branches;
+        const QRectF there = m_network.Extent(), here = added.Extent(), both = here | there;
+        if (there.isNull() || here.isNull())
+            return;
+        const double gap = std::hypot(std::max(both.width() - here.width() - there.width(), 0.0),
+                                      std::max(both.height() - here.height() - there.height(), 0.0));
+        const auto across = [](const QRectF& box) { return std::hypot(box.width(), box.height()); };
+        if (gap > std::max(across(here), across(there)))
+            Say(Text::tr("These lines lie %1 away from the branches of the network: they may be in different "
+                         "coordinate systems.")
+                    .arg(Length(std::round(gap))),
+                true);
+    }
+
+    void List(const QString& title, const QStringList& entries)
+    {
+        if (!entries.isEmpty())
+            Say(QStringLiteral("\n%1 (%2)").arg(title).arg(entries.size()));
+        for (const QString& entry : entries)
+            Say(QStringLiteral("  ") + entry);
+    }
+
+    const CImport& m_import;
+    const CNetwork& m_network;
+    CImportReport m_report;
+};
 
 } // namespace
 
-std::vector<CImportRemark> ImportRemarks(const CImport& import, const CNetwork& network)
+CImportReport ReportOf(const CImport& import, const CNetwork& network)
 {
-    if (!import.map.error.isEmpty())
-        return {{import.map.error, true}};
-    std::vector<CImportRemark> remarks{SystemRemark(import)};
-    AddScale(import.map, remarks);
-    AddErrors(*import.layer, remarks);
-    AddDistance(import, network, remarks);
-    return remarks;
-}
-
-QString ImportReport(const CImport& import, const CNetwork& network)
-{
-    const CImportPlan& plan = import.plan;
-    double whole = 0;
-    QStringList branches;
-    for (const CNetworkBranch& branch : plan.branches) {
-        whole += branch.Length();
-        branches << Text::tr("%1: %2 long, chainages from %3 to %4")
-                        .arg(branch.Name(), Length(branch.Length()), Length(branch.start), Length(branch.end));
-    }
-    QStringList lines{Text::tr("%1, layer \"%2\"").arg(import.file, import.layer->name),
-                      Text::tr("Branches: %1, in all %2").arg(plan.branches.size()).arg(Length(whole))};
-    for (const CImportRemark& remark : ImportRemarks(import, network))
-        lines << remark.text;
-    AddList(Text::tr("Left out"), plan.leftOut, lines);
-    AddList(Text::tr("Changed"), plan.changed, lines);
-    AddList(Text::tr("Branches"), branches, lines);
-    return lines.join(u'\n') + u'\n';
+    return CTeller(import, network).Report();
 }
 
 QPlainTextEdit* MakeReportField(QDialogButtonBox& buttons)

@@ -17,17 +17,12 @@ struct CImport
     CImportPlan plan;
 };
 
-/// A remark about the import as a whole.
-struct CImportRemark
+struct CImportReport
 {
-    QString text;
-    bool warning = false; // what is imported may not be what the user means
+    QString text;         // coordinates, lengths, completeness; lines left out, lines changed and branches, all by name
+    QStringList warnings; // of these: what is imported may not be what the user means
 };
-
-/// What is to be said of coordinates, lengths and completeness.
-std::vector<CImportRemark> ImportRemarks(const CImport& import, const CNetwork& network);
-/// Remarks, lines left out, lines changed and branches, all by name.
-QString ImportReport(const CImport& import, const CNetwork& network);
+CImportReport ReportOf(const CImport& import, const CNetwork& network);
 
 /// A text to read, and to copy with a button more.
 QPlainTextEdit* MakeReportField(QDialogButtonBox& buttons);

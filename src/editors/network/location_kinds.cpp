@@ -3,7 +3,6 @@
 #include <QCoreApplication>
 #include <QPainter>
 #include <QPainterPath>
-#include <array>
 #include <cmath>
 #include <numbers>
 
@@ -53,31 +52,21 @@ struct KindRow
 
 // Seven colours that people with any colour vision tell apart: M. Okabe, K. Ito, Color Universal Design, 2008. Shapes
 // differ as well.
-const std::array<KindRow, HDDataTypeCount>& Kinds()
-{
-    static const std::array<KindRow, HDDataTypeCount> rows{{
-        {QT_TRANSLATE_NOOP("LocationKinds", "Initial"), 0xff0072b2, [] { return Circle(); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Wind"), 0xff56b4e9, [] { return Polygon(3, 0); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Bed resistance"), 0xffd55e00,
-         [] { return Polygon(4, std::numbers::pi / 4); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Wave"), 0xffcc79a7, [] { return Polygon(4, 0); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Water loss"), 0xff009e73, [] { return Polygon(3, std::numbers::pi); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Flood plain"), 0xfff0e442, [] { return Plus(); }},
-        {QT_TRANSLATE_NOOP("LocationKinds", "Mixing"), 0xffe69f00, [] { return Polygon(5, 0, 0.5); }},
-    }};
-    return rows;
-}
+constexpr KindRow Kinds[HDDataTypeCount] = {
+    {QT_TRANSLATE_NOOP("LocationKinds", "Initial"), 0xff0072b2, [] { return Circle(); }},
+    {QT_TRANSLATE_NOOP("LocationKinds", "Wind"), 0xff56b4e9, [] { return Polygon(3, 0); }},
+    {QT_TRANSLATE_NOOP("LocationKinds", "Bed resistance"), 0xffd55e00, [] { return Polygon(4, std::numbers::pi / 4); }},
+    {QT_TRANSLATE_NOOP("LocationKinds", "Wave"), 0xffcc79a7, [] { return Polygon(4, 0); }},
+    {QT_TRANSLATE_NOOP("LocationKinds", "Water loss"), 0xff009e73, [] { return Polygon(3, std::numbers::pi); }},
+    {QT_TRANSLATE_NOOP("LocationKinds", "Flood plain"), 0xfff0e442, [] { return Plus(); }},
+    {QT_TRANSLATE_NOOP("LocationKinds", "Mixing"), 0xffe69f00, [] { return Polygon(5, 0, 0.5); }},
+};
 
 } // namespace
 
 QString LocationKindName(int kind)
 {
-    return LocationKinds::tr(Kinds().at(std::size_t(kind)).name);
-}
-
-QColor LocationKindColour(int kind)
-{
-    return QColor(Kinds().at(std::size_t(kind)).colour);
+    return LocationKinds::tr(Kinds[kind].name);
 }
 
 QPixmap LocationKindSymbol(int kind, double size, const QColor& outline)
@@ -91,7 +80,7 @@ QPixmap LocationKindSymbol(int kind, double size, const QColor& outline)
     const double radius = size / 2 - line;
     painter.scale(radius, radius);
     painter.setPen(QPen(outline, line / radius, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
-    painter.setBrush(LocationKindColour(kind));
-    painter.drawPath(Kinds().at(std::size_t(kind)).shape());
+    painter.setBrush(QColor(Kinds[kind].colour));
+    painter.drawPath(Kinds[kind].shape());
     return symbol;
 }

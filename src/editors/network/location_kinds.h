@@ -25,6 +25,5 @@ struct CMapLocation : CMapPlace
 
 /// The kind's name in the user's language.
 QString LocationKindName(int kind);
-QColor LocationKindColour(int kind);
 /// The kind's symbol, `size` pixels wide, with an outline that sets it off from the map and from other symbols.
 QPixmap LocationKindSymbol(int kind, double size, const QColor& outline);

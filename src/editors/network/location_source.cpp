@@ -31,18 +31,16 @@ CObList ItemOf(const CMapLocation& location)
     return objects;
 }
 
-} // namespace
-
-std::vector<CView*> CLocationSource::HDViews() const
+std::vector<CView*> HDViews(CKsProjectView& asking)
 {
-    std::vector<CView*> views = m_document.ProjectViews(&m_view);
+    std::vector<CView*> views = asking.ProjectDoc()->ProjectViews(&asking);
     std::erase_if(views, [](const CView* view) { return !IsHDView(view); });
     return views;
 }
 
-CView* CLocationSource::FindView(const QString& file) const
+CView* FindView(CKsProjectView& asking, const QString& file)
 {
-    for (CView* view : HDViews()) {
+    for (CView* view : HDViews(asking)) {
         if (KsSameFile(view->GetDocument()->GetPathName(), file)) // it may have been saved in another case
             return view;
     }
@@ -50,23 +48,25 @@ CView* CLocationSource::FindView(const QString& file) const
     return nullptr;
 }
 
-QStringList CLocationSource::Files() const
+} // namespace
+
+QStringList LocationSource::Files(CKsProjectView& asking)
 {
     QStringList files;
-    for (const CView* view : HDViews())
+    for (const CView* view : HDViews(asking))
         files << view->GetDocument()->GetPathName();
     files.removeDuplicates();
     return files;
 }
 
-std::vector<CMapLocation> CLocationSource::Fetch() const
+std::vector<CMapLocation> LocationSource::Fetch(CKsProjectView& asking)
 {
     std::vector<CMapLocation> locations;
     auto* getData = KsFindExportAs<decltype(KvrMSGGetData)>("KvrMSGGetData");
     if (!getData)
         return locations;
     QStringList done; // two windows may show one document
-    for (CView* view : HDViews()) {
+    for (CView* view : HDViews(asking)) {
         const QString file = view->GetDocument()->GetPathName();
         if (done.contains(file))
             continue;
@@ -83,17 +83,17 @@ std::vector<CMapLocation> CLocationSource::Fetch() const
     return locations;
 }
 
-void CLocationSource::Send(WPARAM request, const CMapLocation& location) const
+void LocationSource::Send(CKsProjectView& asking, WPARAM request, const CMapLocation& location)
 {
     CObList objects = ItemOf(location);
-    if (CView* receiver = FindView(location.file))
-        m_document.AskView(receiver, request, &m_view, &objects);
+    if (CView* receiver = FindView(asking, location.file))
+        asking.ProjectDoc()->AskView(receiver, request, &asking, &objects);
 }
 
-void CLocationSource::Show(const CMapLocation& location) const
+void LocationSource::Show(CKsProjectView& asking, const CMapLocation& location)
 {
     CObList objects = ItemOf(location);
     auto* select = KsFindExportAs<decltype(KvrMSGSelectData)>("KvrMSGSelectData");
-    if (CView* receiver = select ? FindView(location.file) : nullptr)
+    if (CView* receiver = select ? FindView(asking, location.file) : nullptr)
         select(location.file, receiver, &objects);
 }

@@ -16,8 +16,7 @@ public:
         : m_scene(scene), m_style(style), m_currentBranch(currentBranch), m_pictures(pictures)
     {
         for (int kind = 0; kind < HDDataTypeCount; ++kind)
-            m_symbols[std::size_t(kind)] =
-                LocationKindSymbol(kind, CMapScene::SymbolSize * scene.Ratio(), style.outline);
+            m_symbols[std::size_t(kind)] = LocationKindSymbol(kind, CMapScene::SymbolSize * scene.ratio, style.outline);
     }
 
     /// `part` is in window pixels; `offset` leads from the plane to the window.
@@ -39,9 +38,9 @@ public:
 private:
     void PaintLines(QPainter& painter, const QRectF& part) const
     {
-        const double ratio = m_scene.Ratio(), reach = (CurrentWidth + Casing) * ratio;
+        const double ratio = m_scene.ratio, reach = (CurrentWidth + Casing) * ratio;
         const QRectF near = part.adjusted(-reach, -reach, reach, reach);
-        const auto& lines = m_scene.Lines();
+        const auto& lines = m_scene.lines;
         for (std::size_t i = 0; i < lines.size(); ++i) {
             const std::vector<QPolygonF> parts = lines[i].Clip(near);
             const bool current = int(i) == m_currentBranch;
@@ -50,7 +49,7 @@ private:
             for (const auto& [colour, extra] :
                  {std::pair(m_style.ground, Casing), std::pair(current ? m_style.chosen : m_style.water, 0.0)}) {
                 const bool casing = extra > 0;
-                if (casing && !m_scene.HasCasings())
+                if (casing && !m_scene.casings)
                     continue;
                 // Lines bend so little between their vertices that round joins would look the same, at twice the time.
                 painter.setPen(QPen(colour, (width + extra) * ratio, Qt::SolidLine, casing ? Qt::FlatCap : Qt::RoundCap,
@@ -63,11 +62,11 @@ private:
 
     void PaintArrows(QPainter& painter, const QRectF& part) const
     {
-        const double size = ArrowSize * m_scene.Ratio();
+        const double size = ArrowSize * m_scene.ratio;
         const QRectF near = part.adjusted(-size, -size, size, size);
         painter.setPen(Qt::NoPen);
         painter.setBrush(m_style.dark ? m_style.water.lighter(125) : m_style.water.darker(160));
-        for (const CMapScene::Arrow& arrow : m_scene.Arrows()) {
+        for (const CMapScene::Arrow& arrow : m_scene.arrows) {
             if (!near.contains(arrow.at))
                 continue;
             const QPointF along = size * arrow.direction, across(-along.y(), along.x());
@@ -79,17 +78,17 @@ private:
 
     void PaintSymbols(QPainter& painter, const QRectF& part) const
     {
-        const double size = CMapScene::SymbolSize * m_scene.Ratio(), lanes = 8 * CMapScene::LaneWidth * m_scene.Ratio();
-        if (m_scene.HasLeaders()) {
+        const double size = CMapScene::SymbolSize * m_scene.ratio, lanes = 8 * CMapScene::LaneWidth * m_scene.ratio;
+        if (m_scene.leaders) {
             const QRectF near = part.adjusted(-lanes, -lanes, lanes, lanes);
-            painter.setPen(QPen(m_style.muted, 0.8 * m_scene.Ratio()));
-            for (const CMapScene::Symbol& symbol : m_scene.Symbols()) {
+            painter.setPen(QPen(m_style.muted, 0.8 * m_scene.ratio));
+            for (const CMapScene::Symbol& symbol : m_scene.symbols) {
                 if (near.contains(symbol.at))
                     painter.drawLine(symbol.foot, symbol.at);
             }
         }
         const QRectF near = part.adjusted(-size, -size, size, size);
-        for (const CMapScene::Symbol& symbol : m_scene.Symbols()) {
+        for (const CMapScene::Symbol& symbol : m_scene.symbols) {
             if (!near.contains(symbol.at))
                 continue;
             // On whole pixels, so that it looks the same wherever it is.
@@ -101,9 +100,9 @@ private:
 
     void PaintLabels(QPainter& painter, const QRectF& part) const
     {
-        const double halo = HaloWidth * m_scene.Ratio();
+        const double halo = HaloWidth * m_scene.ratio;
         const QRectF near = part.adjusted(-halo, -halo, halo, halo);
-        const auto& labels = m_scene.Labels();
+        const auto& labels = m_scene.labels;
         for (std::size_t i = 0; i < labels.size(); ++i) {
             if (!near.intersects(labels[i].box))
                 continue;
@@ -125,7 +124,7 @@ private:
         QPainter painter(&picture);
         painter.setRenderHint(QPainter::Antialiasing);
         painter.translate(-box.topLeft());
-        PaintLabel(painter, m_scene.Labels()[label], m_style.text);
+        PaintLabel(painter, m_scene.labels[label], m_style.text);
         painter.end();
         m_pictures.insert(label, new QPixmap(picture), 4 * box.width() * box.height());
         return picture;
@@ -133,8 +132,8 @@ private:
 
     void PaintLabel(QPainter& painter, const CMapScene::Label& label, const QColor& colour) const
     {
-        const double halo = HaloWidth * m_scene.Ratio();
-        const QPainterPath& text = m_scene.Text(label.branch);
+        const double halo = HaloWidth * m_scene.ratio;
+        const QPainterPath& text = m_scene.names[label.branch];
         painter.save();
         painter.translate(label.center);
         painter.rotate(label.angle);
@@ -181,6 +180,6 @@ const QPixmap& CMapBuffer::Paint(const CMapScene& scene, const CMapStyle& style,
         for (const QRect& part : missing)
             map.Paint(painter, part, offset);
     }
-    m_picture.setDevicePixelRatio(scene.Ratio());
+    m_picture.setDevicePixelRatio(scene.ratio);
     return m_picture;
 }

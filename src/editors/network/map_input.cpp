@@ -15,7 +15,6 @@
 namespace {
 
 constexpr int PanStep = 60, PanPage = 400; // pixels of the user
-constexpr double ZoomStep = 1.4;
 
 /// What a key does, whatever the modifiers.
 struct MapKey
@@ -32,9 +31,9 @@ constexpr MapKey Keys[] = {
     {Qt::Key_Down, [](CNetworkMap& map) { map.Pan({0, -PanStep}); }},
     {Qt::Key_PageUp, [](CNetworkMap& map) { map.Pan({0, PanPage}); }},
     {Qt::Key_PageDown, [](CNetworkMap& map) { map.Pan({0, -PanPage}); }},
-    {Qt::Key_Plus, [](CNetworkMap& map) { map.Zoom(ZoomStep); }},
-    {Qt::Key_Equal, [](CNetworkMap& map) { map.Zoom(ZoomStep); }}, // plus without Shift
-    {Qt::Key_Minus, [](CNetworkMap& map) { map.Zoom(1 / ZoomStep); }},
+    {Qt::Key_Plus, [](CNetworkMap& map) { map.Zoom(CNetworkMap::ZoomStep); }},
+    {Qt::Key_Equal, [](CNetworkMap& map) { map.Zoom(CNetworkMap::ZoomStep); }}, // plus without Shift
+    {Qt::Key_Minus, [](CNetworkMap& map) { map.Zoom(1 / CNetworkMap::ZoomStep); }},
     {Qt::Key_Home, [](CNetworkMap& map) { map.FitAll(); }},
     {Qt::Key_Space, [](CNetworkMap& map) { map.PickMiddle(); }},
     {Qt::Key_N, [](CNetworkMap& map) { map.StepLocation(1); }},
@@ -62,23 +61,16 @@ bool CMapInput::eventFilter(QObject*, QEvent* event)
     case QEvent::KeyPress:
         return Key(*static_cast<QKeyEvent*>(event));
     case QEvent::MouseButtonPress:
-        Press(*static_cast<QMouseEvent*>(event));
-        return true;
     case QEvent::MouseMove:
-        Move(*static_cast<QMouseEvent*>(event));
-        return true;
     case QEvent::MouseButtonRelease:
-        Release(*static_cast<QMouseEvent*>(event));
-        return true;
     case QEvent::MouseButtonDblClick:
-        if (const auto* click = static_cast<QMouseEvent*>(event); click->button() == Qt::LeftButton)
-            m_map.ZoomAt(click->position(), ZoomStep * ZoomStep);
+        Mouse(*static_cast<QMouseEvent*>(event));
         return true;
     case QEvent::Wheel: {
         constexpr double notch = 120; // as QWheelEvent counts
         const auto* wheel = static_cast<QWheelEvent*>(event);
         if (wheel->angleDelta().y() != 0)
-            m_map.ZoomAt(wheel->position(), std::pow(ZoomStep, wheel->angleDelta().y() / notch));
+            m_map.ZoomAt(wheel->position(), std::pow(CNetworkMap::ZoomStep, wheel->angleDelta().y() / notch));
         event->accept();
         return true;
     }
@@ -121,31 +113,25 @@ void CMapInput::OpenMenu(const std::optional<QPoint>& at)
     emit m_map.MenuRequested(m_map.mapToGlobal(at ? *at : marked ? marked->toPoint() : m_map.rect().center()));
 }
 
-void CMapInput::Press(const QMouseEvent& event)
-{
-    if (event.button() != Qt::LeftButton && event.button() != Qt::MiddleButton)
-        return;
-    m_pressed = m_dragged = event.position().toPoint();
-    m_pressing = true;
-    m_dragging = false;
-}
-
-void CMapInput::Move(const QMouseEvent& event)
+void CMapInput::Mouse(const QMouseEvent& event)
 {
     const QPoint at = event.position().toPoint();
-    if (m_pressing && !m_dragging && (at - m_pressed).manhattanLength() >= QApplication::startDragDistance()) {
-        m_dragging = true;
-        m_map.setCursor(Qt::ClosedHandCursor);
+    const bool left = event.button() == Qt::LeftButton;
+    if (event.type() == QEvent::MouseButtonDblClick && left) {
+        m_map.ZoomAt(event.position(), CNetworkMap::ZoomStep * CNetworkMap::ZoomStep);
+    } else if (event.type() == QEvent::MouseButtonPress && (left || event.button() == Qt::MiddleButton)) {
+        m_pressed = at;
+        m_dragged.reset();
+    } else if (event.type() == QEvent::MouseMove && m_pressed) {
+        if (!m_dragged && (at - *m_pressed).manhattanLength() >= QApplication::startDragDistance()) {
+            m_dragged = m_pressed;
+            m_map.setCursor(Qt::ClosedHandCursor);
+        }
+        if (m_dragged)
+            m_map.Pan(at - *std::exchange(m_dragged, at));
+    } else if (event.type() == QEvent::MouseButtonRelease && std::exchange(m_pressed, std::nullopt)) {
+        m_map.unsetCursor();
+        if (!std::exchange(m_dragged, std::nullopt) && left)
+            m_map.PickAt(event.position());
     }
-    if (m_dragging)
-        m_map.Pan(at - std::exchange(m_dragged, at));
-}
-
-void CMapInput::Release(const QMouseEvent& event)
-{
-    if (!std::exchange(m_pressing, false))
-        return;
-    m_map.unsetCursor();
-    if (!std::exchange(m_dragging, false) && event.button() == Qt::LeftButton)
-        m_map.PickAt(event.position());
 }

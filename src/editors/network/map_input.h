@@ -22,11 +22,8 @@ protected:
 private:
     bool Key(const QKeyEvent& event);
     void OpenMenu(const std::optional<QPoint>& at);
-    void Press(const QMouseEvent& event);
-    void Move(const QMouseEvent& event);
-    void Release(const QMouseEvent& event);
+    void Mouse(const QMouseEvent& event);
 
     CNetworkMap& m_map;
-    QPoint m_pressed, m_dragged;
-    bool m_pressing = false, m_dragging = false;
+    std::optional<QPoint> m_pressed, m_dragged; // where a button went down, and where the map was dragged to since
 };

@@ -25,9 +25,9 @@ std::vector<CPlacedLocation> PlaceLocations(const CNetworkDoc& document, const s
 /// The names of the branches as outlines around zero, in device pixels.
 std::vector<QPainterPath> NameOutlines(const CNetwork& network, QFont font, double ratio);
 
-class CMapScene
+/// All of it in device pixels.
+struct CMapScene
 {
-public:
     struct Arrow
     {
         QPointF at, direction;
@@ -46,44 +46,24 @@ public:
         std::size_t location;
     };
 
-    /// `ratio`: device pixels a pixel of the user's. `names` outlives the scene.
+    /// `outlines` of the names outlive the scene; `pixels`: of the device a pixel of the user's.
     CMapScene(const CNetwork& network, const std::vector<CPlacedLocation>& placed, const CMapProjection& projection,
-              const std::vector<QPainterPath>& names, double ratio);
-    ~CMapScene();
+              const std::vector<QPainterPath>& outlines, double pixels);
 
-    const std::vector<CPlaneLine>& Lines() const { return m_lines; } // as the network's branches
-    const std::vector<Arrow>& Arrows() const { return m_arrows; }
-    const std::vector<Label>& Labels() const { return m_labels; }
-    const std::vector<Symbol>& Symbols() const { return m_symbols; }
     /// The symbol that is drawn at a place of the plane, of several the one nearest and, of equals, drawn last; null
     /// for none.
     const Symbol* SymbolAt(const QPointF& plane) const;
     /// The symbol of a location; null for one that is not on the map.
     const Symbol* SymbolOf(std::size_t location) const;
-    const QPainterPath& Text(std::size_t branch) const { return m_texts[branch]; }
-    bool HasLeaders() const { return m_leaders; }
-    bool HasCasings() const { return m_casings; }
-    double Ratio() const { return m_ratio; }
 
     static constexpr double SymbolSize = 11, LaneWidth = 10; // pixels of the user
 
-private:
-    void AddSymbols(const std::vector<CPlacedLocation>& placed, const CMapProjection& projection);
-    void AddArrows(const CNetwork& network);
-    void AddObstacles();
-    void AddLabels();
-    void AddLabel(std::size_t branch, double distance, double shift, const QRectF& text);
-    Label LabelAt(std::size_t branch, double distance, double side, const QRectF& text, double& bulge) const;
-
-    double m_ratio;
-    double m_length = 0; // of all lines
-    double m_lanes = 0;  // half the width of the symbols' band
-    bool m_leaders = false, m_casings = false;
-    std::vector<CPlaneLine> m_lines;
-    std::vector<Arrow> m_arrows;
-    std::vector<Label> m_labels;
-    std::vector<Symbol> m_symbols;
-    const std::vector<QPainterPath>& m_texts;
-    class Boxes;
-    std::unique_ptr<Boxes> m_labelBoxes, m_obstacles; // while labels are placed
+    double ratio;                           // device pixels a pixel of the user's
+    const std::vector<QPainterPath>& names; // as the network's branches
+    std::vector<CPlaneLine> lines;          // likewise
+    std::vector<Arrow> arrows;
+    std::vector<Label> labels;
+    std::vector<Symbol> symbols;
+    bool leaders = false; // from symbols to their branch
+    bool casings = false; // around lines
 };

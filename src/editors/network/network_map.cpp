@@ -181,7 +181,7 @@ void CNetworkMap::Unmark()
 /// The pixels of another screen are others.
 void CNetworkMap::ScreenChanged()
 {
-    const double change = devicePixelRatioF() / m_scene->Ratio();
+    const double change = devicePixelRatioF() / m_scene->ratio;
     m_projection.scale *= change;
     m_projection.offset = (QPointF(m_projection.offset) * change).toPoint();
     m_names.clear();
@@ -190,7 +190,7 @@ void CNetworkMap::ScreenChanged()
 
 void CNetworkMap::paintEvent(QPaintEvent*)
 {
-    if (m_scene && m_scene->Ratio() != devicePixelRatioF())
+    if (m_scene && m_scene->ratio != devicePixelRatioF())
         ScreenChanged();
     const CMapStyle style(palette());
     QPainter painter(this);

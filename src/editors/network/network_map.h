@@ -22,6 +22,7 @@ public:
     void SetCurrentBranch(int branch);
 
     void FitAll();
+    static constexpr double ZoomStep = 1.4;
     /// Around the middle of the window.
     void Zoom(double factor) { ZoomAt(QRectF(rect()).center(), factor); }
     void ZoomAt(const QPointF& window, double factor);

@@ -102,12 +102,11 @@ public:
     std::vector<std::size_t> Order() const override
     {
         const auto& channel = Rows();
-        const auto byChainage = [&](std::size_t a, std::size_t b) { return channel[a].chainage < channel[b].chainage; };
+        if (std::ranges::is_sorted(channel, {}, &CChannelRow::chainage))
+            return {};
         std::vector<std::size_t> order(channel.size());
         std::iota(order.begin(), order.end(), 0);
-        if (std::is_sorted(order.begin(), order.end(), byChainage))
-            return {};
-        std::stable_sort(order.begin(), order.end(), byChainage);
+        std::ranges::stable_sort(order, {}, [&channel](std::size_t row) { return channel[row].chainage; });
         return order;
     }
 

@@ -41,7 +41,6 @@ void CNetworkView::OnInitialUpdate()
             menu->exec(at);
     });
     CTablesView::OnInitialUpdate();
-    m_source = std::make_unique<CLocationSource>(*Document(), *this);
     LocationsChanged();
 }
 

@@ -3,7 +3,6 @@
 
 #include "editors/common/tables_view.h"
 #include "editors/network/document.h"
-#include "editors/network/location_source.h"
 #include "editors/network/network_map.h"
 #include "editors/network/network_tables.h"
 
@@ -71,7 +70,6 @@ private:
     CGenGrid *m_branches = nullptr, *m_channel = nullptr;
     int m_channelOf = -1; // the branch whose channel is shown
     QLabel *m_branchTitle = nullptr, *m_channelTitle = nullptr;
-    std::unique_ptr<CLocationSource> m_source;
     static constexpr int RefreshDelay = 60; // milliseconds: shorter than a blink, longer than a burst of changes
     QTimer m_refresh;                       // one fetch for changes that follow one another
     bool m_stale = true;

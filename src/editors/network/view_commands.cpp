@@ -10,8 +10,6 @@
 #include <iterator>
 
 namespace {
-constexpr double ZoomStep = 1.4;
-
 /// What a file holds instead of lines; empty when it has some.
 QString WhyNoLines(const QString& name, const CGisFile& file)
 {
@@ -84,10 +82,10 @@ bool CNetworkView::OnCommand(int id)
         m_map->FitAll();
         break;
     case NetworkCommand::ZoomIn:
-        m_map->Zoom(ZoomStep);
+        m_map->Zoom(CNetworkMap::ZoomStep);
         break;
     case NetworkCommand::ZoomOut:
-        m_map->Zoom(1 / ZoomStep);
+        m_map->Zoom(1 / CNetworkMap::ZoomStep);
         break;
     default:
         return CTablesView::OnCommand(id);
@@ -121,7 +119,7 @@ void CNetworkView::Import(const QString& path)
     CImportDialog dialog(name, file, *library, Document()->Network(), this);
     if (dialog.exec() != QDialog::Accepted)
         return;
-    const QString report = ImportReport(dialog.Import(), Document()->Network());
+    const QString report = ReportOf(dialog.Import(), Document()->Network()).text;
     const auto first = int(Document()->Network().branches.size());
     Document()->AppendBranches(dialog.Import().plan.branches, dialog.NetworkSystem(), tr("Import Branches"));
     m_branches->SetCurrentCell(first + 1, BranchName + 1);

@@ -1,5 +1,6 @@
 // The network's view among other editors: what it answers them, and the locations it gets from the HD documents.
 #include "editors/common/branch_names.h"
+#include "editors/network/location_source.h"
 #include "editors/network/view.h"
 #include "ks/fc/branch_name.h"
 
@@ -24,13 +25,15 @@ LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
         LocationsChanged();
         return 0;
     }
+    if (request == KsRequest::LoadLocations)
+        return 0; // a network has branches, but no list of locations
     using Answer = LRESULT (CNetworkView::*)(CObList&);
     const Answer answer = request == KsRequest::FetchLocation             ? &CNetworkView::FetchLocation
                           : request == KsRequest::BranchNames             ? &CNetworkView::ListBranches
                           : request == KsRequest::LoadLocationsAndChannel ? &CNetworkView::FillChannel
                           : request == KsRequest::LocationShown           ? &CNetworkView::ShowLocation
                                                                           : nullptr;
-    if (!answer) // a network has branches, but no list of locations
+    if (!answer)
         return CTablesView::OnRequest(request, package);
     if (package.objects)
         return (this->*answer)(*package.objects);
@@ -128,7 +131,7 @@ void CNetworkView::RefreshLocations()
     m_stale = false;
     QElapsedTimer time;
     time.start();
-    auto locations = m_source->Fetch();
+    auto locations = LocationSource::Fetch(*this);
     // Of what the user edits most are values, of which the map shows nothing.
     if (locations != m_map->Marks().Locations())
         m_map->Marks().SetLocations(std::move(locations));
@@ -139,7 +142,7 @@ void CNetworkView::RefreshLocations()
 /// A copy, for the map's own list may change meanwhile.
 void CNetworkView::Send(WPARAM request, CMapLocation location)
 {
-    m_source->Send(request, location);
+    LocationSource::Send(*this, request, location);
     LocationsChanged();
 }
 
@@ -162,12 +165,13 @@ std::unique_ptr<QMenu> CNetworkView::MapMenu()
 {
     auto menu = std::make_unique<QMenu>(this);
     if (const CMapLocation* selected = m_map->Marks().Selected()) {
-        menu->addAction(tr("&Show in HD Parameters"), this, [this, location = *selected] { m_source->Show(location); });
+        menu->addAction(tr("&Show in HD Parameters"), this,
+                        [this, location = *selected] { LocationSource::Show(*this, location); });
         menu->addAction(tr("&Delete Location"), Qt::Key_Delete, this, &CNetworkView::DeleteLocation);
         menu->addSeparator();
     }
     const auto picked = m_map->Marks().Picked();
-    const QStringList files = picked ? m_source->Files() : QStringList();
+    const QStringList files = picked ? LocationSource::Files(*this) : QStringList();
     if (files.isEmpty())
         return menu;
     QMenu* insert = menu->addMenu(tr("&Insert Here as"));

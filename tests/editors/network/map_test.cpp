@@ -128,7 +128,8 @@ TEST_F(NetworkTest, OnlyLocationsCountAndPlacesAreSaidWithTheirUnit)
 {
     CNetworkView* view = Open();
     ASSERT_TRUE(QTest::qWaitFor([&] { return view->Map()->Marks().Placed().size() == 2; }));
-    EXPECT_EQ(view->Map()->Marks().Locations().size(), 4u) << "two of them are not in this network; blank lines are nowhere";
+    EXPECT_EQ(view->Map()->Marks().Locations().size(), 4u)
+        << "two of them are not in this network; blank lines are nowhere";
     EXPECT_EQ(PlaceText({"MAIN", 1234.56}), "MAIN 1234.6 m");
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     EXPECT_EQ(PlaceText({"MAIN", 304.8}), "MAIN 1000.0 ft");
@@ -188,7 +189,10 @@ TEST_F(NetworkTest, EveryKindHasAColourAndAShapeOfItsOwn)
     for (int a = 0; a < HDDataTypeCount; ++a) {
         EXPECT_FALSE(LocationKindName(a).isEmpty());
         for (int b = 0; b < a; ++b) {
-            EXPECT_NE(LocationKindColour(a), LocationKindColour(b));
+            const auto colour = [](int kind) {
+                return LocationKindSymbol(kind, 33, Qt::black).toImage().pixel(16, 16);
+            };
+            EXPECT_NE(colour(a), colour(b));
             const QImage one = LocationKindSymbol(a, 33, Qt::black).toImage().convertToFormat(QImage::Format_Alpha8);
             const QImage other = LocationKindSymbol(b, 33, Qt::black).toImage().convertToFormat(QImage::Format_Alpha8);
             int outside = 0; // pixels that only one of them covers
