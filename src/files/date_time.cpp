@@ -17,6 +17,6 @@ bool HDDateTime::IsValid() const
     namespace ch = std::chrono;
     if (Year < 100 || Year > 9999 || Month < 1 || Month > 12 || Day < 1 || Day > 31)
         return false; // also keeps the calendar types inside the ranges that they define
-    const ch::year_month_day date(ch::year(Year), ch::month(unsigned(Month)), ch::day(unsigned(Day)));
+    const ch::year_month_day date{ch::year(Year), ch::month(unsigned(Month)), ch::day(unsigned(Day))};
     return date.ok() && Hour >= 0 && Hour <= 23 && Minute >= 0 && Minute <= 59 && Second >= 0 && Second <= 59;
 }

@@ -1,6 +1,7 @@
 #include "editors/cross_sections/module.h"
 
 #include "editors/cross_sections/view.h"
+#include "files/extensions.h"
 #include "grid/grid_texts.h"
 #include "ks/fc/doc_template.h"
 #include "ks/language/language.h"
@@ -23,7 +24,7 @@ CString TemplateStrings()
                               CrossSectionTexts::tr("Sections"),
                               CrossSectionTexts::tr("KVR Cross Sections"),
                               CrossSectionTexts::tr("KVR Cross Sections (*.kvxs)"),
-                              QStringLiteral(".kvxs"),
+                              QLatin1String(CrossSectionExtension),
                               QStringLiteral("CrossSections.Document"),
                               QStringLiteral("CrossSections Document")};
     return strings.join(u'\n');

@@ -1,7 +1,8 @@
 #include "editors/cross_sections/section_file.h"
 
 #include "editors/cross_sections/section_rules.h"
-#include "ks/fc/parameter_file.h"
+#include "files/declared_section.h"
+#include "files/field_io.h"
 
 #include <iterator>
 #include <set>
@@ -24,7 +25,9 @@ struct FileSections
 
 // The names of the file.
 constexpr const char *SectionName = "CrossSection", *ProfileName = "Profile";
-constexpr const char *BranchKeyword = "Branch", *WidthKeyword = "Width", *PointKeyword = "Point";
+constexpr const char *BranchKeyword = "Branch", *TopoIdKeyword = "TopoID", *WidthKeyword = "Width";
+constexpr const char* PointKeyword = "Point";
+constexpr const char* NoBranch = "BRANCH"; // of a section whose branch the file does not name
 
 using F = FileSection;
 using C = CCrossSection;
@@ -35,7 +38,7 @@ constexpr auto radius = FieldsOf<F>({Number<&F::section, &C::radius>("Radius", U
 constexpr auto width = FieldsOf<F>({Number<&F::section, &C::width>("Width", U::Width).MayBeUnknown()});
 constexpr auto points = FieldsOf<F>({Group<&F::section, &C::points>("Point")});
 constexpr DeclaredKeyword sectionKeywords[] = {{BranchKeyword, branch, Presence::Optional}, // a rule asks for it
-                                               {"TopoID", topoId, Presence::Optional},
+                                               {TopoIdKeyword, topoId, Presence::Optional},
                                                {"Chainage", chainage},
                                                {"Radius", radius, Presence::Optional},
                                                {WidthKeyword, width, Presence::Optional}};
@@ -56,59 +59,84 @@ constexpr DeclaredFile file{{.name = "KVR_CROSS_SECTIONS",
                              .sectionCount = std::size(targetSections)},
                             Keeps<&FileSections::keptTargets>()};
 
-/// What is wrong stands in this line.
-tqlHandle FaultyNode(tqlHandle node, const CSectionFault& fault)
+/// What a section has to fulfil beside its declaration: it is made to, and that is reported.
+void Mend(FileSection& read, tqlHandle node, LoadReport& report)
 {
-    switch (fault.field) {
-    case CSectionFault::Point:
-        return tqlKeywordByNameNum(tqlSectionByNameNum(node, ProfileName, 1), PointKeyword, fault.point + 1);
-    case CSectionFault::Width:
-        return CKsParameterFile::PlaceOf(node, WidthKeyword);
-    default:
-        return CKsParameterFile::PlaceOf(node, BranchKeyword);
+    CCrossSection& section = read.section;
+    for (CSectionFault fault; (fault = FindFault(section)).field != CSectionFault::Nothing;) {
+        const auto rule = [field = fault.field] { return SectionRule(field).toStdString(); };
+        switch (fault.field) {
+        case CSectionFault::Point: {
+            CSectionPoint& point = section.points[std::size_t(fault.point)];
+            point.offset = section.points[std::size_t(fault.point) - 1].offset;
+            ReportRule(report, tqlSectionByNameNum(node, ProfileName, 1), PointKeyword, fault.point + 1,
+                       ParamsText(CSectionPoint::DeclaredFields(), &point), rule);
+            break;
+        }
+        case CSectionFault::Width:
+            section.width = KsUnset;
+            ReportRule(report, node, WidthKeyword, 1, ParamsText(width, &read), rule);
+            break;
+        default:
+            read.branch = NoBranch;
+            section.branch = QString::fromStdString(read.branch);
+            ReportRule(report, node, BranchKeyword, 1, ParamsText(branch, &read), rule);
+        }
     }
+}
+
+using Keys = std::set<decltype(CCrossSection().Key())>;
+
+/// A section at the place of another is told apart by its topo ID.
+void MendKey(FileSection& read, const Keys& taken, tqlHandle node, LoadReport& report)
+{
+    CCrossSection& section = read.section;
+    CCrossSection same = section;
+    same.points.clear();
+    for (int number = 2; taken.contains(section.Key()); ++number)
+        section.topoId = same.topoId + QStringLiteral("-%1").arg(number);
+    read.topoId = section.topoId.toStdString();
+    ReportRule(report, node, TopoIdKeyword, 1, ParamsText(topoId, &read),
+               [same] { return WhyTaken(same).toStdString(); });
 }
 
 } // namespace
 
-FieldList CSectionPoint::DeclaredFields()
-{
-    using P = CSectionPoint;
-    static constexpr auto fields =
-        FieldsOf<P>({Number<&P::offset>("offset", U::Width), Number<&P::level>("level", U::WaterLevel)});
-    return fields;
-}
+KVR_FIELDS(CSectionPoint,
+           Number<&Self::offset>("offset", U::Width),
+           Number<&Self::level>("level", U::WaterLevel))
 
-QString ReadCrossSections(const QString& path, CCrossSections& sections)
+CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
 {
     FileSections read;
-    CKsParameterFile source(path, file, &read);
-    CCrossSections taken;
-    std::set<decltype(CCrossSection().Key())> keys;
-    for (std::size_t i = 0; i < read.sections.size() && source.Error().isEmpty(); ++i) {
-        CCrossSection section = std::move(read.sections[i].section);
-        section.branch = QString::fromStdString(read.sections[i].branch);
-        section.topoId = QString::fromStdString(read.sections[i].topoId);
-        const tqlHandle node = tqlSectionByNameNum(source.Target(), SectionName, int(i) + 1);
-        if (const CSectionFault fault = FindFault(section); fault.field != CSectionFault::Nothing)
-            source.Fail(FaultyNode(node, fault), fault.text);
-        else if (!keys.insert(section.Key()).second)
-            source.Fail(node, WhyTaken(section));
-        taken.sections.push_back(std::move(section));
+    ReadDeclared(structure, file, &read, report);
+    const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
+    const auto nodeOf = [&](const FileSection& each) {
+        return tqlSectionByNameNum(target, SectionName, int(&each - read.sections.data()) + 1);
+    };
+    Keys all, met;
+    for (FileSection& each : read.sections) {
+        each.section.branch = QString::fromStdString(each.branch);
+        each.section.topoId = QString::fromStdString(each.topoId);
+        Mend(each, nodeOf(each), report);
+        all.insert(each.section.Key());
     }
-    if (!source.Error().isEmpty())
-        return source.Error();
-    taken.kept = std::move(read.kept);
-    taken.keptTargets = std::move(read.keptTargets);
-    taken.SortByPlace();
-    sections = std::move(taken);
-    return {};
+    CCrossSections sections{{}, std::move(read.kept), std::move(read.keptTargets)};
+    for (FileSection& each : read.sections) {
+        if (!met.insert(each.section.Key()).second) {
+            MendKey(each, all, nodeOf(each), report);
+            all.insert(each.section.Key());
+        }
+        sections.sections.push_back(std::move(each.section));
+    }
+    sections.SortByPlace();
+    return sections;
 }
 
-QString WriteCrossSections(const QString& path, const CCrossSections& sections)
+Result<void> SaveCrossSections(const CCrossSections& sections, const std::string& path)
 {
     FileSections written{{}, sections.kept, sections.keptTargets};
     for (const CCrossSection& section : sections.sections)
         written.sections.push_back({section.branch.toStdString(), section.topoId.toStdString(), section});
-    return KsWriteParameterFile(path, file, &written);
+    return SaveDeclared(path, file, &written);
 }

@@ -18,6 +18,8 @@ struct CSectionFault
     QString text{}; // for the user: a sentence that says what was expected
 };
 
+/// What is expected instead of such a fault.
+QString SectionRule(CSectionFault::Field field);
 CSectionFault FindFault(const CCrossSection& section);
 /// That there is such a section already.
 QString WhyTaken(const CCrossSection& section);

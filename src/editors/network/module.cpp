@@ -2,6 +2,7 @@
 
 #include "editors/network/import_branches.h"
 #include "editors/network/view.h"
+#include "files/extensions.h"
 #include "grid/grid_texts.h"
 #include "ks/fc/doc_template.h"
 #include "ks/language/language.h"
@@ -24,7 +25,7 @@ CString TemplateStrings()
                               NetworkTexts::tr("Network"),
                               NetworkTexts::tr("KVR River Network"),
                               NetworkTexts::tr("KVR River Network (*.kvnw)"),
-                              QStringLiteral(".kvnw"),
+                              QLatin1String(NetworkExtension),
                               QStringLiteral("Network.Document"),
                               QStringLiteral("Network Document")};
     return strings.join(u'\n');

@@ -1,8 +1,11 @@
 #include "editors/network/network_file.h"
 
-#include "ks/fc/parameter_file.h"
+#include "files/declared_section.h"
+#include "files/field_io.h"
+#include "ks/fc/branch_name.h"
 
 #include <QCoreApplication>
+#include <algorithm>
 #include <iterator>
 
 namespace {
@@ -55,7 +58,9 @@ constexpr DeclaredSection branchSections[] = {
     {.name = "Line", .kept = Keeps<&B::branch, &N::keptLine>(), .keywords = lineKeywords},
     {.name = "Channel", .kept = Keeps<&B::branch, &N::keptChannel>(), .keywords = channelKeywords}};
 constexpr DeclaredKeyword branchKeywords[] = {
-    {NameKeyword, name}, {ChainageKeyword, ends}, {"FlowsDownstream", downstream, Presence::Optional}};
+    {NameKeyword, name, Presence::Optional}, // a rule asks for it
+    {ChainageKeyword, ends},
+    {"FlowsDownstream", downstream, Presence::Optional}};
 
 constexpr auto coordinates = FieldsOf<FileNetwork>({Text<&FileNetwork::system>("CoordinateSystem")});
 constexpr Field branches = SectionGroup<&FileNetwork::branches>(BranchSection);
@@ -73,16 +78,6 @@ constexpr DeclaredFile file{{.name = "KVR_NETWORK",
                              .sectionCount = std::size(networkSections)},
                             Keeps<&FileNetwork::keptTargets>()};
 
-CNetworkBranch Taken(FileBranch& read)
-{
-    CNetworkBranch branch = std::move(read.branch);
-    branch.name = QString::fromStdString(read.name);
-    for (const Vertex& at : read.line)
-        branch.line.emplace_back(at.x, at.y);
-    branch.SortChannel();
-    return branch;
-}
-
 FileBranch ForFile(const CNetworkBranch& branch)
 {
     FileBranch written{branch.name.toStdString(), {}, branch};
@@ -91,53 +86,67 @@ FileBranch ForFile(const CNetworkBranch& branch)
     return written;
 }
 
-/// What a branch of the file has to fulfil beside its declaration.
-void Check(CKsParameterFile& source, tqlHandle section, const CNetworkBranch& branch, const CNetwork& before)
+/// Whether one of the file's first branches has a name.
+bool HasName(const FileNetwork& network, std::size_t count, const std::string& wanted)
 {
-    const tqlHandle named = CKsParameterFile::PlaceOf(section, NameKeyword);
-    if (branch.name.isEmpty())
-        source.Fail(named, NetworkFile::tr("expected the branch's name, Name = \"...\"."));
-    else if (branch.start == branch.end)
-        source.Fail(CKsParameterFile::PlaceOf(section, ChainageKeyword),
-                    NetworkFile::tr("the chainages of the two ends have to differ."));
-    else if (before.FindBranch(branch.name) >= 0)
-        source.Fail(named, NetworkFile::tr("there is a branch \"%1\" already.").arg(branch.name));
+    return std::any_of(network.branches.begin(), network.branches.begin() + std::ptrdiff_t(count),
+                       [&](const FileBranch& each) { return KsSameBranch(each.name, wanted); });
+}
+
+/// What a branch has to fulfil beside its declaration: it is made to, and that is reported.
+void Mend(FileNetwork& network, std::size_t index, tqlHandle section, LoadReport& report)
+{
+    FileBranch& read = network.branches[index];
+    CNetworkBranch& branch = read.branch;
+    if (const std::string given = read.name; given.empty() || HasName(network, index, given)) {
+        const std::string wanted = given.empty() ? "BRANCH" : given;
+        std::string free = wanted;
+        for (int number = 2; HasName(network, network.branches.size(), free); ++number)
+            free = wanted + '-' + std::to_string(number);
+        read.name = free;
+        ReportRule(report, section, NameKeyword, 1, ParamsText(name, &read), [given] {
+            const QString taken = NetworkFile::tr("there is a branch \"%1\" already.");
+            return (given.empty() ? NetworkFile::tr("expected the branch's name, Name = \"...\".")
+                                  : taken.arg(QString::fromStdString(given)))
+                .toStdString();
+        });
+    }
+    if (branch.start == branch.end) {
+        branch.end += std::max(branch.Length(), 1.0);
+        ReportRule(report, section, ChainageKeyword, 1, ParamsText(ends, &read),
+                   [] { return NetworkFile::tr("the chainages of the two ends have to differ.").toStdString(); });
+    }
 }
 
 } // namespace
 
-FieldList CChannelRow::DeclaredFields()
-{
-    using R = CChannelRow;
-    static constexpr auto fields = FieldsOf<R>({Number<&R::chainage>("chainage", U::Chainage),
-                                                Number<&R::radius>("radius", U::Radius).MayBeUnknown(),
-                                                Number<&R::width>("width", U::Width).MayBeUnknown()});
-    return fields;
-}
+KVR_FIELDS(CChannelRow,
+           Number<&Self::chainage>("chainage", U::Chainage),
+           Number<&Self::radius>("radius", U::Radius).MayBeUnknown(),
+           Number<&Self::width>("width", U::Width).MayBeUnknown())
 
-QString ReadNetwork(const QString& path, CNetwork& network)
+CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
 {
     FileNetwork read;
-    CKsParameterFile source(path, file, &read);
-    CNetwork taken;
-    for (std::size_t i = 0; i < read.branches.size() && source.Error().isEmpty(); ++i) {
-        CNetworkBranch branch = Taken(read.branches[i]);
-        Check(source, tqlSectionByNameNum(source.Target(), BranchSection, int(i) + 1), branch, taken);
-        taken.branches.push_back(std::move(branch));
+    ReadDeclared(structure, file, &read, report);
+    const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
+    CNetwork network{{}, QString::fromStdString(read.system), std::move(read.kept), std::move(read.keptTargets)};
+    for (std::size_t i = 0; i < read.branches.size(); ++i) {
+        CNetworkBranch& branch = read.branches[i].branch;
+        for (const Vertex& at : read.branches[i].line)
+            branch.line.emplace_back(at.x, at.y);
+        branch.SortChannel();
+        Mend(read, i, tqlSectionByNameNum(target, BranchSection, int(i) + 1), report);
+        branch.name = QString::fromStdString(read.branches[i].name);
+        network.branches.push_back(std::move(branch));
     }
-    if (!source.Error().isEmpty())
-        return source.Error();
-    taken.system = QString::fromStdString(read.system);
-    taken.kept = std::move(read.kept);
-    taken.keptTargets = std::move(read.keptTargets);
-    network = std::move(taken);
-    return {};
+    return network;
 }
 
-QString WriteNetwork(const QString& path, const CNetwork& network)
+Result<void> SaveNetwork(const CNetwork& network, const std::string& path)
 {
     FileNetwork written{network.system.toStdString(), {}, network.kept, network.keptTargets};
     for (const CNetworkBranch& branch : network.branches)
         written.branches.push_back(ForFile(branch));
-    return KsWriteParameterFile(path, file, &written);
+    return SaveDeclared(path, file, &written);
 }
