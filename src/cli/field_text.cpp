@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <charconv>
 #include <cmath>
+#include <cstdio>
 #include <iterator>
 #include <limits>
 
@@ -18,16 +19,11 @@ std::string Shortest(T value)
     return {buffer, std::to_chars(buffer, buffer + sizeof buffer, value).ptr};
 }
 
-std::string TwoDigits(std::int32_t value)
-{
-    const std::string text = Shortest(value);
-    return (text.size() == 1 ? "0" : "") + text;
-}
-
 std::string DateText(const HDDateTime& d)
 {
-    return Shortest(d.Year) + '-' + TwoDigits(d.Month) + '-' + TwoDigits(d.Day) + ' ' + TwoDigits(d.Hour) + ':' +
-           TwoDigits(d.Minute) + ':' + TwoDigits(d.Second);
+    char text[80];
+    std::snprintf(text, sizeof text, "%d-%02d-%02d %02d:%02d:%02d", d.Year, d.Month, d.Day, d.Hour, d.Minute, d.Second);
+    return text;
 }
 
 /// Text of a field that is no group.
@@ -72,23 +68,22 @@ private:
         return Visit(field, object, [&](auto&& value) { return ParseValue(field.name, value); });
     }
 
-    bool AtEnd() const { return m_next == m_texts.size(); }
-    static Error Missing(std::string_view name, const char* expected)
-    {
-        return {"value for " + std::string(name) + " is missing, expected " + expected};
-    }
-    Error Wrong(std::string_view name, const char* expected) const
-    {
-        return {std::string(name) + " should be " + expected + ", found \"" + m_texts[m_next] + '"'};
-    }
-
     Result<void> ParseValue(std::string_view name, double& value)
     {
-        return TakeNumber(name, value, "a number", &ReadArgument);
+        return Take(name, value, "a number", &ReadArgument);
     }
     Result<void> ParseValue(std::string_view name, std::int32_t& value)
     {
-        return TakeNumber(name, value, "an integer", &ReadWhole);
+        return Take(name, value, "an integer", &ReadWhole);
+    }
+    Result<void> ParseValue(std::string_view name, bool& value)
+    {
+        return Take(name, value, "true or false", &ReadFlag);
+    }
+
+    static std::optional<bool> ReadFlag(std::string_view text)
+    {
+        return text == "true" || text == "false" ? std::optional(text == "true") : std::nullopt;
     }
 
     static std::optional<std::int32_t> ReadWhole(std::string_view text)
@@ -99,37 +94,23 @@ private:
     }
 
     template <typename T>
-    Result<void> TakeNumber(std::string_view name, T& value, const char* expected,
-                            std::optional<T> (*read)(std::string_view))
+    Result<void> Take(std::string_view name, T& value, const char* expected, std::optional<T> (*read)(std::string_view))
     {
-        if (AtEnd())
-            return Missing(name, expected);
-        const std::optional<T> number = read(m_texts[m_next]);
-        if (!number)
-            return Wrong(name, expected);
-        value = *number;
-        ++m_next;
-        return {};
-    }
-
-    Result<void> ParseValue(std::string_view name, bool& value)
-    {
-        if (AtEnd())
-            return Missing(name, "true or false");
+        if (m_next == m_texts.size())
+            return Error{"value for " + std::string(name) + " is missing, expected " + expected};
         const std::string& text = m_texts[m_next];
-        if (text != "true" && text != "false")
-            return Wrong(name, "true or false");
-        value = text == "true";
+        std::optional<T> taken = read(text);
+        if (!taken)
+            return Error{std::string(name) + " should be " + expected + ", found \"" + text + '"'};
+        value = *std::move(taken);
         ++m_next;
         return {};
     }
 
     Result<void> ParseValue(std::string_view name, std::string& value)
     {
-        if (AtEnd())
-            return Missing(name, "a text");
-        value = m_texts[m_next++];
-        return {};
+        return Take<std::string>(name, value, "a text",
+                                 [](std::string_view text) { return std::optional(std::string(text)); });
     }
 
     Result<void> ParseValue(std::string_view name, HDDateTime& value)
@@ -138,7 +119,7 @@ private:
         std::int32_t* const parts[] = {&date.Year, &date.Month, &date.Day, &date.Hour, &date.Minute, &date.Second};
         for (std::int32_t* part : parts)
             if (Result<void> read =
-                    TakeNumber(name, *part, "six integers: year month day hour minute second", &ReadWhole);
+                    Take(name, *part, "six integers: year month day hour minute second", &ReadWhole);
                 !read)
                 return read;
         if (!date.IsValid())
@@ -151,7 +132,7 @@ private:
     {
         const std::string what = "the number of " + std::string(name);
         std::int32_t count = 0;
-        if (Result<void> read = TakeNumber(what, count, "an integer", &ReadWhole); !read)
+        if (Result<void> read = Take(what, count, "an integer", &ReadWhole); !read)
             return read;
         const std::size_t given = m_texts.size() - m_next;
         if (!CountFits(group.Elements(), count, int(given)))

@@ -2,7 +2,6 @@
 #pragma once
 
 #include "cli/commands.h"
-#include "data/hd_check.h"
 #include "data/hd_file.h"
 
 #include <ostream>

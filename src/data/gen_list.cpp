@@ -1,5 +1,6 @@
 #include "data/gen_list.h"
 
+#include <algorithm>
 #include <iterator>
 
 void CGenList::RemoveAll()
@@ -41,39 +42,34 @@ std::vector<std::unique_ptr<HD_RiverPos>> CGenList::RemoveAt(std::size_t index, 
 
 bool CGenList::RemoveIncompleteLines(bool& asked, const std::function<bool()>& ask)
 {
-    std::size_t first = 0;
-    while (first < m_records.size() && !m_records[first]->IsBlank())
-        ++first;
-    if (first == m_records.size())
+    const auto isBlank = [](const std::unique_ptr<HD_RiverPos>& record) { return record->IsBlank(); };
+    if (std::ranges::none_of(m_records, isBlank))
         return true;
     if (!asked && !(ask && ask()))
         return false;
     asked = true;
-    // One pass over the rest: each kept record moves once, however many go.
-    std::erase_if(m_records, [](const std::unique_ptr<HD_RiverPos>& record) { return record->IsBlank(); });
+    std::erase_if(m_records, isBlank);
     return true;
+}
+
+template <typename Fits>
+HD_RiverPos* CGenList::Find(std::size_t& position, Fits fits)
+{
+    while (position < m_records.size())
+        if (HD_RiverPos& record = *m_records[position++]; fits(record))
+            return &record;
+    position = End;
+    return nullptr;
 }
 
 HD_RiverPos* CGenList::FindByChainage(double chainage, std::size_t& position)
 {
-    while (position < m_records.size()) {
-        HD_RiverPos& record = *m_records[position++];
-        if (record.Chainage == chainage)
-            return &record;
-    }
-    position = End;
-    return nullptr;
+    return Find(position, [=](const HD_RiverPos& record) { return record.Chainage == chainage; });
 }
 
 HD_RiverPos* CGenList::FindByName(std::string_view text, std::size_t& position)
 {
-    while (position < m_records.size()) {
-        HD_RiverPos& record = *m_records[position++];
-        if (std::string_view(record.RiverName).starts_with(text))
-            return &record;
-    }
-    position = End;
-    return nullptr;
+    return Find(position, [=](const HD_RiverPos& record) { return record.RiverName.starts_with(text); });
 }
 
 void CGenParamListBase::Save(tqlHandle structure) const
@@ -119,10 +115,10 @@ void CGenParamListBase::Load(tqlHandle parent, int number, LoadReport* report)
         AddTail(std::move(record));
     }
     if (tqlGetNoKeywords(section) != records || tqlGetNoSections(section) != 0)
-        CollectUnknown(section, &KnownName, m_unknown, report);
-}
-
-Known CGenParamListBase::KnownName(std::string_view name, bool isSection)
-{
-    return !isSection && name == "DATA" ? Known::Every : Known::No;
+        CollectUnknown(
+            section,
+            [](std::string_view name, bool isSection) {
+                return !isSection && name == "DATA" ? Known::Every : Known::No;
+            },
+            m_unknown, report);
 }

@@ -57,6 +57,9 @@ public:
     HD_RiverPos* FindByName(std::string_view text, std::size_t& position);
 
 private:
+    template <typename Fits>
+    HD_RiverPos* Find(std::size_t& position, Fits fits);
+
     std::vector<std::unique_ptr<HD_RiverPos>> m_records;
 };
 
@@ -75,8 +78,6 @@ public:
     /// What the section held beside its records. It stays when the records are removed.
     const UnknownNodes& Unknown() const { return m_unknown; }
     void ClearUnknown() { m_unknown.clear(); }
-    /// Which children of such a section are records.
-    static Known KnownName(std::string_view name, bool isSection);
 
 private:
     std::string m_sectionName;
@@ -160,13 +161,10 @@ public:
             Add().Load(outer, inner, report);
         if (report)
             report->firstLineMayBeBlank = false;
-        CollectUnknown(
-            outer, [this](std::string_view name, bool isSection) { return KnownName(name, isSection); }, m_unknown,
-            report);
-    }
-    Known KnownName(std::string_view name, bool isSection) const
-    {
-        return isSection && name == m_innerSection ? Known::Every : Known::No;
+        const auto known = [this](std::string_view name, bool isSection) {
+            return isSection && name == m_innerSection ? Known::Every : Known::No;
+        };
+        CollectUnknown(outer, known, m_unknown, report);
     }
 
 private:

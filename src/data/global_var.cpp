@@ -26,10 +26,10 @@ void SaveItems(tqlHandle structure, GroupValue<const void> items)
     }
 }
 
-const GlobalKeyword* FindRow(const GlobalSection& table, std::string_view name)
+/// Whether a table has a row of that name.
+bool Has(const auto& rows, std::string_view name)
 {
-    const auto found = std::ranges::find(table.keywords, name, &GlobalKeyword::name);
-    return found == table.keywords.end() ? nullptr : &*found;
+    return std::ranges::any_of(rows, [name](const auto& row) { return row.name == name; });
 }
 
 } // namespace
@@ -42,7 +42,10 @@ void HD_Global_Var::Load(tqlHandle target, LoadReport* report)
     for (const GlobalSection& table : HDGlobalSections())
         if (const tqlHandle section = tqlSectionByNameNum(global, table.name, 1))
             LoadSection(section, table, report);
-    CollectUnknown(global, &HDKnownGlobalSection, m_unknown[HDGlobalSectionName], report);
+    const auto known = [](std::string_view name, bool isSection) {
+        return isSection && Has(HDGlobalSections(), name) ? Known::First : Known::No;
+    };
+    CollectUnknown(global, known, m_unknown[HDGlobalSectionName], report);
 }
 
 void HD_Global_Var::LoadSection(tqlHandle section, const GlobalSection& table, LoadReport* report)
@@ -68,25 +71,24 @@ void HD_Global_Var::LoadSection(tqlHandle section, const GlobalSection& table, L
         if (report)
             report->InSection(items.name);
         LoadItems(inner, items.GroupIn(this), report);
-        CollectUnknown(inner, &HDKnownItem, m_unknown[items.name], report);
+        const auto known = [](std::string_view name, bool isSection) {
+            return !isSection && name == HDItemKeyword ? Known::Every : Known::No;
+        };
+        CollectUnknown(inner, known, m_unknown[items.name], report);
     }
     if (report)
         report->InSection(table.name);
-    CollectUnknown(
-        section, [&table](std::string_view name, bool isSection) { return HDKnownInSection(table, name, isSection); },
-        m_unknown[table.name], report);
+    const auto known = [&table](std::string_view name, bool isSection) {
+        return (isSection ? Has(table.items, name) : Has(table.keywords, name)) ? Known::First : Known::No;
+    };
+    CollectUnknown(section, known, m_unknown[table.name], report);
 }
 
 void HD_Global_Var::LoadKeyword(tqlHandle keyword, const GlobalKeyword& row, LoadReport* report)
 {
     ParamCursor params(keyword, report);
     ReadFields(params, row.Fields(), this);
-    ExtraParams extra;
-    ReadExtra(params, extra);
-    if (extra.IsEmpty())
-        m_extra.erase(&row);
-    else
-        m_extra[&row] = std::move(extra);
+    ReadExtra(params, m_extra[&row]);
     // The titles stand before their flags in the table, and so are read by now.
     if (report && row.Fields().front().address(this) == &MarkInterpolate && MarkInterpolate.size() > MarkTitles.size())
         report->Add(keyword, keyword,
@@ -142,9 +144,9 @@ const std::string* HD_Global_Var::Unread(const GlobalSection& table, const Globa
     if (found == m_unread.end())
         return nullptr;
     static const HD_Global_Var defaults;
-    const GlobalKeyword* const opener = FindRow(table, row.onlyWith);
+    const auto opener = std::ranges::find(table.keywords, row.onlyWith, &GlobalKeyword::name);
     const bool untouched =
-        SameFields(row.Fields(), this, &defaults) && opener && SameFields(opener->Fields(), this, &defaults);
+        SameFields(row.Fields(), this, &defaults) && SameFields(opener->Fields(), this, &defaults);
     return untouched ? &found->second : nullptr;
 }
 
@@ -159,23 +161,4 @@ void HD_Global_Var::ClearUnknown()
     m_unknown.clear();
     m_extra.clear();
     m_unread.clear();
-}
-
-Known HDKnownGlobalSection(std::string_view name, bool isSection)
-{
-    const auto sections = HDGlobalSections();
-    const bool known = isSection && std::ranges::find(sections, name, &GlobalSection::name) != sections.end();
-    return known ? Known::First : Known::No;
-}
-
-Known HDKnownInSection(const GlobalSection& table, std::string_view name, bool isSection)
-{
-    const bool known = isSection ? std::ranges::find(table.items, name, &Field::name) != table.items.end()
-                                 : FindRow(table, name) != nullptr;
-    return known ? Known::First : Known::No;
-}
-
-Known HDKnownItem(std::string_view name, bool isSection)
-{
-    return !isSection && name == HDItemKeyword ? Known::Every : Known::No;
 }

@@ -270,8 +270,3 @@ struct GlobalSection
 
 /// The table of the global values: sub-sections and keywords in file order.
 std::span<const GlobalSection> HDGlobalSections();
-
-/// What the sections take for themselves: "Global_Variables" its sub-sections, each of these its keywords and items.
-Known HDKnownGlobalSection(std::string_view name, bool isSection);
-Known HDKnownInSection(const GlobalSection& table, std::string_view name, bool isSection);
-Known HDKnownItem(std::string_view name, bool isSection);

@@ -10,6 +10,13 @@ Result<HD_Parameters> LoadHDFile(const std::string& path)
     return parameters;
 }
 
+std::vector<Finding> CheckHDStructure(tqlHandle structure)
+{
+    LoadReport report(structure, LoadReport::Wanted::Everything);
+    HD_Parameters{}.Load(structure, &report);
+    return report.Take();
+}
+
 namespace {
 
 TqlStructure Build(const HD_Parameters& parameters, bool everySet)

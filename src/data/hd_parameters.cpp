@@ -40,20 +40,6 @@ std::span<const ListEntry> HDLists()
     return lists;
 }
 
-Known HDKnownSection(std::string_view name, bool isSection)
-{
-    if (!isSection)
-        return Known::No;
-    const bool known = name == HDGlobalSectionName ||
-                       std::ranges::any_of(lists, [name](const ListEntry& entry) { return name == entry.section; });
-    return known ? Known::First : Known::No;
-}
-
-Known HDKnownTarget(std::string_view name, bool isSection)
-{
-    return isSection && name == HDTargetName ? Known::First : Known::No;
-}
-
 void HD_Parameters::Load(tqlHandle structure, LoadReport* report)
 {
     const tqlHandle target = tqlTargetByNameNum(structure, HDTargetName, 1);
@@ -68,8 +54,14 @@ void HD_Parameters::Load(tqlHandle structure, LoadReport* report)
         else
             EncroachList.Load(target, 1, report);
     }
-    CollectUnknown(target, &HDKnownSection, Unknown.InTarget, report);
-    CollectUnknown(structure, &HDKnownTarget, Unknown.Targets, report);
+    const auto first = [](bool known) { return known ? Known::First : Known::No; };
+    const auto knownSection = [&](std::string_view name, bool isSection) {
+        return first(isSection && (name == HDGlobalSectionName ||
+                                   std::ranges::find(lists, name, &ListEntry::section) != std::end(lists)));
+    };
+    CollectUnknown(target, knownSection, Unknown.InTarget, report);
+    const auto knownTarget = [&](std::string_view name, bool) { return first(name == HDTargetName); };
+    CollectUnknown(structure, knownTarget, Unknown.Targets, report);
 }
 
 void HD_Parameters::Save(tqlHandle structure, bool everySet) const

@@ -54,7 +54,3 @@ struct ListEntry
     const CGenParamListBase* (*constList)(const HD_Parameters&);
 };
 std::span<const ListEntry> HDLists();
-/// The target's sections that are known, each once.
-Known HDKnownSection(std::string_view name, bool isSection);
-/// The structure's targets that are known: the first "KAVO0_HD".
-Known HDKnownTarget(std::string_view name, bool isSection);

@@ -1,11 +1,13 @@
 #include "document/document.h"
 
-#include "files/safe_file.h"
+#include "data/hd_file.h"
+#include "files/extensions.h"
 #include "ks/fc/message_box.h"
 #include "document/purged_lines.h"
 #include "grid/row_source.h"
 #include "res/strings.h"
 
+#include <QDir>
 #include <QFileInfo>
 #include <QUndoStack>
 #include <algorithm>
@@ -45,8 +47,7 @@ CKavo0_hdDoc::CKavo0_hdDoc() : CKsProjectDoc(HDPackageKind) {}
 bool CKavo0_hdDoc::HasExtension(const CString& path)
 {
     // Mixed spellings are refused: the shell's file tables know these two.
-    const CString extension = QFileInfo(path).suffix();
-    return extension == QLatin1String("HDKV") || extension == QLatin1String("hdkv");
+    return path.endsWith(QLatin1String(SavedHDExtension)) || path.endsWith(QLatin1String(HDExtension));
 }
 
 BOOL CKavo0_hdDoc::OnOpenDocument(const CString& path)
@@ -57,15 +58,14 @@ BOOL CKavo0_hdDoc::OnOpenDocument(const CString& path)
         KsMessageBox(LoadString(Str::UnsupportedFormat));
         return false;
     }
-    m_file.Read(path, m_parameters);
-    m_isReadOnly = m_file.IsUnreadable();
-    emit FileStateChanged();
+    ReadFile(path, [this](tqlHandle structure, LoadReport& report) { m_parameters.Load(structure, &report); });
     return true;
 }
 
 CString CKavo0_hdDoc::SavePathFor(const CString& path) const
 {
-    return CDocumentFile::SavePathFor(path);
+    const QFileInfo info(path);
+    return info.dir().filePath(info.completeBaseName() + QLatin1String(SavedHDExtension));
 }
 
 BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
@@ -87,13 +87,9 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
     const QString dropped = purged->Summary();
     if (!purged->IsEmpty())
         UndoStack().push(purged.release());
-    UndoStack().setClean();
-
-    m_isReadOnly = false;
-    SetPathName(m_file.Path());
+    FileWritten();
     UpdateAllViews(nullptr, CKsDoc::ReloadHint);
     SetModifiedFlag(false);
-    emit FileStateChanged();
     QString saved = dropped.isEmpty() ? LoadString(Str::Saved) : LoadString(Str::SavedDropping).arg(dropped);
     if (const std::size_t unwritten = UnwrittenSetups(); unwritten > 0)
         saved += QStringLiteral("   ") + LoadCounted(unwritten, Str::SetupNotWritten, Str::SetupsNotWritten);
@@ -126,13 +122,7 @@ std::size_t CKavo0_hdDoc::UnwrittenSetups() const
 bool CKavo0_hdDoc::WriteData(const CString& path)
 {
     const FirstRows defaults(m_rowsShown);
-    return m_file.Write(m_parameters, path);
-}
-
-void CKavo0_hdDoc::EditUnreadable()
-{
-    m_isReadOnly = false;
-    emit FileStateChanged();
+    return m_file.Write(path, [this](const std::string& written) { return SaveHDFile(m_parameters, written); });
 }
 
 void CKavo0_hdDoc::AtSave(ShownRows shown)

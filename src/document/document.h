@@ -2,7 +2,6 @@
 #pragma once
 
 #include "data/hd_parameters.h"
-#include "document/document_file.h"
 #include "ks/fc/project_doc.h"
 #include "res/strings.h"
 
@@ -28,6 +27,7 @@ public:
     BOOL OnOpenDocument(const CString& path) override;
     /// Saves to the path with the extension ".HDKV"; see docs/architecture.md, "Saving".
     BOOL OnSaveDocument(const CString& path) override;
+    /// The extension is always ".HDKV".
     CString SavePathFor(const CString& path) const override;
     void DeleteContents() override;
 
@@ -45,16 +45,6 @@ public:
     void AtSave(ShownRows shown);
     const std::vector<ShownRows>& RowsShown() const { return m_rowsShown; }
 
-    /// The file last opened or saved.
-    const CDocumentFile& File() const { return m_file; }
-    /// It could not be parsed, and nobody has asked to edit what is shown instead.
-    bool IsReadOnly() const { return m_isReadOnly; }
-    void EditUnreadable();
-
-signals:
-    /// What is known of File(), or IsReadOnly(), is another.
-    void FileStateChanged();
-
 private:
     bool WriteData(const CString& path);
     std::size_t UnwrittenSetups() const;
@@ -62,7 +52,5 @@ private:
     bool MayReplace(const CString& target, const CString& path);
 
     HD_Parameters m_parameters;
-    CDocumentFile m_file;
-    bool m_isReadOnly = false;
     std::vector<ShownRows> m_rowsShown;
 };

@@ -79,44 +79,23 @@ constexpr Field Declare(FieldKind kind, std::string_view name, UnitGroup unit = 
             .unit = unit};
 }
 
-template <typename Container>
-std::size_t Size(const void* container)
-{
-    return static_cast<const Container*>(container)->size();
-}
-template <typename Container>
-void Resize(void* container, std::size_t count)
-{
-    static_cast<Container*>(container)->resize(count);
-}
-template <typename Container>
-void* At(void* container, std::size_t index)
-{
-    return &(*static_cast<Container*>(container))[index];
-}
-template <typename Container>
-const void* ConstAt(const void* container, std::size_t index)
-{
-    return &(*static_cast<const Container*>(container))[index];
-}
-template <typename Element>
-ExtraParams* Extra(void* element)
-{
-    return &static_cast<Element*>(element)->Extra;
-}
-template <typename Element>
-const ExtraParams* ConstExtra(const void* element)
-{
-    return &static_cast<const Element*>(element)->Extra;
-}
 template <typename Container, auto Elements>
 constexpr GroupAccess MakeAccess()
 {
     using Element = typename Container::value_type;
-    GroupAccess access{Elements, &Size<Container>, &Resize<Container>, &At<Container>, &ConstAt<Container>, {}, {}};
+    GroupAccess access{
+        .elements = Elements,
+        .size = [](const void* container) { return static_cast<const Container*>(container)->size(); },
+        .resize = [](void* container, std::size_t count) { static_cast<Container*>(container)->resize(count); },
+        .at = [](void* container, std::size_t index) -> void* { return &(*static_cast<Container*>(container))[index]; },
+        .constAt = [](const void* container, std::size_t index) -> const void* {
+            return &(*static_cast<const Container*>(container))[index];
+        },
+        .extra = {},
+        .constExtra = {}};
     if constexpr (requires(Element element) { element.Extra; }) {
-        access.extra = &Extra<Element>;
-        access.constExtra = &ConstExtra<Element>;
+        access.extra = [](void* element) { return &static_cast<Element*>(element)->Extra; };
+        access.constExtra = [](const void* element) { return &static_cast<const Element*>(element)->Extra; };
     }
     return access;
 }
@@ -215,6 +194,16 @@ constexpr Field GroupOf(std::string_view name)
     field.group = &field_detail::Access<typename field_detail::Path<Path...>::Type, Elements>;
     return field;
 }
+
+/// Defines Class::DeclaredFields() as these fields, in which the class is called Self.
+#define KVR_FIELDS(Class, ...)                                                                                         \
+    FieldList Class::DeclaredFields()                                                                                  \
+    {                                                                                                                  \
+        using Self = Class;                                                                                            \
+        static constexpr auto fields = FieldsOf<Self>({__VA_ARGS__});                                                  \
+        return fields;                                                                                                 \
+    }
+
 /// A repeated group of structs: `Element::DeclaredFields()` lists the fields of one.
 template <auto... Path>
 constexpr Field Group(std::string_view name)

@@ -1,35 +1,22 @@
 #include "files/declared_section.h"
 
 #include "files/field_io.h"
+#include "files/structure.h"
 
 #include <algorithm>
-#include <cmath>
 
 namespace {
 
-using Fault = std::optional<ReadingFault>;
-
-/// Takes a value only when it stands there exactly as declared.
-bool TakeExactly(tqlHandle* param, const Field& field, void* object)
+void ReadKeyword(tqlHandle keyword, FieldList fields, void* object, LoadReport& report)
 {
-    return Visit(field, object,
-                 Overloads{[&](double& value) {
-                               return tqlTake(param, &value) &&
-                                      (std::isfinite(value) || (field.mayBeUnknown && std::isnan(value)));
-                           },
-                           [&](HDDateTime&) { return false; }, [&](GroupValue<void>) { return false; },
-                           [&](auto& value) { return tqlTake(param, &value); }});
-}
-
-Fault ReadKeyword(tqlHandle keyword, FieldList fields, void* object)
-{
-    bool good = tqlGetNoParams(keyword) == int(fields.size());
-    tqlHandle param = tqlParamByNum(keyword, 1);
-    for (const Field& field : fields)
-        good = good && TakeExactly(&param, field, object);
-    if (good)
-        return {};
-    return ReadingFault{ReadingFault::WrongValue, keyword, tqlName(keyword), {}, fields};
+    ParamCursor params(keyword, &report);
+    params.onlyFinite = true;
+    ReadFields(params, fields, object);
+    if (params.param)
+        report.Add(params.param, keyword,
+                   {.kind = Finding::SurplusParams,
+                    .parameter = params.number,
+                    .found = std::string(tqlGetRawParamsFrom(params.param))});
 }
 
 bool IsRepeated(const DeclaredKeyword& keyword)
@@ -37,30 +24,26 @@ bool IsRepeated(const DeclaredKeyword& keyword)
     return keyword.fields.front().kind == FieldKind::Group;
 }
 
-Fault ReadKeywords(tqlHandle section, const DeclaredKeyword& declared, void* object)
+void ReadKeywords(tqlHandle section, const DeclaredKeyword& declared, void* object, LoadReport& report)
 {
     if (IsRepeated(declared)) {
         const auto group = declared.fields.front().GroupIn(object);
         group.Renew(std::size_t(tqlGetNoKeywords(section, declared.name)));
-        for (std::size_t i = 0; i < group.size(); ++i) {
-            const tqlHandle keyword = tqlKeywordByNameNum(section, declared.name, int(i) + 1);
-            if (const Fault fault = ReadKeyword(keyword, group.Elements(), group[i]))
-                return fault;
-        }
-        return {};
+        for (std::size_t i = 0; i < group.size(); ++i)
+            ReadKeyword(tqlKeywordByNameNum(section, declared.name, int(i) + 1), group.Elements(), group[i], report);
+    } else if (const tqlHandle keyword = tqlKeywordByNameNum(section, declared.name, 1)) {
+        ReadKeyword(keyword, declared.fields, object, report);
+    } else if (declared.presence == Presence::Required) {
+        report.Add(section, nullptr,
+                   {.kind = Finding::NoKeyword,
+                    .keyword = std::string(declared.name),
+                    .used = ParamsText(declared.fields, object)});
     }
-    if (const tqlHandle second = tqlKeywordByNameNum(section, declared.name, 2))
-        return ReadingFault{ReadingFault::Second, second, declared.name, tqlName(section)};
-    if (const tqlHandle keyword = tqlKeywordByNameNum(section, declared.name, 1))
-        return ReadKeyword(keyword, declared.fields, object);
-    if (declared.presence == Presence::Required)
-        return ReadingFault{ReadingFault::Missing, section, declared.name, tqlName(section), declared.fields};
-    return {};
 }
 
-Fault ReadSection(tqlHandle section, const DeclaredSection& declared, void* object);
+void ReadSection(tqlHandle section, const DeclaredSection& declared, void* object, LoadReport& report);
 
-Fault ReadSections(tqlHandle parent, const DeclaredSection& declared, void* object)
+void ReadSections(tqlHandle parent, const DeclaredSection& declared, void* object, LoadReport& report)
 {
     if (declared.each) {
         std::size_t count = 0;
@@ -68,37 +51,32 @@ Fault ReadSections(tqlHandle parent, const DeclaredSection& declared, void* obje
             ++count;
         const auto group = declared.each->GroupIn(object);
         group.Renew(count);
-        for (std::size_t i = 0; i < count; ++i) {
-            const tqlHandle section = tqlSectionByNameNum(parent, declared.name, int(i) + 1);
-            if (const Fault fault = ReadSection(section, declared, group[i]))
-                return fault;
-        }
-        return {};
+        for (std::size_t i = 0; i < count; ++i)
+            ReadSection(tqlSectionByNameNum(parent, declared.name, int(i) + 1), declared, group[i], report);
+    } else if (const tqlHandle section = tqlSectionByNameNum(parent, declared.name, 1)) {
+        ReadSection(section, declared, object, report);
+    } else if (declared.required) {
+        report.Add(parent, nullptr, {.kind = Finding::NoSection, .section = std::string(declared.name)});
     }
-    if (const tqlHandle second = tqlSectionByNameNum(parent, declared.name, 2))
-        return ReadingFault{ReadingFault::Second, second, declared.name, tqlName(parent)};
-    if (const tqlHandle section = tqlSectionByNameNum(parent, declared.name, 1))
-        return ReadSection(section, declared, object);
-    if (declared.required)
-        return ReadingFault{ReadingFault::NoSection, parent, declared.name, tqlName(parent)};
-    return {};
 }
 
-Fault ReadSection(tqlHandle section, const DeclaredSection& declared, void* object)
+void ReadSection(tqlHandle section, const DeclaredSection& declared, void* object, LoadReport& report)
 {
+    report.InSection(declared.name);
     for (const DeclaredKeyword& keyword : declared.keywords)
-        if (const Fault fault = ReadKeywords(section, keyword, object))
-            return fault;
+        ReadKeywords(section, keyword, object, report);
     for (const DeclaredSection& inner : declared.Sections())
-        if (const Fault fault = ReadSections(section, inner, object))
-            return fault;
+        ReadSections(section, inner, object, report);
+    report.InSection(declared.name);
     const auto known = [&](std::string_view name, bool isSection) {
-        const bool is = isSection ? std::ranges::count(declared.Sections(), name, &DeclaredSection::name) > 0
-                                  : std::ranges::count(declared.keywords, name, &DeclaredKeyword::name) > 0;
-        return is ? Known::Every : Known::No;
+        if (isSection) {
+            const auto found = std::ranges::find(declared.Sections(), name, &DeclaredSection::name);
+            return found == declared.Sections().end() ? Known::No : found->each ? Known::Every : Known::First;
+        }
+        const auto found = std::ranges::find(declared.keywords, name, &DeclaredKeyword::name);
+        return found == declared.keywords.end() ? Known::No : IsRepeated(*found) ? Known::Every : Known::First;
     };
-    CollectUnknown(section, known, *declared.kept.of(object));
-    return {};
+    CollectUnknown(section, known, *declared.kept.of(object), &report);
 }
 
 bool IsEmptyText(const Field& field, const void* object)
@@ -145,24 +123,39 @@ void WriteContent(tqlHandle structure, const DeclaredSection& declared, const vo
 
 } // namespace
 
-std::optional<ReadingFault> ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object)
+void ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object, LoadReport& report)
 {
     const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
-    if (!target)
-        return ReadingFault{ReadingFault::NoTarget, nullptr, file.target.name, {}};
-    if (const Fault fault = ReadSection(target, file.target, object))
-        return fault;
+    if (!target) {
+        report.Add(nullptr, nullptr, {.kind = Finding::NoTarget, .section = std::string(file.target.name)});
+        return;
+    }
+    ReadSection(target, file.target, object, report);
     const auto known = [&](std::string_view name, bool isSection) {
         return isSection && name == file.target.name ? Known::First : Known::No;
     };
-    CollectUnknown(structure, known, *file.otherTargets.of(object));
-    return {};
+    CollectUnknown(structure, known, *file.otherTargets.of(object), &report);
 }
 
-void WriteDeclared(tqlHandle structure, const DeclaredFile& file, const void* object)
+void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, int number, std::string used,
+                std::function<std::string()> rule)
 {
-    tqlAddTarget(structure, file.target.name);
-    WriteContent(structure, file.target, object);
-    tqlEndSection(structure);
-    WriteUnknownTargets(structure, *file.otherTargets.constOf(object));
+    const tqlHandle keyword = tqlKeywordByNameNum(section, name, number);
+    report.Add(keyword ? keyword : section, keyword,
+               {.kind = Finding::Rule,
+                .section = std::string(tqlName(section)),
+                .keyword = std::string(name),
+                .found = std::string(tqlGetRawParams(keyword)),
+                .used = std::move(used),
+                .rule = std::move(rule)});
+}
+
+Result<void> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object)
+{
+    const TqlStructure structure(tqlCreate());
+    tqlAddTarget(structure.Get(), file.target.name);
+    WriteContent(structure.Get(), file.target, object);
+    tqlEndSection(structure.Get());
+    WriteUnknownTargets(structure.Get(), *file.otherTargets.constOf(object));
+    return SaveStructure(structure.Get(), path);
 }

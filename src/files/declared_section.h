@@ -1,18 +1,19 @@
-// Whole files by declaration: what stands in a section, which object takes it, and reading that stops at the first
-// thing that is not as declared. (Files of HD parameters are read past what is not in order: data/hd_parameters.h.)
+// Whole files by declaration: what stands in a section, and which object takes it. Reading goes past what is not as
+// declared, with a report of it.
 #pragma once
 
+#include "base/result.h"
 #include "files/declare_field.h"
+#include "files/finding.h"
 #include "files/unknown_content.h"
-#include "tql/tql.h"
 
-#include <optional>
+#include <functional>
 #include <span>
 #include <string_view>
 
 enum class Presence
 {
-    Required,
+    Required, // that it is missing is reported
     Optional, // always written
     WhenSet   // written unless it is an empty text
 };
@@ -61,24 +62,12 @@ struct DeclaredFile
     KeptContent otherTargets;
 };
 
-/// Where reading stopped, and why.
-struct ReadingFault
-{
-    enum Kind
-    {
-        NoTarget,   // `name` is there not even once; no place
-        WrongValue, // the parameters of `name` are not those of `fields`
-        Missing,    // a keyword of the section at the place
-        NoSection,  // likewise a section
-        Second      // `name` again, though one counts: it would be lost when the file is saved
-    };
-    Kind kind;
-    tqlHandle place;
-    std::string_view name, section;
-    FieldList fields{};
-};
-
-/// Reads a loaded file into the object. On a fault the object holds part of it.
-std::optional<ReadingFault> ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object);
-/// Writes the object's file into a created structure, what was kept behind what is declared.
-void WriteDeclared(tqlHandle structure, const DeclaredFile& file, const void* object);
+/// Reads a loaded file into the object: the first of what stands there once, all of what repeats, finite numbers. What
+/// is missing or of another type keeps its value; a file without the target is reported as such and not read.
+void ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object, LoadReport& report);
+/// Reports that occurrence `number` of a section's keyword - the section, when it is missing - breaks a rule beyond its
+/// declaration. `used`: what is used instead, in file notation.
+void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, int number, std::string used,
+                std::function<std::string()> rule);
+/// Puts the object's file into the place of `path` (safe_file.h); what was kept stands behind what is declared.
+Result<void> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object);

@@ -128,56 +128,27 @@ struct Field
     std::optional<double> minimum{}, maximum{}; // what a user may enter, in base units
 
     // What else a declaration says, one after the other.
-    constexpr Field Title(Str text, int line = TextLine::Whole) const
+    template <typename Value>
+    constexpr Field With(Value Field::*member, std::type_identity_t<Value> value) const
     {
         Field field = *this;
-        field.title = {text, line};
+        field.*member = value;
         return field;
     }
-    constexpr Field Title(const char* source) const
-    {
-        Field field = *this;
-        field.title.source = source;
-        return field;
-    }
+    constexpr Field Title(Str text, int line = TextLine::Whole) const { return With(&Field::title, {text, line}); }
+    constexpr Field Title(const char* source) const { return With(&Field::title, {.source = source}); }
     constexpr Field Choices(Str texts, std::int32_t first = 0) const
     {
-        Field field = *this;
-        field.choices = texts;
-        field.firstChoice = first;
-        return field;
+        return With(&Field::choices, texts).With(&Field::firstChoice, first);
     }
     constexpr Field Range(std::optional<double> least, std::optional<double> most = {}) const
     {
-        Field field = *this;
-        field.minimum = least;
-        field.maximum = most;
-        return field;
+        return With(&Field::minimum, least).With(&Field::maximum, most);
     }
-    constexpr Field Digits(int significant) const
-    {
-        Field field = *this;
-        field.digits = significant;
-        return field;
-    }
-    constexpr Field OptionalTail() const
-    {
-        Field field = *this;
-        field.optionalTail = true;
-        return field;
-    }
-    constexpr Field MayBeUnknown() const
-    {
-        Field field = *this;
-        field.mayBeUnknown = true;
-        return field;
-    }
-    constexpr Field PadWhenEmpty() const
-    {
-        Field field = *this;
-        field.padWhenEmpty = true;
-        return field;
-    }
+    constexpr Field Digits(int significant) const { return With(&Field::digits, significant); }
+    constexpr Field OptionalTail() const { return With(&Field::optionalTail, true); }
+    constexpr Field MayBeUnknown() const { return With(&Field::mayBeUnknown, true); }
+    constexpr Field PadWhenEmpty() const { return With(&Field::padWhenEmpty, true); }
 
     /// The value inside `object`, of the type that the kind says.
     template <typename T>

@@ -19,6 +19,7 @@ struct ParamCursor
     int number = 1;
     int count;
     LoadReport* report; // may be null
+    bool onlyFinite = false; // numbers have to be some, unless their field may be unknown
 
     explicit ParamCursor(tqlHandle itsKeyword, LoadReport* itsReport = nullptr)
         : keyword(itsKeyword), param(tqlParamByNum(keyword, 1)), count(tqlGetNoParams(keyword)), report(itsReport)
@@ -36,11 +37,6 @@ struct ParamCursor
     {
         param = tqlNextParam(param);
         ++number;
-    }
-    void Skip(int params)
-    {
-        for (; params > 0 && param; --params)
-            Next();
     }
     void ToEnd()
     {
@@ -65,4 +61,3 @@ void WriteFields(tqlHandle structure, FieldList fields, const void* object);
 
 /// Whether all fields are equal, numbers to the last bit.
 bool SameFields(FieldList fields, const void* a, const void* b);
-void CopyFields(FieldList fields, const void* from, void* to);

@@ -11,41 +11,19 @@ std::string Quoted(std::string_view text)
 
 const char* KindText(FieldKind kind)
 {
-    switch (kind) {
-    case FieldKind::Number:
-        return "a number";
-    case FieldKind::Boolean:
-        return "true or false";
-    case FieldKind::Text:
-        return "a text in quotes";
-    case FieldKind::FileName:
-        return "a file name in < >";
-    case FieldKind::Integer:
-    case FieldKind::Choice:
-    case FieldKind::DateTime:
-    case FieldKind::Group:
-        break;
-    }
-    return "an integer";
+    return VisitKind(
+        kind, Overloads{[](std::type_identity<double>) { return "a number"; },
+                        [](std::type_identity<bool>) { return "true or false"; },
+                        [kind](std::type_identity<std::string>) {
+                            return kind == FieldKind::Text ? "a text in quotes" : "a file name in < >";
+                        },
+                        [](auto) { return "an integer"; }});
 }
 
 const char* TypeText(TqlType type)
 {
-    switch (type) {
-    case TqlType::Int:
-        return "an integer";
-    case TqlType::Double:
-        return "a number";
-    case TqlType::Bool:
-        return "true or false";
-    case TqlType::String:
-        return "a text";
-    case TqlType::FileName:
-        return "a file name";
-    case TqlType::None:
-        break;
-    }
-    return "nothing";
+    constexpr const char* texts[] = {"nothing", "an integer", "a number", "true or false", "a text", "a file name"};
+    return texts[std::size_t(type)];
 }
 
 /// Lists and item sections hold keywords of one name only: there the section's name says more.
@@ -85,20 +63,21 @@ std::string OwnText(const Finding& finding)
         return "there are more flags than the " + std::to_string(finding.behind) + " titles";
     case Finding::Missing:
         return Parameter(finding) + (finding.more ? " and those behind it are missing" : " is missing");
+    case Finding::NoKeyword:
+        return "the keyword is missing";
     case Finding::NoDate:
         return "the six integers of " + finding.field + " are no date and time";
+    case Finding::SurplusParams:
     case Finding::UnknownParams:
         return "unknown parameters from number " + std::to_string(finding.parameter) + " on";
     case Finding::IncompleteLine:
         return finding.parameter == 1 ? "incomplete line, the branch name is empty"
                                       : "incomplete line, the chainage is not given";
-    case Finding::NoTarget:
-    case Finding::NotRead:
-    case Finding::Unknown:
-    case Finding::Repeated:
-        break;
+    case Finding::Rule:
+        return finding.rule();
+    default:
+        return {};
     }
-    return {};
 }
 
 /// Enough to recognise what stands there, cut between characters.
@@ -120,6 +99,8 @@ std::string FindingText(const Finding& finding)
     switch (finding.kind) {
     case Finding::NoTarget:
         return "there is no target [" + finding.section + "]";
+    case Finding::NoSection:
+        return "there is no section [" + finding.section + "]";
     case Finding::NotRead:
         return finding.keyword + " is not read, because " + finding.field + " is missing";
     case Finding::Unknown:
@@ -137,7 +118,8 @@ void LoadReport::Add(tqlHandle place, tqlHandle keyword, Finding finding)
     const TqlPosition position = tqlGetPosition(m_structure, place);
     finding.line = position.line ? position.line : 1;
     finding.column = position.column ? position.column : 1;
-    finding.keyword = tqlName(keyword);
+    if (keyword)
+        finding.keyword = tqlName(keyword);
     if (finding.section.empty())
         finding.section = m_section;
     finding.found = Shortened(std::move(finding.found));

@@ -6,6 +6,7 @@
 #include "tql/tql.h"
 
 #include <cstddef>
+#include <functional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -18,16 +19,21 @@ struct Finding
         WrongType,
         CountDoesNotFit, // a repeated group, and what follows it in its keyword
         ShortDate,
-        SurplusFlags, // more flags than mark titles
+        SurplusFlags,  // more flags than mark titles
+        SurplusParams, // of a keyword that keeps no others than its own
+        Rule,          // what the editor of the file asks for beyond types
         NoTarget,
         // Taken, though it is written otherwise than it should be.
         OtherType,
+        // Nothing that stands there is lost, but something is used or shown that does not stand there, or the reverse.
+        Missing, // a parameter
+        NoKeyword,
+        NoSection,
+        Repeated,
         // Nothing that stands there is lost.
-        Missing,
         NoDate,
         NotRead, // because another keyword is missing
         Unknown,
-        Repeated,
         UnknownParams,
         IncompleteLine
     };
@@ -44,12 +50,13 @@ struct Finding
     bool more = false;            // others behind it are missing, too
     std::string found{};          // as it stands in the file
     std::string used{};           // what is used instead, in the same notation
+    std::function<std::string()> rule{}; // of Rule: what was expected, in the user's language
 
     /// Whether rewriting the file would lose what stands there.
     bool LosesContent() const { return kind <= NoTarget; }
     /// Whether the user must know before relying on what is shown: a value was lost or taken for another, defaults stand
     /// where parameters are missing, or something stands in the file that is never shown because it was there before.
-    bool NeedsAttention() const { return kind <= OtherType || kind == Missing || kind == Repeated; }
+    bool NeedsAttention() const { return kind <= Repeated; }
 };
 
 /// One sentence in English, without the place.

@@ -4,22 +4,17 @@
 
 namespace {
 
-/// Takes a run of digits off the front and returns whether there was one.
-bool TakeDigits(std::string_view& text)
+/// The library's number syntax takes more: words, a point without digits behind it, no plus.
+std::errc Parse(std::string_view text, double& value)
 {
-    std::size_t count = 0;
-    while (count < text.size() && text[count] >= '0' && text[count] <= '9')
-        ++count;
-    text.remove_prefix(count);
-    return count > 0;
-}
-
-bool TakeOneOf(std::string_view& text, std::string_view characters)
-{
-    if (text.empty() || characters.find(text.front()) == std::string_view::npos)
-        return false;
-    text.remove_prefix(1);
-    return true;
+    if (text.starts_with('+') && !text.starts_with("+-"))
+        text.remove_prefix(1);
+    const auto point = text.find('.');
+    if (text.find_first_not_of("0123456789.eE+-") != std::string_view::npos ||
+        (point != std::string_view::npos && text.find_first_of("0123456789", point) != point + 1))
+        return std::errc::invalid_argument;
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+    return end == text.data() + text.size() ? error : std::errc::invalid_argument;
 }
 
 /// Whether a valid number that no double holds is too small rather than too large.
@@ -35,33 +30,15 @@ bool IsTiny(std::string_view text)
 
 bool IsValidNumber(std::string_view text)
 {
-    TakeOneOf(text, "+-");
-    const bool whole = TakeDigits(text);
-    if (text.empty())
-        return whole;
-    if (TakeOneOf(text, ".")) {
-        if (!TakeDigits(text))
-            return false;
-        if (text.empty())
-            return true;
-    } else if (!whole) {
-        return false;
-    }
-    if (!TakeOneOf(text, "eE"))
-        return false;
-    TakeOneOf(text, "+-");
-    return TakeDigits(text) && text.empty();
+    double value = 0;
+    return Parse(text, value) != std::errc::invalid_argument;
 }
 
 std::optional<double> ReadNumber(std::string_view text)
 {
-    if (!IsValidNumber(text))
-        return std::nullopt;
-    if (text.front() == '+')
-        text.remove_prefix(1);
     double value = 0;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    if (error == std::errc::result_out_of_range)
-        return IsTiny(text) ? std::optional(0.0) : std::nullopt;
-    return value;
+    const std::errc error = Parse(text, value);
+    if (error == std::errc::result_out_of_range && IsTiny(text))
+        return 0.0;
+    return error == std::errc() ? std::optional(value) : std::nullopt;
 }

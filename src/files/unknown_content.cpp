@@ -6,31 +6,6 @@
 
 namespace {
 
-/// Remembers which names were met, so that only the first occurrence of one is taken.
-class Filter
-{
-public:
-    Filter(const KnownNames& known, bool sections) : m_known(known), m_sections(sections) {}
-
-    bool IsUnknown(std::string_view name)
-    {
-        switch (m_known(name, m_sections)) {
-        case Known::No:
-            return true;
-        case Known::First:
-            return !m_met.insert(name).second;
-        case Known::Every:
-            break;
-        }
-        return false;
-    }
-
-private:
-    const KnownNames& m_known;
-    bool m_sections;
-    std::unordered_set<std::string_view> m_met;
-};
-
 UnknownNode CopyNode(tqlHandle node, bool isSection)
 {
     UnknownNode copy{std::string(tqlName(node)), isSection, {}, {}};
@@ -44,35 +19,25 @@ UnknownNode CopyNode(tqlHandle node, bool isSection)
 
 } // namespace
 
-void ForEachUnknown(tqlHandle section, const KnownNames& known, const std::function<void(tqlHandle, bool)>& visit)
-{
-    Filter keywords(known, false);
-    const int keywordCount = tqlGetNoKeywords(section);
-    for (int number = 1; number <= keywordCount; ++number) {
-        const tqlHandle keyword = tqlKeywordByNum(section, number);
-        if (keywords.IsUnknown(tqlName(keyword)))
-            visit(keyword, false);
-    }
-    Filter sections(known, true);
-    const int sectionCount = tqlGetNoSections(section);
-    for (int number = 1; number <= sectionCount; ++number) {
-        const tqlHandle inner = tqlSectionByNum(section, number);
-        if (sections.IsUnknown(tqlName(inner)))
-            visit(inner, true);
-    }
-}
-
 void CollectUnknown(tqlHandle section, const KnownNames& known, UnknownNodes& nodes, LoadReport* report)
 {
-    ForEachUnknown(section, known, [&](tqlHandle node, bool isSection) {
-        const std::string_view name = tqlName(node);
-        if (report)
-            report->Add(node, isSection ? nullptr : node,
-                        {.kind = known(name, isSection) == Known::No ? Finding::Unknown : Finding::Repeated,
-                         .section = std::string(isSection ? name : std::string_view()),
-                         .found = isSection ? std::string() : std::string(tqlGetRawParams(node))});
-        nodes.push_back(CopyNode(node, isSection));
-    });
+    for (const bool isSection : {false, true}) {
+        std::unordered_set<std::string_view> met; // of the names whose first occurrence is known
+        const int count = isSection ? tqlGetNoSections(section) : tqlGetNoKeywords(section);
+        for (int number = 1; number <= count; ++number) {
+            const tqlHandle node = isSection ? tqlSectionByNum(section, number) : tqlKeywordByNum(section, number);
+            const std::string_view name = tqlName(node);
+            const Known takes = known(name, isSection);
+            if (takes == Known::Every || (takes == Known::First && met.insert(name).second))
+                continue;
+            if (report)
+                report->Add(node, isSection ? nullptr : node,
+                            {.kind = takes == Known::No ? Finding::Unknown : Finding::Repeated,
+                             .section = std::string(isSection ? name : std::string_view()),
+                             .found = isSection ? std::string() : std::string(tqlGetRawParams(node))});
+            nodes.push_back(CopyNode(node, isSection));
+        }
+    }
 }
 
 void WriteUnknown(tqlHandle structure, const UnknownNodes& nodes)

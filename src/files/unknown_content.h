@@ -31,11 +31,8 @@ enum class Known
 };
 using KnownNames = std::function<Known(std::string_view name, bool isSection)>;
 
-/// Calls `visit` for every direct child of the section that its reader does not take: keywords, then sections.
-void ForEachUnknown(tqlHandle section, const KnownNames& known,
-                    const std::function<void(tqlHandle node, bool isSection)>& visit);
-
-/// Appends copies of those children, with everything in them, and reports them.
+/// Appends copies of the section's direct children that its reader does not take, keywords and then sections, with
+/// everything in them, and reports them.
 void CollectUnknown(tqlHandle section, const KnownNames& known, UnknownNodes& nodes, LoadReport* report = nullptr);
 /// Writes the nodes into the section being written, or as targets.
 void WriteUnknown(tqlHandle structure, const UnknownNodes& nodes);

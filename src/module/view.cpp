@@ -2,7 +2,6 @@
 
 #include "grid/gen_grid.h"
 #include "ks/fc/after_paint.h"
-#include "module/file_bar.h"
 #include "module/sheet.h"
 #include "pages/framework/page.h"
 #include "pages/page_table.h"
@@ -10,7 +9,6 @@
 
 #include <QTimer>
 #include <QUndoStack>
-#include <QVBoxLayout>
 #include <algorithm>
 #include <iterator>
 
@@ -44,11 +42,7 @@ CGenPropertyPage* CKavo0_hdView::ActivePage() const
 void CKavo0_hdView::OnInitialUpdate()
 {
     m_sheet = new CDlgPropertySheet(this);
-    auto* layout = new QVBoxLayout(this);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(0);
-    layout->addWidget(new CFileBar(*GetDocument(), this));
-    layout->addWidget(m_sheet, 1);
+    SetContent(m_sheet);
     setFocusProxy(m_sheet);
     const auto allowEditing = [this] { m_sheet->setEnabled(!GetDocument()->IsReadOnly()); };
     connect(GetDocument(), &CKavo0_hdDoc::FileStateChanged, m_sheet, allowEditing);

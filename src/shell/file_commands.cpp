@@ -1,5 +1,6 @@
 #include "shell/file_commands.h"
 
+#include "files/extensions.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
@@ -13,8 +14,6 @@
 #include <QSettings>
 
 namespace {
-
-constexpr char ProjectExtension[] = ".kvrp";
 
 bool IsProject(const QString& path)
 {

@@ -2,6 +2,7 @@
 
 #include "ks/fc/after_paint.h"
 #include "ks/fc/file_name.h"
+#include "ks/fc/findings_dialog.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
 #include "shell/plugin_loader.h"
@@ -38,6 +39,8 @@ bool CProjectController::Open(const QString& path, bool othersLater)
     RecentFiles::Add(project.path);
     Announce(KsRequest::ProjectOpened, project);
     m_tree->show();
+    if (!project.findings.empty())
+        (new CKsFindingsDialog(project.path, project.findings, &m_frame))->show();
     m_frame.resizeDocks({m_tree}, {ProjectTreeWidth}, Qt::Horizontal);
     m_frame.layout()->activate(); // the tree takes its room first
     const bool waits = othersLater && project.members.size() > 1;

@@ -18,11 +18,7 @@ constexpr DeclaredFile file{
 
 } // namespace
 
-FieldList ProjectMember::DeclaredFields()
-{
-    static constexpr auto fields = FieldsOf<ProjectMember>({FileName<&ProjectMember::file>(MemberName)});
-    return fields;
-}
+KVR_FIELDS(ProjectMember, FileName<&Self::file>(MemberName))
 
 QString ProjectMember::PathIn(const QDir& folder) const
 {

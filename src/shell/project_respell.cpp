@@ -32,9 +32,11 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
 {
     QList<qsizetype> offsets;
     const auto structure = ParseText(text.toStdString(), projectPath.toStdString());
-    ProjectFile project;
-    if (!structure || ReadDeclared(structure.value().Get(), DeclaredProjectFile(), &project))
+    if (!structure)
         return {};
+    ProjectFile project;
+    LoadReport unused(structure.value().Get());
+    ReadDeclared(structure.value().Get(), DeclaredProjectFile(), &project, unused);
     const QDir folder = QFileInfo(projectPath).absoluteDir();
     for (std::size_t i = 0; i < project.members.size(); ++i) {
         if (project.members[i].PathIn(folder) != QDir::cleanPath(path))

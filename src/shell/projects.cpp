@@ -1,8 +1,8 @@
 #include "shell/projects.h"
 
+#include "ks/fc/document_file.h"
 #include "ks/fc/exchange.h"
 #include "ks/fc/file_name.h"
-#include "ks/fc/parameter_file.h"
 #include "shell/project_file.h"
 
 #include <QDir>
@@ -15,15 +15,18 @@ namespace {
 bool ReadMembers(CProject& project, QString& error)
 {
     ProjectFile read;
-    const CKsParameterFile source(project.path, DeclaredProjectFile(), &read);
-    error = source.Error();
-    if (!error.isEmpty())
-        return false;
+    CKsDocumentFile file;
+    file.Read(project.path, project.path, [&read](tqlHandle structure, LoadReport& report) {
+        ReadDeclared(structure, DeclaredProjectFile(), &read, report);
+    });
+    error = file.WhyNothing();
+    project.findings = file.Findings();
     const QDir folder = QFileInfo(project.path).absoluteDir();
     for (const ProjectMember& member : read.members)
-        project.members << member.PathIn(folder);
+        if (!member.file.empty())
+            project.members << member.PathIn(folder);
     project.members.removeDuplicates();
-    return true;
+    return error.isEmpty();
 }
 
 } // namespace

@@ -4,6 +4,7 @@
 // request 25) and then hears when another member's data change (request 522); other projects never do.
 #pragma once
 
+#include "files/finding.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/package.h"
 
@@ -20,6 +21,7 @@ struct CProject
     QString path;                       // absolute
     QString name;                       // the file's base name
     QStringList members;                // absolute paths as they are spelt there, in file order
+    std::vector<Finding> findings;      // what of the file was not taken as it stands
     std::vector<QPointer<CView>> views; // those that joined
 };
 

@@ -31,7 +31,7 @@ struct Builder
     bool BeginParam();
     void Open(std::string_view name);
     void Close();
-    bool BeginKeyword(std::string_view name);
+    void BeginKeyword(std::string_view name);
 };
 
 void Builder::EndLine()
@@ -78,7 +78,7 @@ void Builder::Close()
     text += "]\n";
 }
 
-bool Builder::BeginKeyword(std::string_view name)
+void Builder::BeginKeyword(std::string_view name)
 {
     EndLine();
     valid = valid && IsName(name) && !open.empty();
@@ -87,7 +87,6 @@ bool Builder::BeginKeyword(std::string_view name)
     text += " =";
     inLine = true;
     anyParam = false;
-    return valid;
 }
 
 Builder* AsBuilder(tqlHandle handle)
@@ -110,18 +109,19 @@ bool Fits(char letter, const TqlIn& value)
     return letters[value.index()].find(letter) != std::string_view::npos;
 }
 
-void AddByLetter(tqlHandle structure, char letter, const TqlIn& value)
+template <typename... Functions>
+struct Overloads : Functions...
 {
-    if (letter == 'n')
-        tqlAddFilename(structure, std::get<std::string_view>(value));
-    else if (const auto* text = std::get_if<std::string_view>(&value))
-        tqlAddString(structure, *text);
-    else if (const auto* flag = std::get_if<bool>(&value))
-        tqlAddBool(structure, *flag);
-    else if (const auto* integer = std::get_if<std::int32_t>(&value))
-        tqlAddInt(structure, *integer);
-    else
-        tqlAddDouble(structure, std::get<double>(value));
+    using Functions::operator()...;
+};
+
+void AddParam(tqlHandle structure, const TqlIn& value)
+{
+    std::visit(Overloads{[&](std::int32_t integer) { tqlAddInt(structure, integer); },
+                         [&](double number) { tqlAddDouble(structure, number); },
+                         [&](bool flag) { tqlAddBool(structure, flag); },
+                         [&](std::string_view text) { tqlAddString(structure, text); }},
+               value);
 }
 
 } // namespace
@@ -196,33 +196,10 @@ void tqlAddFilename(tqlHandle structure, std::string_view value)
     AddParam(structure, AppendFilename, value);
 }
 
-void tqlPutParam(tqlHandle structure, std::string_view name, bool value)
+void tqlPutParam(tqlHandle structure, std::string_view name, const TqlIn& value)
 {
     tqlAddKeyword(structure, name);
-    tqlAddBool(structure, value);
-}
-
-void tqlPutParam(tqlHandle structure, std::string_view name, std::int32_t value)
-{
-    tqlAddKeyword(structure, name);
-    tqlAddInt(structure, value);
-}
-
-void tqlPutParam(tqlHandle structure, std::string_view name, double value)
-{
-    tqlAddKeyword(structure, name);
-    tqlAddDouble(structure, value);
-}
-
-void tqlPutParam(tqlHandle structure, std::string_view name, std::string_view value)
-{
-    tqlAddKeyword(structure, name);
-    tqlAddString(structure, value);
-}
-
-void tqlPutParam(tqlHandle structure, std::string_view name, const char* value)
-{
-    tqlPutParam(structure, name, std::string_view(value));
+    AddParam(structure, value);
 }
 
 void tqlPutParamFilename(tqlHandle structure, std::string_view name, std::string_view value)
@@ -240,21 +217,29 @@ bool tqlPutListParam(tqlHandle structure, std::string_view name, std::string_vie
         if (!Fits(signature[i], values[i]))
             return false;
     tqlAddKeyword(structure, name);
-    for (std::size_t i = 0; i < values.size(); ++i)
-        AddByLetter(structure, signature[i], values[i]);
+    for (std::size_t i = 0; i < values.size(); ++i) {
+        if (signature[i] == 'n')
+            tqlAddFilename(structure, std::get<std::string_view>(values[i]));
+        else
+            AddParam(structure, values[i]);
+    }
     return true;
 }
 
 void tqlAddRawKeyword(tqlHandle structure, std::string_view name, std::string_view params)
 {
+    tqlAddKeyword(structure, name);
+    tqlAddRawParams(structure, params);
+}
+
+void tqlAddRawParams(tqlHandle structure, std::string_view params)
+{
     Builder* const builder = AsBuilder(structure);
     if (!builder)
         return;
     builder->valid = builder->valid && IsParamList(params);
-    if (builder->BeginKeyword(name) && !params.empty()) {
-        builder->BeginParam();
+    if (builder->valid && !params.empty() && builder->BeginParam())
         builder->text += params;
-    }
 }
 
 std::string_view tqlGetText(tqlHandle structure)

@@ -22,7 +22,7 @@ void SetGlobalError(TqlError code)
     globalError = code;
 }
 
-Text::Text(std::size_t size) : m_bytes(std::make_unique_for_overwrite<char[]>(size + 2 + ReadAhead)), m_size(size) {}
+Text::Text(std::size_t size) : m_bytes(std::make_unique_for_overwrite<char[]>(size + 1 + ReadAhead)), m_size(size) {}
 
 void Text::Grow(std::size_t size)
 {
@@ -34,8 +34,7 @@ void Text::Grow(std::size_t size)
 void Text::Finish(std::size_t size)
 {
     m_size = size;
-    m_begin = size >= 3 && std::memcmp(Data(), "\xEF\xBB\xBF", 3) == 0 ? 4 : 1;
-    m_bytes[m_begin - 1] = '\0';
+    m_begin = size >= 3 && std::memcmp(Data(), "\xEF\xBB\xBF", 3) == 0 ? 3 : 0;
     Data()[size] = '\n';
     std::memset(Data() + size + 1, 0, ReadAhead);
 }

@@ -1,5 +1,4 @@
 // Finding, counting, naming and placing what a loaded structure holds.
-#include "tql/char_class.h"
 #include "tql/node.h"
 #include "tql/scan.h"
 #include "tql/utf8.h"
@@ -11,27 +10,26 @@ using namespace tql;
 
 namespace {
 
-constexpr auto NotFound = NameIndex::NotFound;
+constexpr std::size_t NotFound = std::size_t(-1);
 
+// Made at the first look-up by name.
 template <typename Children, typename NameOf>
-const NameIndex& IndexOf(std::unique_ptr<NameIndex>& index, const Children& children, NameOf nameOf)
+const std::vector<std::uint32_t>& Named(std::unique_ptr<NameIndex>& index, const Children& children,
+                                        std::string_view name, NameOf nameOf)
 {
+    static const std::vector<std::uint32_t> none;
     if (!index) {
-        std::vector<std::string_view> names(children.size());
-        std::transform(children.begin(), children.end(), names.begin(), nameOf);
-        index = std::make_unique<NameIndex>(names);
+        index = std::make_unique<NameIndex>();
+        for (std::size_t i = 0; i < children.size(); ++i)
+            (*index)[nameOf(children[i])].push_back(std::uint32_t(i));
     }
-    return *index;
+    const auto found = index->find(name);
+    return found == index->end() ? none : found->second;
 }
 
-const NameIndex& SectionIndex(Section& parent)
+const std::vector<std::uint32_t>& KeywordsNamed(Section& section, std::string_view name)
 {
-    return IndexOf(parent.sectionIndex, parent.sections, [](const Section* section) { return section->name; });
-}
-
-const NameIndex& KeywordIndex(Section& section)
-{
-    return IndexOf(section.keywordIndex, section.keywords, [](const Keyword& keyword) { return keyword.Name(); });
+    return Named(section.keywordIndex, section.keywords, name, [](const Keyword& keyword) { return keyword.Name(); });
 }
 
 // Position from 0 of a number from 1.
@@ -54,11 +52,6 @@ const char* TextOf(tqlHandle node)
         return param;
     const Section* const section = AsParent(node);
     return section && !section->name.empty() ? section->name.data() - 1 : nullptr; // at its bracket
-}
-
-std::size_t ColumnOf(const char* lineStart, const char* at)
-{
-    return CountCharacters({lineStart, std::size_t(at - lineStart)}) + 1;
 }
 
 const std::vector<std::size_t>& LineStarts(Structure& structure)
@@ -87,8 +80,10 @@ tqlHandle tqlSectionByNameNum(tqlHandle handle, std::string_view name, int numbe
     Section* const parent = AsParent(handle);
     if (!parent || parent->sections.empty())
         return nullptr;
-    const std::size_t position = SectionIndex(*parent).Find(name, number);
-    return position == NotFound ? nullptr : HandleOf(parent->sections[position]);
+    const auto& positions =
+        Named(parent->sectionIndex, parent->sections, name, [](const Section* section) { return section->name; });
+    const std::size_t place = PositionOf(number, positions.size());
+    return place == NotFound ? nullptr : HandleOf(parent->sections[positions[place]]);
 }
 
 tqlHandle tqlKeywordByNameNum(tqlHandle handle, std::string_view name, int number)
@@ -98,8 +93,9 @@ tqlHandle tqlKeywordByNameNum(tqlHandle handle, std::string_view name, int numbe
         return nullptr;
     if (HasOneName(*section))
         return section->keywords.front().Name() == name ? tqlKeywordByNum(handle, number) : nullptr;
-    const std::size_t position = KeywordIndex(*section).Find(name, number);
-    return position == NotFound ? nullptr : HandleOf(&section->keywords[position]);
+    const auto& positions = KeywordsNamed(*section, name);
+    const std::size_t place = PositionOf(number, positions.size());
+    return place == NotFound ? nullptr : HandleOf(&section->keywords[positions[place]]);
 }
 
 tqlHandle tqlParamByNum(tqlHandle handle, int number)
@@ -143,7 +139,7 @@ int tqlGetNoKeywords(tqlHandle handle, std::string_view name)
         return 0;
     if (HasOneName(*section))
         return section->keywords.front().Name() == name ? tqlGetNoKeywords(handle) : 0;
-    return KeywordIndex(*section).Count(name);
+    return int(KeywordsNamed(*section, name).size());
 }
 
 int tqlGetNoParams(tqlHandle keyword)
@@ -174,20 +170,6 @@ std::string_view tqlName(tqlHandle node)
     return section ? section->name : std::string_view();
 }
 
-TqlPosition tqlGetPosition(tqlHandle node)
-{
-    const char* const at = TextOf(node);
-    if (!at)
-        return {};
-    const char* lineStart = at;
-    while (lineStart[-1] != '\n' && lineStart[-1] != '\0')
-        --lineStart;
-    std::size_t line = 1;
-    for (const char* p = lineStart; p[-1] != '\0'; --p)
-        line += p[-1] == '\n';
-    return {line, ColumnOf(lineStart, at)};
-}
-
 TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node)
 {
     Structure* const whole = AsStructure(structure);
@@ -197,7 +179,8 @@ TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node)
     const auto& starts = LineStarts(*whole);
     const auto offset = std::size_t(at - whole->text.begin());
     const auto next = std::upper_bound(starts.begin(), starts.end(), offset);
-    return {std::size_t(next - starts.begin()), ColumnOf(whole->text.begin() + next[-1], at)};
+    return {std::size_t(next - starts.begin()),
+            CountCharacters({whole->text.begin() + next[-1], offset - next[-1]}) + 1};
 }
 
 namespace {

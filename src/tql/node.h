@@ -5,7 +5,6 @@
 // and nothing a parameter, and a handle of the wrong kind is recognised wherever it is passed.
 #pragma once
 
-#include "tql/name_index.h"
 #include "tql/tql.h"
 
 #include <cstdint>
@@ -13,6 +12,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <unordered_map>
 #include <vector>
 
 namespace tql {
@@ -55,6 +55,9 @@ struct Keyword
 };
 static_assert(sizeof(Keyword) == 16);
 
+/// Where the occurrences of a name stand among the children of one parent, by position from 0.
+using NameIndex = std::unordered_map<std::string_view, std::vector<std::uint32_t>>;
+
 /// A target, a section, or (without a name) the file around the targets.
 struct Section
 {
@@ -68,16 +71,15 @@ struct Section
     std::unique_ptr<NameIndex> sectionIndex, keywordIndex; // made at the first look-up by name
 };
 
-/// The text of a file, framed so that scanning needs no bounds: a NUL (which no text holds) before it, and after it a
-/// line feed and zeros.
+/// The text of a file, framed so that scanning needs no bounds: a line feed and zeros stand behind it.
 class Text
 {
 public:
     /// Uninitialised bytes to read into; Finish must follow.
     explicit Text(std::size_t size = 0);
-    char* Data() { return m_bytes.get() + 1; }
+    char* Data() { return m_bytes.get(); }
     const char* begin() const { return m_bytes.get() + m_begin; }
-    const char* end() const { return m_bytes.get() + 1 + m_size; }
+    const char* end() const { return m_bytes.get() + m_size; }
     std::size_t Size() const { return m_size; }
     /// Makes room for `size` bytes, keeping what is there.
     void Grow(std::size_t size);
@@ -86,7 +88,7 @@ public:
 
 private:
     std::unique_ptr<char[]> m_bytes;
-    std::size_t m_size = 0, m_begin = 1;
+    std::size_t m_size = 0, m_begin = 0;
 };
 
 struct Structure : Section

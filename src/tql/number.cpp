@@ -17,21 +17,13 @@ const char* WordEndAt(const char* p)
     return p;
 }
 
-bool FitsInt(const char* digits, const char* end, bool negative)
-{
-    while (digits < end && *digits == '0')
-        ++digits;
-    std::uint64_t value = 0;
-    return end - digits <= 10 && ReadDigits(digits, value) &&
-           value <= std::uint64_t{std::numeric_limits<std::int32_t>::max()} + negative;
-}
-
 // A value whose text has no exponent and fewer digits than this is in range whatever the digits are.
 constexpr std::ptrdiff_t SafeLength = 300;
 
-bool FitsDouble(const char* p, const char* end)
+template <typename Value>
+bool Fits(const char* p, const char* end)
 {
-    double value;
+    Value value;
     return std::from_chars(p, end, value).ec == std::errc();
 }
 
@@ -50,7 +42,7 @@ NumberScan ScanNumber(const char* const p)
     }
     const char* end = SkipDigits(digits);
     if (Is(*end, WordEnd) && end != digits) {
-        if (!FitsInt(digits, end, negative))
+        if (!Fits<std::int32_t>(p, end))
             return {end, TqlType::None, TqlPhrase::IntRange};
         return {end, TqlType::Int};
     }
@@ -68,7 +60,7 @@ NumberScan ScanNumber(const char* const p)
     }
     if (!anyDigit || !Is(*end, WordEnd))
         return {WordEndAt(end), TqlType::None, TqlPhrase::Number};
-    if ((exponent || end - p > SafeLength) && !FitsDouble(p, end))
+    if ((exponent || end - p > SafeLength) && !Fits<double>(p, end))
         return {end, TqlType::None, TqlPhrase::DoubleRange};
     return {end, TqlType::Double};
 }
@@ -160,7 +152,7 @@ void AppendDouble(std::string& out, double value)
     const char* const digits = buffer + (buffer[0] == '-');
     if (SkipDigits(digits) != end)
         return;
-    if (!FitsInt(digits, end, digits != buffer) || (value == 0 && std::signbit(value)))
+    if (!Fits<std::int32_t>(buffer, end) || (value == 0 && std::signbit(value)))
         out += ".0";
 }
 

@@ -8,6 +8,7 @@
 #include "tql/utf8.h"
 
 #include <algorithm>
+#include <cstdio>
 #include <cstring>
 #include <limits>
 
@@ -22,9 +23,8 @@ TqlTerm Closing(std::string_view name)
 
 std::string HexOf(unsigned value, int digits)
 {
-    std::string text;
-    for (int shift = (digits - 1) * 4; shift >= 0; shift -= 4)
-        text += "0123456789ABCDEF"[(value >> shift) & 15];
+    char text[16];
+    std::snprintf(text, sizeof text, "%0*X", digits, value);
     return text;
 }
 

@@ -3,7 +3,9 @@
 #include "tql/number.h"
 #include "tql/utf8.h"
 
+#include <charconv>
 #include <cstring>
+#include <iterator>
 
 namespace tql {
 
@@ -16,28 +18,16 @@ struct Escape
 };
 constexpr Escape Escapes[] = {{'n', '\n'}, {'r', '\r'}, {'t', '\t'}};
 
-bool IsHex(char c)
-{
-    return Is(c, Digit) || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F');
-}
-
-std::uint32_t HexValue(char c)
-{
-    return std::uint32_t(Is(c, Digit) ? c - '0' : (c | 0x20) - 'a' + 10);
-}
-
 // `p` behind "\u"; on success the end, and the character. Null when it is no \u{...} of a character.
 const char* ScanCodePoint(const char* p, std::uint32_t& value)
 {
-    value = 0;
-    if (*p != '{' || !IsHex(p[1]))
+    const char* const close =
+        FindByte(p, [](std::uint64_t block) { return EqualMask(block, '}') | EqualMask(block, '\n'); });
+    if (*p != '{' || *close != '}')
         return nullptr;
-    for (++p; IsHex(*p); ++p) {
-        value = value * 16 + HexValue(*p);
-        if (value > 0x10FFFF)
-            return nullptr;
-    }
-    return *p == '}' && IsScalarValue(value) ? p + 1 : nullptr;
+    value = 0;
+    const auto [end, error] = std::from_chars(p + 1, close, value, 16);
+    return end == close && error == std::errc() && IsScalarValue(value) ? close + 1 : nullptr;
 }
 
 struct Quoting
@@ -113,13 +103,9 @@ std::size_t PlainRun(std::string_view text, CharClass stop)
 
 void AppendCodeEscape(std::string& out, char control)
 {
-    constexpr const char* digits = "0123456789abcdef";
-    const auto code = static_cast<unsigned char>(control);
-    out += "\\u{";
-    if (code >= 16)
-        out += digits[code >> 4];
-    out += digits[code & 15];
-    out += '}';
+    char digits[2];
+    const char* const end = std::to_chars(digits, std::end(digits), int(control), 16).ptr;
+    out.append("\\u{").append(digits, std::size_t(end - digits)) += '}';
 }
 
 // One character that is not plain; returns its length in bytes.

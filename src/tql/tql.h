@@ -105,9 +105,8 @@ struct TqlPosition
 {
     std::size_t line = 0, column = 0; // from 1; 0 for what was not loaded from a text
 };
-/// Where a section opens, a keyword's name or a parameter stands. Counted on demand, from the front of the text.
-TqlPosition tqlGetPosition(tqlHandle node);
-/// The same for many nodes of one structure: the first call counts the lines, the others only look up.
+/// Where a section opens, a keyword's name or a parameter stands. The first call counts the structure's lines, the
+/// others only look up.
 TqlPosition tqlGetPosition(tqlHandle structure, tqlHandle node);
 
 // ---- values ------------------------------------------------------------------------------------
@@ -133,19 +132,13 @@ bool tqlGetString(tqlHandle param, std::string* value);
 
 /// The same, and the handle moves on to the next parameter (null behind the last) whatever the type was. The quick way
 /// through all parameters of a keyword.
-bool tqlTake(tqlHandle* param, std::int32_t* value);
-bool tqlTake(tqlHandle* param, double* value);
-bool tqlTake(tqlHandle* param, bool* value);
-bool tqlTake(tqlHandle* param, std::string* value);
-
-/// Value of parameter `param` of occurrence `keyword` of the named keyword; same contract.
-bool tqlGetParam(tqlHandle section, std::string_view name, bool* value, int keyword = 1, int param = 1);
-bool tqlGetParam(tqlHandle section, std::string_view name, std::int32_t* value, int keyword = 1, int param = 1);
-bool tqlGetParam(tqlHandle section, std::string_view name, double* value, int keyword = 1, int param = 1);
-bool tqlGetParam(tqlHandle section, std::string_view name, std::string* value, int keyword = 1, int param = 1);
-bool tqlGetParamFilename(tqlHandle section, std::string_view name, std::string* value, int keyword = 1, int param = 1);
+template <typename Value> // of the functions above
+bool tqlTake(tqlHandle* param, Value* value);
 
 using TqlOut = std::variant<std::int32_t*, double*, bool*, std::string*>;
+/// Value of parameter `param` of occurrence `keyword` of the named keyword; same contract.
+bool tqlGetParam(tqlHandle section, std::string_view name, TqlOut value, int keyword = 1, int param = 1);
+bool tqlGetParamFilename(tqlHandle section, std::string_view name, std::string* value, int keyword = 1, int param = 1);
 /// All parameters of one keyword by signature ("i" integer, "d" float, "b" boolean, "s" string, "n" file name), one
 /// pointer a letter. All or nothing: false, and no pointer written, unless every parameter is there with its type.
 bool tqlGetListParam(tqlHandle section, std::string_view name, int number, std::string_view signature,
@@ -175,21 +168,18 @@ void tqlAddBool(tqlHandle structure, bool value);
 void tqlAddString(tqlHandle structure, std::string_view value);
 void tqlAddFilename(tqlHandle structure, std::string_view value);
 
-/// A keyword with one parameter.
-void tqlPutParam(tqlHandle structure, std::string_view name, bool value);
-void tqlPutParam(tqlHandle structure, std::string_view name, std::int32_t value);
-void tqlPutParam(tqlHandle structure, std::string_view name, double value);
-void tqlPutParam(tqlHandle structure, std::string_view name, std::string_view value);
-void tqlPutParam(tqlHandle structure, std::string_view name, const char* value); // a literal is text, not a bool
-void tqlPutParamFilename(tqlHandle structure, std::string_view name, std::string_view value);
-
 using TqlIn = std::variant<std::int32_t, double, bool, std::string_view>;
+/// A keyword with one parameter.
+void tqlPutParam(tqlHandle structure, std::string_view name, const TqlIn& value);
+void tqlPutParamFilename(tqlHandle structure, std::string_view name, std::string_view value);
 /// A keyword whose parameters follow the signature; false, and nothing added, when they do not fit it.
 bool tqlPutListParam(tqlHandle structure, std::string_view name, std::string_view signature,
                      const std::vector<TqlIn>& values);
 
 /// A keyword with parameters already in file notation (as tqlGetRawParams gave them).
 void tqlAddRawKeyword(tqlHandle structure, std::string_view name, std::string_view params);
+/// Likewise parameters behind those of the keyword added last.
+void tqlAddRawParams(tqlHandle structure, std::string_view params);
 
 /// The text built so far. Valid until the next operation on the structure. Empty while a section is still open, and
 /// when something was asked that no file can hold: a name with other characters than names have (docs/format.md), a

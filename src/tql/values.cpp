@@ -15,20 +15,8 @@ tqlHandle ParamOf(tqlHandle section, std::string_view name, int keyword, int par
 // Which types a letter of a signature takes.
 bool Fits(char letter, TqlType type)
 {
-    switch (letter) {
-    case 'i':
-        return type == TqlType::Int;
-    case 'd':
-        return type == TqlType::Double || type == TqlType::Int;
-    case 'b':
-        return type == TqlType::Bool;
-    case 's':
-        return type == TqlType::String;
-    case 'n':
-        return type == TqlType::FileName;
-    default:
-        return false;
-    }
+    constexpr std::string_view letters[] = {"", "id", "d", "b", "s", "n"}; // by type
+    return letters[std::size_t(type)].find(letter) != std::string_view::npos;
 }
 
 bool Fits(char letter, const TqlOut& out)
@@ -89,16 +77,6 @@ bool Get(tqlHandle param, Value* value)
     return ReadValue(AsParam(param), value, end);
 }
 
-template <typename Value>
-bool Take(tqlHandle* param, Value* value)
-{
-    const char* const p = AsParam(*param);
-    const char* end = nullptr;
-    const bool stored = ReadValue(p, value, end);
-    *param = stored ? HandleOf(ParamBehind(end)) : tqlNextParam(*param);
-    return stored;
-}
-
 } // namespace
 
 bool tqlGetInt(tqlHandle param, std::int32_t* value)
@@ -118,41 +96,23 @@ bool tqlGetString(tqlHandle param, std::string* value)
     return Get(param, value);
 }
 
-bool tqlTake(tqlHandle* param, std::int32_t* value)
+template <typename Value>
+bool tqlTake(tqlHandle* param, Value* value)
 {
-    return Take(param, value);
+    const char* const p = AsParam(*param);
+    const char* end = nullptr;
+    const bool stored = ReadValue(p, value, end);
+    *param = stored ? HandleOf(ParamBehind(end)) : tqlNextParam(*param);
+    return stored;
 }
-bool tqlTake(tqlHandle* param, double* value)
-{
-    return Take(param, value);
-}
-bool tqlTake(tqlHandle* param, bool* value)
-{
-    return Take(param, value);
-}
-bool tqlTake(tqlHandle* param, std::string* value)
-{
-    return Take(param, value);
-}
+template bool tqlTake(tqlHandle*, std::int32_t*);
+template bool tqlTake(tqlHandle*, double*);
+template bool tqlTake(tqlHandle*, bool*);
+template bool tqlTake(tqlHandle*, std::string*);
 
-bool tqlGetParam(tqlHandle section, std::string_view name, bool* value, int keyword, int param)
+bool tqlGetParam(tqlHandle section, std::string_view name, TqlOut value, int keyword, int param)
 {
-    return tqlGetBool(ParamOf(section, name, keyword, param), value);
-}
-
-bool tqlGetParam(tqlHandle section, std::string_view name, std::int32_t* value, int keyword, int param)
-{
-    return tqlGetInt(ParamOf(section, name, keyword, param), value);
-}
-
-bool tqlGetParam(tqlHandle section, std::string_view name, double* value, int keyword, int param)
-{
-    return tqlGetDouble(ParamOf(section, name, keyword, param), value);
-}
-
-bool tqlGetParam(tqlHandle section, std::string_view name, std::string* value, int keyword, int param)
-{
-    return tqlGetString(ParamOf(section, name, keyword, param), value);
+    return std::visit([handle = ParamOf(section, name, keyword, param)](auto* out) { return Get(handle, out); }, value);
 }
 
 bool tqlGetParamFilename(tqlHandle section, std::string_view name, std::string* value, int keyword, int param)
@@ -173,6 +133,6 @@ bool tqlGetListParam(tqlHandle section, std::string_view name, int number, std::
             return false;
     param = first;
     for (const TqlOut& pointer : out)
-        std::visit([&](auto* value) { Take(&param, value); }, pointer);
+        std::visit([&](auto* value) { tqlTake(&param, value); }, pointer);
     return true;
 }

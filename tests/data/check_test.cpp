@@ -1,6 +1,6 @@
 #include "hd_support.h"
 
-#include "data/hd_check.h"
+#include "data/hd_file.h"
 
 #include <algorithm>
 

@@ -141,7 +141,7 @@ TEST(Unknown, ParametersTravelWithTheirRecord)
     copy.LeakageList.Add(read.LeakageList.GetAt(1));
     copy.LeakageList.Add(read.LeakageList.GetAt(0));
     copy.LeakageList.GetAt(1) = copy.LeakageList.GetAt(1);
-    EXPECT_NE(HDFileText(copy).find("\"S\", 1, 2\n    DATA = \"R\", 1, 2, 1.5, <f>, \"t\", false, -3\n"),
+    EXPECT_NE(HDFileText(copy).find("\"S\", 1, 2\n    DATA = \"R\", 1, 2, 1.50, <f>, \"t\", false, -3\n"),
               std::string::npos);
 }
 

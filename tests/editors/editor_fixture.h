@@ -7,8 +7,11 @@
 #include "grid/row_commands.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/exchange.h"
+#include "ks/fc/file_bar.h"
+#include "ks/fc/findings_dialog.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/project_doc.h"
 #include "ks/units/edit_style.h"
 
 #include <QComboBox>
@@ -28,7 +31,7 @@ protected:
         KsSetMainWindow(this);
         KsSetMessageBoxHandler([this](const CString& text, QMessageBox::StandardButtons) {
             boxes << text;
-            return QMessageBox::Ok;
+            return answer;
         });
     }
     ~EditorTest() override
@@ -49,6 +52,52 @@ protected:
     {
         QFile file(path);
         return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
+    }
+
+    /// Reads a file and says what was not taken as it stands: "line keyword: what stands there -> what is used", or why
+    /// nothing was taken.
+    template <typename Load>
+    static QString ReadBy(const QString& path, Load load)
+    {
+        CKsDocumentFile file;
+        file.Read(path, path, load);
+        QStringList told{file.WhyNothing()};
+        told.removeAll(QString());
+        if (told.isEmpty())
+            for (const Finding& each : file.Findings())
+                told << QString("%1 %2: %3 -> %4")
+                            .arg(each.line)
+                            .arg(QString::fromStdString(each.keyword.empty() ? "[" + each.section + "]" : each.keyword),
+                                 QString::fromStdString(each.found), QString::fromStdString(each.used));
+        return told.join("; ");
+    }
+    /// Opens a file of which two places are not taken as they stand, and saves it. `lines`: "line, what is expected".
+    void CheckFindings(CView* view, const QStringList& lines)
+    {
+        ASSERT_NE(view, nullptr);
+        EXPECT_TRUE(boxes.isEmpty());
+        auto* document = static_cast<CKsProjectDoc*>(view->GetDocument());
+        EXPECT_TRUE(view->findChild<CKsFileBar*>()->isVisible());
+        ASSERT_TRUE(QTest::qWaitFor([&] { return view->findChild<CKsFindingsDialog*>() != nullptr; }));
+        const auto* model = view->findChild<CKsFindingsModel*>();
+        QStringList rows;
+        for (int row = 0; row < model->rowCount(); ++row)
+            rows << model->index(row, 0).data().toString() + ", " + model->index(row, 6).data().toString();
+        EXPECT_EQ(rows, lines);
+
+        const QString path = document->GetPathName();
+        const QByteArray before = Read(path);
+        EXPECT_FALSE(document->DoSave(path));
+        ASSERT_EQ(boxes.size(), 1);
+        EXPECT_TRUE(boxes.takeFirst().contains(QFileInfo(path).fileName() + ".original-1"));
+        EXPECT_EQ(Read(path), before);
+        answer = QMessageBox::Yes;
+        EXPECT_TRUE(document->DoSave(path));
+        EXPECT_EQ(Read(path + ".original-1"), before);
+        EXPECT_EQ(document->File().KeptCopy(), path + ".original-1");
+        EXPECT_TRUE(document->DoSave(path));
+        EXPECT_EQ(boxes.size(), 1) << "asked once";
+        EXPECT_NE(Read(path), before);
     }
 
     /// Opens a file in a window of that size; null when the editor refused it.
@@ -121,6 +170,7 @@ protected:
 
     QTemporaryDir folder;
     QStringList boxes, log;
+    QMessageBox::StandardButton answer = QMessageBox::Ok; // to every message
     std::intptr_t project = 7;
     std::unique_ptr<CMultiDocTemplate> documents;
     std::unique_ptr<CKsMDIFrameWnd> frame;

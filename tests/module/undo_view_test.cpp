@@ -2,7 +2,7 @@
 // seen.
 #include "exchange_fixture.h"
 
-#include "data/hd_check.h"
+#include "data/hd_file.h"
 
 #include <QClipboard>
 #include <QLabel>

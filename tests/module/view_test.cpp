@@ -2,8 +2,8 @@
 #include "module_fixture.h"
 
 #include "ks/fc/doc_template.h"
-#include "module/file_bar.h"
-#include "module/findings_dialog.h"
+#include "ks/fc/file_bar.h"
+#include "ks/fc/findings_dialog.h"
 #include "module/kavo0_hd.h"
 #include "module/sheet.h"
 #include "module/view.h"
@@ -274,9 +274,9 @@ TEST_F(ViewTest, WhatWasNotTakenIsListedOnceTheWindowIsThere)
                               "[/WaveList]\n[/KAVO0_HD]\n");
     auto* view = Open();
     ASSERT_NE(view, nullptr);
-    EXPECT_EQ(view->findChild<CFindingsDialog*>(), nullptr) << "not before the first paint";
-    ASSERT_TRUE(QTest::qWaitFor([&] { return view->findChild<CFindingsDialog*>() != nullptr; }));
-    auto* dialog = view->findChild<CFindingsDialog*>();
+    EXPECT_EQ(view->findChild<CKsFindingsDialog*>(), nullptr) << "not before the first paint";
+    ASSERT_TRUE(QTest::qWaitFor([&] { return view->findChild<CKsFindingsDialog*>() != nullptr; }));
+    auto* dialog = view->findChild<CKsFindingsDialog*>();
     EXPECT_FALSE(dialog->isModal());
     auto* table = dialog->findChild<QTableView*>();
     ASSERT_EQ(table->model()->rowCount(), 2);
@@ -286,12 +286,12 @@ TEST_F(ViewTest, WhatWasNotTakenIsListedOnceTheWindowIsThere)
               "Line\tColumn\tSection\tKeyword\tParameter\tIn the file\tExpected\tUsed instead\n"
               "3\t19\tWaveList\tDATA\t4 WaveApproximation\t2.0\tan integer\t2\n"
               "4\t19\tWaveList\tDATA\t4 WaveApproximation\t\"x\"\tan integer\t0\n");
-    auto* bar = view->findChild<CFileBar*>();
+    auto* bar = view->findChild<CKsFileBar*>();
     EXPECT_TRUE(bar->isVisible());
     dialog->close();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     bar->findChild<QPushButton*>()->click();
-    EXPECT_NE(view->findChild<CFindingsDialog*>(), nullptr) << "reachable again";
+    EXPECT_NE(view->findChild<CKsFindingsDialog*>(), nullptr) << "reachable again";
     EXPECT_TRUE(boxes.isEmpty());
 }
 
@@ -299,9 +299,9 @@ TEST_F(ViewTest, ACleanFileHasNoBar)
 {
     auto* view = Open();
     ASSERT_NE(view, nullptr);
-    EXPECT_FALSE(view->findChild<CFileBar*>()->isVisible());
+    EXPECT_FALSE(view->findChild<CKsFileBar*>()->isVisible());
     QTest::qWait(50);
-    EXPECT_EQ(view->findChild<CFindingsDialog*>(), nullptr);
+    EXPECT_EQ(view->findChild<CKsFindingsDialog*>(), nullptr);
 }
 
 } // namespace

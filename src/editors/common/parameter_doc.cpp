@@ -2,14 +2,12 @@
 
 #include "ks/fc/message_box.h"
 
-#include <QDir>
-#include <QUndoStack>
-
 BOOL CParameterDoc::OnOpenDocument(const CString& path)
 {
     if (!CKsDoc::OnOpenDocument(path))
         return false;
-    const QString reason = ReadFile(path);
+    ReadFile(path, [this](tqlHandle structure, LoadReport& report) { Load(structure, report); });
+    const CString reason = m_file.WhyNothing();
     if (!reason.isEmpty())
         KsMessageBox(reason);
     return reason.isEmpty();
@@ -18,12 +16,10 @@ BOOL CParameterDoc::OnOpenDocument(const CString& path)
 BOOL CParameterDoc::OnSaveDocument(const CString& path)
 {
     UpdateAllViews(nullptr, StoreHint);
-    const QString reason = WriteFile(path);
-    if (!reason.isEmpty()) {
-        KsMessageBox(tr("%1 could not be saved.\n%2").arg(QDir::toNativeSeparators(path), reason));
+    if (!m_file.MayReplace(path) || !m_file.Write(path, [this](const std::string& written) { return Save(written); }))
         return false;
-    }
-    UndoStack().setClean();
-    SetModifiedFlag(false);
+    FileWritten();
+    if (!m_file.Renamed().isEmpty())
+        Say(m_file.Renamed());
     return true;
 }

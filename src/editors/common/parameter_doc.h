@@ -9,13 +9,13 @@ class CParameterDoc : public CKsProjectDoc
 public:
     using CKsProjectDoc::CKsProjectDoc;
 
-    /// A file that cannot be read is not opened, after a message that names the line.
+    /// A file that cannot be parsed or is of another kind is not opened, after a message that says where and why. Of
+    /// others, what is not taken as it stands is listed (File()).
     BOOL OnOpenDocument(const CString& path) override;
     /// When that fails, the document stays as it is, after a message that tells why.
     BOOL OnSaveDocument(const CString& path) override;
 
 protected:
-    /// Both return why not, for the user; nothing when it went well.
-    virtual QString ReadFile(const CString& path) = 0;
-    virtual QString WriteFile(const CString& path) const = 0;
+    virtual void Load(tqlHandle structure, LoadReport& report) = 0;
+    virtual Result<void> Save(const std::string& path) const = 0;
 };

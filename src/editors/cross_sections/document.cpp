@@ -14,14 +14,14 @@ const CCrossSection* CCrossSectionDoc::Section(int index) const
     return index >= 0 && std::size_t(index) < sections.size() ? &sections[std::size_t(index)] : nullptr;
 }
 
-QString CCrossSectionDoc::ReadFile(const CString& path)
+void CCrossSectionDoc::Load(tqlHandle structure, LoadReport& report)
 {
-    return ReadCrossSections(path, m_sections);
+    m_sections = LoadCrossSections(structure, report);
 }
 
-QString CCrossSectionDoc::WriteFile(const CString& path) const
+Result<void> CCrossSectionDoc::Save(const std::string& path) const
 {
-    return WriteCrossSections(path, m_sections);
+    return SaveCrossSections(m_sections, path);
 }
 
 void CCrossSectionDoc::DeleteContents()

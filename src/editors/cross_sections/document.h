@@ -22,8 +22,8 @@ public:
     QString NewBranch() const;
 
 protected:
-    QString ReadFile(const CString& path) override;
-    QString WriteFile(const CString& path) const override;
+    void Load(tqlHandle structure, LoadReport& report) override;
+    Result<void> Save(const std::string& path) const override;
 
 private:
     CCrossSections m_sections;

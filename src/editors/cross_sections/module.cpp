@@ -1,6 +1,7 @@
 #include "editors/cross_sections/module.h"
 
 #include "editors/cross_sections/view.h"
+#include "files/extensions.h"
 #include "grid/grid_texts.h"
 
 #include <QCoreApplication>
@@ -18,7 +19,7 @@ CString DocumentStrings()
                               CrossSectionTexts::tr("Sections"),
                               CrossSectionTexts::tr("KVR Cross Sections"),
                               CrossSectionTexts::tr("KVR Cross Sections (*.kvxs)"),
-                              ".kvxs",
+                              QLatin1String(CrossSectionExtension),
                               "CrossSections.Document",
                               "CrossSections Document"};
     return strings.join(u'\n');

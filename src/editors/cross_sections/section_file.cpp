@@ -1,7 +1,8 @@
 #include "editors/cross_sections/section_file.h"
 
 #include "editors/cross_sections/section_rules.h"
-#include "ks/fc/parameter_file.h"
+#include "files/declared_section.h"
+#include "files/field_io.h"
 
 #include <QCoreApplication>
 #include <iterator>
@@ -12,13 +13,16 @@ namespace {
 using U = UnitGroup;
 
 // The names of the file.
-constexpr const char *SectionName = "CrossSection", *ProfileName = "Profile", *PointKeyword = "Point";
+constexpr const char *SectionName = "CrossSection", *ProfileName = "Profile";
+constexpr const char *BranchKeyword = "Branch", *TopoIdKeyword = "TopoID", *WidthKeyword = "Width";
+constexpr const char* PointKeyword = "Point";
+constexpr const char* NoBranch = "BRANCH"; // of a section whose branch the file does not name
 
 using C = CCrossSection;
 using S = CCrossSections;
 constexpr auto sectionFields = FieldsOf<C>(
-    {Text<&C::branch>("Branch").Title(QT_TRANSLATE_NOOP("SectionTables", "Branch")),
-     Text<&C::topoId>("TopoID").Title(QT_TRANSLATE_NOOP("SectionTables", "Topo ID")),
+    {Text<&C::branch>(BranchKeyword).Title(QT_TRANSLATE_NOOP("SectionTables", "Branch")),
+     Text<&C::topoId>(TopoIdKeyword).Title(QT_TRANSLATE_NOOP("SectionTables", "Topo ID")),
      Number<&C::chainage>("Chainage", U::Chainage).Title(QT_TRANSLATE_NOOP("SectionTables", "Chainage")),
      Number<&C::radius>("Radius", U::Radius).MayBeUnknown().Title(QT_TRANSLATE_NOOP("SectionTables", "Radius")),
      Number<&C::width>("Width", U::Width).MayBeUnknown().Range(0).Title(QT_TRANSLATE_NOOP("SectionTables", "Width"))});
@@ -27,11 +31,11 @@ constexpr FieldList FieldOf(std::size_t index)
     return FieldList(sectionFields).subspan(index, 1);
 }
 constexpr auto points = FieldsOf<C>({Group<&C::points>("Point")});
-constexpr DeclaredKeyword sectionKeywords[] = {{"Branch", FieldOf(0), Presence::Optional}, // a rule asks for it
-                                               {"TopoID", FieldOf(1), Presence::Optional},
+constexpr DeclaredKeyword sectionKeywords[] = {{BranchKeyword, FieldOf(0), Presence::Optional}, // a rule asks for it
+                                               {TopoIdKeyword, FieldOf(1), Presence::Optional},
                                                {"Chainage", FieldOf(2)},
                                                {"Radius", FieldOf(3), Presence::Optional},
-                                               {"Width", FieldOf(4), Presence::Optional}};
+                                               {WidthKeyword, FieldOf(4), Presence::Optional}};
 constexpr DeclaredKeyword profileKeywords[] = {{PointKeyword, points}};
 constexpr DeclaredSection sectionSections[] = {
     {.name = ProfileName, .kept = Keeps<&C::keptProfile>(), .keywords = profileKeywords}};
@@ -49,12 +53,41 @@ constexpr DeclaredFile file{{.name = "KVR_CROSS_SECTIONS",
                              .sectionCount = std::size(targetSections)},
                             Keeps<&S::keptTargets>()};
 
-/// What is wrong stands in this line.
-tqlHandle FaultyNode(tqlHandle node, const CSectionFault& fault)
+/// What a section has to fulfil beside its declaration: it is made to, and that is reported.
+void Mend(CCrossSection& section, tqlHandle node, LoadReport& report)
 {
-    return fault.point < 0
-               ? CKsParameterFile::PlaceOf(node, fault.keyword)
-               : tqlKeywordByNameNum(tqlSectionByNameNum(node, ProfileName, 1), PointKeyword, fault.point + 1);
+    for (CSectionFault fault; (fault = FindFault(section)).field != CSectionFault::Nothing;) {
+        const auto rule = [field = fault.field] { return SectionRule(field).toStdString(); };
+        switch (fault.field) {
+        case CSectionFault::Point: {
+            CSectionPoint& point = section.points[std::size_t(fault.point)];
+            point.offset = section.points[std::size_t(fault.point) - 1].offset;
+            ReportRule(report, tqlSectionByNameNum(node, ProfileName, 1), PointKeyword, fault.point + 1,
+                       ParamsText(CSectionPoint::DeclaredFields(), &point), rule);
+            break;
+        }
+        case CSectionFault::Width:
+            section.width = KsUnset;
+            ReportRule(report, node, WidthKeyword, 1, ParamsText(FieldOf(4), &section), rule);
+            break;
+        default:
+            section.branch = NoBranch;
+            ReportRule(report, node, BranchKeyword, 1, ParamsText(FieldOf(0), &section), rule);
+        }
+    }
+}
+
+using Keys = std::set<decltype(CCrossSection().Key())>;
+
+/// A section at the place of another is told apart by its topo ID.
+void MendKey(CCrossSection& section, const Keys& taken, tqlHandle node, LoadReport& report)
+{
+    CCrossSection same = section;
+    same.points.clear();
+    for (int number = 2; taken.contains(section.Key()); ++number)
+        section.topoId = same.topoId + '-' + std::to_string(number);
+    ReportRule(report, node, TopoIdKeyword, 1, ParamsText(FieldOf(1), &section),
+               [same] { return WhyTaken(same).toStdString(); });
 }
 
 } // namespace
@@ -64,36 +97,33 @@ FieldList CCrossSection::DeclaredFields()
     return sectionFields;
 }
 
-FieldList CSectionPoint::DeclaredFields()
-{
-    using P = CSectionPoint;
-    static constexpr auto fields =
-        FieldsOf<P>({Number<&P::offset>("offset", U::Width).Title(QT_TRANSLATE_NOOP("SectionTables", "Offset")),
-                     Number<&P::level>("level", U::WaterLevel).Title(QT_TRANSLATE_NOOP("SectionTables", "Bed level"))});
-    return fields;
-}
+KVR_FIELDS(CSectionPoint, Number<&Self::offset>("offset", U::Width).Title(QT_TRANSLATE_NOOP("SectionTables", "Offset")),
+           Number<&Self::level>("level", U::WaterLevel).Title(QT_TRANSLATE_NOOP("SectionTables", "Bed level")))
 
-QString ReadCrossSections(const QString& path, CCrossSections& sections)
+CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
 {
     CCrossSections read;
-    CKsParameterFile source(path, file, &read);
-    std::set<decltype(CCrossSection().Key())> keys;
-    for (int i = 0; i < int(read.sections.size()) && source.Error().isEmpty(); ++i) {
-        const CCrossSection& section = read.sections[std::size_t(i)];
-        const tqlHandle node = tqlSectionByNameNum(source.Target(), SectionName, i + 1);
-        if (const CSectionFault fault = FindFault(section); !fault.text.isEmpty())
-            source.Fail(FaultyNode(node, fault), fault.text);
-        else if (!keys.insert(section.Key()).second)
-            source.Fail(node, WhyTaken(section));
+    ReadDeclared(structure, file, &read, report);
+    const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
+    const auto nodeOf = [&](const CCrossSection& each) {
+        return tqlSectionByNameNum(target, SectionName, int(&each - read.sections.data()) + 1);
+    };
+    Keys all, met;
+    for (CCrossSection& each : read.sections) {
+        Mend(each, nodeOf(each), report);
+        all.insert(each.Key());
     }
-    if (!source.Error().isEmpty())
-        return source.Error();
+    for (CCrossSection& each : read.sections) {
+        if (!met.insert(each.Key()).second) {
+            MendKey(each, all, nodeOf(each), report);
+            all.insert(each.Key());
+        }
+    }
     read.SortByPlace();
-    sections = std::move(read);
-    return {};
+    return read;
 }
 
-QString WriteCrossSections(const QString& path, const CCrossSections& sections)
+Result<void> SaveCrossSections(const CCrossSections& sections, const std::string& path)
 {
-    return KsWriteParameterFile(path, file, &sections);
+    return SaveDeclared(path, file, &sections);
 }

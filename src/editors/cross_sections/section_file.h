@@ -1,10 +1,11 @@
 // Cross-section files (.kvxs): see docs/cross_sections.md.
 #pragma once
 
+#include "base/result.h"
 #include "editors/cross_sections/section.h"
+#include "files/finding.h"
 
-/// Reads a file; the sections come sorted by place. The reason, for the user and with the line, when that failed and
-/// `sections` is untouched; otherwise empty.
-QString ReadCrossSections(const QString& path, CCrossSections& sections);
-/// Writes a file; the old content stays until the new one is complete. The reason when that failed, otherwise empty.
-QString WriteCrossSections(const QString& path, const CCrossSections& sections);
+/// The sections of a loaded file, sorted by place. What is not in order is reported, with what they have instead.
+CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report);
+/// Puts the sections into the place of a file (safe_file.h).
+Result<void> SaveCrossSections(const CCrossSections& sections, const std::string& path);

@@ -3,6 +3,8 @@
 #include "ks/units/edit_style.h"
 
 #include <QCoreApplication>
+#include <algorithm>
+#include <functional>
 
 namespace {
 
@@ -13,17 +15,32 @@ struct SectionRules
 
 } // namespace
 
+QString SectionRule(CSectionFault::Field field)
+{
+    switch (field) {
+    case CSectionFault::Branch:
+        return SectionRules::tr("a cross section needs the name of its branch.");
+    case CSectionFault::Width:
+        return SectionRules::tr("expected a width that is not negative.");
+    case CSectionFault::Point:
+        return SectionRules::tr("expected offsets that do not decrease from point to point.");
+    default:
+        return {};
+    }
+}
+
 CSectionFault FindFault(const CCrossSection& section)
 {
+    const auto fault = [](CSectionFault::Field field, int point = -1) {
+        return CSectionFault{field, point, SectionRule(field)};
+    };
     if (section.branch.empty())
-        return {SectionRules::tr("a cross section needs the name of its branch."), "Branch"};
+        return fault(CSectionFault::Branch);
     if (section.width < 0)
-        return {SectionRules::tr("expected a width that is not negative."), "Width"};
-    for (std::size_t i = 1; i < section.points.size(); ++i) {
-        if (section.points[i].offset < section.points[i - 1].offset)
-            return {SectionRules::tr("expected offsets that do not decrease from point to point."), {}, int(i)};
-    }
-    return {};
+        return fault(CSectionFault::Width);
+    const auto& points = section.points;
+    const auto falls = std::ranges::adjacent_find(points, std::greater(), &CSectionPoint::offset);
+    return falls == points.end() ? CSectionFault() : fault(CSectionFault::Point, int(falls - points.begin()) + 1);
 }
 
 QString WhyTaken(const CCrossSection& section)

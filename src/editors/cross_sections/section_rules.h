@@ -11,6 +11,8 @@ struct CSectionFault
     int point = -1;                // or this point
 };
 
+/// What is expected instead of such a fault.
+QString SectionRule(CSectionFault::Field field);
 CSectionFault FindFault(const CCrossSection& section);
 /// That there is such a section already.
 QString WhyTaken(const CCrossSection& section);

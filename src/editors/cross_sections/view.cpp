@@ -3,7 +3,6 @@
 #include <QHeaderView>
 #include <QLabel>
 #include <QSplitter>
-#include <QVBoxLayout>
 #include <algorithm>
 #include <utility>
 
@@ -22,9 +21,7 @@ void CCrossSectionView::OnInitialUpdate()
     splitter->setStretchFactor(1, 5);
     splitter->setCollapsible(0, false);
     splitter->setSizes({700, 500});
-    auto* layout = new QVBoxLayout(this);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(splitter);
+    SetContent(splitter);
     setFocusProxy(m_sections);
     connect(m_plot, &CSectionPlot::PointPicked, this, [this](int point) { m_points->GotoLine(point + 1); });
     connect(m_plot, &CSectionPlot::SectionStep, this, [this](int step) { GoToSection(CurrentSection() + step); });

@@ -19,15 +19,15 @@ const CLinearReference& CNetworkDoc::Reference() const
     return *m_reference;
 }
 
-QString CNetworkDoc::ReadFile(const CString& path)
+void CNetworkDoc::Load(tqlHandle structure, LoadReport& report)
 {
     m_reference.reset();
-    return ReadNetwork(path, m_network);
+    m_network = LoadNetwork(structure, report);
 }
 
-QString CNetworkDoc::WriteFile(const CString& path) const
+Result<void> CNetworkDoc::Save(const std::string& path) const
 {
-    return WriteNetwork(path, m_network);
+    return SaveNetwork(m_network, path);
 }
 
 void CNetworkDoc::DeleteContents()

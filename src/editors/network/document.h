@@ -30,8 +30,8 @@ signals:
     void NetworkChanged();
 
 protected:
-    QString ReadFile(const CString& path) override;
-    QString WriteFile(const CString& path) const override;
+    void Load(tqlHandle structure, LoadReport& report) override;
+    Result<void> Save(const std::string& path) const override;
 
 private:
     CNetwork m_network;

@@ -1,6 +1,7 @@
 #include "editors/network/location_source.h"
 
 #include "base/not_given.h"
+#include "files/extensions.h"
 #include "ks/fc/exports.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/hd_messages.h"
@@ -11,7 +12,7 @@ namespace {
 
 bool IsHDView(const CView* view)
 {
-    return view->GetDocument()->GetPathName().endsWith(QStringLiteral(".hdkv"), Qt::CaseInsensitive);
+    return view->GetDocument()->GetPathName().endsWith(QLatin1String(HDExtension), Qt::CaseInsensitive);
 }
 
 /// A line that the user has not completed is no location.

@@ -2,6 +2,7 @@
 
 #include "editors/network/import_branches.h"
 #include "editors/network/view.h"
+#include "files/extensions.h"
 #include "grid/grid_texts.h"
 
 #include <QCoreApplication>
@@ -19,7 +20,7 @@ CString DocumentStrings()
                               NetworkTexts::tr("Network"),
                               NetworkTexts::tr("KVR River Network"),
                               NetworkTexts::tr("KVR River Network (*.kvnw)"),
-                              ".kvnw",
+                              QLatin1String(NetworkExtension),
                               "Network.Document",
                               "Network Document"};
     return strings.join(u'\n');

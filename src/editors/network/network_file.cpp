@@ -1,8 +1,11 @@
 #include "editors/network/network_file.h"
 
-#include "ks/fc/parameter_file.h"
+#include "files/declared_section.h"
+#include "files/field_io.h"
+#include "ks/fc/branch_name.h"
 
 #include <QCoreApplication>
+#include <algorithm>
 #include <iterator>
 
 namespace {
@@ -49,6 +52,8 @@ constexpr auto branchFields =
                  Number<&N::start>("first vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "From")),
                  Number<&N::end>("last vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "To")),
                  Boolean<&N::downstream>("FlowsDownstream").Title(QT_TRANSLATE_NOOP("NetworkTables", "Flow"))});
+constexpr FieldList nameField = FieldList(branchFields).subspan(0, 1),
+                    endFields = FieldList(branchFields).subspan(1, 2);
 constexpr auto vertices = FieldsOf<N>({GroupOf<&VertexFields, &N::line>("Vertex")});
 constexpr auto rows = FieldsOf<N>({Group<&N::channel>("DATA")});
 constexpr DeclaredKeyword lineKeywords[] = {{"Vertex", vertices}}, channelKeywords[] = {{"DATA", rows}};
@@ -56,8 +61,8 @@ constexpr DeclaredSection branchSections[] = {
     {.name = "Line", .kept = Keeps<&N::keptLine>(), .keywords = lineKeywords},
     {.name = "Channel", .kept = Keeps<&N::keptChannel>(), .keywords = channelKeywords}};
 constexpr DeclaredKeyword branchKeywords[] = {
-    {NameKeyword, FieldList(branchFields).subspan(0, 1)},
-    {ChainageKeyword, FieldList(branchFields).subspan(1, 2)},
+    {NameKeyword, nameField, Presence::Optional}, // a rule asks for it
+    {ChainageKeyword, endFields},
     {"FlowsDownstream", FieldList(branchFields).subspan(3), Presence::Optional}};
 
 constexpr auto coordinates = FieldsOf<FileNetwork>({Text<&FileNetwork::system>("CoordinateSystem")});
@@ -76,19 +81,35 @@ constexpr DeclaredFile file{{.name = "KVR_NETWORK",
                              .sectionCount = std::size(networkSections)},
                             Keeps<&FileNetwork::network, &CNetwork::keptTargets>()};
 
-/// What a branch of the file has to fulfil beside its declaration.
-void Check(CKsParameterFile& source, const CNetwork& network, int index)
+/// Whether one of the first branches has a name.
+bool HasName(const CNetwork& network, std::size_t count, const std::string& wanted)
 {
-    const CNetworkBranch& branch = network.branches[std::size_t(index)];
-    const tqlHandle section = tqlSectionByNameNum(source.Target(), BranchSection, index + 1);
-    const tqlHandle named = CKsParameterFile::PlaceOf(section, NameKeyword);
-    if (branch.name.empty())
-        source.Fail(named, NetworkFile::tr("expected the branch's name, Name = \"...\"."));
-    else if (branch.start == branch.end)
-        source.Fail(CKsParameterFile::PlaceOf(section, ChainageKeyword),
-                    NetworkFile::tr("the chainages of the two ends have to differ."));
-    else if (network.FindBranch(branch.Name()) < index)
-        source.Fail(named, NetworkFile::tr("there is a branch \"%1\" already.").arg(branch.Name()));
+    return std::any_of(network.branches.begin(), network.branches.begin() + std::ptrdiff_t(count),
+                       [&](const CNetworkBranch& each) { return KsSameBranch(each.name, wanted); });
+}
+
+/// What a branch has to fulfil beside its declaration: it is made to, and that is reported.
+void Mend(CNetwork& network, std::size_t index, tqlHandle section, LoadReport& report)
+{
+    CNetworkBranch& branch = network.branches[index];
+    if (const std::string given = branch.name; given.empty() || HasName(network, index, given)) {
+        const std::string wanted = given.empty() ? "BRANCH" : given;
+        std::string free = wanted;
+        for (int number = 2; HasName(network, network.branches.size(), free); ++number)
+            free = wanted + '-' + std::to_string(number);
+        branch.name = free;
+        ReportRule(report, section, NameKeyword, 1, ParamsText(nameField, &branch), [given] {
+            const QString taken = NetworkFile::tr("there is a branch \"%1\" already.");
+            return (given.empty() ? NetworkFile::tr("expected the branch's name, Name = \"...\".")
+                                  : taken.arg(QString::fromStdString(given)))
+                .toStdString();
+        });
+    }
+    if (branch.start == branch.end) {
+        branch.end += std::max(branch.Length(), 1.0);
+        ReportRule(report, section, ChainageKeyword, 1, ParamsText(endFields, &branch),
+                   [] { return NetworkFile::tr("the chainages of the two ends have to differ.").toStdString(); });
+    }
 }
 
 } // namespace
@@ -98,34 +119,27 @@ FieldList CNetworkBranch::DeclaredFields()
     return branchFields;
 }
 
-FieldList CChannelRow::DeclaredFields()
-{
-    using R = CChannelRow;
-    static constexpr auto fields = FieldsOf<R>(
-        {Number<&R::chainage>("chainage", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "Chainage")),
-         Number<&R::radius>("radius", U::Radius).MayBeUnknown().Title(QT_TRANSLATE_NOOP("NetworkTables", "Radius")),
-         Number<&R::width>("width", U::Width).MayBeUnknown().Title(QT_TRANSLATE_NOOP("NetworkTables", "Width"))});
-    return fields;
-}
+KVR_FIELDS(
+    CChannelRow, Number<&Self::chainage>("chainage", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "Chainage")),
+    Number<&Self::radius>("radius", U::Radius).MayBeUnknown().Title(QT_TRANSLATE_NOOP("NetworkTables", "Radius")),
+    Number<&Self::width>("width", U::Width).MayBeUnknown().Title(QT_TRANSLATE_NOOP("NetworkTables", "Width")))
 
-QString ReadNetwork(const QString& path, CNetwork& network)
+CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
 {
     FileNetwork read;
-    CKsParameterFile source(path, file, &read);
-    CNetwork& taken = read.network;
-    for (std::size_t i = 0; i < taken.branches.size() && source.Error().isEmpty(); ++i) {
-        Check(source, taken, int(i));
-        taken.branches[i].SortChannel();
+    ReadDeclared(structure, file, &read, report);
+    const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
+    CNetwork& network = read.network;
+    network.system = QString::fromStdString(read.system);
+    for (std::size_t i = 0; i < network.branches.size(); ++i) {
+        network.branches[i].SortChannel();
+        Mend(network, i, tqlSectionByNameNum(target, BranchSection, int(i) + 1), report);
     }
-    if (!source.Error().isEmpty())
-        return source.Error();
-    taken.system = QString::fromStdString(read.system);
-    network = std::move(taken);
-    return {};
+    return std::move(network);
 }
 
-QString WriteNetwork(const QString& path, const CNetwork& network)
+Result<void> SaveNetwork(const CNetwork& network, const std::string& path)
 {
     const FileNetwork written{network.system.toStdString(), network};
-    return KsWriteParameterFile(path, file, &written);
+    return SaveDeclared(path, file, &written);
 }

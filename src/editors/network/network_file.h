@@ -1,10 +1,11 @@
 // River network files (.kvnw): see docs/network.md.
 #pragma once
 
+#include "base/result.h"
 #include "editors/network/network.h"
+#include "files/finding.h"
 
-/// Reads a file. The reason, for the user and with the line, when that failed and `network` is untouched; otherwise
-/// empty.
-QString ReadNetwork(const QString& path, CNetwork& network);
-/// Writes a file; the old content stays until the new one is complete. The reason when that failed, otherwise empty.
-QString WriteNetwork(const QString& path, const CNetwork& network);
+/// The network of a loaded file. What is not in order is reported, with what the network has instead.
+CNetwork LoadNetwork(tqlHandle structure, LoadReport& report);
+/// Puts the network into the place of a file (safe_file.h).
+Result<void> SaveNetwork(const CNetwork& network, const std::string& path);

@@ -2,7 +2,6 @@
 
 #include <QLabel>
 #include <QSplitter>
-#include <QVBoxLayout>
 #include <algorithm>
 #include <utility>
 
@@ -29,9 +28,7 @@ void CNetworkView::OnInitialUpdate()
     splitter->setStretchFactor(1, 1);
     splitter->setCollapsible(0, false);
     splitter->setSizes({860, 420}); // in proportion
-    auto* layout = new QVBoxLayout(this);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(splitter);
+    SetContent(splitter);
     setFocusProxy(m_map);
 
     connect(&m_map->Marks(), &CMapSelection::PickedChanged, this, &CNetworkView::PickedChanged);

@@ -11,6 +11,27 @@ CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind)
     connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
 }
 
+void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load)
+{
+    m_file.Read(path, SavePathFor(path), load);
+    m_isReadOnly = m_file.IsUnreadable();
+    emit FileStateChanged();
+}
+
+void CKsProjectDoc::FileWritten()
+{
+    UndoStack().setClean();
+    SetPathName(m_file.Path());
+    SetModifiedFlag(false);
+    EditUnreadable();
+}
+
+void CKsProjectDoc::EditUnreadable()
+{
+    m_isReadOnly = false;
+    emit FileStateChanged();
+}
+
 LRESULT CKsProjectDoc::Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const
 {
     CKSComm_Package package;

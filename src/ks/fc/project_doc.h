@@ -1,7 +1,9 @@
 // The document of an editor that takes part in projects: joins and leaves them, tells the others of changes, asks them.
+// It knows the file that it was read from, and what of that was not taken as it stands.
 #pragma once
 
 #include "ks/fc/doc.h"
+#include "ks/fc/document_file.h"
 #include "ks/fc/package.h"
 
 #include <QStringList>
@@ -12,6 +14,12 @@ class KS_API CKsProjectDoc : public CKsDoc
 public:
     /// `kind`: what the editor's packages call themselves.
     explicit CKsProjectDoc(int kind);
+
+    /// The file last opened or saved.
+    const CKsDocumentFile& File() const { return m_file; }
+    /// It could not be parsed, and nobody has asked to edit what is shown instead.
+    bool IsReadOnly() const { return m_isReadOnly; }
+    void EditUnreadable();
 
     /// Joins the project that the document's file is a member of; false when there is none.
     bool JoinProject(CView* view);
@@ -39,11 +47,24 @@ public:
     /// The names of the branches that the project's other editors know, as they spell them; none is empty.
     QStringList BranchNames(CView* view) const;
 
+signals:
+    /// What is known of File(), or IsReadOnly(), is another.
+    void FileStateChanged();
+
+protected:
+    /// `load` takes what a file holds, see CKsDocumentFile::Read.
+    void ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load);
+    /// The file has been written: it is what the document holds, and its name the document's.
+    void FileWritten();
+
+    CKsDocumentFile m_file;
+
 private:
     void StepMade();
     LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const;
 
     int m_kind;
+    bool m_isReadOnly = false;
     std::intptr_t m_project = 0;
     int m_untold = 0; // steps that the project has not heard of
 };

@@ -1,9 +1,11 @@
 #include "ks/fc/project_view.h"
 
+#include "ks/fc/file_bar.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 
 #include <QTimer>
+#include <QVBoxLayout>
 #include <utility>
 
 CKsProjectView::~CKsProjectView()
@@ -23,6 +25,15 @@ void CKsProjectView::OnInitialUpdate()
     for (auto switched : {&KsUnits::Changed, &KsUnits::DigitsChanged})
         connect(&KsUnits::Instance(), switched, this, [this] { OnUpdate(nullptr, CKsDoc::ReloadHint, nullptr); });
     connect(&KsLanguage::Instance(), &KsLanguage::Changed, this, &CKsProjectView::ShowStatus);
+}
+
+void CKsProjectView::SetContent(QWidget* content)
+{
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(0);
+    layout->addWidget(new CKsFileBar(*ProjectDoc(), this));
+    layout->addWidget(content, 1);
 }
 
 void CKsProjectView::OnUpdate(CView*, int, CHint*)

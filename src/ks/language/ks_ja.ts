@@ -65,46 +65,171 @@
     </message>
 </context>
 <context>
-    <name>ParameterFile</name>
+    <name>CKsDocumentFile</name>
     <message>
-        <source>%1, line %2: %3</source>
-        <translation>%1、%2行目: %3</translation>
+        <source>Could not read &quot;%1&quot;: %2.</source>
+        <translation>「%1」を読み込めませんでした: %2。</translation>
+    </message>
+    <message>
+        <source>Could not write &quot;%1&quot;: %2.</source>
+        <translation>「%1」に書き込めませんでした: %2。</translation>
+    </message>
+    <message>
+        <source>The new content is complete in &quot;%1&quot;.</source>
+        <translation>新しい内容は「%1」にすべて残っています。</translation>
     </message>
     <message>
         <source>%1 is no file of this kind: it has no section [%2].</source>
         <translation>%1はこの種類のファイルではありません: セクション[%2]がありません。</translation>
     </message>
     <message>
-        <source>expected a section [%1].</source>
-        <translation>セクション[%1]が必要です。</translation>
+        <source>%1 could not be read when it was opened; what is shown is not its content.
+Saving replaces it. As it is now it stays in a copy beside it, %2.
+Save?</source>
+        <translation>%1 は開いたときに読み込めませんでした。表示されているのはその内容ではありません。
+保存すると置き換えられます。今のファイルは同じフォルダの %2 に残ります。
+保存しますか?</translation>
     </message>
     <message>
-        <source>expected only one %1 in [%2].</source>
-        <translation>[%2]の中の%1は1つだけにしてください。</translation>
+        <source>%1 holds values that were not taken as they stand (places: %2).
+Saving writes what is shown instead. As it is now the file stays in a copy beside it, %3.
+Save?</source>
+        <translation>%1 には、そのまま取り込めなかった値があります (%2 か所)。
+保存すると、表示されている値で書き込まれます。今のファイルは同じフォルダの %3 に残ります。
+保存しますか?</translation>
     </message>
     <message>
-        <source>expected a text, %1 = &quot;...&quot;.</source>
-        <translation>文字列(%1 = &quot;...&quot;)が必要です。</translation>
+        <source>The changes are saved in %1, which could not be renamed to %2: %3.</source>
+        <translation>変更は %1 に保存しましたが、名前を %2 に変更できませんでした: %3。</translation>
     </message>
     <message>
-        <source>expected a file name after &quot;%1 =&quot;.</source>
-        <translation>「%1 =」の後にファイル名が必要です。</translation>
+        <source>%1 is now %2</source>
+        <translation>%1 は %2 になりました</translation>
+    </message>
+</context>
+<context>
+    <name>CKsFileBar</name>
+    <message>
+        <source>%1 could not be read. What is shown here are default values, not its content.
+%2</source>
+        <translation>%1 を読み込めませんでした。表示されているのは既定値で、ファイルの内容ではありません。
+%2</translation>
     </message>
     <message>
-        <source>expected true or false after &quot;%1 =&quot;.</source>
-        <translation>「%1 =」の後にtrueまたはfalseが必要です。</translation>
+        <source>Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.</source>
+        <translation>%1 の値のうち、そのまま取り込めなかったもの: %2 か所。保存すると、今のファイルのコピーが残ります。</translation>
     </message>
     <message>
-        <source>expected a number after &quot;%1 =&quot;.</source>
-        <translation>「%1 =」の後に数値が必要です。</translation>
+        <source>The file as it was before this save is kept in %1.</source>
+        <translation>保存前のファイルは %1 に残っています。</translation>
     </message>
     <message>
-        <source>expected %1 numbers after &quot;%2 =&quot;.</source>
-        <translation>「%2 =」の後に%1個の数値が必要です。</translation>
+        <source>Show List...</source>
+        <translation>一覧を表示...</translation>
     </message>
     <message>
-        <source>The new content is complete in &quot;%1&quot;.</source>
-        <translation>新しい内容は「%1」にすべて残っています。</translation>
+        <source>Edit Default Values</source>
+        <translation>既定値を編集</translation>
+    </message>
+    <message>
+        <source>Close this bar</source>
+        <translation>このバーを閉じる</translation>
+    </message>
+</context>
+<context>
+    <name>CKsFindingsDialog</name>
+    <message>
+        <source>%1: Values Not Taken as They Stand</source>
+        <translation>%1: そのまま取り込めなかった値</translation>
+    </message>
+    <message>
+        <source>These places of %1 are not written as they should be. Each row says what stands there, what was expected, and what is used instead. Nothing is changed in the file unless you save; a save keeps the file as it is in a copy.</source>
+        <translation>%1 のこれらの箇所は、正しく書かれていません。各行に、ファイルの内容、期待される内容、代わりに使われる値を示します。保存しない限りファイルは変わりません。保存すると、今のファイルのコピーが残ります。</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>コピー(&amp;C)</translation>
+    </message>
+    <message>
+        <source>C&amp;lose</source>
+        <translation>閉じる(&amp;L)</translation>
+    </message>
+</context>
+<context>
+    <name>CKsFindingsModel</name>
+    <message>
+        <source>a number</source>
+        <translation>数値</translation>
+    </message>
+    <message>
+        <source>an integer</source>
+        <translation>整数</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true または false</translation>
+    </message>
+    <message>
+        <source>a text in quotes</source>
+        <translation>引用符で囲んだ文字列</translation>
+    </message>
+    <message>
+        <source>a file name in &lt; &gt;</source>
+        <translation>&lt; &gt; で囲んだファイル名</translation>
+    </message>
+    <message>
+        <source>six integers</source>
+        <translation>6 個の整数</translation>
+    </message>
+    <message>
+        <source>a count that fits the %1 parameters behind it</source>
+        <translation>後に続く %1 個のパラメータに合う個数</translation>
+    </message>
+    <message>
+        <source>a flag for each of %1 titles</source>
+        <translation>%1 個のタイトルごとに 1 個のフラグ</translation>
+    </message>
+    <message>
+        <source>a target [%1]</source>
+        <translation>ターゲット [%1]</translation>
+    </message>
+    <message>
+        <source>more parameters, or a smaller count</source>
+        <translation>より多くのパラメータ、またはより小さい個数</translation>
+    </message>
+    <message>
+        <source>only one of this name; the first counts</source>
+        <translation>この名前は 1 つだけ (最初のものが有効)</translation>
+    </message>
+    <message>
+        <source>a keyword %1</source>
+        <translation>キーワード %1</translation>
+    </message>
+    <message>
+        <source>a section [%1]</source>
+        <translation>セクション [%1]</translation>
+    </message>
+    <message>
+        <source>no more parameters</source>
+        <translation>これ以上のパラメータがないこと</translation>
+    </message>
+    <message>
+        <source>Line
+Column
+Section
+Keyword
+Parameter
+In the file
+Expected
+Used instead</source>
+        <translation>行
+列
+セクション
+キーワード
+パラメータ
+ファイルの内容
+期待される内容
+代わりに使う値</translation>
     </message>
 </context>
 <context>

@@ -1220,102 +1220,6 @@ The simulation will look for it. Use this name?</source>
 計算時にこのファイルが読み込まれます。この名前を使いますか?</translation>
     </message>
     <message>
-        <source>Could not write &quot;%1&quot;: %2.</source>
-        <translation>「%1」に書き込めませんでした: %2。</translation>
-    </message>
-    <message>
-        <source>Could not read &quot;%1&quot;: %2.</source>
-        <translation>「%1」を読み込めませんでした: %2。</translation>
-    </message>
-    <message>
-        <source>The new content is complete in &quot;%1&quot;.</source>
-        <translation>新しい内容は「%1」にすべて残っています。</translation>
-    </message>
-    <message>
-        <source>%1 is now %2</source>
-        <translation>%1 は %2 になりました</translation>
-    </message>
-    <message>
-        <source>The changes are saved in %1, which could not be renamed to %2: %3.</source>
-        <translation>変更は %1 に保存しましたが、名前を %2 に変更できませんでした: %3。</translation>
-    </message>
-    <message>
-        <source>%1 could not be read when it was opened; what is shown is not its content.
-Saving replaces it. As it is now it stays in a copy beside it, %2.
-Save?</source>
-        <translation>%1 は開いたときに読み込めませんでした。表示されているのはその内容ではありません。
-保存すると置き換えられます。今のファイルは同じフォルダの %2 に残ります。
-保存しますか?</translation>
-    </message>
-    <message>
-        <source>%1 holds values that were not taken as they stand (places: %2).
-Saving writes what is shown instead. As it is now the file stays in a copy beside it, %3.
-Save?</source>
-        <translation>%1 には、そのまま取り込めなかった値があります (%2 か所)。
-保存すると、表示されている値で書き込まれます。今のファイルは同じフォルダの %3 に残ります。
-保存しますか?</translation>
-    </message>
-    <message>
-        <source>%1 could not be read. What is shown here are default values, not its content.
-%2</source>
-        <translation>%1 を読み込めませんでした。表示されているのは既定値で、ファイルの内容ではありません。
-%2</translation>
-    </message>
-    <message>
-        <source>Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.</source>
-        <translation>%1 の値のうち、そのまま取り込めなかったもの: %2 か所。保存すると、今のファイルのコピーが残ります。</translation>
-    </message>
-    <message>
-        <source>The file as it was before this save is kept in %1.</source>
-        <translation>保存前のファイルは %1 に残っています。</translation>
-    </message>
-    <message>
-        <source>Show List...</source>
-        <translation>一覧を表示...</translation>
-    </message>
-    <message>
-        <source>Edit Default Values</source>
-        <translation>既定値を編集</translation>
-    </message>
-    <message>
-        <source>Close this bar</source>
-        <translation>このバーを閉じる</translation>
-    </message>
-    <message>
-        <source>%1: Values Not Taken as They Stand</source>
-        <translation>%1: そのまま取り込めなかった値</translation>
-    </message>
-    <message>
-        <source>These places of %1 are not written as they should be. Each row says what stands there, what was expected, and what is used instead. Nothing is changed in the file unless you save; a save keeps the file as it is in a copy.</source>
-        <translation>%1 のこれらの箇所は、正しく書かれていません。各行に、ファイルの内容、期待される内容、代わりに使われる値を示します。保存しない限りファイルは変わりません。保存すると、今のファイルのコピーが残ります。</translation>
-    </message>
-    <message>
-        <source>Line
-Column
-Section
-Keyword
-Parameter
-In the file
-Expected
-Used instead</source>
-        <translation>行
-列
-セクション
-キーワード
-パラメータ
-ファイルの内容
-期待される内容
-代わりに使う値</translation>
-    </message>
-    <message>
-        <source>&amp;Copy</source>
-        <translation>コピー(&amp;C)</translation>
-    </message>
-    <message>
-        <source>C&amp;lose</source>
-        <translation>閉じる(&amp;L)</translation>
-    </message>
-    <message>
         <source>Resistance = a·(V·R)^b, between minimum and maximum. V is the velocity in m/s, R the hydraulic radius in m.</source>
         <translation>抵抗値 = a·(V·R)^b(最小値と最大値の間)。Vは流速(m/s)、Rは径深(m)です。</translation>
     </message>
@@ -1404,30 +1308,6 @@ Between the two no value can be converted without a hydraulic radius, so all %3 
     <message>
         <source>%1 encroachment set-ups without a filled second line were not written</source>
         <translation>2行目が入力されていない河積阻害の設定%1件は書き込まれませんでした</translation>
-    </message>
-    <message>
-        <source>a number
-an integer
-true or false
-a text in quotes
-a file name in &lt; &gt;
-six integers
-a count that fits the %1 parameters behind it
-a flag for each of %1 titles
-a target [%1]
-more parameters, or a smaller count
-only one of this name; the first counts</source>
-        <translation>数値
-整数
-true または false
-引用符で囲んだ文字列
-&lt; &gt; で囲んだファイル名
-6 個の整数
-後に続く %1 個のパラメータに合う個数
-%1 個のタイトルごとに 1 個のフラグ
-ターゲット [%1]
-より多くのパラメータ、またはより小さい個数
-この名前は 1 つだけ (最初のものが有効)</translation>
     </message>
     <message>
         <source>&amp;Resistance:</source>

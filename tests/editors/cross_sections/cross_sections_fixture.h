@@ -2,6 +2,7 @@
 #pragma once
 
 #include "editors/cross_sections/module.h"
+#include "editors/cross_sections/section_file.h"
 #include "editors/cross_sections/view.h"
 #include "editors/editor_fixture.h"
 
@@ -95,6 +96,14 @@ protected:
         return request == KsRequest::JoinProject ? project : 0;
     }
 
+    static QString ReadCrossSections(const QString& path, CCrossSections& sections)
+    {
+        return ReadBy(path, [&](tqlHandle file, LoadReport& report) { sections = LoadCrossSections(file, report); });
+    }
+    static QString WriteCrossSections(const QString& path, const CCrossSections& sections)
+    {
+        return QString::fromStdString(SaveCrossSections(sections, path.toStdString()).error().message);
+    }
     /// Opens sections in a window.
     CCrossSectionView* Open(const QByteArray& text = SmallSections)
     {

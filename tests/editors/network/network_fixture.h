@@ -3,6 +3,7 @@
 
 #include "editors/editor_fixture.h"
 #include "editors/network/module.h"
+#include "editors/network/network_file.h"
 #include "editors/network/view.h"
 #include "ks/fc/exports.h"
 #include "ks/fc/file_dialog.h"
@@ -110,6 +111,14 @@ protected:
         return request == KsRequest::JoinProject ? project : 0;
     }
 
+    static QString ReadNetwork(const QString& path, CNetwork& network)
+    {
+        return ReadBy(path, [&](tqlHandle file, LoadReport& report) { network = LoadNetwork(file, report); });
+    }
+    static QString WriteNetwork(const QString& path, const CNetwork& network)
+    {
+        return QString::fromStdString(SaveNetwork(network, path.toStdString()).error().message);
+    }
     /// Opens the small network in a window.
     CNetworkView* Open(const QByteArray& text = SmallNetwork)
     {

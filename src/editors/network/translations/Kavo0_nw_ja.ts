@@ -267,15 +267,6 @@
     </message>
 </context>
 <context>
-    <name>CParameterDoc</name>
-    <message>
-        <source>%1 could not be saved.
-%2</source>
-        <translation>%1を保存できませんでした。
-%2</translation>
-    </message>
-</context>
-<context>
     <name>GisGeometry</name>
     <message>
         <source>Point</source>

@@ -1,9 +1,9 @@
-#include "module/file_bar.h"
+#include "ks/fc/file_bar.h"
 
 #include "ks/fc/after_paint.h"
 #include "ks/fc/file_name.h"
-#include "module/findings_dialog.h"
-#include "res/strings.h"
+#include "ks/fc/findings_dialog.h"
+#include "ks/fc/project_doc.h"
 
 #include <QEvent>
 #include <QHBoxLayout>
@@ -20,7 +20,7 @@ CString NameOf(const CString& path)
 
 } // namespace
 
-CFileBar::CFileBar(CKavo0_hdDoc& document, QWidget* parent)
+CKsFileBar::CKsFileBar(CKsProjectDoc& document, QWidget* parent)
     : QFrame(parent),
       m_document(document),
       m_text(new QLabel(this)),
@@ -46,36 +46,39 @@ CFileBar::CFileBar(CKavo0_hdDoc& document, QWidget* parent)
     for (QWidget* button :
          {static_cast<QWidget*>(m_list), static_cast<QWidget*>(m_edit), static_cast<QWidget*>(m_close)})
         layout->addWidget(button);
-    connect(m_list, &QPushButton::clicked, this, &CFileBar::ShowList);
+    connect(m_list, &QPushButton::clicked, this, &CKsFileBar::ShowList);
     connect(m_edit, &QPushButton::clicked, this, [this] { m_document.EditUnreadable(); });
     connect(m_close, &QToolButton::clicked, this, &QWidget::hide);
-    connect(&document, &CKavo0_hdDoc::FileStateChanged, this, &CFileBar::Refresh);
+    connect(&document, &CKsProjectDoc::FileStateChanged, this, &CKsFileBar::Refresh);
     Refresh();
     if (!document.File().Findings().empty())
         KsAfterPaint(parent, this, [this] { ShowList(); });
 }
 
-CString CFileBar::Text() const
+CString CKsFileBar::Text() const
 {
-    const CDocumentFile& file = m_document.File();
+    const CKsDocumentFile& file = m_document.File();
     if (file.IsUnreadable())
-        return LoadString(Str::UnreadableBar).arg(NameOf(file.Path()), file.Error());
+        return tr("%1 could not be read. What is shown here are default values, not its content.\n%2")
+            .arg(NameOf(file.Path()), file.Error());
     if (!file.Findings().empty())
-        return LoadString(Str::NotTakenBar).arg(NameOf(file.Path())).arg(file.Findings().size());
+        return tr("Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.")
+            .arg(NameOf(file.Path()))
+            .arg(file.Findings().size());
     if (!file.KeptCopy().isEmpty())
-        return LoadString(Str::CopyKeptBar).arg(NameOf(file.KeptCopy()));
+        return tr("The file as it was before this save is kept in %1.").arg(NameOf(file.KeptCopy()));
     return {};
 }
 
-void CFileBar::Refresh()
+void CKsFileBar::Refresh()
 {
     const CString text = Text();
     m_text->setText(text);
     m_text->setAccessibleName(text);
-    m_list->setText(LoadString(Str::ShowFindings));
-    m_edit->setText(LoadString(Str::EditDefaults));
-    m_close->setToolTip(LoadString(Str::CloseBar));
-    m_close->setAccessibleName(LoadString(Str::CloseBar));
+    m_list->setText(tr("Show List..."));
+    m_edit->setText(tr("Edit Default Values"));
+    m_close->setToolTip(tr("Close this bar"));
+    m_close->setAccessibleName(tr("Close this bar"));
     m_list->setVisible(!m_document.File().Findings().empty());
     m_edit->setVisible(m_document.IsReadOnly());
     m_close->setVisible(!m_document.File().IsUnreadable());
@@ -84,19 +87,17 @@ void CFileBar::Refresh()
         m_dialog->close();
 }
 
-void CFileBar::ShowList()
+void CKsFileBar::ShowList()
 {
     if (m_document.File().Findings().empty())
         return;
-    if (!m_dialog) {
-        m_dialog = new CFindingsDialog(m_document.File(), this);
-        m_dialog->setAttribute(Qt::WA_DeleteOnClose);
-    }
+    if (!m_dialog)
+        m_dialog = new CKsFindingsDialog(m_document.File().Path(), m_document.File().Findings(), this);
     m_dialog->show();
     m_dialog->raise();
 }
 
-void CFileBar::changeEvent(QEvent* event)
+void CKsFileBar::changeEvent(QEvent* event)
 {
     QFrame::changeEvent(event);
     if (event->type() == QEvent::LanguageChange && !isHidden())

@@ -1,11 +1,10 @@
-#include "document/document_file.h"
+#include "ks/fc/document_file.h"
 
-#include "data/hd_file.h"
+#include "files/structure.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/syntax_error.h"
 #include "ks/fc/system_reason.h"
-#include "res/strings.h"
 
 #include <QDir>
 #include <QFileInfo>
@@ -25,54 +24,54 @@ void Tell(const Error& error)
         return;
     }
     const auto native = [](const std::string& path) { return QDir::toNativeSeparators(QString::fromStdString(path)); };
-    QString text = LoadString(error.reading ? Str::CouldNotRead : Str::CouldNotWrite)
-                       .arg(native(error.path), KsSystemReason(error.code));
+    const QString what = error.reading ? CKsDocumentFile::tr("Could not read \"%1\": %2.")
+                                       : CKsDocumentFile::tr("Could not write \"%1\": %2.");
+    QString text = what.arg(native(error.path), KsSystemReason(error.code));
     if (!error.kept.empty())
-        text += u'\n' + LoadString(Str::ContentIsLeftIn).arg(native(error.kept));
+        text += u'\n' + CKsDocumentFile::tr("The new content is complete in \"%1\".").arg(native(error.kept));
     KsMessageBox(text);
 }
 
 } // namespace
 
-CString CDocumentFile::SavePathFor(const CString& path)
-{
-    const QFileInfo info(path);
-    return info.dir().filePath(info.completeBaseName() + QStringLiteral(".HDKV"));
-}
-
-bool CDocumentFile::IsUnreadable() const
-{
-    return m_error.code != TqlError::None;
-}
-
-CString CDocumentFile::Error() const
+CString CKsDocumentFile::Error() const
 {
     return KsSyntaxErrorText(m_error);
 }
 
-void CDocumentFile::Read(const CString& path, HD_Parameters& parameters)
+CString CKsDocumentFile::WhyNothing() const
+{
+    if (m_findings.empty() || m_findings.front().kind != Finding::NoTarget)
+        return Error();
+    return tr("%1 is no file of this kind: it has no section [%2].")
+        .arg(NameOf(m_path), QString::fromStdString(m_findings.front().section));
+}
+
+void CKsDocumentFile::Read(const CString& path, const CString& savedAs,
+                           const std::function<void(tqlHandle, LoadReport&)>& load)
 {
     *this = {};
     m_path = path;
+    m_savedAs = savedAs;
     const Result<TqlStructure> structure = ParseFile(path.toStdString(), &m_error);
     if (!structure)
         return;
     LoadReport report(structure.value().Get());
-    parameters.Load(structure.value().Get(), &report);
+    load(structure.value().Get(), report);
     m_findings = report.Take();
 }
 
 /// Whether the file stands, under its present spelling, where a save to `target` writes.
-bool CDocumentFile::IsReplacedBy(const CString& target) const
+bool CKsDocumentFile::IsReplacedBy(const CString& target) const
 {
     // One file may be reached by several paths, and be saved by another than it was opened by.
     return !m_path.isEmpty() && QFileInfo::exists(m_path) &&
-           (SavePathFor(m_path) == target || SameFile(m_path.toStdString(), target.toStdString()));
+           (m_savedAs == target || SameFile(m_path.toStdString(), target.toStdString()));
 }
 
 /// What a save to `target` writes over: the file that was read, or one of that name in whatever case it is spelt. Of
 /// two files that differ in their case only, `target` itself.
-CString CDocumentFile::EntryFor(const CString& target) const
+CString CKsDocumentFile::EntryFor(const CString& target) const
 {
     if (IsReplacedBy(target))
         return m_path;
@@ -81,24 +80,31 @@ CString CDocumentFile::EntryFor(const CString& target) const
 }
 
 /// What a copy of the file is called; null when nothing has to be kept.
-const char* CDocumentFile::CopySuffix() const
+const char* CKsDocumentFile::CopySuffix() const
 {
     return IsUnreadable() ? "unreadable" : !m_findings.empty() ? "original" : nullptr;
 }
 
-bool CDocumentFile::MayReplace(const CString& target) const
+bool CKsDocumentFile::MayReplace(const CString& target) const
 {
     const char* const suffix = CopySuffix();
     if (!suffix || !IsReplacedBy(target))
         return true;
     const CString copy = NameOf(QString::fromStdString(FreeCopyName(m_path.toStdString(), suffix)));
     const CString question =
-        IsUnreadable() ? LoadString(Str::ReplaceUnreadable).arg(NameOf(m_path), copy)
-                       : LoadString(Str::ReplaceNotTaken).arg(NameOf(m_path)).arg(m_findings.size()).arg(copy);
+        IsUnreadable() ? tr("%1 could not be read when it was opened; what is shown is not its content.\n"
+                            "Saving replaces it. As it is now it stays in a copy beside it, %2.\nSave?")
+                             .arg(NameOf(m_path), copy)
+                       : tr("%1 holds values that were not taken as they stand (places: %2).\n"
+                            "Saving writes what is shown instead. As it is now the file stays in a copy beside it, "
+                            "%3.\nSave?")
+                             .arg(NameOf(m_path))
+                             .arg(m_findings.size())
+                             .arg(copy);
     return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
-bool CDocumentFile::KeepCopy()
+bool CKsDocumentFile::KeepCopy()
 {
     const Result<std::string> kept = KeepOriginal(m_path.toStdString(), CopySuffix());
     if (kept)
@@ -108,7 +114,7 @@ bool CDocumentFile::KeepCopy()
     return bool(kept);
 }
 
-bool CDocumentFile::Write(const HD_Parameters& parameters, const CString& target)
+bool CKsDocumentFile::Write(const CString& target, const std::function<Result<void>(const std::string& path)>& write)
 {
     const bool replaces = IsReplacedBy(target);
     if (replaces && CopySuffix() && m_keptCopy.isEmpty() && !KeepCopy())
@@ -120,7 +126,7 @@ bool CDocumentFile::Write(const HD_Parameters& parameters, const CString& target
     const bool renames =
         entry != target && QFileInfo::exists(entry) && !SameFile(entry.toStdString(), target.toStdString());
     const std::string written = (renames ? entry : target).toStdString();
-    if (const Result<void> saved = SaveHDFile(parameters, written); !saved) {
+    if (const Result<void> saved = write(written); !saved) {
         Tell(saved.error());
         return false;
     }
@@ -128,11 +134,12 @@ bool CDocumentFile::Write(const HD_Parameters& parameters, const CString& target
     const CString kept = replaces ? m_keptCopy : CString();
     *this = {};
     m_path = renamed ? target : entry;
+    m_savedAs = target;
     m_keptCopy = kept;
     if (!renamed) // it is saved, and keeps its name
-        KsMessageBox(LoadString(Str::KeepsItsName)
+        KsMessageBox(tr("The changes are saved in %1, which could not be renamed to %2: %3.")
                          .arg(NameOf(entry), NameOf(target), KsSystemReason(renamed.error().code)));
     else if (renames)
-        m_renamed = LoadString(Str::FileIsNow).arg(NameOf(entry), NameOf(target));
+        m_renamed = tr("%1 is now %2").arg(NameOf(entry), NameOf(target));
     return true;
 }

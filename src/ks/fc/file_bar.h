@@ -1,23 +1,25 @@
-// The bar above the pages that says what the document's file is when it is not simply what the pages show.
+// The bar above a view that says what the document's file is when it is not simply what the view shows.
 #pragma once
 
-#include "document/document.h"
+#include "ks/fc/types.h"
+#include "ks/ks_export.h"
 
 #include <QFrame>
 #include <QPointer>
 
-class CFindingsDialog;
+class CKsFindingsDialog;
+class CKsProjectDoc;
 class QLabel;
 class QPushButton;
 class QToolButton;
 
 /// Hidden while there is nothing to say. After an open it also shows the list of what was not taken, once the window
 /// has been painted.
-class CFileBar : public QFrame
+class KS_API CKsFileBar : public QFrame
 {
     Q_OBJECT
 public:
-    CFileBar(CKavo0_hdDoc& document, QWidget* parent);
+    CKsFileBar(CKsProjectDoc& document, QWidget* parent);
 
     /// The places of the file that were not taken as they stand; not modal.
     void ShowList();
@@ -29,10 +31,10 @@ private:
     void Refresh();
     CString Text() const;
 
-    CKavo0_hdDoc& m_document;
+    CKsProjectDoc& m_document;
     QLabel* m_text; // children
     QPushButton* m_list;
     QPushButton* m_edit;
     QToolButton* m_close;
-    QPointer<CFindingsDialog> m_dialog;
+    QPointer<CKsFindingsDialog> m_dialog;
 };

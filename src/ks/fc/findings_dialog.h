@@ -1,7 +1,9 @@
 // The places of a file that were not taken as they stand, as a table.
 #pragma once
 
-#include "document/document_file.h"
+#include "files/finding.h"
+#include "ks/fc/types.h"
+#include "ks/ks_export.h"
 
 #include <QAbstractTableModel>
 #include <QDialog>
@@ -11,11 +13,11 @@ class QPushButton;
 class QTableView;
 
 /// A row a place: where it is, what stands there, what was expected, what is used instead.
-class CFindingsModel : public QAbstractTableModel
+class KS_API CKsFindingsModel : public QAbstractTableModel
 {
     Q_OBJECT
 public:
-    CFindingsModel(std::vector<Finding> findings, QObject* parent);
+    CKsFindingsModel(std::vector<Finding> findings, QObject* parent);
 
     int rowCount(const QModelIndex& parent = {}) const override;
     int columnCount(const QModelIndex& parent = {}) const override;
@@ -29,11 +31,12 @@ private:
     std::vector<Finding> m_findings;
 };
 
-class CFindingsDialog : public QDialog
+/// Not modal; deletes itself when it is closed.
+class KS_API CKsFindingsDialog : public QDialog
 {
     Q_OBJECT
 public:
-    CFindingsDialog(const CDocumentFile& file, QWidget* parent);
+    CKsFindingsDialog(const CString& path, std::vector<Finding> findings, QWidget* parent);
 
 protected:
     void changeEvent(QEvent* event) override;
@@ -44,7 +47,7 @@ private:
     void Copy();
 
     CString m_name;
-    CFindingsModel* m_model; // children
+    CKsFindingsModel* m_model; // children
     QLabel* m_text;
     QTableView* m_table;
     QPushButton* m_copy;

@@ -1,7 +1,6 @@
-#include "module/findings_dialog.h"
+#include "ks/fc/findings_dialog.h"
 
 #include "ks/fc/file_name.h"
-#include "res/strings.h"
 
 #include <QClipboard>
 #include <QDialogButtonBox>
@@ -29,54 +28,42 @@ enum Column
     Columns
 };
 
+QString KindText(FieldKind kind)
+{
+    return VisitKind(kind, Overloads{[](std::type_identity<double>) { return CKsFindingsModel::tr("a number"); },
+                                     [](std::type_identity<bool>) { return CKsFindingsModel::tr("true or false"); },
+                                     [kind](std::type_identity<std::string>) {
+                                         return kind == FieldKind::Text ? CKsFindingsModel::tr("a text in quotes")
+                                                                        : CKsFindingsModel::tr("a file name in < >");
+                                     },
+                                     [](std::type_identity<HDDateTime>) { return CKsFindingsModel::tr("six integers"); },
+                                     [](auto) { return CKsFindingsModel::tr("an integer"); }});
+}
+
 QString ExpectedText(const Finding& finding)
 {
-    const auto text = [](int index) { return LoadString(Str::FindingExpected).split(u'\n').value(index); };
-    enum
-    {
-        ANumber,
-        AnInteger,
-        TrueOrFalse,
-        AText,
-        AFileName,
-        SixIntegers,
-        FittingCount,
-        FewerFlags,
-        Target,
-        MoreParameters,
-        OnlyOne
-    };
     switch (finding.kind) {
     case Finding::CountDoesNotFit:
-        return text(FittingCount).arg(finding.behind);
+        return CKsFindingsModel::tr("a count that fits the %1 parameters behind it").arg(finding.behind);
     case Finding::SurplusFlags:
-        return text(FewerFlags).arg(finding.behind);
+        return CKsFindingsModel::tr("a flag for each of %1 titles").arg(finding.behind);
+    case Finding::SurplusParams:
+        return CKsFindingsModel::tr("no more parameters");
     case Finding::NoTarget:
-        return text(Target).arg(QString::fromStdString(finding.section));
+        return CKsFindingsModel::tr("a target [%1]").arg(QString::fromStdString(finding.section));
     case Finding::Missing:
-        return text(MoreParameters);
+        return CKsFindingsModel::tr("more parameters, or a smaller count");
+    case Finding::NoKeyword:
+        return CKsFindingsModel::tr("a keyword %1").arg(QString::fromStdString(finding.keyword));
+    case Finding::NoSection:
+        return CKsFindingsModel::tr("a section [%1]").arg(QString::fromStdString(finding.section));
     case Finding::Repeated:
-        return text(OnlyOne);
+        return CKsFindingsModel::tr("only one of this name; the first counts");
+    case Finding::Rule:
+        return QString::fromStdString(finding.rule());
     default:
-        break;
+        return KindText(finding.expected);
     }
-    switch (finding.expected) {
-    case FieldKind::Number:
-        return text(ANumber);
-    case FieldKind::Boolean:
-        return text(TrueOrFalse);
-    case FieldKind::Text:
-        return text(AText);
-    case FieldKind::FileName:
-        return text(AFileName);
-    case FieldKind::DateTime:
-        return text(SixIntegers);
-    case FieldKind::Integer:
-    case FieldKind::Choice:
-    case FieldKind::Group:
-        break;
-    }
-    return text(AnInteger);
 }
 
 QString CellText(const Finding& finding, int column)
@@ -105,40 +92,46 @@ QString CellText(const Finding& finding, int column)
     }
 }
 
+QStringList Captions()
+{
+    return CKsFindingsModel::tr("Line\nColumn\nSection\nKeyword\nParameter\nIn the file\nExpected\nUsed instead")
+        .split(u'\n');
+}
+
 } // namespace
 
-CFindingsModel::CFindingsModel(std::vector<Finding> findings, QObject* parent)
+CKsFindingsModel::CKsFindingsModel(std::vector<Finding> findings, QObject* parent)
     : QAbstractTableModel(parent), m_findings(std::move(findings))
 {
 }
 
-int CFindingsModel::rowCount(const QModelIndex& parent) const
+int CKsFindingsModel::rowCount(const QModelIndex& parent) const
 {
     return parent.isValid() ? 0 : int(m_findings.size());
 }
 
-int CFindingsModel::columnCount(const QModelIndex& parent) const
+int CKsFindingsModel::columnCount(const QModelIndex& parent) const
 {
     return parent.isValid() ? 0 : Columns;
 }
 
-QVariant CFindingsModel::data(const QModelIndex& index, int role) const
+QVariant CKsFindingsModel::data(const QModelIndex& index, int role) const
 {
     if (!index.isValid() || (role != Qt::DisplayRole && role != Qt::ToolTipRole))
         return {};
     return CellText(m_findings[std::size_t(index.row())], index.column());
 }
 
-QVariant CFindingsModel::headerData(int section, Qt::Orientation orientation, int role) const
+QVariant CKsFindingsModel::headerData(int section, Qt::Orientation orientation, int role) const
 {
     if (orientation == Qt::Horizontal && role == Qt::DisplayRole)
-        return LoadString(Str::FindingColumns).split(u'\n').value(section);
+        return Captions().value(section);
     return QAbstractTableModel::headerData(section, orientation, role);
 }
 
-QString CFindingsModel::Text(const QModelIndexList& rows) const
+QString CKsFindingsModel::Text(const QModelIndexList& rows) const
 {
-    QString text = LoadString(Str::FindingColumns).replace(u'\n', u'\t') + u'\n';
+    QString text = Captions().join(u'\t') + u'\n';
     for (const QModelIndex& row : rows) {
         QStringList cells;
         for (int column = 0; column < Columns; ++column)
@@ -148,21 +141,22 @@ QString CFindingsModel::Text(const QModelIndexList& rows) const
     return text;
 }
 
-void CFindingsModel::Retranslate()
+void CKsFindingsModel::Retranslate()
 {
     emit headerDataChanged(Qt::Horizontal, 0, Columns - 1);
     if (!m_findings.empty())
         emit dataChanged(index(0, 0), index(rowCount() - 1, Columns - 1));
 }
 
-CFindingsDialog::CFindingsDialog(const CDocumentFile& file, QWidget* parent)
+CKsFindingsDialog::CKsFindingsDialog(const CString& path, std::vector<Finding> findings, QWidget* parent)
     : QDialog(parent),
-      m_name(KsShownFileName(file.Path())),
-      m_model(new CFindingsModel(file.Findings(), this)),
+      m_name(KsShownFileName(path)),
+      m_model(new CKsFindingsModel(std::move(findings), this)),
       m_text(new QLabel(this)),
       m_table(new QTableView(this))
 {
     setObjectName("findings");
+    setAttribute(Qt::WA_DeleteOnClose);
     m_text->setWordWrap(true);
     m_text->setTextFormat(Qt::PlainText);
     m_table->setModel(m_model);
@@ -177,7 +171,7 @@ CFindingsDialog::CFindingsDialog(const CDocumentFile& file, QWidget* parent)
     layout->addWidget(m_text);
     layout->addWidget(m_table, 1);
     layout->addWidget(buttons);
-    connect(m_copy, &QPushButton::clicked, this, &CFindingsDialog::Copy);
+    connect(m_copy, &QPushButton::clicked, this, &CKsFindingsDialog::Copy);
     connect(m_close, &QPushButton::clicked, this, &QDialog::close);
     m_close->setDefault(true);
     Retranslate();
@@ -186,18 +180,21 @@ CFindingsDialog::CFindingsDialog(const CDocumentFile& file, QWidget* parent)
     resize(900, 360);
 }
 
-void CFindingsDialog::Retranslate()
+void CKsFindingsDialog::Retranslate()
 {
-    setWindowTitle(LoadString(Str::FindingsTitle).arg(m_name));
-    m_text->setText(LoadString(Str::FindingsText).arg(m_name));
-    m_table->setAccessibleName(LoadString(Str::FindingsTitle).arg(m_name));
-    m_copy->setText(LoadString(Str::CopyFindings));
-    m_close->setText(LoadString(Str::CloseFindings));
+    setWindowTitle(tr("%1: Values Not Taken as They Stand").arg(m_name));
+    m_text->setText(tr("These places of %1 are not written as they should be. Each row says what stands there, what "
+                       "was expected, and what is used instead. Nothing is changed in the file unless you save; a save "
+                       "keeps the file as it is in a copy.")
+                        .arg(m_name));
+    m_table->setAccessibleName(tr("%1: Values Not Taken as They Stand").arg(m_name));
+    m_copy->setText(tr("&Copy"));
+    m_close->setText(tr("C&lose"));
     m_model->Retranslate();
 }
 
 /// The selected rows, or all.
-void CFindingsDialog::Copy()
+void CKsFindingsDialog::Copy()
 {
     if (!m_table->selectionModel()->hasSelection())
         m_table->selectAll();
@@ -206,7 +203,7 @@ void CFindingsDialog::Copy()
     QGuiApplication::clipboard()->setText(m_model->Text(rows));
 }
 
-void CFindingsDialog::keyPressEvent(QKeyEvent* event)
+void CKsFindingsDialog::keyPressEvent(QKeyEvent* event)
 {
     if (event->matches(QKeySequence::Copy))
         Copy();
@@ -214,7 +211,7 @@ void CFindingsDialog::keyPressEvent(QKeyEvent* event)
         QDialog::keyPressEvent(event);
 }
 
-void CFindingsDialog::changeEvent(QEvent* event)
+void CKsFindingsDialog::changeEvent(QEvent* event)
 {
     QDialog::changeEvent(event);
     if (event->type() == QEvent::LanguageChange)
