@@ -10,7 +10,7 @@ protected:
         auto* layout = new QVBoxLayout(&window);
         layout->addWidget(&field);
         layout->addWidget(&other);
-        Setup({.unit = UnitGroup::WaterLevel});
+        Setup({.name = "level", .unit = UnitGroup::WaterLevel});
         window.show();
         window.activateWindow();
         EXPECT_TRUE(QTest::qWaitForWindowActive(&window));
@@ -41,7 +41,7 @@ protected:
 TEST_F(CtrlEditTest, ShowsTheDeclaredDigits)
 {
     EXPECT_EQ(field.text(), "1.23457");
-    Setup({.unit = UnitGroup::WaterLevel, .digits = 3});
+    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .digits = 3});
     EXPECT_EQ(field.text(), "1.23");
     value = 12345678;
     field.Show();
@@ -103,7 +103,7 @@ TEST_F(CtrlEditTest, TypingWhatIsShownIsTyping)
         QTest::keyClicks(&field, "3");
     });
     // One single character, whose replacement looks like itself.
-    Setup({.unit = UnitGroup::WaterLevel, .digits = 1});
+    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .digits = 1});
     value = 2.4;
     field.Show();
     field.setFocus();
@@ -177,7 +177,7 @@ TEST_F(CtrlEditTest, ADisabledFieldShowsWhatIsStored)
 TEST_F(CtrlEditTest, RefusesAndKeepsTheFocus)
 {
     const double before = value;
-    Setup({.unit = UnitGroup::WaterLevel, .minimum = 0.5, .maximum = 1.5});
+    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .minimum = 0.5, .maximum = 1.5});
     const struct
     {
         const char *text, *message;
@@ -212,7 +212,7 @@ TEST_F(CtrlEditTest, StoresInBaseUnits)
     field.Show();
     EXPECT_EQ(field.text(), "4.05042");
     EXPECT_TRUE(field.toolTip().endsWith("\nUnit: ft")) << field.toolTip().toStdString();
-    Setup({.unit = UnitGroup::WaterLevel, .minimum = 0, .maximum = 4}); // metres
+    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .minimum = 0, .maximum = 4}); // metres
     Type("10");
     QTest::keyClick(&field, Qt::Key_Return);
     EXPECT_NEAR(value, 3.048, 1e-5);

@@ -86,13 +86,13 @@ TEST_F(DigitsTest, WhatWasTypedInAnotherUnitReadsAsItWasTyped)
 TEST_F(DigitsTest, AllDigitsShowsEveryCellAndFieldInFull)
 {
     Add("A", 1500.6, 0.1 + 0.2, 1e-7);
-    globals.G_waterlevel = 0.1234567890123456789;
+    globals.G_waterlevel = -1.2345678901234567e-100;
     Open<FamilyPage>(init);
     auto* field = new CCtrlEdit(view.get());
     view->layout()->addWidget(field);
-    field->Setup(&globals.G_waterlevel, 6, 3, true, UnitGroup::WaterLevel);
-    EXPECT_EQ(field->text(), "0.123");
-    EXPECT_EQ(field->toolTip(), "Full value: 0.12345678901234568 m\nUnit: m");
+    field->Setup(globals.G_waterlevel, {.name = "level", .unit = UnitGroup::WaterLevel, .digits = 3}, {});
+    EXPECT_EQ(field->text(), "-1.23e-100");
+    EXPECT_EQ(field->toolTip(), "Full value: -1.2345678901234567e-100 m\nUnit: m");
     EXPECT_EQ(Texts(1), "A|1501|0.300|0.000");
     const int width = grid->columnWidth(2);
 
@@ -104,13 +104,13 @@ TEST_F(DigitsTest, AllDigitsShowsEveryCellAndFieldInFull)
     EXPECT_EQ(Texts(1), "A|1500.6|0.30000000000000004|1e-07");
     EXPECT_FALSE(IsMarked(1, 2));
     EXPECT_GT(grid->columnWidth(2), width) << "an elided number shows no digits";
-    EXPECT_EQ(field->text(), "0.12345678901234568") << "longer than what may be typed";
+    EXPECT_EQ(field->text(), "-1.2345678901234567e-100") << "longer than what may be typed";
     EXPECT_EQ(field->toolTip(), "Unit: m");
     EXPECT_TRUE(document.UndoStack().isClean());
 
     KsUnits::Instance().SetAllDigits(false);
     field->Show();
     EXPECT_EQ(Texts(1), "A|1501|0.300|0.000");
-    EXPECT_EQ(field->text(), "0.123");
-    EXPECT_EQ(field->maxLength(), 6);
+    EXPECT_EQ(field->text(), "-1.23e-100");
+    EXPECT_EQ(field->maxLength(), 20);
 }
