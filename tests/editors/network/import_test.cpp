@@ -66,9 +66,9 @@ protected:
             if (!dialog || m_answers.empty() || dialog == m_answered)
                 return;
             m_answered = dialog;
-            const auto answer = m_answers.front();
+            const auto act = m_answers.front();
             m_answers.erase(m_answers.begin());
-            answer(dialog);
+            act(dialog);
         });
         m_clock.start(20);
     }
