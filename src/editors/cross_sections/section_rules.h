@@ -6,9 +6,16 @@
 /// What is wrong with a section.
 struct CSectionFault
 {
-    QString text{};                // for the user: a sentence that says what was expected; empty for nothing
-    std::string_view keyword = {}; // of the file, where it stands
-    int point = -1;                // or this point
+    enum Field
+    {
+        Nothing,
+        Branch,
+        Width,
+        Point
+    };
+    Field field = Nothing;
+    int point = -1; // of Field::Point
+    QString text{}; // for the user: a sentence that says what was expected
 };
 
 /// What is expected instead of such a fault.
