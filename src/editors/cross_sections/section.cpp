@@ -32,10 +32,9 @@ int CCrossSections::Nearest(const QString& branch, double chainage) const
 {
     int nearest = -1;
     double least = HUGE_VAL;
-    const std::string wanted = branch.toStdString();
     for (std::size_t i = 0; i < sections.size(); ++i) {
         const double distance = std::abs(sections[i].chainage - chainage);
-        if (distance < least && KsSameBranch(sections[i].branch, wanted)) {
+        if (distance < least && KsSameBranch(sections[i].Branch(), branch)) {
             least = distance;
             nearest = int(i);
         }

@@ -86,7 +86,7 @@ LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
         return 0;
     const int nearest = Document()->Sections().Nearest(item->branch, item->chainage);
     const CCrossSection *there = Document()->Section(nearest), *here = Document()->Section(CurrentSection());
-    if (!there || (here && KsSameBranch(here->branch, there->branch) &&
+    if (!there || (here && KsSameBranch(here->Branch(), there->Branch()) &&
                    std::abs(here->chainage - item->chainage) <= std::abs(there->chainage - item->chainage)))
         return 0;
     const QScopedValueRollback showing(m_showing, true);

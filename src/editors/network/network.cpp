@@ -18,7 +18,7 @@ void CNetworkBranch::SortChannel()
 
 int CNetwork::FindBranch(const QString& name) const
 {
-    const auto isIt = [wanted = name.toStdString()](const auto& each) { return KsSameBranch(each.name, wanted); };
+    const auto isIt = [&name](const auto& each) { return KsSameBranch(each.Name(), name); };
     const auto found = std::find_if(branches.begin(), branches.end(), isIt);
     return found == branches.end() ? -1 : int(found - branches.begin());
 }

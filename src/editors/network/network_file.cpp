@@ -5,6 +5,7 @@
 #include "ks/fc/branch_name.h"
 
 #include <QCoreApplication>
+#include <QSet>
 #include <algorithm>
 #include <iterator>
 
@@ -81,30 +82,30 @@ constexpr DeclaredFile file{{.name = "KVR_NETWORK",
                              .sectionCount = std::size(networkSections)},
                             Keeps<&FileNetwork::network, &CNetwork::keptTargets>()};
 
-/// Whether one of the first branches has a name.
-bool HasName(const CNetwork& network, std::size_t count, const std::string& wanted)
+/// Keys of the names that the file gives, and of those that branches have by now.
+struct Names
 {
-    return std::any_of(network.branches.begin(), network.branches.begin() + std::ptrdiff_t(count),
-                       [&](const CNetworkBranch& each) { return KsSameBranch(each.name, wanted); });
-}
+    QSet<QString> given, taken;
+};
 
 /// What a branch has to fulfil beside its declaration: it is made to, and that is reported.
-void Mend(CNetwork& network, std::size_t index, tqlHandle section, LoadReport& report)
+void Mend(CNetworkBranch& branch, Names& names, tqlHandle section, LoadReport& report)
 {
-    CNetworkBranch& branch = network.branches[index];
-    if (const std::string given = branch.name; given.empty() || HasName(network, index, given)) {
-        const std::string wanted = given.empty() ? "BRANCH" : given;
-        std::string free = wanted;
-        for (int number = 2; HasName(network, network.branches.size(), free); ++number)
-            free = wanted + '-' + std::to_string(number);
-        branch.name = free;
+    const QString given = branch.Name();
+    if (given.isEmpty() || names.taken.contains(KsBranchKey(given))) {
+        const QString wanted = given.isEmpty() ? QStringLiteral("BRANCH") : given;
+        QString free = wanted;
+        for (int number = 2; names.given.contains(KsBranchKey(free)) || names.taken.contains(KsBranchKey(free));
+             ++number)
+            free = QStringLiteral("%1-%2").arg(wanted).arg(number);
+        branch.name = free.toStdString();
         ReportRule(report, section, NameKeyword, 1, ParamsText(nameField, &branch), [given] {
             const QString taken = NetworkFile::tr("there is a branch \"%1\" already.");
-            return (given.empty() ? NetworkFile::tr("expected the branch's name, Name = \"...\".")
-                                  : taken.arg(QString::fromStdString(given)))
+            return (given.isEmpty() ? NetworkFile::tr("expected the branch's name, Name = \"...\".") : taken.arg(given))
                 .toStdString();
         });
     }
+    names.taken.insert(KsBranchKey(branch.Name()));
     if (branch.start == branch.end) {
         branch.end += std::max(branch.Length(), 1.0);
         ReportRule(report, section, ChainageKeyword, 1, ParamsText(endFields, &branch),
@@ -131,9 +132,12 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
     const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
     CNetwork& network = read.network;
     network.system = QString::fromStdString(read.system);
+    Names names;
+    for (const CNetworkBranch& branch : network.branches)
+        names.given.insert(KsBranchKey(branch.Name()));
     for (std::size_t i = 0; i < network.branches.size(); ++i) {
         network.branches[i].SortChannel();
-        Mend(network, i, tqlSectionByNameNum(target, BranchSection, int(i) + 1), report);
+        Mend(network.branches[i], names, tqlSectionByNameNum(target, BranchSection, int(i) + 1), report);
     }
     return std::move(network);
 }
