@@ -34,9 +34,15 @@ function(kvr_defaults target)
   endif()
 endfunction()
 
-# A static library without Qt.
+# A static library without Qt, of what stands in the room's folder; of what knows the platform that of the platform.
 function(kvr_library name)
-  add_library(${name} STATIC ${ARGN})
+  file(GLOB sources CONFIGURE_DEPENDS *.cpp)
+  set(foreign windows)
+  if(WIN32)
+    set(foreign posix)
+  endif()
+  list(FILTER sources EXCLUDE REGEX "_${foreign}\\.cpp$")
+  add_library(${name} STATIC ${sources})
   kvr_defaults(${name})
 endfunction()
 
