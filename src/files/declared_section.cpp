@@ -24,13 +24,26 @@ bool IsRepeated(const DeclaredKeyword& keyword)
     return keyword.fields.front().kind == FieldKind::Group;
 }
 
+/// One element a keyword. A line without all of its values would be another place or another shape: it is left out.
+void ReadLines(tqlHandle section, const DeclaredKeyword& declared, GroupValue<void> group, LoadReport& report)
+{
+    group.Renew(0);
+    for (int line = 1; line <= tqlGetNoKeywords(section, declared.name); ++line) {
+        const tqlHandle keyword = tqlKeywordByNameNum(section, declared.name, line);
+        const std::size_t lost = report.Lost(), taken = group.size();
+        group.Resize(taken + 1);
+        ReadKeyword(keyword, group.Elements(), group[taken], report);
+        if (report.Lost() != lost) {
+            report.LeaveOut(keyword);
+            group.Resize(taken);
+        }
+    }
+}
+
 void ReadKeywords(tqlHandle section, const DeclaredKeyword& declared, void* object, LoadReport& report)
 {
     if (IsRepeated(declared)) {
-        const auto group = declared.fields.front().GroupIn(object);
-        group.Renew(std::size_t(tqlGetNoKeywords(section, declared.name)));
-        for (std::size_t i = 0; i < group.size(); ++i)
-            ReadKeyword(tqlKeywordByNameNum(section, declared.name, int(i) + 1), group.Elements(), group[i], report);
+        ReadLines(section, declared, declared.fields.front().GroupIn(object), report);
     } else if (const tqlHandle keyword = tqlKeywordByNameNum(section, declared.name, 1)) {
         ReadKeyword(keyword, declared.fields, object, report);
     } else if (declared.presence == Presence::Required) {
@@ -121,6 +134,17 @@ void WriteContent(tqlHandle structure, const DeclaredSection& declared, const vo
     WriteUnknown(structure, *declared.kept.constOf(object));
 }
 
+/// The keyword that became element `number` of its lines; null when there is none.
+tqlHandle TakenKeyword(const LoadReport& report, tqlHandle section, std::string_view name, int number)
+{
+    if (!report.HasLeftOut())
+        return tqlKeywordByNameNum(section, name, number);
+    tqlHandle keyword = nullptr;
+    for (int place = 1; number > 0 && (keyword = tqlKeywordByNameNum(section, name, place)); ++place)
+        number -= !report.IsLeftOut(keyword);
+    return keyword;
+}
+
 } // namespace
 
 void ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object, LoadReport& report)
@@ -140,7 +164,9 @@ void ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object, L
 void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, int number, std::string used,
                 std::function<std::string()> rule)
 {
-    const tqlHandle keyword = tqlKeywordByNameNum(section, name, number);
+    const tqlHandle keyword = TakenKeyword(report, section, name, number);
+    if (report.Use(keyword ? keyword : section, name, used))
+        return; // a consequence of what was told of it
     report.Add(keyword ? keyword : section, keyword,
                {.kind = Finding::Rule,
                 .section = std::string(tqlName(section)),

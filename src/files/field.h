@@ -90,6 +90,8 @@ public:
         Access().resize(m_container, 0);
         Access().resize(m_container, count);
     }
+    /// The first elements stay; others have their defaults.
+    void Resize(std::size_t count) const requires(!std::is_const_v<Void>) { Access().resize(m_container, count); }
     /// Null where nothing is kept.
     Extra* ExtraOf(std::size_t index) const
     {

@@ -46,6 +46,8 @@ void Report(const ParamCursor& params, tqlHandle at, const Field& field, const v
         finding.found = tqlGetRawParam(at);
     if (finding.used.empty())
         finding.used = ParamsText(FieldList(&field, 1), object);
+    if (!field.mayBeUnknown && (finding.kind == Finding::WrongType || finding.kind == Finding::Missing))
+        params.report->CountLost();
     params.report->Add(at, params.keyword, std::move(finding));
 }
 

@@ -11,13 +11,12 @@ std::string Quoted(std::string_view text)
 
 const char* KindText(FieldKind kind)
 {
-    return VisitKind(
-        kind, Overloads{[](std::type_identity<double>) { return "a number"; },
-                        [](std::type_identity<bool>) { return "true or false"; },
-                        [kind](std::type_identity<std::string>) {
-                            return kind == FieldKind::Text ? "a text in quotes" : "a file name in < >";
-                        },
-                        [](auto) { return "an integer"; }});
+    return VisitKind(kind, Overloads{[](std::type_identity<double>) { return "a number"; },
+                                     [](std::type_identity<bool>) { return "true or false"; },
+                                     [kind](std::type_identity<std::string>) {
+                                         return kind == FieldKind::Text ? "a text in quotes" : "a file name in < >";
+                                     },
+                                     [](auto) { return "an integer"; }});
 }
 
 const char* TypeText(TqlType type)
@@ -124,7 +123,32 @@ void LoadReport::Add(tqlHandle place, tqlHandle keyword, Finding finding)
         finding.section = m_section;
     finding.found = Shortened(std::move(finding.found));
     finding.used = Shortened(std::move(finding.used));
+    m_of.emplace(keyword ? keyword : place, m_findings.size());
     m_findings.push_back(std::move(finding));
+}
+
+void LoadReport::LeaveOut(tqlHandle keyword)
+{
+    m_leftOut.insert(keyword);
+    const auto [first, last] = m_of.equal_range(keyword);
+    for (auto each = first; each != last; ++each) {
+        m_findings[each->second].leftOut = true;
+        m_findings[each->second].used.clear();
+    }
+}
+
+bool LoadReport::Use(tqlHandle node, std::string_view keyword, const std::string& used)
+{
+    bool was = false;
+    const auto [first, last] = m_of.equal_range(node);
+    for (auto each = first; each != last; ++each) {
+        Finding& finding = m_findings[each->second];
+        if (finding.keyword != keyword || finding.kind == Finding::Rule)
+            continue;
+        finding.used = Shortened(used);
+        was = true;
+    }
+    return was;
 }
 
 std::vector<Finding> LoadReport::Take()

@@ -10,6 +10,7 @@
 #include "grid/typing.h"
 #include "ks/language/language.h"
 
+#include <QAbstractButton>
 #include <QApplication>
 #include <QHeaderView>
 #include <QPainter>
@@ -34,8 +35,9 @@ CGenGrid::CGenGrid(QWidget* parent)
     QSizePolicy policy = sizePolicy();
     policy.setRetainSizeWhenHidden(true); // a hidden grid leaves the rest of the page where it is
     setSizePolicy(policy);
-    // A click on a header moves the current cell as one on a cell does.
-    for (QWidget* part : {verticalHeader()->viewport(), horizontalHeader()->viewport()})
+    // A click on a header moves the current cell as one on a cell does; one on the corner selects all.
+    QWidget* corner = findChild<QAbstractButton*>(QString(), Qt::FindDirectChildrenOnly);
+    for (QWidget* part : {verticalHeader()->viewport(), horizontalHeader()->viewport(), corner})
         part->installEventFilter(this);
     connect(m_model, &CGridModel::CellModified, this, [this] { m_modified = true; });
     connect(m_model, &CGridModel::modelReset, this, [this] { // other rows, none of which is current

@@ -30,14 +30,15 @@ enum Column
 
 QString KindText(FieldKind kind)
 {
-    return VisitKind(kind, Overloads{[](std::type_identity<double>) { return CKsFindingsModel::tr("a number"); },
-                                     [](std::type_identity<bool>) { return CKsFindingsModel::tr("true or false"); },
-                                     [kind](std::type_identity<std::string>) {
-                                         return kind == FieldKind::Text ? CKsFindingsModel::tr("a text in quotes")
-                                                                        : CKsFindingsModel::tr("a file name in < >");
-                                     },
-                                     [](std::type_identity<HDDateTime>) { return CKsFindingsModel::tr("six integers"); },
-                                     [](auto) { return CKsFindingsModel::tr("an integer"); }});
+    return VisitKind(kind,
+                     Overloads{[](std::type_identity<double>) { return CKsFindingsModel::tr("a number"); },
+                               [](std::type_identity<bool>) { return CKsFindingsModel::tr("true or false"); },
+                               [kind](std::type_identity<std::string>) {
+                                   return kind == FieldKind::Text ? CKsFindingsModel::tr("a text in quotes")
+                                                                  : CKsFindingsModel::tr("a file name in < >");
+                               },
+                               [](std::type_identity<HDDateTime>) { return CKsFindingsModel::tr("six integers"); },
+                               [](auto) { return CKsFindingsModel::tr("an integer"); }});
 }
 
 QString ExpectedText(const Finding& finding)
@@ -66,6 +67,15 @@ QString ExpectedText(const Finding& finding)
     }
 }
 
+QString UsedText(const Finding& finding)
+{
+    if (finding.leftOut)
+        return CKsFindingsModel::tr("nothing: the line is left out");
+    if (finding.kind == Finding::Repeated)
+        return CKsFindingsModel::tr("the first; this one is kept, but not shown");
+    return finding.used == "nan" ? CKsFindingsModel::tr("not known") : QString::fromStdString(finding.used);
+}
+
 QString CellText(const Finding& finding, int column)
 {
     switch (column) {
@@ -86,7 +96,7 @@ QString CellText(const Finding& finding, int column)
     case Expected:
         return ExpectedText(finding);
     case Used:
-        return QString::fromStdString(finding.used);
+        return UsedText(finding);
     default:
         return {};
     }
@@ -175,9 +185,22 @@ CKsFindingsDialog::CKsFindingsDialog(const CString& path, std::vector<Finding> f
     connect(m_close, &QPushButton::clicked, this, &QDialog::close);
     m_close->setDefault(true);
     Retranslate();
+    resize(1000, 360);
+    ShareWidth();
+}
+
+/// What is used instead is in sight, whatever the length of the texts before it; a tool tip has them whole.
+void CKsFindingsDialog::ShareWidth()
+{
     m_table->resizeColumnsToContents(); // by the rows in sight
-    m_table->horizontalHeader()->setStretchLastSection(true);
-    resize(900, 360);
+    QHeaderView& columns = *m_table->horizontalHeader();
+    constexpr int most = 220, least = 160; // pixels
+    columns.resizeSection(Found, std::min(columns.sectionSize(Found), most));
+    const int expected = columns.sectionSize(Expected), used = std::min(columns.sectionSize(Used), most);
+    const int others = columns.length() - expected - columns.sectionSize(Used);
+    constexpr int around = 80; // margins and scroll bar
+    columns.resizeSection(Expected, std::clamp(width() - others - used - around, std::min(least, expected), expected));
+    columns.setStretchLastSection(true);
 }
 
 void CKsFindingsDialog::Retranslate()

@@ -44,6 +44,7 @@ protected:
 
 private:
     void Retranslate();
+    void ShareWidth();
     void Copy();
 
     CString m_name;

@@ -202,6 +202,18 @@ Save?</source>
         <translation>この名前は 1 つだけ (最初のものが有効)</translation>
     </message>
     <message>
+        <source>nothing: the line is left out</source>
+        <translation>なし (この行は読み込まれません)</translation>
+    </message>
+    <message>
+        <source>the first; this one is kept, but not shown</source>
+        <translation>最初のもの (これは保持されますが表示されません)</translation>
+    </message>
+    <message>
+        <source>not known</source>
+        <translation>不明</translation>
+    </message>
+    <message>
         <source>a keyword %1</source>
         <translation>キーワード %1</translation>
     </message>

@@ -414,7 +414,7 @@
     </message>
     <message>
         <source>Load &amp;Branch &amp;&amp; Chainage</source>
-        <translation>河道と距離標を読み込む(&amp;B)</translation>
+        <translation>河川名と追加距離を読み込む(&amp;B)</translation>
     </message>
 </context>
 <context>
@@ -444,7 +444,7 @@
     </message>
     <message>
         <source>Load &amp;Branch &amp;&amp; Chainage</source>
-        <translation>河道と距離標を読み込む(&amp;B)</translation>
+        <translation>河川名と追加距離を読み込む(&amp;B)</translation>
     </message>
 </context>
 <context>

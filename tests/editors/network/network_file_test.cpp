@@ -52,12 +52,13 @@ TEST_F(NetworkTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
     struct Case
     {
         const char *from, *to, *told;
+        std::size_t vertices = 3, rows = 3; // without lines that are left out
     };
     const Case cases[] = {
         {"Name = \"MAIN\"", "Title = \"MAIN\"", "3 Name:  -> \"BRANCH\""},
         {"Name = \"SIDE\"", "Name = \"\"", "26 Name: \"\" -> \"BRANCH\""},
         {"Name = \"SIDE\"", "Name = \"Main\"", "26 Name: \"Main\" -> \"Main-2\""},
-        {"    Chainage = 1000, 8000\n", "", "3 Chainage:  -> 0, 0; 3 Chainage:  -> 0, 7000"},
+        {"    Chainage = 1000, 8000\n", "", "3 Chainage:  -> 0, 7000"},
         {"Chainage = 1000, 8000", "Chainage = 1000", "5 Chainage: 1000 -> 0"},
         {"Chainage = 1000, 8000", "Chainage = 8, 8.0", "5 Chainage: 8, 8.0 -> 8, 7008"},
         {"FlowsDownstream = true", "FlowsDownstream = 1", "6 FlowsDownstream: 1 -> true"},
@@ -65,9 +66,9 @@ TEST_F(NetworkTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
          "7 FlowsDownstream: false -> "},
         {"    [Channel]\n", "    [Line]\n    [/Line]\n    [Channel]\n", "13 [Line]:  -> "},
         {"Survey = \"2019\", 3", "CoordinateSystem = 25832", "2 CoordinateSystem: 25832 -> \"\""},
-        {"Vertex = 3000, 0\n", "Vertex = 3000, \"north\"\n", "10 Vertex: \"north\" -> 0"},
-        {"Vertex = 3000, 4000", "Vertex = inf, 4000", "11 Vertex: inf -> 0"},
-        {"DATA = 2000, 400, 30", "DATA = nan, inf, 30", "14 DATA: nan -> 0; 14 DATA: inf -> nan"},
+        {"Vertex = 3000, 0\n", "Vertex = 3000, \"north\"\n", "10 Vertex: \"north\" -> ", 2},
+        {"Vertex = 3000, 4000", "Vertex = inf, 4000", "11 Vertex: inf -> ", 2},
+        {"DATA = 2000, 400, 30", "DATA = nan, inf, 30", "14 DATA: nan -> ; 14 DATA: inf -> ", 3, 2},
         {"DATA = 2000, 400, 30", "DATA = 2000, 400, 30, 1", "14 DATA: 1 -> "},
     };
     for (const Case& each : cases) {
@@ -78,10 +79,10 @@ TEST_F(NetworkTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
         CNetwork network;
         EXPECT_EQ(ReadNetwork(Write("bad.kvnw", text), network).toStdString(), each.told);
         ASSERT_EQ(network.branches.size(), 2u) << each.told;
-        EXPECT_EQ(network.branches[0].line.size(), 3u) << each.told;
-        EXPECT_EQ(network.branches[0].channel.size(), 3u) << each.told;
+        EXPECT_EQ(network.branches[0].line.size(), each.vertices) << each.told;
+        EXPECT_EQ(network.branches[0].channel.size(), each.rows) << each.told;
         ASSERT_EQ(WriteNetwork(folder.filePath("mended.kvnw"), network), "");
-        const bool twice = QByteArray(each.told).endsWith("-> ") && !QByteArray(each.told).contains("DATA");
+        const bool twice = QByteArray(each.to).contains("[Line]") || QByteArray(each.to).contains("= false");
         EXPECT_EQ(ReadNetwork(folder.filePath("mended.kvnw"), network).isEmpty(), !twice) << "what repeats is kept";
     }
 }

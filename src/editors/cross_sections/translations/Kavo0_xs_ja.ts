@@ -190,7 +190,7 @@ Delete Lines</source>
     </message>
     <message>
         <source>Radius</source>
-        <translation>径深</translation>
+        <translation>曲率半径</translation>
     </message>
     <message>
         <source>Width</source>
