@@ -56,7 +56,7 @@ struct Finding
     std::function<std::string()> rule{}; // of Rule: what was expected, in the user's language
 
     /// Whether rewriting the file would lose what stands there.
-    bool LosesContent() const { return kind <= NoTarget; }
+    bool LosesContent() const { return kind <= NoTarget || leftOut; }
     /// Whether the user must know before relying on what is shown: a value was lost or taken for another, defaults
     /// stand where parameters are missing, or something stands in the file that is never shown because it was there
     /// before.
