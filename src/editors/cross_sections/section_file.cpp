@@ -6,6 +6,7 @@
 
 #include <QCoreApplication>
 #include <iterator>
+#include <map>
 #include <set>
 
 namespace {
@@ -77,15 +78,19 @@ void Mend(CCrossSection& section, tqlHandle node, LoadReport& report)
     }
 }
 
-using Keys = std::set<decltype(CCrossSection().Key())>;
+using Key = decltype(CCrossSection().Key());
+using Keys = std::set<Key>;
+using Numbers = std::map<Key, int>; // the last one that was tried, by the key that is taken: many may share it
 
 /// A section at the place of another is told apart by its topo ID.
-void MendKey(CCrossSection& section, const Keys& taken, tqlHandle node, LoadReport& report)
+void MendKey(CCrossSection& section, const Keys& taken, Numbers& numbers, tqlHandle node, LoadReport& report)
 {
     CCrossSection same = section;
     same.points.clear();
-    for (int number = 2; taken.contains(section.Key()); ++number)
-        section.topoId = same.topoId + '-' + std::to_string(number);
+    int& number = numbers.try_emplace(section.Key(), 1).first->second;
+    do
+        section.topoId = same.topoId + '-' + std::to_string(++number);
+    while (taken.contains(section.Key()));
     ReportRule(report, node, TopoIdKeyword, 1, ParamsText(FieldOf(1), &section),
                [same] { return WhyTaken(same).toStdString(); });
 }
@@ -109,13 +114,14 @@ CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
         return tqlSectionByNameNum(target, SectionName, int(&each - read.sections.data()) + 1);
     };
     Keys all, met;
+    Numbers numbers;
     for (CCrossSection& each : read.sections) {
         Mend(each, nodeOf(each), report);
         all.insert(each.Key());
     }
     for (CCrossSection& each : read.sections) {
         if (!met.insert(each.Key()).second) {
-            MendKey(each, all, nodeOf(each), report);
+            MendKey(each, all, numbers, nodeOf(each), report);
             all.insert(each.Key());
         }
     }

@@ -3,6 +3,7 @@
 #include "editors/cross_sections/document.h"
 #include "grid/field_columns.h"
 #include "grid/vector_rows.h"
+#include "ks/fc/branch_name.h"
 
 #include <numeric>
 #include <set>
@@ -35,9 +36,9 @@ public:
             line.branch = before->branch;
             line.topoId = before->topoId;
             const CCrossSection *next = Above(at + 1, 1), *previous = i > 0 ? Above(at, 1) : Above(at, 2);
-            if (next && next->branch == line.branch)
+            if (next && KsSameBranch(next->Branch(), line.Branch()))
                 line.chainage = std::midpoint(before->chainage, next->chainage);
-            else if (previous && previous->branch == line.branch)
+            else if (previous && KsSameBranch(previous->Branch(), line.Branch()))
                 line.chainage = 2 * before->chainage - previous->chainage;
             else
                 line.chainage = before->chainage + step;

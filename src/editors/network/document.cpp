@@ -55,8 +55,8 @@ void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QSt
         *static_cast<CNetworkBranch*>(added->At(i)) = std::move(branches[i]);
     }
     UndoStack().beginMacro(text);
-    if (system != m_network.system)
-        UndoStack().push(new CSetValue<QString>(*this, text, m_network.system, system));
+    if (system != m_network.System())
+        UndoStack().push(new CSetValue<std::string>(*this, text, m_network.system, system.toStdString()));
     InsertLines(*this, rows, rows->Count(), std::move(added));
     UndoStack().endMacro();
 }

@@ -3,11 +3,10 @@
 #include "editors/common/quantity.h"
 #include "editors/network/join_lines.h"
 #include "editors/network/measured_line.h"
-#include "ks/fc/branch_name.h"
+#include "editors/network/network_rules.h"
 
 #include <QCoreApplication>
 #include <QLibrary>
-#include <QSet>
 #include <cmath>
 #include <numeric>
 #include <optional>
@@ -42,20 +41,11 @@ int FindField(const CGisLayer& layer, std::initializer_list<const char*> names)
     return -1;
 }
 
-QString Metres(double value)
-{
-    return WithSymbol(UnitGroup::Chainage, value);
-}
-
 /// Goes through the lines of a layer.
 class CPlanner
 {
 public:
-    CPlanner(const CImportOptions& options, const CNetwork& network) : m_options(options)
-    {
-        for (const CNetworkBranch& branch : network.branches)
-            m_taken << KsBranchKey(branch.Name());
-    }
+    CPlanner(const CImportOptions& options, const CNetwork& network) : m_options(options), m_names(network) {}
 
     void Add(const CGisFeature& feature, std::vector<CGisLine> parts)
     {
@@ -141,13 +131,9 @@ private:
     CNetworkBranch& NewBranch(const QString& wanted, const CGisLine& line)
     {
         CNetworkBranch& branch = plan.branches.emplace_back();
-        QString name = wanted;
-        for (int number = 2; m_taken.contains(KsBranchKey(name)); ++number)
-            name = QStringLiteral("%1 (%2)").arg(wanted).arg(number);
-        branch.name = name.toStdString();
+        branch.name = m_names.Take(wanted, QStringLiteral("%1 (%2)")).toStdString();
         branch.line = line;
         branch.end = branch.Length();
-        m_taken << KsBranchKey(branch.Name());
         return branch;
     }
 
@@ -177,12 +163,12 @@ private:
                                           : Number(feature, fields.end);
         if (!start || !end || *start == *end) {
             Change(ImportBranches::tr("no two different chainages; it goes from 0 to its length, %1.")
-                       .arg(Metres(length)));
+                       .arg(LengthText(length)));
             return {};
         }
         if (std::abs(std::abs(*end - *start) / length - 1) > tolerance)
             Change(ImportBranches::tr("its chainages go from %1 to %2, but the line is %3 long.")
-                       .arg(Metres(*start), Metres(*end), Metres(length)));
+                       .arg(LengthText(*start), LengthText(*end), LengthText(length)));
         return std::pair(*start, *end);
     }
 
@@ -215,7 +201,7 @@ private:
                 branch.end = std::lerp(first, last, after / whole);
             }
             before = after;
-            names << ImportBranches::tr("\"%1\" (%2)").arg(branch.Name(), Metres(LengthOf(each.line)));
+            names << ImportBranches::tr("\"%1\" (%2)").arg(branch.Name(), LengthText(LengthOf(each.line)));
         }
         const QString how = chainages ? ImportBranches::tr("The chainages of the line are shared out among them.")
                                       : ImportBranches::tr("Each goes from 0 to its length.");
@@ -224,7 +210,7 @@ private:
     }
 
     const CImportOptions& m_options;
-    QSet<QString> m_taken;
+    CBranchNames m_names;
     QString m_name, m_who; // of the line at hand
 };
 
@@ -264,6 +250,11 @@ QString GeometryText(const QString& geometry)
                                                          QT_TRANSLATE_NOOP("GisGeometry", "Multi Curve"),
                                                          QT_TRANSLATE_NOOP("GisGeometry", "Geometry Collection")};
     return geometry.isEmpty() ? QString() : QCoreApplication::translate("GisGeometry", geometry.toUtf8().constData());
+}
+
+QString LengthText(double metres)
+{
+    return WithSymbol(UnitGroup::Chainage, metres);
 }
 
 CImportFields ProposeFields(const CGisLayer& layer)

@@ -38,6 +38,8 @@ bool CanImport();
 const CGisLibrary* GisLibrary(QString& reason);
 /// What a geometry is, in the words of the user.
 QString GeometryText(const QString& geometry);
+/// A length or a chainage in the user's unit.
+QString LengthText(double metres);
 /// Fields that look as if they had a branch's name and chainages.
 CImportFields ProposeFields(const CGisLayer& layer);
 /// The branches that the lines of `layer` become, where `map` has them. Names that are missing or taken, in `network`

@@ -49,7 +49,7 @@ CImportDialog::CImportDialog(const QString& name, const CGisFile& file, const CG
       m_file(file),
       m_library(library),
       m_network(network),
-      m_own(library.FindSystem(network.system)),
+      m_own(library.FindSystem(network.System())),
       m_layers(Named(new QTableWidget, "layers")),
       m_name(Named(new QComboBox, "nameField")),
       m_start(Named(new QComboBox, "startField")),
@@ -251,14 +251,14 @@ void CImportDialog::TargetChanged()
                                  .arg(m_code->text());
     else if (m_import.layer)
         m_import.map = m_library.MapOf(*m_import.layer, m_import.target);
-    m_declare->setVisible(m_network.system.isEmpty() && !m_network.branches.empty() && m_import.target.IsKnown());
+    m_declare->setVisible(m_network.system.empty() && !m_network.branches.empty() && m_import.target.IsKnown());
     Plan();
 }
 
 QString CImportDialog::NetworkSystem() const
 {
     const bool take = m_network.branches.empty() || m_declare->isChecked();
-    return m_network.system.isEmpty() && take ? m_import.target.definition : m_network.system;
+    return m_network.system.empty() && take ? m_import.target.definition : m_network.System();
 }
 
 // ---- preview -----------------------------------------------------------------------------------
@@ -290,9 +290,9 @@ void CImportDialog::ShowPlan()
     QStringList warnings;
     if (const QString reason = WhyNot(); !reason.isEmpty())
         warnings << reason;
-    if (!m_network.system.isEmpty() && !m_own.IsKnown())
+    if (!m_network.system.empty() && !m_own.IsKnown())
         warnings
-            << tr("The network names the coordinate system \"%1\", which is not known here.").arg(m_network.system);
+            << tr("The network names the coordinate system \"%1\", which is not known here.").arg(m_network.System());
     const CImportReport report = m_import.layer ? ReportOf(m_import, m_network) : CImportReport();
     warnings << report.warnings;
     warnings.removeDuplicates();

@@ -1,7 +1,5 @@
 #include "editors/network/import_report.h"
 
-#include "editors/common/quantity.h"
-
 #include <QClipboard>
 #include <QCoreApplication>
 #include <QDialog>
@@ -19,11 +17,6 @@ struct Text
 {
     Q_DECLARE_TR_FUNCTIONS(ImportReport)
 };
-
-QString Length(double metres)
-{
-    return WithSymbol(UnitGroup::Chainage, metres);
-}
 
 QString Factor(double value)
 {
@@ -43,9 +36,10 @@ public:
         for (const CNetworkBranch& branch : m_import.plan.branches) {
             whole += branch.Length();
             branches << Text::tr("%1: %2 long, chainages from %3 to %4")
-                            .arg(branch.Name(), Length(branch.Length()), Length(branch.start), Length(branch.end));
+                            .arg(branch.Name(), LengthText(branch.Length()), LengthText(branch.start),
+                                 LengthText(branch.end));
         }
-        Say(Text::tr("Branches: %1, in all %2").arg(branches.size()).arg(Length(whole)));
+        Say(Text::tr("Branches: %1, in all %2").arg(branches.size()).arg(LengthText(whole)));
         if (!m_import.map.error.isEmpty()) {
             Say(m_import.map.error, true);
         } else {
@@ -125,7 +119,7 @@ private:
         if (gap > std::max(across(here), across(there)))
             Say(Text::tr("These lines lie %1 away from the branches of the network: they may be in different "
                          "coordinate systems.")
-                    .arg(Length(std::round(gap))),
+                    .arg(LengthText(std::round(gap))),
                 true);
     }
 

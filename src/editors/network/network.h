@@ -41,9 +41,10 @@ struct CNetworkBranch
 struct CNetwork
 {
     std::vector<CNetworkBranch> branches;
-    QString system; // that the coordinates lie in, as "EPSG:25832" or in WKT; empty when the file names none
+    std::string system; // that the coordinates lie in, as "EPSG:25832" or in WKT; empty when the file names none
     UnknownNodes kept, keptTargets; // what the file says beyond that, and its other targets
 
+    QString System() const { return QString::fromStdString(system); }
     /// -1 for none.
     int FindBranch(const QString& name) const;
     /// Around all vertices; null without any.

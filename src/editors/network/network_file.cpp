@@ -1,49 +1,38 @@
 #include "editors/network/network_file.h"
 
+#include "editors/network/network_rules.h"
 #include "files/declared_section.h"
 #include "files/field_io.h"
 #include "ks/fc/branch_name.h"
 
 #include <QCoreApplication>
-#include <QSet>
 #include <algorithm>
 #include <iterator>
 
 namespace {
 
-struct NetworkFile
-{
-    Q_DECLARE_TR_FUNCTIONS(NetworkFile)
-};
-
 using U = UnitGroup;
 
 using N = CNetworkBranch;
+using W = CNetwork;
 
-/// A coordinate of a point, which gives it by a function.
-template <auto reach>
+/// The way from a point to a coordinate, which its class gives by a function.
+template <std::size_t index>
+struct CoordinateOf
+{
+    using Class = QPointF;
+    static constexpr auto& Of(auto& point) { return get<index>(point); }
+};
+template <std::size_t index>
 constexpr Field Coordinate(std::string_view name)
 {
-    return {.name = name,
-            .owner = &field_detail::Tag<QPointF>,
-            .address = [](void* point) -> void* { return &(static_cast<QPointF*>(point)->*reach)(); },
-            .constAddress = [](const void* point) -> const void* {
-                return &(static_cast<QPointF*>(const_cast<void*>(point))->*reach)();
-            },
-            .unit = U::Coordinate};
+    return field_detail::Declare<CoordinateOf<index>>(FieldKind::Number, name, U::Coordinate);
 }
 FieldList VertexFields()
 {
-    static constexpr auto fields = FieldsOf<QPointF>({Coordinate<&QPointF::rx>("x"), Coordinate<&QPointF::ry>("y")});
+    static constexpr auto fields = FieldsOf<QPointF>({Coordinate<0>("x"), Coordinate<1>("y")});
     return fields;
 }
-
-// What the file holds.
-struct FileNetwork
-{
-    std::string system;
-    CNetwork network; // all else
-};
 
 // The names of the file.
 constexpr const char *BranchSection = "Branch", *NameKeyword = "Name", *ChainageKeyword = "Chainage";
@@ -66,8 +55,8 @@ constexpr DeclaredKeyword branchKeywords[] = {
     {ChainageKeyword, endFields},
     {"FlowsDownstream", FieldList(branchFields).subspan(3), Presence::Optional}};
 
-constexpr auto coordinates = FieldsOf<FileNetwork>({Text<&FileNetwork::system>("CoordinateSystem")});
-constexpr Field branches = SectionGroup<&FileNetwork::network, &CNetwork::branches>(BranchSection);
+constexpr auto coordinates = FieldsOf<W>({Text<&W::system>("CoordinateSystem")});
+constexpr Field branches = SectionGroup<&W::branches>(BranchSection);
 constexpr DeclaredKeyword networkKeywords[] = {{"CoordinateSystem", coordinates, Presence::WhenSet}};
 constexpr DeclaredSection networkSections[] = {{.name = BranchSection,
                                                 .kept = Keeps<&N::kept>(),
@@ -76,40 +65,27 @@ constexpr DeclaredSection networkSections[] = {{.name = BranchSection,
                                                 .sectionCount = std::size(branchSections),
                                                 .each = &branches}};
 constexpr DeclaredFile file{{.name = "KVR_NETWORK",
-                             .kept = Keeps<&FileNetwork::network, &CNetwork::kept>(),
+                             .kept = Keeps<&W::kept>(),
                              .keywords = networkKeywords,
                              .sections = networkSections,
                              .sectionCount = std::size(networkSections)},
-                            Keeps<&FileNetwork::network, &CNetwork::keptTargets>()};
+                            Keeps<&W::keptTargets>()};
 
-/// Keys of the names that the file gives, and of those that branches have by now.
-struct Names
-{
-    QSet<QString> given, taken;
-};
+constexpr const char* NoName = "BRANCH"; // of a branch that the file does not name
 
-/// What a branch has to fulfil beside its declaration: it is made to, and that is reported.
-void Mend(CNetworkBranch& branch, Names& names, tqlHandle section, LoadReport& report)
+/// What a branch has to fulfil beside its declaration: it is made to, and that is reported. `met`: the branches before.
+void Mend(CNetworkBranch& branch, const QSet<QString>& met, CBranchNames& names, tqlHandle section, LoadReport& report)
 {
-    const QString given = branch.Name();
-    if (given.isEmpty() || names.taken.contains(KsBranchKey(given))) {
-        const QString wanted = given.isEmpty() ? QStringLiteral("BRANCH") : given;
-        QString free = wanted;
-        for (int number = 2; names.given.contains(KsBranchKey(free)) || names.taken.contains(KsBranchKey(free));
-             ++number)
-            free = QStringLiteral("%1-%2").arg(wanted).arg(number);
-        branch.name = free.toStdString();
-        ReportRule(report, section, NameKeyword, 1, ParamsText(nameField, &branch), [given] {
-            const QString taken = NetworkFile::tr("there is a branch \"%1\" already.");
-            return (given.isEmpty() ? NetworkFile::tr("expected the branch's name, Name = \"...\".") : taken.arg(given))
-                .toStdString();
-        });
-    }
-    names.taken.insert(KsBranchKey(branch.Name()));
-    if (branch.start == branch.end) {
-        branch.end += std::max(branch.Length(), 1.0);
-        ReportRule(report, section, ChainageKeyword, 1, ParamsText(endFields, &branch),
-                   [] { return NetworkFile::tr("the chainages of the two ends have to differ.").toStdString(); });
+    for (CBranchFault fault; (fault = FindFault(branch, met)).rule != CBranchFault::None;) {
+        const auto rule = [fault] { return fault.Text().toStdString(); };
+        if (fault.rule == CBranchFault::EndsDiffer) {
+            branch.end += std::max(branch.Length(), 1.0);
+            ReportRule(report, section, ChainageKeyword, 1, ParamsText(endFields, &branch), rule);
+            continue;
+        }
+        const QString wanted = fault.rule == CBranchFault::Named ? QString::fromLatin1(NoName) : fault.name;
+        branch.name = names.Take(wanted, QStringLiteral("%1-%2")).toStdString();
+        ReportRule(report, section, NameKeyword, 1, ParamsText(nameField, &branch), rule);
     }
 }
 
@@ -127,23 +103,21 @@ KVR_FIELDS(
 
 CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
 {
-    FileNetwork read;
-    ReadDeclared(structure, file, &read, report);
+    CNetwork network;
+    ReadDeclared(structure, file, &network, report);
     const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
-    CNetwork& network = read.network;
-    network.system = QString::fromStdString(read.system);
-    Names names;
-    for (const CNetworkBranch& branch : network.branches)
-        names.given.insert(KsBranchKey(branch.Name()));
+    CBranchNames names(network);
+    QSet<QString> met;
     for (std::size_t i = 0; i < network.branches.size(); ++i) {
-        network.branches[i].SortChannel();
-        Mend(network.branches[i], names, tqlSectionByNameNum(target, BranchSection, int(i) + 1), report);
+        CNetworkBranch& branch = network.branches[i];
+        branch.SortChannel();
+        Mend(branch, met, names, tqlSectionByNameNum(target, BranchSection, int(i) + 1), report);
+        met.insert(KsBranchKey(branch.Name()));
     }
-    return std::move(network);
+    return network;
 }
 
 Result<void> SaveNetwork(const CNetwork& network, const std::string& path)
 {
-    const FileNetwork written{network.system.toStdString(), network};
-    return SaveDeclared(path, file, &written);
+    return SaveDeclared(path, file, &network);
 }

@@ -1,6 +1,7 @@
 #include "editors/network/network_tables.h"
 
 #include "editors/network/document.h"
+#include "editors/network/network_rules.h"
 #include "grid/field_columns.h"
 #include "grid/vector_rows.h"
 #include "ks/fc/branch_name.h"
@@ -15,6 +16,13 @@ struct NetworkTables
 {
     Q_DECLARE_TR_FUNCTIONS(NetworkTables)
 };
+
+/// What stands behind a place in a report, for a message of its own.
+QString Sentence(QString text)
+{
+    text.front() = text.front().toUpper();
+    return text;
+}
 
 class CBranchRows : public VectorRows<CNetworkBranch>
 {
@@ -32,14 +40,9 @@ public:
         }
         for (std::size_t i = 0; i < rows.Count(); ++i) {
             const auto& branch = *static_cast<const CNetworkBranch*>(rows.At(i));
-            const QString key = KsBranchKey(branch.Name());
-            if (key.isEmpty())
-                return Fault{i, NetworkTables::tr("A branch needs a name.")};
-            if (taken.contains(key))
-                return Fault{i, NetworkTables::tr("There is a branch \"%1\" already.").arg(branch.Name())};
-            if (branch.start == branch.end)
-                return Fault{i, NetworkTables::tr("The chainages of the two ends of a branch have to differ.")};
-            taken.insert(key);
+            if (const CBranchFault fault = ::FindFault(branch, taken); fault.rule != CBranchFault::None)
+                return Fault{i, Sentence(fault.Text())};
+            taken.insert(KsBranchKey(branch.Name()));
         }
         return std::nullopt;
     }

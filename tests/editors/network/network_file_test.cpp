@@ -3,6 +3,9 @@
 #include "sample_network.h"
 #include "sample_river.h"
 
+#include <chrono>
+#include <set>
+
 namespace {
 
 using testing::HasSubstr;
@@ -57,6 +60,7 @@ TEST_F(NetworkTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
     const Case cases[] = {
         {"Name = \"MAIN\"", "Title = \"MAIN\"", "3 Name:  -> \"BRANCH\""},
         {"Name = \"SIDE\"", "Name = \"\"", "26 Name: \"\" -> \"BRANCH\""},
+        {"Name = \"SIDE\"", "Name = \" \u200e\"", "26 Name: \" \u200e\" -> \"BRANCH\""}, // nobody sees it
         {"Name = \"SIDE\"", "Name = \"Main\"", "26 Name: \"Main\" -> \"Main-2\""},
         {"    Chainage = 1000, 8000\n", "", "3 Chainage:  -> 0, 7000"},
         {"Chainage = 1000, 8000", "Chainage = 1000", "5 Chainage: 1000 -> 0"},
@@ -85,6 +89,23 @@ TEST_F(NetworkTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
         const bool twice = QByteArray(each.to).contains("[Line]") || QByteArray(each.to).contains("= false");
         EXPECT_EQ(ReadNetwork(folder.filePath("mended.kvnw"), network).isEmpty(), !twice) << "what repeats is kept";
     }
+}
+
+TEST_F(NetworkTest, ManyBranchesOfOneNameAreToldApartAtOnce)
+{
+    constexpr int count = 20000;
+    QByteArray text = "[KVR_NETWORK]\n";
+    for (int i = 0; i < count; ++i)
+        text += i % 2 ? "[Branch]\nName = \"A\"\n[/Branch]\n" : "[Branch]\n[/Branch]\n";
+    CNetwork network;
+    const auto start = std::chrono::steady_clock::now();
+    EXPECT_NE(ReadNetwork(Write("many.kvnw", text + "[/KVR_NETWORK]\n"), network), "");
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(10));
+    std::set<std::string> names;
+    for (const CNetworkBranch& branch : network.branches)
+        names.insert(branch.name);
+    EXPECT_EQ(names.size(), std::size_t(count));
+    EXPECT_TRUE(names.contains("A-10000") && names.contains("BRANCH-10000"));
 }
 
 TEST_F(NetworkTest, AFileWithFaultsOpensUnderABarAndIsKeptWhenSavedOver)

@@ -568,34 +568,22 @@
     </message>
 </context>
 <context>
-    <name>NetworkFile</name>
+    <name>NetworkRules</name>
+    <message>
+        <source>a branch needs a name.</source>
+        <translation>河川には名前が必要です。</translation>
+    </message>
     <message>
         <source>there is a branch &quot;%1&quot; already.</source>
         <translation>河川「%1」はすでにあります。</translation>
     </message>
     <message>
-        <source>expected the branch&apos;s name, Name = &quot;...&quot;.</source>
-        <translation>河川名 Name = &quot;...&quot; が必要です。</translation>
-    </message>
-    <message>
-        <source>the chainages of the two ends have to differ.</source>
-        <translation>両端の追加距離は異なる値でなければなりません。</translation>
+        <source>the chainages of the two ends of a branch have to differ.</source>
+        <translation>河川の両端の追加距離は異なる値でなければなりません。</translation>
     </message>
 </context>
 <context>
     <name>NetworkTables</name>
-    <message>
-        <source>A branch needs a name.</source>
-        <translation>河川名を入力してください。</translation>
-    </message>
-    <message>
-        <source>There is a branch &quot;%1&quot; already.</source>
-        <translation>河川「%1」はすでにあります。</translation>
-    </message>
-    <message>
-        <source>The chainages of the two ends of a branch have to differ.</source>
-        <translation>河川の両端の追加距離は異なる値にしてください。</translation>
-    </message>
     <message>
         <source>There is a line at this chainage already.</source>
         <translation>この追加距離の行はすでにあります。</translation>
