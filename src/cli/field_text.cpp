@@ -26,17 +26,6 @@ std::string DateText(const HDDateTime& d)
     return text;
 }
 
-/// Text of a field that is no group.
-std::string ScalarText(const Field& field, const void* object)
-{
-    return Visit(field, object,
-                 Overloads{[](bool value) { return std::string(value ? "true" : "false"); },
-                           [](const std::string& value) { return value; },
-                           [](const HDDateTime& value) { return DateText(value); },
-                           [](GroupValue<const void>) { return std::string(); },
-                           [](auto value) { return Shortest(value); }});
-}
-
 std::string JsonElement(FieldList fields, const void* element)
 {
     if (fields.size() == 1)
@@ -153,19 +142,21 @@ private:
 
 std::string CellText(const Field& field, const void* object)
 {
-    if (field.kind != FieldKind::Group)
-        return ScalarText(field, object);
-    const auto group = field.GroupIn(object);
-    std::string text;
-    for (std::size_t i = 0; i < group.size(); ++i) {
-        text += i ? "; " : "";
-        const FieldList parts = group.Elements();
-        for (const Field& part : parts) {
-            text += &part == parts.data() ? "" : " ";
-            text += ScalarText(part, group[i]);
-        }
-    }
-    return text;
+    return Visit(field, object,
+                 Overloads{[](bool value) { return std::string(value ? "true" : "false"); },
+                           [](const std::string& value) { return value; },
+                           [](const HDDateTime& value) { return DateText(value); },
+                           [](GroupValue<const void> group) {
+                               std::string text;
+                               for (std::size_t i = 0; i < group.size(); ++i) {
+                                   text += i ? "; " : "";
+                                   const FieldList parts = group.Elements();
+                                   for (const Field& part : parts)
+                                       text += (&part == parts.data() ? "" : " ") + CellText(part, group[i]);
+                               }
+                               return text;
+                           },
+                           [](auto value) { return Shortest(value); }});
 }
 
 std::string JsonText(const Field& field, const void* object)
@@ -173,14 +164,14 @@ std::string JsonText(const Field& field, const void* object)
     return Visit(field, object,
                  Overloads{[](double value) { return std::isfinite(value) ? Shortest(value) : "null"; },
                            [](std::int32_t value) { return Shortest(value); },
-                           [&](bool) { return ScalarText(field, object); },
+                           [&](bool) { return CellText(field, object); },
                            [](GroupValue<const void> group) {
                                std::string text = "[";
                                for (std::size_t i = 0; i < group.size(); ++i)
                                    text += (i ? ", " : "") + JsonElement(group.Elements(), group[i]);
                                return text + ']';
                            },
-                           [&](const auto&) { return JsonString(ScalarText(field, object)); }});
+                           [&](const auto&) { return JsonString(CellText(field, object)); }});
 }
 
 std::string JsonString(std::string_view text)
@@ -212,7 +203,7 @@ std::vector<std::string> ParamTexts(FieldList fields, const void* object)
                             for (const std::int32_t part : {d.Year, d.Month, d.Day, d.Hour, d.Minute, d.Second})
                                 texts.push_back(Shortest(part));
                         },
-                        [&](const auto&) { texts.push_back(ScalarText(field, object)); }});
+                        [&](const auto&) { texts.push_back(CellText(field, object)); }});
     return texts;
 }
 

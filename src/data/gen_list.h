@@ -108,7 +108,6 @@ public:
     {
     }
 
-    const std::string& OuterSectionName() const { return m_outerSection; }
     const std::string& InnerSectionName() const { return m_innerSection; }
     std::size_t GetCount() const { return m_lists.size(); }
     bool IsEmpty() const { return m_lists.empty(); }

@@ -105,7 +105,7 @@ CellReading ReadCell(const ColumnSpec& column, const QString& text)
     if (!number)
         return {{}, GridTexts::tr("Floating point number required")};
     const double value = column.style.UnitConvertFromBase(*number, 0);
-    if (!column.IsAllowed(value))
+    if (!column.bounds.Allow(value))
         return {{}, OutOfRange()};
     return {value, {}};
 }

@@ -114,14 +114,6 @@ CellValue ColumnSpec::NewLineValue() const
     return emptyIsNotGiven ? CellValue(NotGiven) : CellValue();
 }
 
-QString ColumnSpec::Allowed() const
-{
-    const auto text = [this](std::optional<double> bound) {
-        return bound ? KsShortestNumber(style.UnitConvertFromBase(*bound, 1)) : QString();
-    };
-    return AllowedRange(text(minimum), text(maximum));
-}
-
 QString ColumnSpec::ToolTip(bool isHeader) const
 {
     const QString unitTip = UnitToolTip(UnitSymbol());

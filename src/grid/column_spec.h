@@ -2,6 +2,7 @@
 #pragma once
 
 #include "files/field.h"
+#include "grid/bounds.h"
 #include "ks/units/edit_style.h"
 
 #include <QStringList>
@@ -120,9 +121,9 @@ struct ColumnSpec
 
     // What follows from the field.
     GridControl control = Control::Number;
-    CKsEditStyle style = {};                          // unit group and format
-    std::optional<double> minimum = {}, maximum = {}; // of a number, base units
-    bool isRequired = false;                          // an empty cell is refused
+    CKsEditStyle style = {}; // unit group and format
+    Bounds bounds = {};      // of a number
+    bool isRequired = false; // an empty cell is refused
     std::shared_ptr<const CellAccess> access = {};
 
     CellKind Kind() const { return control.kind; }
@@ -137,9 +138,6 @@ struct ColumnSpec
     /// What a new line holds; nothing where the record's own default stands.
     CellValue NewLineValue() const;
     QString UnitSymbol() const { return unitText ? unitText() : style.UnitSymbol(); }
-    /// "at least 0", in the user's unit; empty without bounds.
-    QString Allowed() const;
-    bool IsAllowed(double value) const { return !(minimum && value < *minimum) && !(maximum && value > *maximum); }
     /// Unit of the cells, and on a header also what the column is.
     QString ToolTip(bool header) const;
 };

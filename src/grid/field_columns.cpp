@@ -72,8 +72,7 @@ FieldColumns& FieldColumns::Add(const Field& field, CellAccess access, ColumnSpe
     column.style = CKsEditStyle(field.unit);
     if (field.digits)
         column.style.SetFormat(QStringLiteral("%.%1lg").arg(field.digits));
-    column.minimum = field.minimum;
-    column.maximum = field.maximum;
+    column.bounds = {field.minimum, field.maximum};
     if (m_style.besideAPicture) {
         column.width = 0;
         column.isRequired = column.Kind() == CellKind::Number && !column.emptyIsNotGiven;

@@ -23,7 +23,6 @@ public:
     void SetHost(IGridHost* host) { m_host = host; }
     IGridHost* Host() const { return m_host; }
     CGridModel* Model() const { return m_model; }
-    CGridDelegate* Delegate() const { return m_delegate; }
     CGridInput& Input() const { return *m_input; }
     CGridWidths& Widths() const { return *m_widths; }
 

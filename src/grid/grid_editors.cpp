@@ -251,7 +251,8 @@ bool CGridDelegate::Commit()
     const QScopedValueRollback telling(m_telling, true);
     const ColumnSpec& column = m_grid->Model()->Column(m_index.column());
     const QString place = GridTexts::tr("%1, line %2").arg(column.header()).arg(m_index.row() + 1);
-    TellRefusal(*editor, refusal, RefusalDetails(place, TextOf(editor), column.Allowed(), column.UnitSymbol()));
+    TellRefusal(*editor, refusal,
+                RefusalDetails(place, TextOf(editor), column.bounds.Text(column.style), column.UnitSymbol()));
     return false;
 }
 

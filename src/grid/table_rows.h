@@ -29,7 +29,6 @@ public:
     int StoredRows() const { return m_rows ? int(m_rows->Count()) : 0; }
     /// Rows at the top that are no lines of the table.
     int FixedRows() const { return m_rows ? int(m_rows->FixedRows()) : 0; }
-    bool HasPending() const { return !m_pending.empty(); }
 
     /// What the cell holds, typed or stored.
     CellValue Value(int row, int column) const;

@@ -72,15 +72,6 @@ QString OutOfRange()
     return GridTexts::tr("Floating-point value is out of range");
 }
 
-QString AllowedRange(const QString& minimum, const QString& maximum)
-{
-    if (!minimum.isEmpty() && !maximum.isEmpty())
-        return GridTexts::tr("%1 to %2").arg(minimum, maximum);
-    return !minimum.isEmpty()   ? GridTexts::tr("at least %1").arg(minimum)
-           : !maximum.isEmpty() ? GridTexts::tr("at most %1").arg(maximum)
-                                : QString();
-}
-
 CTyping::CTyping(QLineEdit* field, TypedField what) : QObject(field), m_field(field), m_what(std::move(what))
 {
     field->installEventFilter(this);

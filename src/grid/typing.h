@@ -17,8 +17,6 @@ QString RefusalDetails(const QString& place, const QString& typed, const QString
 void DropLineEnds(QWidget& widget);
 /// Why a number that is out of these bounds is not taken.
 QString OutOfRange();
-/// "0.5 to 1", "at least 0" and so on; a bound may be empty.
-QString AllowedRange(const QString& minimum, const QString& maximum);
 
 /// Whether a field or cell that loses the focus for this reason is still being edited: another window, a menu or a
 /// list that it opened is in front for a while.

@@ -93,11 +93,13 @@ CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Par
 {
     m_ui.grid_1074->SetLineChoice(LineChoice::CurrentLine);
     Grid(m_ui.grid_1074).BranchName({.width = 71}).Chainage({.width = 71});
+    const auto element = [this](const auto& group) -> const Field& {
+        return Bindings().Declaration(&group).group->elements()[0];
+    };
     RowsGrid(m_ui.titles_1075, MakeMarkTitleRows(*document))
-        .Value(TitleAccess(), {.name = "Title", .kind = FieldKind::Text},
+        .Value(TitleAccess(), element(Globals().MarkTitles),
                {.caption = Str::MarkTitle, .width = 300, .upperCase = true})
-        .Value(InterpolateAccess(), {.name = "Interpolate", .kind = FieldKind::Boolean},
-               {.caption = Str::MarkInterpolate, .width = 50});
+        .Value(InterpolateAccess(), element(Globals().MarkInterpolate), {.caption = Str::MarkInterpolate, .width = 50});
     Bindings().Always([this] { ShowLevelColumns(); });
     // With an untitled column go its levels.
     LeaveOut({{m_ui.titles_1075, &IsUntitled}}, m_ui.status_1076, Str::MarksWithoutTitle, Str::DroppedTitle,
@@ -111,10 +113,11 @@ void CWLMarkPage::ShowLevelColumns()
     const std::size_t shown = std::max<std::size_t>(titles.size(), 1); // the row that stands for no titles, too
     CGridModel& model = *GetGrid()->Model();
     model.RemoveColumnsFrom(LocationColumns + int(shown));
+    const Field& level = HDWLMark::DeclaredFields()[0].group->elements()[0];
     GridColumns columns(*GetGrid());
     for (auto title = std::size_t(model.columnCount() - LocationColumns); title < shown; ++title)
         columns.Value(
-            LevelAccess(title), {.name = "Level", .unit = UnitGroup::WaterLevel},
+            LevelAccess(title), level,
             {.header = [&titles,
                         title] { return title < titles.size() ? QString::fromStdString(titles[title]) : QString(); },
              .width = 62,

@@ -2,8 +2,6 @@
 // hears.
 #pragma once
 
-#include "grid/gen_grid.h"
-#include "grid/grid_editors.h"
 #include "grid/row_commands.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/exchange.h"
@@ -13,6 +11,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/project_doc.h"
 #include "ks/units/edit_style.h"
+#include "open_editor.h"
 
 #include <QComboBox>
 #include <QFile>
@@ -138,7 +137,7 @@ protected:
         table->setFocus();
         table->SetCurrentCell(row + 1, column + 1);
         QTest::keyClick(table, Qt::Key_F2);
-        QWidget* editor = table->Delegate()->Editor();
+        QWidget* editor = OpenEditor(*table);
         if (auto* field = qobject_cast<QLineEdit*>(editor)) {
             field->selectAll();
             field->insert(text);

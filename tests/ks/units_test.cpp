@@ -3,7 +3,6 @@
 #include <QSignalSpy>
 #include <cmath>
 #include <gtest/gtest.h>
-#include <set>
 #include <udunits2.h>
 
 namespace {
@@ -22,11 +21,15 @@ TEST_F(Units, EveryRowConvertsThereAndBackAndMetricIsWhatIsStored)
     ut_set_error_message_handler(ut_ignore);
     ut_system* system = ut_read_xml(nullptr);
     ASSERT_TRUE(system);
-    std::set<UnitGroup> numbers;
-    for (const KsUnitGroupRow& row : KsUnitGroups()) {
+    int rows = 0;
+    for (int number = 100000; number < 101000; ++number) {
+        const KsUnitGroupRow* found = KsFindUnitGroup(UnitGroup(number));
+        if (!found)
+            continue;
+        const KsUnitGroupRow& row = *found;
         SCOPED_TRACE(row.quantity);
-        EXPECT_TRUE(numbers.insert(row.group).second);
-        EXPECT_EQ(KsFindUnitGroup(row.group), &row);
+        ++rows;
+        EXPECT_EQ(row.group, UnitGroup(number));
         const bool open = !row.base.spelling;
         for (const KsUnit& unit : {row.base, row.usCustomary}) {
             ASSERT_EQ(unit.spelling == nullptr, open) << "a group is known in all units or in none";
@@ -49,6 +52,7 @@ TEST_F(Units, EveryRowConvertsThereAndBackAndMetricIsWhatIsStored)
         for (const double value : {0.1, 1.0 / 3, 12345.678})
             EXPECT_EQ(style.UnitConvertFromBase(value, 1), value) << "to the last bit";
     }
+    EXPECT_EQ(rows, 19);
     ut_free_system(system);
 }
 

@@ -1,9 +1,8 @@
 #include "random_user.h"
 
-#include "grid/gen_grid.h"
-#include "grid/grid_editors.h"
 #include "module/data_tables.h"
 #include "module/sheet.h"
+#include "open_editor.h"
 #include "pages/framework/page.h"
 
 #include <QAbstractButton>
@@ -140,13 +139,13 @@ void RandomUser::TypeIntoCell()
     m_done = "type '" + text + "' into " + where;
     if (text.isEmpty()) {
         Press(Qt::Key_F2);
-        if (!grid->Delegate()->Editor())
+        if (!OpenEditor(*grid))
             return;
         Press(Qt::Key_A, Qt::ControlModifier);
         Press(Qt::Key_Backspace);
     } else {
         PressKeys(text);
-        if (!grid->Delegate()->Editor())
+        if (!OpenEditor(*grid))
             return; // locked
     }
     const CellKind kind = grid->Model()->Columns()[std::size_t(cell.column())].Kind();

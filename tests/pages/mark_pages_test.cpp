@@ -84,8 +84,8 @@ TEST_F(MarkPagesTest, TitlesAndLevelsStayInStep)
     EXPECT_EQ(Levels(), "3 | 1 - 2") << "a list that ends before the column is left as it is";
     // Typed in lower case it stands in upper case, in the cell and above the column.
     QTest::keyClicks(&titles, "m");
-    QTest::keyClicks(titles.Delegate()->Editor(), "id");
-    QTest::keyClick(titles.Delegate()->Editor(), Qt::Key_Return);
+    QTest::keyClicks(OpenEditor(titles), "id");
+    QTest::keyClick(OpenEditor(titles), Qt::Key_Return);
     titles.StoreEditedLine();
     EXPECT_EQ(titles.TextAt(2, 1), "MID");
     EXPECT_EQ(Headers(), QStringList({"LOW", "MID", "HIGH"}));
@@ -135,7 +135,7 @@ TEST_F(MarkPagesTest, InterpolateIsAClickOnItsBox)
     EXPECT_TRUE(Text() == before) << "and the list of flags is as short as it was";
     // Keys that would open an editor elsewhere do nothing here.
     QTest::keyClick(&titles, Qt::Key_A);
-    EXPECT_FALSE(titles.Delegate()->Editor());
+    EXPECT_FALSE(OpenEditor(titles));
     EXPECT_TRUE(Text() == before);
 }
 
@@ -151,7 +151,7 @@ TEST_F(MarkPagesTest, ATitleWithoutTextIsLeftOutOfTheFile)
     EXPECT_EQ(document.UndoStack().count(), 0);
     titles.setFocus();
     QTest::keyClick(&titles, Qt::Key_F);
-    QTest::keyClick(titles.Delegate()->Editor(), Qt::Key_Return);
+    QTest::keyClick(OpenEditor(titles), Qt::Key_Return);
     titles.StoreEditedLine();
     titles.setFocus();
     QTest::keyClick(&titles, Qt::Key_Insert); // a second one, never named

@@ -1,8 +1,8 @@
 // A page in an active window, hosted as the program's view hosts it, with recorded calls and message boxes.
 #pragma once
 
-#include "grid/grid_editors.h"
 #include "ks/fc/message_box.h"
+#include "open_editor.h"
 #include "pages/framework/location_page.h"
 
 #include <QComboBox>
@@ -165,7 +165,7 @@ protected:
         Type(row, column, text);
         QTest::keyClick(Editor(), Qt::Key_Return);
     }
-    QWidget* Editor() const { return grid->Delegate()->Editor(); }
+    QWidget* Editor() const { return OpenEditor(*grid); }
     std::pair<int, int> Current() const { return {grid->CurrentRow(), grid->CurrentColumn()}; }
     void SelectRows(int first, int last) { grid->SelectLines(first, last); }
 

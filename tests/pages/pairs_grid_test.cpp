@@ -37,8 +37,8 @@ protected:
         into->setFocus();
         for (const char* text : texts) {
             QTest::keyClicks(into, QString(text[0]));
-            QTest::keyClicks(into->Delegate()->Editor(), text + 1);
-            QTest::keyClick(into->Delegate()->Editor(), Qt::Key_Tab);
+            QTest::keyClicks(OpenEditor(*into), text + 1);
+            QTest::keyClick(OpenEditor(*into), Qt::Key_Tab);
         }
     }
     void UndoAll()
@@ -136,13 +136,13 @@ TEST_F(PairsGridTest, AWrongNumberKeepsTheLine)
     line->setFocus();
     line->SetCurrentCell(1, 2);
     QTest::keyClick(line, '1');
-    QTest::keyClicks(line->Delegate()->Editor(), ".");
+    QTest::keyClicks(OpenEditor(*line), ".");
     QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, grid->visualRect(grid->model()->index(1, 0)).center());
     EXPECT_EQ(boxes, QStringList("Floating point number required"));
     EXPECT_EQ(grid->CurrentRow(), 1);
-    ASSERT_TRUE(line->Delegate()->Editor());
+    ASSERT_TRUE(OpenEditor(*line));
     QTest::qWait(0);
-    QTest::keyClicks(line->Delegate()->Editor(), "5");
+    QTest::keyClicks(OpenEditor(*line), "5");
     grid->GotoLine(2); // as the menu does: what is typed still goes to its own line
     EXPECT_EQ(Pairs(list.GetAt(0).VeloRes), "0.5 1.5");
     EXPECT_EQ(Pairs(list.GetAt(1).VeloRes), "2 30");

@@ -42,7 +42,6 @@ public:
     CKsEditStyle() = default;
     explicit CKsEditStyle(UnitGroup group, const char* format = "%-lf") : m_group(group), m_format(format) {}
 
-    UnitGroup GetEumUnitBaseGroup() const { return m_group; }
     /// `unit` -1 takes the display unit of the user's unit system, 0 the base unit itself.
     void SetEumUnitBaseGroup(UnitGroup group, int unit = -1);
     /// A printf format for one double ("%-lf", "%.6lg", "%-.3E"). The C locale plays no part.

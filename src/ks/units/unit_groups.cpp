@@ -3,6 +3,7 @@
 #include <QDebug>
 #include <algorithm>
 #include <array>
+#include <functional>
 #include <memory>
 #include <udunits2.h>
 
@@ -40,6 +41,9 @@ constexpr std::array Groups{
     KsUnitGroupRow{UnitGroup::LightAttenuation, "light attenuation", PerMetre, PerFoot},
     KsUnitGroupRow{UnitGroup::LeakageCoefficient, "leakage coefficient", AsStored, AsStored},
 };
+
+static_assert(std::ranges::adjacent_find(Groups, std::ranges::greater_equal{}, &KsUnitGroupRow::group) == Groups.end(),
+              "one row a group, by number");
 
 /// Nothing to convert: one spelling, or none at all.
 bool IsSame(const KsUnit& base, const KsUnit& display)
@@ -81,11 +85,6 @@ std::array<double, Groups.size()> Factors()
 }
 
 } // namespace
-
-std::span<const KsUnitGroupRow> KsUnitGroups()
-{
-    return Groups;
-}
 
 const KsUnitGroupRow* KsFindUnitGroup(UnitGroup group)
 {

@@ -5,8 +5,6 @@
 #include "ks/ks_export.h"
 #include "ks/units/edit_style.h"
 
-#include <span>
-
 /// A unit: how UDUNITS spells it, and how the user reads it.
 struct KsUnit
 {
@@ -23,7 +21,6 @@ struct KsUnitGroupRow
     const KsUnit& Display(KsUnitSystem system) const { return system == KsUnitSystem::Metric ? base : usCustomary; }
 };
 
-KS_API std::span<const KsUnitGroupRow> KsUnitGroups();
 /// Null for UnitGroup::None and numbers that no row has.
 KS_API const KsUnitGroupRow* KsFindUnitGroup(UnitGroup group);
 /// Between a group's base unit and its display unit: base = display * factor. No quantity has an offset. Computed once;

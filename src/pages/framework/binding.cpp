@@ -48,7 +48,6 @@ void SetAccessibleName(QWidget& widget, const QString& name)
         widget.setAccessibleName(name);
 }
 
-/// One that says nothing for a value that is none of the global ones.
 const Field& CBindings::Declaration(const void* value) const
 {
     static constexpr Field none;

@@ -75,6 +75,8 @@ public:
     bool Take();
     /// Likewise while the page stays: a text that may wait for the page is let be.
     bool TakeField();
+    /// How the value at this address is declared; says nothing for one that is none of the global ones.
+    const Field& Declaration(const void* value) const;
     /// The control of the value at this address, of several one that can be used now; null for a value of other pages.
     QWidget* ControlFor(const void* value) const;
 
@@ -92,7 +94,6 @@ private:
     void AddTyped(QLineEdit* field, const void* value, TypedField what);
     template <typename T>
     void Store(T& target, T value);
-    const Field& Declaration(const void* value) const;
     void AddLabel(QWidget* control, const void* value, std::function<Str()> title = {});
     void AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets, void (QWidget::*apply)(bool));
 

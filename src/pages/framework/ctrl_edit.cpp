@@ -20,7 +20,7 @@ CCtrlEdit::CCtrlEdit(QWidget* parent)
       m_typing(new CTyping(this, {.complaint = [this] { return Complaint(); },
                                   .store = [this] { Store(); },
                                   .show = [this] { ShowValue(); },
-                                  .allowed = [this] { return Allowed(); },
+                                  .allowed = [this] { return m_bounds.Text(m_style); },
                                   .unit = [this] { return UnitSymbol(); }}))
 {
     setAlignment(Qt::AlignRight);
@@ -31,8 +31,7 @@ void CCtrlEdit::Setup(const double& value, const Field& declared, std::function<
 {
     m_style = CKsEditStyle(declared.unit);
     m_style.SetFormat(QStringLiteral("%.%1g").arg(declared.digits ? declared.digits : UsualDigits));
-    m_minimum = declared.minimum;
-    m_maximum = declared.maximum;
+    m_bounds = {declared.minimum, declared.maximum};
     m_store = std::move(store);
     m_value = &value;
     ShowValue();
@@ -67,14 +66,8 @@ void CCtrlEdit::UpdateToolTip()
 
 std::optional<double> CCtrlEdit::Typed() const
 {
-    const std::string typed = text().toStdString();
-    const auto number = IsValidNumber(typed) ? ReadNumber(typed) : std::nullopt;
+    const auto number = ReadNumber(text().toStdString());
     return number ? std::optional(m_style.UnitConvertFromBase(*number, 0)) : std::nullopt;
-}
-
-bool CCtrlEdit::InRange(double value) const
-{
-    return !(m_minimum && value < *m_minimum) && !(m_maximum && value > *m_maximum);
 }
 
 /// An empty text is none: the value stays.
@@ -85,15 +78,7 @@ QString CCtrlEdit::Complaint() const
     if (!IsValidNumber(text().toStdString()))
         return LoadString(Str::InvalidNumber);
     const auto value = Typed();
-    return value && InRange(*value) ? QString() : OutOfRange();
-}
-
-QString CCtrlEdit::Allowed() const
-{
-    const auto bound = [this](const std::optional<double>& value) {
-        return value ? KsShortestNumber(m_style.UnitConvertFromBase(*value, 1)) : QString();
-    };
-    return AllowedRange(bound(m_minimum), bound(m_maximum));
+    return value && m_bounds.Allow(*value) ? QString() : OutOfRange();
 }
 
 void CCtrlEdit::Store()

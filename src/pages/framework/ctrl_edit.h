@@ -2,6 +2,7 @@
 #pragma once
 
 #include "files/field.h"
+#include "grid/bounds.h"
 #include "grid/typing.h"
 #include "ks/units/edit_style.h"
 
@@ -38,13 +39,11 @@ private:
     void UpdateToolTip();
     void Store();
     std::optional<double> Typed() const; // in base units; nothing for a text that is no number
-    bool InRange(double value) const;
     QString Complaint() const;
-    QString Allowed() const;
 
     CKsEditStyle m_style;
     const double* m_value = nullptr;
-    std::optional<double> m_minimum, m_maximum; // of what may be typed, in base units
+    Bounds m_bounds;
     std::function<void(double)> m_store;
     std::function<QString()> m_unitText;
     QString m_shown;   // the value as text

@@ -7,18 +7,13 @@
 #include <QLabel>
 #include <QUndoStack>
 
-static QString TextOf(const TextLine& line)
-{
-    const QString text = LoadString(line.text);
-    return line.line == TextLine::Whole ? text : text.split(u'\n').value(line.line);
-}
-
 std::function<QString()> LineOf(Str text, int line)
 {
-    return [text, line] { return TextOf({text, line}); };
+    return [text, line] { return LoadLine(text, line); };
 }
 
-static constexpr TableStyle OnPages{&TextOf, Str::GlobalRow};
+static constexpr TableStyle OnPages{[](const TextLine& line) { return LoadLine(line.text, line.line); },
+                                    Str::GlobalRow};
 
 GridColumns::GridColumns(CGenGrid& grid, const void* globals) : FieldColumns(*grid.Model(), OnPages, globals) {}
 

@@ -366,22 +366,6 @@
         <translation>テキストファイルの設定</translation>
     </message>
     <message>
-        <source>&amp;Minimum</source>
-        <translation>最小値(&amp;M)</translation>
-    </message>
-    <message>
-        <source>Ma&amp;ximum</source>
-        <translation>最大値(&amp;X)</translation>
-    </message>
-    <message>
-        <source>Time &amp;of minimum</source>
-        <translation>最小値の時刻(&amp;O)</translation>
-    </message>
-    <message>
-        <source>&amp;Time of maximum</source>
-        <translation>最大値の時刻(&amp;T)</translation>
-    </message>
-    <message>
         <source>Time period in output</source>
         <translation>出力期間</translation>
     </message>
