@@ -7,6 +7,7 @@
 
 #include <QCoreApplication>
 #include <algorithm>
+#include <cmath>
 #include <iterator>
 
 namespace {
@@ -73,13 +74,24 @@ constexpr DeclaredFile file{{.name = "KVR_NETWORK",
 
 constexpr const char* NoName = "BRANCH"; // of a branch that the file does not name
 
+/// It ends as much further as it is long; where numbers are too large to tell the two apart, it begins at 0.
+void SetEndsApart(CNetworkBranch& branch)
+{
+    const double length = branch.Length(), room = std::isfinite(length) ? std::max(length, 1.0) : 1.0;
+    branch.end = branch.start + room;
+    if (branch.end == branch.start || !std::isfinite(branch.end)) {
+        branch.start = 0;
+        branch.end = room;
+    }
+}
+
 /// What a branch has to fulfil beside its declaration: it is made to, and that is reported. `met`: the branches before.
 void Mend(CNetworkBranch& branch, const QSet<QString>& met, CBranchNames& names, tqlHandle section, LoadReport& report)
 {
     for (CBranchFault fault; (fault = FindFault(branch, met)).rule != CBranchFault::None;) {
         const auto rule = [fault] { return fault.Text().toStdString(); };
         if (fault.rule == CBranchFault::EndsDiffer) {
-            branch.end += std::max(branch.Length(), 1.0);
+            SetEndsApart(branch);
             ReportRule(report, section, ChainageKeyword, 1, ParamsText(endFields, &branch), rule);
             continue;
         }

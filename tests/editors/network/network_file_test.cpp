@@ -65,6 +65,7 @@ TEST_F(NetworkTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
         {"    Chainage = 1000, 8000\n", "", "3 Chainage:  -> 0, 7000"},
         {"Chainage = 1000, 8000", "Chainage = 1000", "5 Chainage: 1000 -> 0"},
         {"Chainage = 1000, 8000", "Chainage = 8, 8.0", "5 Chainage: 8, 8.0 -> 8, 7008"},
+        {"Chainage = 1000, 8000", "Chainage = 1e300, 1e300", "5 Chainage: 1e300, 1e300 -> 0, 7000"},
         {"FlowsDownstream = true", "FlowsDownstream = 1", "6 FlowsDownstream: 1 -> true"},
         {"FlowsDownstream = true", "FlowsDownstream = true\n    FlowsDownstream = false",
          "7 FlowsDownstream: false -> "},
