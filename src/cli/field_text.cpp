@@ -152,7 +152,7 @@ std::string CellText(const Field& field, const void* object)
                                    text += i ? "; " : "";
                                    const FieldList parts = group.Elements();
                                    for (const Field& part : parts)
-                                       text += (&part == parts.data() ? "" : " ") + CellText(part, group[i]);
+                                       text.append(&part == parts.data() ? "" : " ").append(CellText(part, group[i]));
                                }
                                return text;
                            },
