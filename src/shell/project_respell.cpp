@@ -35,13 +35,16 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
     if (!structure)
         return {};
     ProjectFile project;
-    LoadReport unused(structure.value().Get());
-    ReadDeclared(structure.value().Get(), DeclaredProjectFile(), &project, unused);
+    LoadReport report(structure.value().Get());
+    ReadDeclared(structure.value().Get(), DeclaredProjectFile(), &project, report);
     const QDir folder = QFileInfo(projectPath).absoluteDir();
-    for (std::size_t i = 0; i < project.members.size(); ++i) {
-        if (project.members[i].PathIn(folder) != QDir::cleanPath(path))
+    int number = 0; // of the keyword: an entry that is none is no member
+    for (const ProjectMember& member : project.members) {
+        while (report.IsLeftOut(MemberKeyword(structure.value().Get(), ++number))) {
+        }
+        if (member.PathIn(folder) != QDir::cleanPath(path))
             continue;
-        const tqlHandle param = tqlParamByNum(MemberKeyword(structure.value().Get(), int(i) + 1), 1);
+        const tqlHandle param = tqlParamByNum(MemberKeyword(structure.value().Get(), number), 1);
         const auto length = qsizetype(tqlGetRawParam(param).size()) - 1 - QFileInfo(path).suffix().size();
         offsets << OffsetOf(text, tqlGetPosition(structure.value().Get(), param)) + length;
     }
