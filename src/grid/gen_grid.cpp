@@ -16,6 +16,18 @@
 #include <QPainter>
 #include <algorithm>
 
+namespace {
+
+/// Whether a press at `x` of the header drags a border between columns: the header's own rule, which it does not tell.
+bool IsColumnBorder(const QHeaderView& header, int x)
+{
+    const int column = header.logicalIndexAt(x), grip = header.style()->pixelMetric(QStyle::PM_HeaderGripMargin);
+    const int within = x - header.sectionViewportPosition(column);
+    return column >= 0 && ((within < grip && column > 0) || within > header.sectionSize(column) - grip);
+}
+
+} // namespace
+
 CGenGrid::CGenGrid(QWidget* parent)
     : QTableView(parent),
       m_model(new CGridModel(this)),
@@ -207,6 +219,10 @@ void CGenGrid::focusOutEvent(QFocusEvent* event)
 void CGenGrid::focusInEvent(QFocusEvent* event)
 {
     QTableView::focusInEvent(event);
+    // What takes no keys itself - a header, a scroll bar - passes the focus of a click on to the grid. The keys remain
+    // those of the cell that is open.
+    if (QWidget* editor = m_delegate->Editor(); editor && state() == EditingState)
+        editor->setFocus();
     if (m_host)
         m_host->CellCurrent(*this);
 }
@@ -276,9 +292,13 @@ void CGenGrid::contextMenuEvent(QContextMenuEvent* event)
         m_input->ShowMenu(event->globalPos());
 }
 
-/// Of the headers.
+/// Of the headers. Whoever makes a column wider goes on typing in the open cell.
 bool CGenGrid::eventFilter(QObject* object, QEvent* event)
 {
     const bool isClick = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick;
-    return (isClick && object != viewport() && !CommitEditor()) || QTableView::eventFilter(object, event);
+    const bool isBorder =
+        isClick && object == horizontalHeader()->viewport() &&
+        IsColumnBorder(*horizontalHeader(), static_cast<QMouseEvent*>(event)->position().toPoint().x());
+    const bool leaves = isClick && !isBorder && object != viewport();
+    return (leaves && !CommitEditor()) || QTableView::eventFilter(object, event);
 }

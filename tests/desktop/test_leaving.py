@@ -225,3 +225,30 @@ class WhileTyping(Case):
         editor.type('0.75\t')
         editor.save()
         self.assertEqual(self.saved().value('delta'), '0.75')
+
+    def assert_borders_leave_the_cell_open(self, table, line, column):
+        """Whoever drags a column's border, or double-clicks it, goes on typing in the open cell."""
+        editor = self.editor
+        header = [h for h in editor.table(table).children_until('table column header')][column - 1]
+        before = editor.table(table).cell(line, column).name
+        for end, expected in (('Escape', before), ('Return', '123')):
+            x, y, width, height = header.place
+            border = x + width - 1, y + height // 2
+            editor.put(line, column, '1', leave=None, table=editor.table(table))
+            editor.hands.drag(border, (border[0] + 25, border[1]))
+            wait_for(lambda: header.place[2] > width + 15, 'the column is wider')
+            editor.type('2')
+            editor.hands.click(border[0] + 25, border[1], times=2)
+            editor.settle()
+            editor.type('3')
+            editor.press(end)
+            wait_for(lambda: editor.table(table).cell(line, column).name == expected, f'{expected} after {end}')
+        self.assert_no_message()
+
+    def test_column_made_wider(self):
+        editor = self.open_project()
+        editor.page('Initial')
+        self.assert_borders_leave_the_cell_open('Local ', 2, 3)
+        editor.save()
+        self.assertEqual(self.saved().records('InitList')[1], '"MOORBECK", 200, 123, 11')
+        self.assert_borders_leave_the_cell_open('Radius and width', 2, 1)
