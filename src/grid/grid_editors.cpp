@@ -147,6 +147,9 @@ void CGridDelegate::PaintControl(QPainter* painter, const QStyleOptionViewItem& 
     button.state = cell.state & (QStyle::State_Enabled | QStyle::State_MouseOver);
     button.state.setFlag(QStyle::State_Enabled, cell.state.testFlag(QStyle::State_Enabled) && !locked);
     if (column.Kind() == CellKind::Flag) {
+        // Styles shade the frame of a box from the window's color, which in dark palettes is that of an empty cell.
+        if (cell.palette.color(QPalette::Base).lightness() < 128)
+            button.palette.setColor(QPalette::Window, cell.palette.color(QPalette::Text));
         const QSize size(style.pixelMetric(QStyle::PM_IndicatorWidth, nullptr, m_grid),
                          style.pixelMetric(QStyle::PM_IndicatorHeight, nullptr, m_grid));
         button.rect = QStyle::alignedRect(cell.direction, Qt::AlignCenter, size, cell.rect);

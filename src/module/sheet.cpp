@@ -73,6 +73,9 @@ protected:
             QStyleOptionTab option;
             initStyleOption(&option, i);
             painter.drawControl(QStyle::CE_TabBarTabShape, option);
+            // Some styles and colors set the current tab off by a shade that nobody sees.
+            if (i == currentIndex())
+                painter.fillRect(QRect(option.rect.topLeft(), QSize(3, option.rect.height())), palette().highlight());
             const QRect text = option.rect.adjusted(fontMetrics().height() * 2 / 3, 0, -4, 0);
             const auto role = option.state & QStyle::State_Enabled ? QPalette::Normal : QPalette::Disabled;
             style()->drawItemText(&painter, text, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextShowMnemonic, palette(),
