@@ -1,0 +1,65 @@
+"""What goes wrong at which file call: one table, for every program. fault_calls.cpp carries it out."""
+import errno
+import mmap
+import struct
+
+ERRORS = ('ENOSPC', 'EIO', 'EDQUOT', 'EACCES', 'EROFS', 'EMFILE', 'EINTR')
+KILL, SHORT = 'KILL', 'SHORT'
+# A call that is interrupted for ever is repeated for ever.
+STICKY = tuple(error for error in ERRORS if error != 'EINTR')
+TRANSFERS = ('read', 'write')  # may come back with less than was asked for
+_HEAD, _FOLDER, _NAME, _MOST = struct.Struct('<5i'), 236, 24, 4000
+
+
+class Point:
+    """The nth file call meets a fault, once or from then on."""
+
+    def __init__(self, number, call, fault, sticky=False):
+        self.number, self.call, self.fault, self.sticky = number, call, fault, sticky
+
+    def __str__(self):
+        return f'{self.fault} at call {self.number}, {self.call}' + (' and ever after' if self.sticky else '')
+
+    @property
+    def kills(self):
+        return self.fault == KILL
+
+    def code(self):
+        return {KILL: -1, SHORT: -2}.get(self.fault) or getattr(errno, self.fault)
+
+
+def points(calls):
+    """Every fault at every call, given the names of the calls."""
+    for number, call in enumerate(calls, 1):
+        yield Point(number, call, KILL)
+        yield from (Point(number, call, error) for error in ERRORS)
+        yield from (Point(number, call, error, sticky=True) for error in STICKY)
+        if call in TRANSFERS:
+            yield Point(number, call, SHORT)
+            yield Point(number, call, SHORT, sticky=True)
+
+
+class Orders:
+    """The record shared with a program that runs with `environment`."""
+
+    def __init__(self, path, library):
+        self._size = _HEAD.size + _FOLDER + _NAME * _MOST
+        with open(path, 'wb') as file:
+            file.write(bytes(self._size))
+        with open(path, 'r+b') as file:
+            self._record = mmap.mmap(file.fileno(), self._size)
+        self.environment = {'KVR_FAULTS': path, 'LD_PRELOAD': library}
+
+    def arm(self, folder, point=None):
+        """From now on calls on what is in the folder are counted, and one of them meets its fault."""
+        self._record[_HEAD.size:_HEAD.size + _FOLDER] = folder.encode().ljust(_FOLDER, b'\0')
+        self._record[_HEAD.size + _FOLDER:] = bytes(_NAME * _MOST)
+        order = (1, point.number, point.code(), point.sticky) if point else (1, 0, 0, 0)
+        self._record[:_HEAD.size] = _HEAD.pack(*order, 0)
+
+    def disarm(self):
+        """The names of the calls since it was armed."""
+        seen = _HEAD.unpack(self._record[:_HEAD.size])[4]
+        self._record[:4] = bytes(4)
+        names = self._record[_HEAD.size + _FOLDER:]
+        return [names[_NAME * i:_NAME * (i + 1)].split(b'\0')[0].decode() for i in range(min(seen, _MOST))]

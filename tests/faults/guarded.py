@@ -1,0 +1,76 @@
+"""A folder with the file that is saved, and what has to hold of it whatever happens."""
+import os
+import re
+import shutil
+import stat
+
+# What a program may leave that is killed or can no longer remove anything: its temporary file and its lock.
+OURS = re.compile(r'\.kvr-.*|.*\.lock')
+
+
+class Guarded:
+    def __init__(self, folder, name, text, linked=False, mode=0o640):
+        """`linked`: the name is a symbolic link into another folder."""
+        shutil.rmtree(folder, ignore_errors=True)
+        os.makedirs(f'{folder}/far' if linked else folder)
+        self.folder = folder
+        self.path = os.path.join(folder, name)
+        self._real = os.path.join(folder, 'far', name) if linked else self.path
+        with open(self._real, 'w', encoding='utf-8', newline='\n') as file:
+            file.write(text)
+        os.chmod(self._real, mode)
+        self._attributes = self._set_attribute()
+        if linked:
+            os.symlink(os.path.join('far', name), self.path)
+        self.start_over()
+
+    def start_over(self):
+        """What is there now is what has to be kept."""
+        self.text = self.content()
+        self._before = self._metadata()
+        self._names = self._listing()
+
+    def _set_attribute(self):
+        try:
+            os.setxattr(self._real, 'user.kept', b'by a save')
+            return True
+        except OSError:  # the file system has none
+            return False
+
+    def _metadata(self):
+        status = os.stat(self._real)
+        return {'mode': stat.filemode(status.st_mode), 'owner': status.st_uid, 'group': status.st_gid,
+                'link': os.path.islink(self.path), 'attributes': os.listxattr(self._real) if self._attributes else []}
+
+    def _listing(self):
+        return sorted(os.path.relpath(os.path.join(top, name), self.folder)
+                      for top, _, names in os.walk(self.folder) for name in names)
+
+    def content(self):
+        with open(self.path, encoding='utf-8', errors='replace', newline='') as file:
+            return file.read()
+
+    def _litter(self, may_litter):
+        """Names that do not belong there."""
+        return [name for name in self._listing()
+                if name not in self._names and not (may_litter and OURS.fullmatch(os.path.basename(name)))]
+
+    def violations(self, new, saved, said='', may_litter=False):
+        """What does not hold, as sentences. `new`: what the file holds when it was saved; `saved`: whether the program
+        says so, None when it could say nothing; `said`: its words. What of the file's mode, owner and attributes could
+        not be kept has to be told."""
+        try:
+            content = self.content()
+        except OSError as error:
+            return [f'the file is gone: {error}']
+        wrong = []
+        if content not in (self.text, new):
+            wrong.append(f'neither old nor new content ({len(content)} characters)')
+        elif saved is not None and (content == new) != saved:
+            wrong.append(f'said {"saved" if saved else "not saved"}, the content is {"new" if content == new else "old"}')
+        now = self._metadata()
+        wrong += [f'{what} was {was}, is {now[what]}, and nobody is told' for what, was in self._before.items()
+                  if now[what] != was and not said.strip()]
+        if litter := self._litter(may_litter):
+            wrong.append(f'left over: {", ".join(litter)}')
+        return wrong

@@ -1,0 +1,111 @@
+"""Every fault at every file call of a save in the shell, for the files of all its editors, with real keys."""
+import os
+import re
+import sys
+import time
+
+import faults
+from guarded import Guarded
+
+sys.path.insert(0, os.path.join(os.path.dirname(os.path.abspath(__file__)), '../desktop'))
+import samples  # noqa: E402: it stands there
+
+# What the file holds at first; the cell that is typed into: table, line, column; what stands in the file before its
+# value.
+KINDS = {'moor.HDKV': (samples.hd_text, 'Local ', 1, 4, '"MOORBECK", 100, 1.25, '),
+         'moor.kvnw': (samples.network_text, 'Radius and width', 1, 2, 'DATA = 0, '),
+         'moor.kvxs': (samples.sections_text, 'Points', 1, 1, 'Point = ')}
+PATIENCE = 8  # seconds for a save, or a message
+
+
+class Desk:
+    """The shell with a file open that is saved again and again."""
+
+    def __init__(self, folder, orders, name, linked):
+        text, *self._cell, self._before = KINDS[name]
+        self._orders, self._name, self._folder = orders, name, f'{folder}/files'
+        self._home = f'{folder}/home'  # of logs and settings
+        os.makedirs(self._home, exist_ok=True)
+        self._guarded = Guarded(self._folder, name, text(), linked)
+        self._value, self._editor = 1, None
+
+    def start(self):
+        from editor import Editor  # only inside of a session: it looks up the accessibility bus
+
+        self.end()
+        os.environ.update(self._orders.environment)
+        try:
+            self._editor = Editor(self._home, f'{self._folder}/{self._name}')
+        finally:
+            for name in self._orders.environment:
+                del os.environ[name]
+
+    def end(self):
+        if self._editor:
+            self._editor.end()
+        self._editor = None
+
+    def save(self, point=None):
+        """Types another value and saves, with a fault. Gives back the calls that the save took and what did not hold
+        afterwards."""
+        editor, (table, line, column) = self._editor, self._cell
+        self._value += 1
+        value = f'1.{self._value:04}1'
+        editor.put(line, column, value, leave='Return', table=editor.table(table))
+        # The value is the only thing that may be new, once the file has been written as the program writes it.
+        new = re.sub(re.escape(self._before) + r'[^,\n]*', self._before + value, self._guarded.content(), count=1)
+        self._orders.arm(self._folder, point)
+        editor.press('ctrl+s')
+        saved, said = self._outcome()
+        calls = self._orders.disarm()
+        found = [] if point is None else self._guarded.violations(new, saved, said, may_litter=saved is None or point.sticky)
+        if saved is False and not said:
+            found.append('nothing is said')
+        if saved is None and not point.kills:
+            found.append('the program ended')
+        if saved is None:
+            self.start()
+        self._guarded.start_over()
+        return calls, found
+
+    def _outcome(self):
+        """Whether the program says that it has saved, and its words; None when it is no more."""
+        editor, end = self._editor, time.monotonic() + PATIENCE
+        try:
+            while time.monotonic() < end:
+                if editor.process.poll() is not None:
+                    return None, ''
+                if texts := editor.no_message():
+                    editor.press('Escape')
+                    editor.settle()
+                    return not editor.modified, '\n'.join(texts)
+                if not editor.modified:
+                    return True, editor.status()
+        except Exception:  # it went while it was looked at
+            time.sleep(1)
+            if editor.process.poll() is None:
+                raise
+            return None, ''
+        return False, ''
+
+
+def run(folder, orders, every):
+    """Goes through every nth point. Gives back how many there were and what did not hold."""
+    from session import Session
+
+    count, wrong = 0, []
+    with Session():
+        for name in KINDS:
+            for linked in (False, True):
+                desk = Desk(folder, orders, name, linked)
+                try:
+                    desk.start()
+                    desk.save()  # as the program writes it
+                    calls, _ = desk.save()
+                    for point in list(faults.points(calls))[::every]:
+                        count += 1
+                        wrong += [f'shell, {name}{" through a link" if linked else ""}, {point}: {sentence}'
+                                  for sentence in desk.save(point)[1]]
+                finally:
+                    desk.end()
+    return count, wrong
