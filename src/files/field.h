@@ -115,7 +115,7 @@ struct Field
     std::string_view name;
     FieldKind kind = FieldKind::Number;
     const void* owner = nullptr; // the tag of the class that declares the member
-    // A location record is passed as its HD_RiverPos.
+    // The object is passed as PassedAs<its class> (declare_field.h).
     void* (*address)(void* object) = nullptr;
     const void* (*constAddress)(const void* object) = nullptr;
     const GroupAccess* group = nullptr; // Group only

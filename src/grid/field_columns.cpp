@@ -1,13 +1,5 @@
 #include "grid/field_columns.h"
 
-const Field& FieldColumns::FieldAt(FieldList fields, void* object, const void* member)
-{
-    for (const Field& field : fields)
-        if (field.address(object) == member)
-            return field;
-    Q_UNREACHABLE(); // a member that is no parameter of the file
-}
-
 GridControl FieldColumns::ControlFor(const Field& field, const ColumnSpec& column) const
 {
     const bool hasChoices = bool(column.choices.entries);
