@@ -84,8 +84,6 @@ struct Choices
     std::optional<std::int32_t> IndexOf(const QString& text) const;
 };
 
-/// "Unit: m"; empty for a quantity without unit.
-QString UnitToolTip(const QString& unit);
 /// "1500.6 m".
 QString NumberText(const QString& number, const QString& unit);
 /// "Width [m]".
