@@ -28,11 +28,11 @@ std::string Values(const Field& field)
         return text.str();
     };
     std::string known;
-    if (field.minimum || field.maximum)
-        known = !field.maximum   ? "at least " + number(*field.minimum)
-                : !field.minimum ? "at most " + number(*field.maximum)
-                                 : number(*field.minimum) + " to " + number(*field.maximum);
-    std::istringstream entries(EnglishText(field.choices));
+    if (const auto& [minimum, maximum] = field.bounds; minimum || maximum)
+        known = !maximum   ? "at least " + number(*minimum)
+                : !minimum ? "at most " + number(*maximum)
+                           : number(*minimum) + " to " + number(*maximum);
+    std::istringstream entries(EnglishText(field.choices.text));
     std::int32_t index = field.firstChoice;
     for (std::string entry; std::getline(entries, entry); ++index) {
         entry = PlainText(entry);

@@ -71,7 +71,7 @@ MUTANTS = [
     ('cross_sections', 'files/declared_section.cpp', 'params.onlyFinite = true;', ''),
     ('cross_sections', 'files/declared_section.cpp', 'if (params.param)\n', 'if (false)\n'),
     ('cross_sections', 'ks/fc/document_file.cpp', 'replaces && CopySuffix() && m_keptCopy.isEmpty()', 'replaces && CopySuffix() && false'),
-    ('cross_sections', 'editors/cross_sections/section_rules.cpp', 'if (section.width < 0)', 'if (section.width < -1)'),
+    ('cross_sections', 'editors/cross_sections/section_file.cpp', '.MayBeUnknown().Range(0)', '.MayBeUnknown().Range(-1)'),
     # The host.
     ('shell', 'shell/recent_files.cpp', 'files.removeAll(clean);\n', ''),
     ('shell', 'shell/recent_files.cpp', 'Write(files.mid(0, Longest));', 'Write(files);'),

@@ -42,7 +42,9 @@ constexpr auto branchFields =
     FieldsOf<N>({Text<&N::name>("Name").Title(QT_TRANSLATE_NOOP("NetworkTables", "Branch")),
                  Number<&N::start>("first vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "From")),
                  Number<&N::end>("last vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "To")),
-                 Boolean<&N::downstream>("FlowsDownstream").Title(QT_TRANSLATE_NOOP("NetworkTables", "Flow"))});
+                 Boolean<&N::downstream>("FlowsDownstream")
+                     .Title(QT_TRANSLATE_NOOP("NetworkTables", "Flow"))
+                     .Choices(QT_TRANSLATE_NOOP("NetworkTables", "decreasing\nincreasing"))});
 constexpr FieldList nameField = FieldList(branchFields).subspan(0, 1),
                     endFields = FieldList(branchFields).subspan(1, 2);
 constexpr auto vertices = FieldsOf<N>({GroupOf<&VertexFields, &N::line>("Vertex")});

@@ -208,7 +208,7 @@ void CBindings::Add(QComboBox* box, std::int32_t& index)
 void CBindings::Add(QComboBox* box, std::int32_t& index, std::function<void(std::int32_t chosen)> choose)
 {
     AddLabel(box, &index);
-    if (const Str choices = Declaration(&index).choices; choices != Str::None) {
+    if (const Str choices = Declaration(&index).choices.text; choices != Str::None) {
         Always([box, choices] {
             int entry = 0;
             for (const QString& text : LoadString(choices).split(u'\n')) {
@@ -246,7 +246,7 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
         Add(button, &value, [] {}); // shown by its group
         group->addButton(button, id++);
     }
-    if (const Str choices = Declaration(&value).choices; choices != Str::None) {
+    if (const Str choices = Declaration(&value).choices.text; choices != Str::None) {
         Always([group, choices] {
             for (QAbstractButton* button : group->buttons())
                 button->setText(LoadLine(choices, group->id(button)));
