@@ -85,16 +85,19 @@ std::string GlobalTable()
 {
     const HD_Global_Var global;
     std::string table = "| Section | Keyword | Parameters | Default |\n|---|---|---|---|\n";
-    for (const GlobalSection& section : HDGlobalSections()) {
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
         std::string name = '`' + std::string(section.name) + '`';
-        for (const GlobalKeyword& row : section.keywords) {
+        for (const DeclaredKeyword& row : section.keywords) {
             table += "| " + name + " | `" + std::string(row.name) + "` | " + Described(row.Fields(), row.name) + " | " +
                      Default(row.Fields(), &global) + " |\n";
             name.clear();
         }
-        for (const Field& items : section.items)
+        for (const DeclaredSection& items : section.Sections()) {
+            const DeclaredKeyword& line = items.keywords.front();
             table += "| " + name + "| sub-section `" + std::string(items.name) + "`: keywords `" +
-                     std::string(HDItemKeyword) + "` | " + Described(items.group->elements(), {}) + " | none |\n";
+                     std::string(line.name) + "` | " + Described(line.Fields().front().group->elements(), {}) +
+                     " | none |\n";
+        }
     }
     return table;
 }

@@ -51,11 +51,10 @@ void SetAccessibleName(QWidget& widget, const QString& name)
 const Field& CBindings::Declaration(const void* value) const
 {
     static constexpr Field none;
-    for (const GlobalSection& section : HDGlobalSections())
-        for (const GlobalKeyword& keyword : section.keywords)
-            for (const Field& field : keyword.Fields())
-                if (field.constAddress(&m_document->Parameters().Global) == value)
-                    return field;
+    for (const DeclaredSection& section : HDGlobals().Sections())
+        for (const DeclaredKeyword& keyword : section.keywords)
+            if (const Field* field = FindField(keyword.Fields(), &m_document->Parameters().Global, value))
+                return *field;
     return none;
 }
 
