@@ -115,10 +115,6 @@ Bed level %2</source>
         <translation>KVR横断面</translation>
     </message>
     <message>
-        <source>KVR Cross Sections (*.kvxs)</source>
-        <translation>KVR横断面 (*.kvxs)</translation>
-    </message>
-    <message>
         <source>Cross Sections</source>
         <translation>横断面</translation>
     </message>

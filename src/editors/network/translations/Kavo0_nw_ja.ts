@@ -642,10 +642,6 @@ increasing</source>
         <translation>KVR 河道網</translation>
     </message>
     <message>
-        <source>KVR River Network (*.kvnw)</source>
-        <translation>KVR 河道網 (*.kvnw)</translation>
-    </message>
-    <message>
         <source>River Network</source>
         <translation>河道網</translation>
     </message>
