@@ -63,7 +63,7 @@ private:
     }
     Result<void> ParseValue(std::string_view name, std::int32_t& value)
     {
-        return Take(name, value, "an integer", &ReadWhole);
+        return Take(name, value, "an integer", &ReadInteger);
     }
     Result<void> ParseValue(std::string_view name, bool& value)
     {
@@ -73,13 +73,6 @@ private:
     static std::optional<bool> ReadFlag(std::string_view text)
     {
         return text == "true" || text == "false" ? std::optional(text == "true") : std::nullopt;
-    }
-
-    static std::optional<std::int32_t> ReadWhole(std::string_view text)
-    {
-        std::int32_t value = 0;
-        const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-        return error == std::errc() && end == text.data() + text.size() ? std::optional(value) : std::nullopt;
     }
 
     template <typename T>
@@ -107,8 +100,7 @@ private:
         HDDateTime date;
         std::int32_t* const parts[] = {&date.Year, &date.Month, &date.Day, &date.Hour, &date.Minute, &date.Second};
         for (std::int32_t* part : parts)
-            if (Result<void> read =
-                    Take(name, *part, "six integers: year month day hour minute second", &ReadWhole);
+            if (Result<void> read = Take(name, *part, "six integers: year month day hour minute second", &ReadInteger);
                 !read)
                 return read;
         if (!date.IsValid())
@@ -121,7 +113,7 @@ private:
     {
         const std::string what = "the number of " + std::string(name);
         std::int32_t count = 0;
-        if (Result<void> read = Take(what, count, "an integer", &ReadWhole); !read)
+        if (Result<void> read = Take(what, count, "an integer", &ReadInteger); !read)
             return read;
         const std::size_t given = m_texts.size() - m_next;
         if (!CountFits(group.Elements(), count, int(given)))

@@ -9,12 +9,12 @@ namespace {
 std::vector<NamedValue> AllValues()
 {
     std::vector<NamedValue> values;
-    for (const GlobalSection& section : HDGlobalSections()) {
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
         const std::string prefix = std::string(section.name) + '/';
-        for (const GlobalKeyword& row : section.keywords)
+        for (const DeclaredKeyword& row : section.keywords)
             values.push_back({prefix + std::string(row.name), row.Fields()});
-        for (const Field& items : section.items)
-            values.push_back({prefix + std::string(items.name), FieldList(&items, 1)});
+        for (const DeclaredSection& items : section.Sections())
+            values.push_back({prefix + std::string(items.name), items.keywords.front().Fields()});
     }
     return values;
 }

@@ -12,10 +12,15 @@ std::string KnownLists()
     std::string names;
     for (const ListEntry& entry : HDLists())
         names += std::string(names.empty() ? "" : ", ") + entry.section;
-    for (const GlobalSection& section : HDGlobalSections())
-        for (const Field& items : section.items)
+    for (const DeclaredSection& section : HDGlobals().Sections())
+        for (const DeclaredSection& items : section.Sections())
             names += ", " + std::string(items.name);
     return names;
+}
+
+GroupValue<const void> ItemsOf(const DeclaredSection& items, const HD_Parameters& parameters)
+{
+    return items.keywords.front().Fields().front().GroupIn(&parameters.Global);
 }
 
 /// The records or items of the list; false when there is no such list.
@@ -30,11 +35,11 @@ bool MakeTable(const HD_Parameters& parameters, const std::string& name, RecordT
             table.AddSets(parameters.EncroachList);
         return true;
     }
-    for (const GlobalSection& section : HDGlobalSections()) {
-        for (const Field& items : section.items) {
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
+        for (const DeclaredSection& items : section.Sections()) {
             if (!SameIgnoringCase(items.name, name))
                 continue;
-            table.AddItems(items.GroupIn(&parameters.Global));
+            table.AddItems(ItemsOf(items, parameters));
             return true;
         }
     }
@@ -55,10 +60,10 @@ std::vector<OverviewRow> Overview(const HD_Parameters& parameters)
     const auto add = [&rows](std::string_view section, const char* contents, std::size_t count) {
         rows.push_back({std::string(section), contents, std::int32_t(count)});
     };
-    for (const GlobalSection& section : HDGlobalSections()) {
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
         add(section.name, "keywords", section.keywords.size());
-        for (const Field& items : section.items)
-            add(items.name, "items", items.GroupIn(&parameters.Global).size());
+        for (const DeclaredSection& items : section.Sections())
+            add(items.name, "items", ItemsOf(items, parameters).size());
     }
     for (const ListEntry& entry : HDLists()) {
         if (entry.constList)

@@ -37,10 +37,10 @@ KVR_FIELDS(HD_Wavetype,
            Choice<&Self::WaveApproximation>("WaveApproximation").Title(Str::WaveApproximation).Choices(Str::WaveApproximations))
 
 KVR_FIELDS(HD_Waterloss,
-           Number<&Self::WaterLoss1>("WaterLoss1").Digits(6),
-           Number<&Self::WaterLoss2>("WaterLoss2").Digits(6),
-           Number<&Self::WaterLoss3>("WaterLoss3").Digits(6),
-           Number<&Self::WaterLoss4>("WaterLoss4").Digits(6))
+           Number<&Self::WaterLoss1>("WaterLoss1").Title(Str::WaterLosses, 0).Digits(6),
+           Number<&Self::WaterLoss2>("WaterLoss2").Title(Str::WaterLosses, 1).Digits(6),
+           Number<&Self::WaterLoss3>("WaterLoss3").Title(Str::WaterLosses, 2).Digits(6),
+           Number<&Self::WaterLoss4>("WaterLoss4").Title(Str::WaterLosses, 3).Digits(6))
 
 KVR_FIELDS(HD_Flood_resist,
            Number<&Self::FloodPlainResistance>("FloodPlainResistance", U::FloodPlainResistance).Title(Str::FloodPlRes))
@@ -51,10 +51,10 @@ KVR_FIELDS(CMixingWCCoef,
 
 KVR_FIELDS(HDMixingCoef,
            Group<&Self::CoefPairs>("CoefPairs"),
-           Number<&Self::MixCoef1>("MixCoef1").Digits(6),
-           Number<&Self::MixCoef2>("MixCoef2").Digits(6),
-           Number<&Self::MixCoef3>("MixCoef3").Digits(6),
-           Number<&Self::MixCoef4>("MixCoef4").Digits(6))
+           Number<&Self::MixCoef1>("MixCoef1").Title(Str::MixCoefs, 0).Digits(6),
+           Number<&Self::MixCoef2>("MixCoef2").Title(Str::MixCoefs, 1).Digits(6),
+           Number<&Self::MixCoef3>("MixCoef3").Title(Str::MixCoefs, 2).Digits(6),
+           Number<&Self::MixCoef4>("MixCoef4").Title(Str::MixCoefs, 3).Digits(6))
 
 KVR_FIELDS(HDWLMark,
            PlainGroup<level, &Self::MarkLevels>("MarkLevels"))

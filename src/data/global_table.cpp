@@ -1,19 +1,21 @@
 // The table of the global values: one row a keyword, in file order.
 #include "data/global_var.h"
-#include "files/declare_field.h"
 #include "texts/text_numbers.h"
+
+#include <iterator>
 
 namespace {
 
 using G = HD_Global_Var;
 using U = UnitGroup;
+constexpr KeptAccess kept = Keeps<&G::Kept>();
 
 constexpr auto resisZone =
     FieldsOf<G>({Integer<&G::ResisZone>("ResisZone").Choices(Str::BedApproaches),
                  Number<&G::ZoneResistance1>("ZoneResistance1").Title(Str::MainChannelResistance),
                  Number<&G::ZoneResistance2>("ZoneResistance2").Title(Str::TransitionResistance),
                  Number<&G::ZoneResistance3>("ZoneResistance3").Title(Str::FloodPlainZoneResistance)});
-constexpr GlobalKeyword globalValues[] = {
+constexpr DeclaredKeyword globalValues[] = {
     Number<&G::G_waterlevel>("G_waterlevel", U::WaterLevel).Title(Str::GlobalWaterLevel),
     Choice<&G::iLevelDepth>("iLevelDepth").Choices(Str::LevelOrDepth),
     Number<&G::G_discharge>("G_discharge", U::Discharge).Title(Str::GlobalDischarge),
@@ -30,7 +32,7 @@ constexpr GlobalKeyword globalValues[] = {
     {"ResisZone", resisZone},
 };
 
-constexpr GlobalKeyword defaultValues[] = {
+constexpr DeclaredKeyword defaultValues[] = {
     Number<&G::delta>("delta", U::Factor).Digits(2).Range(0.5, 1).Title(Str::Delta),
     Number<&G::delhs>("delhs", U::WaterLevel).Digits(7).Title(Str::Delhs),
     Number<&G::delh>("delh", U::WaterLevel).Digits(3).Title(Str::Delh),
@@ -57,7 +59,7 @@ constexpr auto energyEquation =
 constexpr auto contractExpansion =
     FieldsOf<G>({Number<&G::G_Contraction>("G_Contraction", U::Factor).Title(Str::GlobalContraction),
                  Number<&G::G_Expansion>("G_Expansion", U::Factor).Title(Str::GlobalExpansion)});
-constexpr GlobalKeyword quasiSteady[] = {
+constexpr DeclaredKeyword quasiSteady[] = {
     Number<&G::relax>("relax", U::Factor).Title(Str::Relax),
     Number<&G::beta_limit>("beta_limit", U::Factor).Digits(8).Title(Str::BetaLimit),
     Number<&G::fac_0>("fac_0", U::Factor).Title(Str::Fac0),
@@ -81,7 +83,7 @@ constexpr Field Switch(std::string_view name, int title)
     return Boolean<&G::AddOutput, Flag>(name).Title(Str::AddedOutputs, title);
 }
 using A = HDAddOutput;
-constexpr GlobalKeyword addOutput[] = {
+constexpr DeclaredKeyword addOutput[] = {
     Integer<&G::AddOutput, &A::ReducedOut>("ReducedOut"),
     Switch<&A::Velo_H>("Velo_H", 0),
     Switch<&A::Velo_struc>("Velo_struc", 0),
@@ -117,14 +119,14 @@ constexpr auto mixingCoef = FieldsOf<G>({Group<&G::Mixing, &X::CoefPairs>("CoefP
                                          Number<&G::Mixing, &X::MixCoef2>("MixCoef2").Title(Str::MixingCoef2),
                                          Number<&G::Mixing, &X::MixCoef3>("MixCoef3").Title(Str::MixingCoef3),
                                          Number<&G::Mixing, &X::MixCoef4>("MixCoef4").Title(Str::MixingCoef4)});
-constexpr GlobalKeyword mixingCoefficients[] = {{"MixingCoef", mixingCoef}};
+constexpr DeclaredKeyword mixingCoefficients[] = {{"MixingCoef", mixingCoef}};
 
 // A count alone would leave these two keywords with a single parameter, which
 // readers take for a value.
-constexpr Field title = Plain<std::string>("Title");
-constexpr Field interpolate = Plain<bool>("Interpolate");
-constexpr GlobalKeyword markTitles[] = {PlainGroup<title, &G::MarkTitles>("MarkTitles").PadWhenEmpty(),
-                                        PlainGroup<interpolate, &G::MarkInterpolate>("MarkInterpolate").PadWhenEmpty()};
+constexpr Field title = Plain<std::string>("Title").Title(Str::MarkTitle);
+constexpr Field interpolate = Plain<bool>("Interpolate").Title(Str::MarkInterpolate);
+constexpr DeclaredKeyword markTitles[] = {PlainGroup<title, &G::MarkTitles>("MarkTitles").PadWhenEmpty(),
+                                          PlainGroup<interpolate, &G::MarkInterpolate>(HDMarkFlags).PadWhenEmpty()};
 
 using B = HDBedResistTools;
 constexpr auto bedResist = FieldsOf<G>(
@@ -136,7 +138,7 @@ constexpr auto bedResist = FieldsOf<G>(
      Number<&G::BedResist, &B::CoefB>("CoefB").Title(Str::ToolboxCoefB),
      Number<&G::BedResist, &B::MinRes>("MinRes").Title(Str::ToolboxMinimum),
      Number<&G::BedResist, &B::MaxRes>("MaxRes").Title(Str::ToolboxMaximum)});
-constexpr GlobalKeyword bedResistTools[] = {{"BRTools", bedResist}};
+constexpr DeclaredKeyword bedResistTools[] = {{"BRTools", bedResist}};
 
 using C = HDCurveIncrement;
 constexpr auto curve =
@@ -149,7 +151,7 @@ constexpr auto curve =
                  Number<&G::CurveIncrement, &C::Width>("Width", U::Width),
                  Number<&G::CurveIncrement, &C::Radius>("Radius", U::Radius),
                  Number<&G::CurveIncrement, &C::Velocity>("Velocity", U::Velocity)});
-constexpr GlobalKeyword waterLevelCurve[] = {{"WLDueToCurve", curve}};
+constexpr DeclaredKeyword waterLevelCurve[] = {{"WLDueToCurve", curve}};
 
 using S = HDSandBarIncrement;
 constexpr auto sand = FieldsOf<G>({Boolean<&G::SandBarIncrement, &S::Enabled>("Enabled").Title(Str::SandBarIncrement),
@@ -158,12 +160,12 @@ constexpr auto sand = FieldsOf<G>({Boolean<&G::SandBarIncrement, &S::Enabled>("E
                                    Number<&G::SandBarIncrement, &S::Width>("Width", U::Width),
                                    Number<&G::SandBarIncrement, &S::Area>("Area", U::Area),
                                    Number<&G::SandBarIncrement, &S::Observed>("Observed", U::WaterLevel)});
-constexpr GlobalKeyword waterLevelSandBars[] = {{"WLDueToSand", sand}};
+constexpr DeclaredKeyword waterLevelSandBars[] = {{"WLDueToSand", sand}};
 
-constexpr GlobalKeyword encroachment[] = {Integer<&G::Max_no_iter>("Max_no_iter").Title(Str::EncroachIterations)};
+constexpr DeclaredKeyword encroachment[] = {Integer<&G::Max_no_iter>("Max_no_iter").Title(Str::EncroachIterations)};
 
 using H = HDHeatBalance;
-constexpr GlobalKeyword heatBalance[] = {
+constexpr DeclaredKeyword heatBalance[] = {
     Boolean<&G::HeatBalance, &H::Calc>("Calc").Title(Str::HeatBalanceIncluded),
     Number<&G::HeatBalance, &H::Latitude>("Latitude", U::GeoAngle).Title(Str::Latitude),
     Number<&G::HeatBalance, &H::Longitude>("Longitude", U::GeoAngle).Title(Str::Longitude),
@@ -178,7 +180,7 @@ constexpr GlobalKeyword heatBalance[] = {
 };
 
 using T = HDStratification;
-constexpr GlobalKeyword stratification[] = {
+constexpr DeclaredKeyword stratification[] = {
     Integer<&G::Stratification, &T::npv>("npv").Title(Str::LayerCount),
     Boolean<&G::Stratification, &T::dens>("dens").Title(Str::LayerDensities),
     Number<&G::Stratification, &T::visc>("visc", U::Viscosity).Title(Str::Viscosity),
@@ -195,7 +197,7 @@ constexpr GlobalKeyword stratification[] = {
 };
 
 using K = HDKlrConstants;
-constexpr GlobalKeyword klrParam[] = {
+constexpr DeclaredKeyword klrParam[] = {
     Number<&G::Klr, &K::fricfac>("fricfac", U::Factor).Title(Str::KlrFriction),
     Number<&G::Klr, &K::maxvol>("maxvol", U::Volume).Digits(8).Title(Str::KlrMaxVolume),
     Number<&G::Klr, &K::maxvelo>("maxvelo", U::Velocity).Title(Str::KlrMaxVelocity),
@@ -208,7 +210,7 @@ constexpr GlobalKeyword klrParam[] = {
 };
 
 using I = HDKlrInitial;
-constexpr GlobalKeyword klrInit[] = {
+constexpr DeclaredKeyword klrInit[] = {
     Number<&G::KlrInit, &I::h1>("h1", U::WaterLevel).Digits(8).Title(Str::KlrWaterLevel),
     Number<&G::KlrInit, &I::h0>("h0", U::WaterLevel).Digits(8).Title(Str::KlrInterfaceLevel),
     Number<&G::KlrInit, &I::Q1>("Q1", U::Discharge).Digits(8).Title(Str::KlrTopDischarge),
@@ -216,13 +218,19 @@ constexpr GlobalKeyword klrInit[] = {
     Number<&G::G_friction_factor>("G_friction_factor", U::Factor).Digits(3).Title(Str::WindFriction),
 };
 
+/// The list that a sub-section holds.
+constexpr DeclaredKeyword Lines(FieldList group)
+{
+    return {"data", group, Presence::EachLine};
+}
+
 using O = HDTextOutput;
 constexpr auto summaryInfo =
     FieldsOf<G>({BooleanAt<0, &G::TextOutput, &O::SummaryInfo>("Minimum").Title(Str::SeriesMinimum),
                  BooleanAt<1, &G::TextOutput, &O::SummaryInfo>("Maximum").Title(Str::SeriesMaximum),
                  BooleanAt<2, &G::TextOutput, &O::SummaryInfo>("TimeOfMinimum").Title(Str::SeriesTimeOfMinimum),
                  BooleanAt<3, &G::TextOutput, &O::SummaryInfo>("TimeOfMaximum").Title(Str::SeriesTimeOfMaximum)});
-constexpr GlobalKeyword textOutput[] = {
+constexpr DeclaredKeyword textOutput[] = {
     Boolean<&G::TextOutput, &O::GenerateOutput>("GenerateOutput").Title(Str::GenerateSeries),
     Text<&G::TextOutput, &O::Delimiter>("Delimiter").Title(Str::SeriesDelimiter),
     Integer<&G::TextOutput, &O::ColumnWidth>("ColumnWidth").Title(Str::SeriesColumnWidth),
@@ -232,14 +240,16 @@ constexpr GlobalKeyword textOutput[] = {
     DateTime<&G::TextOutput, &O::LimitedPeriodStart>("LimitedPeriodStart").Title(Str::SeriesStart),
     DateTime<&G::TextOutput, &O::LimitedPeriodEnd>("LimitedPeriodEnd").Title(Str::SeriesEnd),
 };
-constexpr auto textLists = FieldsOf<G>(
-    {Group<&G::TextOutput, &O::OutputItems>("OutputItems"), Group<&G::TextOutput, &O::OutputFiles>("OutputFiles")});
+constexpr auto outputItems = FieldsOf<G>({Group<&G::TextOutput, &O::OutputItems>("OutputItems")});
+constexpr auto outputFiles = FieldsOf<G>({Group<&G::TextOutput, &O::OutputFiles>("OutputFiles")});
+constexpr DeclaredKeyword itemLines[] = {Lines(outputItems)}, fileLines[] = {Lines(outputFiles)};
+constexpr DeclaredSection textLists[] = {{"OutputItems", kept, itemLines}, {"OutputFiles", kept, fileLines}};
 
 // Files from before ground elevations could come from a DEM have no use for the
 // three keywords that refine it.
 constexpr std::string_view groundElevation = "ApplyDemGroundElevation";
 using M = HDMapOutput;
-constexpr GlobalKeyword mapOutput[] = {
+constexpr DeclaredKeyword mapOutput[] = {
     Boolean<&G::MapOutput, &M::GenerateOutput>("GenerateOutput").Title(Str::GenerateMaps),
     Boolean<&G::MapOutput, &M::ApplyDemInRiverXsec>("ApplyDemInRiverXsec").Title(Str::MapRiverCrossSections),
     Boolean<&G::MapOutput, &M::ApplyDemGroundElevation>(groundElevation).Title(Str::MapGroundElevation),
@@ -247,42 +257,47 @@ constexpr GlobalKeyword mapOutput[] = {
     {FileName<&G::MapOutput, &M::GeoDb>("GeoDb").Title(Str::MapHelpGrid), groundElevation},
     {Boolean<&G::MapOutput, &M::AddToCalculation>("AddToCalculation"), groundElevation},
 };
-constexpr auto mapLists = FieldsOf<G>({Group<&G::MapOutput, &M::MapOutputFiles>("MapOutputFiles"),
-                                       Group<&G::MapOutput, &M::DemInputFiles>("DemInputFiles")});
+constexpr auto mapFiles = FieldsOf<G>({Group<&G::MapOutput, &M::MapOutputFiles>("MapOutputFiles")});
+constexpr auto demFiles = FieldsOf<G>({Group<&G::MapOutput, &M::DemInputFiles>("DemInputFiles")});
+constexpr DeclaredKeyword mapLines[] = {Lines(mapFiles)}, demLines[] = {Lines(demFiles)};
+constexpr DeclaredSection mapLists[] = {{"MapOutputFiles", kept, mapLines}, {"DemInputFiles", kept, demLines}};
 
 using L = HDLeakageGlobal;
-constexpr GlobalKeyword leakage[] = {
+constexpr DeclaredKeyword leakage[] = {
     Boolean<&G::Leakage, &L::IncludeLeakage>("IncludeLeakage").Title(Str::IncludeLeakage),
     Number<&G::Leakage, &L::LeakageCoefficient>("LeakageCoefficient", U::LeakageCoefficient)
         .Digits(3)
         .Title(Str::GlobalLeakageCoef),
 };
 
-constexpr GlobalSection sections[] = {
-    {"Global_Values", globalValues},
-    {"Defalt_Values", defaultValues}, // spelled so in every file
-    {"Quasi_steady", quasiSteady},
-    {"Add_Output", addOutput},
-    {"MixingCoefficients", mixingCoefficients},
-    {"WaterLevelMarkTitles", markTitles},
-    {"BedResistTools", bedResistTools},
-    {"WaterLevelCurve", waterLevelCurve},
-    {"WaterLevelSandBars", waterLevelSandBars},
-    {"Encroachment", encroachment},
-    {"Heat_Balance", heatBalance},
-    {"Stratification", stratification},
-    {"KlrParam", klrParam},
-    {"KlrInit", klrInit},
-    {"TextOutput", textOutput, textLists},
-    {"MapOutput", mapOutput, mapLists},
-    {"Leakage", leakage},
+constexpr DeclaredSection sections[] = {
+    {"Global_Values", kept, globalValues},
+    {"Defalt_Values", kept, defaultValues}, // spelled so in every file
+    {"Quasi_steady", kept, quasiSteady},
+    {"Add_Output", kept, addOutput},
+    {"MixingCoefficients", kept, mixingCoefficients},
+    {HDMarkSection, kept, markTitles},
+    {"BedResistTools", kept, bedResistTools},
+    {"WaterLevelCurve", kept, waterLevelCurve},
+    {"WaterLevelSandBars", kept, waterLevelSandBars},
+    {"Encroachment", kept, encroachment},
+    {"Heat_Balance", kept, heatBalance},
+    {"Stratification", kept, stratification},
+    {"KlrParam", kept, klrParam},
+    {"KlrInit", kept, klrInit},
+    {"TextOutput", kept, textOutput, textLists, std::size(textLists)},
+    {"MapOutput", kept, mapOutput, mapLists, std::size(mapLists)},
+    {"Leakage", kept, leakage},
 };
+
+static_assert(AreOf<G>(sections));
+constexpr DeclaredSection globals{"Global_Variables", kept, {}, sections, std::size(sections)};
 
 } // namespace
 
-std::span<const GlobalSection> HDGlobalSections()
+const DeclaredSection& HDGlobals()
 {
-    return sections;
+    return globals;
 }
 
 FieldList CTextOutItem::DeclaredFields()

@@ -3,11 +3,9 @@
 #pragma once
 
 #include "data/families.h"
-#include "files/declare_field.h"
-#include "files/unknown_content.h"
+#include "files/declared_section.h"
 
 #include <deque>
-#include <map>
 
 struct HDAddOutput
 {
@@ -165,9 +163,6 @@ struct HDLeakageGlobal
     double LeakageCoefficient = 0;
 };
 
-struct GlobalKeyword;
-struct GlobalSection;
-
 class HD_Global_Var
 {
 public:
@@ -223,50 +218,14 @@ public:
     /// Writes the section, every keyword of the table, then what the table does not know. There is one flag a mark
     /// title, whatever was read.
     void Save(tqlHandle structure) const;
-    void ClearUnknown();
+    void ClearUnknown() { Kept = {}; }
 
-private:
-    void LoadSection(tqlHandle section, const GlobalSection& table, LoadReport* report);
-    void LoadKeyword(tqlHandle keyword, const GlobalKeyword& row, LoadReport* report);
-    const std::string* Unread(const GlobalSection& table, const GlobalKeyword& row) const;
-    void SaveSection(tqlHandle structure, const GlobalSection& table) const;
-    void SaveUnknown(tqlHandle structure, std::string_view section) const;
-
-    std::map<std::string_view, UnknownNodes> m_unknown; // by the name of the known section it stood in
-    std::map<const GlobalKeyword*, ExtraParams> m_extra;
-    std::map<const GlobalKeyword*, std::string> m_unread; // parameters of keywords that another one's absence closed
+    KeptContent Kept; // what the file says beyond that
 };
 
-/// The section of a file that holds the global values.
-inline constexpr std::string_view HDGlobalSectionName = "Global_Variables";
-/// The keyword that holds one element of an item sub-section.
-inline constexpr std::string_view HDItemKeyword = "data";
+/// The flags of user-defined marks, one a title.
+inline constexpr std::string_view HDMarkSection = "WaterLevelMarkTitles", HDMarkFlags = "MarkInterpolate";
 
-/// One keyword of the global values. Most hold one parameter named like the keyword.
-struct GlobalKeyword
-{
-    std::string_view name;
-    Field single{};
-    FieldList several{};
-    std::string_view onlyWith{}; // read only when this keyword is there
-
-    consteval GlobalKeyword(const Field& field, std::string_view with = {})
-        : name(field.name), single(FieldsOf<HD_Global_Var>({field})[0]), onlyWith(with)
-    {
-    }
-    constexpr GlobalKeyword(std::string_view keyword, FieldList fields) : name(keyword), several(fields) {}
-
-    FieldList Fields() const { return several.empty() ? FieldList(&single, 1) : several; }
-};
-
-/// One sub-section. `items` are sub-sections of its own that hold one keyword "data" an element; each is declared as a
-/// group of HD_Global_Var with the sub-section's name.
-struct GlobalSection
-{
-    std::string_view name;
-    std::span<const GlobalKeyword> keywords;
-    FieldList items{};
-};
-
-/// The table of the global values: sub-sections and keywords in file order.
-std::span<const GlobalSection> HDGlobalSections();
+/// The section of a file that holds the global values: sub-sections and keywords in file order. Sub-sections of those
+/// hold a list each, one keyword an element.
+const DeclaredSection& HDGlobals();

@@ -56,7 +56,7 @@ void HD_Parameters::Load(tqlHandle structure, LoadReport* report)
     }
     const auto first = [](bool known) { return known ? Known::First : Known::No; };
     const auto knownSection = [&](std::string_view name, bool isSection) {
-        return first(isSection && (name == HDGlobalSectionName ||
+        return first(isSection && (name == HDGlobals().name ||
                                    std::ranges::find(lists, name, &ListEntry::section) != std::end(lists)));
     };
     CollectUnknown(target, knownSection, Unknown.InTarget, report);

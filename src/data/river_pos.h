@@ -14,6 +14,8 @@ class LoadReport;
 class HD_RiverPos
 {
 public:
+    using PassedAs = HD_RiverPos; // as lists and rows know all families
+
     std::string RiverName;      // branch name
     double Chainage = NotGiven; // position along the branch, metres
     ExtraParams Extra;          // what the file holds behind the family's parameters

@@ -13,8 +13,6 @@
 #include <concepts>
 #include <utility>
 
-class HD_RiverPos;
-
 namespace field_detail {
 
 template <typename Class>
@@ -53,11 +51,28 @@ struct Self
     static constexpr auto& Of(auto& object) { return object; }
 };
 
-/// The object as the class that declares the member. Records travel as their base class.
+/// A class of objects that are passed as such.
+template <typename Class>
+struct Passed
+{
+    using As = Class;
+};
+/// One of a family whose objects are kept and passed as their base.
+template <typename Class>
+requires requires
+{
+    typename Class::PassedAs;
+}
+struct Passed<Class>
+{
+    using As = typename Class::PassedAs;
+};
+
+/// The object as the class that declares the member.
 template <typename Class, typename Void>
 auto& Object(Void* object)
 {
-    using Base = std::conditional_t<std::is_base_of_v<HD_RiverPos, Class>, HD_RiverPos, Class>;
+    using Base = typename Passed<Class>::As;
     if constexpr (std::is_const_v<Void>)
         return static_cast<const Class&>(*static_cast<const Base*>(object));
     else
@@ -112,6 +127,26 @@ template <typename Container, auto Elements>
 inline constexpr GroupAccess Access = MakeAccess<Container, Elements>();
 
 } // namespace field_detail
+
+/// The class as which a pointer to an object without type is taken: its own, or `Class::PassedAs` where it says so.
+template <typename Class>
+using PassedAs = typename field_detail::Passed<Class>::As;
+
+/// Which of an object's fields holds the value at that address; null for none.
+inline const Field* FindField(FieldList fields, const void* object, const void* value)
+{
+    for (const Field& field : fields)
+        if (field.constAddress(object) == value)
+            return &field;
+    return nullptr;
+}
+/// The declaration of a member, which has to have one.
+template <typename Class, typename T>
+const Field& FieldOf(T Class::*member)
+{
+    static const Class object{};
+    return *FindField(Class::DeclaredFields(), static_cast<const PassedAs<Class>*>(&object), &(object.*member));
+}
 
 /// That a path of members leads to a value of the type.
 template <typename T, auto... Path>

@@ -63,7 +63,11 @@ struct TextLine
     int line = Whole;
     const char* source = nullptr; // the text itself, to be translated, where an editor has no numbers for its texts
 
-    explicit constexpr operator bool() const { return text != Str{}; }
+    constexpr TextLine() = default;
+    constexpr TextLine(Str itsText, int itsLine = Whole) : text(itsText), line(itsLine) {}
+    constexpr TextLine(const char* itsSource) : source(itsSource) {}
+
+    explicit constexpr operator bool() const { return text != Str{} || source; }
 };
 
 /// The value of a group: the elements of a container. `Void` is const for an object that is.
@@ -110,12 +114,25 @@ private:
     Void* m_container;
 };
 
+/// What a user may enter as a number, in base units.
+struct Bounds
+{
+    std::optional<double> minimum{}, maximum{};
+
+    /// A value that is not known is within them.
+    constexpr bool Allow(double value) const
+    {
+        return !(minimum && value < *minimum) && !(maximum && value > *maximum);
+    }
+    bool operator==(const Bounds&) const = default;
+};
+
 struct Field
 {
     std::string_view name;
     FieldKind kind = FieldKind::Number;
     const void* owner = nullptr; // the tag of the class that declares the member
-    // A location record is passed as its HD_RiverPos.
+    // The object is passed as PassedAs<its class> (declare_field.h).
     void* (*address)(void* object) = nullptr;
     const void* (*constAddress)(const void* object) = nullptr;
     const GroupAccess* group = nullptr; // Group only
@@ -124,10 +141,10 @@ struct Field
     bool mayBeUnknown = false; // a number: not a number stands for one that is not known
     bool padWhenEmpty = false; // an empty group is followed by one element with default values
     TextLine title{};
-    Str choices{};                              // the texts of the indices, one a line; for a text what it may be
-    std::int32_t firstChoice = 0;               // the index of the first of them
-    int digits = 0;                             // significant ones, where a number is shown; 0 for the usual
-    std::optional<double> minimum{}, maximum{}; // what a user may enter, in base units
+    TextLine choices{};           // the texts of the indices, one a line; for a text what it may be
+    std::int32_t firstChoice = 0; // the index of the first of them
+    int digits = 0;               // significant ones, where a number is shown; 0 for the usual
+    Bounds bounds{};
 
     // What else a declaration says, one after the other.
     template <typename Value>
@@ -137,15 +154,15 @@ struct Field
         field.*member = value;
         return field;
     }
-    constexpr Field Title(Str text, int line = TextLine::Whole) const { return With(&Field::title, {text, line}); }
-    constexpr Field Title(const char* source) const { return With(&Field::title, {.source = source}); }
-    constexpr Field Choices(Str texts, std::int32_t first = 0) const
+    constexpr Field Title(TextLine text) const { return With(&Field::title, text); }
+    constexpr Field Title(Str text, int line) const { return Title({text, line}); }
+    constexpr Field Choices(TextLine texts, std::int32_t first = 0) const
     {
         return With(&Field::choices, texts).With(&Field::firstChoice, first);
     }
     constexpr Field Range(std::optional<double> least, std::optional<double> most = {}) const
     {
-        return With(&Field::minimum, least).With(&Field::maximum, most);
+        return With(&Field::bounds, {least, most});
     }
     constexpr Field Digits(int significant) const { return With(&Field::digits, significant); }
     constexpr Field OptionalTail() const { return With(&Field::optionalTail, true); }

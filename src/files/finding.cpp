@@ -9,14 +9,10 @@ std::string Quoted(std::string_view text)
     return '"' + std::string(text) + '"';
 }
 
-const char* KindText(FieldKind kind)
+/// Of one parameter.
+FieldKind OfOne(FieldKind kind)
 {
-    return VisitKind(kind, Overloads{[](std::type_identity<double>) { return "a number"; },
-                                     [](std::type_identity<bool>) { return "true or false"; },
-                                     [kind](std::type_identity<std::string>) {
-                                         return kind == FieldKind::Text ? "a text in quotes" : "a file name in < >";
-                                     },
-                                     [](auto) { return "an integer"; }});
+    return kind == FieldKind::DateTime ? FieldKind::Integer : kind;
 }
 
 const char* TypeText(TqlType type)
@@ -51,7 +47,8 @@ std::string OwnText(const Finding& finding)
     switch (finding.kind) {
     case Finding::WrongType:
     case Finding::OtherType:
-        return Parameter(finding) + " should be " + KindText(finding.expected) + ", found " + TypeText(finding.type) +
+        return Parameter(finding) + " should be " + KindText(OfOne(finding.expected)) + ", found " +
+               TypeText(finding.type) +
                (finding.kind == Finding::OtherType ? "; taken as " + finding.used : std::string());
     case Finding::CountDoesNotFit:
         return "the count " + finding.found.substr(0, finding.found.find_first_of(", ")) + " of " + finding.field +
@@ -92,6 +89,26 @@ std::string Shortened(std::string text)
 }
 
 } // namespace
+
+const char* KindText(FieldKind kind)
+{
+#define TQL_TEXT(context, english) english
+    switch (kind) {
+    case FieldKind::Number:
+        return TQL_TEXT("CKsFindingsModel", "a number");
+    case FieldKind::Boolean:
+        return TQL_TEXT("CKsFindingsModel", "true or false");
+    case FieldKind::Text:
+        return TQL_TEXT("CKsFindingsModel", "a text in quotes");
+    case FieldKind::FileName:
+        return TQL_TEXT("CKsFindingsModel", "a file name in < >");
+    case FieldKind::DateTime:
+        return TQL_TEXT("CKsFindingsModel", "six integers");
+    default:
+        return TQL_TEXT("CKsFindingsModel", "an integer");
+    }
+#undef TQL_TEXT
+}
 
 std::string FindingText(const Finding& finding)
 {

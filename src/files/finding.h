@@ -63,6 +63,8 @@ struct Finding
     bool NeedsAttention() const { return kind <= Repeated; }
 };
 
+/// What is expected of a value: English, and the source of its translations.
+const char* KindText(FieldKind kind);
 /// One sentence in English, without the place.
 std::string FindingText(const Finding& finding);
 

@@ -4,17 +4,28 @@
 
 namespace {
 
-/// The library's number syntax takes more: words, a point without digits behind it, no plus.
+/// The library knows no plus.
+std::string_view WithoutPlus(std::string_view text)
+{
+    return text.substr(text.starts_with('+') && !text.starts_with("+-"));
+}
+
+template <typename Value>
+std::errc ParseWhole(std::string_view text, Value& value)
+{
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+    return end == text.data() + text.size() ? error : std::errc::invalid_argument;
+}
+
+/// The library's number syntax takes more: words, a point without digits behind it.
 std::errc Parse(std::string_view text, double& value)
 {
-    if (text.starts_with('+') && !text.starts_with("+-"))
-        text.remove_prefix(1);
+    text = WithoutPlus(text);
     const auto point = text.find('.');
     if (text.find_first_not_of("0123456789.eE+-") != std::string_view::npos ||
         (point != std::string_view::npos && text.find_first_of("0123456789", point) != point + 1))
         return std::errc::invalid_argument;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-    return end == text.data() + text.size() ? error : std::errc::invalid_argument;
+    return ParseWhole(text, value);
 }
 
 /// Whether a valid number that no double holds is too small rather than too large.
@@ -41,4 +52,10 @@ std::optional<double> ReadNumber(std::string_view text)
     if (error == std::errc::result_out_of_range && IsTiny(text))
         return 0.0;
     return error == std::errc() ? std::optional(value) : std::nullopt;
+}
+
+std::optional<std::int32_t> ReadInteger(std::string_view text)
+{
+    std::int32_t value = 0;
+    return ParseWhole(WithoutPlus(text), value) == std::errc() ? std::optional(value) : std::nullopt;
 }

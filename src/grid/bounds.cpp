@@ -2,8 +2,9 @@
 
 #include "grid/grid_texts.h"
 
-QString Bounds::Text(const CKsEditStyle& style) const
+QString BoundsText(const Bounds& bounds, const CKsEditStyle& style)
 {
+    const auto& [minimum, maximum] = bounds;
     const auto text = [&style](double bound) { return KsShortestNumber(style.UnitConvertFromBase(bound, 1)); };
     if (minimum && maximum)
         return GridTexts::tr("%1 to %2").arg(text(*minimum), text(*maximum));

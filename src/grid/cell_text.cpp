@@ -33,7 +33,7 @@ QString ShownText(const ColumnSpec& column, const CellValue& value)
     if (decimals == AsFormatted || KsUnits::Instance().AllDigits())
         return column.style.ShownText(*number);
     if (decimals == UpToThousandths)
-        return KsShortestNumber(std::round(column.style.UnitConvertFromBase(*number, 1) * 1000) / 1000);
+        return column.style.RoundedText(*number);
     return KsFormatNumber(QStringLiteral("%-.%1lf").arg(decimals), column.style.UnitConvertFromBase(*number, 1));
 }
 
@@ -97,9 +97,8 @@ CellReading ReadCell(const ColumnSpec& column, const QString& text)
         return {{}, GridTexts::tr("One of these is required: %1").arg(column.choices.entries().join(", "))};
     }
     if (column.Kind() == CellKind::Integer) {
-        bool isInteger = false;
-        const std::int32_t value = text.toInt(&isInteger);
-        return isInteger ? CellReading{value, {}} : CellReading{{}, GridTexts::tr("Please enter an integer.")};
+        const auto integer = ReadInteger(text.toStdString());
+        return integer ? CellReading{*integer, {}} : CellReading{{}, GridTexts::tr("Please enter an integer.")};
     }
     const auto number = ReadNumber(text.toStdString());
     if (!number)

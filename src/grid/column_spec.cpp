@@ -1,10 +1,11 @@
 #include "grid/column_spec.h"
 
 #include "base/not_given.h"
+#include "files/read_number.h"
 #include "grid/grid_texts.h"
 #include "grid/typing.h"
+#include "ks/fc/exchange.h"
 
-#include <QCoreApplication>
 #include <cmath>
 
 CellAccess FieldAccess(const Field& field)
@@ -20,11 +21,11 @@ CellAccess FieldAccess(const Field& field)
         else if (std::is_same_v<T, double> && field.mayBeUnknown)
             return {[field](const void* row) -> CellValue {
                         const double value = field.In<double>(row);
-                        return std::isnan(value) ? NotGiven : value;
+                        return std::isnan(value) ? NotGiven : value; // the one mark that cells know
                     },
                     [field](void* row, const CellValue& value) {
                         const double given = std::get<double>(value);
-                        field.In<double>(row) = given == NotGiven ? std::nan("") : given;
+                        field.In<double>(row) = given == NotGiven ? KsUnset : given;
                     }};
         else
             return {[field](const void* row) -> CellValue { return field.In<T>(row); },
@@ -49,20 +50,11 @@ std::optional<QString> Choices::EntryOf(const QString& text) const
 std::optional<std::int32_t> Choices::IndexOf(const QString& text) const
 {
     const QStringList texts = entries();
-    const QString wanted = text.trimmed();
     const qsizetype entry = texts.indexOf(EntryOf(text).value_or(QString()));
     if (entry >= 0)
         return first + std::int32_t(entry);
-    bool isNumber = false;
-    const std::int32_t number = wanted.toInt(&isNumber);
-    if (isNumber && number >= first && number - first < texts.size())
-        return number;
-    return std::nullopt;
-}
-
-QString UnitToolTip(const QString& unit)
-{
-    return unit.isEmpty() ? QString() : QCoreApplication::translate("CKsEditStyle", "Unit: %1").arg(unit);
+    const auto number = ReadInteger(text.trimmed().toStdString());
+    return number && *number >= first && *number - first < texts.size() ? number : std::nullopt;
 }
 
 QString NumberText(const QString& number, const QString& unit)
@@ -77,7 +69,7 @@ QString WithUnit(const QString& name, UnitGroup group)
 
 QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit)
 {
-    const QString unitTip = UnitToolTip(unit);
+    const QString unitTip = KsUnitToolTip(unit);
     if (!style.HidesDigits(value, shown))
         return unitTip;
     const QString full = GridTexts::tr("Full value: %1").arg(NumberText(style.FullText(value), unit));
@@ -116,7 +108,7 @@ CellValue ColumnSpec::NewLineValue() const
 
 QString ColumnSpec::ToolTip(bool isHeader) const
 {
-    const QString unitTip = UnitToolTip(UnitSymbol());
+    const QString unitTip = KsUnitToolTip(UnitSymbol());
     if (!isHeader || !hint)
         return unitTip;
     return unitTip.isEmpty() ? hint() : hint() + u'\n' + unitTip;

@@ -2,7 +2,6 @@
 #pragma once
 
 #include "files/field.h"
-#include "grid/bounds.h"
 #include "ks/units/edit_style.h"
 
 #include <QStringList>
@@ -84,8 +83,6 @@ struct Choices
     std::optional<std::int32_t> IndexOf(const QString& text) const;
 };
 
-/// "Unit: m"; empty for a quantity without unit.
-QString UnitToolTip(const QString& unit);
 /// "1500.6 m".
 QString NumberText(const QString& number, const QString& unit);
 /// "Width [m]".
@@ -105,7 +102,6 @@ struct ColumnSpec
 {
     // What a table says about its column, where that is not what the field says; see field_columns.h.
     std::function<QString()> header = {};
-    Str caption{};                // the number of the header's text
     int width = 72;               // pixels at the original font size; the grid scales it
     bool asFormatted = false;     // a number stands with six decimals, not with the control's
     const double* fill = nullptr; // enters new lines, and blank cells when the page is left; as it is, not converted

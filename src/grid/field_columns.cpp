@@ -1,13 +1,5 @@
 #include "grid/field_columns.h"
 
-const Field& FieldColumns::FieldAt(FieldList fields, void* object, const void* member)
-{
-    for (const Field& field : fields)
-        if (field.address(object) == member)
-            return field;
-    Q_UNREACHABLE(); // a member that is no parameter of the file
-}
-
 GridControl FieldColumns::ControlFor(const Field& field, const ColumnSpec& column) const
 {
     const bool hasChoices = bool(column.choices.entries);
@@ -63,16 +55,15 @@ void FieldColumns::AddGlobalRow(ColumnSpec& column, CellAccess& access) const
 FieldColumns& FieldColumns::Add(const Field& field, CellAccess access, ColumnSpec column)
 {
     if (!column.header) {
-        const TextLine title = column.caption != Str{} ? TextLine{column.caption} : field.title;
         const UnitGroup named = m_style.besideAPicture ? field.unit : UnitGroup::None;
-        column.header = [text = m_style.text, title, named] {
+        column.header = [text = m_style.text, title = field.title, named] {
             return named == UnitGroup::None ? text(title) : WithUnit(text(title), named);
         };
     }
     column.style = CKsEditStyle(field.unit);
     if (field.digits)
         column.style.SetFormat(QStringLiteral("%.%1lg").arg(field.digits));
-    column.bounds = {field.minimum, field.maximum};
+    column.bounds = field.bounds;
     if (m_style.besideAPicture) {
         column.width = 0;
         column.isRequired = column.Kind() == CellKind::Number && !column.emptyIsNotGiven;
@@ -86,10 +77,8 @@ FieldColumns& FieldColumns::Add(const Field& field, CellAccess access, ColumnSpe
 
 FieldColumns& FieldColumns::Value(CellAccess access, const Field& field, ColumnSpec column)
 {
-    if (field.choices != Str{}) {
-        column.choices.entries = [text = m_style.text, entries = field.choices] {
-            return text({entries}).split(u'\n');
-        };
+    if (field.choices) {
+        column.choices.entries = [text = m_style.text, entries = field.choices] { return text(entries).split(u'\n'); };
         column.choices.first = field.firstChoice;
     }
     column.emptyIsNotGiven = column.emptyIsNotGiven || field.mayBeUnknown;

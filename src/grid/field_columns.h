@@ -32,9 +32,7 @@ public:
     template <typename Row, typename T>
     FieldColumns& Value(T Row::*member, ColumnSpec column = {})
     {
-        static Row row;
-        using Object = std::conditional_t<std::is_base_of_v<HD_RiverPos, Row>, HD_RiverPos, Row>;
-        return Value(FieldAt(Row::DeclaredFields(), static_cast<Object*>(&row), &(row.*member)), std::move(column));
+        return Value(FieldOf(member), std::move(column));
     }
     /// A value that the rows reach in a way of their own; `field` says the rest.
     FieldColumns& Value(CellAccess access, const Field& field, ColumnSpec column = {});
@@ -42,7 +40,6 @@ public:
     FieldColumns& Button(ColumnSpec column);
 
 private:
-    static const Field& FieldAt(FieldList fields, void* object, const void* member);
     GridControl ControlFor(const Field& field, const ColumnSpec& column) const;
     FieldColumns& Add(const Field& field, CellAccess access, ColumnSpec column);
     void AddGlobalRow(ColumnSpec& column, CellAccess& access) const;

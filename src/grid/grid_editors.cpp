@@ -1,5 +1,6 @@
 #include "grid/grid_editors.h"
 
+#include "grid/bounds.h"
 #include "grid/digits_mark.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_host.h"
@@ -255,7 +256,7 @@ bool CGridDelegate::Commit()
     const ColumnSpec& column = m_grid->Model()->Column(m_index.column());
     const QString place = GridTexts::tr("%1, line %2").arg(column.header()).arg(m_index.row() + 1);
     TellRefusal(*editor, refusal,
-                RefusalDetails(place, TextOf(editor), column.bounds.Text(column.style), column.UnitSymbol()));
+                RefusalDetails(place, TextOf(editor), BoundsText(column.bounds, column.style), column.UnitSymbol()));
     return false;
 }
 

@@ -51,7 +51,7 @@ QString RefusalDetails(const QString& place, const QString& typed, const QString
     if (!allowed.isEmpty())
         lines << GridTexts::tr("Allowed: %1").arg(allowed);
     if (!unit.isEmpty())
-        lines << UnitToolTip(unit);
+        lines << KsUnitToolTip(unit);
     return lines.join(u'\n');
 }
 

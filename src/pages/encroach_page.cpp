@@ -24,26 +24,27 @@ enum Reduction
     BankByBank = 3
 };
 
-/// Whether the method of a line uses the field. Choices that nobody knows may use anything.
-bool IsUsed(std::string_view field, const HDEncroach& line)
+/// Whether the method of a line uses one of its values. Choices that nobody knows may use anything.
+bool IsUsed(const void* value, const HDEncroach& line)
 {
+    const auto isOneOf = [value](const auto&... members) { return (... || (value == &members)); };
     const std::int32_t method = line.EncOption1;
     const bool isKnown = method >= FixedPositions && method <= TargetLevelAndEnergy;
-    if (!isKnown || field == "EncOption1" || field == "EncOption2")
+    if (!isKnown || isOneOf(line.EncOption1, line.EncOption2))
         return true;
-    if (field == "EncValues1.1" || field == "EncValues1.2") // offsets
+    if (isOneOf(line.EncValues1[0], line.EncValues1[1])) // offsets
         return method != FixedPositions;
-    if (field == "EncValues1.3" || field == "EncValues1.4") // positions
+    if (isOneOf(line.EncValues1[2], line.EncValues1[3])) // positions
         return method == FixedPositions;
-    if (field == "EncValues1.5") // width
+    if (isOneOf(line.EncValues1[4])) // width
         return method == FixedWidth;
-    if (field == "EncOption3") // how a reduction is shared
+    if (isOneOf(line.EncOption3)) // how a reduction is shared
         return method >= ConveyanceReduction;
-    if (field == "EncValues2.1") // total reduction
+    if (isOneOf(line.EncValues2[0])) // total reduction
         return method == ConveyanceReduction && line.EncOption3 != BankByBank;
-    if (field == "EncValues2.2" || field == "EncValues2.3") // of the banks
+    if (isOneOf(line.EncValues2[1], line.EncValues2[2])) // of the banks
         return method == ConveyanceReduction && (line.EncOption3 < 1 || line.EncOption3 >= BankByBank);
-    return method == TargetLevelAndEnergy || (method == TargetLevel && field == "EncValues2.4");
+    return method == TargetLevelAndEnergy || (method == TargetLevel && isOneOf(line.EncValues2[3]));
 }
 
 /// A set-up more, or one less.
@@ -141,16 +142,15 @@ void CEncroachPage::DeclareColumns()
     GridColumns columns = Grid(m_ui.grid_1348);
     columns.BranchName({.width = 110}).Chainage({});
     for (const Field& field : HDEncroach::DeclaredFields()) {
-        ColumnSpec options{
-            .locked =
-                [name = field.name](const void* row) {
-                    const auto* record = static_cast<const HD_RiverPos*>(row);
-                    return !IsUsed(name, *static_cast<const HDEncroach*>(record));
-                },
-            .hint =
-                [name = field.name] {
-                    return LoadString(Str::StoredAs).arg(QString::fromLatin1(name.data(), name.size()));
-                }};
+        ColumnSpec options{.locked =
+                               [&field](const void* row) {
+                                   const auto* record = static_cast<const HD_RiverPos*>(row);
+                                   return !IsUsed(field.constAddress(row), *static_cast<const HDEncroach*>(record));
+                               },
+                           .hint =
+                               [name = field.name] {
+                                   return LoadString(Str::StoredAs).arg(QString::fromLatin1(name.data(), name.size()));
+                               }};
         if (field.kind == FieldKind::Choice) {
             options.width = 130;
             options.choices = {.whenEmptied = field.firstChoice};

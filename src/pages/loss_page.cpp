@@ -13,10 +13,8 @@ public:
     {
         auto columns = Grid(m_ui.grid);
         columns.BranchName({.width = 100}).Chainage({.width = 72});
-        int number = 0;
         for (const Field& field : HD_Waterloss::DeclaredFields())
-            columns.Value(field,
-                          {.header = [n = ++number] { return LoadString(Str::WaterLossNumber).arg(n); }, .width = 82});
+            columns.Value(field, {.width = 82});
     }
 };
 

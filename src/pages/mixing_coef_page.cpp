@@ -17,19 +17,14 @@ public:
         Bindings().Add(m_ui.coef_1332, mixing.MixCoef3);
         Bindings().Add(m_ui.coef_1333, mixing.MixCoef4);
 
-        const auto coefficient = [](int number, const double& global) {
-            return ColumnSpec{.header = [number] { return LoadString(Str::MixCoefNumber).arg(number); },
-                                 .width = 60,
-                                 .fill = &global};
-        };
         using R = HDMixingCoef;
         Grid(m_ui.grid_1335)
             .BranchName({.width = 110})
             .Chainage({})
-            .Value(&R::MixCoef1, coefficient(1, mixing.MixCoef1))
-            .Value(&R::MixCoef2, coefficient(2, mixing.MixCoef2))
-            .Value(&R::MixCoef3, coefficient(3, mixing.MixCoef3))
-            .Value(&R::MixCoef4, coefficient(4, mixing.MixCoef4));
+            .Value(&R::MixCoef1, {.width = 60, .fill = &mixing.MixCoef1})
+            .Value(&R::MixCoef2, {.width = 60, .fill = &mixing.MixCoef2})
+            .Value(&R::MixCoef3, {.width = 60, .fill = &mixing.MixCoef3})
+            .Value(&R::MixCoef4, {.width = 60, .fill = &mixing.MixCoef4});
         for (GridColumns pairs :
              {PairsGrid(m_ui.pairs_1334, mixing.CoefPairs), PairsGrid(m_ui.linePairs_1336, &R::CoefPairs)})
             pairs.Value(&CMixingWCCoef::First).Value(&CMixingWCCoef::Second);

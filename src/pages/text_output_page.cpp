@@ -35,7 +35,7 @@ CTextOutputPage::CTextOutputPage(CKavo0_hdDoc* document) : CDialogPage(document,
         grid->SetLineChoice(LineChoice::CurrentLine);
     Grid(m_ui.grid_1217)
         .BranchName({.width = 110})
-        .Chainage({.caption = Str::UpstreamChainage})
+        .Chainage({.header = LineOf(Str::UpstreamChainage)})
         .Value(&HDOutputGridPoint::PointValue, {.emptyIsNotGiven = true});
     ItemsGrid(m_ui.items_1216, output.OutputItems)
         .Value(&CTextOutItem::Item, {.width = 200})

@@ -16,7 +16,7 @@ public:
         Bindings().Add(m_ui.wave_1010, Globals().G_wave);
         Grid(m_ui.grid_1011)
             .BranchName({.width = 110})
-            .Chainage({.caption = Str::UpstreamChainage})
+            .Chainage({.header = LineOf(Str::UpstreamChainage)})
             .Value(&HD_Wavetype::DownstreamChainage, {.emptyIsNotGiven = true})
             .Value(&HD_Wavetype::WaveApproximation,
                    {.width = 150, .choices = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});

@@ -97,9 +97,8 @@ CWLMarkPage::CWLMarkPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Par
         return Bindings().Declaration(&group).group->elements()[0];
     };
     RowsGrid(m_ui.titles_1075, MakeMarkTitleRows(*document))
-        .Value(TitleAccess(), element(Globals().MarkTitles),
-               {.caption = Str::MarkTitle, .width = 300, .upperCase = true})
-        .Value(InterpolateAccess(), element(Globals().MarkInterpolate), {.caption = Str::MarkInterpolate, .width = 50});
+        .Value(TitleAccess(), element(Globals().MarkTitles), {.width = 300, .upperCase = true})
+        .Value(InterpolateAccess(), element(Globals().MarkInterpolate), {.width = 50});
     Bindings().Always([this] { ShowLevelColumns(); });
     // With an untitled column go its levels.
     LeaveOut({{m_ui.titles_1075, &IsUntitled}}, m_ui.status_1076, Str::MarksWithoutTitle, Str::DroppedTitle,

@@ -9,12 +9,11 @@ constexpr const char *TargetName = "KVR_PROJECT", *MembersName = "Members", *Mem
 
 using P = ProjectFile;
 constexpr auto members = FieldsOf<P>({Group<&P::members>(MemberName)});
-constexpr DeclaredKeyword memberKeywords[] = {{MemberName, members}};
+constexpr DeclaredKeyword memberKeywords[] = {{MemberName, members, Presence::EachLine}};
 constexpr DeclaredSection sections[] = {
-    {.name = MembersName, .kept = Keeps<&P::keptMembers>(), .keywords = memberKeywords, .required = true}};
-constexpr DeclaredFile file{
-    {.name = TargetName, .kept = Keeps<&P::kept>(), .sections = sections, .sectionCount = std::size(sections)},
-    Keeps<&P::keptTargets>()};
+    {.name = MembersName, .kept = Keeps<&P::kept>(), .keywords = memberKeywords, .required = true}};
+constexpr DeclaredSection file{
+    .name = TargetName, .kept = Keeps<&P::kept>(), .sections = sections, .sectionCount = std::size(sections)};
 
 } // namespace
 
@@ -25,7 +24,7 @@ QString ProjectMember::PathIn(const QDir& folder) const
     return QDir::cleanPath(folder.absoluteFilePath(QString::fromStdString(file).replace(u'\\', u'/')));
 }
 
-const DeclaredFile& DeclaredProjectFile()
+const DeclaredSection& DeclaredProjectFile()
 {
     return file;
 }

@@ -21,9 +21,9 @@ struct ProjectMember
 struct ProjectFile
 {
     std::vector<ProjectMember> members;
-    UnknownNodes kept, keptMembers, keptTargets;
+    KeptContent kept;
 };
 
-const DeclaredFile& DeclaredProjectFile();
+const DeclaredSection& DeclaredProjectFile();
 /// Where the members' keywords stand, by number.
 tqlHandle MemberKeyword(tqlHandle structure, int number);

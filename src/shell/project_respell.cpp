@@ -36,7 +36,7 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
         return {};
     ProjectFile project;
     LoadReport report(structure.value().Get());
-    ReadDeclared(structure.value().Get(), DeclaredProjectFile(), &project, report);
+    ReadDeclaredFile(structure.value().Get(), DeclaredProjectFile(), &project, report);
     const QDir folder = QFileInfo(projectPath).absoluteDir();
     int number = 0; // of the keyword: an entry that is none is no member
     for (const ProjectMember& member : project.members) {

@@ -17,7 +17,7 @@ bool ReadMembers(CProject& project, QString& error)
     ProjectFile read;
     CKsDocumentFile file;
     file.Read(project.path, project.path, [&read](tqlHandle structure, LoadReport& report) {
-        ReadDeclared(structure, DeclaredProjectFile(), &read, report);
+        ReadDeclaredFile(structure, DeclaredProjectFile(), &read, report);
     });
     error = file.WhyNothing();
     project.findings = file.Findings();

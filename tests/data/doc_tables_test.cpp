@@ -28,11 +28,11 @@ std::string Values(const Field& field)
         return text.str();
     };
     std::string known;
-    if (field.minimum || field.maximum)
-        known = !field.maximum   ? "at least " + number(*field.minimum)
-                : !field.minimum ? "at most " + number(*field.maximum)
-                                 : number(*field.minimum) + " to " + number(*field.maximum);
-    std::istringstream entries(EnglishText(field.choices));
+    if (const auto& [minimum, maximum] = field.bounds; minimum || maximum)
+        known = !maximum   ? "at least " + number(*minimum)
+                : !minimum ? "at most " + number(*maximum)
+                           : number(*minimum) + " to " + number(*maximum);
+    std::istringstream entries(EnglishText(field.choices.text));
     std::int32_t index = field.firstChoice;
     for (std::string entry; std::getline(entries, entry); ++index) {
         entry = PlainText(entry);
@@ -85,16 +85,19 @@ std::string GlobalTable()
 {
     const HD_Global_Var global;
     std::string table = "| Section | Keyword | Parameters | Default |\n|---|---|---|---|\n";
-    for (const GlobalSection& section : HDGlobalSections()) {
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
         std::string name = '`' + std::string(section.name) + '`';
-        for (const GlobalKeyword& row : section.keywords) {
+        for (const DeclaredKeyword& row : section.keywords) {
             table += "| " + name + " | `" + std::string(row.name) + "` | " + Described(row.Fields(), row.name) + " | " +
                      Default(row.Fields(), &global) + " |\n";
             name.clear();
         }
-        for (const Field& items : section.items)
+        for (const DeclaredSection& items : section.Sections()) {
+            const DeclaredKeyword& line = items.keywords.front();
             table += "| " + name + "| sub-section `" + std::string(items.name) + "`: keywords `" +
-                     std::string(HDItemKeyword) + "` | " + Described(items.group->elements(), {}) + " | none |\n";
+                     std::string(line.name) + "` | " + Described(line.Fields().front().group->elements(), {}) +
+                     " | none |\n";
+        }
     }
     return table;
 }

@@ -111,6 +111,6 @@ TEST(Fields, AreReachedThroughObjectsThatAreConst)
 TEST(Fields, SayWhatIsKnownAboutThemInOneDeclaration)
 {
     const Field field = Number<&Sample::number>("x", UnitGroup::Width).Range(0.5, 1).Digits(3).OptionalTail();
-    EXPECT_EQ(std::tuple(field.minimum, field.maximum, field.digits, field.optionalTail, field.unit),
-              std::tuple(0.5, 1.0, 3, true, UnitGroup::Width));
+    EXPECT_EQ(std::tuple(field.bounds, field.digits, field.optionalTail, field.unit),
+              std::tuple(Bounds{0.5, 1.0}, 3, true, UnitGroup::Width));
 }

@@ -66,11 +66,11 @@ inline void Disturb(FieldList fields, void* object, int& seed)
 template <typename Visit>
 void ForEachGlobal(Visit visit)
 {
-    for (const GlobalSection& section : HDGlobalSections()) {
-        for (const GlobalKeyword& row : section.keywords)
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
+        for (const DeclaredKeyword& row : section.keywords)
             visit(std::string(section.name) + "/" + std::string(row.name), row.Fields());
-        for (const Field& items : section.items)
-            visit(std::string(section.name) + "/" + std::string(items.name), FieldList(&items, 1));
+        for (const DeclaredSection& items : section.Sections())
+            visit(std::string(section.name) + "/" + std::string(items.name), items.keywords.front().Fields());
     }
 }
 

@@ -16,6 +16,16 @@ TEST(NumberSyntax, AcceptsAndRejects)
     EXPECT_FALSE(IsValidNumber("１")); // a full-width digit
 }
 
+TEST(NumberSyntax, IntegersOf32Bits)
+{
+    const std::pair<const char*, std::int32_t> taken[] = {
+        {"0", 0}, {"+3", 3}, {"-007", -7}, {"2147483647", 2147483647}, {"-2147483648", -2147483647 - 1}};
+    for (const auto& [text, value] : taken)
+        EXPECT_EQ(ReadInteger(text), value) << text;
+    for (const char* text : {"", "+", "-", "--1", "+-1", "1.0", "1e3", " 1", "1 ", "0x10", "2147483648", "-2147483649"})
+        EXPECT_EQ(ReadInteger(text), std::nullopt) << text;
+}
+
 TEST(NumberSyntax, Reads)
 {
     const struct

@@ -117,17 +117,17 @@ TEST(Layout, NewRecordsAreTheRecordedOnes)
 
 TEST(Layout, NamesInTheTablesAreUnique)
 {
-    std::set<std::string_view> sections{HDGlobalSectionName};
-    for (const GlobalSection& section : HDGlobalSections()) {
+    std::set<std::string_view> sections{HDGlobals().name};
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
         EXPECT_TRUE(sections.insert(section.name).second) << section.name;
         std::set<std::string_view> names;
-        for (const GlobalKeyword& row : section.keywords) {
+        for (const DeclaredKeyword& row : section.keywords) {
             EXPECT_TRUE(names.insert(row.name).second) << row.name;
             EXPECT_TRUE(row.onlyWith.empty() || names.contains(row.onlyWith)) << row.name;
         }
-        for (const Field& items : section.items) {
+        for (const DeclaredSection& items : section.Sections()) {
             EXPECT_TRUE(sections.insert(items.name).second) << items.name;
-            EXPECT_TRUE(items.group && items.group->extra) << items.name;
+            EXPECT_TRUE(items.keywords.front().Fields().front().group->extra) << items.name;
         }
     }
     HD_Parameters parameters;
@@ -145,11 +145,11 @@ TEST(Layout, EverySectionAndKeywordIsDocumented)
     const auto expect = [&document](std::string_view name) {
         EXPECT_NE(document.find("`" + std::string(name) + "`"), std::string::npos) << name;
     };
-    for (const GlobalSection& section : HDGlobalSections()) {
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
         expect(section.name);
-        for (const GlobalKeyword& row : section.keywords)
+        for (const DeclaredKeyword& row : section.keywords)
             expect(row.name);
-        for (const Field& items : section.items)
+        for (const DeclaredSection& items : section.Sections())
             expect(items.name);
     }
     for (const ListEntry& entry : HDLists())

@@ -22,7 +22,7 @@ TEST_F(KsTest, AFileThatIsOpenComesToTheFront)
     TextDoc* first = Open(Write("one.tst", "1"));
     Open(Write("two.tst", "2"));
     EXPECT_EQ(Open(folder.path() + "/./one.tst"), first);
-    EXPECT_EQ(documents.Documents().size(), 2u);
+    EXPECT_EQ(documents.findChildren<CKsDoc*>().size(), 2);
     EXPECT_EQ(frame.GetActiveView(), ViewOf(first));
 }
 
@@ -34,7 +34,7 @@ TEST_F(KsTest, WhatCannotBeOpenedIsToldAndLeavesNothing)
         EXPECT_THAT(asked.takeLast().toStdString(), HasSubstr(name));
     }
     EXPECT_FALSE(Open(Write("no.tst", "refuse"))); // the document refuses, and has told why itself
-    EXPECT_TRUE(documents.Documents().empty());
+    EXPECT_TRUE(documents.findChildren<CKsDoc*>().empty());
     EXPECT_TRUE(frame.MdiArea().subWindowList().isEmpty());
 }
 
@@ -101,5 +101,5 @@ TEST_F(KsTest, TheViewGoesBeforeItsDocument)
     Settle();
     EXPECT_FALSE(watch);
     EXPECT_TRUE(LogView::log.contains("a gone river.tst"));
-    EXPECT_EQ(documents.Documents().size(), 1u);
+    EXPECT_EQ(documents.findChildren<CKsDoc*>().size(), 1);
 }

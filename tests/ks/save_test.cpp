@@ -107,7 +107,7 @@ TEST_F(KsTest, ClosingTheLastWindowAsks)
             WindowOf(document)->close();
         }
         Settle();
-        EXPECT_TRUE(documents.Documents().empty());
+        EXPECT_TRUE(documents.findChildren<CKsDoc*>().empty());
     }
 }
 
@@ -138,15 +138,15 @@ TEST_F(KsTest, OneRefusalKeepsAllWindows)
     EXPECT_FALSE(frame.CloseAllWindows());
     EXPECT_EQ(asked.size(), 2);
     Settle();
-    EXPECT_EQ(documents.Documents().size(), 3u);
-    EXPECT_TRUE(documents.Documents()[0]->IsModified());
+    EXPECT_EQ(documents.findChildren<CKsDoc*>().size(), 3);
+    EXPECT_TRUE(documents.findChildren<CKsDoc*>()[0]->IsModified());
 
     asked.clear();
     answers = {Button::Discard, Button::Discard, Button::Discard};
     EXPECT_TRUE(frame.CloseAllWindows());
     EXPECT_EQ(asked.size(), 3) << "each once";
     Settle();
-    EXPECT_TRUE(documents.Documents().empty());
+    EXPECT_TRUE(documents.findChildren<CKsDoc*>().empty());
 }
 
 TEST_F(KsTest, WhatCannotBeTakenStopsSavingAndClosing)

@@ -93,7 +93,7 @@ TEST_F(ExchangeTest, AFileIsFoundInWhateverCaseItIsSpelt)
     auto* view = Open(path);
     CObList items = Items(0, "MAIN", 5);
     KvrMSGInsertData(spelt, nullptr, &items);
-    EXPECT_EQ(documents->Documents().size(), 1u);
+    EXPECT_EQ(documents->findChildren<CKsDoc*>().size(), 1);
     EXPECT_EQ(List(*view, 0).GetCount(), 3u) << "into the open document";
     EXPECT_EQ(Open(spelt), view);
 }
@@ -324,7 +324,7 @@ TEST_F(ExchangeTest, WithoutAViewTheFileIsOpenedOnce)
     const CString path = WriteFile("river.hdkv");
     CObList items = Items(0, "MAIN", 5);
     KvrMSGInsertData(path, nullptr, &items);
-    ASSERT_EQ(documents->Documents().size(), 1u);
+    ASSERT_EQ(documents->findChildren<CKsDoc*>().size(), 1);
     auto* view = static_cast<CKavo0_hdView*>(frame.GetActiveView());
     ASSERT_NE(view, nullptr);
     EXPECT_EQ(List(*view, 0).GetCount(), 3u);
@@ -334,7 +334,7 @@ TEST_F(ExchangeTest, WithoutAViewTheFileIsOpenedOnce)
     grid->SetCurrentCell(1, 3);
     QTest::keyClicks(grid, "8");
     KvrMSGDeleteData(folder.path() + "/./river.hdkv", nullptr, &items);
-    EXPECT_EQ(documents->Documents().size(), 1u) << "the same file";
+    EXPECT_EQ(documents->findChildren<CKsDoc*>().size(), 1) << "the same file";
     EXPECT_EQ(List(*view, 0).GetCount(), 2u);
     EXPECT_EQ(Parameters(*view).InitList.GetAt(0).InitialH, 8);
 
@@ -346,7 +346,7 @@ TEST_F(ExchangeTest, WithoutAViewTheFileIsOpenedOnce)
     KsSetMainWindow(this); // no frame to open windows in
     KvrMSGInsertData(WriteFile("other.hdkv"), nullptr, &items);
     EXPECT_EQ(log.Take(), 1);
-    EXPECT_EQ(documents->Documents().size(), 1u);
+    EXPECT_EQ(documents->findChildren<CKsDoc*>().size(), 1);
     EXPECT_TRUE(boxes.isEmpty());
     answer = QMessageBox::Discard;
     EXPECT_TRUE(frame.CloseAllWindows());

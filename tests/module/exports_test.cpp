@@ -1,4 +1,5 @@
 // The plug-in as the shell sees it: loaded by name, reached through its exported functions alone.
+#include "files/extensions.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/hd_messages.h"
@@ -47,6 +48,7 @@ TEST_F(ExportsTest, AnswersAsTheShellExpects)
     EXPECT_NE(first, second);
     EXPECT_EQ(first->ResourceId(), 4953);
     EXPECT_EQ(first->GetDocString(CMultiDocTemplate::windowTitle), "Kvr_Help.chm");
+    EXPECT_EQ(first->GetDocString(CMultiDocTemplate::filterExt), HDExtension) << "a text of its own";
     EXPECT_EQ(first->GetDocString(CMultiDocTemplate::regFileTypeName), "HDPar Document");
 }
 

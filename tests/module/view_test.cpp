@@ -192,7 +192,7 @@ TEST_F(ViewTest, AChangeIsToldToTheProjectAndLeavingIsToo)
     ASSERT_EQ(messages.size(), 2u);
     EXPECT_EQ(messages[0].request, KsRequest::LeaveProject);
     EXPECT_EQ(messages[1].request, KsRequest::DataChanged);
-    EXPECT_TRUE(documents->Documents().empty());
+    EXPECT_TRUE(documents->findChildren<CKsDoc*>().empty());
 }
 
 TEST_F(ViewTest, ToolBarFollowsActivation)

@@ -68,10 +68,10 @@ MUTANTS = [
     ('network', 'editors/network/join_lines.cpp', 'ends.size() == 2 &&', 'ends.size() >= 2 &&'),
     ('network', 'editors/network/join_lines.cpp', '(joined.line.empty() ? 0 : 1)', '0'),
     ('cross_sections', 'editors/cross_sections/section_rules.cpp', 'std::greater()', 'std::greater_equal()'),
-    ('cross_sections', 'files/declared_section.cpp', 'params.onlyFinite = true;', ''),
-    ('cross_sections', 'files/declared_section.cpp', 'if (params.param)\n', 'if (false)\n'),
+    ('cross_sections', 'files/declared_section.cpp', 'params.onlyFinite = m_isStrict;', ''),
+    ('cross_sections', 'files/declared_section.cpp', 'if (!params.param)\n', 'if (true)\n'),
     ('cross_sections', 'ks/fc/document_file.cpp', 'replaces && CopySuffix() && m_keptCopy.isEmpty()', 'replaces && CopySuffix() && false'),
-    ('cross_sections', 'editors/cross_sections/section_rules.cpp', 'if (section.width < 0)', 'if (section.width < -1)'),
+    ('cross_sections', 'editors/cross_sections/section_file.cpp', '.MayBeUnknown().Range(0)', '.MayBeUnknown().Range(-1)'),
     # The host.
     ('shell', 'shell/recent_files.cpp', 'files.removeAll(clean);\n', ''),
     ('shell', 'shell/recent_files.cpp', 'Write(files.mid(0, Longest));', 'Write(files);'),

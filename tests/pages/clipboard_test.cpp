@@ -5,27 +5,6 @@
 
 #include <QClipboard>
 
-TEST(TableText, RoundTripAndForeignTexts)
-{
-    const std::vector<QStringList> odd = {{"a", "", "tab\there"}, {"line\nend", "\"quoted\"", " blank "}, {"", "", ""}};
-    EXPECT_EQ(ReadTable(WriteTable(odd)), odd);
-    const struct
-    {
-        const char* text;
-        std::vector<QStringList> table;
-    } cases[] = {
-        {"", {{""}}},
-        {"1\t2\r\n3\t4\r\n", {{"1", "2"}, {"3", "4"}}},
-        {"1\r2", {{"1"}, {"2"}}},
-        {"\t\n", {{"", ""}}},
-        {"a\n\nb", {{"a"}, {""}, {"b"}}},
-        {"\"a\nb\"\tc", {{"a\nb", "c"}}},
-        {"5\" pipe\t\"open", {{"5\" pipe", "\"open"}}},
-    };
-    for (const auto& c : cases)
-        EXPECT_EQ(ReadTable(c.text), c.table) << c.text;
-}
-
 class ClipboardTest : public PageTest
 {
 protected:

@@ -177,7 +177,7 @@ TEST_F(CtrlEditTest, ADisabledFieldShowsWhatIsStored)
 TEST_F(CtrlEditTest, RefusesAndKeepsTheFocus)
 {
     const double before = value;
-    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .minimum = 0.5, .maximum = 1.5});
+    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .bounds = {0.5, 1.5}});
     const struct
     {
         const char *text, *message;
@@ -212,7 +212,7 @@ TEST_F(CtrlEditTest, StoresInBaseUnits)
     field.Show();
     EXPECT_EQ(field.text(), "4.05042");
     EXPECT_TRUE(field.toolTip().endsWith("\nUnit: ft")) << field.toolTip().toStdString();
-    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .minimum = 0, .maximum = 4}); // metres
+    Setup({.name = "level", .unit = UnitGroup::WaterLevel, .bounds = {0, 4}}); // metres
     Type("10");
     QTest::keyClick(&field, Qt::Key_Return);
     EXPECT_NEAR(value, 3.048, 1e-5);

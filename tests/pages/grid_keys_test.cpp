@@ -8,18 +8,6 @@
 #include <QKeyEvent>
 #include <QSignalSpy>
 
-TEST(GridKeys, TableFindsEveryRow)
-{
-    for (const GridKey& row : GridKeys()) {
-        EXPECT_EQ(row.held & row.lookedAt, row.held) << row.key;
-        EXPECT_FALSE(row.Text().isEmpty()) << row.key;
-        EXPECT_EQ(FindGridKey(QKeyEvent(QEvent::KeyPress, row.key, row.held)), &row) << "hidden by an earlier row";
-    }
-    for (const int key : {Qt::Key_C, Qt::Key_V, Qt::Key_Z, Qt::Key_Up, Qt::Key_Escape})
-        EXPECT_EQ(FindGridKey(QKeyEvent(QEvent::KeyPress, key, Qt::NoModifier)), nullptr);
-    EXPECT_EQ(FindGridKey(QKeyEvent(QEvent::KeyPress, Qt::Key_Tab, Qt::ControlModifier)), nullptr);
-}
-
 class GridKeyTest : public PageTest
 {
 protected:

@@ -68,7 +68,7 @@ TEST_F(ShellTest, FilesAreDroppedIn)
     EXPECT_TRUE(enter.isAccepted());
     QDropEvent drop(QPointF(5, 5), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
     QApplication::sendEvent(frame.get(), &drop);
-    EXPECT_EQ(Texts().Documents().size(), 2u);
+    EXPECT_EQ(Texts().findChildren<CKsDoc*>().size(), 2);
 
     data.setUrls({QUrl::fromLocalFile(Write("c.png"))});
     QDragEnterEvent other(QPoint(5, 5), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);

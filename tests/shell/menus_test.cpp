@@ -116,7 +116,7 @@ TEST_F(ShellTest, TheWindowMenuListsTheWindows)
     EXPECT_EQ(frame->MdiArea().viewMode(), QMdiArea::SubWindowView);
     Action("actionCloseAll")->trigger();
     Settle();
-    EXPECT_TRUE(Texts().Documents().empty());
+    EXPECT_TRUE(Texts().findChildren<CKsDoc*>().empty());
 }
 
 TEST_F(ShellTest, AnEditorsToolBarShowsWithItsView)

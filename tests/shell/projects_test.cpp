@@ -40,7 +40,7 @@ TEST_F(ShellTest, AtTheStartTheFirstFileIsThereAtOnceAndTheOthersFollow)
     EXPECT_TRUE(frame->OpenFile(path, true));
     const auto opened = [this] {
         QStringList open;
-        for (const auto& document : Texts().Documents())
+        for (const auto& document : Texts().findChildren<CKsDoc*>())
             open << QFileInfo(document->GetPathName()).fileName();
         return open.join(' ').toStdString();
     };
@@ -150,7 +150,7 @@ TEST_F(ShellTest, AFileOpenBeforeItsProjectJoinsWhenTheProjectOpens)
     frame->OpenFile(path);
     Settle();
     EXPECT_NE(ProjectOf("a.tst"), 0);
-    EXPECT_EQ(Texts().Documents().size(), 1u);
+    EXPECT_EQ(Texts().findChildren<CKsDoc*>().size(), 1);
 }
 
 TEST_F(ShellTest, ClosingAProjectClosesItsWindowsOnly)
@@ -168,7 +168,7 @@ TEST_F(ShellTest, ClosingAProjectClosesItsWindowsOnly)
     answers << QMessageBox::Discard;
     EXPECT_TRUE(frame->Projects().Close(handle));
     Settle();
-    EXPECT_EQ(Texts().Documents().size(), 1u);
+    EXPECT_EQ(Texts().findChildren<CKsDoc*>().size(), 1);
     EXPECT_THAT(TakeLog(ViewOf("alone.tst")), ElementsAre(QString("project 3 %1").arg(handle)));
     EXPECT_FALSE(frame->Projects().Close(handle)) << "a handle is used once";
     EXPECT_FALSE(Action("actionCloseProject")->isEnabled());
@@ -266,7 +266,7 @@ TEST_F(ShellTest, AMemberIsFoundInWhateverCaseItWasSaved)
     EXPECT_NE(ProjectOf("a.TST"), 0);
     EXPECT_EQ(ViewOf("A.tst"), ViewOf("a.TST"));
     EXPECT_TRUE(frame->OpenFile(Path("A.tst")));
-    EXPECT_EQ(Texts().Documents().size(), 1u) << "it is open already";
+    EXPECT_EQ(Texts().findChildren<CKsDoc*>().size(), 1) << "it is open already";
     EXPECT_TRUE(frame->OpenFile(Path("P.KVRP")));
     EXPECT_EQ(frame->Projects().Registry().All().size(), 1u) << "so is the project";
 }
@@ -286,7 +286,7 @@ TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
     Action("actionCloseProject")->trigger();
     Settle();
     EXPECT_EQ(asked.size(), 2);
-    EXPECT_EQ(Texts().Documents().size(), 3u);
+    EXPECT_EQ(Texts().findChildren<CKsDoc*>().size(), 3);
     ASSERT_TRUE(frame->Projects().Registry().Find(handle));
     EXPECT_EQ(frame->Projects().Registry().Find(handle)->views.size(), 3u);
     EXPECT_EQ(frame->GetActiveView(), front);
@@ -299,7 +299,7 @@ TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
     Action("actionCloseProject")->trigger();
     Settle();
     EXPECT_EQ(asked.size(), 2) << "each question once";
-    EXPECT_TRUE(Texts().Documents().empty());
+    EXPECT_TRUE(Texts().findChildren<CKsDoc*>().empty());
     EXPECT_TRUE(frame->Projects().Registry().All().empty());
 }
 

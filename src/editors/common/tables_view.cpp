@@ -1,5 +1,6 @@
 #include "editors/common/tables_view.h"
 
+#include "editors/common/branch_names.h"
 #include "grid/grid_keys.h"
 #include "grid/grid_widths.h"
 
@@ -10,6 +11,7 @@
 #include <QUndoStack>
 #include <QVBoxLayout>
 #include <algorithm>
+#include <utility>
 
 CTablesView::~CTablesView()
 {
@@ -19,7 +21,24 @@ CTablesView::~CTablesView()
     }
 }
 
-CGenGrid* CTablesView::AddTable(QSplitter& side, QLabel*& title, const char* name)
+void CTablesView::MakeContent(QWidget& picture, int pictureWidth, int tablesWidth, const char* mainName,
+                              const char* partsName)
+{
+    auto* splitter = new QSplitter(Qt::Horizontal, this);
+    auto* side = new QSplitter(Qt::Vertical);
+    m_main = AddTable(*side, mainName);
+    m_parts = AddTable(*side, partsName);
+    m_lines = m_main.grid;
+    splitter->addWidget(&picture);
+    splitter->addWidget(side);
+    splitter->setStretchFactor(0, pictureWidth); // whatever the window's size
+    splitter->setStretchFactor(1, tablesWidth);
+    splitter->setCollapsible(0, false);
+    splitter->setSizes({pictureWidth, tablesWidth});
+    SetContent(splitter);
+}
+
+CTablesView::Table CTablesView::AddTable(QSplitter& side, const char* name)
 {
     auto* table = new CGenGrid;
     table->setObjectName(QString::fromLatin1(name));
@@ -28,7 +47,7 @@ CGenGrid* CTablesView::AddTable(QSplitter& side, QLabel*& title, const char* nam
     constexpr int least = 36; // letters, row numbers included: two columns are in sight beside the smallest picture
     table->setMinimumWidth(least * table->fontMetrics().averageCharWidth());
     table->SetLineChoice(LineChoice::LinesOfCells);
-    title = new QLabel;
+    auto* title = new QLabel;
     title->setWordWrap(true);
     title->setBuddy(table);
     auto* pane = new QWidget;
@@ -39,9 +58,7 @@ CGenGrid* CTablesView::AddTable(QSplitter& side, QLabel*& title, const char* nam
     side.addWidget(pane);
     connect(table->selectionModel(), &QItemSelectionModel::selectionChanged, this, &CTablesView::CommandsChanged);
     m_tables.push_back(table);
-    if (!m_lines)
-        m_lines = table;
-    return table;
+    return {table, title};
 }
 
 void CTablesView::OnInitialUpdate()
@@ -81,6 +98,94 @@ void CTablesView::changeEvent(QEvent* event)
         ShowDocument();
     }
     CKsProjectView::changeEvent(event);
+}
+
+int CTablesView::CurrentLine() const
+{
+    const auto rows = m_main.grid ? m_main.grid->Model()->Rows() : nullptr;
+    return rows ? std::min(m_main.grid->CurrentRow(), int(rows->Count())) - 1 : -1;
+}
+
+void CTablesView::LineCurrent(CGenGrid& grid)
+{
+    if (&grid == m_main.grid)
+        ShowParts();
+}
+
+void CTablesView::ShowDocument()
+{
+    m_main.grid->Reload();
+    ShowParts();
+}
+
+void CTablesView::ShowParts()
+{
+    const int line = CurrentLine();
+    if (std::exchange(m_partsOf, line) != line)
+        m_parts.grid->Model()->SetSource(*ProjectDoc(), MakePartRows(line));
+    m_parts.grid->setEnabled(line >= 0);
+    ShowInPicture(line);
+    m_parts.grid->Refresh();
+    m_parts.title->setText(PartTitle());
+}
+
+/// A part is shown once its line is current. The view that the user does not work in stays where it is.
+void CTablesView::RevealChange(const ChangePlace& place)
+{
+    const void* const lines = m_main.grid->Model()->Rows()->Data();
+    const bool isPart = place.list == lines;
+    if ((!isPart && place.data != lines) || IsEditing() || (!IsActive() && ProjectDoc()->Views().size() > 1))
+        return;
+    const int column = std::max(place.column, 1);
+    m_main.grid->SetCurrentCell(isPart ? place.listRow : place.row, isPart ? m_main.grid->CurrentColumn() : column);
+    if (isPart)
+        m_parts.grid->SetCurrentCell(place.row, column);
+    if (IsActive())
+        (isPart ? m_parts : m_main).grid->setFocus(Qt::OtherFocusReason);
+}
+
+// ---- other editors -----------------------------------------------------------------------------
+
+CTablesView::Answer CTablesView::CommonAnswerTo(WPARAM request)
+{
+    switch (request) {
+    case KsRequest::BranchNames:
+        return [branches = KnownBranches()](CObList& objects) {
+            AppendBranchNames(branches, objects);
+            return !branches.isEmpty();
+        };
+    case KsRequest::LocationShown:
+        return [this](CObList& objects) {
+            if (const auto* item = objects.empty() ? nullptr : dynamic_cast<CKvrCBELocation*>(objects.front().get()))
+                ShowLocation(*item);
+            return 0;
+        };
+    default:
+        return AnswerTo(request);
+    }
+}
+
+LRESULT CTablesView::OnRequest(WPARAM request, CKSComm_Package& package)
+{
+    if (!m_main.grid) // before the first update
+        return 0;
+    if (request == KsRequest::DataChanged) {
+        OthersChanged();
+        return 0;
+    }
+    const Answer answer = CommonAnswerTo(request);
+    if (!answer)
+        return CKsProjectView::OnRequest(request, package);
+    if (package.objects)
+        return answer(*package.objects);
+    qDebug("%s: request %llu without a list", metaObject()->className(), static_cast<unsigned long long>(request));
+    return 0;
+}
+
+void CTablesView::OnProjectsChanged()
+{
+    if (m_main.grid && !ProjectDoc()->ProjectHandle())
+        ProjectDoc()->JoinProject(this);
 }
 
 // ---- editing -----------------------------------------------------------------------------------
@@ -155,7 +260,7 @@ bool CTablesView::IsCommandEnabled(int id) const
     case Command::DeleteLine:
         return m_lines->HasLinesToDelete();
     default:
-        return m_search.CanRun(id, SearchedTable());
+        return m_search.CanRun(id, m_main.grid);
     }
 }
 
@@ -170,7 +275,7 @@ bool CTablesView::OnCommand(int id)
     else if (id == Command::DeleteLine)
         m_lines->DeleteSelectedLines();
     else
-        m_search.Run(id, *const_cast<CGenGrid*>(SearchedTable()));
+        m_search.Run(id, *m_main.grid);
     return true;
 }
 

@@ -18,7 +18,8 @@ CString DocumentStrings()
     const QStringList strings{"Kvr_Help.chm",
                               CrossSectionTexts::tr("Sections"),
                               CrossSectionTexts::tr("KVR Cross Sections"),
-                              CrossSectionTexts::tr("KVR Cross Sections (*.kvxs)"),
+                              CrossSectionTexts::tr("KVR Cross Sections") +
+                                  QStringLiteral(" (*%1)").arg(CrossSectionExtension),
                               QLatin1String(CrossSectionExtension),
                               "CrossSections.Document",
                               "CrossSections Document"};

@@ -1,6 +1,7 @@
 // How the plot of a cross section is painted.
 #include "editors/common/quantity.h"
 #include "editors/cross_sections/section_plot.h"
+#include "editors/cross_sections/section_tables.h"
 #include "grid/column_spec.h"
 
 #include <QPainter>
@@ -92,11 +93,12 @@ void CSectionPlot::PaintAxes(QPainter& painter, const CPlotStyle& style) const
                             QPointF(Crisp(m_area.right()), Crisp(m_area.bottom()))));
     painter.setPen(style.text);
     painter.drawText(QRectF(m_area.left(), m_area.bottom() + 1.5 * line, m_area.width(), 1.2 * line), Qt::AlignCenter,
-                     WithUnit(tr("Offset"), m_across.group));
+                     WithUnit(TitleOf(&CSectionPoint::offset), m_across.group));
     painter.save();
     painter.translate(0.2 * line, m_area.bottom());
     painter.rotate(-90);
-    painter.drawText(QRectF(0, 0, m_area.height(), 1.3 * line), Qt::AlignCenter, WithUnit(tr("Bed level"), m_up.group));
+    painter.drawText(QRectF(0, 0, m_area.height(), 1.3 * line), Qt::AlignCenter,
+                     WithUnit(TitleOf(&CSectionPoint::level), m_up.group));
     painter.restore();
 }
 

@@ -1,8 +1,7 @@
 // A cross section: the ground across the river at a place of a branch.
 #pragma once
 
-#include "files/field.h"
-#include "files/unknown_content.h"
+#include "files/declared_section.h"
 #include "ks/fc/exchange.h"
 
 #include <QString>
@@ -28,7 +27,7 @@ struct CCrossSection
     double radius = KsUnset;           // of curvature
     double width = KsUnset;            // of the water surface
     std::vector<CSectionPoint> points; // from left to right; offsets do not decrease
-    UnknownNodes kept, keptProfile;    // what the file says beyond that, and among the points
+    KeptContent kept;                  // what the file says beyond that
 
     static FieldList DeclaredFields();
     QString Branch() const { return QString::fromStdString(branch); }
@@ -43,7 +42,7 @@ double PlaceOf(double chainage);
 struct CCrossSections
 {
     std::vector<CCrossSection> sections;
-    UnknownNodes kept, keptTargets; // what the file says beyond that, and its other targets
+    KeptContent kept; // what the file says beyond that
 
     /// Whether a section but the one at `except` (-1: any) has the key of `section`.
     bool IsTaken(const CCrossSection& section, int except = -1) const;

@@ -37,9 +37,9 @@ constexpr DeclaredKeyword sectionKeywords[] = {{BranchKeyword, FieldOf(0), Prese
                                                {"Chainage", FieldOf(2)},
                                                {"Radius", FieldOf(3), Presence::Optional},
                                                {WidthKeyword, FieldOf(4), Presence::Optional}};
-constexpr DeclaredKeyword profileKeywords[] = {{PointKeyword, points}};
+constexpr DeclaredKeyword profileKeywords[] = {{PointKeyword, points, Presence::EachLine}};
 constexpr DeclaredSection sectionSections[] = {
-    {.name = ProfileName, .kept = Keeps<&C::keptProfile>(), .keywords = profileKeywords}};
+    {.name = ProfileName, .kept = Keeps<&C::kept>(), .keywords = profileKeywords}};
 
 constexpr Field each = SectionGroup<&S::sections>(SectionName);
 constexpr DeclaredSection targetSections[] = {{.name = SectionName,
@@ -48,11 +48,10 @@ constexpr DeclaredSection targetSections[] = {{.name = SectionName,
                                                .sections = sectionSections,
                                                .sectionCount = std::size(sectionSections),
                                                .each = &each}};
-constexpr DeclaredFile file{{.name = "KVR_CROSS_SECTIONS",
-                             .kept = Keeps<&S::kept>(),
-                             .sections = targetSections,
-                             .sectionCount = std::size(targetSections)},
-                            Keeps<&S::keptTargets>()};
+constexpr DeclaredSection file{.name = "KVR_CROSS_SECTIONS",
+                               .kept = Keeps<&S::kept>(),
+                               .sections = targetSections,
+                               .sectionCount = std::size(targetSections)};
 
 /// What a section has to fulfil beside its declaration: it is made to, and that is reported.
 void Mend(CCrossSection& section, tqlHandle node, LoadReport& report)
@@ -108,8 +107,8 @@ KVR_FIELDS(CSectionPoint, Number<&Self::offset>("offset", U::Width).Title(QT_TRA
 CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
 {
     CCrossSections read;
-    ReadDeclared(structure, file, &read, report);
-    const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
+    ReadDeclaredFile(structure, file, &read, report);
+    const tqlHandle target = tqlTargetByNameNum(structure, file.name, 1);
     const auto nodeOf = [&](const CCrossSection& each) {
         return tqlSectionByNameNum(target, SectionName, int(&each - read.sections.data()) + 1);
     };
@@ -131,5 +130,5 @@ CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
 
 Result<void> SaveCrossSections(const CCrossSections& sections, const std::string& path)
 {
-    return SaveDeclared(path, file, &sections);
+    return SaveDeclaredFile(path, file, &sections);
 }

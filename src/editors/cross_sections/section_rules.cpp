@@ -1,5 +1,6 @@
 #include "editors/cross_sections/section_rules.h"
 
+#include "files/declare_field.h"
 #include "ks/units/edit_style.h"
 
 #include <QCoreApplication>
@@ -36,7 +37,8 @@ CSectionFault FindFault(const CCrossSection& section)
     };
     if (section.branch.empty())
         return fault(CSectionFault::Branch);
-    if (section.width < 0)
+    static const Field& width = FieldOf(&CCrossSection::width);
+    if (!width.bounds.Allow(section.width))
         return fault(CSectionFault::Width);
     const auto& points = section.points;
     const auto falls = std::ranges::adjacent_find(points, std::greater(), &CSectionPoint::offset);

@@ -140,6 +140,11 @@ std::shared_ptr<IRowSource> MakePointRows(CCrossSectionDoc& document, int sectio
 static constexpr TableStyle Tables{.text = [](const TextLine& line) { return SectionTables::tr(line.source); },
                                    .besideAPicture = true};
 
+QString TitleOf(double CSectionPoint::*value)
+{
+    return Tables.text(FieldOf(value).title);
+}
+
 void AddSectionColumns(CGridModel& model)
 {
     using C = CCrossSection;

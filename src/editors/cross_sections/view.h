@@ -6,9 +6,6 @@
 #include "editors/cross_sections/section_plot.h"
 #include "editors/cross_sections/section_tables.h"
 
-class QLabel;
-class QSplitter;
-
 /// Commands of the "Lines" menu, the context menu and the tool bar.
 namespace CrossSectionCommand {
 inline constexpr int Previous = 43102, Next = 43103;
@@ -22,10 +19,10 @@ public:
 
     CCrossSectionDoc* Document() const { return static_cast<CCrossSectionDoc*>(GetDocument()); }
     CSectionPlot* Plot() const { return m_plot; }
-    CGenGrid* Sections() const { return m_sections; }
-    CGenGrid* Points() const { return m_points; }
+    CGenGrid* Sections() const { return MainTable(); }
+    CGenGrid* Points() const { return PartTable(); }
     /// Index of the section that is shown; -1 for none.
-    int CurrentSection() const;
+    int CurrentSection() const { return CurrentLine(); }
 
     void OnInitialUpdate() override;
     bool OnCommand(int id) override;
@@ -35,29 +32,24 @@ public:
     void LineCurrent(CGenGrid& grid) override;
 
 protected:
-    LRESULT OnRequest(WPARAM request, CKSComm_Package& package) override;
-    void OnProjectsChanged() override;
-    void ShowDocument() override;
     void Retranslate() override;
-    const CGenGrid* SearchedTable() const override { return m_sections; }
-    void RevealChange(const ChangePlace& place) override;
+    std::shared_ptr<IRowSource> MakePartRows(int section) override { return MakePointRows(*Document(), section); }
+    void ShowInPicture(int section) override { m_plot->Show(Document()->Section(section)); }
+    QString PartTitle() const override;
+    void ShowParts() override;
+    Answer AnswerTo(WPARAM request) override;
+    QStringList KnownBranches() const override { return Document()->Sections().Branches(); }
+    void ShowLocation(const CKvrCBELocation& location) override;
 
 private:
-    void MakeTables(QSplitter* splitter);
-    void ShowSection();
     void GoToSection(int section);
     void TellLocation();
 
     // What other editors ask; each answers whether there was something.
     LRESULT LoadLocations(CObList& objects) const;
     LRESULT FillChannel(const CObList& objects) const;
-    LRESULT ListBranches(CObList& objects) const;
-    LRESULT ShowLocation(const CObList& objects);
 
     CSectionPlot* m_plot = nullptr;
-    CGenGrid *m_sections = nullptr, *m_points = nullptr;
-    int m_pointsOf = -1; // the section whose points are shown
-    QLabel *m_sectionTitle = nullptr, *m_pointTitle = nullptr;
     QString m_toldBranch; // the place that the project was told of last, or was shown
     double m_toldChainage = KsUnset;
     bool m_showing = false, m_telling = false; // a place that another editor shows, or that is shown to the others

@@ -1,34 +1,22 @@
 // The cross sections' view among other editors: what it answers them, and the place it shows them.
 #include "editors/cross_sections/view.h"
 
-#include "editors/common/branch_names.h"
 #include "ks/fc/branch_name.h"
 
 #include <QScopedValueRollback>
 #include <cmath>
+#include <functional>
 #include <map>
 
-LRESULT CCrossSectionView::OnRequest(WPARAM request, CKSComm_Package& package)
+CTablesView::Answer CCrossSectionView::AnswerTo(WPARAM request)
 {
-    if (!m_plot || request == KsRequest::DataChanged) // before the first update; or nothing that is shown here
-        return 0;
-    const bool known = request == KsRequest::LoadLocations || request == KsRequest::LoadLocationsAndChannel ||
-                       request == KsRequest::BranchNames || request == KsRequest::LocationShown;
-    if (!known)
-        return CTablesView::OnRequest(request, package);
-    if (!package.objects) {
-        qDebug("cross sections: request %llu without a list", static_cast<unsigned long long>(request));
-        return 0;
-    }
     switch (request) {
     case KsRequest::LoadLocations:
-        return LoadLocations(*package.objects);
+        return std::bind_front(&CCrossSectionView::LoadLocations, this);
     case KsRequest::LoadLocationsAndChannel:
-        return FillChannel(*package.objects);
-    case KsRequest::BranchNames:
-        return ListBranches(*package.objects);
+        return std::bind_front(&CCrossSectionView::FillChannel, this);
     default:
-        return ShowLocation(*package.objects);
+        return nullptr;
     }
 }
 
@@ -70,28 +58,19 @@ LRESULT CCrossSectionView::FillChannel(const CObList& objects) const
     return filled;
 }
 
-LRESULT CCrossSectionView::ListBranches(CObList& objects) const
-{
-    const QStringList branches = Document()->Sections().Branches();
-    AppendBranchNames(branches, objects);
-    return !branches.isEmpty();
-}
-
 /// Goes to the nearest section, unless the one that is shown is as near.
-LRESULT CCrossSectionView::ShowLocation(const CObList& objects)
+void CCrossSectionView::ShowLocation(const CKvrCBELocation& location)
 {
-    const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
     // An answer to what this view tells would move its user away, and so would any place while a cell is being typed.
-    if (!item || m_telling || IsEditing())
-        return 0;
-    const int nearest = Document()->Sections().Nearest(item->branch, item->chainage);
+    if (m_telling || IsEditing())
+        return;
+    const int nearest = Document()->Sections().Nearest(location.branch, location.chainage);
     const CCrossSection *there = Document()->Section(nearest), *here = Document()->Section(CurrentSection());
     if (!there || (here && KsSameBranch(here->Branch(), there->Branch()) &&
-                   std::abs(here->chainage - item->chainage) <= std::abs(there->chainage - item->chainage)))
-        return 0;
+                   std::abs(here->chainage - location.chainage) <= std::abs(there->chainage - location.chainage)))
+        return;
     const QScopedValueRollback showing(m_showing, true);
     GoToSection(nearest);
-    return 0;
 }
 
 /// Tells the project where the user looks now; not while another editor leads.
@@ -106,10 +85,4 @@ void CCrossSectionView::TellLocation()
         return;
     const QScopedValueRollback telling(m_telling, true);
     Document()->LocationShown(this, m_toldBranch, m_toldChainage);
-}
-
-void CCrossSectionView::OnProjectsChanged()
-{
-    if (m_plot && !Document()->ProjectHandle())
-        Document()->JoinProject(this);
 }

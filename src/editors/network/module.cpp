@@ -19,7 +19,7 @@ CString DocumentStrings()
     const QStringList strings{"Kvr_Help.chm",
                               NetworkTexts::tr("Network"),
                               NetworkTexts::tr("KVR River Network"),
-                              NetworkTexts::tr("KVR River Network (*.kvnw)"),
+                              NetworkTexts::tr("KVR River Network") + QStringLiteral(" (*%1)").arg(NetworkExtension),
                               QLatin1String(NetworkExtension),
                               "Network.Document",
                               "Network Document"};

@@ -1,8 +1,7 @@
 // The river network: branches with their course on the map and the channel along them.
 #pragma once
 
-#include "files/field.h"
-#include "files/unknown_content.h"
+#include "files/declared_section.h"
 #include "ks/fc/exchange.h"
 
 #include <QPointF>
@@ -27,7 +26,7 @@ struct CNetworkBranch
     bool downstream = true;                   // water flows towards increasing chainage
     std::vector<QPointF> line;                // map coordinates, metres: x to the east, y to the north
     std::vector<CChannelRow> channel;         // by increasing chainage
-    UnknownNodes kept, keptLine, keptChannel; // what the file says beyond that, and among the vertices and the rows
+    KeptContent kept;                         // what the file says beyond that
 
     static FieldList DeclaredFields();
     QString Name() const { return QString::fromStdString(name); }
@@ -42,7 +41,7 @@ struct CNetwork
 {
     std::vector<CNetworkBranch> branches;
     std::string system; // that the coordinates lie in, as "EPSG:25832" or in WKT; empty when the file names none
-    UnknownNodes kept, keptTargets; // what the file says beyond that, and its other targets
+    KeptContent kept;   // what the file says beyond that
 
     QString System() const { return QString::fromStdString(system); }
     /// -1 for none.

@@ -42,15 +42,18 @@ constexpr auto branchFields =
     FieldsOf<N>({Text<&N::name>("Name").Title(QT_TRANSLATE_NOOP("NetworkTables", "Branch")),
                  Number<&N::start>("first vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "From")),
                  Number<&N::end>("last vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "To")),
-                 Boolean<&N::downstream>("FlowsDownstream").Title(QT_TRANSLATE_NOOP("NetworkTables", "Flow"))});
+                 Boolean<&N::downstream>("FlowsDownstream")
+                     .Title(QT_TRANSLATE_NOOP("NetworkTables", "Flow"))
+                     .Choices(QT_TRANSLATE_NOOP("NetworkTables", "decreasing\nincreasing"))});
 constexpr FieldList nameField = FieldList(branchFields).subspan(0, 1),
                     endFields = FieldList(branchFields).subspan(1, 2);
 constexpr auto vertices = FieldsOf<N>({GroupOf<&VertexFields, &N::line>("Vertex")});
 constexpr auto rows = FieldsOf<N>({Group<&N::channel>("DATA")});
-constexpr DeclaredKeyword lineKeywords[] = {{"Vertex", vertices}}, channelKeywords[] = {{"DATA", rows}};
+constexpr DeclaredKeyword lineKeywords[] = {{"Vertex", vertices, Presence::EachLine}},
+                          channelKeywords[] = {{"DATA", rows, Presence::EachLine}};
 constexpr DeclaredSection branchSections[] = {
-    {.name = "Line", .kept = Keeps<&N::keptLine>(), .keywords = lineKeywords},
-    {.name = "Channel", .kept = Keeps<&N::keptChannel>(), .keywords = channelKeywords}};
+    {.name = "Line", .kept = Keeps<&N::kept>(), .keywords = lineKeywords},
+    {.name = "Channel", .kept = Keeps<&N::kept>(), .keywords = channelKeywords}};
 constexpr DeclaredKeyword branchKeywords[] = {
     {NameKeyword, nameField, Presence::Optional}, // a rule asks for it
     {ChainageKeyword, endFields},
@@ -65,12 +68,11 @@ constexpr DeclaredSection networkSections[] = {{.name = BranchSection,
                                                 .sections = branchSections,
                                                 .sectionCount = std::size(branchSections),
                                                 .each = &branches}};
-constexpr DeclaredFile file{{.name = "KVR_NETWORK",
-                             .kept = Keeps<&W::kept>(),
-                             .keywords = networkKeywords,
-                             .sections = networkSections,
-                             .sectionCount = std::size(networkSections)},
-                            Keeps<&W::keptTargets>()};
+constexpr DeclaredSection file{.name = "KVR_NETWORK",
+                               .kept = Keeps<&W::kept>(),
+                               .keywords = networkKeywords,
+                               .sections = networkSections,
+                               .sectionCount = std::size(networkSections)};
 
 constexpr const char* NoName = "BRANCH"; // of a branch that the file does not name
 
@@ -116,8 +118,8 @@ KVR_FIELDS(
 CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
 {
     CNetwork network;
-    ReadDeclared(structure, file, &network, report);
-    const tqlHandle target = tqlTargetByNameNum(structure, file.target.name, 1);
+    ReadDeclaredFile(structure, file, &network, report);
+    const tqlHandle target = tqlTargetByNameNum(structure, file.name, 1);
     CBranchNames names(network);
     QSet<QString> met;
     for (std::size_t i = 0; i < network.branches.size(); ++i) {
@@ -131,5 +133,5 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
 
 Result<void> SaveNetwork(const CNetwork& network, const std::string& path)
 {
-    return SaveDeclared(path, file, &network);
+    return SaveDeclaredFile(path, file, &network);
 }

@@ -142,12 +142,6 @@ void AddBranchColumns(CGridModel& model)
         [](void*, const CellValue&) {}};
     static constexpr Field counted =
         Field{.name = "vertices", .kind = FieldKind::Integer}.Title(QT_TRANSLATE_NOOP("NetworkTables", "Vertices"));
-    const Choices directions{
-        .entries =
-            [] {
-                return QStringList{NetworkTables::tr("decreasing"), NetworkTables::tr("increasing")};
-            },
-        .whenEmptied = 1};
     const auto hint = [] {
         return NetworkTables::tr("Whether water flows towards increasing or decreasing chainages");
     };
@@ -156,7 +150,7 @@ void AddBranchColumns(CGridModel& model)
         .Value(&N::start)
         .Value(&N::end)
         .Value(vertices, counted, {.locked = [](const void*) { return true; }})
-        .Value(&N::downstream, {.choices = directions, .hint = hint});
+        .Value(&N::downstream, {.choices = {.whenEmptied = true}, .hint = hint});
 }
 
 void AddChannelColumns(CGridModel& model)

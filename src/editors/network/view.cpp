@@ -1,9 +1,6 @@
 #include "editors/network/view.h"
 
 #include <QLabel>
-#include <QSplitter>
-#include <algorithm>
-#include <utility>
 
 CNetworkView::CNetworkView(QWidget* parent) : CTablesView(parent)
 {
@@ -21,14 +18,10 @@ CNetworkView::~CNetworkView()
 void CNetworkView::OnInitialUpdate()
 {
     m_map = new CNetworkMap(*Document());
-    auto* splitter = new QSplitter(Qt::Horizontal, this);
-    splitter->addWidget(m_map);
-    MakeTables(splitter);
-    splitter->setStretchFactor(0, 2);
-    splitter->setStretchFactor(1, 1);
-    splitter->setCollapsible(0, false);
-    splitter->setSizes({860, 420}); // in proportion
-    SetContent(splitter);
+    MakeContent(*m_map, 860, 420, "branchTable", "channelTable");
+    AddBranchColumns(*Branches()->Model());
+    AddChannelColumns(*Channel()->Model());
+    Branches()->Model()->SetSource(*Document(), MakeBranchRows(*Document()));
     setFocusProxy(m_map);
 
     connect(&m_map->Marks(), &CMapSelection::PickedChanged, this, &CNetworkView::PickedChanged);
@@ -41,72 +34,24 @@ void CNetworkView::OnInitialUpdate()
     LocationsChanged();
 }
 
-// ---- tables ------------------------------------------------------------------------------------
-
-void CNetworkView::MakeTables(QSplitter* splitter)
+QString CNetworkView::PartTitle() const
 {
-    auto* side = new QSplitter(Qt::Vertical);
-    m_branches = AddTable(*side, m_branchTitle, "branchTable");
-    m_channel = AddTable(*side, m_channelTitle, "channelTable");
-    AddBranchColumns(*m_branches->Model());
-    AddChannelColumns(*m_channel->Model());
-    m_branches->Model()->SetSource(*Document(), MakeBranchRows(*Document()));
-    splitter->addWidget(side);
-}
-
-int CNetworkView::CurrentBranch() const
-{
-    return std::min(m_branches->CurrentRow(), int(Document()->Network().branches.size())) - 1;
-}
-
-void CNetworkView::LineCurrent(CGenGrid& grid)
-{
-    if (&grid == m_branches)
-        ShowChannel();
-}
-
-void CNetworkView::ShowDocument()
-{
-    m_branches->Reload();
-    ShowChannel();
-}
-
-void CNetworkView::ShowChannel()
-{
-    const int branch = CurrentBranch();
-    if (std::exchange(m_channelOf, branch) != branch)
-        m_channel->Model()->SetSource(*Document(), MakeChannelRows(*Document(), branch));
-    m_channel->setEnabled(branch >= 0);
-    m_channel->Refresh();
-    m_map->SetCurrentBranch(branch);
-    const QString name = branch >= 0 ? Document()->Network().branches[std::size_t(branch)].Name() : QString();
-    m_channelTitle->setText(branch >= 0 ? tr("Cha&nnel of %1").arg(QString(name).replace(u'&', QStringLiteral("&&")))
-                                        : tr("Cha&nnel"));
-}
-
-/// A line of a channel is shown once its branch is current.
-void CNetworkView::RevealChange(const ChangePlace& place)
-{
-    const bool isChannel = place.list == &Document()->Network().branches;
-    if (IsEditing() || (!isChannel && place.data != &Document()->Network().branches))
-        return;
-    const int column = std::max(place.column, 1);
-    m_branches->SetCurrentCell(isChannel ? place.listRow : place.row, isChannel ? m_branches->CurrentColumn() : column);
-    if (isChannel)
-        m_channel->SetCurrentCell(place.row, column);
-    if (IsActive())
-        (isChannel ? m_channel : m_branches)->setFocus(Qt::OtherFocusReason);
+    const int branch = CurrentLine();
+    if (branch < 0)
+        return tr("Cha&nnel");
+    const QString name = Document()->Network().branches[std::size_t(branch)].Name();
+    return tr("Cha&nnel of %1").arg(QString(name).replace(u'&', QStringLiteral("&&")));
 }
 
 void CNetworkView::InsertLine()
 {
-    m_channel->InsertLine();
-    m_channel->setFocus();
+    Channel()->InsertLine();
+    Channel()->setFocus();
 }
 
 void CNetworkView::Retranslate()
 {
-    m_branchTitle->setText(tr("&Branches"));
-    m_branches->setAccessibleName(tr("Branches of the river network"));
-    m_channel->setAccessibleName(tr("Radius and width along the current branch"));
+    MainTitle().setText(tr("&Branches"));
+    Branches()->setAccessibleName(tr("Branches of the river network"));
+    Channel()->setAccessibleName(tr("Radius and width along the current branch"));
 }

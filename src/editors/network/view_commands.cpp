@@ -57,7 +57,7 @@ bool CNetworkView::IsCommandEnabled(int id) const
     case NetworkCommand::Import:
         return CanImport();
     case Command::InsertLine:
-        return CurrentBranch() >= 0;
+        return CurrentLine() >= 0;
     case Command::DeleteLine: // the key means something else on the map
         return HasFocus(Lines()) && CTablesView::IsCommandEnabled(id);
     case NetworkCommand::FitAll:
@@ -122,8 +122,8 @@ void CNetworkView::Import(const QString& path)
     const QString report = ReportOf(dialog.Import(), Document()->Network()).text;
     const auto first = int(Document()->Network().branches.size());
     Document()->AppendBranches(dialog.Import().plan.branches, dialog.NetworkSystem(), tr("Import Branches"));
-    m_branches->SetCurrentCell(first + 1, BranchName + 1);
-    m_branches->Widths().MakeRoom();
+    Branches()->SetCurrentCell(first + 1, BranchName + 1);
+    Branches()->Widths().MakeRoom();
     m_map->FitAll();
     ShowImportReport(report, this);
 }

@@ -1,5 +1,4 @@
 // The network's view among other editors: what it answers them, and the locations it gets from the HD documents.
-#include "editors/common/branch_names.h"
 #include "editors/network/location_source.h"
 #include "editors/network/view.h"
 #include "ks/fc/branch_name.h"
@@ -10,6 +9,7 @@
 #include <QMenu>
 #include <algorithm>
 #include <cmath>
+#include <functional>
 
 namespace {
 constexpr int PauseFactor = 4; // of the time that the last refresh took
@@ -17,28 +17,18 @@ constexpr int PauseFactor = 4; // of the time that the last refresh took
 
 // ---- requests ----------------------------------------------------------------------------------
 
-LRESULT CNetworkView::OnRequest(WPARAM request, CKSComm_Package& package)
+CTablesView::Answer CNetworkView::AnswerTo(WPARAM request)
 {
-    if (!m_map) // before the first update
-        return 0;
-    if (request == KsRequest::DataChanged) {
-        LocationsChanged();
-        return 0;
+    switch (request) {
+    case KsRequest::FetchLocation:
+        return std::bind_front(&CNetworkView::FetchLocation, this);
+    case KsRequest::LoadLocationsAndChannel:
+        return std::bind_front(&CNetworkView::FillChannel, this);
+    case KsRequest::LoadLocations: // a network has branches, but no list of locations
+        return [](CObList&) { return 0; };
+    default:
+        return nullptr;
     }
-    if (request == KsRequest::LoadLocations)
-        return 0; // a network has branches, but no list of locations
-    using Answer = LRESULT (CNetworkView::*)(CObList&);
-    const Answer answer = request == KsRequest::FetchLocation             ? &CNetworkView::FetchLocation
-                          : request == KsRequest::BranchNames             ? &CNetworkView::ListBranches
-                          : request == KsRequest::LoadLocationsAndChannel ? &CNetworkView::FillChannel
-                          : request == KsRequest::LocationShown           ? &CNetworkView::ShowLocation
-                                                                          : nullptr;
-    if (!answer)
-        return CTablesView::OnRequest(request, package);
-    if (package.objects)
-        return (this->*answer)(*package.objects);
-    qDebug("network: request %llu without a list", static_cast<unsigned long long>(request));
-    return 0;
 }
 
 LRESULT CNetworkView::FetchLocation(CObList& objects)
@@ -53,13 +43,12 @@ LRESULT CNetworkView::FetchLocation(CObList& objects)
     return 1;
 }
 
-LRESULT CNetworkView::ListBranches(CObList& objects)
+QStringList CNetworkView::KnownBranches() const
 {
     QStringList branches;
     for (const CNetworkBranch& branch : Document()->Network().branches)
         branches << branch.Name();
-    AppendBranchNames(branches, objects);
-    return !branches.isEmpty();
+    return branches;
 }
 
 /// Radius and width where the list lacks them and the tables have them.
@@ -86,21 +75,16 @@ LRESULT CNetworkView::FillChannel(CObList& objects)
     return filled;
 }
 
-LRESULT CNetworkView::ShowLocation(CObList& objects)
+void CNetworkView::ShowLocation(const CKvrCBELocation& location)
 {
-    const auto* item = objects.empty() ? nullptr : dynamic_cast<const CKvrCBELocation*>(objects.front().get());
-    if (item)
-        m_map->ShowPlace({item->branch, item->chainage});
-    return 0;
+    m_map->ShowPlace({location.branch, location.chainage});
 }
 
 void CNetworkView::OnProjectsChanged()
 {
-    if (!m_map)
-        return;
-    if (!Document()->ProjectHandle())
-        Document()->JoinProject(this);
-    LocationsChanged();
+    CTablesView::OnProjectsChanged();
+    if (m_map)
+        LocationsChanged();
 }
 
 // ---- locations ---------------------------------------------------------------------------------
@@ -157,8 +141,8 @@ void CNetworkView::PickedChanged()
 {
     const auto picked = m_map->Marks().Picked();
     const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
-    if (branch >= 0 && branch != CurrentBranch() && !IsEditing()) // what is refused stays in its cell
-        m_branches->SetCurrentCell(branch + 1, BranchName + 1);
+    if (branch >= 0 && branch != CurrentLine() && !IsEditing()) // what is refused stays in its cell
+        Branches()->SetCurrentCell(branch + 1, BranchName + 1);
 }
 
 std::unique_ptr<QMenu> CNetworkView::MapMenu()

@@ -40,8 +40,8 @@ CMultiDocTemplate::CMultiDocTemplate(int resourceId, const CString& strings, Cla
 
 CMultiDocTemplate::~CMultiDocTemplate()
 {
-    while (!m_documents.empty())
-        CloseDocument(m_documents.back());
+    while (!Documents().empty())
+        CloseDocument(Documents().back());
     std::erase(Templates(), this);
 }
 
@@ -71,10 +71,10 @@ CString CMultiDocTemplate::FileDialogFilter() const
 CKsDoc* CMultiDocTemplate::FindDocument(const CString& path) const
 {
     const CString key = KsFileKey(path);
-    const auto found = std::find_if(m_documents.begin(), m_documents.end(), [&](const CKsDoc* document) {
-        return !key.isEmpty() && KsFileKey(document->GetPathName()) == key && !IsClosing(document);
-    });
-    return found == m_documents.end() ? nullptr : *found;
+    for (CKsDoc* document : Documents())
+        if (!key.isEmpty() && KsFileKey(document->GetPathName()) == key && !IsClosing(document))
+            return document;
+    return nullptr;
 }
 
 std::unique_ptr<CKsDoc> CMultiDocTemplate::LoadDocument(const CString& path)
@@ -126,7 +126,7 @@ CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString
     if (!loaded)
         return nullptr;
     CKsDoc* document = loaded.release();
-    m_documents.push_back(document);
+    document->setParent(this);
     emit DocumentOpened(document);
     if (!ShowDocument(document, frame)) {
         CloseDocument(document);
@@ -138,8 +138,9 @@ CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString
 
 void CMultiDocTemplate::CloseDocument(CKsDoc* document)
 {
-    if (!std::erase(m_documents, document))
+    if (document->parent() != this)
         return;
+    document->setParent(nullptr);
     emit DocumentClosing(document);
     document->OnCloseDocument();
     delete document;

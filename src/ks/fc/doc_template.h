@@ -11,8 +11,8 @@
 class CKsMDIChildWnd;
 class CKsMDIFrameWnd;
 
-/// A document template. The shell owns it; it owns its open documents. A document is deleted when its last window has
-/// closed.
+/// A document template. The shell owns it; it owns its open documents, which are its children. A document is deleted
+/// when its last window has closed.
 class KS_API CMultiDocTemplate : public QObject
 {
     Q_OBJECT
@@ -58,7 +58,6 @@ public:
     /// null.
     CKsDoc* OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path);
 
-    const std::vector<CKsDoc*>& Documents() const { return m_documents; }
     /// The open document of a file; null when there is none.
     CKsDoc* FindDocument(const CString& path) const;
 
@@ -72,10 +71,10 @@ private:
     std::unique_ptr<CKsDoc> LoadDocument(const CString& path);
     bool ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame);
     void CloseDocument(CKsDoc* document);
+    QList<CKsDoc*> Documents() const { return findChildren<CKsDoc*>(Qt::FindDirectChildrenOnly); }
 
     int m_resourceId;
     Strings m_strings;
     Classes m_classes;
-    std::vector<CKsDoc*> m_documents;
     int m_untitled = 0;
 };

@@ -9,7 +9,8 @@
 
 class CView;
 
-/// A value that the item does not carry.
+/// A value that the item does not carry. No number could say so: every one, NotGiven included, is a value that an HD
+/// parameter file may hold and an item hands on. Files of networks and cross sections write it as nan.
 inline constexpr double KsUnset = std::numeric_limits<double>::quiet_NaN();
 
 /// A text, such as a branch name.

@@ -28,19 +28,6 @@ enum Column
     Columns
 };
 
-QString KindText(FieldKind kind)
-{
-    return VisitKind(kind,
-                     Overloads{[](std::type_identity<double>) { return CKsFindingsModel::tr("a number"); },
-                               [](std::type_identity<bool>) { return CKsFindingsModel::tr("true or false"); },
-                               [kind](std::type_identity<std::string>) {
-                                   return kind == FieldKind::Text ? CKsFindingsModel::tr("a text in quotes")
-                                                                  : CKsFindingsModel::tr("a file name in < >");
-                               },
-                               [](std::type_identity<HDDateTime>) { return CKsFindingsModel::tr("six integers"); },
-                               [](auto) { return CKsFindingsModel::tr("an integer"); }});
-}
-
 QString ExpectedText(const Finding& finding)
 {
     switch (finding.kind) {
@@ -63,7 +50,7 @@ QString ExpectedText(const Finding& finding)
     case Finding::Rule:
         return QString::fromStdString(finding.rule());
     default:
-        return KindText(finding.expected);
+        return CKsFindingsModel::tr(KindText(finding.expected));
     }
 }
 

@@ -26,16 +26,15 @@ void CKsEditLong::SetValue(std::int32_t value)
 
 std::optional<std::int32_t> CKsEditLong::Value() const
 {
-    return Complaint().isEmpty() ? std::optional(text().trimmed().toInt()) : std::nullopt;
+    return Complaint().isEmpty() ? ReadInteger(text().toStdString()) : std::nullopt;
 }
 
 CString CKsEditLong::Complaint() const
 {
-    bool isInteger = false;
-    const int value = text().trimmed().toInt(&isInteger);
-    return !isInteger                ? tr("Enter an integer.")
-           : m_range.Contains(value) ? CString()
-                                     : tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high);
+    const auto value = ReadInteger(text().toStdString());
+    return !value                     ? tr("Enter an integer.")
+           : m_range.Contains(*value) ? CString()
+                                      : tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high);
 }
 
 std::optional<std::int32_t> CKsEditLong::CheckedValue()
@@ -53,10 +52,9 @@ bool DDX_KSedit(bool save, QLineEdit& edit, double& value, const CKsEditStyle& s
         edit.setToolTip(style.GetEumToolTipText());
         return true;
     }
-    const CString text = edit.text().trimmed();
-    if (text.isEmpty())
+    if (edit.text().isEmpty())
         return true;
-    const auto number = ReadNumber(text.toStdString());
+    const auto number = ReadNumber(edit.text().toStdString());
     if (!number) {
         Refuse(edit, CKsEditLong::tr("Enter a number."));
         return false;

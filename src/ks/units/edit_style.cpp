@@ -70,6 +70,11 @@ CString CKsEditStyle::ShownText(double value) const
     return KsUnits::Instance().AllDigits() ? FullText(value) : UnitConvertFromBase_T(value, 1);
 }
 
+CString CKsEditStyle::RoundedText(double value) const
+{
+    return KsShortestNumber(std::round(UnitConvertFromBase(value, 1) * 1000) / 1000);
+}
+
 bool CKsEditStyle::HidesDigits(double value, const CString& shown) const
 {
     constexpr double LastPlaces = 4 * std::numeric_limits<double>::epsilon();
@@ -91,8 +96,7 @@ CString CKsEditStyle::UnitSymbol() const
     return CString::fromUtf8((base ? row->base : row->Display(KsUnits::Instance().System())).symbol);
 }
 
-CString CKsEditStyle::GetEumToolTipText() const
+CString KsUnitToolTip(const CString& symbol)
 {
-    const CString symbol = UnitSymbol();
     return symbol.isEmpty() ? CString() : QCoreApplication::translate("CKsEditStyle", "Unit: %1").arg(symbol);
 }

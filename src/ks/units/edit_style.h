@@ -36,6 +36,9 @@ private:
     bool m_allDigits = false;
 };
 
+/// "Unit: m"; empty for a quantity without unit.
+KS_API CString KsUnitToolTip(const CString& symbol);
+
 class KS_API CKsEditStyle
 {
 public:
@@ -56,11 +59,13 @@ public:
     CString FullText(double value) const;
     /// A base value as the user wants to see it: as UnitConvertFromBase_T has it, or in full (KsUnits::AllDigits).
     CString ShownText(double value) const;
+    /// A base value in display units, to a thousandth.
+    CString RoundedText(double value) const;
     /// Whether `shown`, a text of a base value, leaves out some of its digits. What a conversion of units adds in the
     /// last place of a double is none.
     bool HidesDigits(double value, const CString& shown) const;
-    /// "Unit: m", or empty for a quantity without unit.
-    CString GetEumToolTipText() const;
+    /// KsUnitToolTip of the display unit.
+    CString GetEumToolTipText() const { return KsUnitToolTip(UnitSymbol()); }
     /// Symbol of the display unit ("ft³/s"), empty without one.
     CString UnitSymbol() const;
 

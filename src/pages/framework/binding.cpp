@@ -51,11 +51,10 @@ void SetAccessibleName(QWidget& widget, const QString& name)
 const Field& CBindings::Declaration(const void* value) const
 {
     static constexpr Field none;
-    for (const GlobalSection& section : HDGlobalSections())
-        for (const GlobalKeyword& keyword : section.keywords)
-            for (const Field& field : keyword.Fields())
-                if (field.constAddress(&m_document->Parameters().Global) == value)
-                    return field;
+    for (const DeclaredSection& section : HDGlobals().Sections())
+        for (const DeclaredKeyword& keyword : section.keywords)
+            if (const Field* field = FindField(keyword.Fields(), &m_document->Parameters().Global, value))
+                return *field;
     return none;
 }
 
@@ -208,7 +207,7 @@ void CBindings::Add(QComboBox* box, std::int32_t& index)
 void CBindings::Add(QComboBox* box, std::int32_t& index, std::function<void(std::int32_t chosen)> choose)
 {
     AddLabel(box, &index);
-    if (const Str choices = Declaration(&index).choices; choices != Str::None) {
+    if (const Str choices = Declaration(&index).choices.text; choices != Str::None) {
         Always([box, choices] {
             int entry = 0;
             for (const QString& text : LoadString(choices).split(u'\n')) {
@@ -246,7 +245,7 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
         Add(button, &value, [] {}); // shown by its group
         group->addButton(button, id++);
     }
-    if (const Str choices = Declaration(&value).choices; choices != Str::None) {
+    if (const Str choices = Declaration(&value).choices.text; choices != Str::None) {
         Always([group, choices] {
             for (QAbstractButton* button : group->buttons())
                 button->setText(LoadLine(choices, group->id(button)));

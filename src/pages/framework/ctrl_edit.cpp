@@ -1,6 +1,7 @@
 #include "pages/framework/ctrl_edit.h"
 
 #include "files/read_number.h"
+#include "grid/bounds.h"
 #include "grid/column_spec.h"
 #include "grid/digits_mark.h"
 #include "res/strings.h"
@@ -20,7 +21,7 @@ CCtrlEdit::CCtrlEdit(QWidget* parent)
       m_typing(new CTyping(this, {.complaint = [this] { return Complaint(); },
                                   .store = [this] { Store(); },
                                   .show = [this] { ShowValue(); },
-                                  .allowed = [this] { return m_bounds.Text(m_style); },
+                                  .allowed = [this] { return BoundsText(m_bounds, m_style); },
                                   .unit = [this] { return UnitSymbol(); }}))
 {
     setAlignment(Qt::AlignRight);
@@ -31,7 +32,7 @@ void CCtrlEdit::Setup(const double& value, const Field& declared, std::function<
 {
     m_style = CKsEditStyle(declared.unit);
     m_style.SetFormat(QStringLiteral("%.%1g").arg(declared.digits ? declared.digits : UsualDigits));
-    m_bounds = {declared.minimum, declared.maximum};
+    m_bounds = declared.bounds;
     m_store = std::move(store);
     m_value = &value;
     ShowValue();

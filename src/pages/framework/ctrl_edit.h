@@ -2,7 +2,6 @@
 #pragma once
 
 #include "files/field.h"
-#include "grid/bounds.h"
 #include "grid/typing.h"
 #include "ks/units/edit_style.h"
 

@@ -8,8 +8,8 @@
 #include "pages/framework/page.h"
 #include "res/strings.h"
 
-/// One line of a text that holds several.
-std::function<QString()> LineOf(Str text, int line);
+/// A text that a column has, or one line of it, in the user's language of the moment.
+std::function<QString()> LineOf(Str text, int line = TextLine::Whole);
 
 /// Declares the columns of a page's grid, from left to right.
 class GridColumns : public FieldColumns

@@ -746,8 +746,14 @@ Pick a place on the network&apos;s map first.</source>
         <translation>損失水量</translation>
     </message>
     <message>
-        <source>Water Loss %1</source>
-        <translation>損失水量 %1</translation>
+        <source>Water Loss 1
+Water Loss 2
+Water Loss 3
+Water Loss 4</source>
+        <translation>損失水量 1
+損失水量 2
+損失水量 3
+損失水量 4</translation>
     </message>
     <message>
         <source>Wave Approx</source>
@@ -826,8 +832,14 @@ Pick a place on the network&apos;s map first.</source>
         <translation>係数f</translation>
     </message>
     <message>
-        <source>f%1</source>
-        <translation>f%1</translation>
+        <source>f1
+f2
+f3
+f4</source>
+        <translation>f1
+f2
+f3
+f4</translation>
     </message>
     <message>
         <source>Method

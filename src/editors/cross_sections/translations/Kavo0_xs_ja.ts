@@ -66,14 +66,6 @@
 <context>
     <name>CSectionPlot</name>
     <message>
-        <source>Offset</source>
-        <translation>横断距離</translation>
-    </message>
-    <message>
-        <source>Bed level</source>
-        <translation>河床高</translation>
-    </message>
-    <message>
         <source>This cross section has no points yet. The Insert key in the table of points adds one.</source>
         <translation>この横断面にはまだ測点がありません。測点の表でInsertキーを押すと追加できます。</translation>
     </message>
@@ -121,10 +113,6 @@ Bed level %2</source>
     <message>
         <source>KVR Cross Sections</source>
         <translation>KVR横断面</translation>
-    </message>
-    <message>
-        <source>KVR Cross Sections (*.kvxs)</source>
-        <translation>KVR横断面 (*.kvxs)</translation>
     </message>
     <message>
         <source>Cross Sections</source>

@@ -589,12 +589,10 @@
         <translation>この追加距離の行はすでにあります。</translation>
     </message>
     <message>
-        <source>decreasing</source>
-        <translation>距離減少方向</translation>
-    </message>
-    <message>
-        <source>increasing</source>
-        <translation>距離増加方向</translation>
+        <source>decreasing
+increasing</source>
+        <translation>距離減少方向
+距離増加方向</translation>
     </message>
     <message>
         <source>Whether water flows towards increasing or decreasing chainages</source>
@@ -642,10 +640,6 @@
     <message>
         <source>KVR River Network</source>
         <translation>KVR 河道網</translation>
-    </message>
-    <message>
-        <source>KVR River Network (*.kvnw)</source>
-        <translation>KVR 河道網 (*.kvnw)</translation>
     </message>
     <message>
         <source>River Network</source>

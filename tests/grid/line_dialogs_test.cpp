@@ -1,11 +1,27 @@
-#include "page_fixture.h"
-
 #include "grid/line_dialogs.h"
 
-#include <QRadioButton>
+#include "ks/fc/message_box.h"
 
-class DialogsTest : public PageTest
+#include <QRadioButton>
+#include <QTest>
+#include <gtest/gtest.h>
+
+class DialogsTest : public testing::Test
 {
+protected:
+    DialogsTest()
+    {
+        KsSetMessageBoxHandler([this](const CString& text, QMessageBox::StandardButtons) {
+            boxes << text;
+            return QMessageBox::Ok;
+        });
+    }
+    ~DialogsTest() override
+    {
+        KsSetMessageBoxHandler({});
+        KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    }
+    QStringList boxes;
 };
 
 TEST_F(DialogsTest, GotoAsksUntilThereIsALine)
