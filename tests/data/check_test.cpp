@@ -161,3 +161,19 @@ TEST(Check, OpeningTellsWhatWasNotTakenAsItStands)
         EXPECT_EQ(finding.used, expected[i].used) << i;
     }
 }
+
+TEST(Check, LongTextsAreCutBetweenCharacters)
+{
+    for (const std::size_t before : {0, 1}) {
+        std::string value = '"' + std::string(before, 'x');
+        while (value.size() < 600)
+            value += "\xC3\xBC";
+        value += '"';
+        const TqlStructure structure = Parsed(InSection("Global_Values", "G_f = " + value));
+        LoadReport report(structure.Get());
+        HD_Parameters().Load(structure.Get(), &report);
+        const auto findings = report.Take();
+        ASSERT_EQ(findings.size(), 1u);
+        EXPECT_EQ(findings[0].found, value.substr(0, 399 + before) + "...");
+    }
+}

@@ -97,6 +97,8 @@ protected:
         EXPECT_TRUE(document->DoSave(path));
         EXPECT_EQ(boxes.size(), 1) << "asked once";
         EXPECT_NE(Read(path), before);
+        EXPECT_TRUE(document->DoSave(folder.filePath("other." + QFileInfo(path).suffix())));
+        EXPECT_EQ(document->File().KeptCopy(), "") << "a new file has no former state";
     }
 
     /// Opens a file in a window of that size; null when the editor refused it.

@@ -214,6 +214,13 @@ TEST_F(DocumentTest, AsksBeforeReplacingAnotherFileThatDiffersInCaseOnly)
     answer = QMessageBox::Yes;
     EXPECT_TRUE(document.OnSaveDocument(Path("river.hdkv")));
     EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files), QStringList("river.HDKV"));
+
+    // A folder is none of those that are spelt otherwise.
+    ASSERT_TRUE(QDir(folder.path()).mkdir("sub"));
+    Write(Path("sub/river.HDKV"), "[Other]\n[/Other]\n");
+    EXPECT_FALSE(document.OnSaveDocument(Path("SUB/river.HDKV")));
+    EXPECT_TRUE(boxes.back().contains("SUB")) << qPrintable(boxes.back());
+    EXPECT_EQ(Read(Path("sub/river.HDKV")), "[Other]\n[/Other]\n");
 }
 
 TEST_F(DocumentTest, AFileThatCannotBeRenamedKeepsItsNameAndHoldsWhatWasSaved)

@@ -16,11 +16,13 @@ from mutants import MUTANTS
 ROOT = os.path.abspath(os.path.join(os.path.dirname(os.path.abspath(__file__)), '../..'))
 BUILD = f'{ROOT}/build/dev'
 PROGRAMS = {'tql': ['tql_test'], 'files': ['data_test'], 'data': ['data_test', 'cli_test'], 'cli': ['cli_test'],
-            'ks': ['ks_test', 'pages_test', 'shell_test'], 'grid': ['grid_test', 'pages_test', 'sheet_pages_test'],
+            'ks': ['ks_test', 'pages_test', 'shell_test'],
+            'documents': ['shell_test', 'ks_test', 'module_test', 'cross_sections_test'],
+            'grid': ['grid_test', 'pages_test', 'sheet_pages_test'],
             'document': ['pages_test', 'sheet_pages_test', 'module_test'], 'pages': ['pages_test', 'sheet_pages_test'],
-            'module': ['module_test'], 'network': ['network_test'], 'cross_sections': ['cross_sections_test'],
-            'shell': ['shell_test']}
-MINUTES = 10  # a test that hangs has noticed, too
+            'module': ['module_test'], 'common': ['network_test', 'cross_sections_test'], 'network': ['network_test'],
+            'cross_sections': ['cross_sections_test'], 'shell': ['shell_test']}
+MINUTES = 3  # a test that hangs has noticed, too
 
 
 @contextlib.contextmanager

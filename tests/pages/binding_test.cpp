@@ -122,6 +122,11 @@ TEST_F(BindingTest, UnknownNumbersAreKept)
     EXPECT_EQ(page.list.count(), 4) << "the number is gone once another entry is chosen";
     EXPECT_EQ(page.list.currentText(), "Fully Dynamic");
     EXPECT_EQ(document.UndoStack().count(), 1);
+    page.depth.click();
+    EXPECT_EQ(globals.iLevelDepth, 1);
+    page.UndoRedo(true);
+    EXPECT_EQ(globals.iLevelDepth, 5);
+    EXPECT_FALSE(page.level.isChecked() || page.depth.isChecked()) << "as before the click";
 }
 
 TEST_F(BindingTest, IntegersAreTakenWhenLeftOrStored)

@@ -39,6 +39,10 @@ TEST_F(ClipboardTest, CopiesWholeNumbersInDisplayUnits)
 {
     Select(1, 1, 2, 3);
     EXPECT_EQ(Copied(), "A\t1.25\t0.1\nB\t\t11");
+    grid->SetCurrentCell(2, 3);
+    for (const auto key : {Qt::Key_Left, Qt::Key_Left, Qt::Key_Up})
+        QTest::keyClick(grid, key, Qt::ShiftModifier); // a selection that grows from its last cell
+    EXPECT_EQ(Copied(), "A\t1.25\t0.1\nB\t\t11");
     Select(2, 4, 2, 4);
     EXPECT_EQ(Copied(), "21");
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
@@ -60,6 +64,13 @@ TEST_F(ClipboardTest, PastesRectangles)
     QGuiApplication::clipboard()->setText("5");
     QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier); // one cell fills the selection
     EXPECT_EQ(Stored(), "A 1.25 5 5, RHINE 1 5 5, MAIN 10000000000 5 5, NECKAR 9 0 0");
+    QGuiApplication::clipboard()->setText("7\t8");
+    QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier); // a line of two does not
+    EXPECT_EQ(Stored(), "A 1.25 7 8, RHINE 1 5 5, MAIN 10000000000 5 5, NECKAR 9 0 0");
+    Paste(1, 3, "7\n5\n6\n");
+    view->revealed.clear();
+    QTest::keyClick(grid, Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(view->revealed, QList<int>{3}) << "where something changed";
     EXPECT_EQ(boxes, QStringList());
 }
 

@@ -8,6 +8,7 @@
 
 #include <QCheckBox>
 #include <QRadioButton>
+#include <QSignalSpy>
 
 class MarkPagesTest : public PageTest
 {
@@ -83,19 +84,26 @@ TEST_F(MarkPagesTest, TitlesAndLevelsStayInStep)
     EXPECT_EQ(Headers(), QStringList({"LOW", "", "HIGH"}));
     EXPECT_EQ(Levels(), "3 | 1 - 2") << "a list that ends before the column is left as it is";
     // Typed in lower case it stands in upper case, in the cell and above the column.
+    const QSignalSpy headers(grid->model(), &QAbstractItemModel::headerDataChanged);
     QTest::keyClicks(&titles, "m");
     QTest::keyClicks(OpenEditor(titles), "id");
     QTest::keyClick(OpenEditor(titles), Qt::Key_Return);
     titles.StoreEditedLine();
     EXPECT_EQ(titles.TextAt(2, 1), "MID");
     EXPECT_EQ(Headers(), QStringList({"LOW", "MID", "HIGH"}));
+    EXPECT_GE(headers.count(), 1) << "which is painted anew";
     // A level for the record that is too short.
     Enter(1, 5, "7.5");
     grid->StoreEditedLine();
     EXPECT_EQ(Levels(), "3 - 7.5 | 1 - 2");
-
     Undo();
     EXPECT_EQ(Levels(), "3 | 1 - 2") << "as short as it was";
+    Enter(1, 4, "6");
+    Enter(1, 5, "7.5");
+    grid->StoreEditedLine();
+    EXPECT_EQ(Levels(), "3 6 7.5 | 1 - 2");
+    Undo();
+    EXPECT_EQ(Levels(), "3 | 1 - 2") << "both cells in one step";
     Undo();
     EXPECT_EQ(Headers(), QStringList({"LOW", "", "HIGH"}));
     Undo();
@@ -142,6 +150,7 @@ TEST_F(MarkPagesTest, InterpolateIsAClickOnItsBox)
 TEST_F(MarkPagesTest, ATitleWithoutTextIsLeftOutOfTheFile)
 {
     QTemporaryDir folder;
+    AddMark("A", 1, {3, 4}); // levels of no title
     CGenGrid& titles = OpenMarks();
     EXPECT_EQ(titles.RowCount(), 1) << "a row to name the first title in";
     EXPECT_EQ(Headers(), QStringList(""));
@@ -156,10 +165,15 @@ TEST_F(MarkPagesTest, ATitleWithoutTextIsLeftOutOfTheFile)
     titles.setFocus();
     QTest::keyClick(&titles, Qt::Key_Insert); // a second one, never named
     EXPECT_EQ(g.MarkTitles, (std::vector<std::string>{"F", ""}));
+    EXPECT_EQ(Levels(), "3 - 4") << "the first title is that of the levels which stand there";
     ASSERT_TRUE(document.OnSaveDocument(folder.filePath("new.HDKV")));
     EXPECT_EQ(g.MarkTitles, std::vector<std::string>{"F"});
     Undo();
     EXPECT_EQ(g.MarkTitles, (std::vector<std::string>{"F", ""}));
+    Undo();
+    Undo();
+    EXPECT_TRUE(g.MarkTitles.empty());
+    EXPECT_EQ(Levels(), "3 4") << "the levels stay, as they were before they had a title";
 }
 
 TEST_F(MarkPagesTest, TheGlobalRowIsNoLineOfTheList)

@@ -61,6 +61,9 @@ TEST_F(SearchTest, ComparesWhatIsShownAndWhatWasTyped)
     Enter(1, 2, "1234.5"); // feet
     const double wanted = CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(1234.5, 0);
     EXPECT_EQ(Found({"", wanted, ChainageMatch::Equal}), QList<int>{1});
+    init.GetAt(2).Chainage = 1000 / 3.0; // 1093.6132983... feet, compared to six decimals
+    const double third = CKsEditStyle(UnitGroup::Chainage).UnitConvertFromBase(1093.613298, 0);
+    EXPECT_EQ(Found({"", third, ChainageMatch::Equal}), QList<int>{3});
     grid->Model()->setData(grid->Model()->index(1, 0), "typed", Qt::EditRole);
     EXPECT_EQ(Found({"TYPED", 0, ChainageMatch::Any, NameMatch::Whole}), QList<int>{2})
         << "a line that is not stored yet";

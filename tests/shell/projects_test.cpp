@@ -60,23 +60,31 @@ TEST_F(ShellTest, AtTheStartTheFirstFileIsThereAtOnceAndTheOthersFollow)
 }
 
 // An editor that writes its extension in capitals renames a member; the project file follows, and nothing else in it.
+// Entries that are none count for nothing.
 TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
 {
-    Write("one/r\u00FC.tst");
-    Write("b.tst");
-    const char* const members =
-        "  // main river\n  File = <one\\\\r\xC3\xBC.tst> // keep\nFile=<b.tst>\nFile = \"one/r\xC3\xBC.tst\"\n";
-    const QString path = WriteProject("p.kvrp", members);
+    for (const char* name : {"one/r\u00FC.tst", "b.tst", "c.tst"})
+        Write(name);
+    ASSERT_TRUE(frame->OpenFile(WriteProject("before.kvrp", "File = <c.tst>\n")));
+    const QString path =
+        WriteProject("p.kvrp", "File = 7\n  // main river\n  File = <one\\\\r\xC3\xBC.tst> // keep\nFile=<b.tst>\n"
+                               "File = true\nFile = \"one/r\xC3\xBC.tst\"\n");
+    const auto content = [&path] {
+        QFile file(path);
+        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+    };
     ASSERT_TRUE(frame->OpenFile(path));
     CKsDoc* document = ViewOf("one/r\u00FC.tst")->GetDocument();
+    const QByteArray before = content();
+    for (const char* other : {"one/other.TST", "two/r\u00FC.TST"}) {
+        document->SetPathName(Path(other));
+        EXPECT_EQ(content(), before) << "another file is no other spelling: " << other;
+        document->SetPathName(Path("one/r\u00FC.tst"));
+    }
     document->SetPathName(Path("one/r\u00FC.TST"));
-    QFile file(path);
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    EXPECT_EQ(file.readAll(), "[KVR_PROJECT]\n[Members]\n  // main river\n  File = <one\\\\r\xC3\xBC.TST> // keep\n"
-                              "File=<b.tst>\nFile = \"one/r\xC3\xBC.TST\"\n[/Members]\n[/KVR_PROJECT]\n");
-    document->SetPathName(Path("one/other.TST"));
-    file.seek(0);
-    EXPECT_FALSE(file.readAll().contains("other")) << "another file is no other spelling";
+    EXPECT_EQ(content(),
+              "[KVR_PROJECT]\n[Members]\nFile = 7\n  // main river\n  File = <one\\\\r\xC3\xBC.TST> // keep\n"
+              "File=<b.tst>\nFile = true\nFile = \"one/r\xC3\xBC.TST\"\n[/Members]\n[/KVR_PROJECT]\n");
     EXPECT_TRUE(asked.isEmpty());
 }
 

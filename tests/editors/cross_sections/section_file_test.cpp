@@ -46,11 +46,13 @@ TEST_F(CrossSectionTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
         {"Chainage = 300", "Chainage = nan", "23 Chainage: nan -> 0"},
         {"Chainage = 300", "Chainage = 300, 4", "23 Chainage: 4 -> "},
         {"Width = 7", "Width =", "24 Width:  -> nan"},
-        {"Width = 7", "Width = -7", "24 Width: -7 -> nan"},
+        {"Width = 7", "Width = -0.25", "24 Width: -0.25 -> nan"},
         {"Width = 7", "Width = 7\n    Width = 8", "25 Width: 8 -> "},
         {"    [Roughness]", "    [Profile]\n    [/Profile]\n    [Roughness]", "17 [Profile]:  -> "},
         {"Point = 20, 100", "Point = 20", "13 Point: 20 -> "},
         {"Point = 20, 100", "Point = 9.5, 100", "13 Point: 9.5, 100 -> 10, 100"},
+        {"Point = 10, 100\n      Point = 20, 100", "Point = 10\n      Point = -1, 100",
+         "12 Point: 10 -> ; 13 Point: -1, 100 -> 0, 100"}, // without the one that is left out
         {"\"2021\"", "\"2019\"", "28 TopoID: \"2019\" -> \"2019-2\""},
         {"KVR_CROSS_SECTIONS", "KVR_NETWORK",
          "river.kvxs is no file of this kind: it has no section [KVR_CROSS_SECTIONS]."},
@@ -65,6 +67,12 @@ TEST_F(CrossSectionTest, WhatCannotBeTakenIsToldAndTheRestIsRead)
     }
     CCrossSections read;
     EXPECT_NE(ReadCrossSections(folder.filePath("none.kvxs"), read), "");
+    QByteArray text = SmallSections;
+    const QString twice = Write("twice.kvxs", text.replace("Width = 20", "Width = 20\n    Width = 8"));
+    CKsDocumentFile file;
+    file.Read(twice, twice, [&](tqlHandle structure, LoadReport& report) { LoadCrossSections(structure, report); });
+    ASSERT_EQ(file.Findings().size(), 1u);
+    EXPECT_EQ(file.Findings()[0].section, "CrossSection") << "though sections stand in it";
     EXPECT_EQ(Open("[KVR_CROSS_SECTIONS]\n  [CrossSection]\n"), nullptr);
     EXPECT_EQ(boxes.size(), 1);
 }

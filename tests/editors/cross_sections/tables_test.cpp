@@ -5,6 +5,7 @@
 #include <QAbstractItemModelTester>
 #include <QClipboard>
 #include <QContextMenuEvent>
+#include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
 #include <QSignalSpy>
@@ -152,6 +153,14 @@ TEST_F(CrossSectionTest, SectionsAreInsertedAndDeletedWithKeys)
     projectBranch = "AELDER"; // the first section of all is on a branch of the project
     QTest::keyClick(table, Qt::Key_Insert);
     EXPECT_EQ(chainages(), "AELDER0");
+    for (int i = 0; i < 3; ++i)
+        QTest::keyClick(table, Qt::Key_Insert);
+    QGuiApplication::clipboard()->setText("300\n400\n100\n200");
+    table->SetCurrentCell(1, SectionChainage + 1);
+    QTest::keyClick(table, Qt::Key_V, Qt::ControlModifier);
+    Select(table, 3);
+    QTest::keyClick(table, Qt::Key_Insert);
+    EXPECT_EQ(chainages(), "AELDER300 AELDER400 AELDER100 AELDER200 AELDER500") << "300 and 400 are taken elsewhere";
 }
 
 TEST_F(CrossSectionTest, PointsAreInsertedAndDeletedWithKeys)
@@ -250,11 +259,11 @@ TEST_F(CrossSectionTest, LinesAreSearchedByBranchAndChainage)
 TEST_F(CrossSectionTest, NumbersShowWhatTheyHide)
 {
     CCrossSectionView* view = Open();
-    EXPECT_TRUE(Edit(view->Sections(), Main2500, SectionWidth, "20.123456"));
-    EXPECT_EQ(Text(view->Sections(), Main2500, SectionWidth), "20.123");
+    EXPECT_TRUE(Edit(view->Sections(), Main2500, SectionWidth, "20.123567"));
+    EXPECT_EQ(Text(view->Sections(), Main2500, SectionWidth), "20.124");
     EXPECT_TRUE(view->Sections()->Model()->HidesDigits(Main2500, SectionWidth));
     KsUnits::Instance().SetAllDigits(true);
-    EXPECT_EQ(Text(view->Sections(), Main2500, SectionWidth), "20.123456");
+    EXPECT_EQ(Text(view->Sections(), Main2500, SectionWidth), "20.123567");
     KsUnits::Instance().SetAllDigits(false);
 }
 
@@ -270,6 +279,14 @@ TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
     EXPECT_FALSE(view->OnCommand(CrossSectionCommand::Next));
     EXPECT_TRUE(view->OnCommand(CrossSectionCommand::Previous));
     EXPECT_FALSE(view->OnCommand(4711));
+    // Another section leaves the table that the user works in the one of the commands.
+    view->Points()->setFocus();
+    EXPECT_TRUE(view->OnCommand(CrossSectionCommand::Previous));
+    EXPECT_TRUE(view->OnCommand(CrossSectionCommand::Next));
+    EXPECT_TRUE(view->OnCommand(Command::InsertLine));
+    EXPECT_EQ(view->Sections()->model()->rowCount(), SmallRows);
+    view->Document()->UndoStack().undo();
+    view->Sections()->setFocus();
     QSignalSpy changed(frame.get(), &CKsMDIFrameWnd::CommandStateChanged);
     Select(view->Sections(), Main1000);
     EXPECT_GE(changed.count(), 1) << "tool bars hear of what can be done now";
@@ -302,8 +319,14 @@ TEST_F(CrossSectionTest, TextsFollowTheLanguage)
     CCrossSectionView* view = Open();
     const auto header = [&] { return view->Points()->model()->headerData(PointLevel, Qt::Horizontal).toString(); };
     const QString english = view->Sections()->accessibleName();
+    const auto title = [&] {
+        const auto labels = view->findChildren<QLabel*>();
+        return (*std::ranges::find(labels, view->Points(), &QLabel::buddy))->text();
+    };
+    EXPECT_TRUE(title().startsWith("&Points of ")) << title().toStdString();
     KsLanguage::Instance().SetCurrent("ja");
     QCoreApplication::processEvents();
+    EXPECT_FALSE(title().contains("Points")) << title().toStdString();
     EXPECT_EQ(header(), QString::fromUtf8("河床高 [m]"));
     EXPECT_NE(view->Sections()->accessibleName(), english);
     EXPECT_NE(view->Plot()->accessibleName(), "Plot of the cross section");

@@ -1,4 +1,5 @@
 // The tables beside the map: models, editing with units and undo, and what is refused.
+#include "grid/grid_keys.h"
 #include "ks/language/language.h"
 #include "network_fixture.h"
 
@@ -119,6 +120,13 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     EXPECT_EQ(channel->CurrentRow(), 4);
     QTest::keyClick(channel, Qt::Key_Insert); // towards the branch's end
     EXPECT_EQ(chainages(), "2000 4000 6000 7000 7500");
+    EXPECT_TRUE(Edit(channel, 4, ChannelChainage, "8000"));
+    channel->SetCurrentCell(5, 1);
+    QTest::keyClick(channel, Qt::Key_Insert); // and back from there
+    EXPECT_EQ(chainages(), "2000 4000 6000 7000 7500 8000");
+    view->Document()->UndoStack().undo();
+    view->Document()->UndoStack().undo();
+    EXPECT_EQ(chainages(), "2000 4000 6000 7000 7500");
     channel->SetCurrentCell(1, 1);
     QTest::keyClick(channel, Qt::Key_Down, Qt::ShiftModifier);
     QTest::keyClick(channel, Qt::Key_Delete);
@@ -137,8 +145,16 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     QTest::keyClick(channel, Qt::Key_V, Qt::ControlModifier);
     EXPECT_EQ(chainages(), "100 6100 7500 7600");
     EXPECT_EQ(boxes.size(), 1);
+    boxes.clear();
     view->Branches()->setFocus();
     Select(view->Branches(), 1);
+    QGuiApplication::clipboard()->setText("LEFT");
+    QTest::keyClick(view->Branches(), Qt::Key_V, Qt::ControlModifier);
+    EXPECT_EQ(view->Document()->Network().branches[1].name, "LEFT");
+    QGuiApplication::clipboard()->setText("LEFT\nRIGHT"); // there is no second line, and none can come
+    QTest::keyClick(view->Branches(), Qt::Key_V, Qt::ControlModifier);
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(boxes[0].contains("From line 2 on the table has only 1 lines")) << boxes[0].toStdString();
     QTest::keyClick(view->Branches(), Qt::Key_Delete);
     EXPECT_EQ(view->Document()->Network().branches.size(), 1u);
     while (view->Document()->UndoStack().canUndo())
@@ -193,6 +209,17 @@ TEST_F(NetworkTest, WhatCannotBeStoredStaysInItsEditorAndIsToldOnce)
     EXPECT_TRUE(view->OnCommand(Command::InsertLine));
     EXPECT_EQ(view->Document()->Network().branches[0].channel[0].width, 31.5);
     EXPECT_EQ(channel->model()->rowCount(), 4);
+
+    // An undo by the keys of one table leaves the cell that is open in another one.
+    editor = static_cast<QLineEdit*>(Type(channel, 0, ChannelWidth, "wide"));
+    const int steps = view->Document()->UndoStack().index();
+    view->Run(*view->Branches(), GridAction::Undo);
+    EXPECT_EQ(boxes, QStringList("Floating point number required"));
+    boxes.clear();
+    EXPECT_EQ(view->Document()->UndoStack().index(), steps);
+    QTest::keyClick(editor, Qt::Key_Escape);
+    view->Run(*view->Branches(), GridAction::Undo);
+    EXPECT_EQ(view->Document()->UndoStack().index(), steps - 1);
     EXPECT_TRUE(boxes.isEmpty()) << boxes.join(';').toStdString();
 }
 
