@@ -5,6 +5,7 @@
 #include <QHeaderView>
 #include <QMouseEvent>
 #include <algorithm>
+#include <limits>
 
 namespace {
 
@@ -12,6 +13,7 @@ constexpr int NumberColumnWidth = 40;
 // Pixels of the font that the columns' widths are meant for: its height, and the mean width of the Latin letters.
 constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
 constexpr int RowsAtStart = 30, RowsForRoom = 4000; // whose texts are measured, at even distances through the table
+constexpr int Margin = 16;                          // pixels beside a text
 constexpr int MostOfAWindow = 320;                  // pixels that a long name may take
 
 /// The row numbers. They are as wide as the grid says: measuring texts of many rows, as the base does whenever the
@@ -37,9 +39,8 @@ protected:
     void mouseDoubleClickEvent(QMouseEvent* event) override { mousePressEvent(event); }
 };
 
-double FontScale(const QWidget& widget)
+double FontScale(const QFontMetrics& font)
 {
-    const QFontMetrics font = widget.fontMetrics();
     const QString letters = QStringLiteral("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz");
     const double letterWidth = double(font.horizontalAdvance(letters)) / double(letters.size());
     return std::max({1.0, font.height() / OriginalFontHeight, letterWidth / OriginalLetterWidth});
@@ -47,7 +48,27 @@ double FontScale(const QWidget& widget)
 
 } // namespace
 
-CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid)
+CGridWidths::Letters::Letters(const QFont& of) : font(of), scale(FontScale(QFontMetrics(of)))
+{
+    advances.fill(-1);
+}
+
+/// Not less than what the text needs, and found much sooner: what its letters take one by one.
+double CGridWidths::Letters::Bound(const QString& text)
+{
+    double width = 0;
+    for (const QChar letter : text) {
+        if (letter.unicode() >= advances.size())
+            return std::numeric_limits<double>::infinity();
+        double& advance = advances[letter.unicode()];
+        if (advance < 0)
+            advance = font.horizontalAdvance(letter);
+        width += advance;
+    }
+    return width;
+}
+
+CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid), m_letters(grid.font())
 {
     grid.setVerticalHeader(new RowNumbers(&grid));
     grid.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
@@ -73,7 +94,7 @@ void CGridWidths::UpdateRowNumbers()
     if (numbers.defaultSectionSize() != height) // setting it visits every row
         numbers.setDefaultSectionSize(height);
     const int longest = font.horizontalAdvance(QString::number(std::max(m_grid.RowCount(), 100))) + 12;
-    const int width = std::max(int(NumberColumnWidth * FontScale(m_grid)), longest);
+    const int width = std::max(int(NumberColumnWidth * m_letters.scale), longest);
     if (numbers.width() != width)
         numbers.setFixedWidth(width);
 }
@@ -82,14 +103,15 @@ void CGridWidths::Update()
 {
     UpdateRowNumbers();
     for (int column = std::min(m_columnsSet, m_grid.ColumnCount()); column < m_grid.ColumnCount(); ++column) {
-        const int width = int(m_grid.Model()->Column(column).width * FontScale(m_grid));
-        m_grid.setColumnWidth(column, std::max(width, WidthOfTexts(column, RowsAtStart)));
+        const int width = int(m_grid.Model()->Column(column).width * m_letters.scale);
+        m_grid.setColumnWidth(column, WidthOfTexts(column, RowsAtStart, width));
     }
     m_columnsSet = m_grid.ColumnCount();
 }
 
 void CGridWidths::Reset()
 {
+    m_letters = Letters(m_grid.font());
     if (std::exchange(m_columnsSet, 0) > 0) // not before the rows are there
         Update();
     else
@@ -99,22 +121,27 @@ void CGridWidths::Reset()
 void CGridWidths::MakeRoom()
 {
     for (int column = 0; column < std::min(m_columnsSet, m_grid.ColumnCount()); ++column)
-        m_grid.setColumnWidth(column, std::max(m_grid.columnWidth(column), WidthOfTexts(column, RowsForRoom)));
+        m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, m_grid.columnWidth(column)));
 }
 
-/// What the header and the texts need: of `most` rows of the whole table, and of those in sight. Only a text that is
-/// as long as any before is measured.
-int CGridWidths::WidthOfTexts(int column, int most) const
+/// At least `least`, and what the header and the texts need: of `most` rows of the whole table, and of those in sight.
+/// Only a text that is as long as any before is measured, and only where its letters might need more than there is.
+int CGridWidths::WidthOfTexts(int column, int most, int least)
 {
     const QFontMetrics font = m_grid.fontMetrics();
-    int width = font.horizontalAdvance(m_grid.Model()->Column(column).header());
+    int width = std::min(least, MostOfAWindow) - Margin;
+    const auto make = [&](const QString& text) {
+        if (m_letters.Bound(text) > width)
+            width = std::max(width, font.horizontalAdvance(text));
+    };
+    make(m_grid.Model()->Column(column).header());
     qsizetype longest = 0;
     const auto measure = [&](int row) {
         const QString text = m_grid.TextAt(row, column + 1);
         if (text.size() < longest)
             return;
         longest = text.size();
-        width = std::max(width, font.horizontalAdvance(text));
+        make(text);
     };
     const int rows = m_grid.RowCount(), step = std::max(1, rows / most);
     for (int row = 1; row <= rows; row += step)
@@ -122,5 +149,5 @@ int CGridWidths::WidthOfTexts(int column, int most) const
     const int inSight = std::max(1, m_grid.rowAt(0) + 1);
     for (int row = inSight; step > 1 && row < std::min(rows, inSight + RowsAtStart); ++row)
         measure(row);
-    return std::min(width + 16, MostOfAWindow);
+    return std::max(least, std::min(width + Margin, MostOfAWindow));
 }

@@ -1,7 +1,9 @@
 // How wide the columns of a grid and its row numbers are.
 #pragma once
 
+#include <QFontMetricsF>
 #include <QObject>
+#include <array>
 
 class CGenGrid;
 
@@ -19,9 +21,21 @@ public:
     void MakeRoom();
 
 private:
+    /// Of the grid's font.
+    struct Letters
+    {
+        explicit Letters(const QFont& of);
+        double Bound(const QString& text);
+
+        QFontMetricsF font;
+        double scale;                     // times the font that the columns' widths are meant for
+        std::array<double, 128> advances; // of the Latin ones; negative until it is asked for
+    };
+
     void UpdateRowNumbers();
-    int WidthOfTexts(int column, int most) const;
+    int WidthOfTexts(int column, int most, int least);
 
     CGenGrid& m_grid;
+    Letters m_letters;
     int m_columnsSet = 0; // from then on their widths are the user's
 };
