@@ -217,8 +217,11 @@ void CMainFrame::dropEvent(QDropEvent* event)
 void CMainFrame::ReadSettings()
 {
     const QSettings settings;
-    if (!restoreGeometry(settings.value(Settings::Geometry).toByteArray()))
-        resize(QSize(1500, 940).boundedTo(screen()->availableSize()));
+    if (!restoreGeometry(settings.value(Settings::Geometry).toByteArray())) {
+        // The frame that the desktop puts around it is not known before it is there.
+        const int frame = 2 * style()->pixelMetric(QStyle::PM_TitleBarHeight);
+        resize(QSize(1500, 940).boundedTo(screen()->availableSize() - QSize(frame, frame)));
+    }
     restoreState(settings.value(Settings::State).toByteArray());
     m_projects.Tree().hide(); // until a project is opened
     m_windows.ShowTabs(settings.value(Settings::Tabs, true).toBool());

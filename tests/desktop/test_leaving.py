@@ -185,6 +185,42 @@ class BadText(Case):
         self.assert_no_message()
         self.assertEqual(editor.current_page(), 'Initial')
 
+    def assert_box_waits(self, box, *ways):
+        """A box that is clicked, or reached by its letter, changes nothing before the text beside it is mended."""
+        editor = self.editor
+        before = editor.field(box, 'check box').checked
+        for way in ways:
+            way()
+            self.assert_told_once('bad')
+            self.assertEqual(editor.field(box, 'check box').checked, before)
+        editor.press('Escape')
+        editor.click(editor.field(box, 'check box'))
+        wait_for(lambda: editor.field(box, 'check box').checked != before, 'the box is changed')
+        self.assert_no_message()
+
+    def test_field_then_box(self):
+        editor = self.editor
+        editor.go_to('Wind')
+        box = 'Include wind'
+        editor.fill('Topographical Factor', 'bad', leave=None)
+        self.assert_box_waits(box, lambda: editor.click(editor.field(box, 'check box')), lambda: editor.press('alt+i'))
+
+    def test_cell_then_box(self):
+        editor = self.editor
+        editor.go_to('Wind')
+        editor.put(1, 3, 'bad', leave=None)
+        box = 'Include wind'
+        self.assert_box_waits(box, lambda: editor.press('alt+i'), lambda: editor.click(editor.field(box, 'check box')))
+
+    def test_cell_then_buttons(self):
+        editor = self.editor
+        editor.go_to('Encroachment')
+        editor.click(editor.field('Add', 'push button'))
+        editor.put(1, 3, '9x', leave=None, table=editor.table(''))
+        for _ in range(2):
+            editor.press('alt+d')
+            self.assert_told_once('9x')
+
 
 class WhileTyping(Case):
     """Commands that come while a cell is being typed into lose nothing of it."""

@@ -6,7 +6,9 @@
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page_help.h"
 
+#include <QAbstractButton>
 #include <QApplication>
+#include <QComboBox>
 #include <QGroupBox>
 #include <QKeyEvent>
 #include <QScrollArea>
@@ -229,6 +231,26 @@ void CGenPropertyPage::UnitsChanged()
     m_shownUnits = now;
     if (isVisible())
         LoadFromDocument(m_document);
+}
+
+bool CGenPropertyPage::event(QEvent* event)
+{
+    if (event->type() == QEvent::Polish) { // the dialog is complete
+        for (auto* button : findChildren<QAbstractButton*>())
+            button->installEventFilter(this);
+        for (auto* list : findChildren<QComboBox*>())
+            list->installEventFilter(this);
+    }
+    return QWidget::event(event);
+}
+
+/// Of buttons, boxes and lists. What is being edited is asked before one of them does anything: by the mouse, or by its
+/// letter. By the time that the field has lost the focus the click may have done its work.
+bool CGenPropertyPage::eventFilter(QObject* object, QEvent* event)
+{
+    const bool acts = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick ||
+                      event->type() == QEvent::Shortcut;
+    return (acts && !LeaveField()) || QWidget::eventFilter(object, event);
 }
 
 void CGenPropertyPage::changeEvent(QEvent* event)

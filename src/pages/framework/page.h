@@ -85,6 +85,8 @@ protected:
     CBindings& Bindings() { return m_bindings; }
     HD_Global_Var& Globals() const;
 
+    bool event(QEvent* event) override;
+    bool eventFilter(QObject* object, QEvent* event) override;
     void changeEvent(QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
 
