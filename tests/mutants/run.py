@@ -54,12 +54,14 @@ def notices(program):
     if run('ninja', '-C', BUILD, program).returncode:
         raise ValueError('does not compile')
     try:
-        result = run(f'{BUILD}/bin/{program}', '--gtest_brief=1', '--gtest_fail_fast')
+        result = run(f'{BUILD}/bin/{program}', '--gtest_fail_fast')
     except subprocess.TimeoutExpired:
         return f'{program} hangs'
     if result.returncode == 0:
         return ''
-    return next((line for line in result.stdout.splitlines() if 'FAILED  ]' in line), f'{program} breaks off').strip()
+    lines = result.stdout.splitlines()
+    failed = next((line for line in lines if 'FAILED  ]' in line), None)
+    return failed or f'{program} breaks off: ' + next((line for line in reversed(lines) if 'RUN  ' in line), '')
 
 
 def main():

@@ -58,6 +58,7 @@ TEST_F(BindingTest, ControlsFollowValuesAndBack)
     EXPECT_EQ(document.UndoStack().count(), 3);
     page.UndoRedo(true);
     EXPECT_TRUE(page.level.isChecked());
+    EXPECT_TRUE(page.level.hasFocus()) << "what changed, as it is now";
     EXPECT_FALSE(page.hidden.isVisible());
     document.UndoStack().setIndex(0);
     EXPECT_EQ(page.box.isChecked(), bool(flag));

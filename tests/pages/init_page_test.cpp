@@ -35,6 +35,7 @@ TEST_F(InitPageTest, EmptyListShowsTheGlobalValues)
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     view->page->AppendLine();
     EXPECT_EQ(Texts(1), "||1.500|30.000") << "what was shown is a line by now";
+    ASSERT_EQ(init.GetCount(), 2u);
     EXPECT_EQ(Texts(2), "||1.500|30.000");
     EXPECT_NEAR(init.GetAt(1).InitialH, 1.5 * 0.3048, 1e-5);
     document.UndoStack().undo();

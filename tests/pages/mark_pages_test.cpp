@@ -7,6 +7,7 @@
 #include "pages/location_loader.h"
 
 #include <QCheckBox>
+#include <QClipboard>
 #include <QRadioButton>
 #include <QSignalSpy>
 
@@ -98,9 +99,9 @@ TEST_F(MarkPagesTest, TitlesAndLevelsStayInStep)
     EXPECT_EQ(Levels(), "3 - 7.5 | 1 - 2");
     Undo();
     EXPECT_EQ(Levels(), "3 | 1 - 2") << "as short as it was";
-    Enter(1, 4, "6");
-    Enter(1, 5, "7.5");
-    grid->StoreEditedLine();
+    grid->SetCurrentCell(1, 4);
+    QGuiApplication::clipboard()->setText("6\t7.5");
+    QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier);
     EXPECT_EQ(Levels(), "3 6 7.5 | 1 - 2");
     Undo();
     EXPECT_EQ(Levels(), "3 | 1 - 2") << "both cells in one step";

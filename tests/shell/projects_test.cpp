@@ -71,11 +71,11 @@ TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
                                "File = true\nFile = \"one/r\xC3\xBC.tst\"\n");
     const auto content = [&path] {
         QFile file(path);
-        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+        return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : std::string();
     };
     ASSERT_TRUE(frame->OpenFile(path));
     CKsDoc* document = ViewOf("one/r\u00FC.tst")->GetDocument();
-    const QByteArray before = content();
+    const std::string before = content();
     for (const char* other : {"one/other.TST", "two/r\u00FC.TST"}) {
         document->SetPathName(Path(other));
         EXPECT_EQ(content(), before) << "another file is no other spelling: " << other;
