@@ -13,13 +13,6 @@
     </message>
 </context>
 <context>
-    <name>CKsEditStyle</name>
-    <message>
-        <source>Unit: %1</source>
-        <translation>単位: %1</translation>
-    </message>
-</context>
-<context>
     <name>CSearchDlg</name>
     <message>
         <source>Search</source>
