@@ -216,7 +216,8 @@ class BadText(Case):
         editor = self.editor
         editor.go_to('Encroachment')
         editor.click(editor.field('Add', 'push button'))
-        editor.put(1, 3, '9x', leave=None, table=editor.table(''))
+        headers = [h.name for h in editor.table('').children_until('table column header')]
+        editor.put(1, 1 + headers.index('Left position'), '9x', leave=None, table=editor.table(''))
         for _ in range(2):
             editor.press('alt+d')
             self.assert_told_once('9x')
