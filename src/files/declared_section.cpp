@@ -176,12 +176,13 @@ void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, in
                 .rule = std::move(rule)});
 }
 
-Result<void> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object)
+Result<WriteReport> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object,
+                                 const SafeFileOptions& options)
 {
     const TqlStructure structure(tqlCreate());
     tqlAddTarget(structure.Get(), file.target.name);
     WriteContent(structure.Get(), file.target, object);
     tqlEndSection(structure.Get());
     WriteUnknownTargets(structure.Get(), *file.otherTargets.constOf(object));
-    return SaveStructure(structure.Get(), path);
+    return SaveStructure(structure.Get(), path, options);
 }

@@ -5,6 +5,7 @@
 #include "base/result.h"
 #include "files/declare_field.h"
 #include "files/finding.h"
+#include "files/safe_file.h"
 #include "files/unknown_content.h"
 
 #include <functional>
@@ -70,4 +71,5 @@ void ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object, L
 void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, int number, std::string used,
                 std::function<std::string()> rule);
 /// Puts the object's file into the place of `path` (safe_file.h); what was kept stands behind what is declared.
-Result<void> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object);
+Result<WriteReport> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object,
+                                 const SafeFileOptions& options = {});

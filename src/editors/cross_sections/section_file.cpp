@@ -129,7 +129,7 @@ CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
     return read;
 }
 
-Result<void> SaveCrossSections(const CCrossSections& sections, const std::string& path)
+Result<WriteReport> SaveCrossSections(const CCrossSections& sections, const std::string& path, const SafeFileOptions& options)
 {
-    return SaveDeclared(path, file, &sections);
+    return SaveDeclared(path, file, &sections, options);
 }

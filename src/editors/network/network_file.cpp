@@ -129,7 +129,7 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
     return network;
 }
 
-Result<void> SaveNetwork(const CNetwork& network, const std::string& path)
+Result<WriteReport> SaveNetwork(const CNetwork& network, const std::string& path, const SafeFileOptions& options)
 {
-    return SaveDeclared(path, file, &network);
+    return SaveDeclared(path, file, &network, options);
 }
