@@ -132,6 +132,9 @@ bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformF
         m_whyNone = platform.Status(path, named);
     const bool isHeld = !locked && !m_whyNone && named.IsSameFile(opened);
     if (!isHeld) {
+        // Where there are no locks, a file made for one is of no use; one that holds a name may be another's.
+        if (m_whyNone && (!locked || (!platform.StatusOf(file, opened) && opened.size == 0)))
+            platform.Remove(path);
         platform.Close(file);
         return locked || m_whyNone;
     }
@@ -176,9 +179,10 @@ void FileLock::Release()
 {
     if (!m_platform)
         return;
-    // Removed while it is locked: whoever has opened it by then finds that it is gone when he gets the lock.
+    // Removed while it is locked: whoever has opened it by then finds that it is gone when he gets the lock. Should
+    // somebody have removed it before, what stands there is another's.
     FileStatus opened, named;
-    if (!m_platform->StatusOf(m_file, opened) && !m_platform->Status(m_path, named) && named.IsSameFile(opened))
+    if (m_platform->StatusOf(m_file, opened) || m_platform->Status(m_path, named) || named.IsSameFile(opened))
         m_platform->Remove(m_path);
     m_platform->Close(m_file);
     m_platform = nullptr;

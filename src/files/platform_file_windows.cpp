@@ -95,11 +95,15 @@ public:
     {
         using Kind = FileStatus::Kind;
         BY_HANDLE_FILE_INFORMATION is;
-        if (!::GetFileInformationByHandle(AsHandle(file), &is))
+        FILE_ATTRIBUTE_TAG_INFO tag; // a file that is not yet fetched from elsewhere has one, too, and is no link
+        if (!::GetFileInformationByHandle(AsHandle(file), &is) ||
+            !::GetFileInformationByHandleEx(AsHandle(file), FileAttributeTagInfo, &tag, sizeof tag))
             return LastError();
-        status = {.kind = is.dwFileAttributes & FILE_ATTRIBUTE_REPARSE_POINT ? Kind::Link
-                          : is.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY   ? Kind::Folder
-                                                                             : Kind::File,
+        const bool isLink =
+            tag.FileAttributes & FILE_ATTRIBUTE_REPARSE_POINT && tag.ReparseTag == IO_REPARSE_TAG_SYMLINK;
+        status = {.kind = isLink                                           ? Kind::Link
+                          : is.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY ? Kind::Folder
+                                                                           : Kind::File,
                   .isMine = true, // who may remove a file of ours here is the folder's affair
                   .device = is.dwVolumeSerialNumber,
                   .inode = Joined(is.nFileIndexHigh, is.nFileIndexLow),

@@ -216,7 +216,7 @@ std::error_code SafeWriter::Overwrite(std::string_view text, bool& begun)
     begun = !error;
     if (!error)
         error = WriteAll(m_platform, file, text);
-    if (!error)
+    if (!error && now.size > text.size())
         error = m_platform.Cut(file, text.size());
     if (!error && m_options.sync)
         error = m_platform.Sync(file);

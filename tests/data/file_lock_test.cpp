@@ -72,6 +72,7 @@ TEST_F(Locks, AFolderThatTakesNoneSaysWhy)
         const FileLock lock = FileLock::Try(Path("river.hdkv"), "first", &platform);
         EXPECT_FALSE(lock.IsHeld() || lock.HeldBy());
         EXPECT_EQ(lock.WhyNone(), std::errc::no_lock_available) << call;
+        EXPECT_EQ(FileCount(), 0u) << call;
     }
     const FileLock nowhere = FileLock::WaitFor(Path("missing/river.hdkv"), "first", 10s);
     EXPECT_EQ(nowhere.WhyNone(), std::errc::no_such_file_or_directory);

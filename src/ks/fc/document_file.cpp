@@ -49,6 +49,15 @@ CString LostWords(const LostMetadata& lost)
     return text.join(CKsDocumentFile::tr(", "));
 }
 
+/// What the copy of a file that somebody has changed will be called. It stands beside the file that links lead to.
+CString DisplacedName(const CString& path)
+{
+    auto target = QFileInfo(path).filesystemFilePath();
+    FileStatus status;
+    FollowLinks(PlatformFile::Native(), target, status);
+    return NameOf(QString::fromStdString(FreeCopyName(Utf8FromPath(target), "displaced")));
+}
+
 /// An existing file of that name in whatever case it is spelt, or the path itself. A folder that cannot be read is no
 /// empty one: the file would be written a second time, in another case.
 Result<CString> ExistingEntry(const CString& target)
@@ -170,7 +179,7 @@ WriteAnswer CKsDocumentFile::Ask(const WriteQuestion& question)
         return agreed(KsMessageBox(
             tr("Another program has changed %1 since it was read or saved here.\nSaving writes what is shown instead. "
                "As it is now the file stays in a copy beside it, %2.\nSave?")
-                .arg(name, NameOf(QString::fromStdString(FreeCopyName(question.path, "displaced")))),
+                .arg(name, DisplacedName(path)),
             YesNo));
     case WriteQuestion::LosesMetadata:
         return agreed(KsMessageBox(
@@ -255,8 +264,7 @@ CString CKsDocumentFile::NotesOn(const CString& path, const WriteReport& report)
     QStringList notes;
     if (report.unconfirmed)
         notes << tr("%1 is saved, but the disk has not confirmed it: %2. Should the power fail soon, the file may be "
-                    "found "
-                    "as it was before.")
+                    "found as it was before.")
                      .arg(NameOf(path), KsSystemReason(report.unconfirmed));
     if (!report.displaced.empty())
         notes << tr("What another program had written to %1 is kept in %2.")
