@@ -82,25 +82,23 @@ std::error_code CopyAttributes(int, const char*, LostMetadata&)
 #endif
 
 /// Only the owner of everything may give files away; others may give one to the groups that they are in.
-void CopyOwner(int file, const struct stat& wanted, LostMetadata& lost)
+std::error_code CopyOwner(int file, const struct stat& wanted, LostMetadata& lost)
 {
-    if (::fchown(file, wanted.st_uid, wanted.st_gid) == 0 || ::fchown(file, uid_t(-1), wanted.st_gid) == 0) {
-        // which of both it was is read below
-    }
-    struct stat is
-    {
-    };
-    const bool known = ::fstat(file, &is) == 0;
-    lost.owner = !known || is.st_uid != wanted.st_uid;
-    lost.group = !known || is.st_gid != wanted.st_gid;
+    struct stat is;
+    if (::fchown(file, wanted.st_uid, wanted.st_gid) == -1 && ::fchown(file, uid_t(-1), wanted.st_gid) == -1 &&
+        !IsForbidden(errno) && errno != EINVAL) // a file system may know one owner only
+        return LastError();
+    if (::fstat(file, &is) == -1)
+        return LastError();
+    lost.owner = is.st_uid != wanted.st_uid;
+    lost.group = is.st_gid != wanted.st_gid;
+    return {};
 }
 
 std::error_code SetMode(int file, mode_t mode, bool& lost)
 {
-    struct stat is
-    {
-    };
-    if (::fchmod(file, mode) == -1 && !IsForbidden(errno))
+    struct stat is;
+    if (::fchmod(file, mode) == -1 && errno != EPERM && errno != ENOTSUP)
         return LastError();
     if (::fstat(file, &is) == -1)
         return LastError();
@@ -112,12 +110,11 @@ std::error_code SetMode(int file, mode_t mode, bool& lost)
 
 std::error_code TakePermissionsOf(int file, const char* from, LostMetadata& lost)
 {
-    struct stat wanted
-    {
-    };
+    struct stat wanted;
     if (::stat(from, &wanted) == -1)
         return LastError();
-    CopyOwner(file, wanted, lost);
+    if (const std::error_code error = CopyOwner(file, wanted, lost))
+        return error;
     if (const std::error_code error = CopyAttributes(file, from, lost))
         return error;
     // Bits that let programs run as somebody else do not speak of the new owner; what the old group might do, another
@@ -137,9 +134,7 @@ std::error_code TakePermissionsOfNewFile(int file, const char* folder)
 #ifdef O_TMPFILE
     // What the mask of the process and the folder's access list make of a new file is seen on one without a name.
     const int model = ::open(folder, O_TMPFILE | O_WRONLY | O_CLOEXEC, 0666);
-    struct stat status
-    {
-    };
+    struct stat status;
     if (model != -1 && ::fstat(model, &status) == 0) {
         mode = status.st_mode & 0777;
         std::string list;

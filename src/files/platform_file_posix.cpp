@@ -61,9 +61,7 @@ class PosixFile final : public PlatformFile
 public:
     std::error_code Status(const Path& path, FileStatus& status) override
     {
-        struct stat is
-        {
-        };
+        struct stat is;
         status = {};
         if (::lstat(path.c_str(), &is) == -1)
             return errno == ENOENT ? std::error_code() : LastError();
@@ -113,9 +111,7 @@ public:
 
     std::error_code StatusOf(Handle file, FileStatus& status) override
     {
-        struct stat is
-        {
-        };
+        struct stat is;
         if (::fstat(Fd(file), &is) == -1)
             return LastError();
         status = StatusFrom(is);

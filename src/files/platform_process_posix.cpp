@@ -22,9 +22,7 @@ void IgnoreFileSizeSignal()
 {
 #ifdef SIGXFSZ
     // A handler, for what is ignored would be so in programs that this one starts.
-    struct sigaction action
-    {
-    };
+    struct sigaction action = {};
     action.sa_handler = [](int) {};
     action.sa_flags = SA_RESTART;
     ::sigaction(SIGXFSZ, &action, nullptr);
