@@ -70,8 +70,8 @@ Result<CString> ExistingEntry(const CString& target)
     if (error || status.kind != FileStatus::Kind::None)
         return error ? Result<CString>(NotWritten(target.toStdString(), error)) : target;
     error = platform.List(FolderOf(path), names);
-    if (error == std::errc::no_such_file_or_directory)
-        return target; // as writing will say
+    if (error == std::errc::no_such_file_or_directory || error == std::errc::permission_denied)
+        return target; // as writing will say; a folder may be open to writing alone
     if (error)
         return NotWritten(target.toStdString(), error);
     std::ranges::sort(names);
