@@ -39,7 +39,9 @@ private:
     const SafeFileOptions& m_options;
     PlatformFile& m_platform;
     fs::path m_target, m_folder;
-    FileStatus m_seen; // the target when the save began
+    FileStatus m_seen;         // the target when the save began
+    bool m_isExpected = false; // it held what was expected then
+    bool m_isSettled = false;  // and nobody had touched it for a while
     bool m_replacesOther = false;
     WriteReport m_report;
 };
@@ -55,6 +57,7 @@ std::error_code SafeWriter::Look()
         return std::make_error_code(std::errc::is_a_directory);
     if (m_seen.kind != Kind::File && m_seen.kind != Kind::None)
         return std::make_error_code(std::errc::operation_not_supported);
+    m_isSettled = TimeSince(m_seen.modified) > std::chrono::seconds(2); // the coarsest clock of a file system
     if (m_seen.kind == Kind::File)
         if (const std::error_code error = m_platform.CheckWritable(m_target))
             return error;
@@ -80,9 +83,10 @@ Result<void> SafeWriter::AskBefore()
         FileVersion found;
         if (const std::error_code error = VersionOfFile(m_platform, m_target, found))
             return Failed(error);
-        if (found != *m_options.expected && !m_options.ask)
+        m_isExpected = found == *m_options.expected;
+        if (!m_isExpected && !m_options.ask)
             return Failed(std::make_error_code(ChangedOutside));
-        if (found != *m_options.expected && Ask(WriteQuestion::ChangedOutside) != WriteAnswer::Yes)
+        if (!m_isExpected && Ask(WriteQuestion::ChangedOutside) != WriteAnswer::Yes)
             return cancelled;
     }
     m_report.inPlace = m_seen.links > 1;
@@ -105,15 +109,17 @@ std::error_code SafeWriter::Fill(TemporaryFile& temporary, std::string_view text
                                      : m_platform.TakeNewPermissions(temporary.Handle(), m_folder);
 }
 
-/// Whether a file is what the save was meant to replace.
+/// Whether a file is what the save was meant to replace. Where the content is known, it is read again unless the time
+/// of the last change is far enough back that another one would show in it.
 bool SafeWriter::IsExpected(const fs::path& path)
 {
     FileStatus status;
     if (m_seen.kind == Kind::None || m_platform.Status(path, status) || status.kind != Kind::File)
         return false;
+    if (!m_options.expected || (m_isExpected && m_isSettled && status.IsUnchanged(m_seen)))
+        return status.IsUnchanged(m_seen);
     FileVersion found;
-    return m_options.expected ? !VersionOfFile(m_platform, path, found) && found == *m_options.expected
-                              : status.IsUnchanged(m_seen);
+    return !VersionOfFile(m_platform, path, found) && found == *m_options.expected;
 }
 
 /// Puts the finished temporary file in the place of the target. Whether somebody wrote to the target in the last moment

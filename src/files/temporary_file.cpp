@@ -1,7 +1,6 @@
 #include "files/temporary_file.h"
 
 #include <algorithm>
-#include <chrono>
 #include <random>
 
 namespace fs = std::filesystem;
@@ -32,18 +31,12 @@ bool IsOurName(const fs::path& name)
     return std::all_of(text.begin() + Prefix.size(), text.end() - Suffix.size(), isDigit);
 }
 
-bool IsOld(const FileStatus& status)
-{
-    using namespace std::chrono;
-    const auto now = duration_cast<nanoseconds>(system_clock::now().time_since_epoch());
-    return now - nanoseconds(status.touched) > hours(1);
-}
-
 /// Removes it while it is locked, so that nobody begins to use it meanwhile.
 void RemoveLeftOver(PlatformFile& platform, const fs::path& path)
 {
     FileStatus named, opened;
-    if (platform.Status(path, named) || named.kind != FileStatus::Kind::File || !named.isMine || !IsOld(named))
+    if (platform.Status(path, named) || named.kind != FileStatus::Kind::File || !named.isMine ||
+        TimeSince(named.touched) < std::chrono::hours(1))
         return;
     PlatformFile::Handle file = 0;
     if (platform.Open(path, PlatformFile::Purpose::Read, file))
@@ -136,6 +129,12 @@ std::error_code WriteAll(PlatformFile& platform, PlatformFile::Handle file, std:
         text.remove_prefix(written);
     }
     return {};
+}
+
+std::chrono::nanoseconds TimeSince(std::int64_t time)
+{
+    const auto now = std::chrono::system_clock::now().time_since_epoch();
+    return std::chrono::duration_cast<std::chrono::nanoseconds>(now) - std::chrono::nanoseconds(time);
 }
 
 fs::path NumberedName(const fs::path& path, std::string_view why, int number)

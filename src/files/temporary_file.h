@@ -3,6 +3,7 @@
 
 #include "files/platform_file.h"
 
+#include <chrono>
 #include <string>
 #include <string_view>
 
@@ -44,6 +45,9 @@ private:
 void RemoveLeftOvers(PlatformFile& platform, const std::filesystem::path& folder);
 
 std::error_code WriteAll(PlatformFile& platform, PlatformFile::Handle file, std::string_view text);
+
+/// How long ago a time of a FileStatus was.
+std::chrono::nanoseconds TimeSince(std::int64_t time);
 
 /// PATH.WHY-NUMBER
 std::filesystem::path NumberedName(const std::filesystem::path& path, std::string_view why, int number);
