@@ -179,7 +179,7 @@ int MeasureSave(const Files& files, int rounds)
     };
     std::vector<Candidate> candidates{{"hand-coded writer", fresh([&] { HandCodedWrite(plain, files.saved); })},
                                       {"HD_Parameters to file, without sync", fresh([&] {
-                                           if (const auto saved = SaveHDFile(parameters, files.saved, {.sync = false});
+                                           if (const auto saved = SaveHDFile(parameters, files.saved, {.file = {.sync = false}});
                                                !saved)
                                                std::fprintf(stderr, "%s\n", saved.error().message.c_str());
                                        })}};

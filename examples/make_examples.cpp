@@ -24,7 +24,7 @@ std::string ProjectText(std::initializer_list<std::string_view> members)
     return std::string(tqlGetText(project.Get()));
 }
 
-int Outcome(const Result<void>& written)
+int Outcome(const Result<WriteReport>& written)
 {
     if (written)
         return 0;

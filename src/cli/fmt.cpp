@@ -2,8 +2,13 @@
 
 int Fmt(const std::string& file, const std::string& out, bool checkOnly)
 {
+    const std::string& target = out.empty() ? file : out;
+    FileLock lock;
+    if (const int failed = checkOnly ? Exit::Fine : LockFile(target, lock))
+        return failed;
     HD_Parameters parameters;
-    if (const int failed = OpenFile(file, Purpose::Rewrite, parameters))
+    FileVersion version;
+    if (const int failed = OpenFile(file, Purpose::Rewrite, parameters, &version))
         return failed;
     const Result<std::string> before = ReadWholeFile(file);
     if (!before)
@@ -13,5 +18,5 @@ int Fmt(const std::string& file, const std::string& out, bool checkOnly)
         return same ? Exit::Fine : Complain(file + " is not in canonical form.", Exit::Findings);
     if (same && out.empty())
         return Exit::Fine;
-    return Rewrite(parameters, out.empty() ? file : out);
+    return Rewrite(parameters, target, lock, out.empty() ? std::optional(version) : std::nullopt);
 }

@@ -2,6 +2,7 @@
 #include "cli/commands.h"
 #include "cli/field_text.h"
 #include "cli/open_file.h"
+#include "files/platform_process.h"
 
 #include <CLI/CLI.hpp>
 
@@ -77,6 +78,7 @@ struct Arguments
 
 int main(int argc, char** argv)
 {
+    IgnoreFileSizeSignal();
     CLI::App app("Checks, shows and changes HD parameter files (.hdkv) of river network models.", "hdkv");
     app.set_version_flag("--version", "hdkv " KVR_VERSION);
     app.require_subcommand(1);

@@ -14,9 +14,9 @@ void PrintFinding(std::ostream& stream, const std::string& path, const Finding& 
     stream << path << ':' << finding.line << ':' << finding.column << ": " << FindingText(finding) << '\n';
 }
 
-int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters)
+int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters, FileVersion* version)
 {
-    const Result<TqlStructure> structure = ParseFile(path);
+    const Result<TqlStructure> structure = ParseFile(path, nullptr, version);
     if (!structure)
         return Complain(structure.error().message, Exit::Unreadable);
     const tqlHandle handle = structure.value().Get();
@@ -35,8 +35,34 @@ int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters
     return Exit::Fine;
 }
 
-int Rewrite(const HD_Parameters& parameters, const std::string& path)
+int LockFile(const std::string& path, FileLock& lock)
 {
-    const Result<void> saved = SaveHDFile(parameters, path, {.everySet = true});
-    return saved ? Exit::Fine : Complain(saved.error().message, Exit::NotWritten);
+    constexpr std::chrono::seconds longest(5);
+    lock = FileLock::WaitFor(path, "hdkv", longest);
+    if (!lock.HeldBy())
+        return Exit::Fine;
+    return Complain("\"" + path + "\" was left as it is: it is in use by " + HolderText(*lock.HeldBy()) + ".",
+                    Exit::NotWritten);
+}
+
+int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
+            const std::optional<FileVersion>& expected)
+{
+    const auto saved = SaveHDFile(parameters, path, {.everySet = true, .file = {.expected = expected}});
+    if (!saved)
+        return Complain(saved.error().message, Exit::NotWritten);
+    const std::string name = "\"" + path + "\" ";
+    const WriteReport& report = saved.value();
+    if (lock.WhyNone())
+        Complain(name + "was written without a lock, which its folder does not take: " + lock.WhyNone().message() + ".",
+                 Exit::Fine);
+    if (report.unconfirmed)
+        Complain(name + "is saved, but the disk has not confirmed it: " + report.unconfirmed.message() + ".",
+                 Exit::Fine);
+    if (report.lost.Any())
+        Complain(name + "is saved; not kept of it as it was before: " + LostText(report.lost) + ".", Exit::Fine);
+    if (!report.displaced.empty())
+        Complain(name + "is saved; what another program had written meanwhile is kept in \"" + report.displaced + "\".",
+                 Exit::Fine);
+    return Exit::Fine;
 }

@@ -3,6 +3,7 @@
 
 #include "cli/commands.h"
 #include "data/hd_file.h"
+#include "files/file_lock.h"
 
 #include <ostream>
 #include <string_view>
@@ -18,10 +19,16 @@ enum class Purpose
 
 /// Reads an HD parameter file; Exit::Fine, or a code after a message. For a rewrite it is told what is not taken as it
 /// stands, and a file with content that reading does not keep is refused.
-int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters);
+/// `version` is the content that was read.
+int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters, FileVersion* version = nullptr);
 
-/// Saves with everything in it, incomplete lines and encroachment sets included.
-int Rewrite(const HD_Parameters& parameters, const std::string& path);
+/// Keeps other programs from writing a file until `lock` goes; waits for one that does. Exit::Fine, or a code after a
+/// message that says who has it. A folder that takes no locks is no reason to stop; Rewrite tells of it.
+int LockFile(const std::string& path, FileLock& lock);
+
+/// Saves with everything in it, incomplete lines and encroachment sets included, over the content `expected` only.
+int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
+            const std::optional<FileVersion>& expected = {});
 
 /// Prints "file:line:column: text".
 void PrintFinding(std::ostream& stream, const std::string& path, const Finding& finding);

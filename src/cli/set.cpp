@@ -8,10 +8,15 @@ int Set(const std::string& file, const std::string& keyword, const std::vector<s
     const Result<NamedValue> value = FindKeyword(keyword);
     if (!value)
         return Complain(value.error().message, Exit::Usage);
+    const std::string& target = out.empty() ? file : out;
+    FileLock lock;
+    if (const int failed = LockFile(target, lock))
+        return failed;
     HD_Parameters parameters;
-    if (const int failed = OpenFile(file, Purpose::Rewrite, parameters))
+    FileVersion version;
+    if (const int failed = OpenFile(file, Purpose::Rewrite, parameters, &version))
         return failed;
     if (const Result<void> stored = ParseParams(value.value().fields, values, &parameters.Global); !stored)
         return Complain(value.value().name + ": " + stored.error().message + ".", Exit::Usage);
-    return Rewrite(parameters, out.empty() ? file : out);
+    return Rewrite(parameters, target, lock, out.empty() ? std::optional(version) : std::nullopt);
 }

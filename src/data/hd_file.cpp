@@ -33,8 +33,8 @@ std::string HDFileText(const HD_Parameters& parameters, bool everySet)
     return std::string(tqlGetText(Build(parameters, everySet).Get()));
 }
 
-Result<void> SaveHDFile(const HD_Parameters& parameters, const std::string& path, const SaveOptions& options)
+Result<WriteReport> SaveHDFile(const HD_Parameters& parameters, const std::string& path, const SaveOptions& options)
 {
     const TqlStructure structure = Build(parameters, options.everySet);
-    return SaveStructure(structure.Get(), path, {.sync = options.sync});
+    return SaveStructure(structure.Get(), path, options.file);
 }

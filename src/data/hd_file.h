@@ -16,6 +16,7 @@ std::string HDFileText(const HD_Parameters& parameters, bool everySet = false);
 struct SaveOptions
 {
     bool everySet = false; // write encroachment sets that hold no filled line, too
-    bool sync = true;
+    SafeFileOptions file{};
 };
-Result<void> SaveHDFile(const HD_Parameters& parameters, const std::string& path, const SaveOptions& options = {});
+Result<WriteReport> SaveHDFile(const HD_Parameters& parameters, const std::string& path,
+                               const SaveOptions& options = {});

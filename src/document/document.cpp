@@ -122,7 +122,9 @@ std::size_t CKavo0_hdDoc::UnwrittenSetups() const
 bool CKavo0_hdDoc::WriteData(const CString& path)
 {
     const FirstRows defaults(m_rowsShown);
-    return m_file.Write(path, [this](const std::string& written) { return SaveHDFile(m_parameters, written); });
+    return WriteFile(path, [this](const std::string& written, const SafeFileOptions& options) {
+        return SaveHDFile(m_parameters, written, {.file = options});
+    });
 }
 
 void CKavo0_hdDoc::AtSave(ShownRows shown)

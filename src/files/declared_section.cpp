@@ -255,7 +255,8 @@ void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, in
                 .rule = std::move(rule)});
 }
 
-Result<void> SaveDeclaredFile(const std::string& path, const DeclaredSection& target, const void* object)
+Result<WriteReport> SaveDeclaredFile(const std::string& path, const DeclaredSection& target, const void* object,
+                                     const SafeFileOptions& options)
 {
     const TqlStructure structure(tqlCreate());
     tqlAddTarget(structure.Get(), target.name);
@@ -263,5 +264,5 @@ Result<void> SaveDeclaredFile(const std::string& path, const DeclaredSection& ta
     tqlEndSection(structure.Get());
     WriteKept(target.kept.constOf(object), {},
               [&](const UnknownNodes& nodes) { WriteUnknownTargets(structure.Get(), nodes); });
-    return SaveStructure(structure.Get(), path);
+    return SaveStructure(structure.Get(), path, options);
 }

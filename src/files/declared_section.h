@@ -6,6 +6,7 @@
 #include "files/declare_field.h"
 #include "files/extra_params.h"
 #include "files/finding.h"
+#include "files/safe_file.h"
 #include "files/unknown_content.h"
 
 #include <functional>
@@ -118,4 +119,5 @@ void ReadDeclaredFile(tqlHandle structure, const DeclaredSection& target, void* 
 void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, int number, std::string used,
                 std::function<std::string()> rule);
 /// Puts the object's file into the place of `path` (safe_file.h); what was kept stands behind what is declared.
-Result<void> SaveDeclaredFile(const std::string& path, const DeclaredSection& target, const void* object);
+Result<WriteReport> SaveDeclaredFile(const std::string& path, const DeclaredSection& target, const void* object,
+                                     const SafeFileOptions& options = {});

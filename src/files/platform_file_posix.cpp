@@ -1,19 +1,23 @@
-#include "files/platform_file.h"
+#include "files/permissions_posix.h"
 
+#include <algorithm>
 #include <cerrno>
+#include <cstdio>
 #include <fcntl.h>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
-#ifdef __linux__
-#include <string>
-#include <sys/xattr.h>
-#endif
 
 namespace {
 
 std::error_code LastError()
 {
     return {errno, std::generic_category()};
+}
+
+std::error_code Outcome(int result)
+{
+    return result == -1 ? LastError() : std::error_code();
 }
 
 /// Calls again when a signal interrupted.
@@ -26,55 +30,99 @@ auto Retry(Call call)
     return result;
 }
 
-#ifdef __linux__
-constexpr const char* AccessControlList = "system.posix_acl_access";
-
-/// What a file system or the user's rights do not allow is not asked for: the file has never had it here.
-bool IsForeign(int error)
+std::int64_t Nanoseconds(const timespec& time)
 {
-    return error == ENOTSUP || error == EPERM || error == EACCES;
+    return std::int64_t(time.tv_sec) * 1'000'000'000 + time.tv_nsec;
 }
 
-std::error_code CopyAttribute(int file, const char* from, const char* name)
+FileStatus StatusFrom(const struct stat& status)
 {
-    const ssize_t size = ::getxattr(from, name, nullptr, 0);
-    std::string value(size > 0 ? std::size_t(size) : 0, '\0');
-    const ssize_t read = size == -1 ? -1 : ::getxattr(from, name, value.data(), value.size());
-    const bool copied = read != -1 && ::fsetxattr(file, name, value.data(), std::size_t(read), 0) == 0;
-    return copied || errno == ENODATA || IsForeign(errno) ? std::error_code() : LastError();
-}
-
-/// Extended attributes, the access control list among them.
-std::error_code CopyAttributes(int file, const char* from)
-{
-    ::fremovexattr(file, AccessControlList); // the folder may have given it one
-    const ssize_t size = ::listxattr(from, nullptr, 0);
-    std::string names(size > 0 ? std::size_t(size) : 0, '\0');
-    const ssize_t read = size == -1 ? -1 : ::listxattr(from, names.data(), names.size());
-    if (read == -1)
-        return IsForeign(errno) ? std::error_code() : LastError();
-    names.resize(std::size_t(read));
-    for (std::size_t begin = 0; begin < names.size(); begin += std::char_traits<char>::length(&names[begin]) + 1)
-        if (const std::error_code error = CopyAttribute(file, from, &names[begin]))
-            return error;
-    return {};
-}
+    using Kind = FileStatus::Kind;
+#ifdef __APPLE__
+    const timespec &modified = status.st_mtimespec, &touched = status.st_ctimespec;
 #else
-std::error_code CopyAttributes(int, const char*)
-{
-    return {};
-}
+    const timespec &modified = status.st_mtim, &touched = status.st_ctim;
 #endif
+    return {.kind = S_ISREG(status.st_mode)   ? Kind::File
+                    : S_ISDIR(status.st_mode) ? Kind::Folder
+                    : S_ISLNK(status.st_mode) ? Kind::Link
+                                              : Kind::Other,
+            .isMine = status.st_uid == ::geteuid(),
+            .device = std::uint64_t(status.st_dev),
+            .inode = std::uint64_t(status.st_ino),
+            .size = std::uint64_t(status.st_size),
+            .links = std::uint64_t(status.st_nlink),
+            .modified = Nanoseconds(modified),
+            .touched = std::max(Nanoseconds(modified), Nanoseconds(touched))};
+}
 
 class PosixFile final : public PlatformFile
 {
 public:
-    std::error_code Create(const std::filesystem::path& path, Access access, Handle& file) override
+    std::error_code Status(const Path& path, FileStatus& status) override
     {
-        const mode_t mode = access == Access::OwnerOnly ? 0600 : 0666;
-        const int fd = Retry([&] { return ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode); });
+        struct stat is;
+        status = {};
+        if (::lstat(path.c_str(), &is) == -1)
+            return errno == ENOENT ? std::error_code() : LastError();
+        status = StatusFrom(is);
+        return {};
+    }
+
+    std::error_code ReadLink(const Path& path, Path& target) override
+    {
+        std::error_code error;
+        target = std::filesystem::read_symlink(path, error);
+        return error;
+    }
+
+    std::error_code List(const Path& folder, std::vector<Path>& names) override
+    {
+        std::error_code error;
+        std::filesystem::directory_iterator entry(folder, error);
+        for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error))
+            names.push_back(entry->path().filename());
+        return error;
+    }
+
+    std::error_code CheckWritable(const Path& path) override { return Outcome(::access(path.c_str(), W_OK)); }
+
+    std::error_code Open(const Path& path, Purpose purpose, Handle& file) override
+    {
+        // Without waiting: a pipe under the name of a file must not hold up whoever opens it.
+        const int flags = O_CLOEXEC | O_NONBLOCK |
+                          (purpose == Purpose::Read     ? O_RDONLY
+                           : purpose == Purpose::Change ? O_WRONLY
+                                                        : O_RDWR | O_CREAT | O_NOFOLLOW);
+        int fd = Retry([&] { return ::open(path.c_str(), flags, 0666); });
+        if (fd == -1 && errno == EACCES &&
+            purpose == Purpose::Lock) // somebody else's, which can be locked all the same
+            fd = Retry([&] { return ::open(path.c_str(), O_CLOEXEC | O_NONBLOCK | O_RDONLY | O_NOFOLLOW); });
         file = fd;
-        return fd == -1 ? LastError() : std::error_code();
+        return Outcome(fd);
+    }
+
+    std::error_code Create(const Path& path, Handle& file) override
+    {
+        const int fd = Retry([&] { return ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0600); });
+        file = fd;
+        return Outcome(fd);
+    }
+
+    std::error_code StatusOf(Handle file, FileStatus& status) override
+    {
+        struct stat is;
+        if (::fstat(Fd(file), &is) == -1)
+            return LastError();
+        status = StatusFrom(is);
+        return {};
+    }
+
+    std::error_code Read(Handle file, char* buffer, std::size_t size, std::size_t& read) override
+    {
+        const ssize_t count = Retry([&] { return ::read(Fd(file), buffer, size); });
+        read = count == -1 ? 0 : std::size_t(count);
+        return count == -1 ? LastError() : std::error_code();
     }
 
     std::error_code Write(Handle file, std::string_view text, std::size_t& written) override
@@ -86,25 +134,31 @@ public:
         return count == 0 ? std::make_error_code(std::errc::no_space_on_device) : std::error_code();
     }
 
-    std::error_code TakePermissions(Handle file, const std::filesystem::path& from) override
+    std::error_code Cut(Handle file, std::uint64_t size) override
     {
-        struct stat status;
-        if (::stat(from.c_str(), &status) == -1)
-            return LastError();
-        // Only the owner of everything may give files away; others keep the mode without the bits that would then
-        // speak of somebody else.
-        mode_t mode = status.st_mode & 07777;
-        if (::fchown(Fd(file), status.st_uid, status.st_gid) == -1 &&
-            ::fchown(Fd(file), uid_t(-1), status.st_gid) == -1)
-            mode &= 0777;
-        if (const std::error_code error = CopyAttributes(Fd(file), from.c_str()))
-            return error;
-        return ::fchmod(Fd(file), mode) == -1 ? LastError() : std::error_code();
+        return Outcome(Retry([&] { return ::ftruncate(Fd(file), off_t(size)); }));
+    }
+
+    std::error_code Lock(Handle file) override
+    {
+        // Of the open file, not of the process: so that two documents of one program are told apart, and nothing else
+        // that the program closes lets it go.
+        return Outcome(Retry([&] { return ::flock(Fd(file), LOCK_EX | LOCK_NB); }));
+    }
+
+    std::error_code TakePermissions(Handle file, const Path& from, LostMetadata& lost) override
+    {
+        return TakePermissionsOf(Fd(file), from.c_str(), lost);
+    }
+
+    std::error_code TakeNewPermissions(Handle file, const Path& folder) override
+    {
+        return TakePermissionsOfNewFile(Fd(file), folder.c_str());
     }
 
     std::error_code Sync(Handle file) override
     {
-        return Retry([&] { return ::fsync(Fd(file)); }) == -1 ? LastError() : std::error_code();
+        return Outcome(Retry([&] { return ::fsync(Fd(file)); }));
     }
 
     std::error_code Close(Handle file) override
@@ -113,22 +167,58 @@ public:
         return ::close(Fd(file)) == -1 && errno != EINTR ? LastError() : std::error_code();
     }
 
-    std::error_code CheckWritable(const std::filesystem::path& path) override
+    std::error_code Exchange(const Path& a, const Path& b) override
     {
-        return ::access(path.c_str(), W_OK) == -1 ? LastError() : std::error_code();
+#ifdef RENAME_EXCHANGE
+        if (RenameAs(a, b, RENAME_EXCHANGE) == 0)
+            return {};
+        if (!IsUnknown(errno))
+            return LastError();
+#else
+        (void)a, (void)b;
+#endif
+        return std::make_error_code(std::errc::function_not_supported);
     }
 
-    std::error_code Replace(const std::filesystem::path& from, const std::filesystem::path& to) override
+    std::error_code Replace(const Path& from, const Path& to) override
     {
-        return ::rename(from.c_str(), to.c_str()) == -1 ? LastError() : std::error_code();
+        return Outcome(::rename(from.c_str(), to.c_str()));
     }
 
-    std::error_code Rename(const std::filesystem::path& from, const std::filesystem::path& to) override
+    std::error_code Rename(const Path& from, const Path& to) override
     {
         return Replace(from, to);
     }
 
-    std::error_code SyncFolder(const std::filesystem::path& folder) override
+    std::error_code RenameNew(const Path& from, const Path& to) override
+    {
+#ifdef RENAME_NOREPLACE
+        if (RenameAs(from, to, RENAME_NOREPLACE) == 0)
+            return {};
+        if (!IsUnknown(errno))
+            return LastError();
+#endif
+        // A second name is never given over an existing one either; a file system without such is asked before.
+        if (::link(from.c_str(), to.c_str()) == 0) {
+            const std::error_code error = Remove(from);
+            if (error)
+                ::unlink(to.c_str());
+            return error;
+        }
+        if (errno == EEXIST)
+            return LastError();
+        FileStatus status;
+        if (const std::error_code error = Status(to, status))
+            return error;
+        return status.kind == FileStatus::Kind::None ? Replace(from, to) : std::make_error_code(std::errc::file_exists);
+    }
+
+    std::error_code Remove(const Path& path) override
+    {
+        return Outcome(::unlink(path.c_str()));
+    }
+
+    std::error_code SyncFolder(const Path& folder) override
     {
         const int fd = Retry([&] { return ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC); });
         if (fd == -1)
@@ -139,7 +229,21 @@ public:
     }
 
 private:
-    static int Fd(Handle file) { return int(file); }
+    static int Fd(Handle file)
+    {
+        return int(file);
+    }
+#ifdef RENAME_NOREPLACE
+    static int RenameAs(const Path& from, const Path& to, unsigned how)
+    {
+        return ::renameat2(AT_FDCWD, from.c_str(), AT_FDCWD, to.c_str(), how);
+    }
+    /// The kernel or the file system does not know this kind of renaming.
+    static bool IsUnknown(int error)
+    {
+        return error == EINVAL || error == ENOSYS || error == ENOTSUP;
+    }
+#endif
 };
 
 } // namespace

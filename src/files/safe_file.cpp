@@ -1,218 +1,340 @@
 #include "files/safe_file.h"
 
 #include "base/utf8_path.h"
-
-#include <cerrno>
-#include <fstream>
-#include <random>
+#include "files/temporary_file.h"
 
 namespace fs = std::filesystem;
 
 namespace {
 
-std::string ReasonText(std::error_code reason)
-{
-    if (reason == std::errc::is_a_directory)
-        return "it is a folder";
-    if (reason == std::errc::operation_not_supported)
-        return "it is not an ordinary file";
-    return reason.message();
-}
+using Kind = FileStatus::Kind;
 
-Error NotWritten(const std::string& path, std::error_code reason)
+/// One save, step by step.
+class SafeWriter
 {
-    return {.message = "Could not write \"" + path + "\": " + ReasonText(reason) + ".", .code = reason, .path = path};
-}
+public:
+    SafeWriter(const std::string& path, const SafeFileOptions& options)
+        : m_path(path), m_options(options), m_platform(OrNative(options.platform)), m_target(PathFromUtf8(path))
+    {
+    }
+    Result<WriteReport> Write(std::string_view text);
 
-Error NotRead(const std::string& path, std::error_code reason)
-{
-    return {.message = "Could not read \"" + path + "\": " + ReasonText(reason) + ".",
-            .code = reason,
-            .path = path,
-            .reading = true};
-}
+private:
+    std::error_code Look();
+    Result<void> AskBefore();
+    WriteAnswer Ask(WriteQuestion::Kind kind) const;
+    std::error_code Fill(TemporaryFile& temporary, std::string_view text);
+    bool IsExpected(const fs::path& path);
+    Result<void> PutInPlace(TemporaryFile& temporary);
+    void KeepDisplaced(TemporaryFile& temporary);
+    Result<void> Replace(TemporaryFile& temporary);
+    Result<void> WriteInPlace(TemporaryFile& temporary, std::string_view text);
+    std::error_code Overwrite(std::string_view text, bool& begun);
+    Result<void> KeepTarget();
+    bool Rename();
+    Error Failed(std::error_code reason) const { return NotWritten(m_path, reason); }
+    Error FailedKeeping(std::error_code reason, const fs::path& kept) const;
 
-/// The file that a chain of symbolic links ends at, whether it exists or not.
-std::error_code FollowLinks(fs::path& path)
+    const std::string m_path;
+    const SafeFileOptions& m_options;
+    PlatformFile& m_platform;
+    fs::path m_target, m_folder;
+    FileStatus m_seen;         // the target when the save began
+    bool m_isExpected = false; // it held what was expected then
+    bool m_isSettled = false;  // and nobody had touched it for a while
+    bool m_replacesOther = false;
+    WriteReport m_report;
+};
+
+/// Finds out what is there. A question that the system does not answer ends the save: whoever takes "I do not know" for
+/// "nothing" replaces links by files and forgets modes.
+std::error_code SafeWriter::Look()
 {
-    constexpr int longestChain = 40; // as file systems allow
-    std::error_code error;
-    for (int step = 0; step < longestChain; ++step) {
-        if (!fs::is_symlink(fs::symlink_status(path, error)))
-            return {}; // not there yet is fine; what is wrong with the folder shows when it is written to
-        const fs::path next = fs::read_symlink(path, error);
-        if (error)
+    if (const std::error_code error = FollowLinks(m_platform, m_target, m_seen))
+        return error;
+    m_folder = FolderOf(m_target);
+    if (m_seen.kind == Kind::Folder)
+        return std::make_error_code(std::errc::is_a_directory);
+    if (m_seen.kind != Kind::File && m_seen.kind != Kind::None)
+        return std::make_error_code(std::errc::operation_not_supported);
+    m_isSettled = TimeSince(m_seen.modified) > std::chrono::seconds(2); // the coarsest clock of a file system
+    if (m_seen.kind == Kind::File)
+        if (const std::error_code error = m_platform.CheckWritable(m_target))
             return error;
-        path = next.is_absolute() ? next : path.parent_path() / next;
-    }
-    return std::make_error_code(std::errc::too_many_symbolic_link_levels);
-}
-
-/// Creates a file of a name that nobody has. The name does not contain the target's, which may be as long as names get.
-std::error_code CreateTemporary(PlatformFile& platform, const fs::path& folder, PlatformFile::Access access,
-                                fs::path& path, PlatformFile::Handle& file)
-{
-    std::random_device random;
-    std::error_code error;
-    for (int attempt = 0; attempt < 100; ++attempt) {
-        path = folder / (".kvr-" + std::to_string(random()) + ".tmp");
-        error = platform.Create(path, access, file);
-        if (error != std::errc::file_exists)
-            break;
-    }
+    if (m_options.renameTo.empty())
+        return {};
+    FileStatus other;
+    const std::error_code error = m_platform.Status(PathFromUtf8(m_options.renameTo), other);
+    m_replacesOther = other.kind != Kind::None;
     return error;
 }
 
-std::error_code WriteAll(PlatformFile& platform, PlatformFile::Handle file, std::string_view text)
+WriteAnswer SafeWriter::Ask(WriteQuestion::Kind kind) const
 {
-    while (!text.empty()) {
-        std::size_t written = 0;
-        if (const std::error_code error = platform.Write(file, text, written))
-            return error;
-        text.remove_prefix(written);
+    return m_options.ask({kind, m_path, m_report.lost, m_seen.links});
+}
+
+Result<void> SafeWriter::AskBefore()
+{
+    const Error cancelled = Failed(std::make_error_code(std::errc::operation_canceled));
+    if (m_seen.kind == Kind::None)
+        return {};
+    if (m_options.expected) {
+        FileVersion found;
+        if (const std::error_code error = VersionOfFile(m_platform, m_target, found))
+            return Failed(error);
+        m_isExpected = found == *m_options.expected;
+        if (!m_isExpected && !m_options.ask)
+            return Failed(std::make_error_code(ChangedOutside));
+        if (!m_isExpected && Ask(WriteQuestion::ChangedOutside) != WriteAnswer::Yes)
+            return cancelled;
     }
+    m_report.inPlace = m_seen.links > 1;
+    if (!m_report.inPlace || !m_options.ask)
+        return {};
+    const WriteAnswer answer = Ask(WriteQuestion::HardLinks);
+    m_report.inPlace = answer == WriteAnswer::Yes;
+    return answer == WriteAnswer::Cancel ? cancelled : Result<void>();
+}
+
+std::error_code SafeWriter::Fill(TemporaryFile& temporary, std::string_view text)
+{
+    if (const std::error_code error = temporary.Create(m_folder))
+        return error;
+    if (const std::error_code error = temporary.Write(text))
+        return error;
+    if (m_report.inPlace) // what is there keeps its own
+        return {};
+    return m_seen.kind == Kind::File ? m_platform.TakePermissions(temporary.Handle(), m_target, m_report.lost)
+                                     : m_platform.TakeNewPermissions(temporary.Handle(), m_folder);
+}
+
+/// Whether a file is what the save was meant to replace. Where the content is known, it is read again unless the time
+/// of the last change is far enough back that another one would show in it.
+bool SafeWriter::IsExpected(const fs::path& path)
+{
+    FileStatus status;
+    if (m_seen.kind == Kind::None || m_platform.Status(path, status) || status.kind != Kind::File)
+        return false;
+    if (!m_options.expected || (m_isExpected && m_isSettled && status.IsUnchanged(m_seen)))
+        return status.IsUnchanged(m_seen);
+    FileVersion found;
+    return !VersionOfFile(m_platform, path, found) && found == *m_options.expected;
+}
+
+/// Puts the finished temporary file in the place of the target. Whether somebody wrote to the target in the last moment
+/// is seen for certain only afterwards, on what has just been swapped out.
+Result<void> SafeWriter::PutInPlace(TemporaryFile& temporary)
+{
+    bool exists = m_seen.kind == Kind::File;
+    std::error_code error;
+    for (int attempt = 0; attempt < 2; ++attempt) {
+        error =
+            exists ? m_platform.Exchange(temporary.Path(), m_target) : m_platform.RenameNew(temporary.Path(), m_target);
+        if (error != (exists ? std::errc::no_such_file_or_directory : std::errc::file_exists))
+            break;
+        exists = !exists; // it has come or gone meanwhile
+    }
+    if (error == std::errc::function_not_supported)
+        return Replace(temporary);
+    if (error)
+        return Failed(error);
+    if (exists)
+        KeepDisplaced(temporary);
+    else
+        temporary.Release();
     return {};
 }
 
-/// Writes, syncs and closes a file just created; closes it whatever happens.
-std::error_code Fill(PlatformFile& platform, PlatformFile::Handle file, std::string_view text, bool sync,
-                     const fs::path* permissionsFrom)
+/// What was swapped out now stands under the temporary name, and goes with it if it is what was meant to.
+void SafeWriter::KeepDisplaced(TemporaryFile& temporary)
 {
-    std::error_code error = WriteAll(platform, file, text);
-    if (!error && permissionsFrom)
-        error = platform.TakePermissions(file, *permissionsFrom);
-    if (!error && sync)
-        error = platform.Sync(file);
-    const std::error_code closed = platform.Close(file);
+    if (IsExpected(temporary.Path()))
+        return;
+    fs::path kept;
+    if (temporary.KeepAs(m_target, "displaced", kept)) {
+        kept = temporary.Path();
+        temporary.Release();
+    }
+    m_report.displaced = Utf8FromPath(kept);
+}
+
+Result<void> SafeWriter::KeepTarget()
+{
+    const Result<KeptCopy> kept = KeepOriginal(Utf8FromPath(m_target), "displaced", &m_platform);
+    if (!kept)
+        return kept.error();
+    m_report.displaced = kept.value().path;
+    return {};
+}
+
+/// Where files cannot be swapped: a last look, as late as can be, and one for the other. A replacement that fails half
+/// way may have cost the target; then the temporary file is all there is, and stays.
+Result<void> SafeWriter::Replace(TemporaryFile& temporary)
+{
+    FileStatus now, last;
+    if (const std::error_code error = m_platform.Status(m_target, now))
+        return Failed(error);
+    if (now.kind != Kind::None &&
+        (!IsExpected(m_target) || m_platform.Status(m_target, last) || !last.IsUnchanged(now)))
+        if (Result<void> kept = KeepTarget(); !kept)
+            return kept;
+    const std::error_code error = m_platform.Replace(temporary.Path(), m_target);
+    if (!error) {
+        temporary.Release();
+        return {};
+    }
+    FileStatus left;
+    if (now.kind == Kind::None || m_platform.Status(m_target, left) || left.kind != Kind::None)
+        return Failed(error);
+    const fs::path kept = temporary.Path();
+    temporary.Release();
+    return FailedKeeping(error, kept);
+}
+
+/// Writes over a file that has several names. Until that is done, the whole new content stands beside it under a name
+/// that speaks for itself.
+Result<void> SafeWriter::WriteInPlace(TemporaryFile& temporary, std::string_view text)
+{
+    fs::path copy;
+    if (const std::error_code error = temporary.KeepAs(m_target, "new", copy))
+        return Failed(error);
+    if (m_options.sync)
+        m_platform.SyncFolder(m_folder); // where there is no such thing, the copy has to do as it is
+    bool begun = false;
+    const std::error_code error = Overwrite(text, begun);
+    if (error && begun)
+        return FailedKeeping(error, copy);
+    m_platform.Remove(copy);
+    return error ? Result<void>(Failed(error)) : Result<void>();
+}
+
+std::error_code SafeWriter::Overwrite(std::string_view text, bool& begun)
+{
+    PlatformFile::Handle file = 0;
+    if (const std::error_code error = m_platform.Open(m_target, PlatformFile::Purpose::Change, file))
+        return error;
+    FileStatus now;
+    std::error_code error = m_platform.StatusOf(file, now);
+    if (!error && (!now.IsUnchanged(m_seen) || !IsExpected(m_target)))
+        if (const Result<void> kept = KeepTarget(); !kept)
+            error = kept.error().code;
+    begun = !error;
+    if (!error)
+        error = WriteAll(m_platform, file, text);
+    if (!error && now.size > text.size())
+        error = m_platform.Cut(file, text.size());
+    if (!error && m_options.sync)
+        error = m_platform.Sync(file);
+    const std::error_code closed = m_platform.Close(file);
     return error ? error : closed;
 }
 
-/// What stands in the way of replacing an existing target.
-std::error_code Obstacle(PlatformFile& platform, const fs::path& target, bool& exists)
+/// Gives the entry - a link itself - its new spelling. The content is safe already.
+bool SafeWriter::Rename()
 {
-    std::error_code ignored;
-    const fs::file_status status = fs::status(target, ignored);
-    exists = fs::exists(status);
-    if (!exists)
-        return {};
-    if (fs::is_directory(status))
-        return std::make_error_code(std::errc::is_a_directory);
-    if (!fs::is_regular_file(status))
-        return std::make_error_code(std::errc::operation_not_supported);
-    return platform.CheckWritable(target);
+    if (m_options.renameTo.empty())
+        return false;
+    const fs::path from = PathFromUtf8(m_path), to = PathFromUtf8(m_options.renameTo);
+    m_report.notRenamed = m_replacesOther ? m_platform.Rename(from, to) : m_platform.RenameNew(from, to);
+    return !m_report.notRenamed;
 }
 
-/// Puts the finished temporary file in the place of the target. A replacement that fails half way may have cost the
-/// target; then the temporary file is all there is, and stays.
-Result<void> PutInPlace(PlatformFile& platform, const fs::path& temporary, const fs::path& target, bool existed,
-                        const std::string& path)
+Error SafeWriter::FailedKeeping(std::error_code reason, const fs::path& kept) const
 {
-    const std::error_code error = platform.Replace(temporary, target);
-    if (!error)
-        return {};
-    Error failure = NotWritten(path, error);
-    std::error_code ignored;
-    if (existed && !fs::exists(target, ignored)) {
-        failure.kept = Utf8FromPath(temporary);
-        failure.message += " The new content is complete in \"" + failure.kept + "\".";
-    } else {
-        fs::remove(temporary, ignored);
-    }
+    Error failure = Failed(reason);
+    failure.kept = Utf8FromPath(kept);
+    failure.message += " The new content is complete in \"" + failure.kept + "\".";
     return failure;
+}
+
+Result<WriteReport> SafeWriter::Write(std::string_view text)
+{
+    if (const std::error_code error = Look())
+        return Failed(error);
+    if (const Result<void> agreed = AskBefore(); !agreed)
+        return agreed.error();
+    RemoveLeftOvers(m_platform, m_folder);
+    TemporaryFile temporary(m_platform);
+    if (const std::error_code error = Fill(temporary, text))
+        return Failed(error);
+    if (m_report.lost.Any() && m_options.ask && Ask(WriteQuestion::LosesMetadata) != WriteAnswer::Yes)
+        return Failed(std::make_error_code(std::errc::operation_canceled));
+    if (const std::error_code error = temporary.Finish(m_options.sync))
+        return Failed(error);
+    if (const Result<void> put = m_report.inPlace ? WriteInPlace(temporary, text) : PutInPlace(temporary); !put)
+        return put.error();
+    m_report.version = VersionOfText(text);
+    // The new content is in place and whole. Should a folder not reach the medium before the power fails, the old
+    // content is found whole instead: no failure, but not what a user takes "saved" for either.
+    const bool renamed = Rename();
+    const fs::path entryFolder = FolderOf(PathFromUtf8(m_path));
+    if (m_options.sync && !m_report.inPlace)
+        m_report.unconfirmed = m_platform.SyncFolder(m_folder);
+    if (m_options.sync && renamed && !m_report.unconfirmed && (m_report.inPlace || entryFolder != m_folder))
+        m_report.unconfirmed = m_platform.SyncFolder(entryFolder);
+    return m_report;
 }
 
 } // namespace
 
-Result<void> WriteFileSafely(const std::string& path, std::string_view text, const SafeFileOptions& options)
+Result<WriteReport> WriteFileSafely(const std::string& path, std::string_view text, const SafeFileOptions& options)
 {
-    PlatformFile& platform = options.platform ? *options.platform : PlatformFile::Native();
-    fs::path target = PathFromUtf8(path);
-    if (const std::error_code error = FollowLinks(target))
-        return NotWritten(path, error);
-    bool exists = false;
-    if (const std::error_code obstacle = Obstacle(platform, target, exists))
-        return NotWritten(path, obstacle);
-
-    const fs::path folder = target.has_parent_path() ? target.parent_path() : fs::path(".");
-    const auto access = exists ? PlatformFile::Access::OwnerOnly : PlatformFile::Access::New;
-    fs::path temporary;
-    PlatformFile::Handle file = 0;
-    if (const std::error_code error = CreateTemporary(platform, folder, access, temporary, file))
-        return NotWritten(path, error);
-    if (const std::error_code error = Fill(platform, file, text, options.sync, exists ? &target : nullptr)) {
-        std::error_code ignored;
-        fs::remove(temporary, ignored);
-        return NotWritten(path, error);
-    }
-    if (Result<void> put = PutInPlace(platform, temporary, target, exists, path); !put)
-        return put;
-    // The new content is in place and whole. Should the folder not reach the medium before the power fails, the old
-    // content is found whole instead: nothing that calling this a failure could still undo.
-    if (options.sync)
-        platform.SyncFolder(folder);
-    return {};
-}
-
-Result<void> RenameFile(const std::string& from, const std::string& to, PlatformFile* platformOrNull)
-{
-    PlatformFile& platform = platformOrNull ? *platformOrNull : PlatformFile::Native();
-    const std::error_code error = platform.Rename(PathFromUtf8(from), PathFromUtf8(to));
-    return error ? NotWritten(to, error) : Result<void>();
+    return SafeWriter(path, options).Write(text);
 }
 
 std::string FreeCopyName(const std::string& path, std::string_view why)
 {
     std::error_code ignored;
     for (int number = 1;; ++number) {
-        std::string copy = path + '.' + std::string(why) + '-' + std::to_string(number);
-        if (!fs::exists(fs::symlink_status(PathFromUtf8(copy), ignored)))
-            return copy;
+        const fs::path copy = NumberedName(PathFromUtf8(path), why, number);
+        if (!fs::exists(fs::symlink_status(copy, ignored)))
+            return Utf8FromPath(copy);
     }
 }
 
-Result<std::string> KeepOriginal(const std::string& path, std::string_view why, PlatformFile* platformOrNull)
+Result<KeptCopy> KeepOriginal(const std::string& path, std::string_view why, PlatformFile* platformOrNull)
 {
-    PlatformFile& platform = platformOrNull ? *platformOrNull : PlatformFile::Native();
-    const Result<std::string> content = ReadWholeFile(path);
+    PlatformFile& platform = OrNative(platformOrNull);
+    const Result<std::string> content = ReadWholeFile(path, &platform);
     if (!content)
         return content.error();
-    std::string copy;
-    PlatformFile::Handle file = 0;
-    std::error_code error;
-    do { // again when somebody else took the name meanwhile
-        copy = FreeCopyName(path, why);
-        error = platform.Create(PathFromUtf8(copy), PlatformFile::Access::OwnerOnly, file);
-    } while (error == std::errc::file_exists);
-    if (error)
-        return NotWritten(copy, error);
     const fs::path original = PathFromUtf8(path);
-    error = Fill(platform, file, content.value(), true, &original);
-    if (error) {
-        std::error_code ignored;
-        fs::remove(PathFromUtf8(copy), ignored);
-        return NotWritten(copy, error);
-    }
-    return copy;
+    TemporaryFile temporary(platform);
+    LostMetadata lost;
+    fs::path kept;
+    std::error_code error = temporary.Create(FolderOf(original));
+    if (!error)
+        error = temporary.Write(content.value());
+    if (!error)
+        error = platform.TakePermissions(temporary.Handle(), original, lost);
+    if (!error)
+        error = temporary.Finish(true);
+    if (!error)
+        error = temporary.KeepAs(original, why, kept);
+    if (error)
+        return NotWritten(Utf8FromPath(NumberedName(original, why, 1)), error);
+    platform.SyncFolder(FolderOf(original)); // a copy that the disk does not confirm is better than none
+    return KeptCopy{Utf8FromPath(kept), VersionOfText(content.value())};
 }
 
-Result<std::string> ReadWholeFile(const std::string& path)
+std::string LostText(const LostMetadata& lost)
 {
-    std::error_code error;
-    const fs::path file = PathFromUtf8(path);
-    const auto size = fs::file_size(file, error);
-    if (error)
-        return NotRead(path, error);
-    errno = 0;
-    std::ifstream stream(file, std::ios::binary);
-    std::string content(std::size_t(size), '\0');
-    if (!stream.read(content.data(), std::streamsize(content.size())))
-        return NotRead(path,
-                       std::make_error_code(errno == EACCES ? std::errc::permission_denied : std::errc::io_error));
-    return content;
+    std::string text;
+    const auto add = [&](bool isLost, const char* what) {
+        if (isLost)
+            text += (text.empty() ? "" : ", ") + std::string(what);
+    };
+    add(lost.owner, "owner");
+    add(lost.group, "group");
+    add(lost.mode, "mode");
+    add(lost.accessList, "access list");
+    add(lost.attributes, "extended attributes");
+    return text;
 }
 
 bool SameFile(const std::string& a, const std::string& b)
 {
-    std::error_code error;
-    return std::filesystem::equivalent(PathFromUtf8(a), PathFromUtf8(b), error) && !error;
+    bool same = false;
+    return !IsSameFile(PlatformFile::Native(), PathFromUtf8(a), PathFromUtf8(b), same) && same;
 }

@@ -15,9 +15,12 @@ Result<TqlStructure> Checked(TqlStructure structure, TqlSyntaxError* report)
 
 } // namespace
 
-Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report)
+Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report, FileVersion* version)
 {
-    return Checked(TqlStructure(tqlLoadFile(path)), report);
+    Result<TqlStructure> structure = Checked(TqlStructure(tqlLoadFile(path)), report);
+    if (structure && version)
+        *version = VersionOfText(tqlGetSource(structure.value().Get()));
+    return structure;
 }
 
 Result<TqlStructure> ParseText(std::string text, const std::string& name)
@@ -25,7 +28,7 @@ Result<TqlStructure> ParseText(std::string text, const std::string& name)
     return Checked(TqlStructure(tqlLoadText(std::move(text), name)), nullptr);
 }
 
-Result<void> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options)
+Result<WriteReport> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options)
 {
     const std::string_view text = tqlGetText(built);
     if (text.empty()) // the library refuses what no reader could take back

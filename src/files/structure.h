@@ -31,10 +31,11 @@ private:
 };
 
 /// Parses a parameter file; the error is the parser's sentence with file, line and column, and, for whoever says it in
-/// another language, its report.
-Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report = nullptr);
+/// another language, its report. `version` is the content that was parsed.
+Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report = nullptr,
+                               FileVersion* version = nullptr);
 /// Likewise a text; `name` stands for the file in messages.
 Result<TqlStructure> ParseText(std::string text, const std::string& name);
 
 /// Puts what was built into the place of a file (safe_file.h).
-Result<void> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options = {});
+Result<WriteReport> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options = {});

@@ -1,6 +1,7 @@
 #include "shell/project_respell.h"
 
 #include "files/structure.h"
+#include "ks/fc/document_file.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/system_reason.h"
 #include "shell/project_file.h"
@@ -51,7 +52,7 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
     return offsets;
 }
 
-Result<void> Respell(const QString& projectPath, const QString& path, const QByteArray& extension)
+Result<WriteReport> Respell(const QString& projectPath, const QString& path, const QByteArray& extension)
 {
     const Result<std::string> content = ReadWholeFile(projectPath.toStdString());
     if (!content)
@@ -60,7 +61,7 @@ Result<void> Respell(const QString& projectPath, const QString& path, const QByt
     for (const qsizetype offset : ExtensionsOf(projectPath, text, path))
         if (text.mid(offset, extension.size()).compare(extension, Qt::CaseInsensitive) == 0)
             text.replace(offset, extension.size(), extension);
-    return WriteFileSafely(projectPath.toStdString(), text.toStdString());
+    return WriteFileSafely(projectPath.toStdString(), text.toStdString(), {.expected = VersionOfText(content.value())});
 }
 
 } // namespace
@@ -75,13 +76,15 @@ void RespellMember(const CProjects& projects, const QString& oldPath, const QStr
     for (const auto& project : projects.All()) {
         if (!project->members.contains(QDir::cleanPath(oldPath)))
             continue;
-        const Result<void> respelt = Respell(project->path, oldPath, after.suffix().toUtf8());
-        if (respelt)
-            continue;
+        const Result<WriteReport> respelt = Respell(project->path, oldPath, after.suffix().toUtf8());
         const QString text =
-            ProjectRespell::tr(
-                "The project %1 still names %2 and could not be changed: %3.\nThe file is found all the same.")
-                .arg(project->name, before.fileName(), KsSystemReason(respelt.error().code));
+            respelt
+                ? CKsDocumentFile::NotesOn(project->path, respelt.value())
+                : ProjectRespell::tr(
+                      "The project %1 still names %2 and could not be changed: %3.\nThe file is found all the same.")
+                      .arg(project->name, before.fileName(), KsSystemReason(respelt.error().code));
+        if (text.isEmpty())
+            continue;
         QTimer::singleShot(0, qApp, [text] { KsMessageBox(text); }); // when the save is over
     }
 }

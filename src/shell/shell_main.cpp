@@ -1,5 +1,6 @@
 #include "shell/shell_main.h"
 
+#include "files/platform_process.h"
 #include "ks/language/language.h"
 #include "shell/main_frame.h"
 #include "shell/settings_keys.h"
@@ -30,6 +31,7 @@ QString StartLanguage()
 
 int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
 {
+    IgnoreFileSizeSignal();
     QCoreApplication::setOrganizationName(QStringLiteral("KVR"));
     QCoreApplication::setApplicationName(QStringLiteral("KVR Shell"));
     QCoreApplication::setApplicationVersion(QStringLiteral(KVR_VERSION));

@@ -154,6 +154,12 @@ tqlHandle tqlLoadText(std::string text, const std::string& name)
     });
 }
 
+std::string_view tqlGetSource(tqlHandle handle)
+{
+    Structure* const structure = AsStructure(handle);
+    return structure ? std::string_view(structure->text.Data(), structure->text.Size()) : std::string_view();
+}
+
 int tqlPeekErrorGlb()
 {
     return int(globalError);

@@ -76,6 +76,8 @@ bool tqlGetSyntaxErr(tqlHandle structure, TqlSyntaxError* report);
 tqlHandle tqlLoadFile(const std::string& path, int mode = 1);
 /// The same for text in memory; `name` stands for the file in messages.
 tqlHandle tqlLoadText(std::string text, const std::string& name);
+/// The bytes that were parsed, as they were read. Valid as long as the structure; empty after an error.
+std::string_view tqlGetSource(tqlHandle structure);
 /// Releases a structure (loaded or created) and sets the handle to null.
 void tqlClose(tqlHandle* structure);
 

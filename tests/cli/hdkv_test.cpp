@@ -1,6 +1,8 @@
 // The program itself: exit codes, what goes to which output, and what happens to files.
 #include "data/hd_support.h"
 
+#include "files/file_lock.h"
+
 #include <cstdlib>
 
 namespace {
@@ -228,12 +230,33 @@ TEST_F(Hdkv, AFullDiskCostsNothing)
 {
     const std::string before = Text("a.hdkv");
     const std::size_t files = FileCount();
-    m_prefix = "trap '' XFSZ; ulimit -f 4; ";
+    m_prefix = "ulimit -f 4; ";
     EXPECT_EQ(Run("set a.hdkv G_f 7"), 4);
     EXPECT_NE(err.find("a.hdkv\": File too large."), std::string::npos) << err;
     EXPECT_EQ(Text("a.hdkv"), before);
     EXPECT_EQ(FileCount(), files + 2); // the outputs of the run
     m_prefix.clear();
     EXPECT_EQ(Run("show a.hdkv >/dev/full 2>err.txt; exit $? #"), 4);
+}
+
+TEST_F(Hdkv, ProgramsThatChangeOneFileAtOnceLoseNothing)
+{
+    const std::string hdkv = "\"" HDKV "\" ";
+    for (int round = 1; round <= 50; ++round) {
+        const std::string number = std::to_string(round);
+        m_prefix = "true; " + hdkv + "set a.hdkv G_f " + number + " & other=$!; ";
+        EXPECT_EQ(Run("set a.hdkv G_waterlevel " + number + "; code=$?; wait $other && exit $code; exit 99 #"), 0);
+        m_prefix.clear();
+        EXPECT_EQ(Got("G_f") + Got("G_waterlevel"), number + "\n" + number + "\n");
+    }
+    const std::string before = Text("a.hdkv");
+    const FileLock lock = FileLock::Try(Path("a.hdkv"), "somebody");
+    ASSERT_TRUE(lock.IsHeld());
+    EXPECT_EQ(Run("set a.hdkv G_f 1"), 4);
+    EXPECT_NE(err.find("\"a.hdkv\" was left as it is: it is in use by "), std::string::npos) << err;
+    EXPECT_NE(err.find("(somebody, process "), std::string::npos) << err;
+    EXPECT_EQ(Run("show a.hdkv"), 0) << "reading needs no lock";
+    EXPECT_EQ(Run("fmt --check a.hdkv"), 0) << err;
+    EXPECT_EQ(Text("a.hdkv"), before);
 }
 #endif

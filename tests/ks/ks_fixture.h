@@ -13,6 +13,7 @@
 #include <QTemporaryDir>
 #include <QTest>
 #include <QVBoxLayout>
+#include <functional>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -32,8 +33,12 @@ public:
     {
         QFile file(SavePathFor(path));
         executing = IsExecuting();
-        if (!canSave || !file.open(QIODevice::WriteOnly))
+        if (!canSave || !file.open(QIODevice::WriteOnly)) {
+            if (!why.isEmpty())
+                TellNotSaved(why);
+            onRefused();
             return false;
+        }
         file.write(text.toUtf8());
         if (namesItself)
             SetPathName(SavePathFor(path));
@@ -51,7 +56,8 @@ public:
         text.clear();
     }
 
-    QString text;
+    QString text, why; // it says when it cannot be saved
+    std::function<void()> onRefused = [] {};
     bool canSave = true, namesItself = false, executing = false;
 };
 

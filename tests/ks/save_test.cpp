@@ -43,6 +43,33 @@ TEST_F(KsTest, AFailedSaveKeepsNameAndFlag)
     EXPECT_FALSE(document->IsExecuting());
 }
 
+TEST_F(KsTest, ASaveThatFailedOffersAnotherName)
+{
+    TextDoc* document = Open(Write("a.TST", "old"));
+    document->text = "new";
+    document->SetModifiedFlag();
+    document->canSave = false;
+    document->why = "The disk is full.";
+    answers = {Button::No};
+    EXPECT_FALSE(document->DoSave(document->GetPathName()));
+    ASSERT_EQ(asked.size(), 1);
+    EXPECT_TRUE(asked[0].startsWith("The disk is full.\n")) << qPrintable(asked[0]);
+    EXPECT_TRUE(questions.empty() && document->IsModified());
+
+    answers = {Button::Yes, Button::Yes};
+    names << Path("again.tst") << QString();
+    EXPECT_FALSE(document->DoSave(document->GetPathName())) << "cancelled at the second attempt";
+    EXPECT_EQ(questions.size(), 2u);
+    EXPECT_EQ(document->GetPathName(), Path("a.TST"));
+
+    answers = {Button::Yes};
+    names << Path("elsewhere.tst");
+    document->onRefused = [document] { document->canSave = true; };
+    EXPECT_TRUE(document->DoSave(document->GetPathName()));
+    EXPECT_EQ(document->GetPathName(), Path("elsewhere.TST"));
+    EXPECT_EQ(Read(Path("elsewhere.TST")) + Read(Path("a.TST")), "newold");
+}
+
 TEST_F(KsTest, SaveAsAsksAboutTheFileThatIsReallyWritten)
 {
     Write("taken.TST", "old");

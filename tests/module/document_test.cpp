@@ -1,6 +1,7 @@
 #include "module_fixture.h"
 
 #include <QDir>
+#include <filesystem>
 #include <QUndoStack>
 
 namespace {
@@ -182,6 +183,51 @@ TEST_F(DocumentTest, ASaveUnderTheNameOfAnotherFileTakesItsPlaceWhateverItsCase)
     Write(Path("b.hdkv"), "[Other]\n[/Other]\n");
     ASSERT_TRUE(document.OnSaveDocument(Path("b.HDKV")));
     EXPECT_EQ(Read(Path("b.hdkv")), "[Other]\n[/Other]\n");
+}
+#endif
+
+// A save replaces what the document was read from or last saved as, and asks about anything else.
+TEST_F(DocumentTest, WhatAnotherProgramHasWrittenIsAskedAboutAndKept)
+{
+    Write(Path("river.HDKV"), SmallFile);
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+    ASSERT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    ASSERT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_TRUE(boxes.isEmpty());
+    Write(Path("river.HDKV"), "theirs");
+    answer = QMessageBox::No;
+    EXPECT_FALSE(document.OnSaveDocument(Path("river.HDKV")));
+    ASSERT_EQ(boxes.size(), 1) << "who says no needs no reason";
+    EXPECT_TRUE(boxes[0].contains("river.HDKV.displaced-1")) << qPrintable(boxes[0]);
+    EXPECT_EQ(Read(Path("river.HDKV")), "theirs");
+    answer = QMessageBox::Yes;
+    EXPECT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(Read(Path("river.HDKV.displaced-1")), "theirs");
+    EXPECT_EQ(document.File().SaveNotes(),
+              "What another program had written to river.HDKV is kept in river.HDKV.displaced-1.");
+    EXPECT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(boxes.size(), 2);
+    EXPECT_EQ(document.File().SaveNotes(), "");
+}
+
+#ifndef _WIN32
+TEST_F(DocumentTest, OtherNamesOfAFileAreAskedAboutOnce)
+{
+    for (const auto choice : {QMessageBox::Cancel, QMessageBox::No, QMessageBox::Yes}) {
+        Write(Path("river.HDKV"), SmallFile);
+        QFile::remove(Path("other"));
+        std::filesystem::create_hard_link(Path("river.HDKV").toStdString(), Path("other").toStdString());
+        ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+        boxes.clear();
+        answer = choice;
+        EXPECT_EQ(bool(document.OnSaveDocument(Path("river.HDKV"))), choice != QMessageBox::Cancel);
+        EXPECT_EQ(boxes.size(), 1);
+        EXPECT_EQ(Read(Path("other")) == SmallFile, choice != QMessageBox::Yes);
+    }
+    document.Parameters().Global.G_waterlevel = 4.5;
+    EXPECT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(Read(Path("other")).contains("G_waterlevel = 4.5"));
 }
 #endif
 

@@ -16,7 +16,10 @@ BOOL CParameterDoc::OnOpenDocument(const CString& path)
 BOOL CParameterDoc::OnSaveDocument(const CString& path)
 {
     UpdateAllViews(nullptr, StoreHint);
-    if (!m_file.MayReplace(path) || !m_file.Write(path, [this](const std::string& written) { return Save(written); }))
+    if (!m_file.MayReplace(path) ||
+        !WriteFile(path, [this](const std::string& written, const SafeFileOptions& options) {
+            return Save(written, options);
+        }))
         return false;
     FileWritten();
     if (!m_file.Renamed().isEmpty())

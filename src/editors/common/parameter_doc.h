@@ -17,5 +17,5 @@ public:
 
 protected:
     virtual void Load(tqlHandle structure, LoadReport& report) = 0;
-    virtual Result<void> Save(const std::string& path) const = 0;
+    virtual Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const = 0;
 };

@@ -19,9 +19,9 @@ void CCrossSectionDoc::Load(tqlHandle structure, LoadReport& report)
     m_sections = LoadCrossSections(structure, report);
 }
 
-Result<void> CCrossSectionDoc::Save(const std::string& path) const
+Result<WriteReport> CCrossSectionDoc::Save(const std::string& path, const SafeFileOptions& options) const
 {
-    return SaveCrossSections(m_sections, path);
+    return SaveCrossSections(m_sections, path, options);
 }
 
 void CCrossSectionDoc::DeleteContents()

@@ -23,7 +23,7 @@ public:
 
 protected:
     void Load(tqlHandle structure, LoadReport& report) override;
-    Result<void> Save(const std::string& path) const override;
+    Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const override;
 
 private:
     CCrossSections m_sections;

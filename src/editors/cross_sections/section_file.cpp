@@ -128,7 +128,7 @@ CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
     return read;
 }
 
-Result<void> SaveCrossSections(const CCrossSections& sections, const std::string& path)
+Result<WriteReport> SaveCrossSections(const CCrossSections& sections, const std::string& path, const SafeFileOptions& options)
 {
-    return SaveDeclaredFile(path, file, &sections);
+    return SaveDeclaredFile(path, file, &sections, options);
 }

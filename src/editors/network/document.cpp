@@ -25,9 +25,9 @@ void CNetworkDoc::Load(tqlHandle structure, LoadReport& report)
     m_network = LoadNetwork(structure, report);
 }
 
-Result<void> CNetworkDoc::Save(const std::string& path) const
+Result<WriteReport> CNetworkDoc::Save(const std::string& path, const SafeFileOptions& options) const
 {
-    return SaveNetwork(m_network, path);
+    return SaveNetwork(m_network, path, options);
 }
 
 void CNetworkDoc::DeleteContents()

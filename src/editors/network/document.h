@@ -31,7 +31,7 @@ signals:
 
 protected:
     void Load(tqlHandle structure, LoadReport& report) override;
-    Result<void> Save(const std::string& path) const override;
+    Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const override;
 
 private:
     CNetwork m_network;

@@ -131,7 +131,7 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
     return network;
 }
 
-Result<void> SaveNetwork(const CNetwork& network, const std::string& path)
+Result<WriteReport> SaveNetwork(const CNetwork& network, const std::string& path, const SafeFileOptions& options)
 {
-    return SaveDeclaredFile(path, file, &network);
+    return SaveDeclaredFile(path, file, &network, options);
 }

@@ -78,7 +78,8 @@ public:
     virtual CString SavePathFor(const CString& path) const;
 
     /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
-    /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As.
+    /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the user
+    /// is asked for another name, too, if he wants.
     BOOL DoSave(const CString& path);
     /// Has the views take over what is being typed, then asks whether to save when the document is modified; false when
     /// the user cancelled or the save failed.
@@ -121,11 +122,17 @@ signals:
     /// What was done, for the status bar.
     void Said(const CString& text);
 
+protected:
+    /// Tells why OnSaveDocument could not write. When DoSave has called it, the user is told when it is over, and may
+    /// choose another name at once.
+    void TellNotSaved(const CString& why);
+
 private:
     friend class CMultiDocTemplate;
     void StepMade(int index);
+    bool SaveTo(const CString& target);
 
-    CString m_path, m_title;
+    CString m_path, m_title, m_whyNotSaved;
     std::vector<CView*> m_views;
     QUndoStack* m_undo = nullptr; // child object
     CMultiDocTemplate* m_template = nullptr;

@@ -9,6 +9,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
+#include <utility>
 
 namespace {
 
@@ -56,16 +57,38 @@ BOOL CKsDoc::DoSave(const CString& path)
 {
     if (!MayLeave())
         return false;
-    const CString target = path.isEmpty() ? AskSavePath(*this) : path;
-    if (target.isEmpty())
-        return false;
+    CString target = path;
+    do {
+        if (target.isEmpty())
+            target = AskSavePath(*this);
+        if (target.isEmpty())
+            return false;
+        if (SaveTo(std::exchange(target, {})))
+            return true;
+    } while (!m_whyNotSaved.isEmpty() &&
+             KsMessageBox(m_whyNotSaved + u'\n' + tr("The changes are not saved. Save them under another name?"),
+                          QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes);
+    return false;
+}
+
+bool CKsDoc::SaveTo(const CString& target)
+{
     m_named = false;
+    m_whyNotSaved.clear();
     m_executing = true;
     const bool saved = OnSaveDocument(target);
     m_executing = false;
     if (saved && !m_named)
         SetPathName(SavePathFor(target));
     return saved;
+}
+
+void CKsDoc::TellNotSaved(const CString& why)
+{
+    if (m_executing)
+        m_whyNotSaved = why;
+    else
+        KsMessageBox(why);
 }
 
 bool CKsDoc::MayLeave()

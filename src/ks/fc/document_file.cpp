@@ -1,13 +1,14 @@
 #include "ks/fc/document_file.h"
 
+#include "base/utf8_path.h"
 #include "files/structure.h"
-#include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/syntax_error.h"
 #include "ks/fc/system_reason.h"
 
 #include <QDir>
 #include <QFileInfo>
+#include <algorithm>
 
 namespace {
 
@@ -16,20 +17,70 @@ CString NameOf(const CString& path)
     return QFileInfo(path).fileName();
 }
 
-/// What went wrong with a file, in the user's language.
-void Tell(const Error& error)
+CString Native(const std::string& path)
 {
-    if (!error.code) {
-        KsMessageBox(QString::fromStdString(error.message));
-        return;
-    }
-    const auto native = [](const std::string& path) { return QDir::toNativeSeparators(QString::fromStdString(path)); };
+    return QDir::toNativeSeparators(QString::fromStdString(path));
+}
+
+/// What went wrong with a file, in the user's language.
+CString Sentence(const Error& error)
+{
+    if (!error.code)
+        return QString::fromStdString(error.message);
     const QString what = error.reading ? CKsDocumentFile::tr("Could not read \"%1\": %2.")
                                        : CKsDocumentFile::tr("Could not write \"%1\": %2.");
-    QString text = what.arg(native(error.path), KsSystemReason(error.code));
+    QString text = what.arg(Native(error.path), KsSystemReason(error.code));
     if (!error.kept.empty())
-        text += u'\n' + CKsDocumentFile::tr("The new content is complete in \"%1\".").arg(native(error.kept));
-    KsMessageBox(text);
+        text += u'\n' + CKsDocumentFile::tr("The new content is complete in \"%1\".").arg(Native(error.kept));
+    return text;
+}
+
+CString LostWords(const LostMetadata& lost)
+{
+    const std::pair<bool, CString> words[] = {{lost.owner, CKsDocumentFile::tr("owner")},
+                                              {lost.group, CKsDocumentFile::tr("group")},
+                                              {lost.mode, CKsDocumentFile::tr("mode")},
+                                              {lost.accessList, CKsDocumentFile::tr("access list")},
+                                              {lost.attributes, CKsDocumentFile::tr("extended attributes")}};
+    QStringList text;
+    for (const auto& [isLost, word] : words)
+        if (isLost)
+            text << word;
+    return text.join(CKsDocumentFile::tr(", "));
+}
+
+/// What the copy of a file that somebody has changed will be called. It stands beside the file that links lead to.
+CString DisplacedName(const CString& path)
+{
+    auto target = QFileInfo(path).filesystemFilePath();
+    FileStatus status;
+    FollowLinks(PlatformFile::Native(), target, status);
+    return NameOf(QString::fromStdString(FreeCopyName(Utf8FromPath(target), "displaced")));
+}
+
+/// An existing file of that name in whatever case it is spelt, or the path itself. A folder that cannot be read is no
+/// empty one: the file would be written a second time, in another case.
+Result<CString> ExistingEntry(const CString& target)
+{
+    PlatformFile& platform = PlatformFile::Native();
+    const auto path = QFileInfo(target).filesystemFilePath();
+    FileStatus status;
+    std::vector<PlatformFile::Path> names;
+    std::error_code error = platform.Status(path, status);
+    if (error || status.kind != FileStatus::Kind::None)
+        return error ? Result<CString>(NotWritten(target.toStdString(), error)) : target;
+    error = platform.List(FolderOf(path), names);
+    if (error == std::errc::no_such_file_or_directory || error == std::errc::permission_denied)
+        return target; // as writing will say; a folder may be open to writing alone
+    if (error)
+        return NotWritten(target.toStdString(), error);
+    std::ranges::sort(names);
+    for (const auto& each : names) {
+        const CString name = QString::fromStdString(Utf8FromPath(each));
+        if (name.compare(QFileInfo(target).fileName(), Qt::CaseInsensitive) == 0)
+            return QFileInfo(target).dir().filePath(name);
+    }
+    return target;
 }
 
 } // namespace
@@ -53,30 +104,30 @@ void CKsDocumentFile::Read(const CString& path, const CString& savedAs,
     *this = {};
     m_path = path;
     m_savedAs = savedAs;
-    const Result<TqlStructure> structure = ParseFile(path.toStdString(), &m_error);
+    FileVersion version;
+    const Result<TqlStructure> structure = ParseFile(path.toStdString(), &m_error, &version);
     if (!structure)
         return;
+    m_version = version;
     LoadReport report(structure.value().Get());
     load(structure.value().Get(), report);
     m_findings = report.Take();
 }
 
 /// Whether the file stands, under its present spelling, where a save to `target` writes.
-bool CKsDocumentFile::IsReplacedBy(const CString& target) const
+Result<bool> CKsDocumentFile::IsReplacedBy(const CString& target) const
 {
+    if (m_path.isEmpty())
+        return false;
+    PlatformFile& platform = PlatformFile::Native();
+    const auto path = QFileInfo(m_path).filesystemFilePath();
+    FileStatus status;
+    std::error_code error = platform.Status(path, status);
     // One file may be reached by several paths, and be saved by another than it was opened by.
-    return !m_path.isEmpty() && QFileInfo::exists(m_path) &&
-           (m_savedAs == target || SameFile(m_path.toStdString(), target.toStdString()));
-}
-
-/// What a save to `target` writes over: the file that was read, or one of that name in whatever case it is spelt. Of
-/// two files that differ in their case only, `target` itself.
-CString CKsDocumentFile::EntryFor(const CString& target) const
-{
-    if (IsReplacedBy(target))
-        return m_path;
-    const CString entry = KsExistingSpelling(target);
-    return QFileInfo(entry).path() == QFileInfo(target).path() ? entry : target; // never in another folder
+    bool replaces = !error && status.kind != FileStatus::Kind::None && m_savedAs == target;
+    if (!error && !replaces && status.kind != FileStatus::Kind::None)
+        error = IsSameFile(platform, path, QFileInfo(target).filesystemFilePath(), replaces);
+    return error ? Result<bool>(NotWritten(target.toStdString(), error)) : replaces;
 }
 
 /// What a copy of the file is called; null when nothing has to be kept.
@@ -88,7 +139,8 @@ const char* CKsDocumentFile::CopySuffix() const
 bool CKsDocumentFile::MayReplace(const CString& target) const
 {
     const char* const suffix = CopySuffix();
-    if (!suffix || !IsReplacedBy(target))
+    const Result<bool> replaces = IsReplacedBy(target);
+    if (!suffix || !replaces || !replaces.value()) // what is not known is no question; writing will say it
         return true;
     const CString copy = NameOf(QString::fromStdString(FreeCopyName(m_path.toStdString(), suffix)));
     const CString question =
@@ -104,42 +156,120 @@ bool CKsDocumentFile::MayReplace(const CString& target) const
     return KsMessageBox(question, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
-bool CKsDocumentFile::KeepCopy()
+Result<void> CKsDocumentFile::KeepCopy()
 {
-    const Result<std::string> kept = KeepOriginal(m_path.toStdString(), CopySuffix());
-    if (kept)
-        m_keptCopy = QString::fromStdString(kept.value());
-    else
-        Tell(kept.error());
-    return bool(kept);
+    const auto kept = KeepOriginal(m_path.toStdString(), CopySuffix());
+    if (!kept)
+        return kept.error();
+    m_keptCopy = QString::fromStdString(kept.value().path);
+    if (!m_version) // of a file that could not be parsed
+        m_version = kept.value().version;
+    return {};
 }
 
-bool CKsDocumentFile::Write(const CString& target, const std::function<Result<void>(const std::string& path)>& write)
+WriteAnswer CKsDocumentFile::Ask(const WriteQuestion& question)
 {
-    const bool replaces = IsReplacedBy(target);
-    if (replaces && CopySuffix() && m_keptCopy.isEmpty() && !KeepCopy())
-        return false;
+    const CString path = QString::fromStdString(question.path), name = NameOf(path);
+    constexpr auto YesNo = QMessageBox::Yes | QMessageBox::No;
+    const auto agreed = [](QMessageBox::StandardButton button) {
+        return button == QMessageBox::Yes ? WriteAnswer::Yes : WriteAnswer::Cancel;
+    };
+    switch (question.kind) {
+    case WriteQuestion::ChangedOutside:
+        return agreed(KsMessageBox(
+            tr("Another program has changed %1 since it was read or saved here.\nSaving writes what is shown instead. "
+               "As it is now the file stays in a copy beside it, %2.\nSave?")
+                .arg(name, DisplacedName(path)),
+            YesNo));
+    case WriteQuestion::LosesMetadata:
+        return agreed(KsMessageBox(
+            tr("Not everything about %1 can be kept: %2.\nSave?").arg(name, LostWords(question.lost)), YesNo));
+    case WriteQuestion::HardLinks:
+        break;
+    }
+    if (!m_otherNames) {
+        const auto button = KsMessageBox(tr("%1 is one of %2 names of the same file (hard links).\n"
+                                            "Shall the file have the new content under all its names?\n"
+                                            "No: only %1 gets it, and becomes a file of its own.")
+                                             .arg(name)
+                                             .arg(question.names),
+                                         YesNo | QMessageBox::Cancel);
+        if (button != QMessageBox::Yes && button != QMessageBox::No)
+            return WriteAnswer::Cancel;
+        m_otherNames = button == QMessageBox::Yes ? WriteAnswer::Yes : WriteAnswer::No;
+    }
+    return *m_otherNames;
+}
+
+Result<void> CKsDocumentFile::Save(const CString& target, const KsFileWriter& write)
+{
+    const Result<bool> replaces = IsReplacedBy(target);
+    if (!replaces)
+        return replaces.error();
+    if (replaces.value() && CopySuffix() && m_keptCopy.isEmpty())
+        if (const Result<void> kept = KeepCopy(); !kept)
+            return kept;
+    const Result<CString> entry = replaces.value() ? m_path : ExistingEntry(target);
+    if (!entry)
+        return entry.error();
     // Where the file system tells the spellings apart, the file is written under its old one and then renamed: so it
-    // remains the same entry, be it a link or a file with an owner, a mode and attributes of its own. Elsewhere both
-    // spellings are one file already.
-    const CString entry = EntryFor(target);
-    const bool renames =
-        entry != target && QFileInfo::exists(entry) && !SameFile(entry.toStdString(), target.toStdString());
-    const std::string written = (renames ? entry : target).toStdString();
-    if (const Result<void> saved = write(written); !saved) {
-        Tell(saved.error());
+    // remains the same entry, be it a link or a file with an owner, a mode and attributes of its own, and there are
+    // never two of it. Elsewhere both spellings are one file already.
+    bool same = entry.value() == target;
+    if (!same)
+        if (const std::error_code error =
+                IsSameFile(PlatformFile::Native(), QFileInfo(entry.value()).filesystemFilePath(),
+                           QFileInfo(target).filesystemFilePath(), same))
+            return NotWritten(target.toStdString(), error);
+    SafeFileOptions options;
+    if (replaces.value())
+        options.expected = m_version;
+    if (!same)
+        options.renameTo = target.toStdString();
+    options.ask = [this](const WriteQuestion& question) { return Ask(question); };
+    const Result<WriteReport> saved = write((same ? target : entry.value()).toStdString(), options);
+    if (!saved)
+        return saved.error();
+    CKsDocumentFile written;
+    written.m_report = saved.value();
+    written.m_version = saved.value().version;
+    written.m_savedAs = target;
+    written.m_path = saved.value().notRenamed ? entry.value() : target;
+    if (replaces.value()) {
+        written.m_keptCopy = m_keptCopy;
+        written.m_otherNames = m_otherNames;
+    }
+    if (!same && !saved.value().notRenamed)
+        written.m_renamed = tr("%1 is now %2").arg(NameOf(entry.value()), NameOf(target));
+    *this = std::move(written);
+    return {};
+}
+
+bool CKsDocumentFile::Write(const CString& target, const KsFileWriter& write)
+{
+    m_whyNotWritten.clear();
+    if (const Result<void> saved = Save(target, write); !saved) {
+        if (saved.error().code != std::errc::operation_canceled)
+            m_whyNotWritten = Sentence(saved.error());
         return false;
     }
-    const Result<void> renamed = renames ? RenameFile(written, target.toStdString()) : Result<void>();
-    const CString kept = replaces ? m_keptCopy : CString();
-    *this = {};
-    m_path = renamed ? target : entry;
-    m_savedAs = target;
-    m_keptCopy = kept;
-    if (!renamed) // it is saved, and keeps its name
+    if (m_report.notRenamed) // it is saved, and keeps its name
         KsMessageBox(tr("The changes are saved in %1, which could not be renamed to %2: %3.")
-                         .arg(NameOf(entry), NameOf(target), KsSystemReason(renamed.error().code)));
-    else if (renames)
-        m_renamed = tr("%1 is now %2").arg(NameOf(entry), NameOf(target));
+                         .arg(NameOf(m_path), NameOf(m_savedAs), KsSystemReason(m_report.notRenamed)));
     return true;
+}
+
+CString CKsDocumentFile::NotesOn(const CString& path, const WriteReport& report)
+{
+    QStringList notes;
+    if (report.unconfirmed)
+        notes << tr("%1 is saved, but the disk has not confirmed it: %2. Should the power fail soon, the file may be "
+                    "found as it was before.")
+                     .arg(NameOf(path), KsSystemReason(report.unconfirmed));
+    if (!report.displaced.empty())
+        notes << tr("What another program had written to %1 is kept in %2.")
+                     .arg(NameOf(path), NameOf(QString::fromStdString(report.displaced)));
+    if (report.lost.Any())
+        notes << tr("Not kept of %1 as it was before: %2.").arg(NameOf(path), LostWords(report.lost));
+    return notes.join(u'\n');
 }

@@ -1,14 +1,18 @@
 // The file that a document was read from: what of it was not taken as it stands, and how a save replaces it.
 #pragma once
 
-#include "base/result.h"
 #include "files/finding.h"
+#include "files/safe_file.h"
 #include "ks/fc/types.h"
 #include "ks/ks_export.h"
 
 #include <QCoreApplication>
 #include <functional>
+#include <optional>
 #include <vector>
+
+/// Writes a document to a path as the options want it.
+using KsFileWriter = std::function<Result<WriteReport>(const std::string& path, const SafeFileOptions& options)>;
 
 class KS_API CKsDocumentFile
 {
@@ -19,10 +23,13 @@ public:
     void Read(const CString& path, const CString& savedAs, const std::function<void(tqlHandle, LoadReport&)>& load);
     /// Whether the file may be replaced by a save to `target`: asks when it holds what the document does not.
     bool MayReplace(const CString& target) const;
-    /// Has `write` write to `target` or to where that leads. Path() says what the file is called then, for where it
-    /// cannot be renamed to a target of another spelling it keeps its name. On failure the user has been told. What the
-    /// file held that the document does not is kept in a copy beside it.
-    bool Write(const CString& target, const std::function<Result<void>(const std::string& path)>& write);
+    /// Has `write` write to `target` or to where that leads, and asks what is the user's to decide: whether to replace
+    /// what somebody else has written meanwhile, what becomes of other names of the file, and whether it may lose what
+    /// cannot be kept. Path() says what the file is called then, for where it cannot be renamed to a target of another
+    /// spelling it keeps its name. What the file held that the document does not is kept in a copy beside it.
+    bool Write(const CString& target, const KsFileWriter& write);
+    /// Why the last write failed; empty when it did not, or when the user did not want it.
+    const CString& WhyNotWritten() const { return m_whyNotWritten; }
 
     const CString& Path() const { return m_path; }
     /// The file could not be parsed; the document holds nothing of it.
@@ -35,16 +42,24 @@ public:
     const std::vector<Finding>& Findings() const { return m_findings; }
     /// Where the last save kept what it replaced; empty when there was no need.
     const CString& KeptCopy() const { return m_keptCopy; }
+    /// What there is to say of the last save: that the disk did not confirm it, what could not be kept of the file that
+    /// was replaced, and where what somebody else wrote meanwhile is kept. Mostly empty.
+    CString SaveNotes() const { return NotesOn(m_path, m_report); }
+    static CString NotesOn(const CString& path, const WriteReport& report);
     /// "river.hdkv is now river.HDKV", when the last save renamed the file; otherwise empty.
     const CString& Renamed() const { return m_renamed; }
 
 private:
-    bool IsReplacedBy(const CString& target) const;
-    CString EntryFor(const CString& target) const;
+    Result<bool> IsReplacedBy(const CString& target) const;
+    Result<void> Save(const CString& target, const KsFileWriter& write);
     const char* CopySuffix() const;
-    bool KeepCopy();
+    Result<void> KeepCopy();
+    WriteAnswer Ask(const WriteQuestion& question);
 
-    CString m_path, m_savedAs, m_keptCopy, m_renamed;
+    CString m_path, m_savedAs, m_keptCopy, m_renamed, m_whyNotWritten;
+    std::optional<FileVersion> m_version;    // what the file held when the document was last the same
+    std::optional<WriteAnswer> m_otherNames; // what becomes of them, as the user said once
+    WriteReport m_report;
     TqlSyntaxError m_error;
     std::vector<Finding> m_findings;
 };

@@ -65,9 +65,11 @@ CString CKsFileBar::Text() const
         return tr("Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.")
             .arg(NameOf(file.Path()))
             .arg(file.Findings().size());
+    QStringList notes{file.SaveNotes()};
     if (!file.KeptCopy().isEmpty())
-        return tr("The file as it was before this save is kept in %1.").arg(NameOf(file.KeptCopy()));
-    return {};
+        notes << tr("The file as it was before this save is kept in %1.").arg(NameOf(file.KeptCopy()));
+    notes.removeAll(QString());
+    return notes.join(u'\n');
 }
 
 void CKsFileBar::Refresh()

@@ -18,6 +18,14 @@ void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHa
     emit FileStateChanged();
 }
 
+bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
+{
+    const bool written = m_file.Write(target, write);
+    if (!written && !m_file.WhyNotWritten().isEmpty())
+        TellNotSaved(m_file.WhyNotWritten());
+    return written;
+}
+
 void CKsProjectDoc::FileWritten()
 {
     UndoStack().setClean();

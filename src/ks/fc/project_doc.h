@@ -54,6 +54,8 @@ signals:
 protected:
     /// `load` takes what a file holds, see CKsDocumentFile::Read.
     void ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load);
+    /// Has `write` write to `target` (CKsDocumentFile::Write); on failure the user is told why.
+    bool WriteFile(const CString& target, const KsFileWriter& write);
     /// The file has been written: it is what the document holds, and its name the document's.
     void FileWritten();
 

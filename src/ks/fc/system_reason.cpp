@@ -26,6 +26,10 @@ const Reason reasons[] = {
     {std::errc::filename_too_long, QT_TRANSLATE_NOOP("SystemReason", "the name is too long")},
     {std::errc::too_many_symbolic_link_levels, QT_TRANSLATE_NOOP("SystemReason", "the link leads in a circle")},
     {std::errc::too_many_files_open, QT_TRANSLATE_NOOP("SystemReason", "too many files are open")},
+    {std::errc::text_file_busy, QT_TRANSLATE_NOOP("SystemReason", "another program has changed it since it was read")},
+    {std::errc::not_enough_memory, QT_TRANSLATE_NOOP("SystemReason", "there is not enough memory")},
+    {std::errc::cross_device_link, QT_TRANSLATE_NOOP("SystemReason", "it lies on another device")},
+    {std::errc::invalid_argument, QT_TRANSLATE_NOOP("SystemReason", "the file system does not support it")},
     {std::errc::device_or_resource_busy, QT_TRANSLATE_NOOP("SystemReason", "another program is using it")},
 #ifdef EDQUOT // no std::errc stands for it
     {{EDQUOT, std::generic_category()}, QT_TRANSLATE_NOOP("SystemReason", "your disk quota is used up")},
@@ -39,7 +43,10 @@ CString KsSystemReason(std::error_code error)
     for (const Reason& reason : reasons)
         if (error == reason.condition)
             return QCoreApplication::translate("SystemReason", reason.text);
-    return QString::fromLocal8Bit(error.message());
+    const QString text = QString::fromLocal8Bit(error.message());
+    return text.isEmpty() || text.startsWith(QLatin1String("Unknown"))
+               ? QCoreApplication::translate("SystemReason", "the system gives the error number %1").arg(error.value())
+               : text;
 }
 
 CString KsSystemSentence(std::error_code error)

@@ -34,6 +34,10 @@
         <translation>%1 は既に存在します。置き換えますか?</translation>
     </message>
     <message>
+        <source>The changes are not saved. Save them under another name?</source>
+        <translation>変更は保存されていません。別の名前で保存しますか?</translation>
+    </message>
+    <message>
         <source>Undone: %1</source>
         <translation>元に戻しました: %1</translation>
     </message>
@@ -77,6 +81,64 @@
     <message>
         <source>The new content is complete in &quot;%1&quot;.</source>
         <translation>新しい内容は「%1」にすべて残っています。</translation>
+    </message>
+    <message>
+        <source>owner</source>
+        <translation>所有者</translation>
+    </message>
+    <message>
+        <source>group</source>
+        <translation>グループ</translation>
+    </message>
+    <message>
+        <source>mode</source>
+        <translation>アクセス許可</translation>
+    </message>
+    <message>
+        <source>access list</source>
+        <translation>アクセス制御リスト</translation>
+    </message>
+    <message>
+        <source>extended attributes</source>
+        <translation>拡張属性</translation>
+    </message>
+    <message>
+        <source>, </source>
+        <translation>、</translation>
+    </message>
+    <message>
+        <source>Another program has changed %1 since it was read or saved here.
+Saving writes what is shown instead. As it is now the file stays in a copy beside it, %2.
+Save?</source>
+        <translation>%1 は、ここで開いた後または保存した後に別のプログラムによって変更されています。
+保存すると、表示されている内容に置き換わります。今のファイルは同じフォルダの %2 に残ります。
+保存しますか?</translation>
+    </message>
+    <message>
+        <source>Not everything about %1 can be kept: %2.
+Save?</source>
+        <translation>%1 の次の情報は引き継げません: %2。
+保存しますか?</translation>
+    </message>
+    <message>
+        <source>%1 is one of %2 names of the same file (hard links).
+Shall the file have the new content under all its names?
+No: only %1 gets it, and becomes a file of its own.</source>
+        <translation>%1 は、同じファイルの %2 個の名前 (ハードリンク) の 1 つです。
+すべての名前で新しい内容にしますか?
+「いいえ」の場合は %1 だけが新しい内容になり、独立したファイルになります。</translation>
+    </message>
+    <message>
+        <source>%1 is saved, but the disk has not confirmed it: %2. Should the power fail soon, the file may be found as it was before.</source>
+        <translation>%1 を保存しましたが、ディスクの確認が得られませんでした: %2。直後に電源が切れると、ファイルが保存前の状態に戻ることがあります。</translation>
+    </message>
+    <message>
+        <source>What another program had written to %1 is kept in %2.</source>
+        <translation>別のプログラムが %1 に書き込んだ内容は %2 に残っています。</translation>
+    </message>
+    <message>
+        <source>Not kept of %1 as it was before: %2.</source>
+        <translation>%1 から引き継げなかった情報: %2。</translation>
     </message>
     <message>
         <source>%1 is no file of this kind: it has no section [%2].</source>
@@ -448,6 +510,26 @@ Used instead</source>
     <message>
         <source>too many files are open</source>
         <translation>開いているファイルが多すぎます</translation>
+    </message>
+    <message>
+        <source>another program has changed it since it was read</source>
+        <translation>読み込んだ後に別のプログラムによって変更されています</translation>
+    </message>
+    <message>
+        <source>there is not enough memory</source>
+        <translation>メモリが足りません</translation>
+    </message>
+    <message>
+        <source>it lies on another device</source>
+        <translation>別のデバイスにあります</translation>
+    </message>
+    <message>
+        <source>the file system does not support it</source>
+        <translation>ファイルシステムが対応していません</translation>
+    </message>
+    <message>
+        <source>the system gives the error number %1</source>
+        <translation>システムのエラー番号は %1 です</translation>
     </message>
     <message>
         <source>another program is using it</source>

@@ -102,7 +102,8 @@ protected:
     }
     static QString WriteCrossSections(const QString& path, const CCrossSections& sections)
     {
-        return QString::fromStdString(SaveCrossSections(sections, path.toStdString()).error().message);
+        const auto saved = SaveCrossSections(sections, path.toStdString());
+        return saved ? QString() : QString::fromStdString(saved.error().message);
     }
     /// Opens sections in a window.
     CCrossSectionView* Open(const QByteArray& text = SmallSections)

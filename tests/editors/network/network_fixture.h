@@ -117,7 +117,8 @@ protected:
     }
     static QString WriteNetwork(const QString& path, const CNetwork& network)
     {
-        return QString::fromStdString(SaveNetwork(network, path.toStdString()).error().message);
+        const auto saved = SaveNetwork(network, path.toStdString());
+        return saved ? QString() : QString::fromStdString(saved.error().message);
     }
     /// Opens the small network in a window.
     CNetworkView* Open(const QByteArray& text = SmallNetwork)

@@ -1,0 +1,39 @@
+// The content of files: read whole, told apart, and what is wrong when that fails.
+#pragma once
+
+#include "base/result.h"
+#include "files/platform_file.h"
+
+#include <string>
+#include <string_view>
+
+/// Which content a file had when it was read: enough to see later whether somebody has written another.
+struct FileVersion
+{
+    std::uint64_t size = 0, hash = 0;
+    bool operator==(const FileVersion&) const = default;
+};
+FileVersion VersionOfText(std::string_view text);
+/// Of a file, which is read for it.
+std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::path& path, FileVersion& version);
+
+/// The content of a file, byte for byte.
+Result<std::string> ReadWholeFile(const std::string& path, PlatformFile* platform = nullptr);
+
+/// Whether both paths lead to one existing file.
+std::error_code IsSameFile(PlatformFile& platform, const std::filesystem::path& a, const std::filesystem::path& b,
+                           bool& same);
+/// What a chain of symbolic links ends at, and its status, whether it exists or not.
+std::error_code FollowLinks(PlatformFile& platform, std::filesystem::path& path, FileStatus& status);
+/// The folder of a path, which may be relative.
+std::filesystem::path FolderOf(const std::filesystem::path& path);
+
+/// "Could not write ..." and "Could not read ...", with the system's reason.
+Error NotWritten(const std::string& path, std::error_code reason);
+Error NotRead(const std::string& path, std::error_code reason);
+
+/// The system's own platform when none is given.
+inline PlatformFile& OrNative(PlatformFile* platform)
+{
+    return platform ? *platform : PlatformFile::Native();
+}

@@ -1,0 +1,189 @@
+#include "files/file_lock.h"
+
+#include "base/utf8_path.h"
+#include "files/platform_process.h"
+#include "files/temporary_file.h"
+
+#include <algorithm>
+#include <charconv>
+#include <ctime>
+#include <thread>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+/// Beside the file that a link leads to. The extension counts in whatever case, for a save may change that.
+std::error_code LockPath(PlatformFile& platform, fs::path& path)
+{
+    constexpr std::size_t longest = 240; // with what is put around it, as long as names may be
+    FileStatus status;
+    if (const std::error_code error = FollowLinks(platform, path, status))
+        return error;
+    std::string name = Utf8FromPath(path.filename());
+    const std::size_t dot = std::min(name.rfind('.'), name.size());
+    std::transform(name.begin() + std::ptrdiff_t(dot), name.end(), name.begin() + std::ptrdiff_t(dot),
+                   [](char c) { return c >= 'A' && c <= 'Z' ? char(c - 'A' + 'a') : c; });
+    if (name.size() > longest)
+        name = std::to_string(VersionOfText(name).hash);
+    path = FolderOf(path) / PathFromUtf8("." + name + ".lock");
+    return {};
+}
+
+// What stands in a lock file: a line for each of these, the name and a blank before the value.
+constexpr const char *ProgramKey = "program ", *ProcessKey = "process ", *UserKey = "user ", *HostKey = "host ",
+                     *SinceKey = "since ";
+
+std::string ThisHolder(std::string_view program)
+{
+    const ProcessName process = ThisProcess();
+    return ProgramKey + std::string(program) + '\n' + ProcessKey + std::to_string(process.number) + '\n' + UserKey +
+           process.user + '\n' + HostKey + process.host + '\n' + SinceKey + std::to_string(std::time(nullptr)) + '\n';
+}
+
+/// A value of a file that anybody may have written.
+std::string ValueOf(std::string_view text, std::string_view key)
+{
+    constexpr std::size_t longest = 100;
+    std::size_t begin = text.starts_with(key) ? 0 : text.find("\n" + std::string(key));
+    if (begin == std::string_view::npos)
+        return {};
+    begin += key.size() + (begin != 0 || text.front() == '\n');
+    std::string value(text.substr(begin, std::min(text.find('\n', begin) - begin, longest)));
+    std::erase_if(value, [](char c) { return (c >= 0 && c < ' ') || c == 127; });
+    return value;
+}
+
+std::int64_t NumberOf(std::string_view text, std::string_view key)
+{
+    const std::string value = ValueOf(text, key);
+    std::int64_t number = 0;
+    std::from_chars(value.data(), value.data() + value.size(), number);
+    return number;
+}
+
+LockHolder ReadHolder(PlatformFile& platform, PlatformFile::Handle file)
+{
+    std::string text(1000, '\0');
+    std::size_t got = 0;
+    if (platform.Read(file, text.data(), text.size(), got))
+        got = 0;
+    text.resize(got);
+    return {.program = ValueOf(text, ProgramKey),
+            .user = ValueOf(text, UserKey),
+            .host = ValueOf(text, HostKey),
+            .process = NumberOf(text, ProcessKey),
+            .since = NumberOf(text, SinceKey)};
+}
+
+std::string TimeText(std::int64_t seconds)
+{
+    const std::time_t time = std::time_t(seconds);
+    char text[32] = {};
+    if (const std::tm* local = std::localtime(&time))
+        std::strftime(text, sizeof text, "%Y-%m-%d %H:%M:%S", local);
+    return text;
+}
+
+} // namespace
+
+std::string HolderText(const LockHolder& holder)
+{
+    std::string text = holder.user.empty() ? "another program" : holder.user;
+    if (!holder.host.empty())
+        text += " on " + holder.host;
+    if (!holder.program.empty() || holder.process)
+        text += " (" + holder.program + (holder.program.empty() ? "" : ", ") + "process " +
+                std::to_string(holder.process) + ')';
+    if (holder.since)
+        text += " since " + TimeText(holder.since);
+    return text;
+}
+
+FileLock& FileLock::operator=(FileLock&& other) noexcept
+{
+    if (this == &other)
+        return *this;
+    Release();
+    m_heldBy = std::move(other.m_heldBy);
+    m_whyNone = other.m_whyNone;
+    m_path = std::move(other.m_path);
+    m_file = other.m_file;
+    m_platform = std::exchange(other.m_platform, nullptr);
+    return *this;
+}
+
+/// False when the lock file that was opened is no longer the one that others will open.
+bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformFile& platform)
+{
+    PlatformFile::Handle file = 0;
+    m_whyNone = platform.Open(path, PlatformFile::Purpose::Lock, file);
+    if (m_whyNone)
+        return true;
+    const std::error_code locked = platform.Lock(file);
+    FileStatus opened, named;
+    if (!locked)
+        m_whyNone = platform.StatusOf(file, opened);
+    else if (locked == std::errc::resource_unavailable_try_again)
+        m_heldBy = ReadHolder(platform, file);
+    else
+        m_whyNone = locked;
+    if (!locked && !m_whyNone)
+        m_whyNone = platform.Status(path, named);
+    const bool isHeld = !locked && !m_whyNone && named.IsSameFile(opened);
+    if (!isHeld) {
+        // Where there are no locks, a file made for one is of no use; one that holds a name may be another's.
+        if (m_whyNone && (!locked || (!platform.StatusOf(file, opened) && opened.size == 0)))
+            platform.Remove(path);
+        platform.Close(file);
+        return locked || m_whyNone;
+    }
+    m_platform = &platform;
+    m_file = file;
+    m_path = path;
+    if (!platform.Cut(file, 0)) // a lock without a name on it is one, too
+        WriteAll(platform, file, ThisHolder(program));
+    return true;
+}
+
+FileLock FileLock::Try(const std::string& path, std::string_view program, PlatformFile* platformOrNull)
+{
+    constexpr int most = 1000; // times that somebody lets go of it just then
+    PlatformFile& platform = OrNative(platformOrNull);
+    FileLock lock;
+    fs::path beside = PathFromUtf8(path);
+    lock.m_whyNone = LockPath(platform, beside);
+    if (lock.m_whyNone)
+        return lock;
+    for (int attempt = 0; attempt < most; ++attempt)
+        if (lock.TryOnce(beside, program, platform))
+            return lock;
+    lock.m_heldBy.emplace();
+    return lock;
+}
+
+FileLock FileLock::WaitFor(const std::string& path, std::string_view program, std::chrono::milliseconds longest,
+                           PlatformFile* platform)
+{
+    using namespace std::chrono_literals;
+    const auto end = std::chrono::steady_clock::now() + longest;
+    FileLock lock = Try(path, program, platform);
+    while (lock.m_heldBy && std::chrono::steady_clock::now() < end) {
+        std::this_thread::sleep_for(10ms);
+        lock = Try(path, program, platform);
+    }
+    return lock;
+}
+
+void FileLock::Release()
+{
+    if (!m_platform)
+        return;
+    // Removed while it is locked: whoever has opened it by then finds that it is gone when he gets the lock. Should
+    // somebody have removed it before, what stands there is another's.
+    FileStatus opened, named;
+    if (m_platform->StatusOf(m_file, opened) || m_platform->Status(m_path, named) || named.IsSameFile(opened))
+        m_platform->Remove(m_path);
+    m_platform->Close(m_file);
+    m_platform = nullptr;
+}

@@ -1,0 +1,102 @@
+#include "faulty_platform.h"
+#include "hd_support.h"
+
+#include "files/file_lock.h"
+#include "files/platform_process.h"
+
+#include <ctime>
+#include <thread>
+
+namespace fs = std::filesystem;
+using namespace std::chrono_literals;
+
+namespace {
+
+using Locks = FolderTest;
+
+} // namespace
+
+TEST_F(Locks, OneHasItAndTheOthersHearWho)
+{
+    Write("river.hdkv", "x");
+    fs::create_symlink("river.hdkv", m_folder / "link.hdkv");
+    FileLock first = FileLock::Try(Path("river.hdkv"), "first");
+    ASSERT_TRUE(first.IsHeld());
+    // By another spelling of the extension, which a save may give it, or through a link it is the same file.
+    for (const char* name : {"river.hdkv", "river.HDKV", "link.hdkv"}) {
+        const FileLock second = FileLock::Try(Path(name), "second");
+        EXPECT_FALSE(second.IsHeld());
+        ASSERT_TRUE(second.HeldBy()) << name;
+        EXPECT_EQ(second.HeldBy()->program, "first");
+        EXPECT_EQ(second.HeldBy()->process, ThisProcess().number);
+        EXPECT_EQ(second.HeldBy()->user + second.HeldBy()->host, ThisProcess().user + ThisProcess().host);
+        EXPECT_NEAR(double(second.HeldBy()->since), double(std::time(nullptr)), 60);
+        EXPECT_TRUE(HolderText(*second.HeldBy()).find("(first, process ") != std::string::npos);
+    }
+    EXPECT_TRUE(FileLock::Try(Path("river.kvnw"), "second").IsHeld());
+    FileLock moved = std::move(first);
+    EXPECT_TRUE(moved.IsHeld() && !first.IsHeld());
+    std::jthread leaving([&] {
+        std::this_thread::sleep_for(50ms);
+        moved.Release();
+    });
+    EXPECT_FALSE(FileLock::WaitFor(Path("river.hdkv"), "second", 1ms).IsHeld());
+    EXPECT_TRUE(FileLock::WaitFor(Path("river.hdkv"), "second", 10s).IsHeld());
+    EXPECT_EQ(FileCount(), 2u) << "nothing is left over";
+}
+
+TEST_F(Locks, WhatADeadProgramOrAnybodyElseLeavesIsNoLock)
+{
+    Write(".river.hdkv.lock", "program kvrshell\nprocess 1\n");
+    EXPECT_TRUE(FileLock::Try(Path("river.hdkv"), "second").IsHeld());
+    // Whatever stands in a lock file that is held, it is shown as one short line.
+    Write(".river.hdkv.lock", "user a\x1b[2J" + std::string(5000, 'u') + "\nprocess 99999999999999999999\nsince x\n");
+    PlatformFile::Handle file = 0;
+    ASSERT_FALSE(PlatformFile::Native().Open(m_folder / ".river.hdkv.lock", PlatformFile::Purpose::Read, file));
+    ASSERT_FALSE(PlatformFile::Native().Lock(file));
+    const FileLock second = FileLock::Try(Path("river.hdkv"), "second");
+    PlatformFile::Native().Close(file);
+    ASSERT_TRUE(second.HeldBy());
+    const std::string text = HolderText(*second.HeldBy());
+    EXPECT_TRUE(text.starts_with("a[2Juuu") && text.size() < 200) << text;
+    EXPECT_EQ(HolderText({}), "another program");
+}
+
+TEST_F(Locks, AFolderThatTakesNoneSaysWhy)
+{
+    for (const char* call : {"Open", "Lock", "StatusOf", "Status"}) {
+        FaultyPlatform platform;
+        platform.fault = [&](const std::string& made) {
+            return made == call ? std::make_error_code(std::errc::no_lock_available) : std::error_code();
+        };
+        const FileLock lock = FileLock::Try(Path("river.hdkv"), "first", &platform);
+        EXPECT_FALSE(lock.IsHeld() || lock.HeldBy());
+        EXPECT_EQ(lock.WhyNone(), std::errc::no_lock_available) << call;
+        EXPECT_EQ(FileCount(), 0u) << call;
+    }
+    const FileLock nowhere = FileLock::WaitFor(Path("missing/river.hdkv"), "first", 10s);
+    EXPECT_EQ(nowhere.WhyNone(), std::errc::no_such_file_or_directory);
+}
+
+// The file goes with each lock: who opened it in between must not take what nobody else sees for the lock.
+TEST_F(Locks, OnlyOneHoldsItHoweverTheyComeAndGo)
+{
+    int holders = 0, most = 0, times = 0; // only ever touched under the lock
+    {
+        std::vector<std::jthread> threads;
+        for (int i = 0; i < 4; ++i)
+            threads.emplace_back([&] {
+                for (int round = 0; round < 100;) {
+                    const FileLock lock = FileLock::Try(Path("a.hdkv"), "thread");
+                    if (!lock.IsHeld())
+                        continue;
+                    most = std::max(most, ++holders);
+                    ++times;
+                    ++round;
+                    --holders;
+                }
+            });
+    }
+    EXPECT_EQ(most, 1);
+    EXPECT_EQ(times, 400);
+}
