@@ -53,7 +53,7 @@ function(kvr_library name)
   if(WIN32)
     set(foreign posix)
   endif()
-  list(FILTER sources EXCLUDE REGEX "_${foreign}\\.cpp$")
+  list(FILTER sources EXCLUDE REGEX "_${foreign}\\.cpp$|/main\\.cpp$") # main is a program's own
   add_library(${name} STATIC ${sources})
   kvr_defaults(${name})
 endfunction()

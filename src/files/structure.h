@@ -30,7 +30,8 @@ private:
     tqlHandle m_handle;
 };
 
-/// Parses a parameter file; the error is the parser's sentence with file, line and column, and, for whoever says it in
+/// Parses a parameter file; the error is the parser's sentence with file, line and column (and the
+/// system's reason against reading it), and, for whoever says it in
 /// another language, its report.
 Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report = nullptr);
 /// Likewise a text; `name` stands for the file in messages.

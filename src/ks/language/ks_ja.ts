@@ -271,6 +271,14 @@ Used instead</source>
         <translation>空のファイル</translation>
     </message>
     <message>
+        <source>a file smaller than 2 GiB</source>
+        <translation>2 GiB 未満のファイル</translation>
+    </message>
+    <message>
+        <source>one of %1 bytes</source>
+        <translation>%1 バイトのファイル</translation>
+    </message>
+    <message>
         <source>a line of at most 16 MiB</source>
         <translation>16 MiB 以下の行</translation>
     </message>
