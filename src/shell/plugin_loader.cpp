@@ -1,12 +1,14 @@
 #include "shell/plugin_loader.h"
 
 #include "ks/fc/exports.h"
+#include "shell/library_file.h"
 
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
 #include <QLibrary>
 #include <QStringList>
+#include <exception>
 
 namespace {
 
@@ -28,6 +30,57 @@ QStringList Resolve(QLibrary& library, CPlugin& plugin)
     return missing;
 }
 
+/// Calls an editor. Its functions must not throw; where one does all the same, the program goes on without what it was
+/// asked for. What was thrown, for the user; empty when nothing was.
+template <typename Call>
+QString WhatIsThrown(Call call)
+{
+    try {
+        call();
+        return {};
+    } catch (const std::exception& thrown) {
+        return PluginLoader::tr("it failed with the error \"%1\"").arg(QString::fromLocal8Bit(thrown.what()));
+    } catch (...) {
+        return PluginLoader::tr("it failed with an error that it does not name");
+    }
+}
+
+/// The same for an editor at work, of which a log is told.
+template <typename Call>
+void AskAtWork(const CPlugin& plugin, Call call)
+{
+    if (const QString thrown = WhatIsThrown(call); !thrown.isEmpty())
+        qWarning("%s: %s", qPrintable(plugin.file), qPrintable(thrown));
+}
+
+/// Loads a library, whose own initialisation runs within. Why that failed, for the user; empty when it did not.
+QString LoadLibrary(QLibrary& library)
+{
+    if (const QString why = WhyNoLibrary(library.fileName()); !why.isEmpty())
+        return why;
+    bool loaded = false;
+    const QString thrown = WhatIsThrown([&] { loaded = library.load(); });
+    return !thrown.isEmpty() ? thrown : loaded ? QString() : library.errorString();
+}
+
+void TakeName(CPlugin& plugin)
+{
+    const bool given = plugin.KsGetEditorString && plugin.KsGetEditorString(&plugin.name);
+    if (!given || plugin.name.isEmpty())
+        plugin.name = QFileInfo(plugin.file).completeBaseName();
+}
+
+QStringList ToolBarNames(const CPlugin& plugin)
+{
+    QStringList names;
+    for (int i = 0, count = plugin.KsGetNumToolbars(); i < count; ++i) {
+        CString text;
+        plugin.KsGetToolbarString(&text, i);
+        names << text.trimmed();
+    }
+    return names;
+}
+
 QString TakeTemplates(CPlugin& plugin)
 {
     const int count = plugin.KsGetNumDocTemplates();
@@ -44,14 +97,29 @@ QString TakeTemplates(CPlugin& plugin)
 
 QIcon CPlugin::Icon() const
 {
-    const QString path = IsUsable() ? KsBitmapPath(KsGetBitmapId()) : QString();
+    QString path;
+    if (IsUsable())
+        AskAtWork(*this, [&] { path = KsBitmapPath(KsGetBitmapId()); });
     return QFileInfo::exists(path) ? QIcon(path) : QIcon();
 }
 
 void CPlugin::UpdateName()
 {
-    if (!KsGetEditorString || !KsGetEditorString(&name) || name.isEmpty())
-        name = QFileInfo(file).completeBaseName();
+    AskAtWork(*this, [this] { TakeName(*this); });
+}
+
+QStringList CPlugin::ToolBarNames() const
+{
+    QStringList names;
+    AskAtWork(*this, [&] { names = ::ToolBarNames(*this); });
+    return names;
+}
+
+CKsToolBarEx* CPlugin::CreateToolBar(CKsMDIFrameWnd& frame, unsigned controlId, int index) const
+{
+    CKsToolBarEx* bar = nullptr;
+    AskAtWork(*this, [&] { bar = KsCreateToolbar(&frame, 0, controlId, index); });
+    return bar;
 }
 
 std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
@@ -62,8 +130,8 @@ std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
     QLibrary library(file); // stays loaded when this object goes
     // Whatever the library lacks itself is found missing now, not when the user works in it.
     library.setLoadHints(QLibrary::ResolveAllSymbolsHint);
-    if (!library.load()) {
-        plugin->error = PluginLoader::tr("It could not be loaded: %1").arg(library.errorString());
+    if (const QString why = LoadLibrary(library); !why.isEmpty()) {
+        plugin->error = PluginLoader::tr("It could not be loaded: %1").arg(why);
         return plugin;
     }
     const QStringList missing = Resolve(library, *plugin);
@@ -72,8 +140,14 @@ std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
             PluginLoader::tr("It is no editor: it does not export %1.").arg(missing.join(QStringLiteral(", ")));
         return plugin;
     }
-    plugin->UpdateName();
-    plugin->error = TakeTemplates(*plugin);
+    const QString thrown = WhatIsThrown([&] {
+        TakeName(*plugin);
+        plugin->error = TakeTemplates(*plugin);
+        ToolBarNames(*plugin);
+        plugin->KsGetBitmapId();
+    });
+    if (!thrown.isEmpty())
+        plugin->error = PluginLoader::tr("It could not be loaded: %1").arg(thrown);
     if (!plugin->IsUsable())
         plugin->templates.clear();
     else

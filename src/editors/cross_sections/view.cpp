@@ -1,5 +1,7 @@
 #include "editors/cross_sections/view.h"
 
+#include "ks/fc/shown_text.h"
+
 #include <QHeaderView>
 #include <QLabel>
 #include <QSplitter>
@@ -77,7 +79,7 @@ void CCrossSectionView::ShowSection()
     m_plot->Show(Document()->Section(section));
     m_points->Refresh();
     m_plot->SetCurrentPoint(m_points->CurrentRow() - 1);
-    const QString title = m_plot->Title().replace(u'&', QStringLiteral("&&"));
+    const QString title = KsWithoutMnemonics(m_plot->Title());
     m_pointTitle->setText(title.isEmpty() ? tr("&Points") : tr("&Points of %1").arg(title));
 }
 

@@ -1,5 +1,7 @@
 #include "editors/network/view.h"
 
+#include "ks/fc/shown_text.h"
+
 #include <QLabel>
 #include <QSplitter>
 #include <algorithm>
@@ -80,8 +82,7 @@ void CNetworkView::ShowChannel()
     m_channel->Refresh();
     m_map->SetCurrentBranch(branch);
     const QString name = branch >= 0 ? Document()->Network().branches[std::size_t(branch)].Name() : QString();
-    m_channelTitle->setText(branch >= 0 ? tr("Cha&nnel of %1").arg(QString(name).replace(u'&', QStringLiteral("&&")))
-                                        : tr("Cha&nnel"));
+    m_channelTitle->setText(branch >= 0 ? tr("Cha&nnel of %1").arg(KsWithoutMnemonics(name)) : tr("Cha&nnel"));
 }
 
 /// A line of a channel is shown once its branch is current.

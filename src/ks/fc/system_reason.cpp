@@ -26,6 +26,7 @@ const Reason reasons[] = {
     {std::errc::filename_too_long, QT_TRANSLATE_NOOP("SystemReason", "the name is too long")},
     {std::errc::too_many_symbolic_link_levels, QT_TRANSLATE_NOOP("SystemReason", "the link leads in a circle")},
     {std::errc::too_many_files_open, QT_TRANSLATE_NOOP("SystemReason", "too many files are open")},
+    {std::errc::not_enough_memory, QT_TRANSLATE_NOOP("SystemReason", "there is not enough memory")},
     {std::errc::device_or_resource_busy, QT_TRANSLATE_NOOP("SystemReason", "another program is using it")},
 #ifdef EDQUOT // no std::errc stands for it
     {{EDQUOT, std::generic_category()}, QT_TRANSLATE_NOOP("SystemReason", "your disk quota is used up")},

@@ -245,6 +245,13 @@ Used instead</source>
     </message>
 </context>
 <context>
+    <name>KsMessageBox</name>
+    <message>
+        <source>... and %1 more lines</source>
+        <translation>... ほか %1 行</translation>
+    </message>
+</context>
+<context>
     <name>SyntaxError</name>
     <message>
         <source>%1 cannot be read: %2</source>
@@ -456,6 +463,10 @@ Used instead</source>
     <message>
         <source>too many files are open</source>
         <translation>開いているファイルが多すぎます</translation>
+    </message>
+    <message>
+        <source>there is not enough memory</source>
+        <translation>メモリーが足りません</translation>
     </message>
     <message>
         <source>another program is using it</source>
