@@ -2,11 +2,15 @@
 
 #include "ks/fc/exports.h"
 #include "shell/library_file.h"
+#include "shell/library_trial.h"
+#include "shell/settings_keys.h"
 
 #include <QCoreApplication>
+#include <QDateTime>
 #include <QDir>
 #include <QFileInfo>
 #include <QLibrary>
+#include <QSettings>
 #include <QStringList>
 #include <exception>
 
@@ -39,9 +43,9 @@ QString WhatIsThrown(Call call)
         call();
         return {};
     } catch (const std::exception& thrown) {
-        return PluginLoader::tr("it failed with the error \"%1\"").arg(QString::fromLocal8Bit(thrown.what()));
+        return ThrownText(thrown.what());
     } catch (...) {
-        return PluginLoader::tr("it failed with an error that it does not name");
+        return ThrownText(nullptr);
     }
 }
 
@@ -53,14 +57,44 @@ void AskAtWork(const CPlugin& plugin, Call call)
         qWarning("%s: %s", qPrintable(plugin.file), qPrintable(thrown));
 }
 
+/// A version of a file, and then its path.
+QString VersionOf(const QFileInfo& file)
+{
+    return QStringLiteral("%1 %2 ").arg(file.size()).arg(file.lastModified().toMSecsSinceEpoch()) +
+           file.absoluteFilePath();
+}
+
+/// A trial takes time at the start, so it is made once of each version of a library: whatever was in use before is
+/// known.
+QString WhyNotTried(const QFileInfo& file)
+{
+    const bool isKnown = QSettings().value(Settings::TriedLibraries).toStringList().contains(VersionOf(file));
+    return isKnown ? QString() : TryLibrary(file.absoluteFilePath());
+}
+
+void RememberTried(const QFileInfo& file)
+{
+    QStringList known = QSettings().value(Settings::TriedLibraries).toStringList();
+    if (known.contains(VersionOf(file)))
+        return;
+    known.removeIf([&](const QString& each) { return each.section(u' ', 2) == file.absoluteFilePath(); });
+    QSettings().setValue(Settings::TriedLibraries, known << VersionOf(file));
+}
+
 /// Loads a library, whose own initialisation runs within. Why that failed, for the user; empty when it did not.
 QString LoadLibrary(QLibrary& library)
 {
-    if (const QString why = WhyNoLibrary(library.fileName()); !why.isEmpty())
+    const QFileInfo file(library.fileName());
+    QString why = WhyNoLibrary(file.absoluteFilePath());
+    if (why.isEmpty())
+        why = WhyNotTried(file);
+    if (!why.isEmpty())
         return why;
     bool loaded = false;
-    const QString thrown = WhatIsThrown([&] { loaded = library.load(); });
-    return !thrown.isEmpty() ? thrown : loaded ? QString() : library.errorString();
+    why = WhatIsThrown([&] { loaded = library.load(); });
+    if (loaded)
+        RememberTried(file);
+    return loaded || !why.isEmpty() ? why : library.errorString();
 }
 
 void TakeName(CPlugin& plugin)

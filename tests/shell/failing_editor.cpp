@@ -1,13 +1,14 @@
-// An editor that fails as it is loaded (FAILS_AT_LOAD), or at every question.
+// An editor that fails as it is loaded (FAILS_AT_LOAD: how), or at every question.
 #include "ks/fc/plugin.h"
 
+#include <cstdlib>
 #include <stdexcept>
 
 #ifdef FAILS_AT_LOAD
 namespace {
 
 const bool failed = [] {
-    throw std::runtime_error("no map of the sea");
+    FAILS_AT_LOAD;
     return true;
 }();
 

@@ -5,6 +5,7 @@
 #include <QDialog>
 #include <QLabel>
 #include <QTabBar>
+#include <QTabWidget>
 #include <QTimer>
 #include <QToolTip>
 #include <QTreeWidget>
@@ -124,4 +125,48 @@ TEST_F(ShellTest, AFileOutsideTheProjectsFolderIsShownAsSuch)
     EXPECT_EQ(shown.join(", ").toStdString(),
               "a.tst, b.tst, ../out/c.tst, ../out/c.tst, ../gone.tst (missing), gone.tst (missing)");
     EXPECT_EQ(told, QStringList({"", "", outside, outside, outside, ""}));
+}
+
+// Every page and every editor, with branches and surveys of such names.
+TEST(HostileNames, NoEditorTakesThemForMarkup)
+{
+    const QTemporaryDir folder;
+    const QStringList files = {"river.HDKV", "river.kvnw", "river.kvxs", "river.kvrp"};
+    for (const QString& file : files) {
+        QFile example(QStringLiteral(KVR_SOURCE_DIR "/examples/river/") + file), copy(folder.filePath(file));
+        ASSERT_TRUE(example.open(QIODevice::ReadOnly) && copy.open(QIODevice::WriteOnly));
+        copy.write(example.readAll()
+                       .replace("\"AELDER UPPER\"", '"' + Name.toUtf8() + '"')
+                       .replace("\"SURVEY 2019\"", "\"<i>S&amp;</i>\""));
+    }
+    QSettings().clear();
+    QStringList asked;
+    KsSetMessageBoxHandler([&](const CString& text, QMessageBox::StandardButtons) {
+        asked << text;
+        return QMessageBox::Ok;
+    });
+    {
+        CMainFrame frame;
+        frame.LoadPlugins(QStringLiteral(KVR_BUILD_DIR "/bin/plugins"));
+        frame.resize(1600, 1000);
+        frame.show();
+        ASSERT_TRUE(frame.OpenFile(folder.filePath("river.kvrp")));
+        ASSERT_EQ(frame.MdiArea().subWindowList().size(), 3) << asked.join('\n').toStdString();
+        bool seen = false; // in a label, so that the names got there at all
+        for (QMdiSubWindow* window : frame.MdiArea().subWindowList()) {
+            frame.MdiArea().setActiveSubWindow(window);
+            auto* sheet = window->findChild<QTabWidget*>("sheet");
+            for (int page = 0; page < (sheet ? sheet->count() : 1); ++page) {
+                if (sheet)
+                    sheet->setCurrentIndex(page);
+                QCoreApplication::processEvents();
+                EXPECT_EQ(RichTexts(frame), QStringList());
+            }
+            for (const QLabel* label : window->findChildren<QLabel*>())
+                seen = seen || label->text().contains(QString(Name).replace("&", "&&"));
+        }
+        EXPECT_TRUE(seen);
+        EXPECT_EQ(asked, QStringList());
+    }
+    KsSetMessageBoxHandler({});
 }

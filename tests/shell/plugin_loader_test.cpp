@@ -4,6 +4,9 @@
 #include <QLibrary>
 #include <QTimer>
 #include <QTreeWidget>
+#include <chrono>
+#include <future>
+#include <thread>
 
 namespace {
 
@@ -63,7 +66,7 @@ TEST_F(ShellTest, AFolderMayHoldAnything)
 
 TEST_F(ShellTest, AnEditorThatFailsIsNamedAndTheOthersWork)
 {
-    for (const char* name : {"fails_at_load", "fails_when_asked"})
+    for (const char* name : {"fails_at_load", "ends_at_load", "fails_when_asked"})
         QFile::copy(QStringLiteral(FAILING_EDITORS "/%1.so").arg(name), Path(QStringLiteral("%1.so").arg(name)));
     QFile whole(TEST_EDITORS "/test_editor.so");
     ASSERT_TRUE(whole.open(QIODevice::ReadOnly));
@@ -84,6 +87,7 @@ TEST_F(ShellTest, AnEditorThatFailsIsNamedAndTheOthersWork)
     const auto& plugins = loaded.All();
     EXPECT_EQ(Named(plugins, "fails_at_load")->error,
               "It could not be loaded: it failed with the error \"no map of the sea\"");
+    EXPECT_TRUE(Named(plugins, "ends_at_load")->error.contains("ended the program that tried it"));
     EXPECT_EQ(Named(plugins, "fails_when_asked")->error,
               "It could not be loaded: it failed with an error that it does not name");
     EXPECT_EQ(Named(plugins, "fails_when_asked")->name, "fails_when_asked");
@@ -92,6 +96,13 @@ TEST_F(ShellTest, AnEditorThatFailsIsNamedAndTheOthersWork)
     EXPECT_EQ(Named(plugins, "cut_4096")->error,
               "It could not be loaded: the file is cut off, it holds only 4096 bytes");
     EXPECT_TRUE(Named(plugins, "zz_editor")->IsUsable());
+
+    // The system's loader still serves other threads.
+    std::promise<bool> served;
+    std::thread other([&served] { served.set_value(QLibrary(TEST_EDITORS "/test_editor.so").load()); });
+    const bool done = served.get_future().wait_for(std::chrono::seconds(10)) == std::future_status::ready;
+    done ? other.join() : other.detach();
+    EXPECT_TRUE(done);
 }
 
 TEST_F(ShellTest, AShellWithoutEditorsSaysSo)

@@ -460,6 +460,21 @@ Shell of the river model editors.</source>
     </message>
 </context>
 <context>
+    <name>LibraryTrial</name>
+    <message>
+        <source>it failed with the error &quot;%1&quot;</source>
+        <translation>エラー「%1」で失敗しました</translation>
+    </message>
+    <message>
+        <source>it failed with an error that it does not name</source>
+        <translation>名前のないエラーで失敗しました</translation>
+    </message>
+    <message>
+        <source>it ended the program that tried it (%1)</source>
+        <translation>試したプログラムが終了しました (%1)</translation>
+    </message>
+</context>
+<context>
     <name>PluginLoader</name>
     <message>
         <source>Its document template %1 is missing or names no file extension.</source>
@@ -468,14 +483,6 @@ Shell of the river model editors.</source>
     <message>
         <source>It could not be loaded: %1</source>
         <translation>読み込めませんでした: %1</translation>
-    </message>
-    <message>
-        <source>it failed with the error &quot;%1&quot;</source>
-        <translation>エラー「%1」で失敗しました</translation>
-    </message>
-    <message>
-        <source>it failed with an error that it does not name</source>
-        <translation>名前のないエラーで失敗しました</translation>
     </message>
     <message>
         <source>It is no editor: it does not export %1.</source>
