@@ -2,6 +2,7 @@
 
 #include "tql/utf8.h"
 
+#include <algorithm>
 #include <cstdint>
 #include <ostream>
 
@@ -45,6 +46,8 @@ void AppendEscaped(std::string& out, std::string_view bytes)
 std::string Printable(std::string_view text)
 {
     std::string shown;
+    if (std::ranges::all_of(text, [](char c) { return c >= ' ' && c <= '~'; })) // as almost all are
+        return shown.assign(text);
     shown.reserve(text.size());
     while (!text.empty()) {
         const std::size_t length = tql::SequenceLength(text);
