@@ -2,31 +2,12 @@
 #include "cli/commands.h"
 #include "cli/hdkv.h"
 #include "data/hd_support.h"
+#include "granted_memory.h"
 
-#include <cstdlib>
 #include <iostream>
-#include <new>
 #include <streambuf>
 
 namespace {
-
-/// What operator new grants before it refuses.
-constexpr long Unlimited = -1;
-long granted = Unlimited;
-bool refusesForGood = false; // and not once only
-bool refused = false;
-
-bool Grants()
-{
-    if (granted == Unlimited)
-        return true;
-    if (granted > 0)
-        return granted-- > 0;
-    refused = true;
-    if (!refusesForGood)
-        granted = Unlimited;
-    return false;
-}
 
 /// Takes what is printed without asking for memory.
 struct Sink : std::streambuf
@@ -62,11 +43,11 @@ protected:
             argv.push_back(word.data());
         std::cout.clear();
         out.size = err.size = 0;
-        refused = false;
-        refusesForGood = forGood;
-        granted = grants;
+        GrantedMemory::refused = false;
+        GrantedMemory::refusesForGood = forGood;
+        GrantedMemory::granted = grants;
         const int code = Hdkv(int(argv.size()), argv.data());
-        granted = Unlimited;
+        GrantedMemory::granted = GrantedMemory::unlimited;
         return code;
     }
 
@@ -84,22 +65,6 @@ private:
 };
 
 } // namespace
-
-void* operator new(std::size_t size)
-{
-    void* const memory = Grants() ? std::malloc(size ? size : 1) : nullptr;
-    if (!memory)
-        throw std::bad_alloc();
-    return memory;
-}
-void operator delete(void* memory) noexcept
-{
-    std::free(memory);
-}
-void operator delete(void* memory, std::size_t) noexcept
-{
-    std::free(memory);
-}
 
 TEST_F(Memory, EndsAnywhereWithAMessage)
 {
@@ -129,21 +94,21 @@ TEST_F(Memory, EndsAnywhereWithAMessage)
                 Write("a.hdkv", before);
         };
         prepare();
-        EXPECT_EQ(Run(c.words, Unlimited), c.code);
+        EXPECT_EQ(Run(c.words, GrantedMemory::unlimited), c.code);
         const std::string made = OnlyFile();
         // Two new files differ in the time at which they were made.
         const auto isMade = [&](const std::string& now) {
             return before.empty() ? bool(LoadHDFile(file)) : now == made;
         };
         for (const bool forGood : {false, true}) {
-            refused = true;
+            GrantedMemory::refused = true;
             long place = 0;
-            for (; refused && !HasFailure(); ++place) {
+            for (; GrantedMemory::refused && !HasFailure(); ++place) {
                 SCOPED_TRACE(c.words[0] + ", place " + std::to_string(place) + (forGood ? " and on" : ""));
                 prepare();
                 const int code = Run(c.words, place, forGood);
                 const std::string after = OnlyFile();
-                EXPECT_TRUE(refused || code == c.code) << code;
+                EXPECT_TRUE(GrantedMemory::refused || code == c.code) << code;
                 EXPECT_TRUE(code == c.code || err.size > 0) << code << ": a failure that nobody is told of";
                 EXPECT_LE(code, Exit::NoMemory);
                 EXPECT_TRUE(after == before || isMade(after)) << after;
