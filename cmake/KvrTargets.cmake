@@ -34,6 +34,18 @@ function(kvr_defaults target)
   endif()
 endfunction()
 
+# kvr_find_libraries(<target> [<folder>]): the shared libraries of the project that the target links stand in this folder, which
+# is given from where the target's own file stands; without one they stand beside it.
+function(kvr_find_libraries target)
+  set(origin "$ORIGIN")
+  if(APPLE)
+    set(origin "@loader_path")
+  endif()
+  list(JOIN ARGN / folder)
+  cmake_path(APPEND origin ${folder})
+  set_target_properties(${target} PROPERTIES INSTALL_RPATH "${origin}")
+endfunction()
+
 # A static library without Qt, of what stands in the room's folder; of what knows the platform that of the platform.
 function(kvr_library name)
   file(GLOB sources CONFIGURE_DEPENDS *.cpp)
@@ -41,7 +53,7 @@ function(kvr_library name)
   if(WIN32)
     set(foreign posix)
   endif()
-  list(FILTER sources EXCLUDE REGEX "_${foreign}\\.cpp$")
+  list(FILTER sources EXCLUDE REGEX "_${foreign}\\.cpp$|/main\\.cpp$") # main is a program's own
   add_library(${name} STATIC ${sources})
   kvr_defaults(${name})
 endfunction()
@@ -96,6 +108,7 @@ function(kvr_editor plugin core)
   endif()
   set_target_properties(${plugin} PROPERTIES AUTORCC ON PREFIX ""
                         LIBRARY_OUTPUT_DIRECTORY ${CMAKE_RUNTIME_OUTPUT_DIRECTORY}/plugins)
+  kvr_find_libraries(${plugin} ..)
   kvr_translations(${plugin} ${E_TRANSLATIONS})
 endfunction()
 
@@ -104,6 +117,7 @@ function(kvr_qt name)
   set(pch ${ARGN} kvr_pch)
   list(GET pch 0 pch)
   kvr_defaults(${name})
+  kvr_find_libraries(${name})
   set_target_properties(${name} PROPERTIES AUTOMOC ON AUTOUIC ON AUTORCC ON)
   target_link_libraries(${name} PUBLIC Qt6::Widgets)
   target_precompile_headers(${name} REUSE_FROM ${pch})

@@ -11,6 +11,7 @@ inline constexpr int Findings = 1; // or: the file would change
 inline constexpr int Usage = 2;
 inline constexpr int Unreadable = 3;
 inline constexpr int NotWritten = 4;
+inline constexpr int NoMemory = 5;
 } // namespace Exit
 
 enum class Format

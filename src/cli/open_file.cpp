@@ -1,28 +1,44 @@
 #include "cli/open_file.h"
 
+#include "cli/terminal.h"
+
 #include <algorithm>
 #include <iostream>
 
 int Complain(std::string_view message, int code)
 {
-    std::cerr << "hdkv: " << message << '\n';
+    std::cerr << "hdkv: " << Printable(message) << '\n';
     return code;
+}
+
+int ComplainNoMemory()
+{
+    std::cerr << "hdkv: There is not enough memory.\n";
+    return Exit::NoMemory;
+}
+
+int ComplainUnread(const Error& error)
+{
+    return Complain(error.message, error.code == std::errc::not_enough_memory ? Exit::NoMemory : Exit::Unreadable);
 }
 
 void PrintFinding(std::ostream& stream, const std::string& path, const Finding& finding)
 {
-    stream << path << ':' << finding.line << ':' << finding.column << ": " << FindingText(finding) << '\n';
+    stream << Printable(path) << ':' << finding.line << ':' << finding.column << ": " << Printable(FindingText(finding))
+           << '\n';
 }
 
 int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters, FileVersion* version)
 {
     const Result<TqlStructure> structure = ParseFile(path, nullptr, version);
     if (!structure)
-        return Complain(structure.error().message, Exit::Unreadable);
+        return ComplainUnread(structure.error());
     const tqlHandle handle = structure.value().Get();
     if (!tqlTargetByNameNum(handle, HDTargetName, 1))
         return Complain(path + " is no HD parameter file: it has no target [" + HDTargetName + "].", Exit::Unreadable);
     LoadReport report(handle);
+    const UndatedObjects undated;
+    parameters = HD_Parameters();
     parameters.Load(handle, &report);
     if (purpose == Purpose::Read)
         return Exit::Fine;

@@ -8,8 +8,12 @@
 #include <ostream>
 #include <string_view>
 
-/// Prints "hdkv: ..." on standard error and returns the code.
+/// Prints "hdkv: ..." on standard error, in one line, and returns the code.
 int Complain(std::string_view message, int code);
+/// Says that there is no memory, without asking for any.
+int ComplainNoMemory();
+/// Says why a file was not read.
+int ComplainUnread(const Error& error);
 
 enum class Purpose
 {
@@ -17,7 +21,8 @@ enum class Purpose
     Rewrite
 };
 
-/// Reads an HD parameter file; Exit::Fine, or a code after a message. For a rewrite it is told what is not taken as it
+/// Reads an HD parameter file into fresh parameters, in which a date that the file lacks is not set: two runs must not
+/// differ. Exit::Fine, or a code after a message. For a rewrite it is told what is not taken as it
 /// stands, and a file with content that reading does not keep is refused.
 /// `version` is the content that was read.
 int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters, FileVersion* version = nullptr);

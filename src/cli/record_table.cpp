@@ -1,6 +1,7 @@
 #include "cli/record_table.h"
 
 #include "cli/field_text.h"
+#include "cli/terminal.h"
 
 #include <algorithm>
 
@@ -26,14 +27,6 @@ std::string CsvCell(const std::string& text)
     for (const char c : text)
         quoted += c == '"' ? std::string("\"\"") : std::string(1, c);
     return quoted + '"';
-}
-
-/// A line of a table must stay one line.
-std::string OneLine(std::string text)
-{
-    std::ranges::replace_if(
-        text, [](char c) { return static_cast<unsigned char>(c) < 0x20; }, ' ');
-    return text;
 }
 
 } // namespace
@@ -106,12 +99,17 @@ void RecordTable::Print(std::ostream& stream, Format format) const
 
 void RecordTable::PrintTable(std::ostream& stream) const
 {
+    const auto printable = [this](const Row& row) { // a line of a table must stay one line
+        auto cells = Cells(row);
+        std::ranges::transform(cells, cells.begin(), Printable);
+        return cells;
+    };
     const std::vector<std::string> headers = Headers();
     std::vector<std::size_t> widths;
     for (const std::string& header : headers)
         widths.push_back(Width(header));
     for (const Row& row : m_rows) {
-        const auto cells = Cells(row);
+        const auto cells = printable(row);
         for (std::size_t i = 0; i < cells.size(); ++i)
             widths[i] = std::max(widths[i], Width(cells[i]));
     }
@@ -121,14 +119,14 @@ void RecordTable::PrintTable(std::ostream& stream) const
         for (std::size_t i = 0; i < cells.size(); ++i) {
             const std::string pad(widths[i] - Width(cells[i]), ' ');
             const bool right = i < fixed || IsNumeric(m_columns[i - fixed]->kind);
-            line += (i ? "  " : "") + (right ? pad + OneLine(cells[i]) : OneLine(cells[i]) + pad);
+            line += (i ? "  " : "") + (right ? pad + cells[i] : cells[i] + pad);
         }
         line.erase(line.find_last_not_of(' ') + 1);
         stream << line << '\n';
     };
     print(headers);
     for (const Row& row : m_rows)
-        print(Cells(row));
+        print(printable(row));
 }
 
 void RecordTable::PrintCsv(std::ostream& stream) const

@@ -3,8 +3,26 @@
 #include <chrono>
 #include <ctime>
 
+namespace {
+
+thread_local int undated = 0;
+
+} // namespace
+
+UndatedObjects::UndatedObjects()
+{
+    ++undated;
+}
+
+UndatedObjects::~UndatedObjects()
+{
+    --undated;
+}
+
 HDDateTime HDDateTime::Now()
 {
+    if (undated)
+        return {};
     const std::time_t now = std::time(nullptr);
     const std::tm* const local = std::localtime(&now);
     if (!local)

@@ -20,11 +20,22 @@ struct HDDateTime
 {
     std::int32_t Year = 0, Month = 0, Day = 0, Hour = 0, Minute = 0, Second = 0;
 
-    /// Local time now, to the second.
+    /// Local time now, to the second; not set while there are UndatedObjects.
     static HDDateTime Now();
     /// Whether the six integers are a date and time of the Gregorian calendar (years 100 to 9999).
     bool IsValid() const;
     friend bool operator==(const HDDateTime&, const HDDateTime&) = default;
+};
+
+/// While one lives, what this thread makes has dates that are not set where it would take the time now, for whoever
+/// reads files and must get the same from the same file.
+class UndatedObjects
+{
+public:
+    UndatedObjects();
+    ~UndatedObjects();
+    UndatedObjects(const UndatedObjects&) = delete;
+    UndatedObjects& operator=(const UndatedObjects&) = delete;
 };
 
 enum class FieldKind

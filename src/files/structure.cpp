@@ -10,7 +10,7 @@ Result<TqlStructure> Checked(TqlStructure structure, TqlSyntaxError* report)
     tqlGetErrorGlb(); // taken: the report says it all
     if (report)
         *report = error;
-    return Error{error.message};
+    return Error{.message = error.message, .code = error.reason};
 }
 
 } // namespace

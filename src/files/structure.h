@@ -30,8 +30,9 @@ private:
     tqlHandle m_handle;
 };
 
-/// Parses a parameter file; the error is the parser's sentence with file, line and column, and, for whoever says it in
-/// another language, its report. `version` is the content that was parsed.
+/// Parses a parameter file; the error is the parser's sentence with file, line and column (and the system's reason
+/// against reading it), and, for whoever says it in another language, its report. `version` is the content that was
+/// parsed.
 Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report = nullptr,
                                FileVersion* version = nullptr);
 /// Likewise a text; `name` stands for the file in messages.

@@ -28,10 +28,9 @@ void CEditorBars::Create()
 void CEditorBars::AddBars(const CPlugin& plugin)
 {
     const QStringList hidden = QSettings().value(Settings::HiddenBars).toStringList();
-    for (int i = 0, count = plugin.KsGetNumToolbars(); i < count; ++i) {
-        CString name;
-        plugin.KsGetToolbarString(&name, i);
-        auto toggle = std::make_unique<QAction>(name.trimmed());
+    const QStringList names = plugin.ToolBarNames();
+    for (int i = 0; i < names.size(); ++i) {
+        auto toggle = std::make_unique<QAction>(names[i]);
         toggle->setObjectName(QStringLiteral("%1-%2").arg(QFileInfo(plugin.file).completeBaseName()).arg(i));
         toggle->setCheckable(true);
         toggle->setChecked(!hidden.contains(toggle->objectName()));
@@ -67,7 +66,7 @@ void CEditorBars::Update()
         Bar& bar = m_bars[i];
         const bool visible = bar.toggle->isChecked() && m_shown[bar.plugin];
         if (visible && !bar.bar) {
-            bar.bar = bar.plugin->KsCreateToolbar(&m_frame, 0, FirstBarId + unsigned(i), bar.index);
+            bar.bar = bar.plugin->CreateToolBar(m_frame, FirstBarId + unsigned(i), bar.index);
             if (!bar.bar)
                 continue;
             bar.bar->setObjectName(bar.toggle->objectName());

@@ -1,5 +1,6 @@
 #include "shell/frame_menus.h"
 
+#include "ks/fc/shown_text.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 #include "shell/frame_actions.h"
@@ -192,8 +193,8 @@ void CFrameMenus::UpdateUndo()
     const QUndoGroup& history = m_frame.Edit().History();
     Action("actionUndo")->setEnabled(history.canUndo());
     Action("actionRedo")->setEnabled(history.canRedo());
-    Action("actionUndo")->setText(tr("&Undo %1").arg(history.undoText()).trimmed());
-    Action("actionRedo")->setText(tr("&Redo %1").arg(history.redoText()).trimmed());
+    Action("actionUndo")->setText(tr("&Undo %1").arg(KsWithoutMnemonics(history.undoText())).trimmed());
+    Action("actionRedo")->setText(tr("&Redo %1").arg(KsWithoutMnemonics(history.redoText())).trimmed());
 }
 
 // ---- menus filled as they open -----------------------------------------------------------------
@@ -204,7 +205,7 @@ void CFrameMenus::FillRecent()
     menu->clear();
     int number = 0;
     for (const QString& file : RecentFiles::All()) {
-        QString text = QDir::toNativeSeparators(file).replace(u'&', QStringLiteral("&&"));
+        QString text = KsWithoutMnemonics(KsVisibleText(QDir::toNativeSeparators(file)));
         if (++number < 10)
             text.prepend(QStringLiteral("&%1  ").arg(number));
         Connect(menu->addAction(text), [this, file] { m_frame.OpenFile(file); });
@@ -240,8 +241,7 @@ void CFrameMenus::FillWindows()
     if (!windows.isEmpty())
         menu->addSeparator();
     for (CKsMDIChildWnd* window : windows) {
-        QString title = window->windowTitle().replace(u'&', QStringLiteral("&&"));
-        QAction* action = menu->addAction(title.replace(QStringLiteral("[*]"), window->isWindowModified() ? "*" : ""));
+        QAction* action = menu->addAction(window->ListedTitle());
         action->setCheckable(true);
         action->setChecked(window == m_frame.MdiArea().currentSubWindow());
         Connect(action, [this, window = QPointer(window)] { m_frame.MdiArea().setActiveSubWindow(window); });

@@ -1,6 +1,7 @@
 #include "shell/main_frame.h"
 
 #include "ks/fc/exports.h"
+#include "ks/fc/shown_text.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 #include "shell/project_respell.h"
@@ -147,7 +148,7 @@ void CMainFrame::UpdateTitle()
     const CKsDoc* document = ActiveDocument();
     const QString program = QCoreApplication::applicationName();
     // This form is also the one that a maximised document window would make of it.
-    setWindowTitle(document ? QStringLiteral("%1 - [%2[*]]").arg(program, document->GetTitle()) : program);
+    setWindowTitle(document ? QStringLiteral("%1 - [%2[*]]").arg(program, KsTitleText(document->GetTitle())) : program);
     setWindowModified(document && document->IsModified());
     const CProject* project = m_projects.Registry().FindByView(GetActiveView());
     m_projectLabel->setText(project ? tr("Project: %1").arg(project->name) : QString());

@@ -1,12 +1,18 @@
 #include "shell/plugin_loader.h"
 
 #include "ks/fc/exports.h"
+#include "shell/library_file.h"
+#include "shell/library_trial.h"
+#include "shell/settings_keys.h"
 
 #include <QCoreApplication>
+#include <QDateTime>
 #include <QDir>
 #include <QFileInfo>
 #include <QLibrary>
+#include <QSettings>
 #include <QStringList>
+#include <exception>
 
 namespace {
 
@@ -28,6 +34,87 @@ QStringList Resolve(QLibrary& library, CPlugin& plugin)
     return missing;
 }
 
+/// Calls an editor. Its functions must not throw; where one does all the same, the program goes on without what it was
+/// asked for. What was thrown, for the user; empty when nothing was.
+template <typename Call>
+QString WhatIsThrown(Call call)
+{
+    try {
+        call();
+        return {};
+    } catch (const std::exception& thrown) {
+        return ThrownText(thrown.what());
+    } catch (...) {
+        return ThrownText(nullptr);
+    }
+}
+
+/// The same for an editor at work, of which a log is told.
+template <typename Call>
+void AskAtWork(const CPlugin& plugin, Call call)
+{
+    if (const QString thrown = WhatIsThrown(call); !thrown.isEmpty())
+        qWarning("%s: %s", qPrintable(plugin.file), qPrintable(thrown));
+}
+
+/// A version of a file, and then its path.
+QString VersionOf(const QFileInfo& file)
+{
+    return QStringLiteral("%1 %2 ").arg(file.size()).arg(file.lastModified().toMSecsSinceEpoch()) +
+           file.absoluteFilePath();
+}
+
+/// A trial takes time at the start, so it is made once of each version of a library: whatever was in use before is
+/// known.
+QString WhyNotTried(const QFileInfo& file)
+{
+    const bool isKnown = QSettings().value(Settings::TriedLibraries).toStringList().contains(VersionOf(file));
+    return isKnown ? QString() : TryLibrary(file.absoluteFilePath());
+}
+
+void RememberTried(const QFileInfo& file)
+{
+    QStringList known = QSettings().value(Settings::TriedLibraries).toStringList();
+    if (known.contains(VersionOf(file)))
+        return;
+    known.removeIf([&](const QString& each) { return each.section(u' ', 2) == file.absoluteFilePath(); });
+    QSettings().setValue(Settings::TriedLibraries, known << VersionOf(file));
+}
+
+/// Loads a library, whose own initialisation runs within. Why that failed, for the user; empty when it did not.
+QString LoadLibrary(QLibrary& library)
+{
+    const QFileInfo file(library.fileName());
+    QString why = WhyNoLibrary(file.absoluteFilePath());
+    if (why.isEmpty())
+        why = WhyNotTried(file);
+    if (!why.isEmpty())
+        return why;
+    bool loaded = false;
+    why = WhatIsThrown([&] { loaded = library.load(); });
+    if (loaded)
+        RememberTried(file);
+    return loaded || !why.isEmpty() ? why : library.errorString();
+}
+
+void TakeName(CPlugin& plugin)
+{
+    const bool given = plugin.KsGetEditorString && plugin.KsGetEditorString(&plugin.name);
+    if (!given || plugin.name.isEmpty())
+        plugin.name = QFileInfo(plugin.file).completeBaseName();
+}
+
+QStringList ToolBarNames(const CPlugin& plugin)
+{
+    QStringList names;
+    for (int i = 0, count = plugin.KsGetNumToolbars(); i < count; ++i) {
+        CString text;
+        plugin.KsGetToolbarString(&text, i);
+        names << text.trimmed();
+    }
+    return names;
+}
+
 QString TakeTemplates(CPlugin& plugin)
 {
     const int count = plugin.KsGetNumDocTemplates();
@@ -44,14 +131,29 @@ QString TakeTemplates(CPlugin& plugin)
 
 QIcon CPlugin::Icon() const
 {
-    const QString path = IsUsable() ? KsBitmapPath(KsGetBitmapId()) : QString();
+    QString path;
+    if (IsUsable())
+        AskAtWork(*this, [&] { path = KsBitmapPath(KsGetBitmapId()); });
     return QFileInfo::exists(path) ? QIcon(path) : QIcon();
 }
 
 void CPlugin::UpdateName()
 {
-    if (!KsGetEditorString || !KsGetEditorString(&name) || name.isEmpty())
-        name = QFileInfo(file).completeBaseName();
+    AskAtWork(*this, [this] { TakeName(*this); });
+}
+
+QStringList CPlugin::ToolBarNames() const
+{
+    QStringList names;
+    AskAtWork(*this, [&] { names = ::ToolBarNames(*this); });
+    return names;
+}
+
+CKsToolBarEx* CPlugin::CreateToolBar(CKsMDIFrameWnd& frame, unsigned controlId, int index) const
+{
+    CKsToolBarEx* bar = nullptr;
+    AskAtWork(*this, [&] { bar = KsCreateToolbar(&frame, 0, controlId, index); });
+    return bar;
 }
 
 std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
@@ -62,8 +164,8 @@ std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
     QLibrary library(file); // stays loaded when this object goes
     // Whatever the library lacks itself is found missing now, not when the user works in it.
     library.setLoadHints(QLibrary::ResolveAllSymbolsHint);
-    if (!library.load()) {
-        plugin->error = PluginLoader::tr("It could not be loaded: %1").arg(library.errorString());
+    if (const QString why = LoadLibrary(library); !why.isEmpty()) {
+        plugin->error = PluginLoader::tr("It could not be loaded: %1").arg(why);
         return plugin;
     }
     const QStringList missing = Resolve(library, *plugin);
@@ -72,8 +174,14 @@ std::unique_ptr<CPlugin> LoadPlugin(const QString& file)
             PluginLoader::tr("It is no editor: it does not export %1.").arg(missing.join(QStringLiteral(", ")));
         return plugin;
     }
-    plugin->UpdateName();
-    plugin->error = TakeTemplates(*plugin);
+    const QString thrown = WhatIsThrown([&] {
+        TakeName(*plugin);
+        plugin->error = TakeTemplates(*plugin);
+        ToolBarNames(*plugin);
+        plugin->KsGetBitmapId();
+    });
+    if (!thrown.isEmpty())
+        plugin->error = PluginLoader::tr("It could not be loaded: %1").arg(thrown);
     if (!plugin->IsUsable())
         plugin->templates.clear();
     else

@@ -29,6 +29,9 @@ struct CPlugin
     QIcon Icon() const;
     /// Asks the editor for its name again, after the language changed.
     void UpdateName();
+    QStringList ToolBarNames() const;
+    /// A new tool bar of the editor, which the frame owns; null when it made none.
+    CKsToolBarEx* CreateToolBar(CKsMDIFrameWnd& frame, unsigned controlId, int index) const;
 };
 
 /// Loads one library and asks it for its templates. What goes wrong is told in `error`.

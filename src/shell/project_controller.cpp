@@ -98,10 +98,21 @@ const CProject* CProjectController::OwnerOf(const QString& member) const
     return open && !open->Views().empty() ? m_projects.FindByView(open->Views().front()) : nullptr;
 }
 
+/// The path from the project's folder to a file outside it, whatever links lead there; empty for one inside.
+static QString WayOut(const CProject& project, const QString& member)
+{
+    const QDir folder = QFileInfo(project.path).absoluteDir();
+    const QString way = QFileInfo::exists(member) ? QDir(KsFileKey(folder.path())).relativeFilePath(KsFileKey(member))
+                                                  : folder.relativeFilePath(member);
+    const bool leaves = way.startsWith(QLatin1String("../")) || QDir::isAbsolutePath(way);
+    return leaves ? QDir::toNativeSeparators(way) : QString();
+}
+
 CMemberState CProjectController::StateOf(const CProject& project, const QString& stored) const
 {
     const QString member = KsExistingSpelling(stored);
     CMemberState state;
+    state.wayOut = WayOut(project, member);
     if (const CProject* owner = OwnerOf(member); owner && owner->handle != project.handle)
         state.elsewhere = owner->name;
     const CPlugin* plugin = m_plugins.Of(m_plugins.TemplateFor(member));

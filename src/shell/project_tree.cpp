@@ -1,5 +1,7 @@
 #include "shell/project_tree.h"
 
+#include "ks/fc/shown_text.h"
+
 #include <QDir>
 #include <QEvent>
 #include <QFileInfo>
@@ -25,6 +27,7 @@ CProjectTree::CProjectTree(QWidget* parent) : QDockWidget(parent), m_tree(new QT
     m_tree->setHeaderHidden(true);
     m_tree->setContextMenuPolicy(Qt::CustomContextMenu);
     m_tree->setUniformRowHeights(true);
+    m_tree->setTextElideMode(Qt::ElideMiddle); // of a path both ends count
     connect(m_tree, &QTreeWidget::itemActivated, this, [this](QTreeWidgetItem* item) {
         if (item->parent())
             emit MemberChosen(HandleOf(*item), item->data(0, PathRole).toString());
@@ -42,7 +45,7 @@ void CProjectTree::Show(const CProjects& projects, const State& state)
     for (const auto& project : projects.All()) {
         auto* root = new QTreeWidgetItem(m_tree, {project->name});
         root->setData(0, HandleRole, qlonglong(project->handle));
-        root->setToolTip(0, QDir::toNativeSeparators(project->path));
+        root->setToolTip(0, KsVisibleText(QDir::toNativeSeparators(project->path)));
         for (const QString& member : project->members)
             AddMember(*root, member, state(*project, member));
         root->setExpanded(true);
@@ -54,7 +57,7 @@ void CProjectTree::Show(const CProjects& projects, const State& state)
 
 void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, const CMemberState& state)
 {
-    QString text = QFileInfo(path).fileName();
+    QString text = KsVisibleText(state.wayOut.isEmpty() ? QFileInfo(path).fileName() : state.wayOut);
     if (state.modified)
         text += u'*';
     if (state.kind == CMemberState::Missing)
@@ -67,8 +70,12 @@ void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, cons
     item->setData(0, HandleRole, project.data(0, HandleRole));
     item->setData(0, PathRole, path);
     item->setIcon(0, state.icon);
-    const QString tip = QDir::toNativeSeparators(path);
-    item->setToolTip(0, state.elsewhere.isEmpty() ? tip : tr("%1: open in the project %2").arg(tip, state.elsewhere));
+    QString tip = KsVisibleText(QDir::toNativeSeparators(path));
+    if (!state.elsewhere.isEmpty())
+        tip = tr("%1: open in the project %2").arg(tip, state.elsewhere);
+    if (!state.wayOut.isEmpty())
+        tip += u'\n' + tr("This file is outside the project's folder.");
+    item->setToolTip(0, tip);
     QFont font = m_tree->font();
     font.setBold(state.kind == CMemberState::Open && state.elsewhere.isEmpty());
     item->setFont(0, font);

@@ -23,6 +23,7 @@ struct CMemberState
     Kind kind = Closed;
     bool modified = false;
     QString elsewhere{}; // the other project that the open file belongs to
+    QString wayOut{};    // from the project's folder to a file that does not stand in it
     QIcon icon;
 };
 

@@ -3,6 +3,7 @@
 #include "ks/fc/document_file.h"
 #include "ks/fc/exchange.h"
 #include "ks/fc/file_name.h"
+#include "ks/fc/shown_text.h"
 #include "shell/project_file.h"
 
 #include <QDir>
@@ -40,7 +41,7 @@ const CProject* CProjects::Open(const QString& path, QString& error)
     }
     auto project = std::make_unique<CProject>();
     project->path = absolute;
-    project->name = QFileInfo(absolute).completeBaseName();
+    project->name = KsVisibleText(QFileInfo(absolute).completeBaseName());
     if (!ReadMembers(*project, error))
         return nullptr;
     project->handle = ++m_last;

@@ -19,7 +19,7 @@ struct CProject
 {
     CProjectHandle handle = 0;
     QString path;                       // absolute
-    QString name;                       // the file's base name
+    QString name;                       // the file's base name as it can be seen
     QStringList members;                // absolute paths as they are spelt there, in file order
     std::vector<Finding> findings;      // what of the file was not taken as it stands
     std::vector<QPointer<CView>> views; // those that joined

@@ -11,4 +11,5 @@ inline constexpr char LastFolder[] = "files/folder";
 inline constexpr char UsCustomary[] = "units/usCustomary";
 inline constexpr char AllDigits[] = "numbers/allDigits";
 inline constexpr char Language[] = "language";
+inline constexpr char TriedLibraries[] = "plugins/tried";
 } // namespace Settings

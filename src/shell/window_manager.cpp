@@ -45,6 +45,7 @@ void CWindowManager::ShowTabs(bool tabs)
     Area().setViewMode(tabs ? QMdiArea::TabbedView : QMdiArea::SubWindowView);
     if (auto* bar = Area().findChild<QTabBar*>(QString(), Qt::FindDirectChildrenOnly))
         bar->setExpanding(false);
+    m_frame.MdiArea().UpdateTabs();
 }
 
 void CWindowManager::ChooseTabs(bool tabs)

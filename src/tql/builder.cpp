@@ -18,7 +18,7 @@ struct Builder
     bool valid = true;     // nothing was asked that no file can hold
     bool inLine = false;   // a keyword's line is open
     bool anyParam = false; // it has a parameter
-    std::string text = "// KVR parameter file 1\n";
+    std::string text = std::string(FirstLine) + '\n';
     struct Name // where it stands in `text`
     {
         std::size_t first, length;

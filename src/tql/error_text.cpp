@@ -11,6 +11,13 @@ std::string TermText(const TqlTerm& term)
     return text;
 }
 
+void MakeMessage(TqlSyntaxError& report)
+{
+    report.message = report.file + ", line " + std::to_string(report.line) + ", column " +
+                     std::to_string(report.column) + ": expected " + TermText(report.expected) + ", found " +
+                     TermText(report.found);
+}
+
 std::string ReasonText(std::error_code reason)
 {
     if (reason == std::errc::no_such_file_or_directory)

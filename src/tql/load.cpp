@@ -63,6 +63,17 @@ void FailToRead(Structure& structure, const std::string& path, std::error_code r
     error.message = path + " cannot be read: " + ReasonText(reason);
 }
 
+void RefuseSize(Structure& structure, const std::string& path, std::uint64_t size)
+{
+    TqlSyntaxError& error = structure.error;
+    error.code = TqlError::TooLarge;
+    error.file = FileNameOf(path);
+    error.line = error.column = 1;
+    error.expected = {TqlPhrase::FileOfLimit};
+    error.found = {TqlPhrase::LargerFile, std::to_string(size)};
+    MakeMessage(error);
+}
+
 // Why a path that cannot be opened cannot, none when nothing is known against it.
 std::error_code ReasonAgainst(const std::filesystem::path& path)
 {
@@ -107,6 +118,10 @@ bool ReadFile(Structure& structure, const std::string& path)
     }
     std::error_code code;
     const auto size = std::filesystem::file_size(native, code);
+    if (!code && size > MaxFileSize) { // before memory is asked for
+        RefuseSize(structure, path, size);
+        return false;
+    }
     errno = 0;
     std::ifstream in(native, std::ios::binary);
     if (!code && in && ReadAll(in, std::size_t(size), structure.text))

@@ -84,6 +84,10 @@ bool Parser::Run()
         return Fail(TqlError::Syntax, m_lineEnd, Closing(m_open.back()->name), {TqlPhrase::EndOfFile});
     if (!m_anything)
         return Fail(TqlError::Syntax, m_lineEnd, {TqlPhrase::ParameterFile}, {TqlPhrase::EmptyFile});
+    // A comment alone makes a file, but not a piece of the one that every written file begins with: the rest was lost.
+    const std::string_view all(m_structure.text.begin(), m_structure.text.end());
+    if (FirstLine.starts_with(all))
+        return Fail(TqlError::Syntax, m_lineEnd, {TqlPhrase::Target}, {TqlPhrase::EndOfFile});
     return true;
 }
 
@@ -281,10 +285,9 @@ bool Parser::Fail(TqlError code, const char* at, TqlTerm expected, TqlTerm found
     error.file = m_file;
     error.line = m_lineNumber;
     error.column = CountCharacters({m_line, std::size_t(at - m_line)}) + 1;
-    error.message = m_file + ", line " + std::to_string(error.line) + ", column " + std::to_string(error.column) +
-                    ": expected " + TermText(expected) + ", found " + TermText(found);
     error.expected = std::move(expected);
     error.found = std::move(found);
+    MakeMessage(error);
     return false;
 }
 

@@ -27,7 +27,7 @@ enum class TqlError : int
     Unreadable, // missing, a folder, no permission, read failure
     Encoding,   // not UTF-8, or a NUL
     Syntax,     // anything the grammar refuses
-    TooLarge,   // nesting deeper than 128, a line longer than 16 MiB
+    TooLarge,   // nesting deeper than 128, a line longer than 16 MiB, a file of 2 GiB
     Write       // tqlAppend could not write
 };
 

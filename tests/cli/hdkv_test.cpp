@@ -1,9 +1,12 @@
 // The program itself: exit codes, what goes to which output, and what happens to files.
+#include "cli/terminal.h"
 #include "data/hd_support.h"
 
 #include "files/file_lock.h"
 
+#include <algorithm>
 #include <cstdlib>
+#include <sstream>
 
 namespace {
 
@@ -27,6 +30,9 @@ protected:
         Write("bad.hdkv", "[KAVO0_HD]\n  [InitList]\n");
         Write("found.hdkv", "[KAVO0_HD]\n[InitList]\nDATA = \"\", 1, 2, 3\n[/InitList]\n[/KAVO0_HD]\n");
         Write("loses.hdkv", "[KAVO0_HD]\n[InitList]\nDATA = \"R\", 1, 2, true\n[/InitList]\n[/KAVO0_HD]\n");
+        Write("cut.hdkv", "// KVR par");
+        Write("huge.hdkv", "");
+        std::filesystem::resize_file(m_folder / "huge.hdkv", std::uintmax_t{2} << 30); // takes no room on the disk
         Write("other.hdkv", "[KVR_PROJECT]\n[/KVR_PROJECT]\n");
         HD_Parameters parameters;
         HD_Initial record;
@@ -81,6 +87,9 @@ TEST_F(Hdkv, ExitCodesAndMessages)
         {"check other.hdkv", 1, "other.hdkv:1:1: there is no target [KAVO0_HD]", ""},
         {"check bad.hdkv", 3, "", "bad.hdkv, line 2, column 13: expected [/InitList]"},
         {"check missing.hdkv", 3, "", "missing.hdkv"},
+        {"show cut.hdkv", 3, "",
+         "cut.hdkv, line 1, column 11: expected a target in brackets, such as [Name], found the end"},
+        {"check huge.hdkv", 3, "", "expected a file smaller than 2 GiB, found one of 2147483648 bytes"},
         {"check bad.hdkv found.hdkv", 3, "found.hdkv: 1 finding\n", "bad.hdkv"},
         {"", 2, "", "subcommand"},
         {"check", 2, "", "FILE"},
@@ -130,6 +139,42 @@ TEST_F(Hdkv, ValuesOfAnotherTypeAreTakenWhenTheirMeaningIsBeyondDoubt)
                    "taken as 2\n");
     EXPECT_NE(Text("taken.hdkv").find("DATA = \"R\", 1, 2, 2\n"), std::string::npos);
     EXPECT_EQ(Run("check taken.hdkv"), 0) << out;
+}
+
+// A name is no command to the terminal that it is printed on, and no line of its own.
+TEST_F(Hdkv, NamesAreShownSoThatTheyDoNothing)
+{
+    const std::string name = "a\x1B[2J\nb\x7F\xC2\x9B\xE2\x80\xAE\xFF\xC3\x9F.hdkv";
+    const std::string shown = R"(a\x1B[2J\x0Ab\x7F\xC2\x9B\xE2\x80\xAE\xFF)"
+                              "\xC3\x9F.hdkv";
+    for (const char* arguments : {"check", "show", "fmt --check", "new", "frobnicate"}) {
+        EXPECT_NE(Run(std::string(arguments) + " '" + name + "' '" + name + '\''), 0);
+        std::istringstream lines(err);
+        for (std::string line; std::getline(lines, line);)
+            EXPECT_EQ(line, Printable(line)) << arguments;
+    }
+    Write(name.c_str(), Text("found.hdkv"));
+    EXPECT_EQ(Run("check '" + name + '\''), 1);
+    EXPECT_EQ(out, shown + ":3:1: InitList: incomplete line, the branch name is empty\n" + shown + ": 1 finding\n");
+    EXPECT_EQ(Run("fmt --check '" + name + '\''), 1);
+    EXPECT_EQ(err, "hdkv: " + shown + " is not in canonical form.\n");
+
+    Write("names.hdkv", "[KAVO0_HD]\n[WindList]\nDATA = \"a\\u{1B}c\\n\", 1, 2\n[/WindList]\n[/KAVO0_HD]\n");
+    EXPECT_EQ(Run("show names.hdkv WindList"), 0);
+    EXPECT_EQ(out, "RiverName   Chainage  WindFactor\na\\x1Bc\\x0A         1           2\n");
+}
+
+TEST_F(Hdkv, FindingsWithoutEndAreCounted)
+{
+    std::string text = "[KAVO0_HD]\n[InitList]\n";
+    for (int line = 0; line < 1500; ++line)
+        text += "DATA = \"\", 1, 2, 3\n";
+    Write("many.hdkv", text + "MINE = 1\n[/InitList]\n[/KAVO0_HD]\n");
+    EXPECT_EQ(Run("check many.hdkv"), 1);
+    EXPECT_EQ(std::ranges::count(out, '\n'), 1000 + 1 + 1 + 1);
+    EXPECT_NE(out.find("\nmany.hdkv: 500 more like the one in line 1002, column 1\nmany.hdkv: 1501 findings\n"),
+              std::string::npos);
+    EXPECT_NE(out.find("\nmany.hdkv:1503:1: unknown keyword"), std::string::npos) << "of another kind";
 }
 
 TEST_F(Hdkv, SetThenGet)
@@ -217,7 +262,14 @@ TEST_F(Hdkv, FmtAndNewWriteCanonicalFiles)
     EXPECT_NE(Text("b.hdkv").find("    DATA = \"\", 1, 2, 3\n"), std::string::npos); // incomplete lines too
     EXPECT_EQ(Run("fmt found.hdkv"), 0);
     EXPECT_EQ(Run("check found.hdkv"), 1);
+    EXPECT_NE(Text("found.hdkv").find("LimitedPeriodEnd = 0, 0, 0, 0, 0, 0\n"), std::string::npos)
+        << "a time of day would be another one in the next run";
+    Write("short.hdkv", "[KAVO0_HD]\n[Global_Variables]\n[MapOutput]\n[MapOutputFiles]\ndata = 0, 0, 0, 100, 9, 9, 0\n"
+                        "[/MapOutputFiles]\n[/MapOutput]\n[/Global_Variables]\n[/KAVO0_HD]\n");
+    EXPECT_EQ(Run("fmt short.hdkv"), 0) << err;
+    EXPECT_NE(Text("short.hdkv").find("false, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0\n"), std::string::npos);
     EXPECT_EQ(Run("new n.hdkv"), 0) << err;
+    EXPECT_EQ(Text("n.hdkv").find("LimitedPeriodEnd = 0,"), std::string::npos) << "the time of creation";
     EXPECT_EQ(Run("check n.hdkv"), 0) << out;
     EXPECT_EQ(out, "n.hdkv: 0 findings\n");
     EXPECT_EQ(Run("fmt --check n.hdkv"), 0);

@@ -4,6 +4,9 @@
 #include <QLibrary>
 #include <QTimer>
 #include <QTreeWidget>
+#include <chrono>
+#include <future>
+#include <thread>
 
 namespace {
 
@@ -59,6 +62,47 @@ TEST_F(ShellTest, AFolderMayHoldAnything)
     EXPECT_TRUE(Named(plugins, "zz_editor")->IsUsable()) << "the one before it did no harm";
     EXPECT_FALSE(Named(plugins, "readme"));
     EXPECT_TRUE(loaded.Load(Path("nowhere")).empty());
+}
+
+TEST_F(ShellTest, AnEditorThatFailsIsNamedAndTheOthersWork)
+{
+    for (const char* name : {"fails_at_load", "ends_at_load", "fails_when_asked"})
+        QFile::copy(QStringLiteral(FAILING_EDITORS "/%1.so").arg(name), Path(QStringLiteral("%1.so").arg(name)));
+    QFile whole(TEST_EDITORS "/test_editor.so");
+    ASSERT_TRUE(whole.open(QIODevice::ReadOnly));
+    const QByteArray bytes = whole.readAll();
+    QStringList cut; // where the system would map what is not there, and near it
+    for (const qsizetype size : {qsizetype(0), qsizetype(1), qsizetype(63), qsizetype(64), qsizetype(4096),
+                                 bytes.size() / 3, bytes.size() / 2, bytes.size() - 4096, bytes.size() - 1}) {
+        cut << QStringLiteral("cut_%1").arg(size);
+        Write(cut.back() + ".so", bytes.first(size));
+    }
+    QByteArray far = bytes;
+    far.replace(0x28, 8, QByteArray(8, '\xFF')); // the place of a table
+    Write("cut_far.so", far);
+    whole.copy(Path("zz_editor.so"));
+
+    CPlugins loaded;
+    EXPECT_EQ(loaded.Load(folder.path()).size(), 1u);
+    const auto& plugins = loaded.All();
+    EXPECT_EQ(Named(plugins, "fails_at_load")->error,
+              "It could not be loaded: it failed with the error \"no map of the sea\"");
+    EXPECT_TRUE(Named(plugins, "ends_at_load")->error.contains("ended the program that tried it"));
+    EXPECT_EQ(Named(plugins, "fails_when_asked")->error,
+              "It could not be loaded: it failed with an error that it does not name");
+    EXPECT_EQ(Named(plugins, "fails_when_asked")->name, "fails_when_asked");
+    for (const QString& name : cut << "cut_far")
+        EXPECT_TRUE(Named(plugins, name)->error.startsWith("It could not be loaded: ")) << name.toStdString();
+    EXPECT_EQ(Named(plugins, "cut_4096")->error,
+              "It could not be loaded: the file is cut off, it holds only 4096 bytes");
+    EXPECT_TRUE(Named(plugins, "zz_editor")->IsUsable());
+
+    // The system's loader still serves other threads.
+    std::promise<bool> served;
+    std::thread other([&served] { served.set_value(QLibrary(TEST_EDITORS "/test_editor.so").load()); });
+    const bool done = served.get_future().wait_for(std::chrono::seconds(10)) == std::future_status::ready;
+    done ? other.join() : other.detach();
+    EXPECT_TRUE(done);
 }
 
 TEST_F(ShellTest, AShellWithoutEditorsSaysSo)

@@ -91,6 +91,24 @@ TEST(Loading, TheLastLoadDecidesTheGlobalError)
     EXPECT_EQ(tqlPeekErrorGlb(), 0);
 }
 
+TEST(Loading, AFileOverTheLimitIsRefusedBeforeItIsRead)
+{
+    const TestFolder folder;
+    const std::string path = WriteFile(folder, "huge.hdkv", "");
+    fs::resize_file(path, std::uintmax_t{1} << 62 >> 20); // more than any memory, and nothing on the disk
+    const TqlSyntaxError error = LoadError(path);
+    EXPECT_EQ(error.code, TqlError::TooLarge);
+    EXPECT_EQ(error.message, "huge.hdkv, line 1, column 1: expected a file smaller than 2 GiB, found one of "
+                             "4398046511104 bytes");
+}
+
+TEST(Loading, ACommentAloneIsAFileUnlessItIsAPieceOfTheFirstLine)
+{
+    for (const char* text :
+         {"// KVR parameter file 1\n", "// KVR parameter file 1\r\n", "// KVR parameter file 2", "// kvr"})
+        EXPECT_EQ(tqlGetNoSections(LoadText(text)), 0) << text;
+}
+
 TEST(Loading, LimitsAreExact)
 {
     const auto nested = [](int depth) {

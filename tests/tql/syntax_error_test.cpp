@@ -26,6 +26,9 @@ const Case Cases[] = {
     {"", "line 1, column 1: expected a parameter file, found an empty file"},
     {" \r\n\n\t", "line 3, column 2: expected a parameter file, found an empty file"},
     {"\xEF\xBB\xBF", "line 1, column 1: expected a parameter file, found an empty file"},
+    {"// KVR par", "line 1, column 11: expected a target in brackets, such as [Name], found the end of the file"},
+    {"\xEF\xBB\xBF// KVR parameter file 1",
+     "line 1, column 24: expected a target in brackets, such as [Name], found the end of the file"},
     // lines that are none
     {"[T]\n?\n", "line 2, column 1: expected a section in brackets, a keyword or a comment, found ?"},
     {"[T]\n/ c\n", "line 2, column 1: expected a section in brackets, a keyword or a comment, found /"},

@@ -1,5 +1,7 @@
 #include "editors/cross_sections/view.h"
 
+#include "ks/fc/shown_text.h"
+
 #include <QHeaderView>
 #include <QLabel>
 
@@ -46,7 +48,7 @@ void CCrossSectionView::ShowParts()
 
 QString CCrossSectionView::PartTitle() const
 {
-    const QString title = m_plot->Title().replace(u'&', QStringLiteral("&&"));
+    const QString title = KsWithoutMnemonics(m_plot->Title());
     return title.isEmpty() ? tr("&Points") : tr("&Points of %1").arg(title);
 }
 

@@ -141,7 +141,6 @@ void CImportDialog::MakeFields(QFormLayout* form)
 
 void CImportDialog::MakeButtons(QFormLayout* form)
 {
-    m_warning->setTextFormat(Qt::PlainText); // names of files, systems and lines
     m_warning->setWordWrap(true);
     QFont bold = font();
     bold.setBold(true);

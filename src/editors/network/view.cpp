@@ -1,5 +1,7 @@
 #include "editors/network/view.h"
 
+#include "ks/fc/shown_text.h"
+
 #include <QLabel>
 
 CNetworkView::CNetworkView(QWidget* parent) : CTablesView(parent)
@@ -40,7 +42,7 @@ QString CNetworkView::PartTitle() const
     if (branch < 0)
         return tr("Cha&nnel");
     const QString name = Document()->Network().branches[std::size_t(branch)].Name();
-    return tr("Cha&nnel of %1").arg(QString(name).replace(u'&', QStringLiteral("&&")));
+    return tr("Cha&nnel of %1").arg(KsWithoutMnemonics(name));
 }
 
 void CNetworkView::InsertLine()

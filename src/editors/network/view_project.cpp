@@ -2,9 +2,10 @@
 #include "editors/network/location_source.h"
 #include "editors/network/view.h"
 #include "ks/fc/branch_name.h"
+#include "ks/fc/file_name.h"
+#include "ks/fc/shown_text.h"
 
 #include <QElapsedTimer>
-#include <QFileInfo>
 #include <QHash>
 #include <QMenu>
 #include <algorithm>
@@ -164,7 +165,7 @@ std::unique_ptr<QMenu> CNetworkView::MapMenu()
         QMenu* among = files.size() > 1 ? insert->addMenu(LocationKindName(kind)) : insert;
         for (const QString& file : files) {
             among->addAction(
-                files.size() > 1 ? QFileInfo(file).fileName() : LocationKindName(kind), this,
+                files.size() > 1 ? KsWithoutMnemonics(KsShownFileName(file)) : LocationKindName(kind), this,
                 [this, location = CMapLocation{*picked, kind, file}] { Send(KsRequest::InsertData, location); });
         }
     }

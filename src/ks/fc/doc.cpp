@@ -2,6 +2,7 @@
 
 #include "ks/fc/doc_template.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/shown_text.h"
 #include "ks/fc/system_reason.h"
 
 #include <QApplication>
@@ -76,7 +77,7 @@ void CKsDoc::SetPathName(const CString& path)
 
 CString CKsDoc::GetTitle() const
 {
-    return m_title.isEmpty() && !m_path.isEmpty() ? QFileInfo(m_path).fileName() : m_title;
+    return m_title.isEmpty() && !m_path.isEmpty() ? KsVisibleText(QFileInfo(m_path).fileName()) : m_title;
 }
 
 void CKsDoc::SetTitle(const CString& title)

@@ -90,7 +90,7 @@ public:
 
     const CString& GetPathName() const { return m_path; } // empty until first saved
     void SetPathName(const CString& path);
-    CString GetTitle() const; // file name, or the template's document name with a number
+    CString GetTitle() const; // file name as it can be seen, or the template's document name with a number
     void SetTitle(const CString& title);
 
     bool IsModified() const { return m_modified; }

@@ -36,7 +36,6 @@ CKsFileBar::CKsFileBar(CKsProjectDoc& document, QWidget* parent)
     colours.setColor(QPalette::WindowText, colours.color(QPalette::ToolTipText));
     setPalette(colours);
     m_text->setObjectName("fileBarText");
-    m_text->setTextFormat(Qt::PlainText);
     m_text->setWordWrap(true);
     m_text->setTextInteractionFlags(Qt::TextSelectableByMouse);
     m_close->setAutoRaise(true);

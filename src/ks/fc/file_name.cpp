@@ -1,5 +1,7 @@
 #include "ks/fc/file_name.h"
 
+#include "ks/fc/shown_text.h"
+
 #include <QDir>
 #include <QFileInfo>
 
@@ -22,7 +24,7 @@ CString KsExistingSpelling(const CString& path)
 CString KsShownFileName(const CString& path)
 {
     constexpr qsizetype Longest = 60, Side = (Longest - 1) / 2; // no place to break a line in them
-    const CString name = QFileInfo(path).fileName();
+    const CString name = KsVisibleText(QFileInfo(path).fileName());
     return name.size() <= Longest ? name : name.first(Side) + u'\u2026' + name.last(Side);
 }
 

@@ -155,7 +155,6 @@ CKsFindingsDialog::CKsFindingsDialog(const CString& path, std::vector<Finding> f
     setObjectName("findings");
     setAttribute(Qt::WA_DeleteOnClose);
     m_text->setWordWrap(true);
-    m_text->setTextFormat(Qt::PlainText);
     m_table->setModel(m_model);
     m_table->setSelectionBehavior(QAbstractItemView::SelectRows);
     m_table->verticalHeader()->hide();

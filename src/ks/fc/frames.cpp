@@ -1,6 +1,7 @@
 #include "ks/fc/frames.h"
 
 #include "ks/fc/doc_template.h"
+#include "ks/fc/shown_text.h"
 
 #include <QAction>
 #include <QApplication>
@@ -11,6 +12,7 @@
 #include <QStatusBar>
 #include <QStatusTipEvent>
 #include <QStyle>
+#include <QTabBar>
 #include <set>
 #include <utility>
 
@@ -84,9 +86,16 @@ void CKsMDIChildWnd::UpdateTitle()
 {
     if (!m_view || !m_view->GetDocument())
         return;
-    setWindowTitle(m_view->GetDocument()->GetTitle() + QStringLiteral("[*]"));
+    setWindowTitle(KsTitleText(m_view->GetDocument()->GetTitle()) + QStringLiteral("[*]"));
     setWindowModified(m_view->GetDocument()->IsModified());
     setToolTip({});
+}
+
+CString CKsMDIChildWnd::ListedTitle() const
+{
+    const CKsDoc* document = m_view ? m_view->GetDocument() : nullptr;
+    const CString title = document ? document->GetTitle() : windowTitle();
+    return KsWithoutMnemonics(isWindowModified() ? title + u'*' : title);
 }
 
 bool CKsMDIChildWnd::IsLastOfDocument() const
@@ -110,6 +119,27 @@ void CKsMDIArea::SetHint(const CString& hint)
 {
     m_hint = hint;
     viewport()->update();
+}
+
+/// The area itself takes a window's title for that of its tab, as if & marked a letter there.
+void CKsMDIArea::UpdateTabs()
+{
+    auto* bar = findChild<QTabBar*>(QString(), Qt::FindDirectChildrenOnly);
+    const auto windows = subWindowList(QMdiArea::CreationOrder); // that of the tabs
+    for (int tab = 0; bar && tab < bar->count() && tab < windows.size(); ++tab) {
+        const auto* window = qobject_cast<CKsMDIChildWnd*>(windows[tab]);
+        if (window && bar->tabText(tab) != window->ListedTitle())
+            bar->setTabText(tab, window->ListedTitle());
+    }
+}
+
+bool CKsMDIArea::eventFilter(QObject* object, QEvent* event)
+{
+    const bool taken = QMdiArea::eventFilter(object, event);
+    if (event->type() == QEvent::WindowTitleChange || event->type() == QEvent::ModifiedChange ||
+        event->type() == QEvent::Show)
+        UpdateTabs();
+    return taken;
 }
 
 void CKsMDIArea::changeEvent(QEvent* event)
@@ -238,8 +268,8 @@ bool CKsMDIFrameWnd::eventFilter(QObject* object, QEvent* event)
 
 void CKsMDIFrameWnd::TellStatus(const CString& text)
 {
-    m_told = text;
-    statusBar()->showMessage(text);
+    m_told = KsVisibleText(text);
+    statusBar()->showMessage(m_told);
 }
 
 /// A tip that ends comes as an empty one, which would take away what had been told - by the command just chosen, too.

@@ -55,6 +55,8 @@ public:
     static CKsMDIChildWnd* Of(const CView* view);
     /// Makes it the area's active window, in its usual size if it was an icon.
     void BringToFront();
+    /// The document's title for a menu or a tab, with the mark of what is modified.
+    CString ListedTitle() const;
     /// Closed by the user; the window lives until control returns to the event loop.
     bool IsClosing() const { return m_closing; }
 
@@ -76,8 +78,11 @@ class KS_API CKsMDIArea : public QMdiArea
 public:
     using QMdiArea::QMdiArea;
     void SetHint(const CString& hint);
+    /// Names the tabs by the documents of their windows; after tabs were made.
+    void UpdateTabs();
 
 protected:
+    bool eventFilter(QObject* object, QEvent* event) override;
     void changeEvent(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
 

@@ -11,7 +11,8 @@
 class QWidget;
 
 /// Shows a modal message with the given buttons and returns the one pressed. The title is the application's name;
-/// `details` stand below the text; Enter presses `defaultButton`.
+/// `details` stand below the text; Enter presses `defaultButton`. Of a text too long for a screen the beginning and the
+/// last lines are shown, and how many lines are left out.
 KS_API QMessageBox::StandardButton KsMessageBox(const CString& text,
                                                 QMessageBox::StandardButtons buttons = QMessageBox::Ok,
                                                 QWidget* parent = nullptr, const CString& details = {},

@@ -1,8 +1,9 @@
 // The boundary between the shell and an editor: a library in the plug-in folder that exports these C functions.
 //
 // The shell finds them by name and calls them on the user-interface thread, after the application object exists, in the
-// order below. No function throws; none shows a message. A library stays loaded until the program ends. Shell and
-// editors are built with the same compiler and the same `ks` library: the pointers are to C++ objects of that library.
+// order below. No function throws (of one that does, the editor is not used); none shows a message. A library stays
+// loaded until the program ends. Shell and editors are built with the same compiler and the same `ks` library: the
+// pointers are to C++ objects of that library.
 #pragma once
 
 #include "ks/fc/types.h"

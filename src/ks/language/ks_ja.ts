@@ -307,6 +307,13 @@ Used instead</source>
     </message>
 </context>
 <context>
+    <name>KsMessageBox</name>
+    <message>
+        <source>... and %1 more lines</source>
+        <translation>... ほか %1 行</translation>
+    </message>
+</context>
+<context>
     <name>SyntaxError</name>
     <message>
         <source>%1 cannot be read: %2</source>
@@ -331,6 +338,14 @@ Used instead</source>
     <message>
         <source>an empty file</source>
         <translation>空のファイル</translation>
+    </message>
+    <message>
+        <source>a file smaller than 2 GiB</source>
+        <translation>2 GiB 未満のファイル</translation>
+    </message>
+    <message>
+        <source>one of %1 bytes</source>
+        <translation>%1 バイトのファイル</translation>
     </message>
     <message>
         <source>a line of at most 16 MiB</source>

@@ -408,6 +408,10 @@ To have one of them in %1, close its window and open it from the list of %1.</so
         <source>%1: open in the project %2</source>
         <translation>%1: プロジェクト %2 で開いています</translation>
     </message>
+    <message>
+        <source>This file is outside the project&apos;s folder.</source>
+        <translation>このファイルはプロジェクトのフォルダーの外にあります。</translation>
+    </message>
 </context>
 <context>
     <name>HelpCommands</name>
@@ -442,6 +446,32 @@ Shell of the river model editors.</source>
     <message>
         <source>In use</source>
         <translation>使用中</translation>
+    </message>
+</context>
+<context>
+    <name>LibraryFile</name>
+    <message>
+        <source>it is no library of this system</source>
+        <translation>このシステムのライブラリではありません</translation>
+    </message>
+    <message>
+        <source>the file is cut off, it holds only %1 bytes</source>
+        <translation>ファイルが途中で切れており、%1 バイトしかありません</translation>
+    </message>
+</context>
+<context>
+    <name>LibraryTrial</name>
+    <message>
+        <source>it failed with the error &quot;%1&quot;</source>
+        <translation>エラー「%1」で失敗しました</translation>
+    </message>
+    <message>
+        <source>it failed with an error that it does not name</source>
+        <translation>名前のないエラーで失敗しました</translation>
+    </message>
+    <message>
+        <source>it ended the program that tried it (%1)</source>
+        <translation>試したプログラムが終了しました (%1)</translation>
     </message>
 </context>
 <context>
