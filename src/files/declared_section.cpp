@@ -145,6 +145,16 @@ tqlHandle TakenKeyword(const LoadReport& report, tqlHandle section, std::string_
     return keyword;
 }
 
+TqlStructure Build(const DeclaredFile& file, const void* object)
+{
+    TqlStructure structure(tqlCreate());
+    tqlAddTarget(structure.Get(), file.target.name);
+    WriteContent(structure.Get(), file.target, object);
+    tqlEndSection(structure.Get());
+    WriteUnknownTargets(structure.Get(), *file.otherTargets.constOf(object));
+    return structure;
+}
+
 } // namespace
 
 void ReadDeclared(tqlHandle structure, const DeclaredFile& file, void* object, LoadReport& report)
@@ -178,10 +188,11 @@ void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, in
 
 Result<void> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object)
 {
-    const TqlStructure structure(tqlCreate());
-    tqlAddTarget(structure.Get(), file.target.name);
-    WriteContent(structure.Get(), file.target, object);
-    tqlEndSection(structure.Get());
-    WriteUnknownTargets(structure.Get(), *file.otherTargets.constOf(object));
-    return SaveStructure(structure.Get(), path);
+    return SaveStructure(Build(file, object).Get(), path);
+}
+
+Result<std::string> DeclaredText(const DeclaredFile& file, const void* object)
+{
+    const TqlStructure structure = Build(file, object);
+    return TextOf(structure.Get());
 }

@@ -71,3 +71,5 @@ void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, in
                 std::function<std::string()> rule);
 /// Puts the object's file into the place of `path` (safe_file.h); what was kept stands behind what is declared.
 Result<void> SaveDeclared(const std::string& path, const DeclaredFile& file, const void* object);
+/// The text of that file; an error where it cannot be expressed in one.
+Result<std::string> DeclaredText(const DeclaredFile& file, const void* object);

@@ -133,3 +133,8 @@ Result<void> SaveCrossSections(const CCrossSections& sections, const std::string
 {
     return SaveDeclared(path, file, &sections);
 }
+
+Result<std::string> CrossSectionsText(const CCrossSections& sections)
+{
+    return DeclaredText(file, &sections);
+}

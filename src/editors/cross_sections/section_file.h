@@ -9,3 +9,5 @@
 CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report);
 /// Puts the sections into the place of a file (safe_file.h).
 Result<void> SaveCrossSections(const CCrossSections& sections, const std::string& path);
+/// The text of that file.
+Result<std::string> CrossSectionsText(const CCrossSections& sections);

@@ -133,3 +133,8 @@ Result<void> SaveNetwork(const CNetwork& network, const std::string& path)
 {
     return SaveDeclared(path, file, &network);
 }
+
+Result<std::string> NetworkText(const CNetwork& network)
+{
+    return DeclaredText(file, &network);
+}

@@ -9,3 +9,5 @@
 CNetwork LoadNetwork(tqlHandle structure, LoadReport& report);
 /// Puts the network into the place of a file (safe_file.h).
 Result<void> SaveNetwork(const CNetwork& network, const std::string& path);
+/// The text of that file.
+Result<std::string> NetworkText(const CNetwork& network);

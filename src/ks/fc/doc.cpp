@@ -57,6 +57,16 @@ void CKsDoc::DeleteContents()
     m_undo->clear();
 }
 
+Result<std::string> CKsDoc::ContentText() const
+{
+    return Error{"The document has no text."};
+}
+
+bool CKsDoc::TakeContent(std::string, const CString&)
+{
+    return false;
+}
+
 void CKsDoc::OnCloseDocument()
 {
     DeleteContents();
