@@ -150,8 +150,9 @@ TEST_F(RecoveryTest, WhatIsKeptGoesWithASaveAnUndoAndAClose)
                 document->UndoStack().setIndex(0);
             }
             answers << QMessageBox::Discard;
-            if (way != std::string("close"))
+            if (way != std::string("close")) {
                 EXPECT_TRUE(Kept().isEmpty()) << way;
+            }
             Action("actionClose")->trigger();
             Settle();
             QTest::qWait(100);
