@@ -109,8 +109,10 @@ void CSnapshot::Write()
 
 void CSnapshot::WriterEnded()
 {
-    if (m_writerEnds)
+    if (m_writerEnds) {
+        m_writerEnds->setEnabled(false);       // before what it looks at is closed
         m_writerEnds.release()->deleteLater(); // it is what calls
+    }
     const std::error_code answer = m_writer->Wait();
     m_writer.reset();
     if (answer) {
