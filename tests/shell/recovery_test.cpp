@@ -16,10 +16,12 @@ namespace {
 
 using namespace std::chrono_literals;
 
+// With its dates: one that a file lacks is the time at which it is read.
 constexpr const char* HDText =
     "[KAVO0_HD]\n[Global_Variables]\n[Global_Values]\nG_waterlevel = 1.5\n[/Global_Values]\n"
-    "[/Global_Variables]\n[InitList]\nDATA = \"MAIN\", 100, 2.5, 30\nDATA = \"\", 1e10, 1, 1\n"
-    "[/InitList]\n[NextVersionList]\nDATA = \"kept\"\n[/NextVersionList]\n[/KAVO0_HD]\n";
+    "[TextOutput]\nLimitedPeriodStart = 2024, 1, 1, 0, 0, 0\nLimitedPeriodEnd = 2024, 2, 1, 0, 0, 0\n[/TextOutput]\n"
+    "[/Global_Variables]\n[InitList]\nDATA = \"MAIN\", 100, 2.5, 30\nDATA = \"\", 1e10, 1, 1\n[/InitList]\n"
+    "[NextVersionList]\nDATA = \"kept\"\n[/NextVersionList]\n[/KAVO0_HD]\n";
 
 QByteArray Content(const QString& path)
 {
