@@ -17,7 +17,7 @@ std::error_code WriteContent(const CKsDoc& document, CRecoveryHeader header, con
 {
     const Result<std::string> content = document.ContentText();
     if (!content)
-        return std::make_error_code(std::errc::invalid_argument);
+        return content.error().code ? content.error().code : std::make_error_code(std::errc::invalid_argument);
     const FileStamp known = document.Stamp();
     if (known.exists && FileStamp::Of(header.path.toStdString()) == known) {
         header.size = qint64(known.size);
@@ -126,9 +126,15 @@ void CSnapshot::WriterEnded()
         m_timer.start(m_delay);
 }
 
-/// The file is as far behind as before. It is tried again, and told once.
+/// The file is as far behind as before. It is tried again, and told once; not of an editor that has no part in this.
 void CSnapshot::Fail(std::error_code why)
 {
+    if (why == std::errc::operation_not_supported) {
+        m_document.disconnect(this);
+        m_document.UndoStack().disconnect(this);
+        Drop();
+        return;
+    }
     m_timer.start(m_delay);
     if (!std::exchange(m_fails, true))
         emit Failed(why);

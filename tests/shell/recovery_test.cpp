@@ -332,6 +332,43 @@ TEST_F(RecoveryTest, ADamagedFileDoesNoHarm)
     EXPECT_EQ(Content(outside), good);
 }
 
+TEST_F(ShellTest, ADocumentOfAnEditorWithoutRecoveryIsLeftAlone)
+{
+    QDir(Folder()).removeRecursively();
+    frame->OpenFile(Write("a.tst"));
+    CKsDoc* document = frame->ActiveDocument();
+    QStringList failures;
+    QObject::connect(&frame->Snapshots(), &CSnapshots::Failed, [&] { failures << "failed"; });
+    const auto change = [&] {
+        for (int step = 0; step < CSnapshot::Steps; ++step)
+            document->UndoStack().push(new QUndoCommand("step"));
+    };
+    change();
+    const CSnapshot* snapshot = frame->Snapshots().Of(document);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !snapshot->IsWriting(); }));
+    change();
+    EXPECT_FALSE(snapshot->IsWriting());
+    EXPECT_TRUE(Kept().isEmpty());
+    EXPECT_TRUE(failures.isEmpty());
+}
+
+TEST_F(RecoveryTest, WhatCannotBeKeptIsToldOnceAndTriedAgain)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    QDir().mkpath(QFileInfo(Folder()).path());
+    QFile obstacle(Folder());
+    ASSERT_TRUE(obstacle.open(QIODevice::WriteOnly)); // no folder
+    QList<std::error_code> failures;
+    QObject::connect(&frame->Snapshots(), &CSnapshots::Failed,
+                     [&](const CKsDoc*, std::error_code why) { failures << why; });
+    Change(document, "1.5", "2.5");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !failures.isEmpty(); }));
+    QTest::qWait(60);
+    EXPECT_EQ(failures, QList<std::error_code>{std::make_error_code(std::errc::not_a_directory)});
+    obstacle.remove();
+    EXPECT_TRUE(IsKept(document));
+}
+
 TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
 {
     auto first = std::make_unique<CRecoveryFolder>();

@@ -59,7 +59,8 @@ void CKsDoc::DeleteContents()
 
 Result<std::string> CKsDoc::ContentText() const
 {
-    return Error{"The document has no text."};
+    return Error{.message = "The document has no text.",
+                 .code = std::make_error_code(std::errc::operation_not_supported)};
 }
 
 bool CKsDoc::TakeContent(std::string, const CString&)
