@@ -2,6 +2,7 @@
 
 #include "data/hd_file.h"
 #include "files/extensions.h"
+#include "ks/fc/doc_command.h"
 #include "ks/fc/message_box.h"
 #include "document/purged_lines.h"
 #include "grid/row_source.h"
@@ -132,6 +133,22 @@ void CKavo0_hdDoc::AtSave(ShownRows shown)
     const auto sameTable = [&](const ShownRows& known) { return known.rows->Data() == shown.rows->Data(); };
     if (std::ranges::none_of(m_rowsShown, sameTable))
         m_rowsShown.push_back(std::move(shown));
+}
+
+Result<std::string> CKavo0_hdDoc::ContentText() const
+{
+    std::string text = HDFileText(m_parameters, true);
+    if (text.empty())
+        return Error{"The content cannot be expressed in a parameter file."};
+    return text;
+}
+
+std::unique_ptr<QUndoCommand> CKavo0_hdDoc::MakeContentStep(tqlHandle structure, LoadReport& report,
+                                                            const CString& text)
+{
+    HD_Parameters read;
+    read.Load(structure, &report);
+    return std::make_unique<CReplaceContent<HD_Parameters>>(*this, text, m_parameters, std::move(read));
 }
 
 void CKavo0_hdDoc::DeleteContents()

@@ -30,6 +30,7 @@ public:
     /// The extension is always ".HDKV".
     CString SavePathFor(const CString& path) const override;
     void DeleteContents() override;
+    Result<std::string> ContentText() const override;
 
     /// What a save makes of a table without locations that the user has seen. A page says so whenever it shows one;
     /// what no page has shown is written as it is.
@@ -44,6 +45,10 @@ public:
     };
     void AtSave(ShownRows shown);
     const std::vector<ShownRows>& RowsShown() const { return m_rowsShown; }
+
+protected:
+    std::unique_ptr<QUndoCommand> MakeContentStep(tqlHandle structure, LoadReport& report,
+                                                  const CString& text) override;
 
 private:
     bool WriteData(const CString& path);

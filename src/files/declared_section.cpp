@@ -212,6 +212,17 @@ tqlHandle TakenKeyword(const LoadReport& report, tqlHandle section, std::string_
     return keyword;
 }
 
+TqlStructure Build(const DeclaredSection& target, const void* object)
+{
+    TqlStructure structure(tqlCreate());
+    tqlAddTarget(structure.Get(), target.name);
+    WriteContent(structure.Get(), target, object);
+    tqlEndSection(structure.Get());
+    WriteKept(target.kept.constOf(object), {},
+              [&](const UnknownNodes& nodes) { WriteUnknownTargets(structure.Get(), nodes); });
+    return structure;
+}
+
 } // namespace
 
 void ReadDeclared(tqlHandle parent, const DeclaredSection& section, void* object, LoadReport* report)
@@ -258,11 +269,11 @@ void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, in
 Result<WriteReport> SaveDeclaredFile(const std::string& path, const DeclaredSection& target, const void* object,
                                      const SafeFileOptions& options)
 {
-    const TqlStructure structure(tqlCreate());
-    tqlAddTarget(structure.Get(), target.name);
-    WriteContent(structure.Get(), target, object);
-    tqlEndSection(structure.Get());
-    WriteKept(target.kept.constOf(object), {},
-              [&](const UnknownNodes& nodes) { WriteUnknownTargets(structure.Get(), nodes); });
-    return SaveStructure(structure.Get(), path, options);
+    return SaveStructure(Build(target, object).Get(), path, options);
+}
+
+Result<std::string> DeclaredText(const DeclaredSection& target, const void* object)
+{
+    const TqlStructure structure = Build(target, object);
+    return TextOf(structure.Get());
 }

@@ -121,3 +121,5 @@ void ReportRule(LoadReport& report, tqlHandle section, std::string_view name, in
 /// Puts the object's file into the place of `path` (safe_file.h); what was kept stands behind what is declared.
 Result<WriteReport> SaveDeclaredFile(const std::string& path, const DeclaredSection& target, const void* object,
                                      const SafeFileOptions& options = {});
+/// The text of that file; an error where it cannot be expressed in one.
+Result<std::string> DeclaredText(const DeclaredSection& target, const void* object);

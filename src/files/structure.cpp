@@ -28,6 +28,14 @@ Result<TqlStructure> ParseText(std::string text, const std::string& name)
     return Checked(TqlStructure(tqlLoadText(std::move(text), name)), nullptr);
 }
 
+Result<std::string> TextOf(tqlHandle built)
+{
+    const std::string_view text = tqlGetText(built);
+    if (text.empty()) // the library refuses what no reader could take back
+        return Error{"The content cannot be expressed in a parameter file."};
+    return std::string(text);
+}
+
 Result<WriteReport> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options)
 {
     const std::string_view text = tqlGetText(built);

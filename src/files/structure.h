@@ -38,5 +38,7 @@ Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report =
 /// Likewise a text; `name` stands for the file in messages.
 Result<TqlStructure> ParseText(std::string text, const std::string& name);
 
+/// The text of what was built; an error when no file can hold it.
+Result<std::string> TextOf(tqlHandle built);
 /// Puts what was built into the place of a file (safe_file.h).
 Result<WriteReport> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options = {});

@@ -1,7 +1,9 @@
 #include "shell/main_frame.h"
 
 #include "ks/fc/exports.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/shown_text.h"
+#include "ks/fc/system_reason.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 #include "shell/project_respell.h"
@@ -27,6 +29,8 @@ CMainFrame::CMainFrame()
       m_files(*this, m_plugins, m_projects),
       m_bars(*this, m_plugins),
       m_menus(*this),
+      m_snapshots(m_recoveryFolder),
+      m_recovery(*this, m_plugins, m_recoveryFolder, m_snapshots),
       m_pluginLabel(new QLabel(this)),
       m_projectLabel(new QLabel(this))
 {
@@ -37,6 +41,7 @@ CMainFrame::CMainFrame()
     statusBar()->addPermanentWidget(m_pluginLabel);
     statusBar()->addPermanentWidget(m_projectLabel);
     connect(&m_projects, &CProjectController::Changed, this, &CMainFrame::Update);
+    connect(&m_snapshots, &CSnapshots::Failed, this, &CMainFrame::NotKept);
 
     Retranslate();
     ReadSettings();
@@ -93,6 +98,7 @@ void CMainFrame::Follow(const CMultiDocTemplate& documents)
         connect(document, &CKsDoc::PathNameChanged, this, &CMainFrame::DocumentRenamed);
     });
     connect(&documents, &CMultiDocTemplate::DocumentShown, this, &CMainFrame::DocumentShown);
+    m_snapshots.Follow(documents);
 }
 
 /// Whoever opened it: the user, a project, or an editor for another one.
@@ -114,6 +120,13 @@ void CMainFrame::DocumentRenamed(const QString& oldPath, const QString& newPath)
     RespellMember(m_projects.Registry(), oldPath, newPath);
     if (!newPath.isEmpty())
         RecentFiles::Add(newPath);
+}
+
+/// Work goes on: only a crash would show the difference.
+void CMainFrame::NotKept(const CKsDoc* document, std::error_code why)
+{
+    TellStatus(tr("The changes to %1 cannot be kept for the case of a crash: %2.")
+                   .arg(KsShownFileName(document->GetTitle()), KsSystemReason(why)));
 }
 
 void CMainFrame::ActiveViewChanged(CView* view)

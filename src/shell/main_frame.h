@@ -8,6 +8,9 @@
 #include "shell/frame_menus.h"
 #include "shell/plugin_loader.h"
 #include "shell/project_controller.h"
+#include "shell/recovery.h"
+#include "shell/recovery_folder.h"
+#include "shell/snapshots.h"
 #include "shell/window_manager.h"
 
 class QLabel;
@@ -26,12 +29,17 @@ public:
     /// See CFileCommands::Open.
     bool OpenFile(const QString& path, bool othersLater = false) { return m_files.Open(path, othersLater); }
 
+    /// Offers the changes that earlier sessions left over, once at the start.
+    void OfferRecovery() { m_recovery.Offer(); }
+
     const CPlugins& Plugins() const { return m_plugins; }
     CWindowManager& Windows() { return m_windows; }
     CProjectController& Projects() { return m_projects; }
     CFileCommands& Files() { return m_files; }
     CEditRouter& Edit() { return m_edit; }
     const CEditorBars& EditorBars() const { return m_bars; }
+    CSnapshots& Snapshots() { return m_snapshots; }
+    CRecovery& Recovery() { return m_recovery; }
 
     LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam) override;
     QMenu* createPopupMenu() override;
@@ -47,6 +55,7 @@ private:
     void Follow(const CMultiDocTemplate& documents);
     void DocumentShown(const CKsDoc* document);
     void DocumentRenamed(const QString& oldPath, const QString& newPath);
+    void NotKept(const CKsDoc* document, std::error_code why);
     void Retranslate();
     void Update();
     void UpdateTitle();
@@ -62,5 +71,8 @@ private:
     CEditRouter m_edit;
     CEditorBars m_bars;
     CFrameMenus m_menus;
+    CRecoveryFolder m_recoveryFolder;
+    CSnapshots m_snapshots;
+    CRecovery m_recovery;
     QLabel *m_pluginLabel, *m_projectLabel;
 };

@@ -61,6 +61,8 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
     // Before control returns to the event loop: the first thing painted is the first page, not an empty frame.
     for (const QString& file : parser.positionalArguments())
         frame.OpenFile(QDir::current().absoluteFilePath(file), true);
+    // When what was asked for is there: a message about it comes first.
+    QTimer::singleShot(0, &frame, &CMainFrame::OfferRecovery);
     if (onStarted)
         QTimer::singleShot(0, &frame, [&] { onStarted(frame); });
     return QApplication::exec();

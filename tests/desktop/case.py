@@ -54,9 +54,9 @@ class Case(unittest.TestCase):
         editor.settle()
         return editor
 
-    def start(self, *files, language=None):
+    def start(self, *files, language=None, recovers=False):
         self.end()
-        self.editor = Editor(self.folder, *files, language=language)
+        self.editor = Editor(self.folder, *files, language=language, recovers=recovers)
         return self.editor
 
     def saved(self, name='moor.HDKV'):

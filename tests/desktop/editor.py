@@ -1,6 +1,7 @@
 """The program as its user meets it: pages, fields, cells, messages, windows."""
 import os
 import re
+import shutil
 import signal
 import subprocess
 import time
@@ -28,15 +29,19 @@ def largest_window(pid):
 
 
 class Editor:
-    """The program, started with files; `folder` is where it runs and where its log is kept."""
+    """The program, started with files; `folder` is where it runs and where its log is kept. What a program before it has
+    left over is forgotten, unless it `recovers`."""
 
-    def __init__(self, folder, *files, language=None):
+    def __init__(self, folder, *files, language=None, recovers=False):
         self.hands = Hands()
         self._known = {}  # widgets that were looked for
         self._log = open(f'{folder}/kvrshell.log', 'w+', encoding='utf-8', errors='replace')
         program = os.path.join(os.environ['KVR_BIN'], 'kvrshell')
-        # Settings of its own: what one case chooses must not meet the next.
-        environment = dict(os.environ, XDG_CONFIG_HOME=f'{folder}/settings', LC_ALL=(language or 'C') + '.UTF-8')
+        if not recovers:
+            shutil.rmtree(f'{folder}/state', ignore_errors=True)
+        # Settings and unsaved changes of its own: those of one case must not meet the next.
+        environment = dict(os.environ, XDG_CONFIG_HOME=f'{folder}/settings', XDG_STATE_HOME=f'{folder}/state',
+                           LC_ALL=(language or 'C') + '.UTF-8')
         self.process = subprocess.Popen([program, *files], cwd=folder, stdout=self._log, stderr=self._log,
                                         env=environment)
         try:

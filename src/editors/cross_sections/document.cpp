@@ -1,6 +1,7 @@
 #include "editors/cross_sections/document.h"
 
 #include "editors/cross_sections/section_file.h"
+#include "ks/fc/doc_command.h"
 
 namespace {
 constexpr int CrossSectionPackageKind = 2; // what this editor's packages call themselves
@@ -22,6 +23,18 @@ void CCrossSectionDoc::Load(tqlHandle structure, LoadReport& report)
 Result<WriteReport> CCrossSectionDoc::Save(const std::string& path, const SafeFileOptions& options) const
 {
     return SaveCrossSections(m_sections, path, options);
+}
+
+Result<std::string> CCrossSectionDoc::ContentText() const
+{
+    return CrossSectionsText(m_sections);
+}
+
+std::unique_ptr<QUndoCommand> CCrossSectionDoc::MakeContentStep(tqlHandle structure, LoadReport& report,
+                                                                const CString& text)
+{
+    return std::make_unique<CReplaceContent<CCrossSections>>(*this, text, m_sections,
+                                                             LoadCrossSections(structure, report));
 }
 
 void CCrossSectionDoc::DeleteContents()

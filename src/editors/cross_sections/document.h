@@ -17,6 +17,7 @@ public:
     const CCrossSection* Section(int index) const;
 
     void DeleteContents() override;
+    Result<std::string> ContentText() const override;
 
     /// For the first section of a document: a branch that the project has.
     QString NewBranch() const;
@@ -24,6 +25,8 @@ public:
 protected:
     void Load(tqlHandle structure, LoadReport& report) override;
     Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const override;
+    std::unique_ptr<QUndoCommand> MakeContentStep(tqlHandle structure, LoadReport& report,
+                                                  const CString& text) override;
 
 private:
     CCrossSections m_sections;

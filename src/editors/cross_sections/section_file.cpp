@@ -132,3 +132,8 @@ Result<WriteReport> SaveCrossSections(const CCrossSections& sections, const std:
 {
     return SaveDeclaredFile(path, file, &sections, options);
 }
+
+Result<std::string> CrossSectionsText(const CCrossSections& sections)
+{
+    return DeclaredText(file, &sections);
+}

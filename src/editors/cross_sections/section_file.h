@@ -10,3 +10,5 @@ CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report);
 /// Puts the sections into the place of a file (safe_file.h).
 Result<WriteReport> SaveCrossSections(const CCrossSections& sections, const std::string& path,
                                       const SafeFileOptions& options = {});
+/// The text of that file.
+Result<std::string> CrossSectionsText(const CCrossSections& sections);

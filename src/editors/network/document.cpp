@@ -30,6 +30,16 @@ Result<WriteReport> CNetworkDoc::Save(const std::string& path, const SafeFileOpt
     return SaveNetwork(m_network, path, options);
 }
 
+Result<std::string> CNetworkDoc::ContentText() const
+{
+    return NetworkText(m_network);
+}
+
+std::unique_ptr<QUndoCommand> CNetworkDoc::MakeContentStep(tqlHandle structure, LoadReport& report, const CString& text)
+{
+    return std::make_unique<CReplaceContent<CNetwork>>(*this, text, m_network, LoadNetwork(structure, report));
+}
+
 void CNetworkDoc::DeleteContents()
 {
     CKsDoc::DeleteContents();

@@ -20,6 +20,7 @@ public:
     const CLinearReference& Reference() const;
 
     void DeleteContents() override;
+    Result<std::string> ContentText() const override;
 
     /// An import: one step to undo. The network names `system` as its coordinate system from then on.
     void AppendBranches(std::vector<CNetworkBranch> branches, const QString& system, const QString& text);
@@ -32,6 +33,8 @@ signals:
 protected:
     void Load(tqlHandle structure, LoadReport& report) override;
     Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const override;
+    std::unique_ptr<QUndoCommand> MakeContentStep(tqlHandle structure, LoadReport& report,
+                                                  const CString& text) override;
 
 private:
     CNetwork m_network;

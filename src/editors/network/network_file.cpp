@@ -135,3 +135,8 @@ Result<WriteReport> SaveNetwork(const CNetwork& network, const std::string& path
 {
     return SaveDeclaredFile(path, file, &network, options);
 }
+
+Result<std::string> NetworkText(const CNetwork& network)
+{
+    return DeclaredText(file, &network);
+}

@@ -10,3 +10,5 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report);
 /// Puts the network into the place of a file (safe_file.h).
 Result<WriteReport> SaveNetwork(const CNetwork& network, const std::string& path,
                                 const SafeFileOptions& options = {});
+/// The text of that file.
+Result<std::string> NetworkText(const CNetwork& network);

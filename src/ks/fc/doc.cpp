@@ -58,6 +58,17 @@ void CKsDoc::DeleteContents()
     m_undo->clear();
 }
 
+Result<std::string> CKsDoc::ContentText() const
+{
+    return Error{.message = "The document has no text.",
+                 .code = std::make_error_code(std::errc::operation_not_supported)};
+}
+
+bool CKsDoc::TakeContent(std::string, const CString&)
+{
+    return false;
+}
+
 void CKsDoc::OnCloseDocument()
 {
     DeleteContents();

@@ -1,6 +1,8 @@
 // Documents and views of the shell.
 #pragma once
 
+#include "base/result.h"
+#include "files/file_stamp.h"
 #include "ks/fc/change_place.h"
 #include "ks/fc/messages.h"
 #include "ks/fc/types.h"
@@ -76,6 +78,16 @@ public:
     /// The file that OnSaveDocument really writes when it is given `path`. A document that chooses the extension itself
     /// says so here, so that the question before overwriting is asked about that file.
     virtual CString SavePathFor(const CString& path) const;
+
+    // What keeps a document's changes for the case that the program ends without a save.
+    /// Everything that the document holds, unfinished lines included, as the text of a file of its kind; an error when
+    /// there is no such text. Computes only: a copy of the process calls it, without a user interface.
+    virtual Result<std::string> ContentText() const;
+    /// Such a text becomes what the document holds, as one step to undo that is called `step`. False, and nothing has
+    /// changed, when it is no file of the kind.
+    virtual bool TakeContent(std::string text, const CString& step);
+    /// What the file on the disk was when the document was read from it or written to it.
+    virtual FileStamp Stamp() const { return {}; }
 
     /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
     /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the user

@@ -26,6 +26,29 @@ private:
     bool m_repeated = false;
 };
 
+/// Everything that a document holds - or a part that stays where it is in memory - becomes something else.
+template <typename T>
+class CReplaceContent : public CDocumentCommand
+{
+public:
+    CReplaceContent(CKsDoc& document, const QString& text, T& target, T content)
+        : CDocumentCommand(document, text), m_target(target), m_other(std::move(content))
+    {
+    }
+
+protected:
+    ChangePlace Apply() override
+    {
+        std::swap(m_target, m_other);
+        return {};
+    }
+    ChangePlace Revert() override { return Apply(); }
+
+private:
+    T& m_target;
+    T m_other; // what is not in the document
+};
+
 /// Changes one value of the document that no list holds.
 template <typename T>
 class CSetValue : public CDocumentCommand

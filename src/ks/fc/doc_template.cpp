@@ -2,6 +2,7 @@
 
 #include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
+#include "ks/fc/message_box.h"
 
 #include <QFileInfo>
 #include <QUndoStack>
@@ -111,6 +112,15 @@ bool CMultiDocTemplate::ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame)
     frame->ShowWindow(child); // at the size of what is in it now
     shown->setFocus();
     return true;
+}
+
+std::unique_ptr<CKsDoc> CMultiDocTemplate::ReadDocument(const CString& path)
+{
+    const CKsKeptMessages untold;
+    const int untitled = m_untitled;
+    auto document = LoadDocument(path);
+    m_untitled = untitled;
+    return document;
 }
 
 CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)

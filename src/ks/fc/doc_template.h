@@ -58,6 +58,9 @@ public:
     /// null.
     CKsDoc* OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path);
 
+    /// What OpenDocumentFile would read, without a window and without a word to the user; null when it failed. The
+    /// document is the caller's.
+    std::unique_ptr<CKsDoc> ReadDocument(const CString& path);
     /// The open document of a file; null when there is none.
     CKsDoc* FindDocument(const CString& path) const;
 

@@ -1,5 +1,6 @@
 #include "ks/fc/project_doc.h"
 
+#include "files/structure.h"
 #include "ks/fc/exchange.h"
 
 #include <QTimer>
@@ -13,6 +14,7 @@ CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind)
 
 void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load)
 {
+    m_stamp = FileStamp::Of(path.toStdString()); // before: what is written to it from now on makes it another
     m_file.Read(path, SavePathFor(path), load);
     m_isReadOnly = m_file.IsUnreadable();
     emit FileStateChanged();
@@ -30,6 +32,7 @@ void CKsProjectDoc::FileWritten()
 {
     UndoStack().setClean();
     SetPathName(m_file.Path());
+    m_stamp = FileStamp::Of(m_file.Path().toStdString());
     SetModifiedFlag(false);
     EditUnreadable();
 }
@@ -38,6 +41,27 @@ void CKsProjectDoc::EditUnreadable()
 {
     m_isReadOnly = false;
     emit FileStateChanged();
+}
+
+bool CKsProjectDoc::TakeContent(std::string text, const CString& step)
+{
+    const Result<TqlStructure> structure = ParseText(std::move(text), GetTitle().toStdString());
+    if (!structure)
+        return false;
+    LoadReport report(structure.value().Get());
+    auto command = MakeContentStep(structure.value().Get(), report, step);
+    const auto findings = report.Take();
+    if (!command || (!findings.empty() && findings.front().kind == Finding::NoTarget))
+        return false;
+    if (m_isReadOnly) // somebody has edited it already
+        EditUnreadable();
+    UndoStack().push(command.release());
+    return true;
+}
+
+std::unique_ptr<QUndoCommand> CKsProjectDoc::MakeContentStep(tqlHandle, LoadReport&, const CString&)
+{
+    return nullptr;
 }
 
 LRESULT CKsProjectDoc::Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const

@@ -7,6 +7,9 @@
 #include "ks/fc/package.h"
 
 #include <QStringList>
+#include <memory>
+
+class QUndoCommand;
 
 class KS_API CKsProjectDoc : public CKsDoc
 {
@@ -20,6 +23,8 @@ public:
     /// It could not be parsed, and nobody has asked to edit what is shown instead.
     bool IsReadOnly() const { return m_isReadOnly; }
     void EditUnreadable();
+    bool TakeContent(std::string text, const CString& step) final;
+    FileStamp Stamp() const final { return m_stamp; }
 
     /// Joins the project that the document's file is a member of; false when there is none.
     bool JoinProject(CView* view);
@@ -56,12 +61,15 @@ protected:
     void ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load);
     /// Has `write` write to `target` (CKsDocumentFile::Write); on failure the user is told why.
     bool WriteFile(const CString& target, const KsFileWriter& write);
+    /// A step that makes what a file holds the document's content; null for an editor that has none.
+    virtual std::unique_ptr<QUndoCommand> MakeContentStep(tqlHandle structure, LoadReport& report, const CString& text);
     /// The file has been written: it is what the document holds, and its name the document's.
     void FileWritten();
 
     CKsDocumentFile m_file;
 
 private:
+    FileStamp m_stamp;
     void StepMade();
     LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const;
 

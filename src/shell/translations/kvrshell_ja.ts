@@ -323,6 +323,10 @@ The editors read %2.</source>
 <context>
     <name>CMainFrame</name>
     <message>
+        <source>The changes to %1 cannot be kept for the case of a crash: %2.</source>
+        <translation>%1 の変更を異常終了に備えて保持できません: %2。</translation>
+    </message>
+    <message>
         <source>Not loaded: %1 (see Help, Plug-ins)</source>
         <translation>読み込めませんでした: %1 (「ヘルプ」の「プラグイン」を参照)</translation>
     </message>
@@ -515,6 +519,153 @@ Shell of the river model editors.</source>
 The file is found all the same.</source>
         <translation>プロジェクト %1 は %2 を指したままで、変更できませんでした: %3。
 ファイルはこのままでも見つかります。</translation>
+    </message>
+</context>
+<context>
+    <name>CRecovery</name>
+    <message>
+        <source>The changes to %1 could not be recovered: what was kept of them cannot be read.</source>
+        <translation>%1 の変更を復元できませんでした: 保存されていた内容を読み取れません。</translation>
+    </message>
+    <message>
+        <source>Recovered changes</source>
+        <translation>復元した変更</translation>
+    </message>
+    <message>
+        <source>The changes to %1 could not be recovered: what was kept of them is no file of this kind.</source>
+        <translation>%1 の変更を復元できませんでした: 保存されていた内容はこの種類のファイルではありません。</translation>
+    </message>
+    <message>
+        <source>%1 (recovered)</source>
+        <translation>%1 (復元)</translation>
+    </message>
+</context>
+<context>
+    <name>CRecoveryDialog</name>
+    <message>
+        <source>Recover Changes</source>
+        <translation>変更の復元</translation>
+    </message>
+    <message>
+        <source>The program ended before these changes were saved. A document that you open has them, not yet saved; undo leads back to its file.</source>
+        <translation>これらの変更が保存される前にプログラムが終了しました。開いた文書には変更が未保存の状態で入っています。元に戻すとファイルの内容に戻ります。</translation>
+    </message>
+    <message>
+        <source>Document</source>
+        <translation>文書</translation>
+    </message>
+    <message>
+        <source>Last change kept</source>
+        <translation>最後に保持した変更</translation>
+    </message>
+    <message>
+        <source>What differs</source>
+        <translation>相違点</translation>
+    </message>
+    <message>
+        <source>&amp;Open</source>
+        <translation>開く(&amp;O)</translation>
+    </message>
+    <message>
+        <source>&amp;Compare</source>
+        <translation>比較(&amp;C)</translation>
+    </message>
+    <message>
+        <source>&amp;Discard</source>
+        <translation>破棄(&amp;D)</translation>
+    </message>
+    <message>
+        <source>&amp;Later</source>
+        <translation>後で(&amp;L)</translation>
+    </message>
+    <message>
+        <source>A damaged recovery file</source>
+        <translation>破損した復元ファイル</translation>
+    </message>
+    <message>
+        <source>Comparing...</source>
+        <translation>比較しています...</translation>
+    </message>
+    <message>
+        <source>What differs is not known: the file cannot be read.</source>
+        <translation>相違点は不明です: ファイルを読み取れません。</translation>
+    </message>
+    <message>
+        <source>It cannot be read, and can only be discarded.</source>
+        <translation>読み取れません。破棄のみ可能です。</translation>
+    </message>
+    <message>
+        <source>No editor reads files of this kind (%1).</source>
+        <translation>この種類のファイル (%1) を扱うエディタがありません。</translation>
+    </message>
+    <message>
+        <source>New document. %1</source>
+        <translation>新しい文書。%1</translation>
+    </message>
+    <message>
+        <source>The file has been changed since; the changes open as a new document beside it. %1</source>
+        <translation>ファイルはその後変更されています。変更は別の新しい文書として開きます。%1</translation>
+    </message>
+    <message>
+        <source>The file is not there any more; the changes open as a new document. %1</source>
+        <translation>ファイルはもう存在しません。変更は新しい文書として開きます。%1</translation>
+    </message>
+    <message>
+        <source>Discard the changes to %1? They cannot be brought back.</source>
+        <translation>%1 の変更を破棄しますか? 元に戻すことはできません。</translation>
+    </message>
+</context>
+<context>
+    <name>CDifferenceDialog</name>
+    <message>
+        <source>lines: %1</source>
+        <translation>行数: %1</translation>
+    </message>
+    <message>
+        <source>Recovered Changes of %1</source>
+        <translation>%1 の復元した変更</translation>
+    </message>
+    <message>
+        <source>The first %1 places are listed.</source>
+        <translation>最初の %1 か所を表示しています。</translation>
+    </message>
+    <message>
+        <source>Section
+Keyword
+Number
+Parameter
+Now
+Recovered</source>
+        <translation>セクション
+キーワード
+番号
+パラメータ
+現在
+復元後</translation>
+    </message>
+    <message>
+        <source>&amp;Close</source>
+        <translation>閉じる(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Nothing differs.</source>
+        <translation>相違はありません。</translation>
+    </message>
+    <message>
+        <source>values changed: %1</source>
+        <translation>変更された値: %1</translation>
+    </message>
+    <message>
+        <source>lines added: %1</source>
+        <translation>追加された行: %1</translation>
+    </message>
+    <message>
+        <source>lines removed: %1</source>
+        <translation>削除された行: %1</translation>
+    </message>
+    <message>
+        <source>Sections: %1; %2.</source>
+        <translation>セクション: %1; %2。</translation>
     </message>
 </context>
 </TS>

@@ -1,0 +1,61 @@
+#include "files/private_folder.h"
+
+#include "base/utf8_path.h"
+
+#include <windows.h>
+
+namespace {
+
+Error Refused(const std::string& path, std::error_code code, bool reading = false)
+{
+    return {.message = "Could not use \"" + path + "\": " + code.message() + ".",
+            .code = code,
+            .path = path,
+            .reading = reading};
+}
+
+} // namespace
+
+// The user's local application data are nobody else's already.
+Result<void> MakePrivateFolder(const std::string& path)
+{
+    std::error_code error;
+    std::filesystem::create_directories(PathFromUtf8(path), error);
+    return error ? Refused(path, error) : Result<void>();
+}
+
+Result<PrivateFile> OpenPrivateFile(const std::string& path)
+{
+    std::error_code error;
+    const std::filesystem::path file = PathFromUtf8(path);
+    if (!std::filesystem::is_regular_file(std::filesystem::symlink_status(file, error)))
+        return Refused(path, error ? error : std::make_error_code(std::errc::invalid_argument), true);
+    PrivateFile opened;
+    opened.size = std::filesystem::file_size(file, error);
+    opened.stream.reset(::_wfopen(file.c_str(), L"rb"));
+    if (error || !opened.stream)
+        return Refused(path, error ? error : std::error_code(errno, std::generic_category()), true);
+    return opened;
+}
+
+Result<ProcessLock> ProcessLock::Take(const std::string& path)
+{
+    const HANDLE file = ::CreateFileW(PathFromUtf8(path).c_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, OPEN_ALWAYS,
+                                      FILE_ATTRIBUTE_NORMAL, nullptr);
+    if (file != INVALID_HANDLE_VALUE)
+        return ProcessLock(reinterpret_cast<std::intptr_t>(file));
+    const DWORD reason = ::GetLastError();
+    return Refused(path, reason == ERROR_SHARING_VIOLATION ? std::make_error_code(std::errc::device_or_resource_busy)
+                                                           : std::error_code(int(reason), std::system_category()));
+}
+
+bool ProcessLock::IsOrphan(const std::string&)
+{
+    return false; // there are no copies
+}
+
+ProcessLock::~ProcessLock()
+{
+    if (m_handle != None)
+        ::CloseHandle(reinterpret_cast<HANDLE>(m_handle));
+}

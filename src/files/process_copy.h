@@ -1,0 +1,42 @@
+// Work on everything as it is at this moment, done while the program goes on and changes it.
+#pragma once
+
+#include "base/result.h"
+
+#include <cstdint>
+#include <functional>
+
+/// A copy of this process that does one piece of work and ends: it has all memory as it was when it was started, which
+/// the system shares until one of both writes to it. The copy has one thread, no connection to the display, and runs no
+/// destructors but those of the work: the work computes and writes files, and asks nothing of the user interface.
+///
+/// Where a system has no such copies the work is done before Start returns.
+class ProcessCopy
+{
+public:
+    /// The answer of the work is 0, or why it failed, as a system error.
+    static Result<ProcessCopy> Start(const std::function<std::error_code()>& work);
+    ProcessCopy(ProcessCopy&& other) noexcept { *this = std::move(other); }
+    ProcessCopy& operator=(ProcessCopy&& other) noexcept
+    {
+        std::swap(m_process, other.m_process);
+        std::swap(m_ended, other.m_ended);
+        std::swap(m_answer, other.m_answer);
+        return *this;
+    }
+    ~ProcessCopy(); // stops it
+
+    /// A descriptor that can be read when the copy has ended; -1 when it has ended already.
+    int Ended() const { return m_ended; }
+    /// Ends the copy whatever it is doing. What it was just doing may still come to its end until Wait returns.
+    void Stop();
+    /// Waits until the copy has ended; what the work answered.
+    std::error_code Wait();
+
+private:
+    ProcessCopy() = default;
+
+    std::intptr_t m_process = -1;
+    int m_ended = -1;
+    std::error_code m_answer;
+};

@@ -1,0 +1,30 @@
+// The file that keeps what has not been saved of a document.
+#pragma once
+
+#include <QByteArray>
+#include <QDateTime>
+#include <QString>
+#include <optional>
+#include <string>
+#include <system_error>
+
+/// Whose content it is. The file is one line of JSON with this, and behind it the content as a file of the document's
+/// kind.
+struct CRecoveryHeader
+{
+    QString path{}; // of the document's file; empty for a document that never had one
+    qint64 size = 0;
+    QByteArray hash{};   // of that file as the document knew it; empty where somebody else has changed it since
+    QString extension{}; // of the files of the document's kind
+    QString title{};
+    QDateTime time{}; // of the content
+};
+
+/// Puts it into the place of a file (safe_file.h).
+std::error_code WriteRecoveryFile(const QString& file, const CRecoveryHeader& header, const std::string& content);
+/// Reads such a file, and what it holds into `content` if that is asked for. Nothing for one that is not, to the last
+/// byte, as it was written.
+std::optional<CRecoveryHeader> ReadRecoveryFile(const QString& file, std::string* content = nullptr);
+
+/// SHA-256 of an ordinary file's content; empty when it cannot be read.
+QByteArray FileHash(const QString& path);

@@ -1,0 +1,38 @@
+// Where the program keeps what has not been saved, for the case that it ends without being asked to.
+#pragma once
+
+#include "files/private_folder.h"
+
+#include <QString>
+#include <QStringList>
+#include <optional>
+#include <vector>
+
+/// Each run of the program - a session - has a folder of its own in the user's folder of states, and holds it as long
+/// as it lives: what stands in a folder that nobody holds is left over, and is for the next session to recover.
+class CRecoveryFolder
+{
+public:
+    CRecoveryFolder();
+    /// What is not needed any more goes; what nobody has recovered yet stays for the next session.
+    ~CRecoveryFolder();
+    CRecoveryFolder(const CRecoveryFolder&) = delete;
+    CRecoveryFolder& operator=(const CRecoveryFolder&) = delete;
+
+    /// The path of a file that is not there yet, in this session's folder.
+    Result<QString> NewFile();
+    /// What sessions have left over. From now on it is held by this one.
+    QStringList TakeOver();
+
+private:
+    struct Session
+    {
+        QString folder;
+        ProcessLock lock;
+    };
+    static std::optional<Session> Hold(const QString& folder);
+
+    QString m_root;
+    std::optional<Session> m_own; // made when first needed
+    std::vector<Session> m_others;
+};

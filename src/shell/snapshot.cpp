@@ -1,0 +1,156 @@
+#include "shell/snapshot.h"
+
+#include "ks/fc/doc.h"
+#include "ks/fc/doc_template.h"
+#include "shell/recovery_file.h"
+#include "shell/recovery_folder.h"
+
+#include <QFile>
+#include <QSocketNotifier>
+#include <QUndoStack>
+#include <utility>
+
+namespace {
+
+/// In the copy of the process: whose changes these are, and what they come to.
+std::error_code WriteContent(const CKsDoc& document, CRecoveryHeader header, const QString& file)
+{
+    const Result<std::string> content = document.ContentText();
+    if (!content)
+        return content.error().code ? content.error().code : std::make_error_code(std::errc::invalid_argument);
+    const FileStamp known = document.Stamp();
+    if (known.exists && FileStamp::Of(header.path.toStdString()) == known) {
+        header.size = qint64(known.size);
+        header.hash = FileHash(header.path);
+    }
+    return WriteRecoveryFile(file, header, content.value());
+}
+
+} // namespace
+
+CSnapshot::CSnapshot(CKsDoc& document, CRecoveryFolder& folder, std::chrono::milliseconds delay)
+    : m_document(document), m_folder(folder), m_delay(delay)
+{
+    m_timer.setSingleShot(true);
+    connect(&m_timer, &QTimer::timeout, this, &CSnapshot::Write);
+    connect(&document.UndoStack(), &QUndoStack::indexChanged, this, &CSnapshot::StepMade);
+    connect(&document, &CKsDoc::TitleChanged, this, &CSnapshot::StateChanged);
+}
+
+CSnapshot::~CSnapshot()
+{
+    Drop();
+}
+
+void CSnapshot::Continue(const QString& file)
+{
+    if (m_file == file)
+        return;
+    const int steps = m_steps;
+    Drop();
+    m_file = file;
+    m_steps = steps;
+    if (m_steps > 0)
+        m_timer.start(m_delay);
+}
+
+void CSnapshot::StepMade()
+{
+    if (m_document.UndoStack().isClean())
+        return;
+    if (++m_steps >= Steps && !m_fails)
+        Write();
+    else if (!m_timer.isActive())
+        m_timer.start(m_delay);
+}
+
+void CSnapshot::StateChanged()
+{
+    if (!m_document.IsModified())
+        Drop();
+}
+
+void CSnapshot::Write()
+{
+    m_timer.stop();
+    if (m_writer)
+        return;                     // what is due then is seen when it has ended
+    if (m_document.IsExecuting()) { // a save has taken out of the document what it does not write
+        constexpr std::chrono::milliseconds pause{200};
+        m_timer.start(pause);
+        return;
+    }
+    if (m_file.isEmpty()) {
+        const Result<QString> file = m_folder.NewFile();
+        if (!file) {
+            Fail(file.error().code);
+            return;
+        }
+        m_file = file.value();
+    }
+    const CRecoveryHeader header{.path = m_document.GetPathName(),
+                                 .extension = m_document.GetDocTemplate()->GetDocString(CMultiDocTemplate::filterExt),
+                                 .title = m_document.GetTitle(),
+                                 .time = QDateTime::currentDateTimeUtc()};
+    Result<ProcessCopy> writer = ProcessCopy::Start([&] { return WriteContent(m_document, header, m_file); });
+    if (!writer) {
+        Fail(writer.error().code);
+        return;
+    }
+    m_steps = 0;
+    m_writer = std::move(writer.value());
+    if (m_writer->Ended() == -1) {
+        WriterEnded();
+        return;
+    }
+    m_writerEnds = std::make_unique<QSocketNotifier>(m_writer->Ended(), QSocketNotifier::Read);
+    connect(m_writerEnds.get(), &QSocketNotifier::activated, this, &CSnapshot::WriterEnded);
+}
+
+void CSnapshot::WriterEnded()
+{
+    if (m_writerEnds) {
+        m_writerEnds->setEnabled(false);       // before what it looks at is closed
+        m_writerEnds.release()->deleteLater(); // it is what calls
+    }
+    const std::error_code answer = m_writer->Wait();
+    m_writer.reset();
+    if (answer) {
+        Fail(answer);
+        return;
+    }
+    m_fails = false;
+    if (m_steps >= Steps)
+        Write();
+    else if (m_steps > 0 && !m_timer.isActive())
+        m_timer.start(m_delay);
+}
+
+/// The file is as far behind as before. It is tried again, and told once; not of an editor that has no part in this.
+void CSnapshot::Fail(std::error_code why)
+{
+    if (why == std::errc::operation_not_supported) {
+        m_document.disconnect(this);
+        m_document.UndoStack().disconnect(this);
+        Drop();
+        return;
+    }
+    m_timer.start(m_delay);
+    if (!std::exchange(m_fails, true))
+        emit Failed(why);
+}
+
+/// Nothing is left to save, or nobody wants it.
+void CSnapshot::Drop()
+{
+    m_timer.stop();
+    m_steps = 0;
+    m_writerEnds.reset();
+    if (m_writer) {
+        m_writer->Stop();
+        m_writer->Wait(); // only then nothing of it comes any more
+        m_writer.reset();
+    }
+    if (!m_file.isEmpty())
+        QFile::remove(std::exchange(m_file, QString()));
+}

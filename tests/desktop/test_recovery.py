@@ -1,0 +1,146 @@
+"""The program is killed and started again: what was typed comes back."""
+import glob
+import os
+import subprocess
+
+import samples
+from case import Case
+from screen import Table
+from waiting import wait_for
+
+WAIT = 12  # seconds, in which what was typed has to be kept
+
+
+class Recovery(Case):
+    def kept(self):
+        """What is kept of unsaved changes, by the name of the file; of new documents by their title."""
+        texts = {}
+        for path in glob.glob(f'{self.folder}/state/KVR/KVR Shell/recovery/*/*.recovery'):
+            try:
+                with open(path, encoding='utf-8') as file:
+                    header, text = file.readline(), file.read()
+            except FileNotFoundError:  # it went meanwhile
+                continue
+            texts[header.split('"file":"')[1].split('"')[0].split('/')[-1] or 'new'] = text
+        return texts
+
+    def wait_until_kept(self, name, text):
+        wait_for(lambda: text in self.kept().get(name, ''), f'{text} of {name} is kept', WAIT)
+
+    def restart(self, *files):
+        """Kills the program and starts it again."""
+        editor = self.start(*files, recovers=True)
+        wait_for(lambda: editor.box().name == 'Recover Changes', 'the dialog is shown')
+        editor.settle()
+        return editor
+
+    def lines(self):
+        table = Table(self.editor.box().find('table', '^Recover Changes'))
+        wait_for(lambda: all('Comparing' not in table.line(n)[2] for n in range(1, table.lines + 1)),
+                 'each line says what differs')
+        return {table.line(n)[0]: (n, table.line(n)[2]) for n in range(1, table.lines + 1)}
+
+    def choose(self, name, button):
+        editor = self.editor
+        dialog = editor.box()
+        table = Table(dialog.find('table', '^Recover Changes'))
+        editor.click(table.cell(self.lines()[name][0], 1))
+        editor.click(dialog.find('push button', f'^{button}'))
+
+    def test_every_kind_of_document(self):
+        # As the editor writes it: a date that a file lacks is the time at which it is read.
+        samples.write(f'{self.folder}/first.HDKV', samples.hd_text())
+        subprocess.run([os.path.join(os.environ['KVR_BIN'], 'hdkv'), 'fmt', f'{self.folder}/first.HDKV'], check=True)
+        editor = self.open_project(samples.Saved(f'{self.folder}/first.HDKV').text)
+        level, radius = 'Points of the current cross section', 'Radius and width'
+        editor.put(1, 3, '2.625')
+        editor.put(1, 2, '1500.5', leave='Return', table=editor.table(radius))
+        editor.put(1, 2, '12.875', leave='Return', table=editor.table(level))
+        changed = {'moor.HDKV': '2.625', 'moor.kvnw': '1500.5', 'moor.kvxs': '12.875'}
+        for name, text in changed.items():
+            self.wait_until_kept(name, text)
+        before = {name: self.saved(name).text for name in changed}
+
+        editor = self.restart('moor.kvrp')
+        self.assertEqual({name: what for name, (_, what) in self.lines().items()},
+                         {name: 'Sections: 1; values changed: 1.' for name in changed})
+        for name in changed:
+            self.choose(name, 'Open')
+        self.assert_no_message()
+        wait_for(lambda: len(editor.windows()) == 3, 'the project opens its three files')
+        self.assertEqual({name: self.saved(name).text for name in changed}, before, 'nothing is saved yet')
+        shown = {'moor.HDKV': lambda: editor.table().cell(1, 3).name,
+                 'moor.kvnw': lambda: editor.table(radius).cell(1, 2).name,
+                 'moor.kvxs': lambda: editor.table(level).cell(1, 2).name}
+        tables = {'moor.HDKV': lambda: editor.table(), 'moor.kvnw': lambda: editor.table(radius),
+                  'moor.kvxs': lambda: editor.table(level)}
+        for name, text in changed.items():
+            wait_for(lambda: shown[name]() == text, f'{name} shows {text}')
+            editor.click_cell(1, 2, tables[name]())
+            self.assertTrue(editor.modified, name)
+            editor.press('ctrl+z')
+            wait_for(lambda: shown[name]() != text and not editor.modified, f'undo shows the file {name}')
+            editor.press('ctrl+y')
+            wait_for(lambda: shown[name]() == text, f'redo shows {text}')
+            editor.save()
+            self.assertIn(text, self.saved(name).text)
+        wait_for(lambda: not self.kept(), 'nothing is kept of what is saved')
+
+    def test_discard_and_later(self):
+        editor = self.open()
+        editor.put(1, 3, '2.625')
+        self.wait_until_kept('moor.HDKV', '2.625')
+        self.restart()
+        self.choose('moor.HDKV', 'Later')
+        self.assert_no_message()
+        editor = self.restart('moor.HDKV')
+        self.choose('moor.HDKV', 'Discard')
+        editor.answer('Discard')
+        self.assert_no_message()
+        self.assertEqual(editor.table().cell(1, 3).name, '1.25')
+        self.assertFalse(editor.modified)
+        self.start('moor.HDKV', recovers=True)
+        self.assert_no_message()
+
+    def test_a_new_document(self):
+        editor = self.start()
+        editor.press('ctrl+n')
+        editor.box()
+        editor.press('Return')  # the first kind
+        wait_for(lambda: editor.windows(), 'a document is open')
+        editor.settle()
+        editor.put(1, 1, 'INN')
+        editor.put(1, 2, '1234.5')
+        self.wait_until_kept('new', '1234.5')
+        editor = self.restart()
+        [name] = self.lines()
+        self.choose(name, 'Open')
+        self.assert_no_message()
+        self.assertEqual(editor.table().line(1)[:2], ['INN', '1234.5'])
+        self.assertTrue(editor.modified)
+
+    def test_a_file_that_is_another_now(self):
+        editor = self.open()
+        editor.put(1, 3, '2.625')
+        self.wait_until_kept('moor.HDKV', '2.625')
+        other = samples.hd_text({'InitList': ['"INN", 5, 6, 7']})
+        samples.write(f'{self.folder}/moor.HDKV', other)
+        editor = self.restart()
+        self.assertIn('The file has been changed since', self.lines()['moor.HDKV'][1])
+        self.choose('moor.HDKV', 'Open')
+        self.assertIn('moor (recovered)', editor.title)
+        self.assertEqual(editor.table().cell(1, 3).name, '2.625')
+        self.assertEqual(self.saved().text, other)
+
+    def test_a_clean_end_leaves_nothing(self):
+        editor = self.open()
+        editor.put(1, 3, '2.625')
+        self.wait_until_kept('moor.HDKV', '2.625')
+        editor.press('ctrl+w')
+        editor.answer('Discard')
+        wait_for(lambda: not self.kept(), 'nothing is kept of what was discarded')
+        editor.press('ctrl+q')
+        wait_for(lambda: editor.process.poll() is not None, 'the program ends')
+        self.assertEqual(os.listdir(f'{self.folder}/state/KVR/KVR Shell/recovery'), [])
+        editor.end()
+        self.editor = None

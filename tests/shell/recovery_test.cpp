@@ -1,0 +1,450 @@
+// What is left of unsaved changes when the program ends without a save, with the three editors.
+#include "shell/recovery_dialog.h"
+#include "shell_fixture.h"
+
+#include <QDirIterator>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QLabel>
+#include <QPushButton>
+#include <QTableWidget>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace {
+
+using namespace std::chrono_literals;
+
+// With its dates: one that a file lacks is the time at which it is read.
+constexpr const char* HDText =
+    "[KAVO0_HD]\n[Global_Variables]\n[Global_Values]\nG_waterlevel = 1.5\n[/Global_Values]\n"
+    "[TextOutput]\nLimitedPeriodStart = 2024, 1, 1, 0, 0, 0\nLimitedPeriodEnd = 2024, 2, 1, 0, 0, 0\n[/TextOutput]\n"
+    "[/Global_Variables]\n[InitList]\nDATA = \"MAIN\", 100, 2.5, 30\nDATA = \"\", 1e10, 1, 1\n[/InitList]\n"
+    "[NextVersionList]\nDATA = \"kept\"\n[/NextVersionList]\n[/KAVO0_HD]\n";
+
+QByteArray Content(const QString& path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
+}
+
+QString Folder()
+{
+    return qEnvironmentVariable("XDG_STATE_HOME") + "/KVR-test/kvr-tests/recovery";
+}
+
+/// Everything in the recovery folder but locks.
+QStringList Kept()
+{
+    QStringList files;
+    for (QDirIterator each(Folder(), QDir::Files | QDir::Hidden | QDir::System, QDirIterator::Subdirectories);
+         each.hasNext();)
+        files << each.next();
+    files.removeIf([](const QString& file) { return file.endsWith("/lock"); });
+    return files;
+}
+
+class RecoveryTest : public ShellTest
+{
+protected:
+    RecoveryTest()
+    {
+        QDir(Folder()).removeRecursively();
+        Restart();
+        frame->Snapshots().SetDelay(10ms);
+    }
+    ~RecoveryTest() override { frame.reset(); }
+
+    void Restart()
+    {
+        frame.reset();
+        frame = std::make_unique<CMainFrame>();
+        frame->LoadPlugins(QStringLiteral(KVR_BUILD_DIR "/bin/plugins"));
+        frame->show();
+    }
+    CKsDoc* Open(const QString& path)
+    {
+        EXPECT_TRUE(frame->OpenFile(path));
+        return frame->ActiveDocument();
+    }
+    static std::string TextOf(const CKsDoc* document) { return document->ContentText().value(); }
+    /// A step of the user's: in the text of the document one piece becomes another.
+    static void Change(CKsDoc* document, const std::string& piece, const std::string& by)
+    {
+        std::string text = TextOf(document);
+        ASSERT_NE(text.find(piece), std::string::npos) << text;
+        text.replace(text.find(piece), piece.size(), by);
+        ASSERT_TRUE(document->TakeContent(text, "A change"));
+    }
+    bool IsKept(CKsDoc* document)
+    {
+        const CSnapshot* snapshot = frame->Snapshots().Of(document);
+        return QTest::qWaitFor([&] { return !snapshot->IsWriting() && QFile::exists(snapshot->File()); });
+    }
+    /// The program ends as in a crash, and starts anew: what was kept stands in a folder that nobody holds.
+    std::vector<CRecoverable> Crash()
+    {
+        const QString left = Folder() + "/" + QString::number(++m_crashes);
+        QDir().mkpath(left);
+        for (const QString& file : Kept())
+            EXPECT_TRUE(QFile::copy(file, left + "/" + QFileInfo(file).fileName()));
+        for (const auto* documents : CMultiDocTemplate::All())
+            for (CKsDoc* document : documents->findChildren<CKsDoc*>(Qt::FindDirectChildrenOnly))
+                document->SetModifiedFlag(false);
+        Restart();
+        frame->Snapshots().SetDelay(10ms);
+        return frame->Recovery().Find();
+    }
+
+private:
+    int m_crashes = 0;
+};
+
+} // namespace
+
+TEST_F(RecoveryTest, ChangesAreKeptAfterATimeOrManySteps)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    QTest::qWait(50);
+    EXPECT_TRUE(Kept().isEmpty()) << "nothing was changed";
+    Change(document, "1.5", "2.5");
+    EXPECT_TRUE(IsKept(document));
+    const QString file = frame->Snapshots().Of(document)->File();
+    EXPECT_TRUE(Content(file).contains("2.5"));
+    EXPECT_EQ(Kept(), QStringList(file));
+    const auto rights = [](const QString& path) {
+        struct stat status
+        {
+        };
+        EXPECT_EQ(::stat(path.toUtf8(), &status), 0);
+        return status.st_mode & 0777;
+    };
+    EXPECT_EQ(rights(file), 0600u);
+    EXPECT_EQ(rights(QFileInfo(file).path()), 0700u);
+    EXPECT_EQ(rights(Folder()), 0700u);
+    Change(document, "2.5", "3.5");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return Content(file).contains("3.5"); })) << "the same file follows";
+
+    frame->Snapshots().SetDelay(1h);
+    document = Open(Write("b.HDKV", HDText));
+    for (int step = 1; step < CSnapshot::Steps; ++step)
+        Change(document, "100", "100");
+    QTest::qWait(50);
+    EXPECT_FALSE(frame->Snapshots().Of(document)->IsWriting());
+    Change(document, "100", "150");
+    EXPECT_TRUE(IsKept(document));
+    EXPECT_TRUE(Content(frame->Snapshots().Of(document)->File()).contains("150"));
+}
+
+TEST_F(RecoveryTest, WhatIsKeptGoesWithASaveAnUndoAndAClose)
+{
+    const QString path = Write("a.HDKV", HDText);
+    for (const bool waits : {true, false}) { // for the writer, or not
+        for (const char* way : {"save", "undo", "close"}) {
+            CKsDoc* document = Open(path);
+            for (int step = 0; step < CSnapshot::Steps; ++step)
+                Change(document, "1.5", "1.5");
+            ASSERT_TRUE(waits ? IsKept(document) : frame->Snapshots().Of(document)->IsWriting());
+            if (way == std::string("save")) {
+                ASSERT_TRUE(document->DoSave(path));
+            } else if (way == std::string("undo")) {
+                document->UndoStack().setIndex(0);
+            }
+            answers << QMessageBox::Discard;
+            if (way != std::string("close")) {
+                EXPECT_TRUE(Kept().isEmpty()) << way;
+            }
+            Action("actionClose")->trigger();
+            Settle();
+            QTest::qWait(100);
+            EXPECT_TRUE(Kept().isEmpty()) << way << waits;
+            answers.clear();
+        }
+    }
+    frame.reset();
+    EXPECT_TRUE(QDir(Folder()).isEmpty());
+}
+
+TEST_F(RecoveryTest, EveryKindOfDocumentComesBackModifiedAndUndoable)
+{
+    const QString river = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.");
+    const struct
+    {
+        QString path;
+        const char *piece, *by;
+    } cases[] = {{Write("a.HDKV", HDText), "\"MAIN\", 100", "\"MAIN\", 125.5"},
+                 {Write("a.kvnw", Content(river + "kvnw")), "FlowsDownstream = true", "FlowsDownstream = false"},
+                 {Write("a.kvxs", Content(river + "kvxs")), "Radius = ", "Radius = 1"}};
+    std::vector<std::pair<std::string, std::string>> texts; // as in the file, and changed
+    for (const auto& [path, piece, by] : cases) {
+        CKsDoc* document = Open(path);
+        texts.emplace_back(TextOf(document), "");
+        Change(document, piece, by);
+        texts.back().second = TextOf(document);
+        ASSERT_NE(texts.back().first, texts.back().second);
+        ASSERT_TRUE(IsKept(document));
+    }
+    const auto found = Crash();
+    ASSERT_EQ(found.size(), std::size(cases));
+    for (const CRecoverable& item : found) {
+        EXPECT_EQ(item.state, CRecoverable::Same);
+        EXPECT_LT(item.header.time.secsTo(QDateTime::currentDateTime()), 60);
+        const auto differences = frame->Recovery().Compare(item);
+        ASSERT_TRUE(differences);
+        EXPECT_EQ(differences->changed, 1u) << item.Name().toStdString();
+        EXPECT_EQ(differences->added + differences->removed, 0u);
+        const auto which =
+            std::size_t(std::ranges::find(cases, item.header.path, [](auto& c) { return c.path; }) - cases);
+        const QByteArray before = Content(item.header.path);
+        ASSERT_TRUE(frame->Recovery().Open(item));
+        CKsDoc* document = frame->ActiveDocument();
+        EXPECT_EQ(document->GetPathName(), item.header.path);
+        EXPECT_EQ(TextOf(document), texts[which].second);
+        EXPECT_TRUE(document->IsModified());
+        EXPECT_EQ(document->UndoStack().undoText(), "Recovered changes");
+        EXPECT_EQ(Content(item.header.path), before);
+        EXPECT_TRUE(QFile::exists(item.file)) << "until it is saved, or kept anew";
+        document->UndoStack().undo();
+        EXPECT_EQ(TextOf(document), texts[which].first);
+        EXPECT_FALSE(document->IsModified());
+        EXPECT_FALSE(QFile::exists(item.file));
+        document->UndoStack().redo();
+        EXPECT_EQ(TextOf(document), texts[which].second);
+    }
+    EXPECT_TRUE(asked.isEmpty());
+}
+
+TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
+{
+    const QString changed = Write("changed.HDKV", HDText), missing = Write("missing.HDKV", HDText),
+                  edited = Write("edited.HDKV", HDText), early = Write("early.HDKV", HDText);
+    for (const QString& path : {changed, missing, edited, early}) {
+        CKsDoc* document = Open(path);
+        if (path == early)
+            Write("early.HDKV", QByteArray(HDText).replace("30", "31")); // before anything is kept
+        Change(document, "1.5", "2.5");
+        ASSERT_TRUE(IsKept(document));
+    }
+    for (CMultiDocTemplate* documents : CMultiDocTemplate::All())
+        if (documents->MatchesExtension("x.HDKV")) {
+            CKsDoc* document = documents->OpenDocumentFile(frame.get(), {});
+            Change(document, "[/KAVO0_HD]", "[Mine]\nK = 1\n[/Mine]\n[/KAVO0_HD]");
+            ASSERT_TRUE(IsKept(document));
+        }
+    const QByteArray others = QByteArray(HDText).replace("1.5", "1.7"); // of the same length
+    Write("changed.HDKV", others);
+    QFile::remove(missing);
+
+    const auto found = Crash();
+    ASSERT_EQ(found.size(), 5u);
+    Change(Open(edited), "1.5", "7.5");
+    for (const CRecoverable& item : found) {
+        const QString name = item.header.path.isEmpty() ? "new" : QFileInfo(item.header.path).completeBaseName();
+        const std::map<QString, CRecoverable::State> states{{"changed", CRecoverable::Changed},
+                                                            {"early", CRecoverable::Changed},
+                                                            {"missing", CRecoverable::Missing},
+                                                            {"edited", CRecoverable::Same},
+                                                            {"new", CRecoverable::New}};
+        EXPECT_EQ(item.state, states.at(name)) << name.toStdString();
+        ASSERT_TRUE(frame->Recovery().Open(item));
+        const CKsDoc* document = frame->ActiveDocument();
+        EXPECT_EQ(document->GetPathName(), QString()) << name.toStdString();
+        EXPECT_TRUE(document->IsModified());
+        if (name != "new") {
+            EXPECT_EQ(document->GetTitle(), name + " (recovered)");
+            EXPECT_NE(TextOf(document).find("G_waterlevel = 2.5"), std::string::npos);
+        } else {
+            EXPECT_NE(TextOf(document).find("[Mine]"), std::string::npos);
+        }
+    }
+    EXPECT_EQ(Content(changed), others);
+}
+
+TEST_F(RecoveryTest, ADamagedFileDoesNoHarm)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    Change(document, "1.5", "2.5");
+    ASSERT_TRUE(IsKept(document));
+    const QByteArray good = Content(frame->Snapshots().Of(document)->File());
+    const qsizetype line = good.indexOf('\n');
+    const auto header = [&](const char* key, const QJsonValue& by) {
+        QJsonObject json = QJsonDocument::fromJson(good.left(line)).object();
+        json[QLatin1String(key)] = by;
+        return QJsonDocument(json).toJson(QJsonDocument::Compact) + good.mid(line);
+    };
+    const QByteArray cases[] = {"",
+                                "\n",
+                                "{}\n",
+                                "[1]\n",
+                                "x",
+                                good.left(line),
+                                good.chopped(1),
+                                good + "x",
+                                QByteArray(good).replace("2.5", "2.6"),
+                                QByteArray(1 << 20, '{'),
+                                header("format", 2),
+                                header("file", 7),
+                                header("file", "/etc/passwd"),
+                                header("file", "a.HDKV"),
+                                header("file", "/tmp/../etc/a.HDKV"),
+                                header("fileSize", "many"),
+                                header("fileHash", "00"),
+                                header("extension", ""),
+                                header("extension", QJsonObject{{"a", QJsonArray{1}}}),
+                                header("time", "yesterday"),
+                                header("size", -1),
+                                header("size", 9e300),
+                                header("size", 1e15),
+                                header("hash", QJsonValue())};
+    const QString left = Folder() + "/left";
+    QDir().mkpath(left);
+    const auto write = [&](const QString& name, const QByteArray& text) {
+        QFile file(left + "/" + name);
+        ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(text);
+    };
+    int number = 0;
+    for (const QByteArray& text : cases)
+        write(QString::number(++number) + ".recovery", text);
+    const QString outside = Write("outside.recovery", good);
+    ASSERT_TRUE(QFile::link(outside, left + "/link.recovery"));
+    ASSERT_EQ(::mkfifo((left + "/pipe.recovery").toUtf8(), 0600), 0);
+    write("unknown.recovery", header("extension", ".abc").replace("a.HDKV", "a.abc"));
+    write("good.recovery", good);
+
+    const auto found = frame->Recovery().Find();
+    EXPECT_EQ(found.size(), std::size(cases) + 4);
+    for (const CRecoverable& item : found) {
+        const QString name = QFileInfo(item.file).completeBaseName();
+        EXPECT_EQ(item.state, name == "good"      ? CRecoverable::Same
+                              : name == "unknown" ? CRecoverable::NoEditor
+                                                  : CRecoverable::Damaged)
+            << name.toStdString();
+        if (name == "good")
+            continue;
+        asked.clear();
+        EXPECT_FALSE(frame->Recovery().Open(item)) << name.toStdString();
+        EXPECT_EQ(asked.size(), 1);
+        frame->Recovery().Discard(item);
+        EXPECT_FALSE(QFileInfo(item.file).isSymLink() || QFileInfo::exists(item.file)) << name.toStdString();
+    }
+    EXPECT_EQ(Content(outside), good);
+}
+
+TEST_F(ShellTest, ADocumentOfAnEditorWithoutRecoveryIsLeftAlone)
+{
+    QDir(Folder()).removeRecursively();
+    frame->OpenFile(Write("a.tst"));
+    CKsDoc* document = frame->ActiveDocument();
+    QStringList failures;
+    QObject::connect(&frame->Snapshots(), &CSnapshots::Failed, [&] { failures << "failed"; });
+    const auto change = [&] {
+        for (int step = 0; step < CSnapshot::Steps; ++step)
+            document->UndoStack().push(new QUndoCommand("step"));
+    };
+    change();
+    const CSnapshot* snapshot = frame->Snapshots().Of(document);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !snapshot->IsWriting(); }));
+    change();
+    EXPECT_FALSE(snapshot->IsWriting());
+    EXPECT_TRUE(Kept().isEmpty());
+    EXPECT_TRUE(failures.isEmpty());
+}
+
+TEST_F(RecoveryTest, WhatCannotBeKeptIsToldOnceAndTriedAgain)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    QDir().mkpath(QFileInfo(Folder()).path());
+    QFile obstacle(Folder());
+    ASSERT_TRUE(obstacle.open(QIODevice::WriteOnly)); // no folder
+    QList<std::error_code> failures;
+    QObject::connect(&frame->Snapshots(), &CSnapshots::Failed,
+                     [&](const CKsDoc*, std::error_code why) { failures << why; });
+    Change(document, "1.5", "2.5");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !failures.isEmpty(); }));
+    QTest::qWait(60);
+    EXPECT_EQ(failures, QList<std::error_code>{std::make_error_code(std::errc::not_a_directory)});
+    obstacle.remove();
+    EXPECT_TRUE(IsKept(document));
+}
+
+TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
+{
+    auto first = std::make_unique<CRecoveryFolder>();
+    CRecoveryFolder second;
+    const QString file = first->NewFile().value();
+    QFile kept(file);
+    ASSERT_TRUE(kept.open(QIODevice::WriteOnly));
+    kept.close();
+    EXPECT_TRUE(second.TakeOver().isEmpty());
+    first.reset(); // without removing it, as if it had crashed
+    EXPECT_EQ(second.TakeOver(), QStringList(file));
+    {
+        CRecoveryFolder third;
+        EXPECT_TRUE(third.TakeOver().isEmpty()) << "the second one has it now";
+    }
+    EXPECT_TRUE(QFile::exists(file));
+    QDir().mkpath(Folder() + "/empty");
+    {
+        CRecoveryFolder third;
+        EXPECT_TRUE(third.TakeOver().isEmpty());
+    }
+    EXPECT_FALSE(QFile::exists(Folder() + "/empty"));
+    ASSERT_TRUE(QDir().rename(Folder(), Folder() + "-aside"));
+    ASSERT_TRUE(QFile::link(folder.path(), Folder()));
+    EXPECT_FALSE(CRecoveryFolder().NewFile()) << "a link is no folder of ours";
+    EXPECT_TRUE(QDir(folder.path()).isEmpty());
+    QFile::remove(Folder());
+    QDir().rename(Folder() + "-aside", Folder());
+}
+
+TEST_F(RecoveryTest, TheDialogSaysWhatDiffersAndDoesWhatIsChosen)
+{
+    frame->OfferRecovery();
+    EXPECT_EQ(frame->findChild<CRecoveryDialog*>(), nullptr) << "nothing to offer";
+    for (const char* name : {"a.HDKV", "b.HDKV", "c.HDKV"}) {
+        CKsDoc* document = Open(Write(name, HDText));
+        Change(document, "1.5", "2.5");
+        ASSERT_TRUE(IsKept(document));
+    }
+    Crash(); // finds them; another session asks again
+    Restart();
+    frame->OfferRecovery();
+    auto* dialog = frame->findChild<CRecoveryDialog*>();
+    ASSERT_TRUE(dialog);
+    auto* table = dialog->findChild<QTableWidget*>();
+    ASSERT_EQ(table->rowCount(), 3);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return table->item(2, 2)->text() != "Comparing..."; }));
+    EXPECT_EQ(table->item(0, 0)->text(), "c.HDKV") << "the latest first";
+    EXPECT_EQ(table->item(0, 2)->text(), "Sections: 1; values changed: 1.");
+    const auto press = [&](const char* text) {
+        for (auto* button : dialog->findChildren<QPushButton*>())
+            if (button->text() == text)
+                button->click();
+    };
+    press("&Compare");
+    auto* differences = dialog->findChild<QDialog*>("differences");
+    ASSERT_TRUE(differences);
+    const auto* values = differences->findChild<QTableWidget*>();
+    QStringList cells;
+    for (int column = 0; column < values->columnCount(); ++column)
+        cells << values->item(0, column)->text();
+    EXPECT_EQ(cells.join("|"), "Global_Variables / Global_Values|G_waterlevel|1|1|1.5|2.5");
+    differences->close();
+    press("&Open");
+    EXPECT_EQ(frame->ActiveDocument()->GetPathName(), Path("c.HDKV"));
+    EXPECT_TRUE(frame->isWindowModified());
+    ASSERT_EQ(table->rowCount(), 2);
+    answers << QMessageBox::Cancel << QMessageBox::Discard;
+    press("&Discard");
+    EXPECT_EQ(table->rowCount(), 2);
+    press("&Discard");
+    ASSERT_EQ(table->rowCount(), 1);
+    EXPECT_EQ(table->item(0, 0)->text(), "a.HDKV");
+    press("&Later");
+    answers << QMessageBox::Discard;
+    frame->close();
+    Restart();
+    EXPECT_EQ(frame->Recovery().Find().size(), 1u);
+}
