@@ -41,11 +41,16 @@ QStringList Entries(const QString& folder, const QString& pattern)
     return paths;
 }
 
-/// The folder goes unless there is something to recover in it.
-void Tidy(const QString& folder)
+void RemoveTemporaries(const QString& folder)
 {
     for (const QString& file : Entries(folder, Temporaries))
         QFile::remove(file);
+}
+
+/// The folder goes unless there is something to recover in it.
+void Tidy(const QString& folder)
+{
+    RemoveTemporaries(folder);
     if (!Entries(folder, Files).isEmpty())
         return;
     QFile::remove(folder + QLatin1String(Lock));
@@ -96,6 +101,18 @@ std::optional<CRecoveryFolder::Session> CRecoveryFolder::Hold(const QString& fol
             return {};
         QThread::msleep(pause);
     }
+}
+
+void CRecoveryFolder::WriterEnds(bool stopped)
+{
+    m_isUntidy = m_isUntidy || stopped;
+    if (--m_writers > 0 || !m_isUntidy)
+        return;
+    m_isUntidy = false;
+    if (m_own)
+        RemoveTemporaries(m_own->folder);
+    for (const Session& session : m_others)
+        RemoveTemporaries(session.folder);
 }
 
 QStringList CRecoveryFolder::TakeOver()

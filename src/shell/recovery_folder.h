@@ -21,6 +21,9 @@ public:
 
     /// The path of a file that is not there yet, in this session's folder.
     Result<QString> NewFile();
+    /// Told of each writer. What one that was stopped leaves half done goes when none is at work.
+    void WriterStarts() { ++m_writers; }
+    void WriterEnds(bool stopped);
     /// What sessions have left over. From now on it is held by this one.
     QStringList TakeOver();
 
@@ -35,4 +38,6 @@ private:
     QString m_root;
     std::optional<Session> m_own; // made when first needed
     std::vector<Session> m_others;
+    int m_writers = 0;
+    bool m_isUntidy = false;
 };

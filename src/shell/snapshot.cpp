@@ -99,6 +99,7 @@ void CSnapshot::Write()
     }
     m_steps = 0;
     m_writer = std::move(writer.value());
+    m_folder.WriterStarts();
     if (m_writer->Ended() == -1) {
         WriterEnded();
         return;
@@ -115,6 +116,7 @@ void CSnapshot::WriterEnded()
     }
     const std::error_code answer = m_writer->Wait();
     m_writer.reset();
+    m_folder.WriterEnds(bool(answer));
     if (answer) {
         Fail(answer);
         return;
@@ -150,6 +152,7 @@ void CSnapshot::Drop()
         m_writer->Stop();
         m_writer->Wait(); // only then nothing of it comes any more
         m_writer.reset();
+        m_folder.WriterEnds(true);
     }
     if (!m_file.isEmpty())
         QFile::remove(std::exchange(m_file, QString()));

@@ -22,7 +22,7 @@ class CSnapshot : public QObject
 public:
     /// How far the file may be behind: so many steps, or so long. What a writer needs is part of ten seconds.
     static constexpr int Steps = 50;
-    static constexpr std::chrono::milliseconds Delay{7000};
+    static constexpr std::chrono::milliseconds Delay{5000};
 
     /// Both outlive it.
     CSnapshot(CKsDoc& document, CRecoveryFolder& folder, std::chrono::milliseconds delay);
