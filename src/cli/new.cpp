@@ -9,5 +9,6 @@ int New(const std::string& file)
     std::error_code error;
     if (std::filesystem::exists(std::filesystem::symlink_status(PathFromUtf8(file), error)))
         return Complain("\"" + file + "\" exists already; it was left as it is.", Exit::NotWritten);
-    return Rewrite(HD_Parameters{}, file, lock);
+    const HD_Parameters defaults;
+    return Rewrite(defaults, file, lock);
 }

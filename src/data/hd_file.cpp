@@ -13,7 +13,8 @@ Result<HD_Parameters> LoadHDFile(const std::string& path)
 std::vector<Finding> CheckHDStructure(tqlHandle structure)
 {
     LoadReport report(structure, LoadReport::Wanted::Everything);
-    HD_Parameters{}.Load(structure, &report);
+    HD_Parameters parameters; // no temporary with braces: should memory end there, the compiler destroys parts of it twice
+    parameters.Load(structure, &report);
     return report.Take();
 }
 

@@ -117,6 +117,7 @@ FileLock& FileLock::operator=(FileLock&& other) noexcept
 bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformFile& platform)
 {
     PlatformFile::Handle file = 0;
+    m_path = path; // known before the file is there, or it stays should memory end just then
     m_whyNone = platform.Open(path, PlatformFile::Purpose::Lock, file);
     if (m_whyNone)
         return true;
@@ -140,7 +141,6 @@ bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformF
     }
     m_platform = &platform;
     m_file = file;
-    m_path = path;
     if (!platform.Cut(file, 0)) // a lock without a name on it is one, too
         WriteAll(platform, file, ThisHolder(program));
     return true;

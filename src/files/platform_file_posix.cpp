@@ -3,7 +3,9 @@
 #include <algorithm>
 #include <cerrno>
 #include <cstdio>
+#include <dirent.h>
 #include <fcntl.h>
+#include <memory>
 #include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -78,11 +80,18 @@ public:
 
     std::error_code List(const Path& folder, std::vector<Path>& names) override
     {
-        std::error_code error;
-        std::filesystem::directory_iterator entry(folder, error);
-        for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error))
-            names.push_back(entry->path().filename());
-        return error;
+        // Not the standard library's iterator, which ends the program where there is no memory.
+        const std::unique_ptr<DIR, int (*)(DIR*)> entries(::opendir(folder.c_str()), &::closedir);
+        if (!entries)
+            return LastError();
+        errno = 0;
+        while (const dirent* entry = ::readdir(entries.get())) {
+            const std::string_view name = entry->d_name;
+            if (name != "." && name != "..")
+                names.emplace_back(name);
+            errno = 0;
+        }
+        return errno ? LastError() : std::error_code();
     }
 
     std::error_code CheckWritable(const Path& path) override { return Outcome(::access(path.c_str(), W_OK)); }

@@ -59,17 +59,18 @@ TemporaryFile::~TemporaryFile()
 std::error_code TemporaryFile::Create(const fs::path& folder)
 {
     std::error_code error;
-    fs::path path;
     for (int attempt = 0; attempt < 100; ++attempt) {
-        path = folder / NewName();
-        error = m_platform.Create(path, m_file);
+        m_path = folder / NewName(); // known before it is there, or it stays should memory end just then
+        error = m_platform.Create(m_path, m_file);
+        if (!error)
+            break;
+        m_path.clear();
         if (error != std::errc::file_exists)
             break;
     }
     m_isOpen = !error;
     if (error)
         return error;
-    m_path = path;
     m_platform.Lock(m_file); // where there are no locks, its age alone protects it
     return {};
 }
