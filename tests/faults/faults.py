@@ -24,6 +24,11 @@ class Point:
     def kills(self):
         return self.fault == KILL
 
+    @property
+    def keeps_files(self):
+        """Whether the program may be unable to remove what it has made."""
+        return self.kills or self.sticky or self.call == 'unlink'
+
     def code(self):
         return {KILL: -1, SHORT: -2}.get(self.fault) or getattr(errno, self.fault)
 

@@ -71,6 +71,7 @@ class Guarded:
         now = self._metadata()
         wrong += [f'{what} was {was}, is {now[what]}, and nobody is told' for what, was in self._before.items()
                   if now[what] != was and not said.strip()]
-        if litter := self._litter(may_litter):
+        # What was displaced and could not be looked at is kept, and named.
+        if litter := [name for name in self._litter(may_litter) if '.displaced-' not in name or name not in said]:
             wrong.append(f'left over: {", ".join(litter)}')
         return wrong

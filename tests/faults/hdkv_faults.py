@@ -47,7 +47,7 @@ class Runs:
             if result.returncode < 0:
                 return [f'ended by signal {-result.returncode}']
             silent = result.returncode != 0 and not result.stderr.strip()
-            found = guarded.violations(new, result.returncode == 0, said=result.stderr, may_litter=point.sticky)
+            found = guarded.violations(new, result.returncode == 0, said=result.stderr, may_litter=point.keeps_files)
             return found + silent * ['failed without a word']
         found = guarded.violations(new, None, may_litter=True)
         result, _ = self.run(command)  # and it can be said again

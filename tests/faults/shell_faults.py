@@ -58,7 +58,7 @@ class Desk:
         editor.press('ctrl+s')
         saved, said = self._outcome()
         calls = self._orders.disarm()
-        found = [] if point is None else self._guarded.violations(new, saved, said, may_litter=saved is None or point.sticky)
+        found = [] if point is None else self._guarded.violations(new, saved, said, may_litter=saved is None or point.keeps_files)
         if saved is False and not said:
             found.append('nothing is said')
         if saved is None and not point.kills:
