@@ -179,6 +179,7 @@ void CBindings::Add(CDateTimeEdit* field, HDDateTime& value)
 void CBindings::Add(QCheckBox* box, bool& value, std::function<void(bool checked)> consequences)
 {
     Add(box, &value, [box, &value] { box->setChecked(value); });
+    m_trials[box] = [&value] { value = !value; };
     if (const TextLine title = Declaration(&value).title) {
         Always([box, title] {
             const QString text = LoadLine(title.text, title.line);
@@ -243,6 +244,7 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
     int id = 0;
     for (QRadioButton* button : buttons) {
         Add(button, &value, [] {}); // shown by its group
+        m_trials[button] = [&value, other = std::int32_t(id)]() mutable { std::swap(value, other); };
         group->addButton(button, id++);
     }
     if (const Str choices = Declaration(&value).choices.text; choices != Str::None) {
@@ -287,6 +289,7 @@ bool CBindings::eventFilter(QObject* object, QEvent* event)
 void CBindings::AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets,
                         void (QWidget::*apply)(bool))
 {
+    m_conditions.push_back({rule, widgets});
     m_rules.push_back([this, rule = std::move(rule), widgets = std::vector(widgets), apply] {
         const bool holds = rule();
         for (QWidget* widget : widgets) {
@@ -322,4 +325,24 @@ bool CBindings::Take()
 bool CBindings::TakeField()
 {
     return std::all_of(m_typed.begin(), m_typed.end(), [](CTyping* typing) { return typing->TakeField(); });
+}
+
+bool CBindings::TakesFieldAway(const QObject* button) const
+{
+    const auto trial = m_trials.find(button);
+    if (trial == m_trials.end())
+        return false;
+    trial->second();
+    const auto isOf = [](const Condition& condition, const QWidget* field) {
+        return std::ranges::any_of(condition.widgets,
+                                   [field](const QWidget* w) { return w == field || w->isAncestorOf(field); });
+    };
+    const auto goes = [&](const CTyping* typing) {
+        const auto* field = qobject_cast<const QWidget*>(typing->parent());
+        return typing->IsTyped() &&
+               std::ranges::any_of(m_conditions, [&](const auto& c) { return isOf(c, field) && !c.holds(); });
+    };
+    const bool takesAway = std::ranges::any_of(m_typed, goes);
+    trial->second();
+    return takesAway;
 }

@@ -75,6 +75,9 @@ public:
     bool Take();
     /// Likewise while the page stays: a text that may wait for the page is let be.
     bool TakeField();
+    /// Whether a click on this button would disable or hide a field that is being typed into: what was typed is then
+    /// nobody's value any more.
+    bool TakesFieldAway(const QObject* button) const;
     /// How the value at this address is declared; says nothing for one that is none of the global ones.
     const Field& Declaration(const void* value) const;
     /// The control of the value at this address, of several one that can be used now; null for a value of other pages.
@@ -101,5 +104,13 @@ private:
     std::vector<Control> m_controls;
     std::vector<CTyping*> m_typed; // children of their fields
     std::vector<std::function<void()>> m_rules;
+    struct Condition // of a rule
+    {
+        std::function<bool()> holds;
+        std::vector<QWidget*> widgets;
+    };
+    std::vector<Condition> m_conditions;
+    // Gives a button's value what a click would give it; called again, what it was.
+    std::map<const QObject*, std::function<void()>> m_trials;
     std::multimap<const QWidget*, QWidget*> m_beside; // label and unit of a control
 };

@@ -245,12 +245,14 @@ bool CGenPropertyPage::event(QEvent* event)
 }
 
 /// Of buttons, boxes and lists. What is being edited is asked before one of them does anything: by the mouse, or by its
-/// letter. By the time that the field has lost the focus the click may have done its work.
+/// letter. By the time that the field has lost the focus the click may have done its work. A box that takes the field
+/// away takes what was typed there along.
 bool CGenPropertyPage::eventFilter(QObject* object, QEvent* event)
 {
     const bool acts = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick ||
                       event->type() == QEvent::Shortcut;
-    return (acts && !LeaveField()) || QWidget::eventFilter(object, event);
+    const bool mayAct = !acts || (m_bindings.TakesFieldAway(object) ? CommitGrids() : LeaveField());
+    return !mayAct || QWidget::eventFilter(object, event);
 }
 
 void CGenPropertyPage::changeEvent(QEvent* event)
