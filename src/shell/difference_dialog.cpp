@@ -58,7 +58,6 @@ CDifferenceDialog::CDifferenceDialog(const QString& name, const Differences& dif
         differences.list.size() < differences.changed + differences.added + differences.removed)
         summary += u' ' + tr("The first %1 places are listed.").arg(differences.list.size());
     auto* text = new QLabel(summary, this);
-    text->setTextFormat(Qt::PlainText);
     text->setWordWrap(true);
     const QStringList captions = tr("Section\nKeyword\nNumber\nParameter\nNow\nRecovered").split(u'\n');
     auto* table = new QTableWidget(0, int(captions.size()), this);

@@ -3,12 +3,11 @@
 
 #include <QTableWidgetItem>
 
-/// A cell that is read and selected only. Its tool tip tells the text whole, or another one; names and contents of files
-/// in it are no markup.
+/// A cell that is read and selected only. Its tool tip tells the text whole, or another one.
 inline QTableWidgetItem* PlainCell(const QString& text, const QString& toolTip = {})
 {
     auto* cell = new QTableWidgetItem(text);
     cell->setFlags(Qt::ItemIsEnabled | Qt::ItemIsSelectable);
-    cell->setToolTip(QStringLiteral("<qt>%1</qt>").arg((toolTip.isEmpty() ? text : toolTip).toHtmlEscaped()));
+    cell->setToolTip(toolTip.isEmpty() ? text : toolTip);
     return cell;
 }

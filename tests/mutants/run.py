@@ -1,9 +1,10 @@
 #!/usr/bin/python3
-"""run.py [ROOM|NUMBER...]: puts one fault after the other into the sources and sees whether a test notices.
+"""run.py [check|ROOM|NUMBER...]: puts one fault after the other into the sources and sees whether a test notices.
 
 Every fault of mutants.py replaces a text that stands in its file once; the room's test programs are built and run,
 those that are quickest first, and the file gets its own text back. A fault that no test notices has survived: a test is
 missing, or weaker than it looks. Works on build/dev, where everything is built already; by hand, for it takes a while.
+`check` only looks whether the texts are there.
 """
 import contextlib
 import os
@@ -64,8 +65,19 @@ def notices(program):
     return failed or f'{program} breaks off: ' + next((line for line in reversed(lines) if 'RUN  ' in line), '')
 
 
+def stale():
+    """The faults whose text does not stand in its file once."""
+    for room, file, text, _ in MUTANTS:
+        with open(f'{ROOT}/src/{file}', encoding='utf-8') as source:
+            if (count := source.read().count(text)) != 1:
+                yield f'{room}, {file}: {text!r} stands {count} times in the file'
+
+
 def main():
     wanted = sys.argv[1:]
+    if wanted == ['check']:
+        print(*(found := list(stale())), sep='\n')
+        return 1 if found else 0
     noticed, survived, unusable = 0, [], []
     for number, (room, file, text, wrong) in enumerate(MUTANTS, 1):
         if wanted and room not in wanted and str(number) not in wanted:
