@@ -45,7 +45,9 @@ std::string ThisHolder(std::string_view program)
 std::string ValueOf(std::string_view text, std::string_view key)
 {
     constexpr std::size_t longest = 100;
-    std::size_t begin = text.starts_with(key) ? 0 : text.find("\n" + std::string(key));
+    std::string line(1, '\n');
+    line += key;
+    std::size_t begin = text.starts_with(key) ? 0 : text.find(line);
     if (begin == std::string_view::npos)
         return {};
     begin += key.size() + (begin != 0 || text.front() == '\n');
