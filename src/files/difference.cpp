@@ -277,7 +277,8 @@ private:
         (found.kind == Difference::Changed ? m_found.changed
          : found.kind == Difference::Added ? m_found.added
                                            : m_found.removed) += lines;
-        if (m_found.list.size() >= m_most)
+        m_found.areMore = m_found.list.size() >= m_most;
+        if (m_found.areMore)
             return;
         found.line = tqlGetPosition(structure, node).line;
         m_found.list.push_back(std::move(found));

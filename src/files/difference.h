@@ -31,6 +31,7 @@ struct Differences
     std::vector<Difference> list;                    // in file order, the first of them
     std::size_t changed = 0, added = 0, removed = 0; // all: values, lines and lines
     std::size_t sections = 0;                        // in which they are
+    bool areMore = false;                            // than the list has
 
     bool IsEmpty() const { return changed + added + removed == 0; }
 };

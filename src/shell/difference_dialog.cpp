@@ -54,8 +54,7 @@ CDifferenceDialog::CDifferenceDialog(const QString& name, const Differences& dif
     setAttribute(Qt::WA_DeleteOnClose);
     setWindowTitle(tr("Recovered Changes of %1").arg(name));
     QString summary = Summary(differences);
-    if (!differences.list.empty() &&
-        differences.list.size() < differences.changed + differences.added + differences.removed)
+    if (differences.areMore)
         summary += u' ' + tr("The first %1 places are listed.").arg(differences.list.size());
     auto* text = new QLabel(summary, this);
     text->setWordWrap(true);

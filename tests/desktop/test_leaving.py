@@ -222,6 +222,20 @@ class BadText(Case):
             editor.press('alt+d')
             self.assert_told_once('9x')
 
+    def test_integer_then_buttons(self):
+        """An integer that waits for the page does not wait for what the page's buttons do."""
+        editor = self.editor
+        editor.go_to('Encroachment')
+        editor.click(editor.field('Add', 'push button'))
+        editor.fill('Maximum number', 'abc', leave=None)
+        for way in (lambda: editor.click(editor.field('Delete', 'push button')), lambda: editor.press('alt+t'),
+                    lambda: editor.press('alt+a')):
+            way()
+            self.assert_told_once('abc', 'Maximum number')
+            self.assertEqual(editor.table('').lines, 2)
+        editor.press('Escape')
+        wait_for(lambda: editor.field('Maximum number').text == '20', 'Escape reverts the field')
+
 
 class WhileTyping(Case):
     """Commands that come while a cell is being typed into lose nothing of it."""

@@ -244,14 +244,22 @@ bool CGenPropertyPage::event(QEvent* event)
     return QWidget::event(event);
 }
 
-/// Of buttons, boxes and lists. What is being edited is asked before one of them does anything: by the mouse, or by its
-/// letter. By the time that the field has lost the focus the click may have done its work. A box that takes the field
-/// away takes what was typed there along.
+/// Of buttons, boxes and lists. All that is typed on the page is asked for before one of them does anything: by the
+/// mouse, by its letter or by a key. By the time that the field has lost the focus the click may have done its work. A
+/// box that takes the field away takes what was typed there along.
 bool CGenPropertyPage::eventFilter(QObject* object, QEvent* event)
 {
-    const bool acts = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick ||
-                      event->type() == QEvent::Shortcut;
-    const bool mayAct = !acts || (m_bindings.TakesFieldAway(object) ? CommitGrids() : LeaveField());
+    const auto isAct = [event] {
+        if (event->type() != QEvent::KeyPress)
+            return event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick ||
+                   event->type() == QEvent::Shortcut;
+        const auto* pressed = static_cast<QKeyEvent*>(event);
+        const int key = pressed->key();
+        return !(pressed->modifiers() & Qt::ControlModifier) && key != Qt::Key_Tab && key != Qt::Key_Backtab &&
+               key != Qt::Key_Escape;
+    };
+    const bool mayAct =
+        !isAct() || ((m_bindings.TakesFieldAway(object) || m_bindings.Take()) && CommitGrids());
     return !mayAct || QWidget::eventFilter(object, event);
 }
 
