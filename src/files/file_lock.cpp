@@ -102,6 +102,23 @@ std::string HolderText(const LockHolder& holder)
     return text;
 }
 
+namespace {
+
+/// Whether what stands under the name of the lock was made for one. A file of the user's that is called so is left alone.
+bool IsLockFile(PlatformFile& platform, const fs::path& path, const FileStatus& status)
+{
+    if (status.kind != FileStatus::Kind::File || status.links > 1)
+        return false;
+    PlatformFile::Handle file = 0; // one of its own: it is read and then written from the start
+    if (status.size == 0 || platform.Open(path, PlatformFile::Purpose::Read, file))
+        return status.size == 0;
+    const LockHolder holder = ReadHolder(platform, file);
+    platform.Close(file);
+    return !holder.program.empty();
+}
+
+} // namespace
+
 FileLock& FileLock::operator=(FileLock&& other) noexcept
 {
     if (this == &other)
@@ -131,12 +148,13 @@ bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformF
         m_heldBy = ReadHolder(platform, file);
     else
         m_whyNone = locked;
+    const bool isOurs = !platform.StatusOf(file, opened) && IsLockFile(platform, path, opened);
     if (!locked && !m_whyNone)
-        m_whyNone = platform.Status(path, named);
+        m_whyNone = isOurs ? platform.Status(path, named) : std::make_error_code(std::errc::file_exists);
     const bool isHeld = !locked && !m_whyNone && named.IsSameFile(opened);
     if (!isHeld) {
         // Where there are no locks, a file made for one is of no use; one that holds a name may be another's.
-        if (m_whyNone && (!locked || (!platform.StatusOf(file, opened) && opened.size == 0)))
+        if (m_whyNone && isOurs && (!locked || opened.size == 0))
             platform.Remove(path);
         platform.Close(file);
         return locked || m_whyNone;
