@@ -51,9 +51,12 @@ class Guarded:
             return file.read()
 
     def _litter(self, may_litter):
-        """Names that do not belong there."""
-        return [name for name in self._listing()
-                if name not in self._names and not (may_litter and OURS.fullmatch(os.path.basename(name)))]
+        """Names that do not belong there. An empty lock that could not be looked at may be somebody else's, and stays."""
+        def is_right(name):
+            is_lock = name.endswith('.lock') and os.path.getsize(os.path.join(self.folder, name)) == 0
+            return name in self._names or is_lock or (may_litter and OURS.fullmatch(os.path.basename(name)))
+
+        return [name for name in self._listing() if not is_right(name)]
 
     def violations(self, new, saved, said='', may_litter=False):
         """What does not hold, as sentences. `new`: what the file holds when it was saved; `saved`: whether the program
@@ -72,6 +75,7 @@ class Guarded:
         wrong += [f'{what} was {was}, is {now[what]}, and nobody is told' for what, was in self._before.items()
                   if now[what] != was and not said.strip()]
         # What was displaced and could not be looked at is kept, and named.
-        if litter := [name for name in self._litter(may_litter) if '.displaced-' not in name or name not in said]:
+        if litter := [name for name in self._litter(may_litter)
+                      if '.displaced-' not in name or os.path.basename(name) not in said]:
             wrong.append(f'left over: {", ".join(litter)}')
         return wrong

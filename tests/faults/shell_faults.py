@@ -68,6 +68,13 @@ class Desk:
         self._guarded.start_over()
         return calls, found
 
+    def _bar(self):
+        """What stands above the view, when something is beside the file that was not there."""
+        if not any('.displaced-' in name for _, _, names in os.walk(self._folder) for name in names):
+            return ''
+        self._editor.settle()
+        return '\n'.join(label.text for label in self._editor.frame.all('label'))
+
     def _outcome(self):
         """Whether the program says that it has saved, and its words; None when it is no more."""
         editor, end = self._editor, time.monotonic() + PATIENCE
@@ -80,7 +87,7 @@ class Desk:
                     editor.settle()
                     return not editor.modified, '\n'.join(texts)
                 if not editor.modified:
-                    return True, editor.status()
+                    return True, editor.status() + self._bar()
         except Exception:  # it went while it was looked at
             time.sleep(1)
             if editor.process.poll() is None:
