@@ -152,6 +152,7 @@ protected:
         QTest::keyClicks(&field, text);
         QTest::keyClick(&field, Qt::Key_Tab);
         QTest::qWait(0);
+        view->page->OnKillActive(); // integers wait for the page
     }
     void DriveControls(QWidget& page, bool backwards)
     {
