@@ -26,11 +26,9 @@ void Fill(CGenList& list, int lines)
 
 void Fill(HD_Parameters& parameters, int lines)
 {
-    for (const ListEntry& entry : HDLists()) {
-        if (entry.list)
-            Fill(*entry.list(parameters), lines);
-    }
-    Fill(parameters.EncroachList.Add(), lines);
+    parameters.EncroachList.Add();
+    for (const ListEntry& entry : HDLists())
+        Fill(entry.list(parameters).ListAt(0), lines);
     // Whatever hides a grid is switched on.
     parameters.Global.EnergyEquation = true;
     parameters.Global.Leakage.IncludeLeakage = true;

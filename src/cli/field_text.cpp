@@ -54,7 +54,11 @@ public:
 private:
     Result<void> ParseField(const Field& field, void* object)
     {
-        return Visit(field, object, [&](auto&& value) { return ParseValue(field.name, value); });
+        if (Result<void> read = Visit(field, object, [&](auto&& value) { return ParseValue(field.name, value); });
+            !read || field.kind != FieldKind::Number || field.bounds.Allow(field.In<double>(object)))
+            return read;
+        return Error{std::string(field.name) + " should be " + BoundsWords(field.bounds) + ", found \"" +
+                     m_texts[m_next - 1] + '"'};
     }
 
     Result<void> ParseValue(std::string_view name, double& value)

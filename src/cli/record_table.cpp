@@ -16,7 +16,7 @@ std::size_t Width(std::string_view text)
 
 bool IsNumeric(FieldKind kind)
 {
-    return kind == FieldKind::Number || kind == FieldKind::Integer || kind == FieldKind::Choice;
+    return kind == FieldKind::Number || kind == FieldKind::Integer;
 }
 
 std::string CsvCell(const std::string& text)
@@ -39,20 +39,19 @@ void RecordTable::SetFields(std::vector<FieldList> fields)
             m_columns.push_back(&field);
 }
 
+void RecordTable::AddSection(const CListSection& section)
+{
+    m_withSet = section.HasSets();
+    SetFields({LocationFields(), section.RecordFields()});
+    for (std::size_t index = 0; index < section.ListCount(); ++index)
+        AddList(section.ListAt(index), m_withSet ? int(index + 1) : 0);
+}
+
 void RecordTable::AddList(const CGenParamListBase& list, int set)
 {
-    SetFields({LocationFields(), list.Fields()});
     m_rows.reserve(m_rows.size() + list.GetCount());
     for (std::size_t index = 0; index < list.GetCount(); ++index)
         AddRow(&list.GetAt(index), set);
-}
-
-void RecordTable::AddSets(const CGenMetaList<HDEncroach>& sets)
-{
-    m_withSet = true;
-    SetFields({LocationFields(), HDEncroach::DeclaredFields()});
-    for (std::size_t index = 0; index < sets.GetCount(); ++index)
-        AddList(sets.GetAt(index), int(index + 1));
 }
 
 void RecordTable::AddItems(GroupValue<const void> items)

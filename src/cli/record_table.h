@@ -16,13 +16,14 @@ public:
     /// `object` outlives the table. `set` is the number of the sub-list it stands in, 0 for none.
     void AddRow(const void* object, int set = 0) { m_rows.push_back({object, set}); }
 
-    void AddList(const CGenParamListBase& list, int set = 0);
-    void AddSets(const CGenMetaList<HDEncroach>& sets);
+    /// The records, with the number of their set where the section has sets.
+    void AddSection(const CListSection& section);
     void AddItems(GroupValue<const void> items);
 
     void Print(std::ostream& stream, Format format) const;
 
 private:
+    void AddList(const CGenParamListBase& list, int set);
     struct Row
     {
         const void* object;

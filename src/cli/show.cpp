@@ -29,10 +29,7 @@ bool MakeTable(const HD_Parameters& parameters, const std::string& name, RecordT
     for (const ListEntry& entry : HDLists()) {
         if (!SameIgnoringCase(entry.section, name))
             continue;
-        if (entry.constList)
-            table.AddList(*entry.constList(parameters));
-        else
-            table.AddSets(parameters.EncroachList);
+        table.AddSection(entry.constList(parameters));
         return true;
     }
     for (const DeclaredSection& section : HDGlobals().Sections()) {
@@ -66,10 +63,9 @@ std::vector<OverviewRow> Overview(const HD_Parameters& parameters)
             add(items.name, "items", ItemsOf(items, parameters).size());
     }
     for (const ListEntry& entry : HDLists()) {
-        if (entry.constList)
-            add(entry.section, "records", entry.constList(parameters)->GetCount());
-        else
-            add(entry.section, "sets", parameters.EncroachList.GetCount());
+        const CListSection& section = entry.constList(parameters);
+        add(entry.section, section.HasSets() ? "sets" : "records",
+            section.HasSets() ? section.ListCount() : section.ListAt(0).GetCount());
     }
     return rows;
 }

@@ -34,7 +34,7 @@ KVR_FIELDS(HD_Resistfact,
 
 KVR_FIELDS(HD_Wavetype,
            Number<&Self::DownstreamChainage>("DownstreamChainage", U::Chainage).Title(Str::DownstreamChainage),
-           Choice<&Self::WaveApproximation>("WaveApproximation").Title(Str::WaveApproximation).Choices(Str::WaveApproximations))
+           Integer<&Self::WaveApproximation>("WaveApproximation").Title(Str::WaveApproximation).Choices(Str::WaveApproximations))
 
 KVR_FIELDS(HD_Waterloss,
            Number<&Self::WaterLoss1>("WaterLoss1").Title(Str::WaterLosses, 0).Digits(6),
@@ -60,7 +60,7 @@ KVR_FIELDS(HDWLMark,
            PlainGroup<level, &Self::MarkLevels>("MarkLevels"))
 
 KVR_FIELDS(HDWLCurve,
-           Choice<&Self::CurveOption>("CurveOption").Title(Str::AverageRange).Choices(Str::AverageRanges),
+           Integer<&Self::CurveOption>("CurveOption").Title(Str::AverageRange).Choices(Str::AverageRanges),
            Number<&Self::CurveValue1>("CurveValue1", U::Width).Title(Str::WaterWidth),
            Number<&Self::CurveValue2>("CurveValue2", U::Radius).Title(Str::CurveRadius),
            Number<&Self::CurveValue3>("CurveValue3", U::Velocity).Title(Str::Velocity))
@@ -83,14 +83,14 @@ KVR_FIELDS(HDBedResTool,
            Group<&Self::VeloRes>("VeloRes"))
 
 KVR_FIELDS(HDEncroach,
-           Choice<&Self::EncOption1>("EncOption1").Title(titles, 0).Choices(Str::EncroachMethods, 1),
-           Choice<&Self::EncOption2>("EncOption2").Title(titles, 1).Choices(Str::EncroachBanks, 1),
+           Integer<&Self::EncOption1>("EncOption1").Title(titles, 0).Choices(Str::EncroachMethods, 1),
+           Integer<&Self::EncOption2>("EncOption2").Title(titles, 1).Choices(Str::EncroachBanks, 1),
            NumberAt<0, &Self::EncValues1>("EncValues1.1", U::Width).Title(titles, 2).Digits(6),
            NumberAt<1, &Self::EncValues1>("EncValues1.2", U::Width).Title(titles, 3).Digits(6),
            NumberAt<2, &Self::EncValues1>("EncValues1.3", U::Width).Title(titles, 4).Digits(6),
            NumberAt<3, &Self::EncValues1>("EncValues1.4", U::Width).Title(titles, 5).Digits(6),
            NumberAt<4, &Self::EncValues1>("EncValues1.5", U::Width).Title(titles, 6).Digits(6),
-           Choice<&Self::EncOption3>("EncOption3").Title(titles, 7).Choices(Str::EncroachReductions, 1),
+           Integer<&Self::EncOption3>("EncOption3").Title(titles, 7).Choices(Str::EncroachReductions, 1),
            NumberAt<0, &Self::EncValues2>("EncValues2.1").Title(titles, 8).Digits(6),
            NumberAt<1, &Self::EncValues2>("EncValues2.2").Title(titles, 9).Digits(6),
            NumberAt<2, &Self::EncValues2>("EncValues2.3").Title(titles, 10).Digits(6),

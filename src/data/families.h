@@ -1,4 +1,4 @@
-// The eighteen families of location records: their fields in file order, behind branch name and chainage. A list is
+// The families of location records: their fields in file order, behind branch name and chainage. A list is
 // stored as one keyword "DATA" a record; the field order below is the parameter order.
 #pragma once
 

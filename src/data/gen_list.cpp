@@ -72,7 +72,7 @@ HD_RiverPos* CGenList::FindByName(std::string_view text, std::size_t& position)
     return Find(position, [=](const HD_RiverPos& record) { return record.RiverName.starts_with(text); });
 }
 
-void CGenParamListBase::Save(tqlHandle structure) const
+void CGenParamListBase::Save(tqlHandle structure, bool) const
 {
     tqlAddSection(structure, m_sectionName);
     for (std::size_t index = 0; index < GetCount(); ++index)

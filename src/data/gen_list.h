@@ -11,6 +11,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 class CGenList
@@ -63,21 +64,59 @@ private:
     std::vector<std::unique_ptr<HD_RiverPos>> m_records;
 };
 
+class CGenParamListBase;
+
+/// A section of a file that holds records: a list of them, or, as sub-sections, a list of such lists.
+class CListSection
+{
+public:
+    virtual ~CListSection() = default;
+    /// Appends what occurrence `number` of the section holds; a missing one leaves everything as it is.
+    virtual void Load(tqlHandle parent, int number, LoadReport* report = nullptr) = 0;
+    /// Writes the section; of sub-sections those that are worth it, or `everySet`.
+    virtual void Save(tqlHandle structure, bool everySet = false) const = 0;
+    /// Removes the records and what else the section held.
+    virtual void Empty() = 0;
+
+    virtual const std::string& SectionName() const = 0;
+    virtual bool HasSets() const = 0; // it is a list of lists
+    virtual std::size_t ListCount() const = 0;
+    virtual FieldList RecordFields() const = 0; // after name and chainage
+    virtual const CGenParamListBase& ListAt(std::size_t index) const = 0;
+    CGenParamListBase& ListAt(std::size_t index)
+    {
+        return const_cast<CGenParamListBase&>(std::as_const(*this).ListAt(index));
+    }
+
+protected:
+    CListSection() = default;
+    CListSection(CListSection&&) = default;
+    CListSection& operator=(CListSection&&) = default;
+};
+
 /// A list that is stored as one section of keywords "DATA".
-class CGenParamListBase : public CGenList
+class CGenParamListBase : public CGenList, public CListSection
 {
 public:
     explicit CGenParamListBase(std::string sectionName) : m_sectionName(std::move(sectionName)) {}
-    const std::string& SectionName() const { return m_sectionName; }
+    const std::string& SectionName() const override { return m_sectionName; }
 
     /// Writes the section with every record, blank ones too.
-    virtual void Save(tqlHandle structure) const;
-    /// Appends the records of occurrence `number` of the section; a missing section leaves the list as it is.
-    virtual void Load(tqlHandle parent, int number, LoadReport* report = nullptr);
+    void Save(tqlHandle structure, bool everySet = false) const override;
+    void Load(tqlHandle parent, int number, LoadReport* report = nullptr) override;
+    void Empty() override
+    {
+        RemoveAll();
+        m_unknown.clear();
+    }
+    bool HasSets() const override { return false; }
+    std::size_t ListCount() const override { return 1; }
+    FieldList RecordFields() const override { return Fields(); }
+    using CListSection::ListAt;
+    const CGenParamListBase& ListAt(std::size_t) const override { return *this; }
 
     /// What the section held beside its records. It stays when the records are removed.
     const UnknownNodes& Unknown() const { return m_unknown; }
-    void ClearUnknown() { m_unknown.clear(); }
 
 private:
     std::string m_sectionName;
@@ -100,7 +139,7 @@ public:
 
 /// An owning list of lists, stored as one section of sub-sections.
 template <typename T>
-class CGenMetaList
+class CGenMetaList final : public CListSection
 {
 public:
     CGenMetaList(std::string outerSection, std::string innerSection)
@@ -108,6 +147,7 @@ public:
     {
     }
 
+    const std::string& SectionName() const override { return m_outerSection; }
     const std::string& InnerSectionName() const { return m_innerSection; }
     std::size_t GetCount() const { return m_lists.size(); }
     bool IsEmpty() const { return m_lists.empty(); }
@@ -125,8 +165,16 @@ public:
     {
         m_lists.insert(m_lists.begin() + std::ptrdiff_t(index), std::move(list));
     }
-    void RemoveAllRecords() { m_lists.clear(); }
-    void ClearUnknown() { m_unknown.clear(); }
+    void Empty() override
+    {
+        m_lists.clear();
+        m_unknown.clear();
+    }
+    bool HasSets() const override { return true; }
+    std::size_t ListCount() const override { return m_lists.size(); }
+    FieldList RecordFields() const override { return T::DeclaredFields(); }
+    using CListSection::ListAt;
+    const CGenParamListBase& ListAt(std::size_t index) const override { return *m_lists[index]; }
 
     /// A sub-list is written only when one of its records from the second on is filled (or it holds unknown content).
     static bool IsWorthKeeping(const CGenParamList<T>& list)
@@ -137,8 +185,7 @@ public:
         return !list.Unknown().empty();
     }
 
-    /// Writes the sub-lists that are worth it, or `everySet`.
-    void Save(tqlHandle structure, bool everySet = false) const
+    void Save(tqlHandle structure, bool everySet = false) const override
     {
         tqlAddSection(structure, m_outerSection);
         for (const auto& list : m_lists)
@@ -147,8 +194,7 @@ public:
         WriteUnknown(structure, m_unknown);
         tqlEndSection(structure);
     }
-    /// Appends one sub-list for each sub-section of their name.
-    void Load(tqlHandle parent, int number = 1, LoadReport* report = nullptr)
+    void Load(tqlHandle parent, int number = 1, LoadReport* report = nullptr) override
     {
         const tqlHandle outer = tqlSectionByNameNum(parent, m_outerSection, number);
         if (!outer)

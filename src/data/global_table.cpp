@@ -17,7 +17,7 @@ constexpr auto resisZone =
                  Number<&G::ZoneResistance3>("ZoneResistance3").Title(Str::FloodPlainZoneResistance)});
 constexpr DeclaredKeyword globalValues[] = {
     Number<&G::G_waterlevel>("G_waterlevel", U::WaterLevel).Title(Str::GlobalWaterLevel),
-    Choice<&G::iLevelDepth>("iLevelDepth").Choices(Str::LevelOrDepth),
+    Integer<&G::iLevelDepth>("iLevelDepth").Choices(Str::LevelOrDepth),
     Number<&G::G_discharge>("G_discharge", U::Discharge).Title(Str::GlobalDischarge),
     Number<&G::G_wind_factor>("G_wind_factor", U::Factor).Digits(3).Title(Str::GlobalWindFactor),
     Number<&G::G_resistance>("G_resistance").Title(Str::GlobalResistance),
@@ -28,7 +28,7 @@ constexpr DeclaredKeyword globalValues[] = {
     Number<&G::G_flood_plan_res>("G_flood_plan_res", U::FloodPlainResistance)
         .Digits(2)
         .Title(Str::GlobalFloodPlainResistance),
-    Choice<&G::G_wave>("G_wave").Choices(Str::WaveApproximations).Title(Str::GlobalWave),
+    Integer<&G::G_wave>("G_wave").Choices(Str::WaveApproximations).Title(Str::GlobalWave),
     {"ResisZone", resisZone},
 };
 
@@ -55,7 +55,7 @@ constexpr DeclaredKeyword defaultValues[] = {
 
 constexpr auto energyEquation =
     FieldsOf<G>({Boolean<&G::EnergyEquation>("EnergyEquation").Title(Str::EnergyEquation),
-                 Choice<&G::FrictionSlope>("FrictionSlope").Title(Str::FrictionSlope).Choices(Str::FrictionSlopes)});
+                 Integer<&G::FrictionSlope>("FrictionSlope").Title(Str::FrictionSlope).Choices(Str::FrictionSlopes)});
 constexpr auto contractExpansion =
     FieldsOf<G>({Number<&G::G_Contraction>("G_Contraction", U::Factor).Title(Str::GlobalContraction),
                  Number<&G::G_Expansion>("G_Expansion", U::Factor).Title(Str::GlobalExpansion)});
@@ -147,7 +147,7 @@ constexpr auto curve =
                  Boolean<&G::CurveIncrement, &C::SystemWidth>("SystemWidth").Title(Str::CurveSystemWidth),
                  Boolean<&G::CurveIncrement, &C::SystemRadius>("SystemRadius").Title(Str::CurveSystemRadius),
                  Boolean<&G::CurveIncrement, &C::SystemVelocity>("SystemVelocity").Title(Str::CurveSystemVelocity),
-                 Choice<&G::CurveIncrement, &C::Range>("Range").Choices(Str::AverageRanges),
+                 Integer<&G::CurveIncrement, &C::Range>("Range").Choices(Str::AverageRanges),
                  Number<&G::CurveIncrement, &C::Width>("Width", U::Width),
                  Number<&G::CurveIncrement, &C::Radius>("Radius", U::Radius),
                  Number<&G::CurveIncrement, &C::Velocity>("Velocity", U::Velocity)});
@@ -155,7 +155,7 @@ constexpr DeclaredKeyword waterLevelCurve[] = {{"WLDueToCurve", curve}};
 
 using S = HDSandBarIncrement;
 constexpr auto sand = FieldsOf<G>({Boolean<&G::SandBarIncrement, &S::Enabled>("Enabled").Title(Str::SandBarIncrement),
-                                   Choice<&G::SandBarIncrement, &S::Method>("Method").Choices(Str::SandBarMethods),
+                                   Integer<&G::SandBarIncrement, &S::Method>("Method").Choices(Str::SandBarMethods),
                                    Number<&G::SandBarIncrement, &S::Slope>("Slope", U::Slope),
                                    Number<&G::SandBarIncrement, &S::Width>("Width", U::Width),
                                    Number<&G::SandBarIncrement, &S::Area>("Area", U::Area),
@@ -184,8 +184,8 @@ constexpr DeclaredKeyword stratification[] = {
     Integer<&G::Stratification, &T::npv>("npv").Title(Str::LayerCount),
     Boolean<&G::Stratification, &T::dens>("dens").Title(Str::LayerDensities),
     Number<&G::Stratification, &T::visc>("visc", U::Viscosity).Title(Str::Viscosity),
-    Choice<&G::Stratification, &T::vmf>("vmf").Title(Str::FluidTurbulence).Choices(Str::FluidTurbulenceModels),
-    Choice<&G::Stratification, &T::vmb>("vmb").Title(Str::BedTurbulence).Choices(Str::BedTurbulenceModels),
+    Integer<&G::Stratification, &T::vmf>("vmf").Title(Str::FluidTurbulence).Choices(Str::FluidTurbulenceModels),
+    Integer<&G::Stratification, &T::vmb>("vmb").Title(Str::BedTurbulence).Choices(Str::BedTurbulenceModels),
     Boolean<&G::Stratification, &T::Rich>("Rich").Title(Str::RichardsonCorrection),
     Number<&G::Stratification, &T::bpr1>("bpr1", U::Factor).Title(Str::BaroclinicFactor),
     Number<&G::Stratification, &T::bpr2>("bpr2", U::Factor).Title(Str::BaroclinicBedSlope),
@@ -203,7 +203,7 @@ constexpr DeclaredKeyword klrParam[] = {
     Number<&G::Klr, &K::maxvelo>("maxvelo", U::Velocity).Title(Str::KlrMaxVelocity),
     Number<&G::Klr, &K::minthick>("minthick", U::WaterLevel).Title(Str::KlrMinThickness),
     Number<&G::Klr, &K::densdiff>("densdiff", U::Factor).Title(Str::KlrDensityDifference),
-    Choice<&G::Klr, &K::action>("action").Title(Str::KlrAction).Choices(Str::KlrActions),
+    Integer<&G::Klr, &K::action>("action").Title(Str::KlrAction).Choices(Str::KlrActions),
     Number<&G::Klr, &K::R1>("R1", U::Factor).Title(Str::KlrUpward),
     Number<&G::Klr, &K::R2>("R2", U::Factor).Title(Str::KlrDownward),
     Number<&G::Klr, &K::Rs>("Rs", U::Factor).Title(Str::KlrUpwardAtControls),
@@ -235,7 +235,7 @@ constexpr DeclaredKeyword textOutput[] = {
     Text<&G::TextOutput, &O::Delimiter>("Delimiter").Title(Str::SeriesDelimiter),
     Integer<&G::TextOutput, &O::ColumnWidth>("ColumnWidth").Title(Str::SeriesColumnWidth),
     {"SummaryInfo", summaryInfo},
-    Choice<&G::TextOutput, &O::GridPointOutputType>("GridPointOutputType").Choices(Str::SeriesPointChoices),
+    Integer<&G::TextOutput, &O::GridPointOutputType>("GridPointOutputType").Choices(Str::SeriesPointChoices),
     Boolean<&G::TextOutput, &O::LimitedPeriod>("LimitedPeriod").Title(Str::SeriesLimited),
     DateTime<&G::TextOutput, &O::LimitedPeriodStart>("LimitedPeriodStart").Title(Str::SeriesStart),
     DateTime<&G::TextOutput, &O::LimitedPeriodEnd>("LimitedPeriodEnd").Title(Str::SeriesEnd),
@@ -290,8 +290,8 @@ constexpr DeclaredSection sections[] = {
     {"Leakage", kept, leakage},
 };
 
-static_assert(AreOf<G>(sections));
 constexpr DeclaredSection globals{"Global_Variables", kept, {}, sections, std::size(sections)};
+static_assert(IsOf<G>(globals));
 
 } // namespace
 
@@ -304,7 +304,7 @@ FieldList CTextOutItem::DeclaredFields()
 {
     using I = CTextOutItem;
     static constexpr auto fields =
-        FieldsOf<I>({Choice<&I::Item>("Item").Title(Str::OutputItemColumns, 0).Choices(Str::OutputItems),
+        FieldsOf<I>({Integer<&I::Item>("Item").Title(Str::OutputItemColumns, 0).Choices(Str::OutputItems),
                      Text<&I::UserName>("UserName").Title(Str::OutputItemColumns, 1),
                      Integer<&I::Decimals>("Decimals").Title(Str::OutputItemColumns, 2)});
     return fields;
@@ -331,9 +331,9 @@ FieldList CMapsOutput::DeclaredFields()
          Number<&R::GridSize>("GridSize", U::GridSize).Title(titles, 3), Integer<&R::JCells>("JCells").Title(titles, 4),
          Integer<&R::KCells>("KCells").Title(titles, 5), Integer<&R::Reserved>("Reserved"),
          ::FileName<&R::FileName>("FileName").Title(titles, 6),
-         Choice<&R::Type>("Type").Title(titles, 8).Choices(Str::MapTypes),
+         Integer<&R::Type>("Type").Title(titles, 8).Choices(Str::MapTypes),
          Integer<&R::StoringFrequency>("StoringFrequency").Title(titles, 11),
-         Choice<&R::Item>("Item").Title(titles, 9).Choices(Str::MapItems),
+         Integer<&R::Item>("Item").Title(titles, 9).Choices(Str::MapItems),
          Integer<&R::ComponentNo>("ComponentNo").Title(titles, 10),
          Boolean<&R::DefaultPeriod>("DefaultPeriod").Title(titles, 12),
          DateTime<&R::StartTime>("StartTime").Title(titles, 13), DateTime<&R::EndTime>("EndTime").Title(titles, 14)});

@@ -7,8 +7,8 @@ namespace {
 template <auto List>
 constexpr ListEntry Entry(const char* section, bool purgedAtSave)
 {
-    return {section, purgedAtSave, [](HD_Parameters& parameters) -> CGenParamListBase* { return &(parameters.*List); },
-            [](const HD_Parameters& parameters) -> const CGenParamListBase* { return &(parameters.*List); }};
+    return {section, purgedAtSave, [](HD_Parameters& parameters) -> CListSection& { return parameters.*List; },
+            [](const HD_Parameters& parameters) -> const CListSection& { return parameters.*List; }};
 }
 
 using P = HD_Parameters;
@@ -24,7 +24,7 @@ constexpr ListEntry lists[] = {
     Entry<&P::BedResistanceToolboxList>("BedResistanceToolboxList", true),
     Entry<&P::WLCurveList>("WLCurveList", false),
     Entry<&P::WLSandBarsList>("WLSandBarsList", false),
-    {"Enc_Simulation", false, nullptr, nullptr},
+    Entry<&P::EncroachList>("Enc_Simulation", false),
     Entry<&P::KlrParamList>("KlrParamList", true),
     Entry<&P::KlrInitList>("KlrInitList", true),
     Entry<&P::QSSContractionExpansionList>("QSSContractionExpansionList", true),
@@ -48,12 +48,8 @@ void HD_Parameters::Load(tqlHandle structure, LoadReport* report)
         report = nullptr; // that says it all
     }
     Global.Load(target, report);
-    for (const ListEntry& entry : lists) {
-        if (entry.list)
-            entry.list(*this)->Load(target, 1, report);
-        else
-            EncroachList.Load(target, 1, report);
-    }
+    for (const ListEntry& entry : lists)
+        entry.list(*this).Load(target, 1, report);
     const auto first = [](bool known) { return known ? Known::First : Known::No; };
     const auto knownSection = [&](std::string_view name, bool isSection) {
         return first(isSection && (name == HDGlobals().name ||
@@ -68,12 +64,8 @@ void HD_Parameters::Save(tqlHandle structure, bool everySet) const
 {
     tqlAddTarget(structure, HDTargetName);
     Global.Save(structure);
-    for (const ListEntry& entry : lists) {
-        if (entry.constList)
-            entry.constList(*this)->Save(structure);
-        else
-            EncroachList.Save(structure, everySet);
-    }
+    for (const ListEntry& entry : lists)
+        entry.constList(*this).Save(structure, everySet);
     WriteUnknown(structure, Unknown.InTarget);
     tqlEndSection(structure);
     WriteUnknownTargets(structure, Unknown.Targets);
@@ -81,15 +73,8 @@ void HD_Parameters::Save(tqlHandle structure, bool everySet) const
 
 void HD_Parameters::RemoveAllRecords()
 {
-    for (const ListEntry& entry : lists) {
-        if (entry.list) {
-            entry.list(*this)->RemoveAll();
-            entry.list(*this)->ClearUnknown();
-        } else {
-            EncroachList.RemoveAllRecords();
-            EncroachList.ClearUnknown();
-        }
-    }
+    for (const ListEntry& entry : lists)
+        entry.list(*this).Empty();
     Global.ClearUnknown();
     Unknown.Clear();
 }
@@ -97,6 +82,10 @@ void HD_Parameters::RemoveAllRecords()
 bool HD_Parameters::RemoveIncompleteLines(bool& asked, const std::function<bool()>& ask)
 {
     return std::ranges::all_of(lists, [&](const ListEntry& entry) {
-        return !entry.purgedAtSave || entry.list(*this)->RemoveIncompleteLines(asked, ask);
+        CListSection& section = entry.list(*this);
+        bool agreed = true;
+        for (std::size_t i = 0; entry.purgedAtSave && agreed && i < section.ListCount(); ++i)
+            agreed = section.ListAt(i).RemoveIncompleteLines(asked, ask);
+        return agreed;
     });
 }

@@ -1,4 +1,4 @@
-// Everything one HD parameter file holds: the global values, the eighteen lists in file order, and what the tables of
+// Everything one HD parameter file holds: the global values, the lists in file order, and what the tables of
 // this version do not know.
 #pragma once
 
@@ -40,7 +40,7 @@ struct HD_Parameters
     void Save(tqlHandle structure, bool everySet = false) const;
     /// Empties all lists and the unknown content; the global values stay.
     void RemoveAllRecords();
-    /// Removes blank records from the thirteen lists that are cleaned at save; false when `ask` refused.
+    /// Removes blank records from the lists that are cleaned at save; false when `ask` refused.
     bool RemoveIncompleteLines(bool& asked, const std::function<bool()>& ask = {});
 };
 
@@ -49,8 +49,7 @@ struct ListEntry
 {
     const char* section;
     bool purgedAtSave; // incomplete lines are removed when the document is saved
-    // Null for the encroachment set-ups, a list of lists.
-    CGenParamListBase* (*list)(HD_Parameters&);
-    const CGenParamListBase* (*constList)(const HD_Parameters&);
+    CListSection& (*list)(HD_Parameters&);
+    const CListSection& (*constList)(const HD_Parameters&);
 };
 std::span<const ListEntry> HDLists();

@@ -139,7 +139,7 @@ Result<std::string> CKavo0_hdDoc::ContentText() const
 {
     std::string text = HDFileText(m_parameters, true);
     if (text.empty())
-        return Error{"The content cannot be expressed in a parameter file."};
+        return NoText();
     return text;
 }
 

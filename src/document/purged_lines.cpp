@@ -10,12 +10,15 @@ CPurgedLines::CPurgedLines(CKavo0_hdDoc& document) : CDocumentCommand(document, 
     for (const ListEntry& entry : HDLists()) {
         if (!entry.purgedAtSave)
             continue;
-        Lines lines{entry.list(document.Parameters()), {}, {}};
-        for (std::size_t row = 0; row < lines.list->GetCount(); ++row)
-            if (lines.list->GetAt(row).IsBlank())
-                lines.rows.push_back(row);
-        if (!lines.rows.empty())
-            m_lists.push_back(std::move(lines));
+        CListSection& section = entry.list(document.Parameters());
+        for (std::size_t i = 0; i < section.ListCount(); ++i) {
+            Lines lines{&section.ListAt(i), {}, {}};
+            for (std::size_t row = 0; row < lines.list->GetCount(); ++row)
+                if (lines.list->GetAt(row).IsBlank())
+                    lines.rows.push_back(row);
+            if (!lines.rows.empty())
+                m_lists.push_back(std::move(lines));
+        }
     }
     for (const auto& shown : document.RowsShown()) {
         Rows table{shown.rows, {}, {}, shown.oneDropped, shown.manyDropped};

@@ -11,6 +11,7 @@
 
 #include <array>
 #include <concepts>
+#include <cstdlib>
 #include <utility>
 
 namespace field_detail {
@@ -99,6 +100,7 @@ constexpr GroupAccess MakeAccess()
 {
     using Element = typename Container::value_type;
     GroupAccess access{
+        .owner = &Tag<Element>,
         .elements = Elements,
         .size = [](const void* container) { return static_cast<const Container*>(container)->size(); },
         .resize = [](void* container, std::size_t count) { static_cast<Container*>(container)->resize(count); },
@@ -140,12 +142,16 @@ inline const Field* FindField(FieldList fields, const void* object, const void* 
             return &field;
     return nullptr;
 }
-/// The declaration of a member, which has to have one.
+/// The declaration of a member; one without ends the program.
 template <typename Class, typename T>
 const Field& FieldOf(T Class::*member)
 {
     static const Class object{};
-    return *FindField(Class::DeclaredFields(), static_cast<const PassedAs<Class>*>(&object), &(object.*member));
+    const Field* const field =
+        FindField(Class::DeclaredFields(), static_cast<const PassedAs<Class>*>(&object), &(object.*member));
+    if (!field)
+        std::abort();
+    return *field;
 }
 
 /// That a path of members leads to a value of the type.
@@ -158,17 +164,21 @@ constexpr Field Number(std::string_view name, UnitGroup unit = UnitGroup::None)
 {
     return field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Number, name, unit);
 }
+/// A number that is reached by `Way::Of(object)`, where its class gives no member; `Way::Class` is that class.
+template <typename Way>
+requires requires(typename Way::Class& object)
+{
+    { Way::Of(object) } -> std::same_as<double&>;
+}
+constexpr Field NumberBy(std::string_view name, UnitGroup unit = UnitGroup::None)
+{
+    return field_detail::Declare<Way>(FieldKind::Number, name, unit);
+}
 template <auto... Path>
 requires LeadsTo<std::int32_t, Path...>
 constexpr Field Integer(std::string_view name)
 {
     return field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Integer, name);
-}
-template <auto... Path>
-requires LeadsTo<std::int32_t, Path...>
-constexpr Field Choice(std::string_view name)
-{
-    return field_detail::Declare<field_detail::Path<Path...>>(FieldKind::Choice, name);
 }
 template <auto... Path>
 requires LeadsTo<bool, Path...>

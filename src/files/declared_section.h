@@ -63,6 +63,7 @@ struct KeptContent
 /// How an object is asked for that.
 struct KeptAccess
 {
+    const void* owner; // the tag of the object's class
     KeptContent& (*of)(void* object);
     const KeptContent& (*constOf)(const void* object);
 };
@@ -70,7 +71,7 @@ template <auto Member>
 constexpr KeptAccess Keeps()
 {
     using Class = typename field_detail::MemberOf<decltype(Member)>::Class;
-    return {[](void* object) -> KeptContent& { return static_cast<Class*>(object)->*Member; },
+    return {&field_detail::Tag<Class>, [](void* object) -> KeptContent& { return static_cast<Class*>(object)->*Member; },
             [](const void* object) -> const KeptContent& { return static_cast<const Class*>(object)->*Member; }};
 }
 
@@ -89,19 +90,35 @@ struct DeclaredSection
     constexpr std::span<const DeclaredSection> Sections() const { return {sections, sectionCount}; }
 };
 
-/// Whether all that the sections are read into is a class's own. A group's elements are checked where it is declared.
-template <typename Class>
-consteval bool AreOf(std::span<const DeclaredSection> sections)
+namespace field_detail {
+
+consteval bool IsOf(const void* owner, const DeclaredSection& section)
 {
-    for (const DeclaredSection& section : sections) {
-        for (const DeclaredKeyword& keyword : section.keywords)
-            for (const Field& field : keyword.Fields())
-                if (field.owner != &field_detail::Tag<Class>)
-                    return false;
-        if (!AreOf<Class>(section.Sections()))
+    if (section.each) {
+        if (section.each->owner != owner)
             return false;
+        owner = section.each->group->owner;
     }
+    if (section.kept.owner != owner)
+        return false;
+    for (const DeclaredKeyword& keyword : section.keywords)
+        for (const Field& field : keyword.Fields())
+            if (field.owner != owner)
+                return false;
+    for (const DeclaredSection& inner : section.Sections())
+        if (!IsOf(owner, inner))
+            return false;
     return true;
+}
+
+} // namespace field_detail
+
+/// Whether all that a section is read into is a class's own, and what stands in sections of a group that of its
+/// elements' class. The elements of other groups are checked where they are declared.
+template <typename Class>
+consteval bool IsOf(const DeclaredSection& section)
+{
+    return field_detail::IsOf(&field_detail::Tag<Class>, section);
 }
 
 /// Reads a section of `parent`, where there is one, into the object, and keeps everything: a value that is no finite

@@ -41,8 +41,7 @@ public:
 enum class FieldKind
 {
     Number,   // double, in the base unit of its group
-    Integer,  // std::int32_t
-    Choice,   // std::int32_t, an index into a list of texts
+    Integer,  // std::int32_t; with choices an index into a list of texts
     Boolean,  // bool
     Text,     // std::string
     FileName, // std::string
@@ -56,6 +55,7 @@ using FieldList = std::span<const Field>;
 /// How the elements of a repeated group are reached. `container` is the address that Field::address gives.
 struct GroupAccess
 {
+    const void* owner;       // the tag of the elements' class
     FieldList (*elements)(); // fields of one element, in file order
     std::size_t (*size)(const void* container);
     void (*resize)(void* container, std::size_t count);
@@ -152,7 +152,7 @@ struct Field
     bool mayBeUnknown = false; // a number: not a number stands for one that is not known
     bool padWhenEmpty = false; // an empty group is followed by one element with default values
     TextLine title{};
-    TextLine choices{};           // the texts of the indices, one a line; for a text what it may be
+    TextLine choices{};           // the texts of an integer's indices, one a line; for a text what it may be
     std::int32_t firstChoice = 0; // the index of the first of them
     int digits = 0;               // significant ones, where a number is shown; 0 for the usual
     Bounds bounds{};
@@ -173,6 +173,8 @@ struct Field
     }
     constexpr Field Range(std::optional<double> least, std::optional<double> most = {}) const
     {
+        if (kind != FieldKind::Number)
+            throw "bounds of what is no number";
         return With(&Field::bounds, {least, most});
     }
     constexpr Field Digits(int significant) const { return With(&Field::digits, significant); }
@@ -216,7 +218,6 @@ decltype(auto) VisitKind(FieldKind kind, Visitor&& visit)
     case FieldKind::Number:
         return visit(std::type_identity<double>{});
     case FieldKind::Integer:
-    case FieldKind::Choice:
         return visit(std::type_identity<std::int32_t>{});
     case FieldKind::Boolean:
         return visit(std::type_identity<bool>{});

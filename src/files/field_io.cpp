@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <bit>
+#include <charconv>
 
 namespace {
 
@@ -76,6 +77,18 @@ std::string ParamsText(FieldList fields, const void* object)
     std::string text(tqlGetText(structure.Get()));
     text.erase(0, text.find(mark) + mark.size());
     return text.substr(0, text.find('\n'));
+}
+
+std::string BoundsWords(const Bounds& bounds)
+{
+    const auto append = [](std::string text, double value) {
+        char number[32];
+        return text.append(number, std::to_chars(number, number + sizeof number, value).ptr);
+    };
+    const auto& [minimum, maximum] = bounds;
+    if (minimum && maximum)
+        return append(append({}, *minimum) + " to ", *maximum);
+    return minimum ? append("at least ", *minimum) : maximum ? append("at most ", *maximum) : std::string();
 }
 
 void WriteFields(tqlHandle structure, FieldList fields, const void* object)

@@ -59,5 +59,8 @@ std::string ParamsText(FieldList fields, const void* object);
 /// Appends the object's parameters to the keyword being written.
 void WriteFields(tqlHandle structure, FieldList fields, const void* object);
 
+/// "0.5 to 1", "at least 0", "at most 1", in base units; empty without bounds.
+std::string BoundsWords(const Bounds& bounds);
+
 /// Whether all fields are equal, numbers to the last bit.
 bool SameFields(FieldList fields, const void* a, const void* b);

@@ -28,18 +28,21 @@ Result<TqlStructure> ParseText(std::string text, const std::string& name)
     return Checked(TqlStructure(tqlLoadText(std::move(text), name)), nullptr);
 }
 
+Error NoText(const std::string& path)
+{
+    constexpr const char* why = "content cannot be expressed in a parameter file.";
+    return {path.empty() ? std::string("The ").append(why)
+                         : std::string("Could not write \"").append(path).append("\": the ").append(why)};
+}
+
 Result<std::string> TextOf(tqlHandle built)
 {
     const std::string_view text = tqlGetText(built);
-    if (text.empty()) // the library refuses what no reader could take back
-        return Error{"The content cannot be expressed in a parameter file."};
-    return std::string(text);
+    return text.empty() ? Result<std::string>(NoText()) : std::string(text);
 }
 
 Result<WriteReport> SaveStructure(tqlHandle built, const std::string& path, const SafeFileOptions& options)
 {
     const std::string_view text = tqlGetText(built);
-    if (text.empty()) // the library refuses what no reader could take back
-        return Error{"Could not write \"" + path + "\": the content cannot be expressed in a parameter file."};
-    return WriteFileSafely(path, text, options);
+    return text.empty() ? NoText(path) : WriteFileSafely(path, text, options);
 }

@@ -38,6 +38,9 @@ Result<TqlStructure> ParseFile(const std::string& path, TqlSyntaxError* report =
 /// Likewise a text; `name` stands for the file in messages.
 Result<TqlStructure> ParseText(std::string text, const std::string& name);
 
+/// The error of content that no reader could take back, so that the library makes no text of it. `path`: of the file
+/// that is not written therefore.
+Error NoText(const std::string& path = {});
 /// The text of what was built; an error when no file can hold it.
 Result<std::string> TextOf(tqlHandle built);
 /// Puts what was built into the place of a file (safe_file.h).

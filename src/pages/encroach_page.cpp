@@ -151,7 +151,7 @@ void CEncroachPage::DeclareColumns()
                                [name = field.name] {
                                    return LoadString(Str::StoredAs).arg(QString::fromLatin1(name.data(), name.size()));
                                }};
-        if (field.kind == FieldKind::Choice) {
+        if (field.choices) {
             options.width = 130;
             options.choices = {.whenEmptied = field.firstChoice};
         }

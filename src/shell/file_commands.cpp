@@ -2,6 +2,7 @@
 
 #include "files/extensions.h"
 #include "ks/fc/file_dialog.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
 #include "shell/plugin_loader.h"
@@ -17,13 +18,12 @@ namespace {
 
 bool IsProject(const QString& path)
 {
-    return path.endsWith(QLatin1String(ProjectExtension), Qt::CaseInsensitive);
+    return KsHasExtension(path, QString::fromLatin1(ProjectExtension));
 }
 
 QString ProjectFilter()
 {
-    const QString extension = QString::fromLatin1(ProjectExtension);
-    return CFileCommands::tr("Projects") + QStringLiteral(" (*%1 *%2)").arg(extension, extension.toUpper());
+    return KsFileFilter(CFileCommands::tr("Projects"), QString::fromLatin1(ProjectExtension));
 }
 
 } // namespace

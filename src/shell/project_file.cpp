@@ -14,6 +14,7 @@ constexpr DeclaredSection sections[] = {
     {.name = MembersName, .kept = Keeps<&P::kept>(), .keywords = memberKeywords, .required = true}};
 constexpr DeclaredSection file{
     .name = TargetName, .kept = Keeps<&P::kept>(), .sections = sections, .sectionCount = std::size(sections)};
+static_assert(IsOf<P>(file));
 
 } // namespace
 

@@ -109,6 +109,8 @@ TEST_F(Hdkv, ExitCodesAndMessages)
         {"set a.hdkv G_wave 1 2", 2, "", "takes 1 value, 2 were given"},
         {"set a.hdkv ResisZone 1 2", 2, "", "ZoneResistance2 is missing"},
         {"set a.hdkv G_f 1e400", 2, "", "should be a number"},
+        {"set a.hdkv delta 0.4999", 2, "", "delta should be 0.5 to 1, found \"0.4999\""},
+        {"set a.hdkv zeta_min -- -1", 2, "", "zeta_min should be at least 0, found \"-1\""},
         {"set a.hdkv MarkTitles 2 A", 2, "", "does not fit the 1 values behind it"},
         {"set a.hdkv LimitedPeriodStart 2024 2 30 0 0 0", 2, "", "found 2024-02-30 00:00:00"},
         {"set a.hdkv G_f --loud", 2, "", "no option --loud"},
@@ -183,7 +185,7 @@ TEST_F(Hdkv, SetThenGet)
     {
         const char *keyword, *values, *printed;
     } cases[] = {{"G_flood_plan_res", "-98.5", "-98.5\n"},
-                 {"delta", "-1e-5", "-1e-05\n"},
+                 {"alpha", "-1e-5", "-1e-05\n"},
                  {"wind_shear_stress", "true", "true\n"},
                  {"Defalt_Values/theta", "0.1", "0.1\n"},
                  {"ResisZone", "2 -1 nan inf", "2\n-1\nnan\ninf\n"},

@@ -1,4 +1,5 @@
 // The tables of docs/hdkv.md are what the declarations say. KVR_UPDATE_DOCS=1 writes them anew.
+#include "files/field_io.h"
 #include "hd_support.h"
 #include "texts/text_numbers.h"
 
@@ -22,16 +23,7 @@ std::string EnglishText(Str number)
 /// " (0.5 to 1)", " (0 Max, 1 Min, 2 Dynamic)": what is known about a value beyond its type.
 std::string Values(const Field& field)
 {
-    const auto number = [](double value) {
-        std::ostringstream text;
-        text << value;
-        return text.str();
-    };
-    std::string known;
-    if (const auto& [minimum, maximum] = field.bounds; minimum || maximum)
-        known = !maximum   ? "at least " + number(*minimum)
-                : !minimum ? "at most " + number(*maximum)
-                           : number(*minimum) + " to " + number(*maximum);
+    std::string known = BoundsWords(field.bounds);
     std::istringstream entries(EnglishText(field.choices.text));
     std::int32_t index = field.firstChoice;
     for (std::string entry; std::getline(entries, entry); ++index) {
@@ -53,6 +45,17 @@ std::string Title(const Field& field)
     return title.empty() ? "" : " \"" + PlainText(title) + '"';
 }
 
+const char* TypeName(FieldKind kind)
+{
+    const char* const text = kind == FieldKind::FileName ? "file name" : "string";
+    return VisitKind(kind, Overloads{[](std::type_identity<double>) { return "float"; },
+                                     [](std::type_identity<std::int32_t>) { return "integer"; },
+                                     [](std::type_identity<bool>) { return "boolean"; },
+                                     [=](std::type_identity<std::string>) { return text; },
+                                     [](std::type_identity<HDDateTime>) { return "6 integers"; },
+                                     [](std::type_identity<GroupType>) { return "group"; }});
+}
+
 std::string Described(FieldList fields, std::string_view keyword);
 
 std::string Described(const Field& field, std::string_view keyword)
@@ -61,8 +64,7 @@ std::string Described(const Field& field, std::string_view keyword)
         const std::string text = "count N, then N x (" + Described(field.group->elements(), {}) + ')';
         return field.padWhenEmpty ? text + "; one empty element when N is 0" : text;
     }
-    constexpr const char* kinds[] = {"float", "integer", "integer", "boolean", "string", "file name", "6 integers"};
-    std::string text = kinds[int(field.kind)];
+    std::string text = TypeName(field.kind);
     if (field.name != keyword)
         text += ' ' + std::string(field.name);
     return text + (field.optionalTail ? "?" : "") + Title(field) + Values(field);
@@ -105,9 +107,10 @@ std::string GlobalTable()
 std::string ListTable()
 {
     HD_Parameters parameters;
+    parameters.EncroachList.Add();
     std::string table = "| Section | Parameters behind branch name and chainage | Default |\n|---|---|---|\n";
     for (const ListEntry& entry : HDLists()) {
-        CGenParamListBase& list = entry.list ? *entry.list(parameters) : parameters.EncroachList.Add();
+        const CGenParamListBase& list = entry.list(parameters).ListAt(0);
         table += "| `" + std::string(entry.section) + "` | " + Described(list.Fields(), {}) + " | " +
                  Default(list.Fields(), list.NewRecord().get()) + " |\n";
     }

@@ -34,10 +34,6 @@ constexpr int Kinds()
     }
     +requires
     {
-        Choice<Path...>("x");
-    }
-    +requires
-    {
         Boolean<Path...>("x");
     }
     +requires
@@ -56,7 +52,7 @@ constexpr int Kinds()
 
 // A kind takes members of its type only.
 static_assert(Kinds<&Sample::number>() == 1 && requires { Number<&Sample::number>("x"); });
-static_assert(Kinds<&Sample::integer>() == 2 && requires { Integer<&Sample::integer>("x"); });
+static_assert(Kinds<&Sample::integer>() == 1 && requires { Integer<&Sample::integer>("x"); });
 static_assert(Kinds<&Sample::flag>() == 1 && requires { Boolean<&Sample::flag>("x"); });
 static_assert(Kinds<&Sample::text>() == 2 && requires { Text<&Sample::text>("x"); });
 static_assert(Kinds<&Sample::time>() == 1 && requires { DateTime<&Sample::time>("x"); });

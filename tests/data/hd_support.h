@@ -79,10 +79,8 @@ template <typename Visit>
 void ForEachList(HD_Parameters& a, HD_Parameters& b, Visit visit)
 {
     for (const ListEntry& entry : HDLists())
-        if (entry.list)
-            visit(entry.section, *entry.list(a), *entry.list(b));
-    for (std::size_t i = 0; i < std::min(a.EncroachList.GetCount(), b.EncroachList.GetCount()); ++i)
-        visit("Encroachment_Setup", a.EncroachList.GetAt(i), b.EncroachList.GetAt(i));
+        for (std::size_t i = 0; i < std::min(entry.list(a).ListCount(), entry.list(b).ListCount()); ++i)
+            visit(entry.list(a).ListAt(i).SectionName().c_str(), entry.list(a).ListAt(i), entry.list(b).ListAt(i));
 }
 
 class FolderTest : public testing::Test

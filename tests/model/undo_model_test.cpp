@@ -62,18 +62,14 @@ protected:
     CString WriteRiver() const
     {
         HD_Parameters parameters;
+        parameters.EncroachList.Add();
         for (const ListEntry& entry : HDLists())
-            for (int line = 0; entry.list && line < 3; ++line) {
-                HD_RiverPos& record = entry.list(parameters)->AddTail(entry.list(parameters)->NewRecord());
+            for (int line = 0; line < 3; ++line) {
+                CGenList& list = entry.list(parameters).ListAt(0);
+                HD_RiverPos& record = list.AddTail(list.NewRecord());
                 record.RiverName = line == 2 ? "SIDE" : "MAIN";
                 record.Chainage = 100 * line + 0.125;
             }
-        auto& setup = parameters.EncroachList.Add();
-        for (int line = 0; line < 2; ++line) {
-            HD_RiverPos& record = setup.Add();
-            record.RiverName = "MAIN";
-            record.Chainage = line;
-        }
         HD_Global_Var& globals = parameters.Global;
         globals.MarkTitles = {"BANK", "", "ALARM"};
         globals.MarkInterpolate = {true, false, false};

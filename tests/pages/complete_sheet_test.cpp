@@ -23,7 +23,7 @@ void Change(const Field& field, void* object, int& seed)
     Visit(field, object,
           Overloads{[&](double& value) { value += 0.25 + seed; },
                     [&](std::int32_t& value) {
-                        value = field.kind == FieldKind::Integer ? value + seed : value == 1 ? 2 : 1;
+                        value = !field.choices ? value + seed : value == 1 ? 2 : 1;
                     },
                     [](bool& value) { value = !value; },
                     [&](std::string& value) { value = "TEXT " + std::to_string(seed); },
@@ -57,6 +57,7 @@ void ChangeEverything(HD_Parameters& parameters)
     // What an increment, a map or a period needs so that its other cells are open.
     parameters.Global.MapOutput.MapOutputFiles[0].Type = 2;
     parameters.Global.MapOutput.MapOutputFiles[0].Item = 4;
+    parameters.Global.BedResist.Method = 9; // what no method is called uses all of its values
 }
 
 /// "Section/keyword parameter", for a line of a file's text. Lists of lines are one name: the first line stands for

@@ -121,8 +121,8 @@ TEST_F(CorePagesTest, VisitingANewFileLeavesNoLineInTheListsThatASaveCleans)
     EXPECT_EQ(document.UndoStack().count(), 0);
     Saved(document, "new.HDKV");
     for (const ListEntry& entry : HDLists())
-        if (!entry.purgedAtSave && entry.list)
-            entry.list(document.Parameters())->RemoveAll();
+        if (CListSection& section = entry.list(document.Parameters()); !entry.purgedAtSave && !section.HasSets())
+            section.ListAt(0).RemoveAll();
     EXPECT_EQ(Text(), before);
 }
 

@@ -27,16 +27,16 @@ constexpr auto sectionFields = FieldsOf<C>(
      Number<&C::chainage>("Chainage", U::Chainage).Title(QT_TRANSLATE_NOOP("SectionTables", "Chainage")),
      Number<&C::radius>("Radius", U::Radius).MayBeUnknown().Title(QT_TRANSLATE_NOOP("SectionTables", "Radius")),
      Number<&C::width>("Width", U::Width).MayBeUnknown().Range(0).Title(QT_TRANSLATE_NOOP("SectionTables", "Width"))});
-constexpr FieldList FieldOf(std::size_t index)
+constexpr FieldList FieldAt(std::size_t index)
 {
     return FieldList(sectionFields).subspan(index, 1);
 }
 constexpr auto points = FieldsOf<C>({Group<&C::points>("Point")});
-constexpr DeclaredKeyword sectionKeywords[] = {{BranchKeyword, FieldOf(0), Presence::Optional}, // a rule asks for it
-                                               {TopoIdKeyword, FieldOf(1), Presence::Optional},
-                                               {"Chainage", FieldOf(2)},
-                                               {"Radius", FieldOf(3), Presence::Optional},
-                                               {WidthKeyword, FieldOf(4), Presence::Optional}};
+constexpr DeclaredKeyword sectionKeywords[] = {{BranchKeyword, FieldAt(0), Presence::Optional}, // a rule asks for it
+                                               {TopoIdKeyword, FieldAt(1), Presence::Optional},
+                                               {"Chainage", FieldAt(2)},
+                                               {"Radius", FieldAt(3), Presence::Optional},
+                                               {WidthKeyword, FieldAt(4), Presence::Optional}};
 constexpr DeclaredKeyword profileKeywords[] = {{PointKeyword, points, Presence::EachLine}};
 constexpr DeclaredSection sectionSections[] = {
     {.name = ProfileName, .kept = Keeps<&C::kept>(), .keywords = profileKeywords}};
@@ -52,6 +52,7 @@ constexpr DeclaredSection file{.name = "KVR_CROSS_SECTIONS",
                                .kept = Keeps<&S::kept>(),
                                .sections = targetSections,
                                .sectionCount = std::size(targetSections)};
+static_assert(IsOf<S>(file));
 
 /// What a section has to fulfil beside its declaration: it is made to, and that is reported.
 void Mend(CCrossSection& section, tqlHandle node, LoadReport& report)
@@ -68,11 +69,11 @@ void Mend(CCrossSection& section, tqlHandle node, LoadReport& report)
         }
         case CSectionFault::Width:
             section.width = KsUnset;
-            ReportRule(report, node, WidthKeyword, 1, ParamsText(FieldOf(4), &section), rule);
+            ReportRule(report, node, WidthKeyword, 1, ParamsText(FieldAt(4), &section), rule);
             break;
         default:
             section.branch = NoBranch;
-            ReportRule(report, node, BranchKeyword, 1, ParamsText(FieldOf(0), &section), rule);
+            ReportRule(report, node, BranchKeyword, 1, ParamsText(FieldAt(0), &section), rule);
         }
     }
 }
@@ -90,7 +91,7 @@ void MendKey(CCrossSection& section, const Keys& taken, Numbers& numbers, tqlHan
     do
         section.topoId = same.topoId + '-' + std::to_string(++number);
     while (taken.contains(section.Key()));
-    ReportRule(report, node, TopoIdKeyword, 1, ParamsText(FieldOf(1), &section),
+    ReportRule(report, node, TopoIdKeyword, 1, ParamsText(FieldAt(1), &section),
                [same] { return WhyTaken(same).toStdString(); });
 }
 

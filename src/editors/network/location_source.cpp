@@ -12,7 +12,7 @@ namespace {
 
 bool IsHDView(const CView* view)
 {
-    return view->GetDocument()->GetPathName().endsWith(QLatin1String(HDExtension), Qt::CaseInsensitive);
+    return KsHasExtension(view->GetDocument()->GetPathName(), QString::fromLatin1(HDExtension));
 }
 
 /// A line that the user has not completed is no location.

@@ -27,7 +27,7 @@ struct CoordinateOf
 template <std::size_t index>
 constexpr Field Coordinate(std::string_view name)
 {
-    return field_detail::Declare<CoordinateOf<index>>(FieldKind::Number, name, U::Coordinate);
+    return NumberBy<CoordinateOf<index>>(name, U::Coordinate);
 }
 FieldList VertexFields()
 {
@@ -73,6 +73,7 @@ constexpr DeclaredSection file{.name = "KVR_NETWORK",
                                .keywords = networkKeywords,
                                .sections = networkSections,
                                .sectionCount = std::size(networkSections)};
+static_assert(IsOf<W>(file));
 
 constexpr const char* NoName = "BRANCH"; // of a branch that the file does not name
 

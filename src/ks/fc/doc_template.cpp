@@ -58,15 +58,12 @@ CString CMultiDocTemplate::GetDocString(DocStringIndex index) const
 
 bool CMultiDocTemplate::MatchesExtension(const CString& path) const
 {
-    const CString extension = GetDocString(filterExt);
-    return !extension.isEmpty() && path.endsWith(extension, Qt::CaseInsensitive);
+    return KsHasExtension(path, GetDocString(filterExt));
 }
 
 CString CMultiDocTemplate::FileDialogFilter() const
 {
-    const CString extension = GetDocString(filterExt);
-    const CString name = GetDocString(filterName).section(QStringLiteral(" ("), 0, 0);
-    return QStringLiteral("%1 (*%2 *%3)").arg(name, extension.toLower(), extension.toUpper());
+    return KsFileFilter(GetDocString(filterName).section(QStringLiteral(" ("), 0, 0), GetDocString(filterExt));
 }
 
 CKsDoc* CMultiDocTemplate::FindDocument(const CString& path) const

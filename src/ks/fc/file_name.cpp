@@ -21,6 +21,16 @@ CString KsExistingSpelling(const CString& path)
     return path;
 }
 
+bool KsHasExtension(const CString& path, const CString& extension)
+{
+    return !extension.isEmpty() && path.endsWith(extension, Qt::CaseInsensitive);
+}
+
+CString KsFileFilter(const CString& name, const CString& extension)
+{
+    return QStringLiteral("%1 (*%2 *%3)").arg(name, extension.toLower(), extension.toUpper());
+}
+
 CString KsShownFileName(const CString& path)
 {
     constexpr qsizetype Longest = 60, Side = (Longest - 1) / 2; // no place to break a line in them

@@ -7,6 +7,10 @@
 /// The path as files and folders are spelt on disk: a project or a list may hold another case, and an editor may have
 /// saved a file with its extension in capitals. The path itself when it exists as it stands, or when nothing fits.
 KS_API CString KsExistingSpelling(const CString& path);
+/// Whether a file's name ends in the extension (with its dot), in whatever case.
+KS_API bool KsHasExtension(const CString& path, const CString& extension);
+/// An entry of a file dialog for the extension, in lower and upper case.
+KS_API CString KsFileFilter(const CString& name, const CString& extension);
 /// The name of a file for a text on the screen: one that is very long is cut in its middle.
 KS_API CString KsShownFileName(const CString& path);
 /// Names a file, whichever of its paths is given: another spelling, a way through other folders, a link to it.
