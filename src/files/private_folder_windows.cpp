@@ -2,7 +2,7 @@
 
 #include "base/utf8_path.h"
 
-#include <windows.h>
+#include <cerrno>
 
 namespace {
 

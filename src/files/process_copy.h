@@ -23,7 +23,12 @@ public:
         std::error_code error; // interrupted: the copy ended before the work did; `text` is by which signal, if any
         std::string text;      // cut where it is longer than a few thousand bytes
     };
-    static Result<ProcessCopy> Start(const std::function<Answer()>& work);
+    enum class Pace
+    {
+        Aside, // slower than the program: the user comes first
+        Awaited
+    };
+    static Result<ProcessCopy> Start(const std::function<Answer()>& work, Pace pace = Pace::Aside);
     ProcessCopy(ProcessCopy&& other) noexcept { *this = std::move(other); }
     ProcessCopy& operator=(ProcessCopy&& other) noexcept
     {

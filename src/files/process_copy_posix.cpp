@@ -36,7 +36,7 @@ void CloseConnections()
 }
 
 /// What the copy does.
-ProcessCopy::Answer Run(const std::function<ProcessCopy::Answer()>& work)
+ProcessCopy::Answer Run(const std::function<ProcessCopy::Answer()>& work, ProcessCopy::Pace pace)
 {
     for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGALRM, SIGPIPE})
         std::signal(signal, SIG_DFL);
@@ -45,7 +45,7 @@ ProcessCopy::Answer Run(const std::function<ProcessCopy::Answer()>& work)
     ::umask(0077);
     const rlimit none{};
     ::setrlimit(RLIMIT_CORE, &none); // of the program's memory only the program leaves an image
-    [[maybe_unused]] const int slower = ::nice(10); // the user comes first
+    [[maybe_unused]] const int slower = pace == ProcessCopy::Pace::Aside ? ::nice(10) : 0;
     try {
         return work();
     } catch (const std::bad_alloc&) {
@@ -81,7 +81,7 @@ ProcessCopy::Answer Receive(int pipe, int status)
 
 } // namespace
 
-Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work)
+Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work, Pace pace)
 {
     int ends[2];
     if (::pipe(ends) == -1)
@@ -92,7 +92,7 @@ Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work)
     const pid_t process = ::fork();
     if (process == 0) {
         ::close(ends[0]);
-        Send(ends[1], Run(work));
+        Send(ends[1], Run(work, pace));
         ::_exit(0); // closes the writing end, as whatever else happens to the copy does
     }
     const int reason = errno;

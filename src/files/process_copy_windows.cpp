@@ -1,6 +1,6 @@
 #include "files/process_copy.h"
 
-Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work)
+Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work, Pace)
 {
     ProcessCopy copy;
     copy.m_answer = work(); // the system has no copies of a process

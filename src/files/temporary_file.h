@@ -22,8 +22,8 @@ public:
     /// Waits for the medium if asked to, and closes.
     std::error_code Finish(bool sync);
 
-    /// Before what stands under the temporary name is swapped for somebody's file: gives it a name by which nobody takes
-    /// it for left over, however this program ends meanwhile and whatever fails.
+    /// Before what stands under the temporary name is swapped for somebody's file: gives it a name by which nobody
+    /// takes it for left over, however this program ends meanwhile and whatever fails.
     std::error_code Protect();
     /// It is this object's again.
     void Unprotect();

@@ -52,7 +52,7 @@ QString ThrownText(const char* what)
 QString TryLibrary(const QString& file)
 {
     const QByteArray name = QFile::encodeName(file);
-    Result<ProcessCopy> copy = ProcessCopy::Start([&] { return Load(name.constData()); });
+    Result<ProcessCopy> copy = ProcessCopy::Start([&] { return Load(name.constData()); }, ProcessCopy::Pace::Awaited);
     if (!copy)
         return {};
     const ProcessCopy::Answer& answer = copy->Wait(Patience);

@@ -65,7 +65,8 @@ void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, cons
     else if (state.kind == CMemberState::Unknown)
         text = tr("%1 (no editor)").arg(text);
     else if (!state.elsewhere.isEmpty())
-        text = tr("%1 (in %2)").arg(text, KsVisibleText(state.elsewhere)); // the tree is narrow; the tip says it in full
+        text =
+            tr("%1 (in %2)").arg(text, KsVisibleText(state.elsewhere)); // the tree is narrow; the tip says it in full
     auto* item = new QTreeWidgetItem(&project, {text});
     item->setData(0, HandleRole, project.data(0, HandleRole));
     item->setData(0, PathRole, path);

@@ -78,8 +78,7 @@ void CRecoveryDialog::Fill()
         const bool isDamaged = item.state == CRecoverable::Damaged;
         const QString path = QDir::toNativeSeparators(isDamaged ? item.file : item.header.path);
         m_table->setItem(row, Document, PlainCell(isDamaged ? tr("A damaged recovery file") : item.Name(), path));
-        m_table->setItem(row, Time,
-                         PlainCell(isDamaged ? QString() : KsDateTimeText(item.header.time.toLocalTime())));
+        m_table->setItem(row, Time, PlainCell(isDamaged ? QString() : KsDateTimeText(item.header.time.toLocalTime())));
         m_table->setItem(row, What, PlainCell(tr("Comparing...")));
     }
     m_table->resizeColumnsToContents();

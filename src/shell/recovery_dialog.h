@@ -40,6 +40,6 @@ private:
     std::size_t m_described = 0; // how many lines say what differs; a copy of the process looks at the next
     std::optional<ProcessCopy> m_look;
     std::unique_ptr<QSocketNotifier> m_lookEnds;
-    QTableWidget* m_table;       // children
+    QTableWidget* m_table; // children
     QPushButton *m_open, *m_compare, *m_discard;
 };

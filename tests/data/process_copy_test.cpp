@@ -66,14 +66,14 @@ TEST(ProcessCopy, AnswersWhyItFailed)
         std::function<Answer()> work;
         std::errc error;
         std::string text{};
-    } cases[] = {{[] { return std::make_error_code(std::errc::no_space_on_device); }, std::errc::no_space_on_device},
-                 {[] { return Answer(std::make_error_code(std::errc::io_error), "in words"); }, std::errc::io_error,
-                  "in words"},
-                 {[&] { return Answer({}, longText); }, std::errc(), longText.substr(0, 4088)},
-                 {[]() -> Answer { throw std::bad_alloc(); }, std::errc::not_enough_memory},
-                 {[]() -> Answer { throw 1; }, std::errc::io_error},
-                 {[]() -> Answer { std::abort(); }, std::errc::interrupted, "Aborted"},
-                 {[]() -> Answer { std::_Exit(0); }, std::errc::interrupted}};
+    } cases[] = {
+        {[] { return std::make_error_code(std::errc::no_space_on_device); }, std::errc::no_space_on_device},
+        {[] { return Answer(std::make_error_code(std::errc::io_error), "in words"); }, std::errc::io_error, "in words"},
+        {[&] { return Answer({}, longText); }, std::errc(), longText.substr(0, 4088)},
+        {[]() -> Answer { throw std::bad_alloc(); }, std::errc::not_enough_memory},
+        {[]() -> Answer { throw 1; }, std::errc::io_error},
+        {[]() -> Answer { std::abort(); }, std::errc::interrupted, "Aborted"},
+        {[]() -> Answer { std::_Exit(0); }, std::errc::interrupted}};
     for (const auto& [work, error, text] : cases) {
         Result<ProcessCopy> copy = ProcessCopy::Start(work);
         EXPECT_EQ(copy->Wait(5s).error, error);
@@ -82,10 +82,15 @@ TEST(ProcessCopy, AnswersWhyItFailed)
     // One that would never end, and has started something that goes on.
     const auto begin = std::chrono::steady_clock::now();
     EXPECT_EQ(ProcessCopy::Start([]() -> Answer {
-                  const auto more = ProcessCopy::Start([]() -> Answer { std::this_thread::sleep_for(3s); return {}; });
+                  const auto more = ProcessCopy::Start([]() -> Answer {
+                      std::this_thread::sleep_for(3s);
+                      return {};
+                  });
                   std::this_thread::sleep_for(1h);
                   return {};
-              })->Wait(200ms).error,
+              })
+                  ->Wait(200ms)
+                  .error,
               std::errc::timed_out);
     EXPECT_LT(std::chrono::steady_clock::now() - begin, 2s);
 }

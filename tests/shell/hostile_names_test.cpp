@@ -27,7 +27,7 @@ QStringList RichTexts(const QWidget& window)
 }
 
 /// What of a window turns the direction of writing.
-QStringList TurnedTexts(const QWidget& window)
+std::string TurnedTexts(const QWidget& window)
 {
     QStringList turned;
     for (const QWidget* widget : window.findChildren<QWidget*>()) {
@@ -37,7 +37,7 @@ QStringList TurnedTexts(const QWidget& window)
             if (text.contains(QChar(0x202E)))
                 turned << widget->metaObject()->className() + (": " + text);
     }
-    return turned;
+    return turned.join(u'\n').toStdString();
 }
 
 /// The label of the tool tip that stands on the screen; null for none.
@@ -117,9 +117,9 @@ TEST_F(ShellTest, TurnedWritingIsSeenInTitles)
     const QString file = "a\u202Efdp\u2066\n.tst";
     Write("b\u202E.tst");
     ASSERT_TRUE(frame->OpenFile(WriteProject("p\u202Eprvk.kvrp", "File = <b\u202E.tst>\n")));
-    EXPECT_EQ(TurnedTexts(*frame), QStringList());
+    EXPECT_EQ(TurnedTexts(*frame), "");
     ASSERT_TRUE(frame->OpenFile(Write(file)));
-    EXPECT_EQ(TurnedTexts(*frame), QStringList());
+    EXPECT_EQ(TurnedTexts(*frame), "");
     EXPECT_TRUE(frame->windowTitle().contains("a\uFFFDfdp\uFFFD\uFFFD.tst")) << frame->windowTitle().toStdString();
     EXPECT_TRUE(ViewOf(file)->GetDocument()->DoSave(Path(file))) << "the name is what it was";
     EXPECT_TRUE(QFile::exists(Path(file)));
@@ -179,7 +179,7 @@ TEST(HostileNames, NoEditorTakesThemForMarkup)
                     sheet->setCurrentIndex(page);
                 QCoreApplication::processEvents();
                 EXPECT_EQ(RichTexts(frame), QStringList());
-                EXPECT_EQ(TurnedTexts(frame), QStringList());
+                EXPECT_EQ(TurnedTexts(frame), "");
             }
             for (const QLabel* label : window->findChildren<QLabel*>())
                 seen = seen || label->text().contains(QString(Name).replace("&", "&&"));

@@ -1,11 +1,14 @@
 #include "shell_fixture.h"
 
 #include <QElapsedTimer>
+#include <QImage>
 #include <QLabel>
 #include <QLibrary>
 #include <QTimer>
 #include <QTreeWidget>
+#include <algorithm>
 #include <chrono>
+#include <cmath>
 #include <future>
 #include <thread>
 
@@ -18,6 +21,22 @@ const CPlugin* Named(const std::vector<std::unique_ptr<CPlugin>>& plugins, const
             return plugin.get();
     }
     return nullptr;
+}
+
+/// Between the lightest and the darkest of a picture.
+double Contrast(const QImage& picture)
+{
+    double lightest = 0, darkest = 1;
+    for (int y = 0; y < picture.height(); ++y)
+        for (int x = 0; x < picture.width(); ++x) {
+            const auto linear = [](float part) { return std::pow((part + 0.055) / 1.055, 2.4); };
+            const QColor color = picture.pixelColor(x, y);
+            const double light =
+                0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
+            lightest = std::max(lightest, light);
+            darkest = std::min(darkest, light);
+        }
+    return (lightest + 0.05) / (darkest + 0.05);
 }
 
 } // namespace
@@ -130,4 +149,12 @@ TEST_F(ShellTest, AShellWithoutEditorsSaysSo)
     EXPECT_FALSE(empty.findChild<QAction*>("actionNew")->isEnabled());
     EXPECT_FALSE(empty.OpenFile(Write("a.tst")));
     EXPECT_TRUE(asked.takeLast().contains("a.tst"));
+    // Its hint can be read on any ground.
+    empty.show();
+    for (const QRgb ground : {0xffeff0f1, 0xff2a2e32}) {
+        QApplication::setPalette(QPalette(QColor(ground)));
+        QCoreApplication::processEvents();
+        EXPECT_GE(Contrast(empty.MdiArea().viewport()->grab().toImage()), 4.5) << std::hex << ground;
+    }
+    QApplication::setPalette(QPalette());
 }

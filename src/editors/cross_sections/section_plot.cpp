@@ -48,10 +48,9 @@ void CSectionPlot::SetCurrentPoint(int point)
 
 QString CSectionPlot::Title() const
 {
-    return m_section
-               ? QStringLiteral("%1  %2").arg(KsVisibleText(m_section->Branch()),
-                                              WithSymbol(UnitGroup::Chainage, m_section->chainage))
-               : QString();
+    return m_section ? QStringLiteral("%1  %2").arg(KsVisibleText(m_section->Branch()),
+                                                    WithSymbol(UnitGroup::Chainage, m_section->chainage))
+                     : QString();
 }
 
 QString CSectionPlot::Caption() const
@@ -71,7 +70,8 @@ QString CSectionPlot::Caption() const
 void CSectionPlot::Describe()
 {
     setAccessibleName(tr("Plot of the cross section"));
-    setAccessibleDescription(m_section ? tr("%1, points: %2").arg(Title(), QString::number(m_section->points.size())) : QString());
+    setAccessibleDescription(m_section ? tr("%1, points: %2").arg(Title(), QString::number(m_section->points.size()))
+                                       : QString());
 }
 
 /// Axes and their room, for the section, the units, the font and the size.
