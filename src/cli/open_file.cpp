@@ -77,7 +77,12 @@ int Rewrite(const HD_Parameters& parameters, const std::string& path, const File
                  Exit::Fine);
     if (report.lost.Any())
         Complain(name + "is saved; not kept of it as it was before: " + LostText(report.lost) + ".", Exit::Fine);
-    if (!report.displaced.empty())
+    if (!report.displaced.empty() && report.unknown)
+        Complain(name + "is saved; what it held just before is kept in \"" + report.displaced +
+                     "\", for whether another program had written that could not be seen: " + report.unknown.message() +
+                     ".",
+                 Exit::Fine);
+    else if (!report.displaced.empty())
         Complain(name + "is saved; what another program had written meanwhile is kept in \"" + report.displaced + "\".",
                  Exit::Fine);
     return Exit::Fine;

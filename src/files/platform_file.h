@@ -51,7 +51,7 @@ public:
 
     /// A symbolic link itself. That nothing is there is no error; whatever else keeps the answer back is one.
     virtual std::error_code Status(const Path& path, FileStatus& status) = 0;
-    virtual std::error_code ReadLink(const Path& path, Path& target) = 0;
+    virtual std::error_code ReadLink(const Path& path, Path& target);
     /// The names of a folder's entries.
     virtual std::error_code List(const Path& folder, std::vector<Path>& names) = 0;
     /// Whether the user may change an existing file's content.

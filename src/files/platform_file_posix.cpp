@@ -71,13 +71,6 @@ public:
         return {};
     }
 
-    std::error_code ReadLink(const Path& path, Path& target) override
-    {
-        std::error_code error;
-        target = std::filesystem::read_symlink(path, error);
-        return error;
-    }
-
     std::error_code List(const Path& folder, std::vector<Path>& names) override
     {
         // Not the standard library's iterator, which ends the program where there is no memory.

@@ -1,5 +1,6 @@
 #include "files/platform_process.h"
 
+#include <cerrno>
 #include <csignal>
 #include <pwd.h>
 #include <unistd.h>
@@ -16,6 +17,11 @@ ProcessName ThisProcess()
     if (::gethostname(buffer, sizeof buffer - 1) == 0)
         process.host = buffer;
     return process;
+}
+
+bool HasEnded(std::int64_t number)
+{
+    return number > 0 && ::kill(pid_t(number), 0) == -1 && errno == ESRCH;
 }
 
 void IgnoreFileSizeSignal()

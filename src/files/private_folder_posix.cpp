@@ -3,10 +3,7 @@
 #include "base/utf8_path.h"
 
 #include <cerrno>
-#include <charconv>
-#include <csignal>
 #include <fcntl.h>
-#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -19,11 +16,6 @@ Error Refused(const std::string& path, int reason, bool reading = false)
             .code = code,
             .path = path,
             .reading = reading};
-}
-
-bool IsSame(const struct stat& a, const struct stat& b)
-{
-    return a.st_dev == b.st_dev && a.st_ino == b.st_ino;
 }
 
 } // namespace
@@ -69,43 +61,4 @@ Result<PrivateFile> OpenPrivateFile(const std::string& path)
     file.stream.reset(stream);
     file.size = std::uintmax_t(status.st_size);
     return file;
-}
-
-Result<ProcessLock> ProcessLock::Take(const std::string& path)
-{
-    while (true) {
-        const int fd = ::open(path.c_str(), O_RDWR | O_CREAT | O_NOFOLLOW | O_CLOEXEC, 0600);
-        if (fd == -1)
-            return Refused(path, errno);
-        ProcessLock lock(fd);
-        if (::flock(fd, LOCK_EX | LOCK_NB) == -1)
-            return Refused(path, errno == EWOULDBLOCK ? EBUSY : errno);
-        struct stat held, there;
-        if (::fstat(fd, &held) == -1)
-            return Refused(path, errno);
-        if (::lstat(path.c_str(), &there) == -1 || !IsSame(held, there))
-            continue; // whoever held it took the file away
-        const std::string process = std::to_string(::getpid());
-        if (::ftruncate(fd, 0) == -1 || ::pwrite(fd, process.data(), process.size(), 0) == -1)
-            return Refused(path, errno);
-        return lock;
-    }
-}
-
-bool ProcessLock::IsOrphan(const std::string& path)
-{
-    const Result<PrivateFile> file = OpenPrivateFile(path);
-    if (!file)
-        return false;
-    char text[24] = {};
-    const std::size_t length = std::fread(text, 1, sizeof text - 1, file.value().stream.get());
-    long process = 0;
-    const auto end = std::from_chars(text, text + length, process);
-    return end.ec == std::errc() && process > 0 && ::kill(pid_t(process), 0) == -1 && errno == ESRCH;
-}
-
-ProcessLock::~ProcessLock()
-{
-    if (m_handle != None)
-        ::close(int(m_handle));
 }

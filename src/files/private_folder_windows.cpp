@@ -2,7 +2,7 @@
 
 #include "base/utf8_path.h"
 
-#include <windows.h>
+#include <cerrno>
 
 namespace {
 
@@ -36,26 +36,4 @@ Result<PrivateFile> OpenPrivateFile(const std::string& path)
     if (error || !opened.stream)
         return Refused(path, error ? error : std::error_code(errno, std::generic_category()), true);
     return opened;
-}
-
-Result<ProcessLock> ProcessLock::Take(const std::string& path)
-{
-    const HANDLE file = ::CreateFileW(PathFromUtf8(path).c_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, OPEN_ALWAYS,
-                                      FILE_ATTRIBUTE_NORMAL, nullptr);
-    if (file != INVALID_HANDLE_VALUE)
-        return ProcessLock(reinterpret_cast<std::intptr_t>(file));
-    const DWORD reason = ::GetLastError();
-    return Refused(path, reason == ERROR_SHARING_VIOLATION ? std::make_error_code(std::errc::device_or_resource_busy)
-                                                           : std::error_code(int(reason), std::system_category()));
-}
-
-bool ProcessLock::IsOrphan(const std::string&)
-{
-    return false; // there are no copies
-}
-
-ProcessLock::~ProcessLock()
-{
-    if (m_handle != None)
-        ::CloseHandle(reinterpret_cast<HANDLE>(m_handle));
 }

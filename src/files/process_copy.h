@@ -3,8 +3,10 @@
 
 #include "base/result.h"
 
+#include <chrono>
 #include <cstdint>
 #include <functional>
+#include <string>
 
 /// A copy of this process that does one piece of work and ends: it has all memory as it was when it was started, which
 /// the system shares until one of both writes to it. The copy has one thread, no connection to the display, and runs no
@@ -14,8 +16,19 @@
 class ProcessCopy
 {
 public:
-    /// The answer of the work is 0, or why it failed, as a system error.
-    static Result<ProcessCopy> Start(const std::function<std::error_code()>& work);
+    /// What the work came to: why it failed, as a system error, and words of its own.
+    struct Answer
+    {
+        Answer(std::error_code failure = {}, std::string words = {}) : error(failure), text(std::move(words)) {}
+        std::error_code error; // interrupted: the copy ended before the work did; `text` is by which signal, if any
+        std::string text;      // cut where it is longer than a few thousand bytes
+    };
+    enum class Pace
+    {
+        Aside, // slower than the program: the user comes first
+        Awaited
+    };
+    static Result<ProcessCopy> Start(const std::function<Answer()>& work, Pace pace = Pace::Aside);
     ProcessCopy(ProcessCopy&& other) noexcept { *this = std::move(other); }
     ProcessCopy& operator=(ProcessCopy&& other) noexcept
     {
@@ -26,17 +39,19 @@ public:
     }
     ~ProcessCopy(); // stops it
 
-    /// A descriptor that can be read when the copy has ended; -1 when it has ended already.
+    /// A descriptor that can be read when the copy has ended or is just about to; -1 when its end is known.
     int Ended() const { return m_ended; }
     /// Ends the copy whatever it is doing. What it was just doing may still come to its end until Wait returns.
     void Stop();
-    /// Waits until the copy has ended; what the work answered.
-    std::error_code Wait();
+    /// Waits until the copy has ended.
+    const Answer& Wait();
+    /// Waits for at most so long, and stops it then, with the answer timed_out.
+    const Answer& Wait(std::chrono::milliseconds longest);
 
 private:
     ProcessCopy() = default;
 
     std::intptr_t m_process = -1;
     int m_ended = -1;
-    std::error_code m_answer;
+    Answer m_answer;
 };

@@ -2,9 +2,14 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <climits>
 #include <csignal>
+#include <cstring>
+#include <exception>
 #include <fcntl.h>
 #include <new>
+#include <poll.h>
+#include <sys/resource.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -30,36 +35,66 @@ void CloseConnections()
     }
 }
 
-/// What the copy does; the answer travels as its exit code.
-int Run(const std::function<std::error_code()>& work)
+/// What the copy does.
+ProcessCopy::Answer Run(const std::function<ProcessCopy::Answer()>& work, ProcessCopy::Pace pace)
 {
     for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGALRM, SIGPIPE})
         std::signal(signal, SIG_DFL);
     ::alarm(LongestWork);
     CloseConnections();
     ::umask(0077);
-    [[maybe_unused]] const int slower = ::nice(10); // the user comes first
+    const rlimit none{};
+    ::setrlimit(RLIMIT_CORE, &none); // of the program's memory only the program leaves an image
+    [[maybe_unused]] const int slower = pace == ProcessCopy::Pace::Aside ? ::nice(10) : 0;
     try {
-        return work().value() & 0xff;
+        return work();
     } catch (const std::bad_alloc&) {
-        return ENOMEM;
+        return std::make_error_code(std::errc::not_enough_memory);
     } catch (...) {
-        return EIO;
+        return std::make_error_code(std::errc::io_error);
     }
+}
+
+/// The answer as it travels, in one piece that a pipe takes at once and that is there whole or not at all. A copy that
+/// ends without it has not done its work, whatever its exit code is.
+struct Letter
+{
+    int error = 0;
+    unsigned length = 0;
+    char text[PIPE_BUF - 2 * sizeof(int)]{};
+};
+
+void Send(int pipe, const ProcessCopy::Answer& answer)
+{
+    Letter letter{.error = answer.error.value(), .length = unsigned(std::min(answer.text.size(), sizeof letter.text))};
+    answer.text.copy(letter.text, letter.length);
+    [[maybe_unused]] const ssize_t sent = ::write(pipe, &letter, sizeof letter);
+}
+
+ProcessCopy::Answer Receive(int pipe, int status)
+{
+    Letter letter;
+    if (::read(pipe, &letter, sizeof letter) == ssize_t(sizeof letter) && letter.length <= sizeof letter.text)
+        return {{letter.error, std::generic_category()}, {letter.text, letter.length}};
+    return {std::make_error_code(std::errc::interrupted), WIFSIGNALED(status) ? ::strsignal(WTERMSIG(status)) : ""};
 }
 
 } // namespace
 
-Result<ProcessCopy> ProcessCopy::Start(const std::function<std::error_code()>& work)
+Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work, Pace pace)
 {
     int ends[2];
     if (::pipe(ends) == -1)
         return Failed(errno);
     ::fcntl(ends[0], F_SETFD, FD_CLOEXEC);
     ::fcntl(ends[1], F_SETFD, FD_CLOEXEC);
+    ::fcntl(ends[0], F_SETFL, O_NONBLOCK); // what the copy has started in its turn may keep the other end open
     const pid_t process = ::fork();
-    if (process == 0)
-        ::_exit(Run(work)); // closes the writing end, whatever happens to the copy
+    if (process == 0) {
+        ::close(ends[0]);
+        Send(ends[1], Run(work, pace));
+        ::_exit(0); // closes the writing end, as whatever else happens to the copy does
+    }
     const int reason = errno;
     ::close(ends[1]);
     if (process == -1) {
@@ -84,19 +119,34 @@ void ProcessCopy::Stop()
         ::kill(pid_t(m_process), SIGKILL);
 }
 
-std::error_code ProcessCopy::Wait()
+const ProcessCopy::Answer& ProcessCopy::Wait()
 {
     if (m_process <= 0)
         return m_answer;
     int status = 0;
-    pid_t ended = 0;
-    do
-        ended = ::waitpid(pid_t(m_process), &status, 0);
-    while (ended == -1 && errno == EINTR);
+    while (::waitpid(pid_t(m_process), &status, 0) == -1 && errno == EINTR) {
+    }
     m_process = -1;
+    m_answer = Receive(m_ended, status);
     ::close(m_ended);
     m_ended = -1;
-    const bool answered = ended != -1 && WIFEXITED(status);
-    m_answer = {answered ? WEXITSTATUS(status) : EINTR, std::generic_category()};
+    return m_answer;
+}
+
+const ProcessCopy::Answer& ProcessCopy::Wait(std::chrono::milliseconds longest)
+{
+    using Clock = std::chrono::steady_clock;
+    pollfd end{.fd = m_ended, .events = POLLIN, .revents = 0};
+    int ready = 0;
+    for (const auto last = Clock::now() + longest; m_process > 0 && ready <= 0 && Clock::now() < last;) {
+        const auto left = std::chrono::ceil<std::chrono::milliseconds>(last - Clock::now());
+        ready = ::poll(&end, 1, int(std::max<std::int64_t>(left.count(), 0)));
+    }
+    const bool isLate = m_process > 0 && ready <= 0;
+    if (isLate)
+        Stop();
+    Wait();
+    if (isLate && m_answer.error == std::errc::interrupted)
+        m_answer = std::make_error_code(std::errc::timed_out);
     return m_answer;
 }

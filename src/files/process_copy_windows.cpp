@@ -1,6 +1,6 @@
 #include "files/process_copy.h"
 
-Result<ProcessCopy> ProcessCopy::Start(const std::function<std::error_code()>& work)
+Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work, Pace)
 {
     ProcessCopy copy;
     copy.m_answer = work(); // the system has no copies of a process
@@ -11,7 +11,12 @@ ProcessCopy::~ProcessCopy() = default;
 
 void ProcessCopy::Stop() {}
 
-std::error_code ProcessCopy::Wait()
+const ProcessCopy::Answer& ProcessCopy::Wait()
+{
+    return m_answer;
+}
+
+const ProcessCopy::Answer& ProcessCopy::Wait(std::chrono::milliseconds)
 {
     return m_answer;
 }

@@ -25,6 +25,7 @@ private:
     WriteAnswer Ask(WriteQuestion::Kind kind) const;
     std::error_code Fill(TemporaryFile& temporary, std::string_view text);
     bool IsExpected(const fs::path& path);
+    bool IsExpected(const fs::path& path, std::error_code& unknown) const;
     Result<void> PutInPlace(TemporaryFile& temporary);
     void KeepDisplaced(TemporaryFile& temporary);
     Result<void> Replace(TemporaryFile& temporary);
@@ -110,16 +111,24 @@ std::error_code SafeWriter::Fill(TemporaryFile& temporary, std::string_view text
 }
 
 /// Whether a file is what the save was meant to replace. Where the content is known, it is read again unless the time
-/// of the last change is far enough back that another one would show in it.
-bool SafeWriter::IsExpected(const fs::path& path)
+/// of the last change is far enough back that another one would show in it. What the system does not answer is no.
+bool SafeWriter::IsExpected(const fs::path& path, std::error_code& unknown) const
 {
     FileStatus status;
-    if (m_seen.kind == Kind::None || m_platform.Status(path, status) || status.kind != Kind::File)
+    unknown = m_platform.Status(path, status);
+    if (unknown || m_seen.kind == Kind::None || status.kind != Kind::File)
         return false;
     if (!m_options.expected || (m_isExpected && m_isSettled && status.IsUnchanged(m_seen)))
         return status.IsUnchanged(m_seen);
     FileVersion found;
-    return !VersionOfFile(m_platform, path, found) && found == *m_options.expected;
+    unknown = VersionOfFile(m_platform, path, found);
+    return !unknown && found == *m_options.expected;
+}
+
+/// The same, and the report says should it not be known.
+bool SafeWriter::IsExpected(const fs::path& path)
+{
+    return IsExpected(path, m_report.unknown);
 }
 
 /// Puts the finished temporary file in the place of the target. Whether somebody wrote to the target in the last moment
@@ -129,6 +138,8 @@ Result<void> SafeWriter::PutInPlace(TemporaryFile& temporary)
     bool exists = m_seen.kind == Kind::File;
     std::error_code error;
     for (int attempt = 0; attempt < 2; ++attempt) {
+        if (exists && (error = temporary.Protect()))
+            break;
         error =
             exists ? m_platform.Exchange(temporary.Path(), m_target) : m_platform.RenameNew(temporary.Path(), m_target);
         if (error != (exists ? std::errc::no_such_file_or_directory : std::errc::file_exists))
@@ -146,11 +157,14 @@ Result<void> SafeWriter::PutInPlace(TemporaryFile& temporary)
     return {};
 }
 
-/// What was swapped out now stands under the temporary name, and goes with it if it is what was meant to.
+/// What was swapped out now stands under the temporary name, and goes with it if it is what was meant to. Otherwise it
+/// is somebody's, and stays under that name where it can be given no better one.
 void SafeWriter::KeepDisplaced(TemporaryFile& temporary)
 {
-    if (IsExpected(temporary.Path()))
+    if (IsExpected(temporary.Path())) {
+        temporary.Unprotect(); // waiting for the disk takes long enough for the program to end meanwhile
         return;
+    }
     fs::path kept;
     if (temporary.KeepAs(m_target, "displaced", kept)) {
         kept = temporary.Path();
@@ -176,7 +190,7 @@ Result<void> SafeWriter::Replace(TemporaryFile& temporary)
     if (const std::error_code error = m_platform.Status(m_target, now))
         return Failed(error);
     if (now.kind != Kind::None &&
-        (!IsExpected(m_target) || m_platform.Status(m_target, last) || !last.IsUnchanged(now)))
+        (!IsExpected(m_target) || (m_report.unknown = m_platform.Status(m_target, last)) || !last.IsUnchanged(now)))
         if (Result<void> kept = KeepTarget(); !kept)
             return kept;
     const std::error_code error = m_platform.Replace(temporary.Path(), m_target);
@@ -321,15 +335,11 @@ Result<KeptCopy> KeepOriginal(const std::string& path, std::string_view why, Pla
 std::string LostText(const LostMetadata& lost)
 {
     std::string text;
-    const auto add = [&](bool isLost, const char* what) {
-        if (isLost)
-            text += (text.empty() ? "" : ", ") + std::string(what);
-    };
-    add(lost.owner, "owner");
-    add(lost.group, "group");
-    add(lost.mode, "mode");
-    add(lost.accessList, "access list");
-    add(lost.attributes, "extended attributes");
+    for (const LostPart& part : LostParts)
+        if (lost.*part.member) {
+            text += text.empty() ? "" : ", ";
+            text += part.name;
+        }
     return text;
 }
 

@@ -48,6 +48,7 @@ struct WriteReport
     std::error_code unconfirmed{}; // why it is not known whether the disk has it: the folder could not be synced
     LostMetadata lost{};
     std::string displaced{};      // where what somebody else wrote at the last moment is kept
+    std::error_code unknown{};    // why it is not known whether somebody did, should it not be; it is kept all the same
     std::error_code notRenamed{}; // it is written, and keeps its spelling
     FileVersion version{};        // what was written
     bool inPlace = false;         // the file itself was written over, as it has several names
@@ -72,6 +73,17 @@ struct KeptCopy
 /// Keeps a copy of a file beside it under such a name, never over an existing one.
 Result<KeptCopy> KeepOriginal(const std::string& path, std::string_view why, PlatformFile* platform = nullptr);
 
+/// The parts of the metadata, and what each is called in English.
+struct LostPart
+{
+    bool LostMetadata::*member;
+    const char* name;
+};
+inline constexpr LostPart LostParts[] = {{&LostMetadata::owner, "owner"},
+                                         {&LostMetadata::group, "group"},
+                                         {&LostMetadata::mode, "mode"},
+                                         {&LostMetadata::accessList, "access list"},
+                                         {&LostMetadata::attributes, "extended attributes"}};
 /// What of the metadata was lost, in English words: "owner, access list".
 std::string LostText(const LostMetadata& lost);
 

@@ -7,7 +7,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr std::string_view Prefix = ".kvr-", Suffix = ".tmp";
+constexpr std::string_view Prefix = ".kvr-", Suffix = ".tmp", ProtectedSuffix = ".kept";
 
 /// The name does not contain the target's, which may be as long as names get.
 fs::path NewName()
@@ -91,6 +91,26 @@ std::error_code TemporaryFile::Close()
 {
     m_isOpen = false;
     return m_platform.Close(m_file);
+}
+
+std::error_code TemporaryFile::EndNameWith(std::string_view suffix)
+{
+    fs::path name = m_path;
+    name.replace_extension(suffix);
+    const std::error_code error = name == m_path ? std::error_code() : m_platform.RenameNew(m_path, name);
+    if (!error)
+        m_path = std::move(name);
+    return error;
+}
+
+std::error_code TemporaryFile::Protect()
+{
+    return EndNameWith(ProtectedSuffix);
+}
+
+void TemporaryFile::Unprotect()
+{
+    EndNameWith(Suffix); // should that fail, it goes all the same unless the program ends before
 }
 
 std::error_code TemporaryFile::KeepAs(const fs::path& path, std::string_view why, fs::path& kept)

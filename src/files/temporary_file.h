@@ -22,6 +22,11 @@ public:
     /// Waits for the medium if asked to, and closes.
     std::error_code Finish(bool sync);
 
+    /// Before what stands under the temporary name is swapped for somebody's file: gives it a name by which nobody
+    /// takes it for left over, however this program ends meanwhile and whatever fails.
+    std::error_code Protect();
+    /// It is this object's again.
+    void Unprotect();
     /// Moves what stands under the temporary name to the first of PATH.WHY-1, -2, ... that is free; where that is
     /// longer than names may be, of kvr.WHY-1, ... in the same folder.
     std::error_code KeepAs(const std::filesystem::path& path, std::string_view why, std::filesystem::path& kept);
@@ -33,6 +38,7 @@ public:
 
 private:
     std::error_code Close();
+    std::error_code EndNameWith(std::string_view suffix);
 
     PlatformFile& m_platform;
     std::filesystem::path m_path;
@@ -41,7 +47,7 @@ private:
 };
 
 /// Removes temporary files that programs of this user have left in a folder: those of that name that nobody has open
-/// and nobody has touched for an hour. What cannot be removed stays.
+/// and nobody has touched for an hour. What is protected stays, and what cannot be removed.
 void RemoveLeftOvers(PlatformFile& platform, const std::filesystem::path& folder);
 
 std::error_code WriteAll(PlatformFile& platform, PlatformFile::Handle file, std::string_view text);

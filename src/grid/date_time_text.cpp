@@ -1,5 +1,6 @@
 #include "grid/date_time_text.h"
 
+#include "ks/language/date_time.h"
 #include "ks/language/language.h"
 #include "grid/grid_texts.h"
 
@@ -27,18 +28,6 @@ QString TimeFormat(const QLocale& locale)
     for (qsizetype part = 0; part < parts.size(); part += 2)
         parts[part].remove(zone);
     return parts.join(u'\'');
-}
-
-/// The locale's short form, made exact: a year of four digits, and seconds.
-QString ExactFormat(const QLocale& locale)
-{
-    QString date = locale.dateFormat(QLocale::ShortFormat);
-    if (!date.contains(QLatin1String("yyyy")))
-        date.replace(QLatin1String("yy"), QLatin1String("yyyy"));
-    QString time = locale.timeFormat(QLocale::ShortFormat);
-    if (!time.contains(u's'))
-        time.replace(QLatin1String("mm"), QLatin1String("mm:ss"));
-    return date + u' ' + time;
 }
 
 /// One kind of digits, of blanks and of letters, whatever keyboard or input method they come from.
@@ -214,8 +203,7 @@ QString DateTimeText(const HDDateTime& time)
         return GridTexts::tr("Invalid DateTime");
     // In UTC, so that no hour of the calendar is missing where clocks change.
     const QDateTime value(QDate(time.Year, time.Month, time.Day), QTime(time.Hour, time.Minute, time.Second), Qt::UTC);
-    const QLocale locale = KsLangGetUserLocale();
-    return locale.toString(value, ExactFormat(locale));
+    return KsDateTimeText(value);
 }
 
 std::optional<HDDateTime> ReadDateTime(const QString& text)

@@ -1,18 +1,13 @@
 #include "shell/library_trial.h"
 
+#include "files/process_copy.h"
+
 #include <QCoreApplication>
 #include <QFile>
-#include <algorithm>
 #include <exception>
 
 #ifdef Q_OS_LINUX
-#include <cerrno>
-#include <cstring>
 #include <dlfcn.h>
-#include <fcntl.h>
-#include <sys/resource.h>
-#include <sys/wait.h>
-#include <unistd.h>
 #endif
 
 namespace {
@@ -24,37 +19,22 @@ struct LibraryTrial
 
 #ifdef Q_OS_LINUX
 
-/// In the copy: loads the library and ends, with 1 when it threw; `report` takes what.
-[[noreturn]] void TryHere(const char* file, int report)
+constexpr std::chrono::seconds Patience{5};
+constexpr std::errc Threw = std::errc::state_not_recoverable; // no library has such an answer of its own
+
+/// In the copy: loads the library; what it throws is the answer.
+ProcessCopy::Answer Load(const char* file)
 {
-    constexpr unsigned patience = 10; // seconds
-    ::alarm(patience);
-    const rlimit none{};
-    ::setrlimit(RLIMIT_CORE, &none);
     // The system's declaration says that it throws nothing; what it runs may.
     void* (*const volatile load)(const char*, int) = ::dlopen;
     try {
         load(file, RTLD_NOW | RTLD_LOCAL);
+        return {};
     } catch (const std::exception& thrown) {
-        const ssize_t written = ::write(report, thrown.what(), std::strlen(thrown.what()));
-        ::_exit(written < 0 ? 2 : 1);
+        return {std::make_error_code(Threw), thrown.what()};
     } catch (...) {
-        ::_exit(1);
+        return std::make_error_code(Threw);
     }
-    ::_exit(0);
-}
-
-QByteArray ReadToEnd(int file)
-{
-    QByteArray text;
-    char buffer[256];
-    for (ssize_t size = 1; size != 0;) {
-        size = ::read(file, buffer, sizeof buffer);
-        if (size < 0 && errno != EINTR)
-            break;
-        text.append(buffer, std::max<ssize_t>(size, 0));
-    }
-    return text;
 }
 
 #endif
@@ -72,22 +52,19 @@ QString ThrownText(const char* what)
 QString TryLibrary(const QString& file)
 {
     const QByteArray name = QFile::encodeName(file);
-    int ends[2];
-    if (::pipe2(ends, O_CLOEXEC) != 0)
+    Result<ProcessCopy> copy = ProcessCopy::Start([&] { return Load(name.constData()); }, ProcessCopy::Pace::Awaited);
+    if (!copy)
         return {};
-    const pid_t copy = ::fork();
-    if (copy == 0)
-        TryHere(name.constData(), ends[1]);
-    ::close(ends[1]);
-    const QByteArray thrown = copy > 0 ? ReadToEnd(ends[0]) : QByteArray();
-    ::close(ends[0]);
-    int status = 0;
-    while (copy > 0 && ::waitpid(copy, &status, 0) < 0 && errno == EINTR) {
-    }
-    if (WIFSIGNALED(status))
-        return LibraryTrial::tr("it ended the program that tried it (%1)")
-            .arg(QString::fromLocal8Bit(::strsignal(WTERMSIG(status))));
-    return WEXITSTATUS(status) ? ThrownText(thrown.constData()) : QString();
+    const ProcessCopy::Answer& answer = copy->Wait(Patience);
+    if (!answer.error)
+        return {};
+    if (answer.error == Threw)
+        return ThrownText(answer.text.c_str());
+    if (answer.error == std::errc::timed_out)
+        return LibraryTrial::tr("its start did not end within %1 seconds").arg(Patience.count());
+    return answer.text.empty() ? LibraryTrial::tr("it ended the program that tried it")
+                               : LibraryTrial::tr("it ended the program that tried it (%1)")
+                                     .arg(QString::fromLocal8Bit(answer.text.c_str()));
 }
 
 #else

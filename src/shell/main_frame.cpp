@@ -12,6 +12,7 @@
 
 #include <QApplication>
 #include <QCloseEvent>
+#include <QDir>
 #include <QDropEvent>
 #include <QIcon>
 #include <QLabel>
@@ -31,6 +32,7 @@ CMainFrame::CMainFrame()
       m_menus(*this),
       m_snapshots(m_recoveryFolder),
       m_recovery(*this, m_plugins, m_recoveryFolder, m_snapshots),
+      m_recoveryLabel(new QLabel(this)),
       m_pluginLabel(new QLabel(this)),
       m_projectLabel(new QLabel(this))
 {
@@ -38,10 +40,16 @@ CMainFrame::CMainFrame()
     setAcceptDrops(true);
     setWindowIcon(QIcon(QStringLiteral(":/shell/shell.svg")));
     m_pluginLabel->setObjectName(QStringLiteral("pluginLabel"));
+    m_recoveryLabel->setObjectName(QStringLiteral("recoveryLabel"));
+    m_recoveryLabel->hide();
+    QFont strong = m_recoveryLabel->font();
+    strong.setBold(true);
+    m_recoveryLabel->setFont(strong);
+    statusBar()->addPermanentWidget(m_recoveryLabel);
     statusBar()->addPermanentWidget(m_pluginLabel);
     statusBar()->addPermanentWidget(m_projectLabel);
     connect(&m_projects, &CProjectController::Changed, this, &CMainFrame::Update);
-    connect(&m_snapshots, &CSnapshots::Failed, this, &CMainFrame::NotKept);
+    connect(&m_snapshots, &CSnapshots::FailuresChanged, this, &CMainFrame::UpdateRecoveryLabel);
 
     Retranslate();
     ReadSettings();
@@ -122,11 +130,20 @@ void CMainFrame::DocumentRenamed(const QString& oldPath, const QString& newPath)
         RecentFiles::Add(newPath);
 }
 
-/// Work goes on: only a crash would show the difference.
-void CMainFrame::NotKept(const CKsDoc* document, std::error_code why)
+/// Work goes on: only a crash would show the difference. It is said as long as it is so.
+void CMainFrame::UpdateRecoveryLabel()
 {
-    TellStatus(tr("The changes to %1 cannot be kept for the case of a crash: %2.")
-                   .arg(KsShownFileName(document->GetTitle()), KsSystemReason(why)));
+    QStringList reasons;
+    for (const auto& [document, why] : m_snapshots.Failures())
+        reasons << tr("The changes to %1 cannot be kept for the case of a crash: %2.")
+                       .arg(KsShownFileName(document->GetTitle()), KsSystemReason(why));
+    if (!reasons.isEmpty() && m_recoveryLabel->isHidden())
+        TellStatus(reasons.back());
+    reasons << tr("Save often. It is tried again and again; when it works, this notice goes.");
+    m_recoveryLabel->setText(tr("Recovery after a crash does not work"));
+    m_recoveryLabel->setToolTip(KsVisibleText(reasons.join(u'\n'), true));
+    m_recoveryLabel->setAccessibleDescription(m_recoveryLabel->toolTip());
+    m_recoveryLabel->setVisible(reasons.size() > 1);
 }
 
 void CMainFrame::ActiveViewChanged(CView* view)
@@ -145,6 +162,7 @@ void CMainFrame::Retranslate()
     m_menus.Retranslate();
     MdiArea().SetHint(CMultiDocTemplate::All().empty() ? tr("No editor was found. See Help, Plug-ins.")
                                                        : tr("Open a file with File, Open, or drop it here."));
+    UpdateRecoveryLabel();
     UpdatePluginLabel();
     UpdateTitle();
 }
@@ -164,8 +182,8 @@ void CMainFrame::UpdateTitle()
     setWindowTitle(document ? QStringLiteral("%1 - [%2[*]]").arg(program, KsTitleText(document->GetTitle())) : program);
     setWindowModified(document && document->IsModified());
     const CProject* project = m_projects.Registry().FindByView(GetActiveView());
-    m_projectLabel->setText(project ? tr("Project: %1").arg(project->name) : QString());
-    m_projectLabel->setToolTip(project ? project->path : QString());
+    m_projectLabel->setText(project ? tr("Project: %1").arg(KsVisibleText(project->name)) : QString());
+    m_projectLabel->setToolTip(project ? KsVisibleText(QDir::toNativeSeparators(project->path)) : QString());
     m_projects.UpdateTree();
 }
 
@@ -176,8 +194,8 @@ void CMainFrame::UpdatePluginLabel()
     for (const auto& plugin : m_plugins.All()) {
         if (plugin->IsUsable())
             continue;
-        names << plugin->name;
-        reasons << plugin->name + QStringLiteral(": ") + plugin->error;
+        names << KsVisibleText(plugin->name);
+        reasons << KsVisibleText(plugin->name + QStringLiteral(": ") + plugin->error);
     }
     m_pluginLabel->setVisible(!names.isEmpty());
     m_pluginLabel->setText(tr("Not loaded: %1 (see Help, Plug-ins)").arg(names.join(QStringLiteral(", "))));

@@ -55,7 +55,7 @@ private:
     void Follow(const CMultiDocTemplate& documents);
     void DocumentShown(const CKsDoc* document);
     void DocumentRenamed(const QString& oldPath, const QString& newPath);
-    void NotKept(const CKsDoc* document, std::error_code why);
+    void UpdateRecoveryLabel();
     void Retranslate();
     void Update();
     void UpdateTitle();
@@ -74,5 +74,5 @@ private:
     CRecoveryFolder m_recoveryFolder;
     CSnapshots m_snapshots;
     CRecovery m_recovery;
-    QLabel *m_pluginLabel, *m_projectLabel;
+    QLabel *m_recoveryLabel, *m_pluginLabel, *m_projectLabel;
 };

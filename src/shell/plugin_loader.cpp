@@ -12,7 +12,9 @@
 #include <QLibrary>
 #include <QSettings>
 #include <QStringList>
+#include <QVariantMap>
 #include <exception>
+#include <optional>
 
 namespace {
 
@@ -57,28 +59,44 @@ void AskAtWork(const CPlugin& plugin, Call call)
         qWarning("%s: %s", qPrintable(plugin.file), qPrintable(thrown));
 }
 
-/// A version of a file, and then its path.
+// A trial takes time at the start, so it is made once of each version of a library, and what came of it is remembered:
+// by the path of the library its version and why it failed; no reason for one that has been in use.
+
+/// A program that is another may find the library another, too.
 QString VersionOf(const QFileInfo& file)
 {
-    return QStringLiteral("%1 %2 ").arg(file.size()).arg(file.lastModified().toMSecsSinceEpoch()) +
-           file.absoluteFilePath();
+    const QStringList parts{QString::number(file.size()), QString::number(file.lastModified().toMSecsSinceEpoch()),
+                            QCoreApplication::applicationVersion()};
+    return parts.join(u' ');
 }
 
-/// A trial takes time at the start, so it is made once of each version of a library: whatever was in use before is
-/// known.
+/// Nothing when this version of the library has not been tried.
+std::optional<QString> WhatCameOf(const QFileInfo& file)
+{
+    const QVariantMap tried = QSettings().value(Settings::TriedLibraries).toMap();
+    const QStringList known = tried.value(file.absoluteFilePath()).toStringList();
+    return known.value(0) == VersionOf(file) ? std::optional(known.value(1)) : std::nullopt;
+}
+
+void Remember(const QFileInfo& file, const QString& whyNot)
+{
+    if (WhatCameOf(file) == whyNot)
+        return;
+    QVariantMap tried = QSettings().value(Settings::TriedLibraries).toMap();
+    tried.removeIf([](const auto& library) { return !QFileInfo::exists(library.key()); });
+    tried[file.absoluteFilePath()] = QStringList{VersionOf(file), whyNot};
+    QSettings().setValue(Settings::TriedLibraries, tried);
+}
+
+/// Why a library cannot be used; empty when nothing speaks against it.
 QString WhyNotTried(const QFileInfo& file)
 {
-    const bool isKnown = QSettings().value(Settings::TriedLibraries).toStringList().contains(VersionOf(file));
-    return isKnown ? QString() : TryLibrary(file.absoluteFilePath());
-}
-
-void RememberTried(const QFileInfo& file)
-{
-    QStringList known = QSettings().value(Settings::TriedLibraries).toStringList();
-    if (known.contains(VersionOf(file)))
-        return;
-    known.removeIf([&](const QString& each) { return each.section(u' ', 2) == file.absoluteFilePath(); });
-    QSettings().setValue(Settings::TriedLibraries, known << VersionOf(file));
+    const std::optional<QString> known = WhatCameOf(file);
+    const QString why = known ? *known : TryLibrary(file.absoluteFilePath());
+    if (why.isEmpty())
+        return {};
+    Remember(file, why);
+    return PluginLoader::tr("%1. It is tried again when its file has changed").arg(why);
 }
 
 /// Loads a library, whose own initialisation runs within. Why that failed, for the user; empty when it did not.
@@ -93,7 +111,7 @@ QString LoadLibrary(QLibrary& library)
     bool loaded = false;
     why = WhatIsThrown([&] { loaded = library.load(); });
     if (loaded)
-        RememberTried(file);
+        Remember(file, {});
     return loaded || !why.isEmpty() ? why : library.errorString();
 }
 

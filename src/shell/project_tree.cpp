@@ -43,7 +43,7 @@ void CProjectTree::Show(const CProjects& projects, const State& state)
     const QString path = current ? current->data(0, PathRole).toString() : QString();
     m_tree->clear();
     for (const auto& project : projects.All()) {
-        auto* root = new QTreeWidgetItem(m_tree, {project->name});
+        auto* root = new QTreeWidgetItem(m_tree, {KsVisibleText(project->name)});
         root->setData(0, HandleRole, qlonglong(project->handle));
         root->setToolTip(0, KsVisibleText(QDir::toNativeSeparators(project->path)));
         for (const QString& member : project->members)
@@ -65,14 +65,15 @@ void CProjectTree::AddMember(QTreeWidgetItem& project, const QString& path, cons
     else if (state.kind == CMemberState::Unknown)
         text = tr("%1 (no editor)").arg(text);
     else if (!state.elsewhere.isEmpty())
-        text = tr("%1 (in %2)").arg(text, state.elsewhere); // the tree is narrow; the tip says it in full
+        text =
+            tr("%1 (in %2)").arg(text, KsVisibleText(state.elsewhere)); // the tree is narrow; the tip says it in full
     auto* item = new QTreeWidgetItem(&project, {text});
     item->setData(0, HandleRole, project.data(0, HandleRole));
     item->setData(0, PathRole, path);
     item->setIcon(0, state.icon);
     QString tip = KsVisibleText(QDir::toNativeSeparators(path));
     if (!state.elsewhere.isEmpty())
-        tip = tr("%1: open in the project %2").arg(tip, state.elsewhere);
+        tip = tr("%1: open in the project %2").arg(tip, KsVisibleText(state.elsewhere));
     if (!state.wayOut.isEmpty())
         tip += u'\n' + tr("This file is outside the project's folder.");
     item->setToolTip(0, tip);

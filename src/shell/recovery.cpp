@@ -26,6 +26,19 @@ CRecoverable::State StateOf(const CRecoveryHeader& header)
     return isSame ? CRecoverable::Same : CRecoverable::Changed;
 }
 
+/// Of a document that stands beside its file; files of one name in two folders are told apart by a number.
+QString FreeTitle(const QString& name)
+{
+    QString title = CRecovery::tr("%1 (recovered)").arg(name);
+    const auto isTaken = [&title](const CMultiDocTemplate* documents) {
+        return std::ranges::any_of(documents->findChildren<const CKsDoc*>(Qt::FindDirectChildrenOnly),
+                                   [&](const CKsDoc* each) { return each->GetTitle() == title; });
+    };
+    for (int number = 2; std::ranges::any_of(CMultiDocTemplate::All(), isTaken); ++number)
+        title = CRecovery::tr("%1 (recovered %2)").arg(name, QString::number(number));
+    return title;
+}
+
 } // namespace
 
 QString CRecoverable::Name() const
@@ -43,22 +56,24 @@ void CRecovery::Offer()
 std::vector<CRecoverable> CRecovery::Find()
 {
     std::vector<CRecoverable> found;
-    for (const QString& file : m_folder.TakeOver())
-        found.push_back(Look(file));
+    for (const QString& file : m_folder.TakeOver()) {
+        CRecoverable& item = found.emplace_back(CRecoverable{.file = file});
+        if (const auto header = ReadRecoveryHeader(file)) {
+            item.header = *header;
+            item.editor = m_plugins.TemplateFor(QStringLiteral("x") + header->extension);
+        } else {
+            item.state = CRecoverable::Damaged;
+        }
+    }
     std::ranges::stable_sort(found, std::greater(), [](const CRecoverable& item) { return item.header.time; });
     return found;
 }
 
-CRecoverable CRecovery::Look(const QString& file) const
+void CRecovery::Examine(CRecoverable& item) const
 {
-    CRecoverable item{.file = file};
-    const auto header = ReadRecoveryFile(file);
-    if (!header)
-        return item;
-    item.header = *header;
-    item.editor = m_plugins.TemplateFor(QStringLiteral("x") + header->extension);
-    item.state = item.editor ? StateOf(*header) : CRecoverable::NoEditor;
-    return item;
+    item.state = !ReadRecoveryFile(item.file) ? CRecoverable::Damaged
+                 : item.editor                ? StateOf(item.header)
+                                              : CRecoverable::NoEditor;
 }
 
 bool CRecovery::Open(const CRecoverable& item)
@@ -69,21 +84,33 @@ bool CRecovery::Open(const CRecoverable& item)
             tr("The changes to %1 could not be recovered: what was kept of them cannot be read.").arg(item.Name()));
         return false;
     }
-    const CKsDoc* open = item.state == CRecoverable::Same ? m_plugins.FindDocument(item.header.path) : nullptr;
-    const bool isBeside = StateOf(item.header) != CRecoverable::Same || (open && open->IsModified());
+    const bool isSame = StateOf(item.header) == CRecoverable::Same;
+    const CKsDoc* open = isSame ? m_plugins.FindDocument(item.header.path) : nullptr;
+    const bool isBeside = !isSame || (open && open->IsModified());
     CKsDoc* document = item.editor->OpenDocumentFile(&m_frame, isBeside ? QString() : item.header.path);
     if (!document)
         return false;
     if (!document->TakeContent(std::move(content), tr("Recovered changes"))) {
+        if (document != open)
+            Close(document);
         KsMessageBox(tr("The changes to %1 could not be recovered: what was kept of them is no file of this kind.")
                          .arg(item.Name()));
         return false;
     }
     if (isBeside && !item.header.path.isEmpty())
-        document->SetTitle(tr("%1 (recovered)").arg(QFileInfo(item.header.path).completeBaseName()));
+        document->SetTitle(FreeTitle(QFileInfo(item.header.path).completeBaseName()));
     if (CSnapshot* snapshot = m_snapshots.Of(document))
         snapshot->Continue(item.file);
     return true;
+}
+
+/// One that was opened for nothing.
+void CRecovery::Close(const CKsDoc* document)
+{
+    QList<QMdiSubWindow*> windows;
+    for (const CView* view : document->Views())
+        windows << CKsMDIChildWnd::Of(view);
+    m_frame.CloseWindows(windows);
 }
 
 std::optional<Differences> CRecovery::Compare(const CRecoverable& item) const
@@ -92,7 +119,7 @@ std::optional<Differences> CRecovery::Compare(const CRecoverable& item) const
     if (!item.CanOpen() || !ReadRecoveryFile(item.file, &content))
         return {};
     // Both as the editor writes them: what is written otherwise in the file is no change.
-    const bool hasFile = item.state == CRecoverable::Same || item.state == CRecoverable::Changed;
+    const bool hasFile = QFileInfo(item.header.path).isFile();
     const auto document = item.editor->ReadDocument(hasFile ? item.header.path : QString());
     Result<std::string> before = document ? document->ContentText() : Result<std::string>(Error{});
     if (!before)

@@ -20,6 +20,7 @@ struct CRecoverable
 {
     enum State
     {
+        Unknown,  // it has not been looked at: that takes as long as its files are large
         Damaged,  // the recovery file is not as it was written
         NoEditor, // that reads files of the kind
         New,      // the document never had a file
@@ -28,11 +29,11 @@ struct CRecoverable
         Missing   // its file is gone
     };
     QString file; // what keeps them
-    State state = Damaged;
+    State state = Unknown;
     CRecoveryHeader header{}; // of a file that is not damaged
     CMultiDocTemplate* editor = nullptr;
 
-    bool CanOpen() const { return editor != nullptr; }
+    bool CanOpen() const { return editor != nullptr && state != Damaged; }
     QString Name() const;
 };
 
@@ -49,8 +50,10 @@ public:
 
     /// Shows what can be recovered, if there is anything; not modal to the caller.
     void Offer();
-    /// What sessions that have ended left over.
+    /// What sessions that have ended left over, as far as the headers tell.
     std::vector<CRecoverable> Find();
+    /// Finds out the state by reading everything.
+    void Examine(CRecoverable& item) const;
     /// Opens the document with its changes: over its file when that is as the document knew it, otherwise beside it, as
     /// a new document. False when the user has been told why not.
     bool Open(const CRecoverable& item);
@@ -60,7 +63,7 @@ public:
     void Discard(const CRecoverable& item);
 
 private:
-    CRecoverable Look(const QString& file) const;
+    void Close(const CKsDoc* document);
 
     CKsMDIFrameWnd& m_frame;
     const CPlugins& m_plugins;

@@ -3,6 +3,7 @@
 #include "ks/fc/after_paint.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
+#include "ks/language/date_time.h"
 #include "shell/difference_dialog.h"
 #include "shell/plain_cell.h"
 
@@ -11,8 +12,8 @@
 #include <QDir>
 #include <QHeaderView>
 #include <QLabel>
-#include <QLocale>
 #include <QPushButton>
+#include <QSocketNotifier>
 #include <QTableWidget>
 #include <QTimer>
 #include <QVBoxLayout>
@@ -67,6 +68,8 @@ CRecoveryDialog::CRecoveryDialog(CRecovery& recovery, std::vector<CRecoverable> 
     Fill();
 }
 
+CRecoveryDialog::~CRecoveryDialog() = default;
+
 void CRecoveryDialog::Fill()
 {
     m_table->setRowCount(int(m_items.size()));
@@ -75,10 +78,7 @@ void CRecoveryDialog::Fill()
         const bool isDamaged = item.state == CRecoverable::Damaged;
         const QString path = QDir::toNativeSeparators(isDamaged ? item.file : item.header.path);
         m_table->setItem(row, Document, PlainCell(isDamaged ? tr("A damaged recovery file") : item.Name(), path));
-        m_table->setItem(row, Time,
-                         PlainCell(isDamaged
-                                       ? QString()
-                                       : QLocale().toString(item.header.time.toLocalTime(), QLocale::ShortFormat)));
+        m_table->setItem(row, Time, PlainCell(isDamaged ? QString() : KsDateTimeText(item.header.time.toLocalTime())));
         m_table->setItem(row, What, PlainCell(tr("Comparing...")));
     }
     m_table->resizeColumnsToContents();
@@ -88,21 +88,53 @@ void CRecoveryDialog::Fill()
     KsAfterPaint(m_table->viewport(), this, [this] { DescribeNext(); });
 }
 
-/// One line a turn of the event loop: a large file takes a moment.
+/// One line after the other, each in a copy of the process: a large file takes a moment, and nobody waits for it.
 void CRecoveryDialog::DescribeNext()
 {
     if (m_described >= m_items.size())
         return;
-    const CRecoverable& item = m_items[m_described];
-    const QString text = Description(item, m_recovery.Compare(item));
+    Result<ProcessCopy> look = ProcessCopy::Start([this] { return Look(m_items[m_described]); });
+    if (look)
+        m_look = std::move(look.value());
+    if (!m_look || m_look->Ended() == -1) {
+        Described();
+        return;
+    }
+    m_lookEnds = std::make_unique<QSocketNotifier>(m_look->Ended(), QSocketNotifier::Read);
+    connect(m_lookEnds.get(), &QSocketNotifier::activated, this, &CRecoveryDialog::Described);
+}
+
+void CRecoveryDialog::Described()
+{
+    if (m_lookEnds) {
+        m_lookEnds->setEnabled(false);       // before what it looks at is closed
+        m_lookEnds.release()->deleteLater(); // it is what calls
+    }
+    const ProcessCopy::Answer answer =
+        m_look ? m_look->Wait() : ProcessCopy::Answer(std::make_error_code(std::errc::interrupted));
+    m_look.reset();
+    CRecoverable& item = m_items[m_described];
+    if (!answer.error)
+        item.state = CRecoverable::State(std::clamp(answer.text.front() - '0', 0, int(CRecoverable::Missing)));
+    const QString text = answer.error ? tr("What differs is not known: it could not be looked at.")
+                                      : QString::fromStdString(answer.text.substr(1));
     m_table->setItem(int(m_described), What, PlainCell(text));
     m_table->resizeRowToContents(int(m_described));
+    UpdateButtons();
     ++m_described;
     QTimer::singleShot(0, this, &CRecoveryDialog::DescribeNext);
 }
 
-QString CRecoveryDialog::Description(const CRecoverable& item, const std::optional<Differences>& differences) const
+/// In the copy: the state, and behind it the description.
+ProcessCopy::Answer CRecoveryDialog::Look(CRecoverable item) const
 {
+    m_recovery.Examine(item);
+    return {{}, char('0' + item.state) + Description(item).toStdString()};
+}
+
+QString CRecoveryDialog::Description(const CRecoverable& item) const
+{
+    const auto differences = m_recovery.Compare(item);
     const QString what = differences ? CDifferenceDialog::Summary(*differences)
                                      : tr("What differs is not known: the file cannot be read.");
     switch (item.state) {
@@ -176,6 +208,11 @@ void CRecoveryDialog::Discard()
 /// The last one closes the dialog.
 void CRecoveryDialog::Remove(int row)
 {
+    if (std::size_t(row) == m_described && m_look) { // nobody wants to know any more
+        m_lookEnds.reset();
+        m_look.reset();
+        QTimer::singleShot(0, this, &CRecoveryDialog::DescribeNext);
+    }
     m_items.erase(m_items.begin() + row);
     m_described -= std::size_t(row) < m_described;
     m_table->removeRow(row);

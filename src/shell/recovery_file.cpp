@@ -93,6 +93,13 @@ std::error_code WriteRecoveryFile(const QString& file, const CRecoveryHeader& he
     return written.error().code ? written.error().code : std::make_error_code(std::errc::io_error);
 }
 
+std::optional<CRecoveryHeader> ReadRecoveryHeader(const QString& file)
+{
+    const Result<PrivateFile> opened = OpenPrivateFile(file.toStdString());
+    const std::optional<QJsonObject> json = opened ? ReadFirstLine(opened.value().stream.get()) : std::nullopt;
+    return json ? FromJson(*json) : std::nullopt;
+}
+
 std::optional<CRecoveryHeader> ReadRecoveryFile(const QString& file, std::string* content)
 {
     const Result<PrivateFile> opened = OpenPrivateFile(file.toStdString());

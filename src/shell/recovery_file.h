@@ -26,5 +26,8 @@ std::error_code WriteRecoveryFile(const QString& file, const CRecoveryHeader& he
 /// byte, as it was written.
 std::optional<CRecoveryHeader> ReadRecoveryFile(const QString& file, std::string* content = nullptr);
 
+/// The header alone, of a file that may hold anything behind it.
+std::optional<CRecoveryHeader> ReadRecoveryHeader(const QString& file);
+
 /// SHA-256 of an ordinary file's content; empty when it cannot be read.
 QByteArray FileHash(const QString& path);

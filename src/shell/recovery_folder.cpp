@@ -1,17 +1,21 @@
 #include "shell/recovery_folder.h"
 
+#include "files/platform_process.h"
+#include "files/private_folder.h"
+
 #include <QCoreApplication>
 #include <QDeadlineTimer>
 #include <QDir>
+#include <QFileInfo>
 #include <QStandardPaths>
 #include <QThread>
 #include <QUuid>
+#include <algorithm>
 
 namespace {
 
-constexpr char Lock[] = "/lock";
 const QString Files = QStringLiteral("*.recovery");
-const QString Temporaries = QStringLiteral(".kvr-*.tmp"); // of writers that were stopped
+const QString Temporaries = QStringLiteral(".kvr-*"); // of writers that were stopped
 
 /// Beside the settings: the folder for what a program keeps from one run to the next.
 QString StateFolder()
@@ -47,14 +51,16 @@ void RemoveTemporaries(const QString& folder)
         QFile::remove(file);
 }
 
-/// The folder goes unless there is something to recover in it.
-void Tidy(const QString& folder)
+FileLock LockOf(const QString& folder)
 {
-    RemoveTemporaries(folder);
-    if (!Entries(folder, Files).isEmpty())
-        return;
-    QFile::remove(folder + QLatin1String(Lock));
-    QDir().rmdir(folder);
+    return FileLock::Try((folder + QStringLiteral("/session")).toStdString(),
+                         QCoreApplication::applicationName().toStdString());
+}
+
+/// Whether the process that took a lock has ended, so that a copy of it is all that still holds it.
+bool IsOrphan(const FileLock& lock)
+{
+    return lock.HeldBy() && lock.HeldBy()->host == ThisProcess().host && HasEnded(lock.HeldBy()->process);
 }
 
 } // namespace
@@ -64,25 +70,58 @@ CRecoveryFolder::CRecoveryFolder() : m_root(StateFolder() + QStringLiteral("/rec
 CRecoveryFolder::~CRecoveryFolder()
 {
     if (m_own)
-        Tidy(m_own->folder);
-    for (const Session& session : m_others)
-        Tidy(session.folder);
+        Tidy(*m_own);
+    for (Session& session : m_others)
+        Tidy(session);
+}
+
+/// The folder goes unless there is something to recover in it.
+void CRecoveryFolder::Tidy(Session& session)
+{
+    RemoveTemporaries(session.folder);
+    if (!Entries(session.folder, Files).isEmpty())
+        return;
+    session.lock.Release();
+    QDir().rmdir(session.folder);
 }
 
 Result<QString> CRecoveryFolder::NewFile()
 {
     if (!m_own) {
-        const QString folder = m_root + u'/' + NewName();
-        if (const Result<void> made = MakePrivateFolder(m_root.toStdString()); !made)
-            return made.error();
-        if (const Result<void> made = MakePrivateFolder(folder.toStdString()); !made)
-            return made.error();
-        Result<ProcessLock> lock = ProcessLock::Take((folder + QLatin1String(Lock)).toStdString());
-        if (!lock)
-            return lock.error();
-        m_own = Session{folder, std::move(lock.value())};
+        Session session{.folder = m_root + u'/' + NewName()};
+        if (const Result<void> secured = Secure(session); !secured)
+            return secured.error();
+        m_own = std::move(session);
+    } else if (const Result<void> secured = Secure(*m_own); !secured) {
+        return secured.error();
     }
     return m_own->folder + u'/' + NewName() + QStringLiteral(".recovery");
+}
+
+Result<void> CRecoveryFolder::Secure(const QString& file)
+{
+    const QString folder = QFileInfo(file).path();
+    if (m_own && m_own->folder == folder)
+        return Secure(*m_own);
+    const auto other = std::ranges::find(m_others, folder, &Session::folder);
+    return other == m_others.end() ? Result<void>() : Secure(*other);
+}
+
+/// A folder that could not be held does not stay behind.
+Result<void> CRecoveryFolder::Secure(Session& session) const
+{
+    for (const QString& folder : {m_root, session.folder})
+        if (Result<void> made = MakePrivateFolder(folder.toStdString()); !made)
+            return made;
+    FileLock lock = LockOf(session.folder);
+    if (lock.HeldBy()) // by this session
+        return {};
+    if (!lock.IsHeld()) {
+        QDir().rmdir(session.folder);
+        return Error{.message = "The folder of the session cannot be held.", .code = lock.WhyNone()};
+    }
+    session.lock = std::move(lock);
+    return {};
 }
 
 /// Nothing for the folder of a session that lives.
@@ -90,14 +129,15 @@ std::optional<CRecoveryFolder::Session> CRecoveryFolder::Hold(const QString& fol
 {
     if (!MakePrivateFolder(folder.toStdString()))
         return {};
-    const std::string path = (folder + QLatin1String(Lock)).toStdString();
     constexpr int patience = 5000, pause = 20; // milliseconds, for what a session that has ended is still writing
     const QDeadlineTimer deadline(patience);
     while (true) {
-        if (Result<ProcessLock> lock = ProcessLock::Take(path))
-            return Session{folder, std::move(lock.value())};
-        else if (lock.error().code != std::errc::device_or_resource_busy || !ProcessLock::IsOrphan(path) ||
-                 deadline.hasExpired())
+        FileLock lock = LockOf(folder);
+        if (lock.IsHeld())
+            return Session{folder, std::move(lock)};
+        if (lock.WhyNone())
+            QDir().rmdir(folder); // that of a session that could not begin
+        if (!IsOrphan(lock) || deadline.hasExpired())
             return {};
         QThread::msleep(pause);
     }
@@ -127,7 +167,7 @@ QStringList CRecoveryFolder::TakeOver()
         std::optional<Session> session = Hold(folder);
         if (!session)
             continue;
-        Tidy(folder);
+        Tidy(*session);
         const QStringList left = Entries(folder, Files);
         if (left.isEmpty())
             continue;

@@ -1,7 +1,7 @@
 // Where the program keeps what has not been saved, for the case that it ends without being asked to.
 #pragma once
 
-#include "files/private_folder.h"
+#include "files/file_lock.h"
 
 #include <QString>
 #include <QStringList>
@@ -21,6 +21,8 @@ public:
 
     /// The path of a file that is not there yet, in this session's folder.
     Result<QString> NewFile();
+    /// Has the folder of a file that this session holds stand and be held: somebody may have removed it.
+    Result<void> Secure(const QString& file);
     /// Told of each writer. What one that was stopped leaves half done goes when none is at work.
     void WriterStarts() { ++m_writers; }
     void WriterEnds(bool stopped);
@@ -31,9 +33,11 @@ private:
     struct Session
     {
         QString folder;
-        ProcessLock lock;
+        FileLock lock{};
     };
     static std::optional<Session> Hold(const QString& folder);
+    static void Tidy(Session& session);
+    Result<void> Secure(Session& session) const;
 
     QString m_root;
     std::optional<Session> m_own; // made when first needed

@@ -2,10 +2,10 @@
 
 #include "files/platform_process.h"
 #include "ks/language/language.h"
+#include "shell/application.h"
 #include "shell/main_frame.h"
 #include "shell/settings_keys.h"
 
-#include <QApplication>
 #include <QCommandLineParser>
 #include <QDir>
 #include <QLocale>
@@ -35,7 +35,7 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
     QCoreApplication::setOrganizationName(QStringLiteral("KVR"));
     QCoreApplication::setApplicationName(QStringLiteral("KVR Shell"));
     QCoreApplication::setApplicationVersion(QStringLiteral(KVR_VERSION));
-    QApplication app(argc, argv);
+    CApplication app(argc, argv);
 
     KsLanguage::Instance().SetCurrent(StartLanguage());
     KsLangLoadResDll("ks", nullptr, 0);
@@ -65,5 +65,5 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
     QTimer::singleShot(0, &frame, &CMainFrame::OfferRecovery);
     if (onStarted)
         QTimer::singleShot(0, &frame, [&] { onStarted(frame); });
-    return QApplication::exec();
+    return CApplication::exec();
 }

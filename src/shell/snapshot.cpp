@@ -8,6 +8,7 @@
 #include <QFile>
 #include <QSocketNotifier>
 #include <QUndoStack>
+#include <new>
 #include <utility>
 
 namespace {
@@ -39,6 +40,7 @@ CSnapshot::CSnapshot(CKsDoc& document, CRecoveryFolder& folder, std::chrono::mil
 
 CSnapshot::~CSnapshot()
 {
+    blockSignals(true); // there is nothing to ask it any more
     Drop();
 }
 
@@ -58,7 +60,7 @@ void CSnapshot::StepMade()
 {
     if (m_document.UndoStack().isClean())
         return;
-    if (++m_steps >= Steps && !m_fails)
+    if (++m_steps >= Steps && !m_failure)
         Write();
     else if (!m_timer.isActive())
         m_timer.start(m_delay);
@@ -80,32 +82,43 @@ void CSnapshot::Write()
         m_timer.start(pause);
         return;
     }
+    std::error_code failure;
+    try {
+        failure = StartWriter();
+    } catch (const std::bad_alloc&) {
+        failure = std::make_error_code(std::errc::not_enough_memory);
+    }
+    if (failure)
+        Fail(failure);
+}
+
+std::error_code CSnapshot::StartWriter()
+{
     if (m_file.isEmpty()) {
-        const Result<QString> file = m_folder.NewFile();
-        if (!file) {
-            Fail(file.error().code);
-            return;
-        }
-        m_file = file.value();
+        Result<QString> file = m_folder.NewFile();
+        if (!file)
+            return file.error().code;
+        m_file = std::move(file.value());
+    } else if (const Result<void> secured = m_folder.Secure(m_file); !secured) {
+        return secured.error().code;
     }
     const CRecoveryHeader header{.path = m_document.GetPathName(),
                                  .extension = m_document.GetDocTemplate()->GetDocString(CMultiDocTemplate::filterExt),
                                  .title = m_document.GetTitle(),
                                  .time = QDateTime::currentDateTimeUtc()};
     Result<ProcessCopy> writer = ProcessCopy::Start([&] { return WriteContent(m_document, header, m_file); });
-    if (!writer) {
-        Fail(writer.error().code);
-        return;
-    }
+    if (!writer)
+        return writer.error().code;
     m_steps = 0;
     m_writer = std::move(writer.value());
     m_folder.WriterStarts();
     if (m_writer->Ended() == -1) {
         WriterEnded();
-        return;
+        return {};
     }
     m_writerEnds = std::make_unique<QSocketNotifier>(m_writer->Ended(), QSocketNotifier::Read);
     connect(m_writerEnds.get(), &QSocketNotifier::activated, this, &CSnapshot::WriterEnded);
+    return {};
 }
 
 void CSnapshot::WriterEnded()
@@ -114,21 +127,21 @@ void CSnapshot::WriterEnded()
         m_writerEnds->setEnabled(false);       // before what it looks at is closed
         m_writerEnds.release()->deleteLater(); // it is what calls
     }
-    const std::error_code answer = m_writer->Wait();
+    const std::error_code answer = m_writer->Wait().error;
     m_writer.reset();
     m_folder.WriterEnds(bool(answer));
     if (answer) {
         Fail(answer);
         return;
     }
-    m_fails = false;
+    SetFailure({});
     if (m_steps >= Steps)
         Write();
     else if (m_steps > 0 && !m_timer.isActive())
         m_timer.start(m_delay);
 }
 
-/// The file is as far behind as before. It is tried again, and told once; not of an editor that has no part in this.
+/// The file is as far behind as before. It is tried again; not of an editor that has no part in this.
 void CSnapshot::Fail(std::error_code why)
 {
     if (why == std::errc::operation_not_supported) {
@@ -138,8 +151,13 @@ void CSnapshot::Fail(std::error_code why)
         return;
     }
     m_timer.start(m_delay);
-    if (!std::exchange(m_fails, true))
-        emit Failed(why);
+    SetFailure(why);
+}
+
+void CSnapshot::SetFailure(std::error_code why)
+{
+    if (std::exchange(m_failure, why) != why)
+        emit FailureChanged();
 }
 
 /// Nothing is left to save, or nobody wants it.
@@ -156,4 +174,5 @@ void CSnapshot::Drop()
     }
     if (!m_file.isEmpty())
         QFile::remove(std::exchange(m_file, QString()));
+    SetFailure({});
 }

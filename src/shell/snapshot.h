@@ -33,23 +33,28 @@ public:
     const QString& File() const { return m_file; } // empty until it is first needed
     bool IsWriting() const { return m_writer.has_value(); }
 
+    /// Why the changes are not kept; none while they are, or there are none.
+    std::error_code Failure() const { return m_failure; }
+
 signals:
-    void Failed(std::error_code why);
+    void FailureChanged();
 
 private:
     void StepMade();
     void StateChanged();
     void Write();
+    std::error_code StartWriter();
     void WriterEnded();
     void Fail(std::error_code why);
+    void SetFailure(std::error_code why);
     void Drop();
 
     CKsDoc& m_document;
     CRecoveryFolder& m_folder;
     std::chrono::milliseconds m_delay;
     QTimer m_timer;
-    int m_steps = 0;      // that the file, or who writes it, does not know of
-    bool m_fails = false; // and has been told
+    int m_steps = 0; // that the file, or who writes it, does not know of
+    std::error_code m_failure;
     QString m_file;
     std::optional<ProcessCopy> m_writer;
     std::unique_ptr<QSocketNotifier> m_writerEnds;

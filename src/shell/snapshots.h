@@ -4,6 +4,8 @@
 #include "shell/snapshot.h"
 
 #include <map>
+#include <utility>
+#include <vector>
 
 class CMultiDocTemplate;
 
@@ -21,11 +23,15 @@ public:
     /// Of documents that are opened from now on; for tests.
     void SetDelay(std::chrono::milliseconds delay) { m_delay = delay; }
 
+    /// The documents whose changes are not kept, and why.
+    std::vector<std::pair<const CKsDoc*, std::error_code>> Failures() const;
+
 signals:
-    void Failed(const CKsDoc* document, std::error_code why);
+    void FailuresChanged();
 
 private:
     void Open(CKsDoc* document);
+    void Close(const CKsDoc* document);
 
     CRecoveryFolder& m_folder;
     std::chrono::milliseconds m_delay = CSnapshot::Delay;

@@ -1,11 +1,14 @@
-#include "files/private_folder.h"
+#include "files/file_lock.h"
+#include "files/platform_process.h"
 #include "files/process_copy.h"
 #include "test_folder.h"
 
 #include <chrono>
+#include <cstdlib>
 #include <fstream>
 #include <gtest/gtest.h>
 #include <new>
+#include <optional>
 #include <thread>
 
 namespace {
@@ -48,7 +51,7 @@ TEST(ProcessCopy, WorksOnWhatWasWhileTheProcessGoesOn)
     ASSERT_TRUE(copy);
     value = 2;
     Mark(go, 0);
-    EXPECT_FALSE(copy->Wait());
+    EXPECT_FALSE(copy->Wait().error);
     int seen = 0;
     std::ifstream(result) >> seen;
     EXPECT_EQ(seen, 1);
@@ -56,13 +59,40 @@ TEST(ProcessCopy, WorksOnWhatWasWhileTheProcessGoesOn)
 
 TEST(ProcessCopy, AnswersWhyItFailed)
 {
-    const std::pair<std::function<std::error_code()>, std::errc> cases[] = {
+    using Answer = ProcessCopy::Answer;
+    const std::string longText(10000, 'x');
+    const struct
+    {
+        std::function<Answer()> work;
+        std::errc error;
+        std::string text{};
+    } cases[] = {
         {[] { return std::make_error_code(std::errc::no_space_on_device); }, std::errc::no_space_on_device},
-        {[]() -> std::error_code { throw std::bad_alloc(); }, std::errc::not_enough_memory},
-        {[]() -> std::error_code { throw 1; }, std::errc::io_error},
-        {[]() -> std::error_code { std::abort(); }, std::errc::interrupted}};
-    for (const auto& [work, answer] : cases)
-        EXPECT_EQ(ProcessCopy::Start(work)->Wait(), answer);
+        {[] { return Answer(std::make_error_code(std::errc::io_error), "in words"); }, std::errc::io_error, "in words"},
+        {[&] { return Answer({}, longText); }, std::errc(), longText.substr(0, 4088)},
+        {[]() -> Answer { throw std::bad_alloc(); }, std::errc::not_enough_memory},
+        {[]() -> Answer { throw 1; }, std::errc::io_error},
+        {[]() -> Answer { std::abort(); }, std::errc::interrupted, "Aborted"},
+        {[]() -> Answer { std::_Exit(0); }, std::errc::interrupted}};
+    for (const auto& [work, error, text] : cases) {
+        Result<ProcessCopy> copy = ProcessCopy::Start(work);
+        EXPECT_EQ(copy->Wait(5s).error, error);
+        EXPECT_EQ(copy->Wait().text, text);
+    }
+    // One that would never end, and has started something that goes on.
+    const auto begin = std::chrono::steady_clock::now();
+    EXPECT_EQ(ProcessCopy::Start([]() -> Answer {
+                  const auto more = ProcessCopy::Start([]() -> Answer {
+                      std::this_thread::sleep_for(3s);
+                      return {};
+                  });
+                  std::this_thread::sleep_for(1h);
+                  return {};
+              })
+                  ->Wait(200ms)
+                  .error,
+              std::errc::timed_out);
+    EXPECT_LT(std::chrono::steady_clock::now() - begin, 2s);
 }
 
 TEST(ProcessCopy, StopsAtOnceAndNothingOfItComesLater)
@@ -81,27 +111,27 @@ TEST(ProcessCopy, StopsAtOnceAndNothingOfItComesLater)
     EXPECT_FALSE(Exists(late));
 }
 
-TEST(ProcessLock, IsHeldUntilTheLastCopyOfADeadProcessHasEnded)
+TEST(FileLock, IsHeldUntilTheLastCopyOfADeadProcessHasEnded)
 {
     const TestFolder folder;
-    const std::string path = folder.Path("lock"), go = folder.Path("go");
+    const std::string path = folder.Path("session"), go = folder.Path("go");
+    const auto take = [&] { return FileLock::Try(path, "test"); };
     const auto hold = [&] { // and die, with a copy still at work
-        static std::optional<ProcessLock> lock;
+        static std::optional<FileLock> lock;
         static std::optional<ProcessCopy> copy;
-        lock = std::move(ProcessLock::Take(path).value());
+        lock = take();
         copy = std::move(ProcessCopy::Start([&] {
                              Comes([&] { return Exists(go); });
                              return std::error_code();
                          }).value());
         return std::error_code();
     };
-    EXPECT_FALSE(ProcessCopy::Start(hold)->Wait());
-    EXPECT_EQ(ProcessLock::Take(path).error().code, std::errc::device_or_resource_busy);
-    EXPECT_TRUE(ProcessLock::IsOrphan(path));
+    EXPECT_FALSE(ProcessCopy::Start(hold)->Wait().error);
+    ASSERT_TRUE(take().HeldBy());
+    EXPECT_TRUE(HasEnded(take().HeldBy()->process));
     Mark(go, 0);
-    EXPECT_TRUE(Comes([&] { return bool(ProcessLock::Take(path)); }));
-    const Result<ProcessLock> own = ProcessLock::Take(path);
-    ASSERT_TRUE(own);
-    EXPECT_FALSE(ProcessLock::IsOrphan(path));
-    EXPECT_EQ(ProcessLock::Take(path).error().code, std::errc::device_or_resource_busy);
+    EXPECT_TRUE(Comes([&] { return take().IsHeld(); }));
+    const FileLock own = take();
+    ASSERT_TRUE(own.IsHeld() && take().HeldBy());
+    EXPECT_FALSE(HasEnded(take().HeldBy()->process));
 }

@@ -224,8 +224,8 @@ TEST_F(SafeFile, ShortWritesAreContinuedAndStepsComeInOrder)
     ASSERT_TRUE(WriteFileSafely(Path("a.hdkv"), "longer than sixteen", {.platform = &platform}));
     EXPECT_EQ(Text("a.hdkv"), "longer than sixteen");
     EXPECT_EQ(platform.calls, (std::vector<std::string>{"Status", "CheckWritable", "List", "Create", "Lock", "Write",
-                                                        "Write", "TakePermissions", "Sync", "Close", "Exchange",
-                                                        "Status", "SyncFolder", "Remove"}));
+                                                        "Write", "TakePermissions", "Sync", "Close", "RenameNew",
+                                                        "Exchange", "Status", "RenameNew", "SyncFolder", "Remove"}));
     platform.calls.clear();
     ASSERT_TRUE(WriteFileSafely(Path("new.hdkv"), "x", {.sync = false, .platform = &platform}));
     EXPECT_EQ(platform.calls, (std::vector<std::string>{"Status", "List", "Create", "Lock", "Write",
@@ -371,6 +371,34 @@ TEST_F(SafeFile, LeftOverTemporariesGoWhenTheyAreOld)
     PlatformFile::Native().Close(used);
     EXPECT_EQ(Names(),
               (std::vector<std::string>{".kvr-1.tmp", ".kvr-42.tmp", ".kvr-mine.tmp", "a.hdkv", "kvr-42.tmp"}));
+}
+
+// A last moment in which somebody writes, or in which the system does not say whether anybody did: what was swapped out
+// stays, whatever fails and however old it gets.
+TEST_F(SafeFile, WhatIsSwappedOutIsNoLeftOver)
+{
+    for (const char* failing : {"RenameNew", "Status"}) {
+        Empty();
+        Write("a.hdkv", "old");
+        FaultyPlatform platform;
+        bool swapped = false;
+        platform.fault = [&](const std::string& call) {
+            if (call == "Exchange" && failing == std::string("RenameNew"))
+                Write("a.hdkv", "theirs");
+            const bool fails = swapped && call == failing;
+            swapped = swapped || call == "Exchange";
+            return fails ? std::error_code(EIO, std::generic_category()) : std::error_code();
+        };
+        const auto written = WriteFileSafely(Path("a.hdkv"), "new", {.platform = &platform});
+        ASSERT_TRUE(written);
+        const auto& [unconfirmed, lost, displaced, unknown, notRenamed, version, inPlace] = written.value();
+        EXPECT_EQ(unknown.value(), failing == std::string("Status") ? EIO : 0);
+        platform.fault = [](const std::string&) { return std::error_code(); };
+        platform.aged = std::int64_t(7200) * 1'000'000'000;
+        ASSERT_TRUE(WriteFileSafely(Path("b.hdkv"), "x", {.platform = &platform}));
+        EXPECT_EQ(ReadText(PathFromUtf8(displaced)), unknown ? "old" : "theirs") << displaced;
+        EXPECT_EQ(FileCount(), 3u);
+    }
 }
 
 // Where a replacement can fail half way, the finished temporary file may be the only copy there is.

@@ -132,6 +132,22 @@ class Recovery(Case):
         self.assertEqual(editor.table().cell(1, 3).name, '2.625')
         self.assertEqual(self.saved().text, other)
 
+    def test_what_cannot_be_kept_is_told_until_it_can(self):
+        notice = '^Recovery after a crash does not work'
+        editor = self.open()
+        folder = f'{self.folder}/state/KVR/KVR Shell'
+        os.makedirs(folder, exist_ok=True)
+        samples.write(f'{folder}/recovery', 'no folder')
+        editor.put(1, 3, '2.625')
+        label = editor.frame.find('label', notice, seconds=WAIT)
+        self.assertIn('The changes to moor.HDKV cannot be kept', label.description)
+        editor.put(1, 3, '2.75')
+        self.assertTrue(label.shown)
+        os.remove(f'{folder}/recovery')
+        self.wait_until_kept('moor.HDKV', '2.75')
+        wait_for(lambda: not editor.frame.all('label', notice), 'the notice goes')
+        self.assert_no_message()
+
     def test_a_clean_end_leaves_nothing(self):
         editor = self.open()
         editor.put(1, 3, '2.625')

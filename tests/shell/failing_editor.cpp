@@ -1,8 +1,10 @@
 // An editor that fails as it is loaded (FAILS_AT_LOAD: how), or at every question.
 #include "ks/fc/plugin.h"
 
+#include <chrono>
 #include <cstdlib>
 #include <stdexcept>
+#include <thread>
 
 #ifdef FAILS_AT_LOAD
 namespace {

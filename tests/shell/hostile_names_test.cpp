@@ -26,6 +26,20 @@ QStringList RichTexts(const QWidget& window)
     return rich;
 }
 
+/// What of a window turns the direction of writing.
+std::string TurnedTexts(const QWidget& window)
+{
+    QStringList turned;
+    for (const QWidget* widget : window.findChildren<QWidget*>()) {
+        const auto* label = qobject_cast<const QLabel*>(widget);
+        for (const QString& text : {label ? label->text() : QString(), widget->toolTip(), widget->statusTip(),
+                                    widget->accessibleName(), widget->accessibleDescription(), widget->windowTitle()})
+            if (text.contains(QChar(0x202E)))
+                turned << widget->metaObject()->className() + (": " + text);
+    }
+    return turned.join(u'\n').toStdString();
+}
+
 /// The label of the tool tip that stands on the screen; null for none.
 const QLabel* ToolTipLabel()
 {
@@ -101,7 +115,11 @@ TEST_F(ShellTest, AMessageIsTextThatFitsOnAScreen)
 TEST_F(ShellTest, TurnedWritingIsSeenInTitles)
 {
     const QString file = "a\u202Efdp\u2066\n.tst";
+    Write("b\u202E.tst");
+    ASSERT_TRUE(frame->OpenFile(WriteProject("p\u202Eprvk.kvrp", "File = <b\u202E.tst>\n")));
+    EXPECT_EQ(TurnedTexts(*frame), "");
     ASSERT_TRUE(frame->OpenFile(Write(file)));
+    EXPECT_EQ(TurnedTexts(*frame), "");
     EXPECT_TRUE(frame->windowTitle().contains("a\uFFFDfdp\uFFFD\uFFFD.tst")) << frame->windowTitle().toStdString();
     EXPECT_TRUE(ViewOf(file)->GetDocument()->DoSave(Path(file))) << "the name is what it was";
     EXPECT_TRUE(QFile::exists(Path(file)));
@@ -136,7 +154,7 @@ TEST(HostileNames, NoEditorTakesThemForMarkup)
         QFile example(QStringLiteral(KVR_SOURCE_DIR "/examples/river/") + file), copy(folder.filePath(file));
         ASSERT_TRUE(example.open(QIODevice::ReadOnly) && copy.open(QIODevice::WriteOnly));
         copy.write(example.readAll()
-                       .replace("\"AELDER UPPER\"", '"' + Name.toUtf8() + '"')
+                       .replace("\"AELDER UPPER\"", '"' + Name.toUtf8() + "\u202E\"")
                        .replace("\"SURVEY 2019\"", "\"<i>S&amp;</i>\""));
     }
     QSettings().clear();
@@ -161,6 +179,7 @@ TEST(HostileNames, NoEditorTakesThemForMarkup)
                     sheet->setCurrentIndex(page);
                 QCoreApplication::processEvents();
                 EXPECT_EQ(RichTexts(frame), QStringList());
+                EXPECT_EQ(TurnedTexts(frame), "");
             }
             for (const QLabel* label : window->findChildren<QLabel*>())
                 seen = seen || label->text().contains(QString(Name).replace("&", "&&"));

@@ -1,10 +1,14 @@
 #include "shell_fixture.h"
 
+#include <QElapsedTimer>
+#include <QImage>
 #include <QLabel>
 #include <QLibrary>
 #include <QTimer>
 #include <QTreeWidget>
+#include <algorithm>
 #include <chrono>
+#include <cmath>
 #include <future>
 #include <thread>
 
@@ -17,6 +21,22 @@ const CPlugin* Named(const std::vector<std::unique_ptr<CPlugin>>& plugins, const
             return plugin.get();
     }
     return nullptr;
+}
+
+/// Between the lightest and the darkest of a picture.
+double Contrast(const QImage& picture)
+{
+    double lightest = 0, darkest = 1;
+    for (int y = 0; y < picture.height(); ++y)
+        for (int x = 0; x < picture.width(); ++x) {
+            const auto linear = [](float part) { return std::pow((part + 0.055) / 1.055, 2.4); };
+            const QColor color = picture.pixelColor(x, y);
+            const double light =
+                0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
+            lightest = std::max(lightest, light);
+            darkest = std::min(darkest, light);
+        }
+    return (lightest + 0.05) / (darkest + 0.05);
 }
 
 } // namespace
@@ -66,7 +86,7 @@ TEST_F(ShellTest, AFolderMayHoldAnything)
 
 TEST_F(ShellTest, AnEditorThatFailsIsNamedAndTheOthersWork)
 {
-    for (const char* name : {"fails_at_load", "ends_at_load", "fails_when_asked"})
+    for (const char* name : {"fails_at_load", "ends_at_load", "leaves_at_load", "stays_at_load", "fails_when_asked"})
         QFile::copy(QStringLiteral(FAILING_EDITORS "/%1.so").arg(name), Path(QStringLiteral("%1.so").arg(name)));
     QFile whole(TEST_EDITORS "/test_editor.so");
     ASSERT_TRUE(whole.open(QIODevice::ReadOnly));
@@ -86,8 +106,11 @@ TEST_F(ShellTest, AnEditorThatFailsIsNamedAndTheOthersWork)
     EXPECT_EQ(loaded.Load(folder.path()).size(), 1u);
     const auto& plugins = loaded.All();
     EXPECT_EQ(Named(plugins, "fails_at_load")->error,
-              "It could not be loaded: it failed with the error \"no map of the sea\"");
-    EXPECT_TRUE(Named(plugins, "ends_at_load")->error.contains("ended the program that tried it"));
+              "It could not be loaded: it failed with the error \"no map of the sea\". It is tried again when its file "
+              "has changed");
+    EXPECT_TRUE(Named(plugins, "ends_at_load")->error.contains("it ended the program that tried it ("));
+    EXPECT_TRUE(Named(plugins, "leaves_at_load")->error.contains("it ended the program that tried it."));
+    EXPECT_TRUE(Named(plugins, "stays_at_load")->error.contains("did not end within 5 seconds"));
     EXPECT_EQ(Named(plugins, "fails_when_asked")->error,
               "It could not be loaded: it failed with an error that it does not name");
     EXPECT_EQ(Named(plugins, "fails_when_asked")->name, "fails_when_asked");
@@ -96,6 +119,19 @@ TEST_F(ShellTest, AnEditorThatFailsIsNamedAndTheOthersWork)
     EXPECT_EQ(Named(plugins, "cut_4096")->error,
               "It could not be loaded: the file is cut off, it holds only 4096 bytes");
     EXPECT_TRUE(Named(plugins, "zz_editor")->IsUsable());
+
+    // What failed is known at the next start, which does not wait for it, until there is another file.
+    QElapsedTimer time;
+    time.start();
+    CPlugins again;
+    EXPECT_EQ(again.Load(folder.path()).size(), 1u);
+    EXPECT_LT(time.elapsed(), 3000);
+    for (const char* name : {"fails_at_load", "ends_at_load", "leaves_at_load", "stays_at_load"})
+        EXPECT_EQ(Named(again.All(), name)->error, Named(plugins, name)->error);
+    QFile::remove(Path("stays_at_load.so"));
+    whole.copy(Path("stays_at_load.so"));
+    CPlugins mended;
+    EXPECT_EQ(mended.Load(folder.path()).size(), 2u);
 
     // The system's loader still serves other threads.
     std::promise<bool> served;
@@ -113,4 +149,12 @@ TEST_F(ShellTest, AShellWithoutEditorsSaysSo)
     EXPECT_FALSE(empty.findChild<QAction*>("actionNew")->isEnabled());
     EXPECT_FALSE(empty.OpenFile(Write("a.tst")));
     EXPECT_TRUE(asked.takeLast().contains("a.tst"));
+    // Its hint can be read on any ground.
+    empty.show();
+    for (const QRgb ground : {0xffeff0f1, 0xff2a2e32}) {
+        QApplication::setPalette(QPalette(QColor(ground)));
+        QCoreApplication::processEvents();
+        EXPECT_GE(Contrast(empty.MdiArea().viewport()->grab().toImage()), 4.5) << std::hex << ground;
+    }
+    QApplication::setPalette(QPalette());
 }

@@ -8,7 +8,9 @@
 #include <QJsonObject>
 #include <QLabel>
 #include <QPushButton>
+#include <QRegularExpression>
 #include <QTableWidget>
+#include <sys/resource.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -41,7 +43,7 @@ QStringList Kept()
     for (QDirIterator each(Folder(), QDir::Files | QDir::Hidden | QDir::System, QDirIterator::Subdirectories);
          each.hasNext();)
         files << each.next();
-    files.removeIf([](const QString& file) { return file.endsWith("/lock"); });
+    files.removeIf([](const QString& file) { return file.endsWith(".lock"); });
     return files;
 }
 
@@ -94,7 +96,15 @@ protected:
                 document->SetModifiedFlag(false);
         Restart();
         frame->Snapshots().SetDelay(10ms);
-        return frame->Recovery().Find();
+        return Find();
+    }
+    /// What can be recovered, looked at.
+    std::vector<CRecoverable> Find()
+    {
+        auto found = frame->Recovery().Find();
+        for (CRecoverable& item : found)
+            frame->Recovery().Examine(item);
+        return found;
     }
 
 private:
@@ -218,8 +228,9 @@ TEST_F(RecoveryTest, EveryKindOfDocumentComesBackModifiedAndUndoable)
 TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
 {
     const QString changed = Write("changed.HDKV", HDText), missing = Write("missing.HDKV", HDText),
-                  edited = Write("edited.HDKV", HDText), early = Write("early.HDKV", HDText);
-    for (const QString& path : {changed, missing, edited, early}) {
+                  edited = Write("edited.HDKV", HDText), early = Write("early.HDKV", HDText),
+                  twin = Write("other/changed.HDKV", HDText);
+    for (const QString& path : {changed, missing, edited, early, twin}) {
         CKsDoc* document = Open(path);
         if (path == early)
             Write("early.HDKV", QByteArray(HDText).replace("30", "31")); // before anything is kept
@@ -234,10 +245,12 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
         }
     const QByteArray others = QByteArray(HDText).replace("1.5", "1.7"); // of the same length
     Write("changed.HDKV", others);
+    Write("other/changed.HDKV", others);
     QFile::remove(missing);
 
     const auto found = Crash();
-    ASSERT_EQ(found.size(), 5u);
+    ASSERT_EQ(found.size(), 6u);
+    QStringList titles;
     Change(Open(edited), "1.5", "7.5");
     for (const CRecoverable& item : found) {
         const QString name = item.header.path.isEmpty() ? "new" : QFileInfo(item.header.path).completeBaseName();
@@ -252,12 +265,15 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
         EXPECT_EQ(document->GetPathName(), QString()) << name.toStdString();
         EXPECT_TRUE(document->IsModified());
         if (name != "new") {
-            EXPECT_EQ(document->GetTitle(), name + " (recovered)");
+            titles << document->GetTitle();
             EXPECT_NE(TextOf(document).find("G_waterlevel = 2.5"), std::string::npos);
         } else {
             EXPECT_NE(TextOf(document).find("[Mine]"), std::string::npos);
         }
     }
+    titles.sort();
+    EXPECT_EQ(titles.join(", "), "changed (recovered 2), changed (recovered), early (recovered), edited (recovered), "
+                                 "missing (recovered)");
     EXPECT_EQ(Content(changed), others);
 }
 
@@ -312,13 +328,18 @@ TEST_F(RecoveryTest, ADamagedFileDoesNoHarm)
     ASSERT_EQ(::mkfifo((left + "/pipe.recovery").toUtf8(), 0600), 0);
     write("unknown.recovery", header("extension", ".abc").replace("a.HDKV", "a.abc"));
     write("good.recovery", good);
+    EXPECT_FALSE(WriteRecoveryFile(left + "/other.recovery",
+                                   {.extension = ".HDKV", .title = "x", .time = QDateTime::currentDateTime()},
+                                   "[KAVO0_HD]"));
 
-    const auto found = frame->Recovery().Find();
-    EXPECT_EQ(found.size(), std::size(cases) + 4);
+    const auto found = Find();
+    const auto windows = frame->MdiArea().subWindowList();
+    EXPECT_EQ(found.size(), std::size(cases) + 5);
     for (const CRecoverable& item : found) {
         const QString name = QFileInfo(item.file).completeBaseName();
         EXPECT_EQ(item.state, name == "good"      ? CRecoverable::Same
                               : name == "unknown" ? CRecoverable::NoEditor
+                              : name == "other"   ? CRecoverable::New
                                                   : CRecoverable::Damaged)
             << name.toStdString();
         if (name == "good")
@@ -326,6 +347,8 @@ TEST_F(RecoveryTest, ADamagedFileDoesNoHarm)
         asked.clear();
         EXPECT_FALSE(frame->Recovery().Open(item)) << name.toStdString();
         EXPECT_EQ(asked.size(), 1);
+        Settle();
+        EXPECT_EQ(frame->MdiArea().subWindowList(), windows) << "none is opened for nothing";
         frame->Recovery().Discard(item);
         EXPECT_FALSE(QFileInfo(item.file).isSymLink() || QFileInfo::exists(item.file)) << name.toStdString();
     }
@@ -337,8 +360,6 @@ TEST_F(ShellTest, ADocumentOfAnEditorWithoutRecoveryIsLeftAlone)
     QDir(Folder()).removeRecursively();
     frame->OpenFile(Write("a.tst"));
     CKsDoc* document = frame->ActiveDocument();
-    QStringList failures;
-    QObject::connect(&frame->Snapshots(), &CSnapshots::Failed, [&] { failures << "failed"; });
     const auto change = [&] {
         for (int step = 0; step < CSnapshot::Steps; ++step)
             document->UndoStack().push(new QUndoCommand("step"));
@@ -349,24 +370,33 @@ TEST_F(ShellTest, ADocumentOfAnEditorWithoutRecoveryIsLeftAlone)
     change();
     EXPECT_FALSE(snapshot->IsWriting());
     EXPECT_TRUE(Kept().isEmpty());
-    EXPECT_TRUE(failures.isEmpty());
+    EXPECT_TRUE(frame->Snapshots().Failures().empty());
 }
 
-TEST_F(RecoveryTest, WhatCannotBeKeptIsToldOnceAndTriedAgain)
+TEST_F(RecoveryTest, WhatCannotBeKeptIsToldUntilItCanBe)
 {
     CKsDoc* document = Open(Write("a.HDKV", HDText));
     QDir().mkpath(QFileInfo(Folder()).path());
     QFile obstacle(Folder());
     ASSERT_TRUE(obstacle.open(QIODevice::WriteOnly)); // no folder
-    QList<std::error_code> failures;
-    QObject::connect(&frame->Snapshots(), &CSnapshots::Failed,
-                     [&](const CKsDoc*, std::error_code why) { failures << why; });
+    const auto* notice = frame->findChild<QLabel*>("recoveryLabel");
+    EXPECT_FALSE(notice->isVisible());
     Change(document, "1.5", "2.5");
-    EXPECT_TRUE(QTest::qWaitFor([&] { return !failures.isEmpty(); }));
+    EXPECT_TRUE(QTest::qWaitFor([&] { return notice->isVisible(); }));
     QTest::qWait(60);
-    EXPECT_EQ(failures, QList<std::error_code>{std::make_error_code(std::errc::not_a_directory)});
+    EXPECT_TRUE(notice->isVisible());
+    EXPECT_TRUE(notice->toolTip().contains("The changes to a.HDKV cannot be kept")) << notice->toolTip().toStdString();
+    EXPECT_TRUE(notice->toolTip().contains("a part of the path is no folder"));
+    EXPECT_EQ(notice->accessibleDescription(), notice->toolTip());
     obstacle.remove();
     EXPECT_TRUE(IsKept(document));
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !notice->isVisible(); }));
+    // Somebody clears the folder meanwhile: it is made again, and is still this session's.
+    QDir(Folder()).removeRecursively();
+    Change(document, "2.5", "3.5");
+    EXPECT_TRUE(IsKept(document));
+    EXPECT_TRUE(CRecoveryFolder().TakeOver().isEmpty());
+    EXPECT_FALSE(notice->isVisible());
 }
 
 TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
@@ -391,6 +421,16 @@ TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
         EXPECT_TRUE(third.TakeOver().isEmpty());
     }
     EXPECT_FALSE(QFile::exists(Folder() + "/empty"));
+    {
+        CRecoveryFolder third; // that cannot make files
+        rlimit files{}, none{};
+        ASSERT_EQ(::getrlimit(RLIMIT_NOFILE, &files), 0);
+        none.rlim_max = files.rlim_max;
+        ::setrlimit(RLIMIT_NOFILE, &none);
+        EXPECT_FALSE(third.NewFile());
+        ::setrlimit(RLIMIT_NOFILE, &files);
+        EXPECT_EQ(QDir(Folder()).entryList(QDir::Dirs | QDir::NoDotAndDotDot).size(), 1) << "nothing is left of it";
+    }
     ASSERT_TRUE(QDir().rename(Folder(), Folder() + "-aside"));
     ASSERT_TRUE(QFile::link(folder.path(), Folder()));
     EXPECT_FALSE(CRecoveryFolder().NewFile()) << "a link is no folder of ours";
@@ -417,6 +457,8 @@ TEST_F(RecoveryTest, TheDialogSaysWhatDiffersAndDoesWhatIsChosen)
     ASSERT_EQ(table->rowCount(), 3);
     EXPECT_TRUE(QTest::qWaitFor([&] { return table->item(2, 2)->text() != "Comparing..."; }));
     EXPECT_EQ(table->item(0, 0)->text(), "c.HDKV") << "the latest first";
+    EXPECT_TRUE(QRegularExpression("^\\d+/\\d+/\\d{4} \\d+:\\d\\d:\\d\\d").match(table->item(0, 1)->text()).hasMatch())
+        << table->item(0, 1)->text().toStdString();
     EXPECT_EQ(table->item(0, 2)->text(), "Sections: 1; values changed: 1.");
     const auto press = [&](const char* text) {
         for (auto* button : dialog->findChildren<QPushButton*>())

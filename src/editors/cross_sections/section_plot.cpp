@@ -1,6 +1,7 @@
 #include "editors/cross_sections/section_plot.h"
 
 #include "editors/common/quantity.h"
+#include "ks/fc/shown_text.h"
 
 #include <QEvent>
 #include <QHelpEvent>
@@ -47,16 +48,16 @@ void CSectionPlot::SetCurrentPoint(int point)
 
 QString CSectionPlot::Title() const
 {
-    return m_section
-               ? QStringLiteral("%1  %2").arg(m_section->Branch(), WithSymbol(UnitGroup::Chainage, m_section->chainage))
-               : QString();
+    return m_section ? QStringLiteral("%1  %2").arg(KsVisibleText(m_section->Branch()),
+                                                    WithSymbol(UnitGroup::Chainage, m_section->chainage))
+                     : QString();
 }
 
 QString CSectionPlot::Caption() const
 {
     QStringList parts;
     if (!m_section->topoId.empty())
-        parts << tr("Topo ID %1").arg(m_section->TopoId());
+        parts << tr("Topo ID %1").arg(KsVisibleText(m_section->TopoId()));
     if (!std::isnan(m_section->radius))
         parts << tr("Radius %1").arg(WithSymbol(UnitGroup::Radius, m_section->radius));
     if (!std::isnan(m_section->width) && !m_water) { // otherwise it stands at the marker
@@ -69,7 +70,8 @@ QString CSectionPlot::Caption() const
 void CSectionPlot::Describe()
 {
     setAccessibleName(tr("Plot of the cross section"));
-    setAccessibleDescription(m_section ? tr("%1, points: %2").arg(Title()).arg(m_section->points.size()) : QString());
+    setAccessibleDescription(m_section ? tr("%1, points: %2").arg(Title(), QString::number(m_section->points.size()))
+                                       : QString());
 }
 
 /// Axes and their room, for the section, the units, the font and the size.

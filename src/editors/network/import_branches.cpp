@@ -194,7 +194,7 @@ private:
         double before = 0;
         for (const CJoinedLine& each : lines) {
             const QString wanted = m_name.isEmpty() ? ImportBranches::tr("Branch") : m_name;
-            CNetworkBranch& branch = NewBranch(QStringLiteral("%1-%2").arg(wanted).arg(names.size() + 1), each.line);
+            CNetworkBranch& branch = NewBranch(wanted + QStringLiteral("-%1").arg(names.size() + 1), each.line);
             const double after = before + branch.end;
             if (chainages) {
                 branch.start = std::lerp(first, last, before / whole);

@@ -126,7 +126,7 @@ private:
     void List(const QString& title, const QStringList& entries)
     {
         if (!entries.isEmpty())
-            Say(QStringLiteral("\n%1 (%2)").arg(title).arg(entries.size()));
+            Say(QStringLiteral("\n%1 (%2)").arg(title, QString::number(entries.size())));
         for (const QString& entry : entries)
             Say(QStringLiteral("  ") + entry);
     }

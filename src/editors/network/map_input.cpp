@@ -2,6 +2,7 @@
 
 #include "editors/network/map_overlay.h"
 #include "editors/network/network_map.h"
+#include "ks/fc/shown_text.h"
 
 #include <QApplication>
 #include <QContextMenuEvent>
@@ -45,7 +46,8 @@ constexpr MapKey Keys[] = {
 
 QString TipOf(const CMapLocation& location)
 {
-    return LocationKindName(location.kind) + u'\n' + PlaceText(location) + u'\n' + location.file.section(u'/', -1);
+    return LocationKindName(location.kind) + u'\n' + PlaceText(location) + u'\n' +
+           KsVisibleText(location.file.section(u'/', -1));
 }
 
 } // namespace

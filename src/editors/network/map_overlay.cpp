@@ -1,5 +1,6 @@
 #include "editors/network/map_overlay.h"
 
+#include "ks/fc/shown_text.h"
 #include "ks/units/edit_style.h"
 
 #include <QCoreApplication>
@@ -140,7 +141,7 @@ QString PlaceText(const CMapPlace& place)
 {
     const CKsEditStyle style(UnitGroup::Chainage, "%.1lf");
     return QStringLiteral("%1 %2 %3")
-        .arg(place.branch, style.UnitConvertFromBase_T(place.chainage, 1), style.UnitSymbol());
+        .arg(KsVisibleText(place.branch), style.UnitConvertFromBase_T(place.chainage, 1), style.UnitSymbol());
 }
 
 CLegend LegendOf(const CMapSelection& marks)

@@ -42,7 +42,7 @@ QString CNetworkView::PartTitle() const
     if (branch < 0)
         return tr("Cha&nnel");
     const QString name = Document()->Network().branches[std::size_t(branch)].Name();
-    return tr("Cha&nnel of %1").arg(KsWithoutMnemonics(name));
+    return tr("Cha&nnel of %1").arg(KsWithoutMnemonics(KsVisibleText(name)));
 }
 
 void CNetworkView::InsertLine()

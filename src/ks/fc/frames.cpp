@@ -155,7 +155,7 @@ void CKsMDIArea::paintEvent(QPaintEvent* event)
     if (m_hint.isEmpty() || !subWindowList().isEmpty())
         return;
     QPainter painter(viewport());
-    painter.setPen(palette().color(QPalette::PlaceholderText));
+    painter.setPen(palette().color(QPalette::WindowText)); // on the frame's colour; a fainter one is hard to read
     painter.drawText(viewport()->rect().adjusted(20, 20, -20, -20), Qt::AlignCenter | Qt::TextWordWrap, m_hint);
 }
 

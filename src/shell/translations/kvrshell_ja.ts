@@ -2,6 +2,13 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ja" sourcelanguage="en_US">
 <context>
+    <name>CApplication</name>
+    <message>
+        <source>There is not enough memory for what was asked for last: it was not done, or not wholly. Save your work, and close other documents or programs.</source>
+        <translation>メモリが足りないため、最後の操作は行われなかったか、途中までしか行われませんでした。作業を保存し、ほかの文書やプログラムを閉じてください。</translation>
+    </message>
+</context>
+<context>
     <name>CFileCommands</name>
     <message>
         <source>Projects</source>
@@ -327,6 +334,14 @@ The editors read %2.</source>
         <translation>%1 の変更を異常終了に備えて保持できません: %2。</translation>
     </message>
     <message>
+        <source>Save often. It is tried again and again; when it works, this notice goes.</source>
+        <translation>こまめに保存してください。繰り返し試し、保持できるとこの表示は消えます。</translation>
+    </message>
+    <message>
+        <source>Recovery after a crash does not work</source>
+        <translation>異常終了後の復元が使えません</translation>
+    </message>
+    <message>
         <source>Not loaded: %1 (see Help, Plug-ins)</source>
         <translation>読み込めませんでした: %1 (「ヘルプ」の「プラグイン」を参照)</translation>
     </message>
@@ -477,6 +492,14 @@ Shell of the river model editors.</source>
         <source>it ended the program that tried it (%1)</source>
         <translation>試したプログラムが終了しました (%1)</translation>
     </message>
+    <message>
+        <source>it ended the program that tried it</source>
+        <translation>試したプログラムが終了しました</translation>
+    </message>
+    <message>
+        <source>its start did not end within %1 seconds</source>
+        <translation>起動が %1 秒以内に終わりませんでした</translation>
+    </message>
 </context>
 <context>
     <name>PluginLoader</name>
@@ -487,6 +510,10 @@ Shell of the river model editors.</source>
     <message>
         <source>It could not be loaded: %1</source>
         <translation>読み込めませんでした: %1</translation>
+    </message>
+    <message>
+        <source>%1. It is tried again when its file has changed</source>
+        <translation>%1。ファイルが変わると、もう一度試します</translation>
     </message>
     <message>
         <source>It is no editor: it does not export %1.</source>
@@ -539,6 +566,10 @@ The file is found all the same.</source>
         <source>%1 (recovered)</source>
         <translation>%1 (復元)</translation>
     </message>
+    <message>
+        <source>%1 (recovered %2)</source>
+        <translation>%1 (復元 %2)</translation>
+    </message>
 </context>
 <context>
     <name>CRecoveryDialog</name>
@@ -589,6 +620,10 @@ The file is found all the same.</source>
     <message>
         <source>What differs is not known: the file cannot be read.</source>
         <translation>相違点は不明です: ファイルを読み取れません。</translation>
+    </message>
+    <message>
+        <source>What differs is not known: it could not be looked at.</source>
+        <translation>相違点は不明です: 調べられませんでした。</translation>
     </message>
     <message>
         <source>It cannot be read, and can only be discarded.</source>
