@@ -37,7 +37,7 @@ Read ReadText(const std::string& text, const RoundTrip& trip)
         read.text = std::move(saved.value());
     else
         read.fault = "what was read cannot be written: " + saved.error().message;
-    read.words = WordsOf(structure.value().Get());
+    read.words = WordsOf(structure.value().Get(), false); // what is empty says nothing, and need not be written
     std::ranges::sort(read.words);
     return read;
 }

@@ -95,10 +95,19 @@ bool IsWalkedAlike(tqlHandle node)
     return true;
 }
 
-void Collect(tqlHandle node, std::vector<Word>& words)
+bool IsEmpty(tqlHandle keyword)
+{
+    const tqlHandle first = tqlParamByNum(keyword, 1);
+    std::string text;
+    return !first || (!tqlNextParam(first) && tqlGetString(first, &text) && text.empty());
+}
+
+void Collect(tqlHandle node, bool emptyToo, std::vector<Word>& words)
 {
     for (int k = 1; k <= tqlGetNoKeywords(node); ++k) {
         const tqlHandle keyword = tqlKeywordByNum(node, k);
+        if (!emptyToo && IsEmpty(keyword))
+            continue;
         words.push_back(Tagged('=', tqlName(keyword)));
         for (tqlHandle param = tqlParamByNum(keyword, 1); param; param = tqlNextParam(param))
             words.push_back(ValueOf(param));
@@ -106,7 +115,7 @@ void Collect(tqlHandle node, std::vector<Word>& words)
     for (int s = 1; s <= tqlGetNoSections(node); ++s) {
         const tqlHandle section = tqlSectionByNum(node, s);
         words.push_back(Tagged('[', tqlName(section)));
-        Collect(section, words);
+        Collect(section, emptyToo, words);
         words.push_back(EndOfSection);
     }
 }
@@ -148,10 +157,10 @@ std::string CheckGood(tqlHandle structure)
 
 } // namespace
 
-std::vector<std::uint64_t> WordsOf(tqlHandle node)
+std::vector<std::uint64_t> WordsOf(tqlHandle node, bool emptyToo)
 {
     std::vector<Word> words;
-    Collect(node, words);
+    Collect(node, emptyToo, words);
     return words;
 }
 
