@@ -32,8 +32,12 @@ const struct
 {
     const char* folder; // of what was kept for it
     std::string (*check)(const std::string& text);
-} checks[] = {{"tql", CheckTql},          {"hd", CheckHDFile},           {"network", CheckNetworkFile},
-              {"sections", CheckSectionFile}, {"project", CheckProjectFile}, {"recovery", CheckRecovery},
+} checks[] = {{"tql", CheckTql},
+              {"hd", CheckHDFile},
+              {"network", CheckNetworkFile},
+              {"sections", CheckSectionFile},
+              {"project", CheckProjectFile},
+              {"recovery", CheckRecovery},
               {"table", CheckTable}};
 
 TEST(Corpus, EveryFileKeepsTheProperties)

@@ -7,9 +7,8 @@
 
 std::string CheckNetworkFile(const std::string& text)
 {
-    return CheckFile(text, [](tqlHandle structure, LoadReport& report) {
-        return NetworkText(LoadNetwork(structure, report));
-    });
+    return CheckFile(
+        text, [](tqlHandle structure, LoadReport& report) { return NetworkText(LoadNetwork(structure, report)); });
 }
 
 std::string CheckSectionFile(const std::string& text)

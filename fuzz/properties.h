@@ -1,5 +1,5 @@
-// What must hold for every text whatsoever that a reader of the product is given. Each of these reads from memory, keeps
-// nothing behind, and answers with what does not hold; empty when all does.
+// What must hold for every text whatsoever that a reader of the product is given. Each of these reads from memory,
+// keeps nothing behind, and answers with what does not hold; empty when all does.
 #pragma once
 
 #include <string>
@@ -8,8 +8,8 @@
 /// again without any change of content.
 std::string CheckTql(const std::string& text);
 
-// Files: what is read can be written and read again, loses nothing on that way, and becomes the same text. A value of the
-// first text that does not stand in it was reported.
+// Files: what is read can be written and read again, loses nothing on that way, and becomes the same text. A value of
+// the first text that does not stand in it was reported.
 std::string CheckHDFile(const std::string& text);
 std::string CheckNetworkFile(const std::string& text);
 std::string CheckSectionFile(const std::string& text);

@@ -6,6 +6,6 @@
 #include <cstdint>
 #include <vector>
 
-/// Names and values of everything below a node, in order, as hashes: a fuzzer asks for them thousands of times a second.
-/// `emptyToo`: also keywords of no parameter or of an empty text.
+/// Names and values of everything below a node, in order, as hashes: a fuzzer asks for them thousands of times a
+/// second. `emptyToo`: also keywords of no parameter or of an empty text.
 std::vector<std::uint64_t> WordsOf(tqlHandle node, bool emptyToo = true);

