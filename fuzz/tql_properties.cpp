@@ -3,39 +3,32 @@
 #include "tql/tql.h"
 
 #include <bit>
-#include <vector>
+#include <functional>
 
 namespace {
 
-std::string Tagged(char tag, std::string_view value)
+using Word = std::uint64_t;
+constexpr Word EndOfSection = 3;
+
+Word Tagged(char tag, std::string_view text)
 {
-    std::string text(1, tag);
-    text += value;
-    return text;
+    return std::hash<std::string_view>()(text) * 31 + Word(tag);
 }
 
-// The value of a parameter in words that two equal values share.
-std::string ValueOf(tqlHandle param)
+// What two equal values share. A float that happens to be an int32 may be written as an integer, so numbers are
+// compared as floats.
+Word ValueOf(tqlHandle param)
 {
-    std::int32_t integer = 0;
     double number = 0;
     bool flag = false;
     std::string text;
-    switch (tqlGetType(param)) {
-    case TqlType::Int:
-        return tqlGetInt(param, &integer) ? Tagged('i', std::to_string(integer)) : "?";
-    case TqlType::Double:
-        return tqlGetDouble(param, &number) ? Tagged('d', std::to_string(std::bit_cast<std::uint64_t>(number))) : "?";
-    case TqlType::Bool:
-        return tqlGetBool(param, &flag) ? (flag ? "b1" : "b0") : "?";
-    case TqlType::String:
-        return tqlGetString(param, &text) ? Tagged('s', text) : "?";
-    case TqlType::FileName:
-        return tqlGetString(param, &text) ? Tagged('n', text) : "?";
-    case TqlType::None:
-        break;
-    }
-    return "?";
+    if (tqlGetDouble(param, &number))
+        return std::bit_cast<Word>(number);
+    if (tqlGetBool(param, &flag))
+        return flag ? 1 : 2;
+    if (tqlGetString(param, &text))
+        return Tagged(tqlGetType(param) == TqlType::String ? 's' : 'n', text);
+    return 0;
 }
 
 void Rebuild(tqlHandle param, tqlHandle out)
@@ -84,29 +77,46 @@ std::string Written(tqlHandle structure, bool raw)
     return text;
 }
 
-// Names and values of everything, in order. A float that happens to be an int32 may be written as an integer, so
-// numbers are compared as floats.
-void List(tqlHandle node, std::vector<std::string>& out)
+/// Whether each keyword's parameters are the same by number and from one to the next.
+bool IsWalkedAlike(tqlHandle node)
 {
     for (int k = 1; k <= tqlGetNoKeywords(node); ++k) {
         const tqlHandle keyword = tqlKeywordByNum(node, k);
-        out.push_back(Tagged('=', tqlName(keyword)));
         tqlHandle next = tqlParamByNum(keyword, 1);
-        for (int p = 1; p <= tqlGetNoParams(keyword); ++p, next = tqlNextParam(next)) {
-            double number = 0;
-            const tqlHandle param = tqlParamByNum(keyword, p);
-            const std::string value = ValueOf(param);
-            out.push_back(param != next                  ? "by number and by step differ"
-                          : tqlGetDouble(param, &number) ? std::to_string(std::bit_cast<std::uint64_t>(number))
-                                                         : value);
-        }
+        for (int p = 1; p <= tqlGetNoParams(keyword); ++p, next = tqlNextParam(next))
+            if (!next || tqlParamByNum(keyword, p) != next)
+                return false;
         if (next)
-            out.push_back("a parameter too many");
+            return false;
+    }
+    for (int s = 1; s <= tqlGetNoSections(node); ++s)
+        if (!IsWalkedAlike(tqlSectionByNum(node, s)))
+            return false;
+    return true;
+}
+
+bool IsEmpty(tqlHandle keyword)
+{
+    const tqlHandle first = tqlParamByNum(keyword, 1);
+    std::string text;
+    return !first || (!tqlNextParam(first) && tqlGetString(first, &text) && text.empty());
+}
+
+void Collect(tqlHandle node, bool emptyToo, std::vector<Word>& words)
+{
+    for (int k = 1; k <= tqlGetNoKeywords(node); ++k) {
+        const tqlHandle keyword = tqlKeywordByNum(node, k);
+        if (!emptyToo && IsEmpty(keyword))
+            continue;
+        words.push_back(Tagged('=', tqlName(keyword)));
+        for (tqlHandle param = tqlParamByNum(keyword, 1); param; param = tqlNextParam(param))
+            words.push_back(ValueOf(param));
     }
     for (int s = 1; s <= tqlGetNoSections(node); ++s) {
-        out.push_back(Tagged('[', tqlName(tqlSectionByNum(node, s))));
-        List(tqlSectionByNum(node, s), out);
-        out.push_back("]");
+        const tqlHandle section = tqlSectionByNum(node, s);
+        words.push_back(Tagged('[', tqlName(section)));
+        Collect(section, emptyToo, words);
+        words.push_back(EndOfSection);
     }
 }
 
@@ -122,8 +132,9 @@ std::string CheckError(tqlHandle structure, const TqlSyntaxError& error)
 
 std::string CheckGood(tqlHandle structure)
 {
-    std::vector<std::string> original, again;
-    List(structure, original);
+    const std::vector<Word> original = WordsOf(structure);
+    if (!IsWalkedAlike(structure))
+        return "parameters by number and by step differ";
     const std::string text = Written(structure, false);
     for (const std::string& rebuilt : {text, Written(structure, true)}) {
         if (rebuilt.empty())
@@ -131,11 +142,9 @@ std::string CheckGood(tqlHandle structure)
         tqlHandle copy = tqlLoadText(rebuilt, "copy");
         TqlSyntaxError error;
         std::string fault;
-        again.clear();
-        List(copy, again);
         if (tqlGetSyntaxErr(copy, &error))
             fault = "what was written cannot be read: " + error.message;
-        else if (again != original)
+        else if (WordsOf(copy) != original)
             fault = "written and read, it has other content";
         else if (Written(copy, false) != text)
             fault = "written twice, it has another text";
@@ -148,7 +157,14 @@ std::string CheckGood(tqlHandle structure)
 
 } // namespace
 
-std::string CheckTextProperties(const std::string& text)
+std::vector<std::uint64_t> WordsOf(tqlHandle node, bool emptyToo)
+{
+    std::vector<Word> words;
+    Collect(node, emptyToo, words);
+    return words;
+}
+
+std::string CheckTql(const std::string& text)
 {
     tqlHandle structure = tqlLoadText(text, "text");
     TqlSyntaxError error;

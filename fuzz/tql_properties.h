@@ -1,8 +1,11 @@
-// What must hold for every text whatsoever.
+// What a structure holds, for what must hold of it.
 #pragma once
 
-#include <string>
+#include "tql/tql.h"
 
-/// Loads `text` and checks: after an error the structure is empty and the report is complete; a text that loads is
-/// written, loaded and written again without any change of content. Empty when all holds, otherwise what does not.
-std::string CheckTextProperties(const std::string& text);
+#include <cstdint>
+#include <vector>
+
+/// Names and values of everything below a node, in order, as hashes: a fuzzer asks for them thousands of times a
+/// second. `emptyToo`: also keywords of no parameter or of an empty text.
+std::vector<std::uint64_t> WordsOf(tqlHandle node, bool emptyToo = true);

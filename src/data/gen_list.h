@@ -45,6 +45,8 @@ public:
     std::unique_ptr<HD_RiverPos> RemoveAt(std::size_t index);
     std::vector<std::unique_ptr<HD_RiverPos>> RemoveAt(std::size_t index, std::size_t count);
     void Reserve(std::size_t count) { m_records.reserve(count); }
+    /// All records against others of the list's family.
+    void Swap(std::vector<std::unique_ptr<HD_RiverPos>>& records) noexcept { m_records.swap(records); }
 
     /// Removes and deletes every blank record, head to tail. Unless `asked` is set, `ask` is called at the first one;
     /// its answer false stops with false (nothing more is removed), true sets `asked`. Without `ask` nobody can agree,

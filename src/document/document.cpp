@@ -21,21 +21,25 @@ constexpr int HDPackageKind = 8; // what this editor's packages call themselves
 class FirstRows
 {
 public:
-    explicit FirstRows(const std::vector<CKavo0_hdDoc::ShownRows>& shown)
-    {
-        for (const auto& table : shown)
-            if (table.writesFirstRow && table.rows->IsEmpty())
-                m_filled.push_back(table.rows);
-        for (const auto& rows : m_filled)
-            rows->Put(0, rows->NewRows(1));
-    }
+    FirstRows() = default;
     ~FirstRows()
     {
         for (const auto& rows : m_filled)
-            rows->Take(0, 1);
+            rows->Drop(0, 1);
     }
     FirstRows(const FirstRows&) = delete;
     FirstRows& operator=(const FirstRows&) = delete;
+
+    void Fill(const std::vector<CKavo0_hdDoc::ShownRows>& shown)
+    {
+        m_filled.reserve(shown.size()); // what is put in is noted, also when memory ends
+        for (const auto& table : shown) {
+            if (!table.writesFirstRow || !table.rows->IsEmpty())
+                continue;
+            table.rows->Put(0, table.rows->NewRows(1));
+            m_filled.push_back(table.rows);
+        }
+    }
 
 private:
     std::vector<std::shared_ptr<IRowSource>> m_filled;
@@ -79,8 +83,7 @@ BOOL CKavo0_hdDoc::OnSaveDocument(const CString& path)
         return false;
 
     auto purged = std::make_unique<CPurgedLines>(*this);
-    purged->TakeOut();
-    if (!WriteData(target)) {
+    if (!WriteData(target, *purged)) {
         purged->PutBack(); // what is in memory stays as the user left it
         UpdateAllViews(nullptr, CKsDoc::ReloadHint);
         return false;
@@ -119,11 +122,13 @@ std::size_t CKavo0_hdDoc::UnwrittenSetups() const
     return unwritten;
 }
 
-/// Writes the whole content; on failure the user has been told and the file is what it was.
-bool CKavo0_hdDoc::WriteData(const CString& path)
+/// Writes the whole content but for what is purged, which stays out; on failure the user has been told and the file is what it was.
+bool CKavo0_hdDoc::WriteData(const CString& path, CPurgedLines& purged)
 {
-    const FirstRows defaults(m_rowsShown);
-    return WriteFile(path, [this](const std::string& written, const SafeFileOptions& options) {
+    FirstRows defaults;
+    return WriteFile(path, [&](const std::string& written, const SafeFileOptions& options) {
+        purged.TakeOut();
+        defaults.Fill(m_rowsShown);
         return SaveHDFile(m_parameters, written, {.file = options});
     });
 }

@@ -51,7 +51,7 @@ protected:
                                                   const CString& text) override;
 
 private:
-    bool WriteData(const CString& path);
+    bool WriteData(const CString& path, CPurgedLines& purged);
     std::size_t UnwrittenSetups() const;
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);

@@ -58,7 +58,9 @@ public:
     }
     std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
     {
-        return std::make_unique<CRecordBlock>(m_list.RemoveAt(row, count));
+        auto taken = std::make_unique<CRecordBlock>(Records()); // asks for memory before anything is moved
+        taken->records = m_list.RemoveAt(row, count);
+        return taken;
     }
     const void* Data() const override { return &m_list; }
     const void* List() const override { return &m_list; }

@@ -12,7 +12,7 @@ CPurgedLines::CPurgedLines(CKavo0_hdDoc& document) : CDocumentCommand(document, 
             continue;
         CListSection& section = entry.list(document.Parameters());
         for (std::size_t i = 0; i < section.ListCount(); ++i) {
-            Lines lines{&section.ListAt(i), {}, {}};
+            Lines lines{&section.ListAt(i), {}, {}, {}};
             for (std::size_t row = 0; row < lines.list->GetCount(); ++row)
                 if (lines.list->GetAt(row).IsBlank())
                     lines.rows.push_back(row);
@@ -43,25 +43,32 @@ QString CPurgedLines::Summary() const
     return parts.join(LoadString(Str::DroppedSeparator));
 }
 
+/// Either all of them are taken out or, when memory ends, none.
 void CPurgedLines::TakeOut(Lines& lines)
 {
-    auto all = lines.list->RemoveAt(0, lines.list->GetCount());
+    auto& all = lines.room;
     std::vector<std::unique_ptr<HD_RiverPos>> kept;
-    kept.reserve(all.size() - lines.rows.size());
+    kept.reserve(lines.list->GetCount() - lines.rows.size());
+    lines.records.reserve(lines.rows.size());
+    lines.list->Swap(all);
     auto next = lines.rows.begin();
     for (std::size_t row = 0; row < all.size(); ++row) {
         const bool goes = next != lines.rows.end() && *next == row;
         next += goes;
         (goes ? lines.records : kept).push_back(std::move(all[row]));
     }
-    lines.list->InsertAt(0, std::move(kept));
+    all.clear();
+    lines.list->Swap(kept);
 }
 
 void CPurgedLines::PutBack(Lines& lines)
 {
-    auto kept = lines.list->RemoveAt(0, lines.list->GetCount());
-    std::vector<std::unique_ptr<HD_RiverPos>> all;
-    all.reserve(kept.size() + lines.rows.size());
+    if (lines.records.empty())
+        return; // memory ended before they were taken out
+    std::vector<std::unique_ptr<HD_RiverPos>> kept;
+    auto& all = lines.room;
+    all.reserve(lines.list->GetCount() + lines.rows.size());
+    lines.list->Swap(kept);
     auto next = kept.begin();
     for (std::size_t i = 0; i < lines.rows.size(); ++i) {
         while (all.size() < lines.rows[i])
@@ -70,7 +77,8 @@ void CPurgedLines::PutBack(Lines& lines)
     }
     std::move(next, kept.end(), std::back_inserter(all));
     lines.records.clear();
-    lines.list->InsertAt(0, std::move(all));
+    lines.list->Swap(all);
+    all.clear();
 }
 
 void CPurgedLines::TakeOut()
@@ -78,9 +86,11 @@ void CPurgedLines::TakeOut()
     m_isOut = true;
     for (Lines& lines : m_lists)
         TakeOut(lines);
-    for (Rows& table : m_tables)
+    for (Rows& table : m_tables) {
+        table.taken.reserve(table.rows.size());
         for (auto row = table.rows.rbegin(); row != table.rows.rend(); ++row)
             table.taken.push_back(table.source->Take(*row, 1));
+    }
 }
 
 void CPurgedLines::PutBack()
@@ -89,8 +99,8 @@ void CPurgedLines::PutBack()
     for (Lines& lines : m_lists)
         PutBack(lines);
     for (Rows& table : m_tables)
-        for (const std::size_t row : table.rows) {
-            table.source->Put(row, std::move(table.taken.back()));
+        for (auto row = table.rows.end() - std::ptrdiff_t(table.taken.size()); row != table.rows.end(); ++row) {
+            table.source->Put(*row, std::move(table.taken.back()));
             table.taken.pop_back();
         }
 }

@@ -19,7 +19,8 @@ public:
     /// What is taken out, in the user's language; empty for nothing.
     QString Summary() const;
 
-    // For a save, which pushes the command when the file is written. Taking out costs one pass a list.
+    // For a save, which pushes the command when the file is written. Taking out costs one pass a list. Putting back asks
+    // for no memory, and works when taking out has ended for want of it.
     void TakeOut();
     void PutBack();
 
@@ -33,6 +34,7 @@ private:
         CGenList* list;
         std::vector<std::size_t> rows;                     // ascending, in the list as it is with them
         std::vector<std::unique_ptr<HD_RiverPos>> records; // while they are out of it
+        std::vector<std::unique_ptr<HD_RiverPos>> room;    // for all of them, empty
     };
     struct Rows // of a table without locations
     {

@@ -157,6 +157,16 @@ void WriteKeyword(tqlHandle structure, std::string_view name, FieldList fields, 
         extra->Write(structure);
 }
 
+/// Whether a further keyword of the name is kept: without this one that would be the first, and be read.
+bool HoldsPlace(const DeclaredSection& in, const DeclaredKeyword& declared, const void* object)
+{
+    const auto& sections = in.kept.constOf(object).sections;
+    const auto kept = sections.find(in.name);
+    return kept != sections.end() && std::ranges::any_of(kept->second, [&](const UnknownNode& node) {
+               return !node.IsSection && node.Name == declared.name;
+           });
+}
+
 void WriteKeywords(tqlHandle structure, const DeclaredSection& in, const DeclaredKeyword& declared, const void* object)
 {
     const FieldList fields = declared.Fields();
@@ -166,7 +176,7 @@ void WriteKeywords(tqlHandle structure, const DeclaredSection& in, const Declare
             WriteKeyword(structure, declared.name, group.Elements(), group[i], group.ExtraOf(i));
         return;
     }
-    if (declared.presence == Presence::WhenSet && IsEmptyText(fields.front(), object))
+    if (declared.presence == Presence::WhenSet && IsEmptyText(fields.front(), object) && !HoldsPlace(in, declared, object))
         return;
     const auto& all = in.kept.constOf(object).keywords;
     const auto found = all.find(&declared);

@@ -130,6 +130,24 @@ bool Read(ParamCursor& params, const Field& field, const void* object, HDDateTim
     return true;
 }
 
+/// An empty group is followed by one element with default values, which is not kept: others are reported. `count` is the
+/// parameter that the cursor has just passed.
+void ReadPadding(ParamCursor& params, tqlHandle count, const Field& field, const void* object, GroupValue<void> group)
+{
+    const int number = params.number - 1, behind = params.Left();
+    group.Renew(1);
+    const std::string padding = ParamsText(group.Elements(), group[0]);
+    ReadFields(params, group.Elements(), group[0]);
+    const bool isKept = ParamsText(group.Elements(), group[0]) == padding;
+    group.Renew(0);
+    if (!isKept)
+        Report(params, count, field, object,
+               {.kind = Finding::CountDoesNotFit,
+                .parameter = number,
+                .behind = behind,
+                .found = std::string(tqlGetRawParamsFrom(count))});
+}
+
 /// A count and its elements; false when the count is none or does not fit.
 bool Read(ParamCursor& params, const Field& field, const void* object, GroupValue<void> group)
 {
@@ -144,10 +162,8 @@ bool Read(ParamCursor& params, const Field& field, const void* object, GroupValu
                {.kind = Finding::OtherType, .parameter = params.number - 1, .used = std::to_string(elements)});
     for (std::int32_t i = 0; i < elements; ++i)
         ReadFields(params, group.Elements(), group[std::size_t(i)]);
-    const int size = int(ParamsOf(group.Elements()));
-    if (elements == 0 && field.padWhenEmpty && params.Left() >= size)
-        for (int i = 0; i < size; ++i)
-            params.Next();
+    if (elements == 0 && field.padWhenEmpty && params.Left() >= int(ParamsOf(group.Elements())))
+        ReadPadding(params, at, field, object, group);
     return true;
 }
 

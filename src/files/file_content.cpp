@@ -104,7 +104,7 @@ FileVersion VersionOfText(std::string_view text)
 std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::path& path, FileVersion& version)
 {
     return WithContent(platform, path, [&](PlatformFile::Handle file, std::uint64_t) {
-        std::string buffer(std::size_t(1) << 18, '\0');
+        std::array<char, std::size_t(1) << 16> buffer; // a save looks at files when it can no longer do without an answer
         ContentHash hash;
         version = {};
         for (std::size_t got = buffer.size(); got == buffer.size(); version.size += got) {

@@ -1,15 +1,7 @@
-// Tables as tab-separated text, as spreadsheets exchange them.
+// Cells of a grid on the clipboard, as a table (table_text.h).
 #pragma once
 
-#include <QStringList>
-#include <vector>
-
 class CGenGrid;
-
-/// A text with tabs, line ends or quotes is put in quotes, its quotes doubled. No line end behind the last line.
-QString WriteTable(const std::vector<QStringList>& rows);
-/// Takes LF, CRLF and CR as line ends; one line end behind the last line is no further line.
-std::vector<QStringList> ReadTable(const QString& text);
 
 bool CanCopyCells(const CGenGrid& grid);
 /// Puts the selected cells of a grid, or the current one, on the clipboard.

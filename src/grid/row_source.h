@@ -39,6 +39,8 @@ public:
     /// Puts the rows in at `row` (at the end when there are fewer) and returns the row where they went.
     virtual std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) = 0;
     virtual std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) = 0;
+    /// Takes rows out that nobody wants; a vector asks for no memory.
+    virtual void Drop(std::size_t row, std::size_t count) { Take(row, count); }
     /// Takes rows out that Put has put in: all is as it was before.
     virtual std::unique_ptr<IRowBlock> TakeBack(std::size_t row, std::size_t count) { return Take(row, count); }
 

@@ -61,9 +61,15 @@ public:
     std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
     {
         const auto first = m_rows().begin() + std::ptrdiff_t(row), last = first + std::ptrdiff_t(count);
-        std::vector<T> taken(std::make_move_iterator(first), std::make_move_iterator(last));
+        auto taken = std::make_unique<Block>(std::vector<T>(count)); // asks for memory before anything is moved
+        std::move(first, last, taken->rows.begin());
         m_rows().erase(first, last);
-        return std::make_unique<Block>(std::move(taken));
+        return taken;
+    }
+    void Drop(std::size_t row, std::size_t count) override
+    {
+        const auto first = m_rows().begin() + std::ptrdiff_t(row);
+        m_rows().erase(first, first + std::ptrdiff_t(count));
     }
 
     void Rearrange(const std::vector<std::size_t>& order) override

@@ -4,12 +4,14 @@
 #include "ks/fc/exchange.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/shown_text.h"
+#include "ks/fc/system_reason.h"
 #include "shell/project_file.h"
 
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
 #include <iterator>
+#include <new>
 
 namespace {
 
@@ -33,7 +35,7 @@ bool ReadMembers(CProject& project, QString& error)
 } // namespace
 
 const CProject* CProjects::Open(const QString& path, QString& error)
-{
+try {
     const QString absolute = KsExistingSpelling(QFileInfo(path).absoluteFilePath());
     for (const auto& project : m_projects) {
         if (KsSameFile(project->path, absolute))
@@ -47,6 +49,9 @@ const CProject* CProjects::Open(const QString& path, QString& error)
     project->handle = ++m_last;
     m_projects.push_back(std::move(project));
     return m_projects.back().get();
+} catch (const std::bad_alloc&) {
+    error = KsSystemSentence(std::make_error_code(std::errc::not_enough_memory));
+    return nullptr;
 }
 
 void CProjects::Close(CProjectHandle handle)

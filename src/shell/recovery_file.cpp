@@ -73,7 +73,7 @@ std::optional<QJsonObject> ReadFirstLine(std::FILE* stream)
 
 } // namespace
 
-std::error_code WriteRecoveryFile(const QString& file, const CRecoveryHeader& header, const std::string& content)
+std::string RecoveryText(const CRecoveryHeader& header, const std::string& content)
 {
     const QJsonObject json{{Key::Format, Format},
                            {Key::Path, header.path},
@@ -86,6 +86,12 @@ std::error_code WriteRecoveryFile(const QString& file, const CRecoveryHeader& he
                            {Key::ContentHash, QString::fromLatin1(HashOf(content))}};
     std::string text = QJsonDocument(json).toJson(QJsonDocument::Compact).toStdString() + '\n';
     text += content;
+    return text;
+}
+
+std::error_code WriteRecoveryFile(const QString& file, const CRecoveryHeader& header, const std::string& content)
+{
+    const std::string text = RecoveryText(header, content);
     // Not synced: it is there for when the program ends, not for when the power does, and the disk is the user's.
     const auto written = WriteFileSafely(file.toStdString(), text, {.sync = false});
     if (written)
@@ -103,9 +109,11 @@ std::optional<CRecoveryHeader> ReadRecoveryHeader(const QString& file)
 std::optional<CRecoveryHeader> ReadRecoveryFile(const QString& file, std::string* content)
 {
     const Result<PrivateFile> opened = OpenPrivateFile(file.toStdString());
-    if (!opened)
-        return {};
-    std::FILE* const stream = opened.value().stream.get();
+    return opened ? ReadRecovery(opened.value().stream.get(), opened.value().size, content) : std::nullopt;
+}
+
+std::optional<CRecoveryHeader> ReadRecovery(std::FILE* stream, std::uintmax_t fileSize, std::string* content)
+{
     const std::optional<QJsonObject> json = ReadFirstLine(stream);
     const std::optional<CRecoveryHeader> header = json ? FromJson(*json) : std::nullopt;
     const long start = std::ftell(stream);
@@ -113,7 +121,7 @@ std::optional<CRecoveryHeader> ReadRecoveryFile(const QString& file, std::string
         return {};
     // Its size is known before anything is read: a file may say whatever it likes.
     const auto size = std::uintmax_t(json->value(Key::ContentSize).toInteger());
-    if (size > LongestContent || opened.value().size != std::uintmax_t(start) + size)
+    if (size > LongestContent || fileSize != std::uintmax_t(start) + size)
         return {};
     std::string text(std::size_t(size), '\0');
     if (std::fread(text.data(), 1, text.size(), stream) != text.size() ||

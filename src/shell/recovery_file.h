@@ -4,6 +4,8 @@
 #include <QByteArray>
 #include <QDateTime>
 #include <QString>
+#include <cstdint>
+#include <cstdio>
 #include <optional>
 #include <string>
 #include <system_error>
@@ -20,11 +22,15 @@ struct CRecoveryHeader
     QDateTime time{}; // of the content
 };
 
+/// The text of such a file.
+std::string RecoveryText(const CRecoveryHeader& header, const std::string& content);
 /// Puts it into the place of a file (safe_file.h).
 std::error_code WriteRecoveryFile(const QString& file, const CRecoveryHeader& header, const std::string& content);
 /// Reads such a file, and what it holds into `content` if that is asked for. Nothing for one that is not, to the last
 /// byte, as it was written.
 std::optional<CRecoveryHeader> ReadRecoveryFile(const QString& file, std::string* content = nullptr);
+/// The same of a stream of `fileSize` bytes.
+std::optional<CRecoveryHeader> ReadRecovery(std::FILE* stream, std::uintmax_t fileSize, std::string* content = nullptr);
 
 /// The header alone, of a file that may hold anything behind it.
 std::optional<CRecoveryHeader> ReadRecoveryHeader(const QString& file);

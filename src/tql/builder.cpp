@@ -114,6 +114,8 @@ struct Overloads : Functions...
 {
     using Functions::operator()...;
 };
+template <typename... Functions>
+Overloads(Functions...) -> Overloads<Functions...>;
 
 void AddParam(tqlHandle structure, const TqlIn& value)
 {

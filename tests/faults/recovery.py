@@ -1,15 +1,18 @@
 #!/usr/bin/python3
-"""recovery.py CYCLES [SEED]: types, kills the program at a random moment, starts it again, and looks at what comes back.
+"""recovery.py CYCLES [SEED [DISPLAYS]]: types, kills the program at a random moment, starts it again, and looks at what comes back.
 
 Numbers that count up are typed into a cell of each of the three files of a project, one after the other, and now and
 then a file is saved. After each kill every file shows the last number that was typed more than ten seconds before, or a
 later one; the file on the disk holds what was saved last; undo leads back to it. Prints how much was lost.
 
-    KVR_BIN=build/dev/bin tests/faults/recovery.py 200 1
+Several displays share the cycles: a cycle is mostly waiting.
+
+    KVR_BIN=build/dev/bin tests/faults/recovery.py 200 1 5
 """
 import os
 import random
 import re
+import subprocess
 import sys
 import tempfile
 import time
@@ -37,7 +40,7 @@ class Cycles:
         self.samples, self.Editor, self.Table, self.wait_for = samples, Editor, Table, wait_for
         self.folder, self.random = folder, random.Random(seed)
         self.project = samples.write_project(folder)
-        self.number = 1000  # the next to be typed
+        self.name, self.number = f'display {seed}', 1000  # the next to be typed
         self.typed = {name: [] for name in TABLES}  # number and time, those since the last save
         self.saved = dict.fromkeys(TABLES)
         self.losses, self.recovered = [], 0
@@ -127,22 +130,38 @@ class Cycles:
     def run(self, cycles):
         for number in range(1, cycles + 1):
             self.cycle()
-            print(f'cycle {number}: {len(self.losses)} looks, {self.recovered} recovered, most lost '
+            print(f'{self.name}, cycle {number}: {len(self.losses)} looks, {self.recovered} recovered, most lost '
                   f'{max(self.losses):.1f} s', flush=True)
 
 
-if __name__ == '__main__':
-    if len(sys.argv) not in (2, 3):
-        sys.exit(__doc__)
-    os.environ['KVR_BIN'] = os.path.abspath(os.environ.get('KVR_BIN', f'{HERE}/../../build/dev/bin'))
+def run_here(number, seed):
+    """The cycles on a display of their own. Why they ended early, or nothing."""
     with Session() as desktop, tempfile.TemporaryDirectory() as work:
-        cycles = Cycles(work, int(sys.argv[2]) if len(sys.argv) == 3 else 1)
+        cycles = Cycles(work, seed)
         try:
-            cycles.run(int(sys.argv[1]))
+            cycles.run(number)
         except Exception as error:
-            picture = f'{tempfile.gettempdir()}/recovery-failed.png'
+            picture = f'{tempfile.gettempdir()}/recovery-failed-{seed}.png'
             desktop.picture(picture)
-            sys.exit(f'{type(error).__name__}: {error}; screen: {picture}')
+            return f'{type(error).__name__}: {error}; screen: {picture}'
         finally:
             if cycles.editor:
                 cycles.editor.end()
+    return None
+
+
+def run_on(displays, number, seed):
+    """The cycles on several displays, each in a process that has it in its environment."""
+    shares = [number // displays + (each < number % displays) for each in range(displays)]
+    runs = [subprocess.Popen([sys.executable, '-B', __file__, str(share), str(seed + each)])
+            for each, share in enumerate(shares) if share]
+    failed = sum(run.wait() != 0 for run in runs)
+    return f'{failed} of {len(runs)} displays ended early' if failed else None
+
+
+if __name__ == '__main__':
+    if len(sys.argv) not in (2, 3, 4):
+        sys.exit(__doc__)
+    os.environ['KVR_BIN'] = os.path.abspath(os.environ.get('KVR_BIN', f'{HERE}/../../build/dev/bin'))
+    cycles, seed, displays = (*map(int, sys.argv[1:]), *(1, 1)[len(sys.argv) - 2:])
+    sys.exit(run_on(displays, cycles, seed) if displays > 1 else run_here(cycles, seed))

@@ -2,6 +2,7 @@
 #include "files/safe_file.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/doc_template.h"
+#include "ks/fc/document_file.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
@@ -9,6 +10,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
+#include <new>
 #include <utility>
 
 namespace {
@@ -76,7 +78,12 @@ bool CKsDoc::SaveTo(const CString& target)
     m_named = false;
     m_whyNotSaved.clear();
     m_executing = true;
-    const bool saved = OnSaveDocument(target);
+    bool saved = false;
+    try {
+        saved = OnSaveDocument(target);
+    } catch (const std::bad_alloc&) {
+        TellNotSaved(CKsDocumentFile::WhyNoMemory(target));
+    }
     m_executing = false;
     if (saved && !m_named)
         SetPathName(SavePathFor(target));

@@ -3,10 +3,13 @@
 #include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/system_reason.h"
 
+#include <QDir>
 #include <QFileInfo>
 #include <QUndoStack>
 #include <algorithm>
+#include <new>
 
 namespace {
 
@@ -121,6 +124,22 @@ std::unique_ptr<CKsDoc> CMultiDocTemplate::ReadDocument(const CString& path)
 }
 
 CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)
+{
+    const auto before = Documents();
+    try {
+        return Open(frame, path);
+    } catch (const std::bad_alloc&) {
+        for (CKsDoc* document : Documents())
+            if (!before.contains(document)) // it has no window
+                CloseDocument(document);
+        KsMessageBox(CKsDoc::tr("%1 could not be opened.\n%2")
+                         .arg(QDir::toNativeSeparators(path.isEmpty() ? GetDocString(docName) : path),
+                              KsSystemSentence(std::make_error_code(std::errc::not_enough_memory))));
+        return nullptr;
+    }
+}
+
+CKsDoc* CMultiDocTemplate::Open(CKsMDIFrameWnd* frame, const CString& path)
 {
     const CString absolute = path.isEmpty() ? path : KsExistingSpelling(QFileInfo(path).absoluteFilePath());
     if (CKsDoc* open = absolute.isEmpty() ? nullptr : FindDocument(absolute)) {

@@ -72,6 +72,7 @@ signals:
 private:
     friend class CKsMDIChildWnd;
     std::unique_ptr<CKsDoc> LoadDocument(const CString& path);
+    CKsDoc* Open(CKsMDIFrameWnd* frame, const CString& path);
     bool ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame);
     void CloseDocument(CKsDoc* document);
     QList<CKsDoc*> Documents() const { return findChildren<CKsDoc*>(Qt::FindDirectChildrenOnly); }

@@ -9,6 +9,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <algorithm>
+#include <new>
 
 namespace {
 
@@ -227,30 +228,41 @@ Result<void> CKsDocumentFile::Save(const CString& target, const KsFileWriter& wr
     if (!same)
         options.renameTo = target.toStdString();
     options.ask = [this](const WriteQuestion& question) { return Ask(question); };
-    const Result<WriteReport> saved = write((same ? target : entry.value()).toStdString(), options);
+    Result<WriteReport> saved = write((same ? target : entry.value()).toStdString(), options);
     if (!saved)
         return saved.error();
     CKsDocumentFile written;
-    written.m_report = saved.value();
-    written.m_version = saved.value().version;
+    written.m_report = std::move(saved.value()); // it is saved: nothing may ask for memory any more
+    written.m_version = written.m_report.version;
     written.m_savedAs = target;
-    written.m_path = saved.value().notRenamed ? entry.value() : target;
+    written.m_path = written.m_report.notRenamed ? entry.value() : target;
     if (replaces.value()) {
         written.m_keptCopy = m_keptCopy;
         written.m_otherNames = m_otherNames;
     }
-    if (!same && !saved.value().notRenamed)
+    if (!same && !written.m_report.notRenamed)
         written.m_renamed = tr("%1 is now %2").arg(NameOf(entry.value()), NameOf(target));
     *this = std::move(written);
     return {};
 }
 
+CString CKsDocumentFile::WhyNoMemory(const CString& path)
+{
+    return tr("Could not write \"%1\": %2.")
+        .arg(QDir::toNativeSeparators(path), KsSystemReason(std::make_error_code(std::errc::not_enough_memory)));
+}
+
 bool CKsDocumentFile::Write(const CString& target, const KsFileWriter& write)
 {
     m_whyNotWritten.clear();
-    if (const Result<void> saved = Save(target, write); !saved) {
-        if (saved.error().code != std::errc::operation_canceled)
-            m_whyNotWritten = Sentence(saved.error());
+    try {
+        if (const Result<void> saved = Save(target, write); !saved) {
+            if (saved.error().code != std::errc::operation_canceled)
+                m_whyNotWritten = Sentence(saved.error());
+            return false;
+        }
+    } catch (const std::bad_alloc&) {
+        m_whyNotWritten = WhyNoMemory(target);
         return false;
     }
     if (m_report.notRenamed) // it is saved, and keeps its name

@@ -28,6 +28,8 @@ public:
     /// cannot be kept. Path() says what the file is called then, for where it cannot be renamed to a target of another
     /// spelling it keeps its name. What the file held that the document does not is kept in a copy beside it.
     bool Write(const CString& target, const KsFileWriter& write);
+    /// That a file could not be written for want of memory.
+    static CString WhyNoMemory(const CString& path);
     /// Why the last write failed; empty when it did not, or when the user did not want it.
     const CString& WhyNotWritten() const { return m_whyNotWritten; }
 

@@ -5,6 +5,7 @@
 
 #include <QTimer>
 #include <QUndoStack>
+#include <new>
 #include <utility>
 
 CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind)
@@ -32,7 +33,12 @@ void CKsProjectDoc::FileWritten()
 {
     UndoStack().setClean();
     SetPathName(m_file.Path());
-    m_stamp = FileStamp::Of(m_file.Path().toStdString());
+    m_stamp = {};
+    try {
+        m_stamp = FileStamp::Of(m_file.Path().toStdString());
+    } catch (const std::bad_alloc&) {
+        // It is saved all the same; what is kept of later changes is bound to no content of it.
+    }
     SetModifiedFlag(false);
     EditUnreadable();
 }
