@@ -9,6 +9,7 @@
 #include <QStringList>
 #include <memory>
 
+class CKsOutsideChange;
 class QUndoCommand;
 
 class KS_API CKsProjectDoc : public CKsDoc
@@ -24,7 +25,16 @@ public:
     bool IsReadOnly() const { return m_isReadOnly; }
     void EditUnreadable();
     bool TakeContent(std::string text, const CString& step) final;
-    FileStamp Stamp() const final { return m_stamp; }
+    FileStatus Seen() const final { return m_file.Seen(); }
+
+    /// What the file holds now becomes the document's content, as one step to undo; the document is not modified then.
+    /// What is being typed is asked for first. False, with the reason in `why` if it is the file's, when nothing has
+    /// changed.
+    bool Reload(CString& why);
+    /// Saves over what another program has written, which is kept in a copy; the user has been told.
+    bool SaveOverOthers();
+    /// What other programs do to the file; the views say when that matters.
+    CKsOutsideChange& Outside() { return *m_outside; }
 
     /// Joins the project that the document's file is a member of; false when there is none.
     bool JoinProject(CView* view);
@@ -69,10 +79,10 @@ protected:
     CKsDocumentFile m_file;
 
 private:
-    FileStamp m_stamp;
     void StepMade();
     LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const;
 
+    CKsOutsideChange* m_outside; // child
     int m_kind;
     bool m_isReadOnly = false;
     std::intptr_t m_project = 0;

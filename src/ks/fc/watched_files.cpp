@@ -1,0 +1,71 @@
+#include "ks/fc/watched_files.h"
+
+#include "ks/fc/file_watch.h"
+
+#include <QGuiApplication>
+#include <QPointer>
+
+CWatchedFiles& CWatchedFiles::Instance()
+{
+    static QPointer<CWatchedFiles> files;
+    if (!files)
+        files = new CWatchedFiles(qApp);
+    return *files;
+}
+
+CWatchedFiles::CWatchedFiles(QObject* parent) : QObject(parent)
+{
+    m_reader.setMaxThreadCount(1);
+    connect(&m_watcher, &QFileSystemWatcher::fileChanged, this, &CWatchedFiles::Touched);
+    connect(&m_watcher, &QFileSystemWatcher::directoryChanged, this, &CWatchedFiles::Touched);
+    connect(qGuiApp, &QGuiApplication::applicationStateChanged, this, [this](Qt::ApplicationState state) {
+        if (state != Qt::ApplicationActive || m_counts.isEmpty())
+            return;
+        m_watcher.addPaths(m_counts.keys()); // those that were not there, or that the system lost
+        for (CKsFileWatch* watch : std::as_const(m_watches))
+            watch->LookSoon();
+    });
+}
+
+CWatchedFiles::~CWatchedFiles()
+{
+    m_reader.clear();
+    m_reader.waitForDone(); // what it reads for is the program's
+}
+
+void CWatchedFiles::Add(CKsFileWatch& watch)
+{
+    m_watches.insert(&watch);
+    for (const QString& path : std::as_const(watch.m_watched))
+        if (++m_counts[path] == 1)
+            m_watcher.addPath(path);
+}
+
+void CWatchedFiles::Remove(CKsFileWatch& watch)
+{
+    m_watches.remove(&watch);
+    for (const QString& path : std::as_const(watch.m_watched))
+        if (--m_counts[path] == 0) {
+            m_counts.remove(path);
+            m_watcher.removePath(path);
+        }
+}
+
+/// A path that has another file now is still watched for the old one. Whoever is meant looks after it is watched anew,
+/// so that nothing is missed in between.
+void CWatchedFiles::Touched(const QString& path)
+{
+    QStringList again{path};
+    for (CKsFileWatch* watch : std::as_const(m_watches))
+        if (watch->m_watched.contains(path)) {
+            again += watch->m_watched;
+            watch->LookSoon();
+        }
+    again.removeDuplicates();
+    const QStringList folders = m_watcher.directories();
+    again.removeIf([&](const QString& each) { return !m_counts.contains(each) || folders.contains(each); });
+    if (again.isEmpty())
+        return;
+    m_watcher.removePaths(again);
+    m_watcher.addPaths(again);
+}
