@@ -17,6 +17,7 @@ void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHa
     m_stamp = FileStamp::Of(path.toStdString()); // before: what is written to it from now on makes it another
     m_file.Read(path, SavePathFor(path), load);
     m_isReadOnly = m_file.IsUnreadable();
+    m_isNoticeClosed = false;
     emit FileStateChanged();
 }
 
@@ -34,6 +35,7 @@ void CKsProjectDoc::FileWritten()
     SetPathName(m_file.Path());
     m_stamp = FileStamp::Of(m_file.Path().toStdString());
     SetModifiedFlag(false);
+    m_isNoticeClosed = false;
     EditUnreadable();
 }
 
