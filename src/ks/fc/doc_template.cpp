@@ -1,8 +1,10 @@
 #include "ks/fc/doc_template.h"
 
+#include "files/field.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/project_doc.h"
 
 #include <QFileInfo>
 #include <QUndoStack>
@@ -121,6 +123,16 @@ std::unique_ptr<CKsDoc> CMultiDocTemplate::ReadDocument(const CString& path)
     auto document = LoadDocument(path);
     m_untitled = untitled;
     return document;
+}
+
+Result<std::string> CMultiDocTemplate::ContentOf(const CString& path)
+{
+    const UndatedObjects undated;
+    const auto document = ReadDocument(path);
+    const auto* const read = dynamic_cast<const CKsProjectDoc*>(document.get());
+    if (!document || (read && read->File().IsUnreadable()))
+        return Error{};
+    return document->ContentText();
 }
 
 CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)

@@ -139,10 +139,10 @@ void CKsOutsideChange::Compare(QWidget* parent)
     if (!m_document.MayLeave()) // what is being typed is shown, too
         return;
     QApplication::setOverrideCursor(Qt::WaitCursor);
-    const Result<std::string> shown = m_document.ContentText();
+    Result<std::string> shown = m_document.ContentText();
+    Result<std::string> there = m_document.GetDocTemplate()->ContentOf(m_document.File().Path());
     const auto differences =
-        shown ? KsFindDifferences(shown.value(), m_document.GetDocTemplate()->ContentOf(m_document.GetPathName()))
-              : std::nullopt;
+        shown && there ? FindDifferences(std::move(shown.value()), std::move(there.value())) : std::nullopt;
     QApplication::restoreOverrideCursor();
     if (!differences) {
         KsMessageBox(tr("What differs is not known: the file cannot be read."));

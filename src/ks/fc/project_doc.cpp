@@ -8,7 +8,7 @@
 #include <QUndoStack>
 #include <utility>
 
-CKsProjectDoc::CKsProjectDoc(int kind) : m_outside(new CKsOutsideChange(*this)), m_kind(kind)
+CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind), m_outside(new CKsOutsideChange(*this))
 {
     connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
 }
@@ -17,8 +17,7 @@ void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHa
 {
     m_file.Read(path, SavePathFor(path), load);
     m_isReadOnly = m_file.IsUnreadable();
-    m_outside->Expect();
-    emit FileStateChanged();
+    FileIsKnown();
 }
 
 bool CKsProjectDoc::Reload(CString& why)
@@ -38,9 +37,16 @@ bool CKsProjectDoc::Reload(CString& why)
     UndoStack().push(step.release());
     UndoStack().setClean();
     SetModifiedFlag(false);
+    FileIsKnown();
+    return true;
+}
+
+/// The document and its file are the same.
+void CKsProjectDoc::FileIsKnown()
+{
+    m_isNoticeClosed = false;
     m_outside->Expect();
     emit FileStateChanged();
-    return true;
 }
 
 bool CKsProjectDoc::SaveOverOthers()
@@ -64,8 +70,8 @@ void CKsProjectDoc::FileWritten()
     UndoStack().setClean();
     SetPathName(m_file.Path());
     SetModifiedFlag(false);
-    m_outside->Expect();
-    EditUnreadable();
+    m_isReadOnly = false;
+    FileIsKnown();
 }
 
 void CKsProjectDoc::EditUnreadable()
