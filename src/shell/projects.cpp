@@ -21,13 +21,18 @@ bool ReadMembers(CProject& project, QString& error)
         ReadDeclaredFile(structure, DeclaredProjectFile(), &read, report);
     });
     error = file.WhyNothing();
+    if (!error.isEmpty())
+        return false;
     project.findings = file.Findings();
+    project.version = file.Version();
+    project.seen = file.Seen();
+    project.members.clear();
     const QDir folder = QFileInfo(project.path).absoluteDir();
     for (const ProjectMember& member : read.members)
         if (!member.file.empty())
             project.members << member.PathIn(folder);
     project.members.removeDuplicates();
-    return error.isEmpty();
+    return true;
 }
 
 } // namespace
@@ -47,6 +52,12 @@ const CProject* CProjects::Open(const QString& path, QString& error)
     project->handle = ++m_last;
     m_projects.push_back(std::move(project));
     return m_projects.back().get();
+}
+
+bool CProjects::ReadAgain(CProjectHandle handle, QString& error)
+{
+    CProject* project = FindForChange(handle);
+    return project && ReadMembers(*project, error);
 }
 
 void CProjects::Close(CProjectHandle handle)

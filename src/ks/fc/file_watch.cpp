@@ -106,7 +106,7 @@ void CKsFileWatch::Expect(const CString& path, const std::optional<FileVersion>&
     m_version = known.value_or(FileVersion());
     m_seen = seen;
     m_isTrusted = known && TimeSince(seen.touched) > CoarsestClock;
-    m_wasGone = false;
+    m_wasMissed = false;
     Take({});
     LookSoon(); // it may have been written to before it was watched
 }
@@ -145,14 +145,14 @@ void CKsFileWatch::Looked(const Look& look, int generation)
 {
     m_isLooking = false;
     const bool isGone = !look.why && look.status.kind == FileStatus::Kind::None;
-    const bool isOutOfDate = generation != m_generation || look.isMoving;
-    if (std::exchange(m_looksAgain, false) || isOutOfDate || (isGone && !m_wasGone)) {
-        m_wasGone = isGone && !isOutOfDate;
+    const bool isMissed = isGone || look.why, isOutOfDate = generation != m_generation || look.isMoving;
+    if (std::exchange(m_looksAgain, false) || isOutOfDate || (isMissed && !m_wasMissed)) {
+        m_wasMissed = isMissed && !isOutOfDate;
         LookSoon();
         return;
     }
-    m_wasGone = isGone;
-    m_isTrusted = look.isTrusted && !look.why && !isGone;
+    m_wasMissed = isMissed;
+    m_isTrusted = look.isTrusted && !isMissed;
     m_seen = look.status;
     m_version = look.version;
     if (isGone)

@@ -63,7 +63,7 @@ private:
     bool m_isTrusted = false; // who writes to it now makes it another by its looks
     int m_generation = 0;     // of what is expected: a look that began before is out of date
     bool m_isLooking = false, m_looksAgain = false;
-    bool m_wasGone = false; // at the last look: a file that is being replaced is there again at the next one
+    bool m_wasMissed = false; // at the last look: a file that is being replaced is there again at the next one
     QTimer m_soon;
     QElapsedTimer m_waits; // since the first call for a look that has not begun
     KsFileSight m_sight;
