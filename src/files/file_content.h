@@ -1,8 +1,8 @@
 // The content of files: read whole, told apart, and what is wrong when that fails.
 //
-// Two notions tell whether a file is what it was. FileVersion is its content, and certain: whether somebody's work would be
-// lost is decided by it. FileStatus (platform_file.h) is known without reading: which file stands there, and when somebody
-// last had to do with it. It says when the content need not be read again, and nothing more.
+// Two notions tell whether a file is what it was. FileVersion is its content, and certain: whether somebody's work
+// would be lost is decided by it. FileStatus (platform_file.h) is known without reading: which file stands there, and
+// when somebody last had to do with it. It says when the content need not be read again, and nothing more.
 #pragma once
 
 #include "base/result.h"

@@ -56,6 +56,6 @@ private:
     CWindowManager& m_windows;
     const CPlugins& m_plugins;
     CProjects m_projects;
-    CProjectTree* m_tree; // the frame's
+    CProjectTree* m_tree;                                              // the frame's
     std::map<CProjectHandle, std::unique_ptr<CKsFileWatch>> m_watches; // of the files of projects
 };

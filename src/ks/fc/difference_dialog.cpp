@@ -58,8 +58,8 @@ CKsDifferenceDialog::CKsDifferenceDialog(const Captions& captions, const Differe
         summary += u' ' + tr("The first %1 places are listed.").arg(differences.list.size());
     auto* text = new QLabel(summary, this);
     text->setWordWrap(true);
-    const QStringList columns =
-        tr("Section\nKeyword\nNumber\nParameter").split(u'\n') << captions.before << captions.after;
+    const QStringList columns = tr("Section\nKeyword\nNumber\nParameter").split(u'\n')
+                                << captions.before << captions.after;
     auto* table = new QTableWidget(0, int(columns.size()), this);
     table->setHorizontalHeaderLabels(columns);
     table->setAccessibleName(windowTitle());

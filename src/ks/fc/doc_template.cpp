@@ -1,16 +1,18 @@
 #include "ks/fc/doc_template.h"
 
-#include "files/field.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/project_doc.h"
 
 #include <QFileInfo>
+#include <QScopedValueRollback>
 #include <QUndoStack>
 #include <algorithm>
 
 namespace {
+
+bool readsToCompare = false;
 
 std::vector<CMultiDocTemplate*>& Templates()
 {
@@ -127,12 +129,17 @@ std::unique_ptr<CKsDoc> CMultiDocTemplate::ReadDocument(const CString& path)
 
 Result<std::string> CMultiDocTemplate::ContentOf(const CString& path)
 {
-    const UndatedObjects undated;
+    const QScopedValueRollback reading(readsToCompare, true);
     const auto document = ReadDocument(path);
     const auto* const read = dynamic_cast<const CKsProjectDoc*>(document.get());
     if (!document || (read && read->File().IsUnreadable()))
         return Error{};
     return document->ContentText();
+}
+
+bool CMultiDocTemplate::ReadsToCompare()
+{
+    return readsToCompare;
 }
 
 CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)

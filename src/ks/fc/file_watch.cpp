@@ -15,9 +15,9 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr auto Rest = 200ms;        // that a file is given when it has been written to
-constexpr auto LongestWait = 1500;  // milliseconds, of a file that is written to all the time
-constexpr auto CoarsestClock = 2s;  // of a file system
+constexpr auto Rest = 200ms;       // that a file is given when it has been written to
+constexpr auto LongestWait = 1500; // milliseconds, of a file that is written to all the time
+constexpr auto CoarsestClock = 2s; // of a file system
 
 std::int64_t Now()
 {
@@ -65,9 +65,9 @@ CKsFileWatch::Look CKsFileWatch::LookAt(const std::string& path, const FileStatu
     if (look.why || look.status.kind == FileStatus::Kind::None)
         return look;
     if (look.status.kind != FileStatus::Kind::File) {
-        look.why = std::make_error_code(look.status.kind == FileStatus::Kind::Folder
-                                            ? std::errc::is_a_directory
-                                            : std::errc::operation_not_supported);
+        look.why =
+            std::make_error_code(look.status.kind == FileStatus::Kind::Folder ? std::errc::is_a_directory
+                                                                              : std::errc::operation_not_supported);
         return look;
     }
     look.isTrusted = TimeSince(look.status.touched) > CoarsestClock;
@@ -125,7 +125,8 @@ void CKsFileWatch::Start()
         m_looksAgain = true;
         return;
     }
-    // A copy of the process that is made meanwhile (a snapshot) holds nothing that the reader does: it only reads files.
+    // A copy of the process that is made meanwhile (a snapshot) holds nothing that the reader does: it only reads
+    // files.
     CWatchedFiles& files = CWatchedFiles::Instance();
     const auto look = [&files, watch = QPointer(this), path = m_path.toStdString(), seen = m_seen, version = m_version,
                        isTrusted = m_isTrusted, generation = m_generation] {
@@ -167,8 +168,7 @@ void CKsFileWatch::Looked(const Look& look, int generation)
 
 void CKsFileWatch::Take(KsFileSight sight)
 {
-    const bool isNews =
-        sight.kind != m_sight.kind || !(sight.version == m_sight.version) || sight.why != m_sight.why;
+    const bool isNews = sight.kind != m_sight.kind || !(sight.version == m_sight.version) || sight.why != m_sight.why;
     if (!isNews)
         return;
     m_sight = std::move(sight);

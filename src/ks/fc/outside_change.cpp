@@ -91,7 +91,8 @@ KsFileNotice CKsOutsideChange::OtherContent()
                             "name. Overwrite puts it back; the file as it is stays in a copy beside it."))
                       .arg(Name(), TimeText(Sight().time));
     if (!m_whyNotReloaded.isEmpty())
-        notice.text += u'\n' + tr("The file cannot be loaded as it is, and what is shown stays: %1").arg(m_whyNotReloaded);
+        notice.text +=
+            u'\n' + tr("The file cannot be loaded as it is, and what is shown stays: %1").arg(m_whyNotReloaded);
     notice.actions = {{tr("Reload"), [this](CKsFileBar&) { Reload(); }},
                       {tr("Compare..."), [this](CKsFileBar& bar) { Compare(&bar); }},
                       {tr("Keep Both..."), [this](CKsFileBar&) { KeepBoth(); }},
@@ -111,8 +112,8 @@ void CKsOutsideChange::Append(std::vector<KsFileNotice>& notices)
         notice.text = tr("%1 was removed or renamed by another program (%2). What is shown is nowhere else until it is "
                          "saved again.")
                           .arg(Name(), TimeText(Sight().time));
-        notice.actions = {
-            {tr("Save Again"), [this](CKsFileBar&) { m_document.DoSave(m_document.GetPathName()); }}, saveAs};
+        notice.actions = {{tr("Save Again"), [this](CKsFileBar&) { m_document.DoSave(m_document.GetPathName()); }},
+                          saveAs};
     } else {
         notice.text = tr("%1 cannot be read any more: %2. What is shown stays; to be safe save it under another name.")
                           .arg(Name(), KsSystemReason(Sight().why));
@@ -149,7 +150,7 @@ void CKsOutsideChange::Compare(QWidget* parent)
         return;
     }
     (new CKsDifferenceDialog({tr("Changes of %1 by Another Program").arg(Name()), tr("Shown"), tr("In the file")},
-                           *differences, parent))
+                             *differences, parent))
         ->open();
 }
 
