@@ -4,6 +4,8 @@
 
 #include <QGuiApplication>
 #include <QPointer>
+#include <QTimer>
+#include <utility>
 
 CWatchedFiles& CWatchedFiles::Instance()
 {
@@ -51,21 +53,34 @@ void CWatchedFiles::Remove(CKsFileWatch& watch)
         }
 }
 
-/// A path that has another file now is still watched for the old one. Whoever is meant looks after it is watched anew,
-/// so that nothing is missed in between.
+/// When the system's watch has told all that it has to tell: it takes no other paths meanwhile.
 void CWatchedFiles::Touched(const QString& path)
 {
-    QStringList again{path};
+    if (m_touched.isEmpty())
+        QTimer::singleShot(0, this, &CWatchedFiles::WatchAgain);
+    m_touched.insert(path);
+}
+
+/// A path that has another file now is still watched for the old one. Whoever is meant looks after it is watched anew,
+/// so that nothing is missed in between.
+void CWatchedFiles::WatchAgain()
+{
+    const QSet<QString> touched = std::exchange(m_touched, {});
+    QSet<CKsFileWatch*> meant;
+    QSet<QString> again;
     for (CKsFileWatch* watch : std::as_const(m_watches))
-        if (watch->m_watched.contains(path)) {
-            again += watch->m_watched;
-            watch->LookSoon();
-        }
-    again.removeDuplicates();
-    const QStringList folders = m_watcher.directories();
-    again.removeIf([&](const QString& each) { return !m_counts.contains(each) || folders.contains(each); });
-    if (again.isEmpty())
-        return;
-    m_watcher.removePaths(again);
-    m_watcher.addPaths(again);
+        for (const QString& path : std::as_const(watch->m_watched))
+            if (touched.contains(path)) {
+                meant.insert(watch);
+                again += QSet<QString>(watch->m_watched.begin(), watch->m_watched.end());
+            }
+    for (const QString& folder : m_watcher.directories())
+        again.remove(folder);
+    for (const QString& file : m_watcher.files())
+        if (again.contains(file))
+            m_watcher.removePath(file);
+    if (!again.isEmpty())
+        m_watcher.addPaths(again.values());
+    for (CKsFileWatch* watch : meant)
+        watch->LookSoon();
 }

@@ -22,9 +22,11 @@ public:
 
 private:
     void Touched(const QString& path);
+    void WatchAgain();
 
     QFileSystemWatcher m_watcher;
     QThreadPool m_reader;
     QSet<CKsFileWatch*> m_watches;
     QHash<QString, int> m_counts; // of the watches of a path
+    QSet<QString> m_touched;      // in the present event
 };
