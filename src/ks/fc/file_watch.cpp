@@ -30,14 +30,14 @@ bool IsUntouched(const FileStatus& a, const FileStatus& b)
     return a.IsUnchanged(b) && a.touched == b.touched;
 }
 
-/// The file, its folder, and where it is a link those of the file that it leads to.
+/// The file that a path leads to, its folder, and that of a link: who changes a link changes its folder.
 QStringList WatchedPaths(const CString& path)
 {
     auto target = QFileInfo(path).filesystemFilePath();
     FileStatus status;
     FollowLinks(PlatformFile::Native(), target, status);
     const CString file = QString::fromStdString(Utf8FromPath(target));
-    QStringList paths{path, QFileInfo(path).absolutePath(), file, QFileInfo(file).absolutePath()};
+    QStringList paths{file, QFileInfo(file).path(), QFileInfo(path).path()};
     paths.removeDuplicates();
     return paths;
 }

@@ -56,7 +56,7 @@ private:
     void Take(KsFileSight sight);
 
     CString m_path;
-    QStringList m_watched; // the file, its folder, and, of a link, those that it leads to
+    QStringList m_watched; // by the system: the file and its folder, and that of a link to it
     std::optional<FileVersion> m_known;
     FileStatus m_seen; // the file as it was last read, and what it held then
     FileVersion m_version;

@@ -2,6 +2,7 @@
 
 #include "ks/fc/file_watch.h"
 
+#include <QFileInfo>
 #include <QGuiApplication>
 #include <QPointer>
 #include <QTimer>
@@ -21,11 +22,8 @@ CWatchedFiles::CWatchedFiles(QObject* parent) : QObject(parent)
     connect(&m_watcher, &QFileSystemWatcher::fileChanged, this, &CWatchedFiles::Touched);
     connect(&m_watcher, &QFileSystemWatcher::directoryChanged, this, &CWatchedFiles::Touched);
     connect(qGuiApp, &QGuiApplication::applicationStateChanged, this, [this](Qt::ApplicationState state) {
-        if (state != Qt::ApplicationActive || m_counts.isEmpty())
-            return;
-        m_watcher.addPaths(m_counts.keys()); // those that were not there, or that the system lost
-        for (CKsFileWatch* watch : std::as_const(m_watches))
-            watch->LookSoon();
+        if (state == Qt::ApplicationActive)
+            LookAtAll();
     });
 }
 
@@ -61,26 +59,24 @@ void CWatchedFiles::Touched(const QString& path)
     m_touched.insert(path);
 }
 
-/// A path that has another file now is still watched for the old one. Whoever is meant looks after it is watched anew,
-/// so that nothing is missed in between.
+/// A path that has another file now is still watched for the old one, and of several paths of one file the system names
+/// but one. So all files near by are watched anew, and looked at when that is done, so that nothing is missed in
+/// between. A look that finds a file as it was does not read it.
 void CWatchedFiles::WatchAgain()
 {
     const QSet<QString> touched = std::exchange(m_touched, {});
-    QSet<CKsFileWatch*> meant;
-    QSet<QString> again;
-    for (CKsFileWatch* watch : std::as_const(m_watches))
-        for (const QString& path : std::as_const(watch->m_watched))
-            if (touched.contains(path)) {
-                meant.insert(watch);
-                again += QSet<QString>(watch->m_watched.begin(), watch->m_watched.end());
-            }
-    for (const QString& folder : m_watcher.directories())
-        again.remove(folder);
-    for (const QString& file : m_watcher.files())
-        if (again.contains(file))
+    const QStringList files = m_watcher.files();
+    for (const QString& file : files)
+        if (touched.contains(file) || touched.contains(QFileInfo(file).path()))
             m_watcher.removePath(file);
-    if (!again.isEmpty())
-        m_watcher.addPaths(again.values());
-    for (CKsFileWatch* watch : meant)
+    LookAtAll();
+}
+
+void CWatchedFiles::LookAtAll()
+{
+    if (m_counts.isEmpty())
+        return;
+    m_watcher.addPaths(m_counts.keys()); // those that are not watched
+    for (CKsFileWatch* watch : std::as_const(m_watches))
         watch->LookSoon();
 }

@@ -23,6 +23,7 @@ public:
 private:
     void Touched(const QString& path);
     void WatchAgain();
+    void LookAtAll();
 
     QFileSystemWatcher m_watcher;
     QThreadPool m_reader;
