@@ -1,5 +1,8 @@
 #include "files/difference.h"
 
+#include "files/field.h"
+#include "files/structure.h"
+
 #include <algorithm>
 #include <functional>
 #include <string_view>
@@ -84,6 +87,27 @@ bool IsSameValue(tqlHandle a, tqlHandle b)
     std::string texts[2];
     return tqlGetType(a) == tqlGetType(b) && tqlGetString(a, &texts[0]) && tqlGetString(b, &texts[1]) &&
            texts[0] == texts[1];
+}
+
+constexpr int DateParameters = 6;
+
+/// The date that begins with a parameter; nothing when there is none.
+std::optional<HDDateTime> DateAt(tqlHandle param)
+{
+    std::int32_t parts[DateParameters] = {};
+    for (std::int32_t& part : parts) {
+        if (!param || !tqlGetInt(param, &part))
+            return {};
+        param = tqlNextParam(param);
+    }
+    return HDDateTime{parts[0], parts[1], parts[2], parts[3], parts[4], parts[5]};
+}
+
+bool IsDateOnOneSide(tqlHandle before, tqlHandle after)
+{
+    const auto old = DateAt(before), now = DateAt(after);
+    constexpr HDDateTime unset;
+    return old && now && ((*old == unset && now->IsValid()) || (*now == unset && old->IsValid()));
 }
 
 class Comparison
@@ -259,10 +283,15 @@ private:
     void Values(const Difference& place, tqlHandle before, tqlHandle after)
     {
         tqlHandle old = tqlParamByNum(before, 1), now = tqlParamByNum(after, 1);
+        int dateEnds = 0; // before this parameter
         for (int number = 1; old && now; ++number, old = tqlNextParam(old), now = tqlNextParam(now)) {
             const std::string_view texts[] = {tqlGetRawParam(old), tqlGetRawParam(now)};
-            if (texts[0] == texts[1] || IsSameValue(old, now))
+            if (number < dateEnds || texts[0] == texts[1] || IsSameValue(old, now))
                 continue;
+            if (IsDateOnOneSide(old, now)) {
+                dateEnds = number + DateParameters;
+                continue;
+            }
             Difference found = place;
             found.parameter = number;
             found.before = texts[0];
@@ -296,4 +325,12 @@ Differences FindDifferences(tqlHandle before, tqlHandle after, std::size_t most)
     Comparison comparison(before, after, most);
     comparison.CompareTargets();
     return comparison.Take();
+}
+
+std::optional<Differences> FindDifferences(std::string before, std::string after)
+{
+    const Result<TqlStructure> structures[] = {ParseText(std::move(before), {}), ParseText(std::move(after), {})};
+    if (!structures[0] || !structures[1])
+        return {};
+    return FindDifferences(structures[0].value().Get(), structures[1].value().Get());
 }

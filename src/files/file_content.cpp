@@ -159,6 +159,17 @@ std::error_code FollowLinks(PlatformFile& platform, std::filesystem::path& path,
     return std::make_error_code(std::errc::too_many_symbolic_link_levels);
 }
 
+FileStatus StatusBehind(const std::string& path)
+{
+    try {
+        std::filesystem::path target = PathFromUtf8(path);
+        FileStatus status;
+        return FollowLinks(PlatformFile::Native(), target, status) ? FileStatus() : status;
+    } catch (const std::bad_alloc&) {
+        return {};
+    }
+}
+
 std::error_code IsSameFile(PlatformFile& platform, const std::filesystem::path& a, const std::filesystem::path& b,
                            bool& same)
 {

@@ -1,4 +1,8 @@
 // The content of files: read whole, told apart, and what is wrong when that fails.
+//
+// Two notions tell whether a file is what it was. FileVersion is its content, and certain: whether somebody's work
+// would be lost is decided by it. FileStatus (platform_file.h) is known without reading: which file stands there, and
+// when somebody last had to do with it. It says when the content need not be read again, and nothing more.
 #pragma once
 
 #include "base/result.h"
@@ -25,6 +29,9 @@ std::error_code IsSameFile(PlatformFile& platform, const std::filesystem::path& 
                            bool& same);
 /// What a chain of symbolic links ends at, and its status, whether it exists or not.
 std::error_code FollowLinks(PlatformFile& platform, std::filesystem::path& path, FileStatus& status);
+/// The status of what a path (UTF-8) leads to; of kind None also where the system does not say, or
+/// memory ends: it is asked for after a save, which has succeeded then.
+FileStatus StatusBehind(const std::string& path);
 /// The folder of a path, which may be relative.
 std::filesystem::path FolderOf(const std::filesystem::path& path);
 

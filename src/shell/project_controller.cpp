@@ -5,6 +5,7 @@
 #include "ks/fc/findings_dialog.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/system_reason.h"
 #include "shell/plugin_loader.h"
 #include "shell/recent_files.h"
 #include "shell/window_manager.h"
@@ -39,6 +40,7 @@ bool CProjectController::Open(const QString& path, bool othersLater)
     RecentFiles::Add(project.path);
     Announce(KsRequest::ProjectOpened, project);
     m_tree->show();
+    KsAfterPaint(m_tree, this, [this, handle = project.handle] { Watch(handle); });
     if (!project.findings.empty())
         (new CKsFindingsDialog(project.path, project.findings, &m_frame))->show();
     m_frame.resizeDocks({m_tree}, {ProjectTreeWidth}, Qt::Horizontal);
@@ -56,6 +58,43 @@ bool CProjectController::Open(const QString& path, bool othersLater)
     else
         OpenOtherMembers(project.handle, missing);
     return true;
+}
+
+void CProjectController::Watch(CProjectHandle handle)
+{
+    const CProject* project = m_projects.Find(handle);
+    if (!project || m_watches.contains(handle))
+        return;
+    auto watch = std::make_unique<CKsFileWatch>(nullptr);
+    connect(watch.get(), &CKsFileWatch::Changed, this, [this, handle] { FileChanged(handle); });
+    watch->Expect(project->path, project->version, project->seen);
+    m_watches[handle] = std::move(watch);
+}
+
+/// Nothing of a project is edited here, so its file is simply read again. Files that are open stay open.
+void CProjectController::FileChanged(CProjectHandle handle)
+{
+    const CProject* project = m_projects.Find(handle);
+    CKsFileWatch& watch = *m_watches.at(handle);
+    const KsFileSight& sight = watch.Sight();
+    if (!project || sight.kind == KsFileSight::Known)
+        return;
+    const QString name = KsShownFileName(project->path);
+    if (sight.kind == KsFileSight::Gone) {
+        m_frame.TellStatus(tr("%1 was removed or renamed by another program. Its files stay open.").arg(name));
+        return;
+    }
+    const bool isOurs = sight.kind == KsFileSight::Other && sight.version == project->version;
+    QString error = sight.why ? KsSystemSentence(sight.why) : QString();
+    if (!isOurs && (sight.why || !m_projects.ReadAgain(handle, error))) {
+        m_frame.TellStatus(tr("%1 was changed by another program and cannot be read: %2").arg(name, error));
+        return;
+    }
+    watch.Expect(project->path, project->version, project->seen);
+    if (isOurs)
+        return;
+    UpdateTree();
+    m_frame.TellStatus(tr("%1 was changed by another program. The list of its files has been read again.").arg(name));
 }
 
 /// `missing`: what could not be opened before.
@@ -211,6 +250,7 @@ bool CProjectController::Close(CProjectHandle handle)
     if (!m_frame.CloseWindows(windows))
         return false;
     Announce(KsRequest::ProjectClosing, project);
+    m_watches.erase(handle);
     m_projects.Close(handle);
     emit Changed();
     return true;

@@ -1,10 +1,12 @@
 // Opening and closing projects, and what their tree shows.
 #pragma once
 
+#include "ks/fc/file_watch.h"
 #include "shell/project_tree.h"
 #include "shell/projects.h"
 
 #include <QObject>
+#include <map>
 
 class CKsMDIFrameWnd;
 class CPlugins;
@@ -42,6 +44,8 @@ private:
     CMemberState StateOf(const CProject& project, const QString& stored) const;
     const CProject* OwnerOf(const QString& member) const;
     void TellOfSharedMembers(const CProject& project) const;
+    void Watch(CProjectHandle handle);
+    void FileChanged(CProjectHandle handle);
     void Announce(WPARAM what, const CProject& project) const;
     QStringList OpenMembers(const CProject& project, const QStringList& members);
     QStringList OpenMemberWithReasons(const CProject& project, const QString& member);
@@ -52,5 +56,6 @@ private:
     CWindowManager& m_windows;
     const CPlugins& m_plugins;
     CProjects m_projects;
-    CProjectTree* m_tree; // the frame's
+    CProjectTree* m_tree;                                              // the frame's
+    std::map<CProjectHandle, std::unique_ptr<CKsFileWatch>> m_watches; // of the files of projects
 };

@@ -77,6 +77,8 @@ void RespellMember(const CProjects& projects, const QString& oldPath, const QStr
         if (!project->members.contains(QDir::cleanPath(oldPath)))
             continue;
         const Result<WriteReport> respelt = Respell(project->path, oldPath, after.suffix().toUtf8());
+        if (respelt)
+            project->version = respelt.value().version;
         const QString text =
             respelt
                 ? CKsDocumentFile::NotesOn(project->path, respelt.value())

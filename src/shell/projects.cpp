@@ -23,13 +23,18 @@ bool ReadMembers(CProject& project, QString& error)
         ReadDeclaredFile(structure, DeclaredProjectFile(), &read, report);
     });
     error = file.WhyNothing();
+    if (!error.isEmpty())
+        return false;
     project.findings = file.Findings();
+    project.version = file.Version();
+    project.seen = file.Seen();
+    project.members.clear();
     const QDir folder = QFileInfo(project.path).absoluteDir();
     for (const ProjectMember& member : read.members)
         if (!member.file.empty())
             project.members << member.PathIn(folder);
     project.members.removeDuplicates();
-    return error.isEmpty();
+    return true;
 }
 
 } // namespace
@@ -52,6 +57,12 @@ try {
 } catch (const std::bad_alloc&) {
     error = KsSystemSentence(std::make_error_code(std::errc::not_enough_memory));
     return nullptr;
+}
+
+bool CProjects::ReadAgain(CProjectHandle handle, QString& error)
+{
+    CProject* project = FindForChange(handle);
+    return project && ReadMembers(*project, error);
 }
 
 void CProjects::Close(CProjectHandle handle)

@@ -4,6 +4,7 @@
 // request 25) and then hears when another member's data change (request 522); other projects never do.
 #pragma once
 
+#include "files/file_content.h"
 #include "files/finding.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/package.h"
@@ -11,6 +12,7 @@
 #include <QPointer>
 #include <QStringList>
 #include <memory>
+#include <optional>
 #include <vector>
 
 using CProjectHandle = std::intptr_t; // never 0, never used twice
@@ -22,6 +24,8 @@ struct CProject
     QString name;                       // the file's base name as it can be seen
     QStringList members;                // absolute paths as they are spelt there, in file order
     std::vector<Finding> findings;      // what of the file was not taken as it stands
+    std::optional<FileVersion> version; // what the file held when it was read or written here
+    FileStatus seen;                    // and what it was then
     std::vector<QPointer<CView>> views; // those that joined
 };
 
@@ -30,6 +34,9 @@ class CProjects
 public:
     /// Reads a project file. Null, with `error` for the user, when that fails. One that is open already is returned.
     const CProject* Open(const QString& path, QString& error);
+    /// Reads the file of a project again, which somebody has changed. Views that have joined stay. False, with `error`,
+    /// and everything as it was, when that fails.
+    bool ReadAgain(CProjectHandle handle, QString& error);
     /// Its views stop being members.
     void Close(CProjectHandle handle);
     const CProject* Find(CProjectHandle handle) const;

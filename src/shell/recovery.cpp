@@ -1,6 +1,5 @@
 #include "shell/recovery.h"
 
-#include "files/structure.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
@@ -120,15 +119,8 @@ std::optional<Differences> CRecovery::Compare(const CRecoverable& item) const
         return {};
     // Both as the editor writes them: what is written otherwise in the file is no change.
     const bool hasFile = QFileInfo(item.header.path).isFile();
-    const auto document = item.editor->ReadDocument(hasFile ? item.header.path : QString());
-    Result<std::string> before = document ? document->ContentText() : Result<std::string>(Error{});
-    if (!before)
-        return {};
-    const Result<TqlStructure> structures[] = {ParseText(std::move(before.value()), {}),
-                                               ParseText(std::move(content), {})};
-    if (!structures[0] || !structures[1])
-        return {};
-    return FindDifferences(structures[0].value().Get(), structures[1].value().Get());
+    Result<std::string> before = item.editor->ContentOf(hasFile ? item.header.path : QString());
+    return before ? FindDifferences(std::move(before.value()), std::move(content)) : std::nullopt;
 }
 
 void CRecovery::Discard(const CRecoverable& item)

@@ -1,11 +1,11 @@
 #include "shell/recovery_dialog.h"
 
 #include "ks/fc/after_paint.h"
+#include "ks/fc/difference_dialog.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/plain_cell.h"
 #include "ks/language/date_time.h"
-#include "shell/difference_dialog.h"
-#include "shell/plain_cell.h"
 
 #include <QApplication>
 #include <QDialogButtonBox>
@@ -135,7 +135,7 @@ ProcessCopy::Answer CRecoveryDialog::Look(CRecoverable item) const
 QString CRecoveryDialog::Description(const CRecoverable& item) const
 {
     const auto differences = m_recovery.Compare(item);
-    const QString what = differences ? CDifferenceDialog::Summary(*differences)
+    const QString what = differences ? CKsDifferenceDialog::Summary(*differences)
                                      : tr("What differs is not known: the file cannot be read.");
     switch (item.state) {
     case CRecoverable::Damaged:
@@ -185,8 +185,9 @@ void CRecoveryDialog::Compare()
     QApplication::setOverrideCursor(Qt::WaitCursor);
     const auto differences = m_recovery.Compare(m_items[std::size_t(row)]);
     QApplication::restoreOverrideCursor();
+    const QString title = tr("Recovered Changes of %1").arg(m_items[std::size_t(row)].Name());
     if (differences)
-        (new CDifferenceDialog(m_items[std::size_t(row)].Name(), *differences, this))->open();
+        (new CKsDifferenceDialog({title, tr("Now"), tr("Recovered")}, *differences, this))->open();
     else
         KsMessageBox(tr("What differs is not known: the file cannot be read."));
 }

@@ -1,5 +1,6 @@
 #include "shell/snapshot.h"
 
+#include "files/file_content.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/doc_template.h"
 #include "shell/recovery_file.h"
@@ -19,8 +20,8 @@ std::error_code WriteContent(const CKsDoc& document, CRecoveryHeader header, con
     const Result<std::string> content = document.ContentText();
     if (!content)
         return content.error().code ? content.error().code : std::make_error_code(std::errc::invalid_argument);
-    const FileStamp known = document.Stamp();
-    if (known.exists && FileStamp::Of(header.path.toStdString()) == known) {
+    const FileStatus known = document.Seen();
+    if (known.kind == FileStatus::Kind::File && StatusBehind(header.path.toStdString()).IsUnchanged(known)) {
         header.size = qint64(known.size);
         header.hash = FileHash(header.path);
     }

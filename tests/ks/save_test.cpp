@@ -1,9 +1,13 @@
 #include "ks_fixture.h"
 
+#include "ks/fc/file_watch.h"
+
+#include <QDir>
 #include <QMenuBar>
 #include <QPushButton>
 #include <QSignalSpy>
 #include <QToolBar>
+#include <filesystem>
 
 using Button = QMessageBox;
 
@@ -206,4 +210,52 @@ TEST_F(KsTest, WhatCannotBeTakenStopsSavingAndClosing)
     QTest::mouseClick(view->edit, Qt::LeftButton);
     QTest::mouseClick(frame.menuBar(), Qt::LeftButton);
     EXPECT_EQ(LogView::log, QStringList());
+}
+
+TEST_F(KsTest, AnOpenFileIsFollowedByItsContent)
+{
+    const QString path = Write("a.TST", "old");
+    ASSERT_TRUE(QFile::link(path, Path("link.TST")));
+    CKsFileWatch direct(nullptr), linked(nullptr);
+    const auto expect = [&](std::string_view text) {
+        direct.Expect(path, VersionOfText(text), StatusBehind(path.toStdString()));
+        linked.Expect(Path("link.TST"), VersionOfText(text), StatusBehind(path.toStdString()));
+    };
+    const auto becomes = [&](KsFileSight::Kind kind) {
+        return QTest::qWaitFor([&] { return direct.Sight().kind == kind && linked.Sight().kind == kind; });
+    };
+    const auto replace = [&](const QByteArray& text) {
+        Write("other", text);
+        std::filesystem::rename(Path("other").toStdString(), path.toStdString());
+    };
+    expect("old");
+    QSignalSpy news(&direct, &CKsFileWatch::Changed);
+    Write("a.TST", "old");
+    replace("old");
+    QFile::remove(path);
+    Write("a.TST", "old");
+    QTest::qWait(900);
+    EXPECT_EQ(news.count(), 0) << "the content is the same";
+
+    replace("new"); // of the same length
+    EXPECT_TRUE(becomes(KsFileSight::Other));
+    EXPECT_EQ(direct.Sight().version, VersionOfText("new"));
+    Write("a.TST", "old"); // the file that took the place is followed, too
+    EXPECT_TRUE(becomes(KsFileSight::Known));
+    QFile::remove(path);
+    EXPECT_TRUE(becomes(KsFileSight::Gone));
+    ASSERT_TRUE(QDir().mkdir(path));
+    EXPECT_TRUE(becomes(KsFileSight::Unreadable));
+    QDir().rmdir(path);
+    Write("a.TST", "newer");
+    EXPECT_TRUE(becomes(KsFileSight::Other));
+
+    news.clear();
+    expect("newer"); // it is what the document holds from now on
+    EXPECT_EQ(news.count(), 1);
+    replace("ours");
+    expect("ours");
+    QTest::qWait(900);
+    EXPECT_EQ(news.count(), 1) << "a save of ours";
+    EXPECT_EQ(direct.Sight().kind, KsFileSight::Known);
 }

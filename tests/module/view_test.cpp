@@ -1,14 +1,14 @@
 // View and sheet with their pages, in a main frame as the shell has it.
 #include "module_fixture.h"
 
+#include "grid/gen_grid.h"
+#include "grid/grid_keys.h"
 #include "ks/fc/doc_template.h"
 #include "ks/fc/file_bar.h"
 #include "ks/fc/findings_dialog.h"
 #include "module/kavo0_hd.h"
 #include "module/sheet.h"
 #include "module/view.h"
-#include "grid/gen_grid.h"
-#include "grid/grid_keys.h"
 #include "pages/framework/page.h"
 #include "pages/framework/page_help.h"
 
@@ -22,6 +22,7 @@
 #include <QTableView>
 #include <QTest>
 #include <QTimer>
+#include <QToolButton>
 #include <QUndoStack>
 
 namespace {
@@ -293,6 +294,21 @@ TEST_F(ViewTest, WhatWasNotTakenIsListedOnceTheWindowIsThere)
     bar->findChild<QPushButton*>()->click();
     EXPECT_NE(view->findChild<CKsFindingsDialog*>(), nullptr) << "reachable again";
     EXPECT_TRUE(boxes.isEmpty());
+    // Somebody else's notice stands above it; closing one leaves the other.
+    bool isTold = true;
+    view->GetDocument()->AddNoticeSource([&](std::vector<KsFileNotice>& notices) {
+        if (isTold)
+            notices.push_back({"<b>told</b>", {{"Do", [&](CKsFileBar&) { isTold = false; }}}});
+    });
+    EXPECT_EQ(bar->findChild<QLabel*>()->text(), "<b>told</b>");
+    const auto closing = bar->findChildren<QToolButton*>();
+    ASSERT_EQ(closing.size(), 2);
+    EXPECT_FALSE(closing[0]->isVisible());
+    closing[1]->click();
+    EXPECT_TRUE(bar->isVisible());
+    bar->findChild<QPushButton*>()->click();
+    emit view->GetDocument()->FileStateChanged();
+    EXPECT_FALSE(bar->isVisible());
 }
 
 TEST_F(ViewTest, ACleanFileHasNoBar)

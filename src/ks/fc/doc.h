@@ -2,7 +2,7 @@
 #pragma once
 
 #include "base/result.h"
-#include "files/file_stamp.h"
+#include "files/platform_file.h"
 #include "ks/fc/change_place.h"
 #include "ks/fc/messages.h"
 #include "ks/fc/types.h"
@@ -87,12 +87,12 @@ public:
     /// changed, when it is no file of the kind.
     virtual bool TakeContent(std::string text, const CString& step);
     /// What the file on the disk was when the document was read from it or written to it.
-    virtual FileStamp Stamp() const { return {}; }
+    virtual FileStatus Seen() const { return {}; }
 
     /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
     /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the user
-    /// is asked for another name, too, if he wants.
-    BOOL DoSave(const CString& path);
+    /// is asked for another name, too, if he wants. `proposal` is what a question for the name begins with.
+    BOOL DoSave(const CString& path, const CString& proposal = {});
     /// Has the views take over what is being typed, then asks whether to save when the document is modified; false when
     /// the user cancelled or the save failed.
     BOOL SaveModified();

@@ -16,12 +16,14 @@
 namespace {
 
 /// Asks for a name until it is one that may be written; empty when the user gives up.
-CString AskSavePath(const CKsDoc& document)
+CString AskSavePath(const CKsDoc& document, const CString& proposal)
 {
     KsFileQuestion question;
     question.save = true;
     question.title = CKsDoc::tr("Save As");
-    question.proposal = document.GetPathName().isEmpty() ? document.GetTitle() : document.GetPathName();
+    question.proposal = !proposal.isEmpty()                ? proposal
+                        : document.GetPathName().isEmpty() ? document.GetTitle()
+                                                           : document.GetPathName();
     const CMultiDocTemplate* const documents = document.GetDocTemplate();
     if (documents) {
         question.filters = documents->FileDialogFilter();
@@ -55,14 +57,14 @@ CString CKsDoc::SavePathFor(const CString& path) const
     return path;
 }
 
-BOOL CKsDoc::DoSave(const CString& path)
+BOOL CKsDoc::DoSave(const CString& path, const CString& proposal)
 {
     if (!MayLeave())
         return false;
     CString target = path;
     do {
         if (target.isEmpty())
-            target = AskSavePath(*this);
+            target = AskSavePath(*this, proposal);
         if (target.isEmpty())
             return false;
         if (SaveTo(std::exchange(target, {})))

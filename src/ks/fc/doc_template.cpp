@@ -3,15 +3,19 @@
 #include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/project_doc.h"
 #include "ks/fc/system_reason.h"
 
 #include <QDir>
 #include <QFileInfo>
+#include <QScopedValueRollback>
 #include <QUndoStack>
 #include <algorithm>
 #include <new>
 
 namespace {
+
+bool readsToCompare = false;
 
 std::vector<CMultiDocTemplate*>& Templates()
 {
@@ -121,6 +125,21 @@ std::unique_ptr<CKsDoc> CMultiDocTemplate::ReadDocument(const CString& path)
     auto document = LoadDocument(path);
     m_untitled = untitled;
     return document;
+}
+
+Result<std::string> CMultiDocTemplate::ContentOf(const CString& path)
+{
+    const QScopedValueRollback reading(readsToCompare, true);
+    const auto document = ReadDocument(path);
+    const auto* const read = dynamic_cast<const CKsProjectDoc*>(document.get());
+    if (!document || (read && read->File().IsUnreadable()))
+        return Error{};
+    return document->ContentText();
+}
+
+bool CMultiDocTemplate::ReadsToCompare()
+{
+    return readsToCompare;
 }
 
 CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)

@@ -105,11 +105,14 @@ void CKsDocumentFile::Read(const CString& path, const CString& savedAs,
     *this = {};
     m_path = path;
     m_savedAs = savedAs;
+    m_seen = StatusBehind(path.toStdString());
     FileVersion version;
     const Result<TqlStructure> structure = ParseFile(path.toStdString(), &m_error, &version);
+    // What cannot be parsed has a content, too, that somebody may mend.
+    if (structure || !VersionOfFile(PlatformFile::Native(), QFileInfo(path).filesystemFilePath(), version))
+        m_version = version;
     if (!structure)
         return;
-    m_version = version;
     LoadReport report(structure.value().Get());
     load(structure.value().Get(), report);
     m_findings = report.Take();
@@ -163,7 +166,7 @@ Result<void> CKsDocumentFile::KeepCopy()
     if (!kept)
         return kept.error();
     m_keptCopy = QString::fromStdString(kept.value().path);
-    if (!m_version) // of a file that could not be parsed
+    if (!m_version) // of a file that could not be read before
         m_version = kept.value().version;
     return {};
 }
@@ -177,6 +180,8 @@ WriteAnswer CKsDocumentFile::Ask(const WriteQuestion& question)
     };
     switch (question.kind) {
     case WriteQuestion::ChangedOutside:
+        if (m_mayReplaceOthers)
+            return WriteAnswer::Yes;
         return agreed(KsMessageBox(
             tr("Another program has changed %1 since it was read or saved here.\nSaving writes what is shown instead. "
                "As it is now the file stays in a copy beside it, %2.\nSave?")
@@ -236,6 +241,7 @@ Result<void> CKsDocumentFile::Save(const CString& target, const KsFileWriter& wr
     written.m_version = written.m_report.version;
     written.m_savedAs = target;
     written.m_path = written.m_report.notRenamed ? entry.value() : target;
+    written.m_seen = StatusBehind(written.m_path.toStdString());
     if (replaces.value()) {
         written.m_keptCopy = m_keptCopy;
         written.m_otherNames = m_otherNames;

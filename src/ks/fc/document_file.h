@@ -30,10 +30,18 @@ public:
     bool Write(const CString& target, const KsFileWriter& write);
     /// That a file could not be written for want of memory.
     static CString WhyNoMemory(const CString& path);
+    /// What somebody else has written may be replaced without a question, as the user has been told and wants it. It is
+    /// kept in a copy all the same.
+    void MayReplaceOthers(bool may) { m_mayReplaceOthers = may; }
     /// Why the last write failed; empty when it did not, or when the user did not want it.
     const CString& WhyNotWritten() const { return m_whyNotWritten; }
 
     const CString& Path() const { return m_path; }
+    /// What the file held when the document was last the same; none when it could not be read.
+    const std::optional<FileVersion>& Version() const { return m_version; }
+    /// What the file was then, without its content: taken before a read, so that whoever writes to it from then on
+    /// makes it another, and after a write.
+    const FileStatus& Seen() const { return m_seen; }
     /// The file could not be parsed; the document holds nothing of it.
     bool IsUnreadable() const { return m_error.code != TqlError::None; }
     /// What is wrong with a file that could not be parsed and where, in the user's language.
@@ -59,7 +67,9 @@ private:
     WriteAnswer Ask(const WriteQuestion& question);
 
     CString m_path, m_savedAs, m_keptCopy, m_renamed, m_whyNotWritten;
-    std::optional<FileVersion> m_version;    // what the file held when the document was last the same
+    std::optional<FileVersion> m_version;
+    FileStatus m_seen;
+    bool m_mayReplaceOthers = false;
     std::optional<WriteAnswer> m_otherNames; // what becomes of them, as the user said once
     WriteReport m_report;
     TqlSyntaxError m_error;

@@ -1,7 +1,6 @@
 #include "ks/fc/file_bar.h"
 
 #include "ks/fc/after_paint.h"
-#include "ks/fc/file_name.h"
 #include "ks/fc/findings_dialog.h"
 #include "ks/fc/project_doc.h"
 
@@ -10,23 +9,10 @@
 #include <QLabel>
 #include <QPushButton>
 #include <QToolButton>
+#include <QVBoxLayout>
+#include <algorithm>
 
-namespace {
-
-CString NameOf(const CString& path)
-{
-    return KsShownFileName(path);
-}
-
-} // namespace
-
-CKsFileBar::CKsFileBar(CKsProjectDoc& document, QWidget* parent)
-    : QFrame(parent),
-      m_document(document),
-      m_text(new QLabel(this)),
-      m_list(new QPushButton(this)),
-      m_edit(new QPushButton(this)),
-      m_close(new QToolButton(this))
+CKsFileBar::CKsFileBar(CKsProjectDoc& document, QWidget* parent) : QFrame(parent), m_document(document)
 {
     setObjectName("fileBar");
     setFrameShape(QFrame::StyledPanel);
@@ -35,55 +21,75 @@ CKsFileBar::CKsFileBar(CKsProjectDoc& document, QWidget* parent)
     colours.setColor(QPalette::Window, colours.color(QPalette::ToolTipBase));
     colours.setColor(QPalette::WindowText, colours.color(QPalette::ToolTipText));
     setPalette(colours);
-    m_text->setObjectName("fileBarText");
-    m_text->setWordWrap(true);
-    m_text->setTextInteractionFlags(Qt::TextSelectableByMouse);
-    m_close->setAutoRaise(true);
-    m_close->setText(QStringLiteral("\u00D7"));
-    auto* layout = new QHBoxLayout(this);
-    layout->addWidget(m_text, 1);
-    for (QWidget* button :
-         {static_cast<QWidget*>(m_list), static_cast<QWidget*>(m_edit), static_cast<QWidget*>(m_close)})
-        layout->addWidget(button);
-    connect(m_list, &QPushButton::clicked, this, &CKsFileBar::ShowList);
-    connect(m_edit, &QPushButton::clicked, this, [this] { m_document.EditUnreadable(); });
-    connect(m_close, &QToolButton::clicked, this, &QWidget::hide);
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(0);
     connect(&document, &CKsProjectDoc::FileStateChanged, this, &CKsFileBar::Refresh);
     Refresh();
     if (!document.File().Findings().empty())
         KsAfterPaint(parent, this, [this] { ShowList(); });
 }
 
-CString CKsFileBar::Text() const
+CKsFileBar::Row CKsFileBar::MakeRow(std::size_t number)
 {
-    const CKsDocumentFile& file = m_document.File();
-    if (file.IsUnreadable())
-        return tr("%1 could not be read. What is shown here are default values, not its content.\n%2")
-            .arg(NameOf(file.Path()), file.Error());
-    if (!file.Findings().empty())
-        return tr("Values of %1 that were not taken as they stand: %2. A save keeps the file as it is in a copy.")
-            .arg(NameOf(file.Path()))
-            .arg(file.Findings().size());
-    QStringList notes{file.SaveNotes()};
-    if (!file.KeptCopy().isEmpty())
-        notes << tr("The file as it was before this save is kept in %1.").arg(NameOf(file.KeptCopy()));
-    notes.removeAll(QString());
-    return notes.join(u'\n');
+    Row row{.widget = new QWidget(this)};
+    row.text = new QLabel(row.widget);
+    row.text->setObjectName("fileBarText");
+    row.text->setWordWrap(true);
+    row.text->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    row.close = new QToolButton(row.widget);
+    row.close->setAutoRaise(true);
+    row.close->setText(QStringLiteral("\u00D7"));
+    connect(row.close, &QToolButton::clicked, this, [this, number] {
+        if (const auto close = m_notices.at(number).close) // a copy: it ends the notice
+            close();
+    });
+    auto* layout = new QHBoxLayout(row.widget);
+    layout->addWidget(row.text, 1);
+    layout->addWidget(row.close);
+    this->layout()->addWidget(row.widget);
+    return row;
+}
+
+void CKsFileBar::Run(std::size_t number, std::size_t action)
+{
+    const auto run = m_notices.at(number).actions.at(action).run; // a copy, likewise
+    run(*this);
+}
+
+void CKsFileBar::Show(Row& row, std::size_t number)
+{
+    const KsFileNotice& notice = m_notices[number];
+    row.text->setText(notice.text);
+    row.text->setAccessibleName(notice.text);
+    while (row.buttons.size() < notice.actions.size()) {
+        auto* button = new QPushButton(row.widget);
+        connect(button, &QPushButton::clicked, this, [this, number, i = row.buttons.size()] { Run(number, i); });
+        static_cast<QHBoxLayout*>(row.widget->layout())->insertWidget(int(row.buttons.size()) + 1, button);
+        row.buttons.push_back(button);
+        QWidget::setTabOrder(button, row.close);
+    }
+    for (std::size_t i = 0; i < row.buttons.size(); ++i) {
+        if (i < notice.actions.size())
+            row.buttons[i]->setText(notice.actions[i].label);
+        row.buttons[i]->setVisible(i < notice.actions.size());
+    }
+    row.close->setToolTip(tr("Close this bar"));
+    row.close->setAccessibleName(tr("Close this bar"));
+    row.close->setVisible(notice.close != nullptr);
 }
 
 void CKsFileBar::Refresh()
 {
-    const CString text = Text();
-    m_text->setText(text);
-    m_text->setAccessibleName(text);
-    m_list->setText(tr("Show List..."));
-    m_edit->setText(tr("Edit Default Values"));
-    m_close->setToolTip(tr("Close this bar"));
-    m_close->setAccessibleName(tr("Close this bar"));
-    m_list->setVisible(!m_document.File().Findings().empty());
-    m_edit->setVisible(m_document.IsReadOnly());
-    m_close->setVisible(!m_document.File().IsUnreadable());
-    setVisible(!text.isEmpty());
+    m_notices = m_document.Notices();
+    while (m_rows.size() < m_notices.size())
+        m_rows.push_back(MakeRow(m_rows.size()));
+    for (std::size_t i = 0; i < m_rows.size(); ++i) {
+        if (i < m_notices.size())
+            Show(m_rows[i], i);
+        m_rows[i].widget->setVisible(i < m_notices.size());
+    }
+    setVisible(!m_notices.empty());
     if (m_document.File().Findings().empty() && m_dialog)
         m_dialog->close();
 }
@@ -101,6 +107,6 @@ void CKsFileBar::ShowList()
 void CKsFileBar::changeEvent(QEvent* event)
 {
     QFrame::changeEvent(event);
-    if (event->type() == QEvent::LanguageChange && !isHidden())
+    if (event->type() == QEvent::LanguageChange)
         Refresh();
 }

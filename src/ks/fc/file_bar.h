@@ -1,11 +1,12 @@
 // The bar above a view that says what the document's file is when it is not simply what the view shows.
 #pragma once
 
-#include "ks/fc/types.h"
+#include "ks/fc/file_notice.h"
 #include "ks/ks_export.h"
 
 #include <QFrame>
 #include <QPointer>
+#include <vector>
 
 class CKsFindingsDialog;
 class CKsProjectDoc;
@@ -13,8 +14,8 @@ class QLabel;
 class QPushButton;
 class QToolButton;
 
-/// Hidden while there is nothing to say. After an open it also shows the list of what was not taken, once the window
-/// has been painted.
+/// One row for each notice of the document; hidden while there is none. After an open it also shows the list of what
+/// was not taken, once the window has been painted.
 class KS_API CKsFileBar : public QFrame
 {
     Q_OBJECT
@@ -28,13 +29,22 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
+    /// The widgets that show one notice, children of the bar; they stay for what is shown there next.
+    struct Row
+    {
+        QWidget* widget = nullptr;
+        QLabel* text = nullptr;
+        std::vector<QPushButton*> buttons{};
+        QToolButton* close = nullptr;
+    };
+
     void Refresh();
-    CString Text() const;
+    Row MakeRow(std::size_t number);
+    void Show(Row& row, std::size_t number);
+    void Run(std::size_t number, std::size_t action);
 
     CKsProjectDoc& m_document;
-    QLabel* m_text; // children
-    QPushButton* m_list;
-    QPushButton* m_edit;
-    QToolButton* m_close;
+    std::vector<KsFileNotice> m_notices; // as they are shown
+    std::vector<Row> m_rows;             // at least as many; the others are hidden
     QPointer<CKsFindingsDialog> m_dialog;
 };

@@ -2,23 +2,60 @@
 
 #include "files/structure.h"
 #include "ks/fc/exchange.h"
+#include "ks/fc/outside_change.h"
 
 #include <QTimer>
 #include <QUndoStack>
 #include <new>
 #include <utility>
 
-CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind)
+CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind), m_outside(new CKsOutsideChange(*this))
 {
     connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
 }
 
 void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load)
 {
-    m_stamp = FileStamp::Of(path.toStdString()); // before: what is written to it from now on makes it another
     m_file.Read(path, SavePathFor(path), load);
     m_isReadOnly = m_file.IsUnreadable();
+    FileIsKnown();
+}
+
+bool CKsProjectDoc::Reload(CString& why)
+{
+    if (!MayLeave())
+        return false;
+    CKsDocumentFile file;
+    std::unique_ptr<QUndoCommand> step;
+    file.Read(m_file.Path(), SavePathFor(m_file.Path()), [&](tqlHandle structure, LoadReport& report) {
+        step = MakeContentStep(structure, report, tr("Reload"));
+    });
+    why = file.WhyNothing();
+    if (!step || !why.isEmpty())
+        return false;
+    m_file = std::move(file);
+    m_isReadOnly = false;
+    UndoStack().push(step.release());
+    UndoStack().setClean();
+    SetModifiedFlag(false);
+    FileIsKnown();
+    return true;
+}
+
+/// The document and its file are the same.
+void CKsProjectDoc::FileIsKnown()
+{
+    m_isNoticeClosed = false;
+    m_outside->Expect();
     emit FileStateChanged();
+}
+
+bool CKsProjectDoc::SaveOverOthers()
+{
+    m_file.MayReplaceOthers(true);
+    const bool saved = DoSave(GetPathName());
+    m_file.MayReplaceOthers(false);
+    return saved;
 }
 
 bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
@@ -33,14 +70,12 @@ void CKsProjectDoc::FileWritten()
 {
     UndoStack().setClean();
     SetPathName(m_file.Path());
-    m_stamp = {};
-    try {
-        m_stamp = FileStamp::Of(m_file.Path().toStdString());
-    } catch (const std::bad_alloc&) {
-        // It is saved all the same; what is kept of later changes is bound to no content of it.
-    }
     SetModifiedFlag(false);
-    EditUnreadable();
+    m_isReadOnly = false;
+    try {
+        FileIsKnown();
+    } catch (const std::bad_alloc&) { // it is saved all the same; what others do to it shows at the next save
+    }
 }
 
 void CKsProjectDoc::EditUnreadable()

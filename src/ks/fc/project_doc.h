@@ -4,11 +4,13 @@
 
 #include "ks/fc/doc.h"
 #include "ks/fc/document_file.h"
+#include "ks/fc/file_notice.h"
 #include "ks/fc/package.h"
 
 #include <QStringList>
 #include <memory>
 
+class CKsOutsideChange;
 class QUndoCommand;
 
 class KS_API CKsProjectDoc : public CKsDoc
@@ -23,8 +25,22 @@ public:
     /// It could not be parsed, and nobody has asked to edit what is shown instead.
     bool IsReadOnly() const { return m_isReadOnly; }
     void EditUnreadable();
+    /// What there is to say of the file, for the bar above the views; in the order in which it is shown.
+    std::vector<KsFileNotice> Notices();
+    /// Who has something to say of the file adds it here for as long as the document lives, and has the notices shown
+    /// anew (FileStateChanged) when it is another.
+    void AddNoticeSource(KsNoticeSource source);
     bool TakeContent(std::string text, const CString& step) final;
-    FileStamp Stamp() const final { return m_stamp; }
+    FileStatus Seen() const final { return m_file.Seen(); }
+
+    /// What the file holds now becomes the document's content, as one step to undo; the document is not modified then.
+    /// What is being typed is asked for first. False, with the reason in `why` if it is the file's, when nothing has
+    /// changed.
+    bool Reload(CString& why);
+    /// Saves over what another program has written, which is kept in a copy; the user has been told.
+    bool SaveOverOthers();
+    /// What other programs do to the file; the views say when that matters.
+    CKsOutsideChange& Outside() { return *m_outside; }
 
     /// Joins the project that the document's file is a member of; false when there is none.
     bool JoinProject(CView* view);
@@ -53,7 +69,7 @@ public:
     QStringList BranchNames(CView* view) const;
 
 signals:
-    /// What is known of File(), or IsReadOnly(), is another.
+    /// What is known of File(), IsReadOnly() or Notices() is another.
     void FileStateChanged();
 
 protected:
@@ -69,12 +85,16 @@ protected:
     CKsDocumentFile m_file;
 
 private:
-    FileStamp m_stamp;
+    void FileIsKnown();
     void StepMade();
+    void OwnNotice(std::vector<KsFileNotice>& notices);
     LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const;
 
     int m_kind;
     bool m_isReadOnly = false;
+    std::vector<KsNoticeSource> m_noticeSources;
+    bool m_isNoticeClosed = false; // what was to be said of the last open or save
     std::intptr_t m_project = 0;
     int m_untold = 0; // steps that the project has not heard of
+    CKsOutsideChange* m_outside; // child; it adds a notice source
 };

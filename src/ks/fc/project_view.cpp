@@ -1,6 +1,8 @@
 #include "ks/fc/project_view.h"
 
+#include "ks/fc/after_paint.h"
 #include "ks/fc/file_bar.h"
+#include "ks/fc/outside_change.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 
@@ -20,6 +22,7 @@ void CKsProjectView::OnInitialUpdate()
 {
     CView::OnInitialUpdate();
     ProjectDoc()->JoinProject(this);
+    KsAfterPaint(this, ProjectDoc(), [document = ProjectDoc()] { document->Outside().Watch(); });
     connect(ProjectDoc(), &CKsDoc::Said, this, &CKsProjectView::Say);
     connect(ProjectDoc(), &CKsDoc::Reveal, this, &CKsProjectView::RevealChange);
     for (auto switched : {&KsUnits::Changed, &KsUnits::DigitsChanged})

@@ -199,6 +199,121 @@ Save?</source>
     </message>
 </context>
 <context>
+    <name>CKsOutsideChange</name>
+    <message>
+        <source>%1 was changed by another program (%2), and the changes made here are not saved. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite saves it here; the file as it is stays in a copy beside it.</source>
+        <translation>%1 がほかのプログラムによって変更されました (%2)。ここで行った変更はまだ保存されていません。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示を保存し、今のファイルのコピーを隣に残します。</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program (%2). What is shown is the content before. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite puts it back; the file as it is stays in a copy beside it.</source>
+        <translation>%1 がほかのプログラムによって変更されました (%2)。表示されているのは変更前の内容です。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示をファイルに書き戻し、今のファイルのコピーを隣に残します。</translation>
+    </message>
+    <message>
+        <source>The file cannot be loaded as it is, and what is shown stays: %1</source>
+        <translation>今のファイルは読み込めないため、表示はそのままです: %1</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>再読み込み</translation>
+    </message>
+    <message>
+        <source>Compare...</source>
+        <translation>比較...</translation>
+    </message>
+    <message>
+        <source>Keep Both...</source>
+        <translation>両方残す...</translation>
+    </message>
+    <message>
+        <source>Overwrite</source>
+        <translation>上書き</translation>
+    </message>
+    <message>
+        <source>Save As...</source>
+        <translation>名前を付けて保存...</translation>
+    </message>
+    <message>
+        <source>Save Again</source>
+        <translation>もう一度保存</translation>
+    </message>
+    <message>
+        <source>%1 was removed or renamed by another program (%2). What is shown is nowhere else until it is saved again.</source>
+        <translation>%1 はほかのプログラムによって削除されたか、名前が変更されました (%2)。表示されている内容は、もう一度保存するまでほかのどこにもありません。</translation>
+    </message>
+    <message>
+        <source>%1 cannot be read any more: %2. What is shown stays; to be safe save it under another name.</source>
+        <translation>%1 を読み込めなくなりました: %2。表示はそのままです。念のため別の名前で保存してください。</translation>
+    </message>
+    <message>
+        <source>What differs is not known: the file cannot be read.</source>
+        <translation>相違点は不明です: ファイルを読み取れません。</translation>
+    </message>
+    <message>
+        <source>Changes of %1 by Another Program</source>
+        <translation>ほかのプログラムによる %1 の変更</translation>
+    </message>
+    <message>
+        <source>Shown</source>
+        <translation>表示中</translation>
+    </message>
+    <message>
+        <source>In the file</source>
+        <translation>ファイル</translation>
+    </message>
+</context>
+<context>
+    <name>CKsProjectDoc</name>
+    <message>
+        <source>Reload</source>
+        <translation>再読み込み</translation>
+    </message>
+</context>
+<context>
+    <name>CKsDifferenceDialog</name>
+    <message>
+        <source>lines: %1</source>
+        <translation>行数: %1</translation>
+    </message>
+    <message>
+        <source>The first %1 places are listed.</source>
+        <translation>最初の %1 か所を表示しています。</translation>
+    </message>
+    <message>
+        <source>Section
+Keyword
+Number
+Parameter</source>
+        <translation>セクション
+キーワード
+番号
+パラメータ</translation>
+    </message>
+    <message>
+        <source>&amp;Close</source>
+        <translation>閉じる(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Nothing differs.</source>
+        <translation>相違はありません。</translation>
+    </message>
+    <message>
+        <source>values changed: %1</source>
+        <translation>変更された値: %1</translation>
+    </message>
+    <message>
+        <source>lines added: %1</source>
+        <translation>追加された行: %1</translation>
+    </message>
+    <message>
+        <source>lines removed: %1</source>
+        <translation>削除された行: %1</translation>
+    </message>
+    <message>
+        <source>Sections: %1; %2.</source>
+        <translation>セクション: %1; %2。</translation>
+    </message>
+</context>
+<context>
     <name>CKsFindingsDialog</name>
     <message>
         <source>%1: Values Not Taken as They Stand</source>

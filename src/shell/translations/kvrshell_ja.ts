@@ -361,6 +361,18 @@ The editors read %2.</source>
 <context>
     <name>CProjectController</name>
     <message>
+        <source>%1 was removed or renamed by another program. Its files stay open.</source>
+        <translation>%1 はほかのプログラムによって削除されたか、名前が変更されました。プロジェクトのファイルは開いたままです。</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program and cannot be read: %2</source>
+        <translation>%1 はほかのプログラムによって変更され、読み込めません: %2</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program. The list of its files has been read again.</source>
+        <translation>%1 はほかのプログラムによって変更されました。ファイルの一覧を読み込み直しました。</translation>
+    </message>
+    <message>
         <source>The project could not be opened.
 %1</source>
         <translation>プロジェクトを開けませんでした。
@@ -649,58 +661,17 @@ The file is found all the same.</source>
         <source>Discard the changes to %1? They cannot be brought back.</source>
         <translation>%1 の変更を破棄しますか? 元に戻すことはできません。</translation>
     </message>
-</context>
-<context>
-    <name>CDifferenceDialog</name>
-    <message>
-        <source>lines: %1</source>
-        <translation>行数: %1</translation>
-    </message>
     <message>
         <source>Recovered Changes of %1</source>
         <translation>%1 の復元した変更</translation>
     </message>
     <message>
-        <source>The first %1 places are listed.</source>
-        <translation>最初の %1 か所を表示しています。</translation>
+        <source>Now</source>
+        <translation>現在</translation>
     </message>
     <message>
-        <source>Section
-Keyword
-Number
-Parameter
-Now
-Recovered</source>
-        <translation>セクション
-キーワード
-番号
-パラメータ
-現在
-復元後</translation>
-    </message>
-    <message>
-        <source>&amp;Close</source>
-        <translation>閉じる(&amp;C)</translation>
-    </message>
-    <message>
-        <source>Nothing differs.</source>
-        <translation>相違はありません。</translation>
-    </message>
-    <message>
-        <source>values changed: %1</source>
-        <translation>変更された値: %1</translation>
-    </message>
-    <message>
-        <source>lines added: %1</source>
-        <translation>追加された行: %1</translation>
-    </message>
-    <message>
-        <source>lines removed: %1</source>
-        <translation>削除された行: %1</translation>
-    </message>
-    <message>
-        <source>Sections: %1; %2.</source>
-        <translation>セクション: %1; %2。</translation>
+        <source>Recovered</source>
+        <translation>復元後</translation>
     </message>
 </context>
 </TS>

@@ -1,6 +1,6 @@
-#include "shell/difference_dialog.h"
+#include "ks/fc/difference_dialog.h"
 
-#include "shell/plain_cell.h"
+#include "ks/fc/plain_cell.h"
 
 #include <QDialogButtonBox>
 #include <QHeaderView>
@@ -24,7 +24,7 @@ QString Number(std::size_t number)
 /// What stands on one side; a section says how many lines it has.
 QString Side(const Difference& difference, const std::string& text)
 {
-    return difference.keyword.empty() && !text.empty() ? CDifferenceDialog::tr("lines: %1").arg(Text(text))
+    return difference.keyword.empty() && !text.empty() ? CKsDifferenceDialog::tr("lines: %1").arg(Text(text))
                                                        : Text(text);
 }
 
@@ -47,20 +47,21 @@ void Fill(QTableWidget& table, const Differences& differences)
 
 } // namespace
 
-CDifferenceDialog::CDifferenceDialog(const QString& name, const Differences& differences, QWidget* parent)
+CKsDifferenceDialog::CKsDifferenceDialog(const Captions& captions, const Differences& differences, QWidget* parent)
     : QDialog(parent)
 {
     setObjectName("differences");
     setAttribute(Qt::WA_DeleteOnClose);
-    setWindowTitle(tr("Recovered Changes of %1").arg(name));
+    setWindowTitle(captions.title);
     QString summary = Summary(differences);
     if (differences.areMore)
         summary += u' ' + tr("The first %1 places are listed.").arg(differences.list.size());
     auto* text = new QLabel(summary, this);
     text->setWordWrap(true);
-    const QStringList captions = tr("Section\nKeyword\nNumber\nParameter\nNow\nRecovered").split(u'\n');
-    auto* table = new QTableWidget(0, int(captions.size()), this);
-    table->setHorizontalHeaderLabels(captions);
+    const QStringList columns = tr("Section\nKeyword\nNumber\nParameter").split(u'\n')
+                                << captions.before << captions.after;
+    auto* table = new QTableWidget(0, int(columns.size()), this);
+    table->setHorizontalHeaderLabels(columns);
     table->setAccessibleName(windowTitle());
     table->setTabKeyNavigation(false);
     table->setWordWrap(false);
@@ -78,7 +79,7 @@ CDifferenceDialog::CDifferenceDialog(const QString& name, const Differences& dif
     resize(900, 400);
 }
 
-QString CDifferenceDialog::Summary(const Differences& differences)
+QString CKsDifferenceDialog::Summary(const Differences& differences)
 {
     if (differences.IsEmpty())
         return tr("Nothing differs.");

@@ -1,0 +1,57 @@
+// What a document has to say of its file: what could not be taken from it, and what became of it at the last save.
+#include "ks/fc/file_notice.h"
+
+#include "ks/fc/file_bar.h"
+#include "ks/fc/file_name.h"
+#include "ks/fc/project_doc.h"
+
+void CKsProjectDoc::AddNoticeSource(KsNoticeSource source)
+{
+    m_noticeSources.push_back(std::move(source));
+    emit FileStateChanged();
+}
+
+std::vector<KsFileNotice> CKsProjectDoc::Notices()
+{
+    std::vector<KsFileNotice> notices;
+    for (const KsNoticeSource& source : m_noticeSources)
+        source(notices);
+    OwnNotice(notices);
+    return notices;
+}
+
+void CKsProjectDoc::OwnNotice(std::vector<KsFileNotice>& notices)
+{
+    const CString name = KsShownFileName(m_file.Path());
+    const auto close = [this] {
+        m_isNoticeClosed = true;
+        emit FileStateChanged();
+    };
+    if (m_file.IsUnreadable()) {
+        KsFileNotice notice{CKsFileBar::tr("%1 could not be read. What is shown here are default values, not its "
+                                           "content.\n%2")
+                                .arg(name, m_file.Error())};
+        if (m_isReadOnly)
+            notice.actions = {{CKsFileBar::tr("Edit Default Values"), [this](CKsFileBar&) { EditUnreadable(); }}};
+        notices.push_back(std::move(notice));
+        return;
+    }
+    if (m_isNoticeClosed)
+        return;
+    if (!m_file.Findings().empty()) {
+        notices.push_back({CKsFileBar::tr("Values of %1 that were not taken as they stand: %2. A save keeps the file "
+                                          "as it is in a copy.")
+                               .arg(name)
+                               .arg(m_file.Findings().size()),
+                           {{CKsFileBar::tr("Show List..."), [](CKsFileBar& bar) { bar.ShowList(); }}},
+                           close});
+        return;
+    }
+    QStringList notes{m_file.SaveNotes()};
+    if (!m_file.KeptCopy().isEmpty())
+        notes << CKsFileBar::tr("The file as it was before this save is kept in %1.")
+                     .arg(KsShownFileName(m_file.KeptCopy()));
+    notes.removeAll(QString());
+    if (!notes.isEmpty())
+        notices.push_back({notes.join(u'\n'), {}, close});
+}
