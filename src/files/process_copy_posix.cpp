@@ -1,5 +1,7 @@
 #include "files/process_copy.h"
 
+#include "files/file_lock.h"
+
 #include <algorithm>
 #include <cerrno>
 #include <csignal>
@@ -37,6 +39,7 @@ int Run(const std::function<std::error_code()>& work)
         std::signal(signal, SIG_DFL);
     ::alarm(LongestWork);
     CloseConnections();
+    FileLock::LeaveToOriginal();
     ::umask(0077);
     [[maybe_unused]] const int slower = ::nice(10); // the user comes first
     try {

@@ -70,8 +70,12 @@ bool CRecovery::Open(const CRecoverable& item)
         return false;
     }
     const CKsDoc* open = item.state == CRecoverable::Same ? m_plugins.FindDocument(item.header.path) : nullptr;
-    const bool isBeside = StateOf(item.header) != CRecoverable::Same || (open && open->IsModified());
+    bool isBeside = StateOf(item.header) != CRecoverable::Same || (open && open->IsModified());
     CKsDoc* document = item.editor->OpenDocumentFile(&m_frame, isBeside ? QString() : item.header.path);
+    if (document && document->IsInUse()) {
+        isBeside = true;
+        document = item.editor->OpenDocumentFile(&m_frame, {});
+    }
     if (!document)
         return false;
     if (!document->TakeContent(std::move(content), tr("Recovered changes"))) {

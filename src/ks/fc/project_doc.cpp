@@ -2,6 +2,7 @@
 
 #include "files/structure.h"
 #include "ks/fc/exchange.h"
+#include "ks/fc/file_name.h"
 
 #include <QTimer>
 #include <QUndoStack>
@@ -10,22 +11,31 @@
 CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind)
 {
     connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
+    connect(&m_use, &CKsFileUse::Changed, this, &CKsProjectDoc::ReadOnlyChanged);
 }
 
 void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load)
 {
     m_stamp = FileStamp::Of(path.toStdString()); // before: what is written to it from now on makes it another
     m_file.Read(path, SavePathFor(path), load);
-    m_isReadOnly = m_file.IsUnreadable();
+    m_showsDefaults = m_file.IsUnreadable();
     m_isNoticeClosed = false;
     emit FileStateChanged();
 }
 
 bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
 {
+    if (!m_use.TakeTarget(target)) {
+        TellNotSaved(
+            tr("%1 was left as it is: it is in use by %2.").arg(KsShownFileName(target), m_use.TargetHolder()));
+        return false;
+    }
     const bool written = m_file.Write(target, write);
     if (!written && !m_file.WhyNotWritten().isEmpty())
         TellNotSaved(m_file.WhyNotWritten());
+    if (written)
+        EditUnreadable(); // a save may end with a step of its own
+    m_use.TargetWritten(written);
     return written;
 }
 
@@ -36,13 +46,47 @@ void CKsProjectDoc::FileWritten()
     m_stamp = FileStamp::Of(m_file.Path().toStdString());
     SetModifiedFlag(false);
     m_isNoticeClosed = false;
-    EditUnreadable();
+    emit FileStateChanged();
 }
 
 void CKsProjectDoc::EditUnreadable()
 {
-    m_isReadOnly = false;
+    if (std::exchange(m_showsDefaults, false))
+        ReadOnlyChanged();
+}
+
+/// The views take what may be changed from the document whenever they show it.
+void CKsProjectDoc::ReadOnlyChanged()
+{
     emit FileStateChanged();
+    if (!IsExecuting())
+        UpdateAllViews(nullptr, ReloadHint);
+}
+
+void CKsProjectDoc::EditFreed()
+{
+    m_use.Take(GetPathName());
+    if (IsInUse()) // somebody else was faster
+        return;
+    if (FileStamp::Of(GetPathName().toStdString()) != m_stamp)
+        ReadFile(GetPathName(), [this](tqlHandle structure, LoadReport& report) {
+            if (auto step = MakeContentStep(structure, report, {}))
+                UndoStack().push(step.release());
+        });
+    UndoStack().setClean(); // it is what the file holds
+    SetModifiedFlag(false);
+}
+
+void CKsProjectDoc::EditCopy()
+{
+    DoSave({});
+}
+
+CString CKsProjectDoc::WhyReadOnly() const
+{
+    const CString name = KsShownFileName(m_file.Path());
+    return IsInUse() ? tr("%1 is in use by %2, and is not changed here.").arg(name, m_use.Holder())
+                     : tr("%1 could not be read, and is not changed.").arg(name);
 }
 
 bool CKsProjectDoc::TakeContent(std::string text, const CString& step)
@@ -55,8 +99,7 @@ bool CKsProjectDoc::TakeContent(std::string text, const CString& step)
     const auto findings = report.Take();
     if (!command || (!findings.empty() && findings.front().kind == Finding::NoTarget))
         return false;
-    if (m_isReadOnly) // somebody has edited it already
-        EditUnreadable();
+    EditUnreadable(); // somebody has edited it already
     UndoStack().push(command.release());
     return true;
 }
@@ -93,6 +136,11 @@ void CKsProjectDoc::LeaveProject(CView* view)
 /// once.
 void CKsProjectDoc::StepMade()
 {
+    if (IsInUse() && UndoStack().count() > 0) // the file was read again; going back would be a change
+        QTimer::singleShot(0, this, [this] {
+            UndoStack().clear();
+            SetModifiedFlag(false);
+        });
     if (!m_project || UndoStack().count() == 0) // a cleared stack is no step
         return;
     if (m_untold++ == 0)
