@@ -61,8 +61,9 @@ int main(int argc, char** argv)
     if (argc == 2 && std::strcmp(argv[1], "--bare") == 0)
         return RunBare(argc, argv);
     if (argc == 3 && std::strcmp(argv[1], "--shell") == 0) {
-        char* arguments[] = {argv[0], argv[2], nullptr};
-        return RunShell(2, arguments);
+        char separate[] = "--separate";
+        char* arguments[] = {argv[0], separate, argv[2], nullptr};
+        return RunShell(3, arguments);
     }
     if (argc != 2) {
         std::fprintf(stderr, "usage: bench_start SAMPLE_PROJECT\n");

@@ -46,14 +46,16 @@ function(kvr_find_libraries target)
   set_target_properties(${target} PROPERTIES INSTALL_RPATH "${origin}")
 endfunction()
 
+# How the sources end that are for another platform.
+set(KVR_FOREIGN windows)
+if(WIN32)
+  set(KVR_FOREIGN posix)
+endif()
+
 # A static library without Qt, of what stands in the room's folder; of what knows the platform that of the platform.
 function(kvr_library name)
   file(GLOB sources CONFIGURE_DEPENDS *.cpp)
-  set(foreign windows)
-  if(WIN32)
-    set(foreign posix)
-  endif()
-  list(FILTER sources EXCLUDE REGEX "_${foreign}\\.cpp$|/main\\.cpp$") # main is a program's own
+  list(FILTER sources EXCLUDE REGEX "_${KVR_FOREIGN}\\.cpp$|/main\\.cpp$") # main is a program's own
   add_library(${name} STATIC ${sources})
   kvr_defaults(${name})
 endfunction()
@@ -82,7 +84,7 @@ function(kvr_qt_library name kind)
   list(TRANSFORM folders APPEND /*.cpp OUTPUT_VARIABLE sources)
   list(TRANSFORM folders APPEND /*.qrc OUTPUT_VARIABLE resources)
   file(GLOB sources CONFIGURE_DEPENDS ${sources} ${resources})
-  list(FILTER sources EXCLUDE REGEX "/main\\.cpp$") # a program's own
+  list(FILTER sources EXCLUDE REGEX "_${KVR_FOREIGN}\\.cpp$|/main\\.cpp$") # main is a program's own
   add_library(${name} ${kind} ${sources})
   kvr_qt(${name})
 endfunction()

@@ -7,17 +7,18 @@
 #include <algorithm>
 #include <charconv>
 #include <ctime>
+#include <mutex>
 #include <thread>
+#include <vector>
 
 namespace fs = std::filesystem;
 
 namespace {
 
 /// Beside the file that a link leads to. The extension counts in whatever case, for a save may change that.
-std::error_code LockPath(PlatformFile& platform, fs::path& path)
+std::error_code LockPath(PlatformFile& platform, fs::path& path, FileStatus& status)
 {
     constexpr std::size_t longest = 240; // with what is put around it, as long as names may be
-    FileStatus status;
     if (const std::error_code error = FollowLinks(platform, path, status))
         return error;
     std::string name = Utf8FromPath(path.filename());
@@ -104,7 +105,8 @@ std::string HolderText(const LockHolder& holder)
 
 namespace {
 
-/// Whether what stands under the name of the lock was made for one. A file of the user's that is called so is left alone.
+/// Whether what stands under the name of the lock was made for one. A file of the user's that is called so is left
+/// alone.
 bool IsLockFile(PlatformFile& platform, const fs::path& path, const FileStatus& status)
 {
     if (status.kind != FileStatus::Kind::File || status.links > 1)
@@ -115,6 +117,32 @@ bool IsLockFile(PlatformFile& platform, const fs::path& path, const FileStatus& 
     const LockHolder holder = ReadHolder(platform, file);
     platform.Close(file);
     return !holder.program.empty();
+}
+
+/// Of this process: a copy of it has their files open, too.
+struct HeldFiles
+{
+    std::mutex guard;
+    std::vector<std::pair<PlatformFile*, PlatformFile::Handle>> files;
+
+    void Add(PlatformFile& platform, PlatformFile::Handle file)
+    {
+        const std::lock_guard held(guard);
+        files.emplace_back(&platform, file);
+    }
+    void Close(PlatformFile& platform, PlatformFile::Handle file)
+    {
+        {
+            const std::lock_guard held(guard);
+            std::erase(files, std::pair(&platform, file));
+        }
+        platform.Close(file);
+    }
+};
+HeldFiles& TheHeldFiles()
+{
+    static HeldFiles held;
+    return held;
 }
 
 } // namespace
@@ -128,6 +156,7 @@ FileLock& FileLock::operator=(FileLock&& other) noexcept
     m_whyNone = other.m_whyNone;
     m_path = std::move(other.m_path);
     m_file = other.m_file;
+    m_itself = std::exchange(other.m_itself, std::nullopt);
     m_platform = std::exchange(other.m_platform, nullptr);
     return *this;
 }
@@ -161,9 +190,29 @@ bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformF
     }
     m_platform = &platform;
     m_file = file;
+    TheHeldFiles().Add(platform, file);
     if (!platform.Cut(file, 0)) // a lock without a name on it is one, too
         WriteAll(platform, file, ThisHolder(program));
     return true;
+}
+
+/// Each of its names has a lock beside it. Who holds another one is not known.
+void FileLock::TryItself(const fs::path& path)
+{
+    PlatformFile::Handle file = 0;
+    if (m_platform->Open(path, PlatformFile::Purpose::Read, file))
+        return;
+    const std::error_code locked = m_platform->Lock(file);
+    if (!locked) {
+        TheHeldFiles().Add(*m_platform, file);
+        m_itself = file;
+        return;
+    }
+    m_platform->Close(file);
+    if (locked == std::errc::resource_unavailable_try_again) {
+        Release();
+        m_heldBy.emplace();
+    }
 }
 
 FileLock FileLock::Try(const std::string& path, std::string_view program, PlatformFile* platformOrNull)
@@ -171,14 +220,18 @@ FileLock FileLock::Try(const std::string& path, std::string_view program, Platfo
     constexpr int most = 1000; // times that somebody lets go of it just then
     PlatformFile& platform = OrNative(platformOrNull);
     FileLock lock;
-    fs::path beside = PathFromUtf8(path);
-    lock.m_whyNone = LockPath(platform, beside);
+    FileStatus status;
+    fs::path beside = PathFromUtf8(path), file = beside;
+    lock.m_whyNone = LockPath(platform, beside, status);
     if (lock.m_whyNone)
         return lock;
-    for (int attempt = 0; attempt < most; ++attempt)
-        if (lock.TryOnce(beside, program, platform))
-            return lock;
-    lock.m_heldBy.emplace();
+    bool isDone = false;
+    for (int attempt = 0; attempt < most && !isDone; ++attempt)
+        isDone = lock.TryOnce(beside, program, platform);
+    if (!isDone)
+        lock.m_heldBy.emplace();
+    else if (lock.IsHeld() && status.kind == FileStatus::Kind::File && status.links > 1)
+        lock.TryItself(file);
     return lock;
 }
 
@@ -195,6 +248,23 @@ FileLock FileLock::WaitFor(const std::string& path, std::string_view program, st
     return lock;
 }
 
+bool FileLock::IsFor(const std::string& path) const
+{
+    fs::path beside = PathFromUtf8(path);
+    FileStatus status;
+    bool isSame = false;
+    return m_platform && !LockPath(*m_platform, beside, status) && !IsSameFile(*m_platform, beside, m_path, isSame) &&
+           isSame;
+}
+
+void FileLock::LeaveToOriginal()
+{
+    HeldFiles& held = TheHeldFiles();
+    const std::unique_lock guard(held.guard, std::try_to_lock); // whoever had it is not in the copy
+    for (const auto& [platform, file] : held.files)
+        platform->Close(file);
+}
+
 void FileLock::Release()
 {
     if (!m_platform)
@@ -204,6 +274,8 @@ void FileLock::Release()
     FileStatus opened, named;
     if (m_platform->StatusOf(m_file, opened) || m_platform->Status(m_path, named) || named.IsSameFile(opened))
         m_platform->Remove(m_path);
-    m_platform->Close(m_file);
+    for (const auto file : {std::optional(m_file), std::exchange(m_itself, std::nullopt)})
+        if (file)
+            TheHeldFiles().Close(*m_platform, *file);
     m_platform = nullptr;
 }

@@ -15,8 +15,8 @@ struct LockHolder
 /// "anna on server (kvrshell, process 4711) since 2026-03-05 14:07:00"
 std::string HolderText(const LockHolder& holder);
 
-/// One lock for a file, whichever of its links and of the spellings of its extension it is named by. The kernel lets go
-/// of it when the process ends, however it ends: a lock file that is left over keeps nobody out. It is held, or
+/// One lock for a file, whichever of its links, its names and the spellings of its extension it is named by. The kernel
+/// lets go of it when the process ends, however it ends: a lock file that is left over keeps nobody out. It is held, or
 /// somebody else has it, or the folder takes no locks; a program then says so and goes on.
 class FileLock
 {
@@ -33,18 +33,24 @@ public:
                             PlatformFile* platform = nullptr);
 
     bool IsHeld() const { return m_platform != nullptr; }
+    /// Whether it is held, and is the one of this file.
+    bool IsFor(const std::string& path) const;
     /// Who else has it.
     const std::optional<LockHolder>& HeldBy() const { return m_heldBy; }
     /// Why the folder takes no lock.
     std::error_code WhyNone() const { return m_whyNone; }
     void Release();
+    /// In a copy of the process: what is held is the original's alone, and ends with it.
+    static void LeaveToOriginal();
 
 private:
+    void TryItself(const std::filesystem::path& file);
     bool TryOnce(const std::filesystem::path& path, std::string_view program, PlatformFile& platform);
 
     std::optional<LockHolder> m_heldBy;
     std::error_code m_whyNone;
     std::filesystem::path m_path;
     PlatformFile::Handle m_file = 0;
-    PlatformFile* m_platform = nullptr; // while it is held
+    std::optional<PlatformFile::Handle> m_itself; // the file, where it has several names
+    PlatformFile* m_platform = nullptr;           // while it is held
 };

@@ -1,5 +1,7 @@
 #include "files/process_copy.h"
 
+#include "files/file_lock.h"
+
 #include <algorithm>
 #include <cerrno>
 #include <climits>
@@ -42,6 +44,7 @@ ProcessCopy::Answer Run(const std::function<ProcessCopy::Answer()>& work, Proces
         std::signal(signal, SIG_DFL);
     ::alarm(LongestWork);
     CloseConnections();
+    FileLock::LeaveToOriginal();
     ::umask(0077);
     const rlimit none{};
     ::setrlimit(RLIMIT_CORE, &none); // of the program's memory only the program leaves an image

@@ -8,6 +8,7 @@
 #include "grid/grid_texts.h"
 #include "grid/grid_widths.h"
 #include "grid/typing.h"
+#include "ks/fc/doc.h"
 #include "ks/language/language.h"
 
 #include <QAbstractButton>
@@ -148,6 +149,19 @@ bool CGenGrid::CommitEditor()
     return m_delegate->Commit();
 }
 
+bool CGenGrid::MayChange() const
+{
+    return !m_model->Document() || m_model->Document()->MayChange();
+}
+
+bool CGenGrid::edit(const QModelIndex& index, EditTrigger trigger, QEvent* event)
+{
+    constexpr EditTriggers byUser = DoubleClicked | EditKeyPressed | AnyKeyPressed;
+    if (byUser.testFlag(trigger) && index.isValid() && !MayChange())
+        return false;
+    return QTableView::edit(index, trigger, event);
+}
+
 bool CGenGrid::LeaveField()
 {
     return m_host ? m_host->LeaveField() : CommitEditor();
@@ -167,7 +181,7 @@ void CGenGrid::ActOn(int row, int column)
 {
     const QModelIndex cell = m_model->index(row - 1, column - 1);
     const ColumnSpec& spec = m_model->Column(cell.column());
-    if (!spec.ActsAtOnce() || m_model->IsLocked(cell.row(), cell.column()))
+    if (!spec.ActsAtOnce() || m_model->IsLocked(cell.row(), cell.column()) || !MayChange())
         return;
     if (spec.Kind() == CellKind::Flag) {
         const bool checked = cell.data(Qt::CheckStateRole).toInt() == Qt::Checked;

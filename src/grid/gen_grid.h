@@ -50,6 +50,8 @@ public:
     /// Likewise; without a current cell the first one becomes it.
     void Reload();
 
+    /// False for a document that takes no change: the user has been told why.
+    bool MayChange() const;
     /// Whether lines can be added.
     bool MayGrow() const { return m_model->Rows() && m_model->Rows()->MayGrow(); }
     /// Inserts a line where the choice of lines says; returns its row.
@@ -87,12 +89,14 @@ protected:
     void changeEvent(QEvent* event) override;
     void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
     void keyboardSearch(const QString&) override {} // typing edits the cell
+    bool edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) override;
+    using QTableView::edit;
 
 private:
     bool LeaveField();
     void FollowLine(int row, int column);
 
-    CGridModel* m_model;         // these are children
+    CGridModel* m_model; // these are children
     CGridDelegate* m_delegate;
     CGridWidths* m_widths;
     CGridSelection* m_selection;

@@ -76,7 +76,7 @@ static QString PasteRefusal(const CGridModel& model, int top, int left, const st
 
 bool PasteCells(CGenGrid& grid)
 {
-    if (!CanPasteCells(grid))
+    if (!CanPasteCells(grid) || !grid.Model()->Document()->MayChange())
         return false;
     const auto selected = grid.SelectedBlock();
     const int top = selected ? selected->top() : std::max(0, grid.currentIndex().row());

@@ -4,6 +4,7 @@
 #include "grid/grid_clipboard.h"
 #include "grid/grid_host.h"
 #include "grid/grid_keys.h"
+#include "ks/fc/doc.h"
 
 #include <QKeyEvent>
 #include <QMenu>
@@ -56,6 +57,8 @@ void CGridInput::Run(GridAction action)
 
 void CGridInput::Ask(GridAction action)
 {
+    if ((action == GridAction::AppendLine || action == GridAction::DeleteLine) && !m_grid.MayChange())
+        return;
     if (action != GridAction::Undo && action != GridAction::Redo)
         m_grid.StoreEditedLine();
     if (m_grid.Host())
@@ -97,11 +100,12 @@ void CGridInput::ShowMenu(const QPoint& at)
                        [this, action] { Run(action); })
             ->setEnabled(enabled);
     };
-    add(GridAction::AppendLine, m_grid.Model()->Rows() != nullptr);
-    add(GridAction::DeleteLine, m_grid.HasLinesToDelete());
+    const bool changes = m_grid.Model()->Document() && !m_grid.Model()->Document()->IsReadOnly();
+    add(GridAction::AppendLine, changes && m_grid.Model()->Rows());
+    add(GridAction::DeleteLine, changes && m_grid.HasLinesToDelete());
     menu.addSeparator();
     add(GridAction::Copy, CanCopyCells(m_grid));
-    add(GridAction::Paste, CanPasteCells(m_grid));
+    add(GridAction::Paste, changes && CanPasteCells(m_grid));
     if (m_grid.Host() && m_grid.Host()->CanSearch(m_grid)) {
         menu.addSeparator();
         add(GridAction::Search, true);

@@ -126,7 +126,7 @@ QVariant CGridModel::headerData(int section, Qt::Orientation orientation, int ro
 Qt::ItemFlags CGridModel::flags(const QModelIndex& index) const
 {
     const auto flags = QAbstractTableModel::flags(index);
-    if (!index.isValid() || !IsRow(index.row()) || IsLocked(index.row(), index.column()))
+    if (!index.isValid() || !IsRow(index.row()) || m_document->IsReadOnly() || IsLocked(index.row(), index.column()))
         return flags;
     return Column(index.column()).ActsAtOnce() ? flags : flags | Qt::ItemIsEditable;
 }
@@ -185,6 +185,10 @@ bool CGridModel::Store(BlankRule rule)
 {
     if (m_pending.empty())
         return false;
+    if (!m_document->MayChange()) {
+        m_pending.clear();
+        return false;
+    }
     const Overlay typed = std::exchange(m_pending, {});
     const bool rows = StoreRows(typed, rule);
     return StoreOffered(typed, rule) || rows;
@@ -238,6 +242,8 @@ bool CGridModel::StoreRows(const Overlay& typed, BlankRule rule)
 
 void CGridModel::Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step)
 {
+    if (!m_document->MayChange())
+        return;
     Store();
     const int last = StoredRows();
     row = std::min(row, last);
@@ -270,7 +276,7 @@ void CGridModel::Paste(int row, int column, const std::vector<QStringList>& text
 
 int CGridModel::InsertRow(int row)
 {
-    if (!m_rows)
+    if (!m_rows || !m_document->MayChange())
         return row;
     Store();
     const int at = std::min(std::max(row, FixedRows()), StoredRows());
@@ -284,12 +290,16 @@ int CGridModel::InsertRow(int row)
 
 void CGridModel::AppendRow(const QStringList& texts)
 {
+    if (!m_document->MayChange())
+        return;
     Paste(StoredRows(), 0, {texts}, GridTexts::tr("Insertion of lines"));
     m_document->Say(GridTexts::tr("Line inserted"));
 }
 
 void CGridModel::RemoveRows(int row, int count)
 {
+    if (!m_document->MayChange())
+        return;
     Store();
     count = std::min(count, StoredRows() - row);
     if (count <= 0)

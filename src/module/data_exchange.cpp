@@ -209,6 +209,8 @@ void Serve(const CString& path, CView* view, const CObList* items, void (*meet)(
         served = view ? Ready(view) : ViewOfFile(path);
         if (!served)
             return;
+        if (meet != &Select && !served->GetDocument()->MayChange())
+            return Log("the document may not be changed");
         const bool mayLeave = served->MayLeave(KsLeave::Page);
         if (!served || !Ready(served)) // the question may have taken its time
             return;

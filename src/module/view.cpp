@@ -44,7 +44,8 @@ void CKavo0_hdView::OnInitialUpdate()
     m_sheet = new CDlgPropertySheet(this);
     SetContent(m_sheet);
     setFocusProxy(m_sheet);
-    const auto allowEditing = [this] { m_sheet->setEnabled(!GetDocument()->IsReadOnly()); };
+    // What a file that could not be read would hold is no model to look at.
+    const auto allowEditing = [this] { m_sheet->setEnabled(!GetDocument()->ShowsDefaults()); };
     connect(GetDocument(), &CKavo0_hdDoc::FileStateChanged, m_sheet, allowEditing);
     allowEditing();
 
@@ -177,6 +178,8 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine;
     const CGenGrid* grid = !page ? nullptr : isForLines ? page->LinesGrid() : page->GetGrid();
     if (!m_linesEnabled || !grid || !grid->isEnabled())
+        return false;
+    if (GetDocument()->IsReadOnly() && (isForLines || id == Command::FetchLocation))
         return false;
     return id == Command::InsertLine      ? true
            : id == Command::DeleteLine    ? grid->HasLinesToDelete()

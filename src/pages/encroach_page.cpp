@@ -207,7 +207,7 @@ void CEncroachPage::GoTo(std::size_t setup)
 
 void CEncroachPage::Insert(std::unique_ptr<Setup> setup)
 {
-    if (!CommitGrids())
+    if (!CommitGrids() || !GetDocument()->MayChange())
         return;
     StoreToDocument();
     m_current = HasSetup() ? m_current + 1 : 0;
@@ -217,7 +217,7 @@ void CEncroachPage::Insert(std::unique_ptr<Setup> setup)
 
 void CEncroachPage::Delete()
 {
-    if (!CommitGrids())
+    if (!CommitGrids() || !GetDocument()->MayChange())
         return;
     StoreToDocument();
     GetDocument()->UndoStack().push(new CSetupCommand(*GetDocument(), m_current, nullptr));

@@ -14,6 +14,8 @@ void AskForLocations(CGenPropertyPage& page)
         KsMessageBox(LoadString(Str::LoadNeedsProject), QMessageBox::Ok, &page);
         return;
     }
+    if (!document.MayChange())
+        return;
     QDialog dialog(&page);
     Ui::CEditorsLoadOptionDlg ui;
     ui.setupUi(&dialog);

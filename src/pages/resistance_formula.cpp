@@ -139,7 +139,7 @@ void SwitchResistanceFormula(CKavo0_hdDoc& document, std::int32_t formula, QComb
     using Button = QMessageBox::StandardButton;
     const HD_Global_Var& globals = document.Parameters().Global;
     const std::int32_t before = globals.resist_num;
-    if (formula == before)
+    if (formula == before || !document.MayChange())
         return;
     auto converted = std::make_unique<CSwitchFormula>(document, formula, true);
     Button answer = Button::No;

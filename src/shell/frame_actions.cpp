@@ -3,6 +3,9 @@
 #include "ks/units/edit_style.h"
 #include "shell/help_commands.h"
 #include "shell/main_frame.h"
+#include "shell/settings_keys.h"
+
+#include <QSettings>
 
 static constexpr bool ShownOnly = true;
 
@@ -16,6 +19,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {FileMenu, "actionOpen", QT_TR_NOOP("&Open..."), QT_TR_NOOP("Opens a document or a project"), [](F& f) { f.Files().AskToOpen(); }, K::Open, "open"},
         {FileMenu, "actionOpenProject", QT_TR_NOOP("Open &Project..."), QT_TR_NOOP("Opens a project with all its files"), [](F& f) { f.Files().AskToOpenProject(); }},
         {FileMenu, "actionOpenRecent", QT_TR_NOOP("Open &Recent"), QT_TR_NOOP("Opens one of the files used last")},
+        {FileMenu, "actionOneProgram", QT_TR_NOOP("Open in the Runnin&g Program"), QT_TR_NOOP("A further start of the program hands its files to the one that runs"), [](F&) { QSettings().setValue(Settings::OneProgram, !QSettings().value(Settings::OneProgram, true).toBool()); }},
         {FileMenu},
         {FileMenu, "actionSave", QT_TR_NOOP("&Save"), QT_TR_NOOP("Saves the active document"), [](F& f) { f.Files().Save(); }, K::Save, "save"},
         {FileMenu, "actionSaveAs", QT_TR_NOOP("Save &As..."), QT_TR_NOOP("Saves the active document under a new name"), [](F& f) { f.Files().SaveAs(); }, K::SaveAs},

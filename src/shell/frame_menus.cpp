@@ -8,11 +8,13 @@
 #include "shell/lines_menu.h"
 #include "shell/main_frame.h"
 #include "shell/recent_files.h"
+#include "shell/settings_keys.h"
 
 #include <QActionGroup>
 #include <QDir>
 #include <QMenu>
 #include <QMenuBar>
+#include <QSettings>
 #include <QToolBar>
 
 static void InitResources()
@@ -69,7 +71,7 @@ void CFrameMenus::CreateActions()
                 action, [this, run = row.run] { run(m_frame); }, row.shownOnly);
         m_actions.emplace(action->objectName(), action);
     }
-    for (const char* name : {"actionTabs", "actionProjectTree", "actionAllDigits"})
+    for (const char* name : {"actionTabs", "actionProjectTree", "actionAllDigits", "actionOneProgram"})
         Action(name)->setCheckable(true);
     Action("actionExit")->setMenuRole(QAction::QuitRole);
     Action("actionAbout")->setMenuRole(QAction::AboutRole);
@@ -173,6 +175,7 @@ void CFrameMenus::Update()
     Action("actionProjectTree")->setEnabled(projects);
     Action("actionProjectTree")->setChecked(m_frame.Projects().Tree().isVisible());
     Action("actionOpenRecent")->setEnabled(!RecentFiles::All().isEmpty());
+    Action("actionOneProgram")->setChecked(QSettings().value(Settings::OneProgram, true).toBool());
     Action("actionAllDigits")->setChecked(KsUnits::Instance().AllDigits());
     const bool usCustomary = KsUnits::Instance().System() == KsUnitSystem::UsCustomary;
     Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);

@@ -21,6 +21,7 @@
 #include <QScreen>
 #include <QSettings>
 #include <QStatusBar>
+#include <QTimer>
 #include <QUndoStack>
 #include <QUrl>
 
@@ -153,6 +154,25 @@ void CMainFrame::ActiveViewChanged(CView* view)
     m_menus.ViewChanged();
     Update();
     TellStatus({}); // it was about the view before
+}
+
+bool CMainFrame::TakeFiles(const QStringList& files, const QString& token)
+{
+    if (QApplication::activeModalWidget())
+        return false;
+    // When the other one has its answer: what is opened may ask.
+    QTimer::singleShot(0, this, [this, files, token] {
+        qputenv("XDG_ACTIVATION_TOKEN", token.toUtf8());
+        setWindowState(windowState() & ~Qt::WindowMinimized);
+        raise();
+        activateWindow();
+        qunsetenv("XDG_ACTIVATION_TOKEN");
+        if (!MayLeave())
+            return;
+        for (const QString& file : files)
+            OpenFile(file, true);
+    });
+    return true;
 }
 
 // ---- texts -------------------------------------------------------------------------------------

@@ -29,6 +29,9 @@ public:
     /// See CFileCommands::Open.
     bool OpenFile(const QString& path, bool othersLater = false) { return m_files.Open(path, othersLater); }
 
+    /// Those of another start of the program, which come to the front (CHandover). False while a question is open.
+    bool TakeFiles(const QStringList& files, const QString& token);
+
     /// Offers the changes that earlier sessions left over, once at the start.
     void OfferRecovery() { m_recovery.Offer(); }
 

@@ -2,6 +2,7 @@
 
 #include "files/structure.h"
 #include "ks/fc/document_file.h"
+#include "ks/fc/file_use.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/system_reason.h"
 #include "shell/project_file.h"
@@ -54,6 +55,9 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
 
 Result<WriteReport> Respell(const QString& projectPath, const QString& path, const QByteArray& extension)
 {
+    const FileLock lock = CKsFileUse::Lock(projectPath);
+    if (lock.HeldBy())
+        return NotWritten(projectPath.toStdString(), std::make_error_code(std::errc::device_or_resource_busy));
     const Result<std::string> content = ReadWholeFile(projectPath.toStdString());
     if (!content)
         return content.error();

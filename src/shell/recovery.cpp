@@ -85,8 +85,12 @@ bool CRecovery::Open(const CRecoverable& item)
     }
     const bool isSame = StateOf(item.header) == CRecoverable::Same;
     const CKsDoc* open = isSame ? m_plugins.FindDocument(item.header.path) : nullptr;
-    const bool isBeside = !isSame || (open && open->IsModified());
+    bool isBeside = !isSame || (open && open->IsModified());
     CKsDoc* document = item.editor->OpenDocumentFile(&m_frame, isBeside ? QString() : item.header.path);
+    if (document && document->IsInUse()) {
+        isBeside = true;
+        document = item.editor->OpenDocumentFile(&m_frame, {});
+    }
     if (!document)
         return false;
     if (!document->TakeContent(std::move(content), tr("Recovered changes"))) {

@@ -8,6 +8,7 @@ inline constexpr char Tabs[] = "window/tabs";
 inline constexpr char HiddenBars[] = "window/hiddenToolBars";
 inline constexpr char RecentFiles[] = "files/recent";
 inline constexpr char LastFolder[] = "files/folder";
+inline constexpr char OneProgram[] = "files/oneProgram";
 inline constexpr char UsCustomary[] = "units/usCustomary";
 inline constexpr char AllDigits[] = "numbers/allDigits";
 inline constexpr char Language[] = "language";

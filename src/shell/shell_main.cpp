@@ -3,6 +3,7 @@
 #include "files/platform_process.h"
 #include "ks/language/language.h"
 #include "shell/application.h"
+#include "shell/handover.h"
 #include "shell/main_frame.h"
 #include "shell/settings_keys.h"
 
@@ -11,6 +12,8 @@
 #include <QLocale>
 #include <QSettings>
 #include <QTimer>
+#include <functional>
+#include <optional>
 
 namespace {
 
@@ -48,19 +51,32 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
                                      QCoreApplication::translate("ShellMain", "folder"),
                                      QCoreApplication::applicationDirPath() + QStringLiteral("/plugins"));
     parser.addOption(plugins);
+    const QCommandLineOption separate(
+        QStringLiteral("separate"),
+        QCoreApplication::translate("ShellMain", "Start a program of its own, whether one runs already or not."));
+    parser.addOption(separate);
     parser.addPositionalArgument(QStringLiteral("files"),
                                  QCoreApplication::translate("ShellMain", "Files and projects to open."),
                                  QStringLiteral("[files...]"));
     parser.addHelpOption();
     parser.addVersionOption();
     parser.process(app);
+    QStringList files;
+    for (const QString& file : parser.positionalArguments())
+        files << QDir::current().absoluteFilePath(file);
+    const bool isSeparate = parser.isSet(separate);
+    if (!isSeparate && QSettings().value(Settings::OneProgram, true).toBool() && CHandover::Give(files))
+        return 0;
 
     CMainFrame frame;
     frame.LoadPlugins(parser.value(plugins));
     frame.show();
     // Before control returns to the event loop: the first thing painted is the first page, not an empty frame.
-    for (const QString& file : parser.positionalArguments())
-        frame.OpenFile(QDir::current().absoluteFilePath(file), true);
+    for (const QString& file : files)
+        frame.OpenFile(file, true);
+    std::optional<CHandover> others;
+    if (!isSeparate)
+        others.emplace(std::bind_front(&CMainFrame::TakeFiles, &frame));
     // When what was asked for is there: a message about it comes first.
     QTimer::singleShot(0, &frame, &CMainFrame::OfferRecovery);
     if (onStarted)

@@ -3,6 +3,7 @@
 
 #include "files/file_lock.h"
 #include "files/platform_process.h"
+#include "files/process_copy.h"
 
 #include <ctime>
 #include <thread>
@@ -34,6 +35,7 @@ TEST_F(Locks, OneHasItAndTheOthersHearWho)
         EXPECT_TRUE(HolderText(*second.HeldBy()).find("(first, process ") != std::string::npos);
     }
     EXPECT_TRUE(FileLock::Try(Path("river.kvnw"), "second").IsHeld());
+    EXPECT_TRUE(first.IsFor(Path("link.hdkv")) && first.IsFor(Path("river.HDKV")) && !first.IsFor(Path("a.hdkv")));
     FileLock moved = std::move(first);
     EXPECT_TRUE(moved.IsHeld() && !first.IsHeld());
     std::jthread leaving([&] {
@@ -43,6 +45,26 @@ TEST_F(Locks, OneHasItAndTheOthersHearWho)
     EXPECT_FALSE(FileLock::WaitFor(Path("river.hdkv"), "second", 1ms).IsHeld());
     EXPECT_TRUE(FileLock::WaitFor(Path("river.hdkv"), "second", 10s).IsHeld());
     EXPECT_EQ(FileCount(), 2u) << "nothing is left over";
+}
+
+TEST_F(Locks, AFileOfSeveralNamesHasOneLock)
+{
+    Write("river.hdkv", "x");
+    fs::create_hard_link(m_folder / "river.hdkv", m_folder / "other.hdkv");
+    FileLock first = FileLock::Try(Path("river.hdkv"), "first");
+    ASSERT_TRUE(first.IsHeld());
+    EXPECT_TRUE(FileLock::Try(Path("other.hdkv"), "second").HeldBy());
+    // A copy of the process that goes on for a while holds nothing.
+    auto copy = ProcessCopy::Start([] {
+        std::this_thread::sleep_for(60s);
+        return std::error_code();
+    });
+    ASSERT_TRUE(copy);
+    EXPECT_TRUE(FileLock::Try(Path("other.hdkv"), "second").HeldBy()) << "the original does";
+    first.Release();
+    EXPECT_TRUE(FileLock::WaitFor(Path("other.hdkv"), "second", 10s).IsHeld());
+    copy.value().Stop();
+    EXPECT_EQ(FileCount(), 2u);
 }
 
 TEST_F(Locks, WhatADeadProgramOrAnybodyElseLeavesIsNoLock)

@@ -30,9 +30,9 @@ def largest_window(pid):
 
 class Editor:
     """The program, started with files; `folder` is where it runs and where its log is kept. What a program before it has
-    left over is forgotten, unless it `recovers`."""
+    left over is forgotten, unless it `recovers`; it takes files of further starts when it is `shared`."""
 
-    def __init__(self, folder, *files, language=None, recovers=False):
+    def __init__(self, folder, *files, language=None, recovers=False, shared=False):
         self.hands = Hands()
         self._known = {}  # widgets that were looked for
         self._log = open(f'{folder}/kvrshell.log', 'w+', encoding='utf-8', errors='replace')
@@ -42,7 +42,7 @@ class Editor:
         # Settings and unsaved changes of its own: those of one case must not meet the next.
         environment = dict(os.environ, XDG_CONFIG_HOME=f'{folder}/settings', XDG_STATE_HOME=f'{folder}/state',
                            LC_ALL=(language or 'C') + '.UTF-8')
-        self.process = subprocess.Popen([program, *files], cwd=folder, stdout=self._log, stderr=self._log,
+        self.process = subprocess.Popen([program, *([] if shared else ['--separate']), *files], cwd=folder, stdout=self._log, stderr=self._log,
                                         env=environment)
         try:
             self.root = application(self.process)
@@ -126,6 +126,11 @@ class Editor:
         self.settle(0.1)
 
     # ---- windows
+
+    @property
+    def window_id(self):
+        """Of the main window, for the X server."""
+        return self._window
 
     @property
     def title(self):

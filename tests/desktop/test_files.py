@@ -92,7 +92,7 @@ class WhereFilesStand(Case):
         editor.put(1, 3, '2.5')
         editor.save()
         self.assertIn('river.hdkv is now river.HDKV', editor.status())
-        self.assertEqual([f for f in os.listdir(self.folder) if 'river' in f.lower()], ['river.HDKV'])
+        self.assertEqual([f for f in os.listdir(self.folder) if f.lower().startswith('river')], ['river.HDKV'])
         return f'{self.folder}/river.HDKV'
 
     def test_link_stays(self):

@@ -1,6 +1,8 @@
 // View and sheet with their pages, in a main frame as the shell has it.
 #include "module_fixture.h"
 
+#include "files/file_lock.h"
+#include "files/platform_process.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_keys.h"
 #include "ks/fc/doc_template.h"
@@ -13,11 +15,14 @@
 #include "pages/framework/page_help.h"
 
 #include <QApplication>
+#include <QCheckBox>
 #include <QClipboard>
+#include <QComboBox>
 #include <QDialog>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QRadioButton>
 #include <QStatusBar>
 #include <QTableView>
 #include <QTest>
@@ -309,6 +314,87 @@ TEST_F(ViewTest, WhatWasNotTakenIsListedOnceTheWindowIsThere)
     bar->findChild<QPushButton*>()->click();
     emit view->GetDocument()->FileStateChanged();
     EXPECT_FALSE(bar->isVisible());
+}
+
+/// What a user tries on a page, and finds the value as it was.
+static void TryEverythingOn(CGenPropertyPage& page)
+{
+    QApplication::clipboard()->setText("7");
+    for (auto* button : page.findChildren<QAbstractButton*>())
+        if (qobject_cast<QCheckBox*>(button) || qobject_cast<QRadioButton*>(button))
+            button->click();
+    for (auto* list : page.findChildren<QComboBox*>())
+        QTest::keyClick(list, Qt::Key_Down);
+    for (auto* field : page.findChildren<QLineEdit*>()) {
+        QTest::keyClicks(field, "7");
+        QTest::keyClick(field, Qt::Key_V, Qt::ControlModifier);
+        QTest::keyClick(field, Qt::Key_Return);
+    }
+    for (auto* grid : page.findChildren<CGenGrid*>()) {
+        grid->SetCurrentCell(1, 1);
+        QTest::keyClicks(grid, "7");
+        EXPECT_FALSE(grid->IsEditing());
+        QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier);
+        QTest::keyClick(grid, Qt::Key_F2);
+        QTest::keyClick(grid, Qt::Key_Space);
+        grid->SelectLines(1, 1);
+        for (const GridKey& key : GridKeys())
+            if (key.action == GridAction::AppendLine || key.action == GridAction::DeleteLine)
+                QTest::keyClick(grid, key.key, key.held);
+        grid->InsertLine(); // however somebody comes to it
+        grid->DeleteSelectedLines();
+    }
+    page.AppendLine();
+    page.InsertLocation("R", "7");
+}
+
+TEST_F(ViewTest, AFileThatSomebodyElseHasIsLookedAtUntilHeLetsGo)
+{
+    FileLock other = FileLock::Try(Path("river.hdkv").toStdString(), "kvrshell");
+    ASSERT_TRUE(other.IsHeld());
+    auto* view = Open();
+    ASSERT_NE(view, nullptr);
+    auto* bar = view->findChild<CKsFileBar*>();
+    const auto* text = bar->findChild<QLabel*>();
+    const auto buttons = [bar] {
+        QStringList names;
+        for (const auto* button : bar->findChildren<QPushButton*>())
+            if (button->isVisible())
+                names << button->text();
+        return names;
+    };
+    EXPECT_TRUE(text->text().contains(QString("kvrshell, process %1").arg(ThisProcess().number)));
+    EXPECT_EQ(buttons(), QStringList("Edit a Copy..."));
+
+    CKavo0_hdDoc& document = *view->GetDocument();
+    const std::string before = document.ContentText().value();
+    for (int tab = 0; tab < view->Sheet()->PageCount(); ++tab) {
+        ASSERT_TRUE(view->Sheet()->SetActivePage(tab)) << tab;
+        TryEverythingOn(*view->ActivePage());
+        QCoreApplication::processEvents();
+        EXPECT_EQ(document.UndoStack().count(), 0) << view->Sheet()->tabText(tab).toStdString();
+        EXPECT_EQ(document.ContentText().value(), before) << view->Sheet()->tabText(tab).toStdString();
+    }
+    EXPECT_FALSE(document.IsModified());
+    EXPECT_EQ(boxes, QStringList()) << "the status bar says why";
+    EXPECT_TRUE(frame.statusBar()->currentMessage().contains("is not changed here"));
+    answer = QMessageBox::No;
+    EXPECT_FALSE(document.DoSave(Path("river.hdkv")));
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(boxes[0].contains("river.HDKV was left as it is: it is in use by")) << qPrintable(boxes[0]);
+    EXPECT_EQ(Read(Path("river.hdkv")), SmallFile);
+
+    other.Release();
+    Write(Path("river.hdkv"), QByteArray(SmallFile).replace("MAIN", "OTHER"));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return buttons().contains("Edit"); }));
+    bar->findChild<QPushButton*>()->click();
+    EXPECT_TRUE(FileLock::Try(Path("river.hdkv").toStdString(), "second").HeldBy());
+    EXPECT_FALSE(document.IsReadOnly() || document.IsModified() || !document.UndoStack().isClean());
+    EXPECT_EQ(document.Parameters().InitList.GetAt(0).RiverName, "OTHER");
+    EXPECT_FALSE(bar->isVisible());
+    ASSERT_TRUE(view->Sheet()->SetActivePage(0));
+    view->ActivePage()->AppendLine();
+    EXPECT_TRUE(document.IsModified());
 }
 
 TEST_F(ViewTest, ACleanFileHasNoBar)

@@ -252,7 +252,7 @@ void CTablesView::Run(CGenGrid& grid, GridAction action)
 
 bool CTablesView::IsCommandEnabled(int id) const
 {
-    if (!m_lines)
+    if (!m_lines || (ProjectDoc()->IsReadOnly() && (id == Command::InsertLine || id == Command::DeleteLine)))
         return false;
     switch (id) {
     case Command::InsertLine:

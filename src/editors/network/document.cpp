@@ -56,7 +56,7 @@ void CNetworkDoc::UpdateAll(CView* sender, int hint, CHint* object)
 
 void CNetworkDoc::AppendBranches(std::vector<CNetworkBranch> branches, const QString& system, const QString& text)
 {
-    if (branches.empty())
+    if (branches.empty() || !MayChange())
         return;
     const auto rows = MakeBranchRows(*this);
     auto added = rows->NewRows(branches.size());

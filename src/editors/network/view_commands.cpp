@@ -55,9 +55,9 @@ bool CNetworkView::IsCommandEnabled(int id) const
         return false;
     switch (id) {
     case NetworkCommand::Import:
-        return CanImport();
+        return CanImport() && !Document()->IsReadOnly();
     case Command::InsertLine:
-        return CurrentLine() >= 0;
+        return CurrentLine() >= 0 && !Document()->IsReadOnly();
     case Command::DeleteLine: // the key means something else on the map
         return HasFocus(Lines()) && CTablesView::IsCommandEnabled(id);
     case NetworkCommand::FitAll:

@@ -69,6 +69,16 @@ bool CKsDoc::TakeContent(std::string, const CString&)
     return false;
 }
 
+void CKsDoc::HoldFile(const CString&) {}
+
+bool CKsDoc::MayChange()
+{
+    if (!IsReadOnly())
+        return true;
+    Say(WhyReadOnly());
+    return false;
+}
+
 void CKsDoc::OnCloseDocument()
 {
     DeleteContents();

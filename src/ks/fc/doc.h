@@ -86,6 +86,17 @@ public:
     /// Such a text becomes what the document holds, as one step to undo that is called `step`. False, and nothing has
     /// changed, when it is no file of the kind.
     virtual bool TakeContent(std::string text, const CString& step);
+    /// Keeps other programs from writing a file that is about to be opened in a window, for as long as the document is
+    /// its.
+    virtual void HoldFile(const CString& path);
+    /// Another program edits the file.
+    virtual bool IsInUse() const { return false; }
+    /// Nothing may be changed.
+    virtual bool IsReadOnly() const { return false; }
+    /// Asked before whatever changes the content; undo steps ask by themselves. False: the user has been told why not,
+    /// in passing.
+    bool MayChange();
+
     /// What the file on the disk was when the document was read from it or written to it.
     virtual FileStatus Seen() const { return {}; }
 
@@ -135,6 +146,8 @@ signals:
     void Said(const CString& text);
 
 protected:
+    /// In the user's language, when nothing may be changed.
+    virtual CString WhyReadOnly() const { return {}; }
     /// Tells why OnSaveDocument could not write. When DoSave has called it, the user is told when it is over, and may
     /// choose another name at once.
     void TellNotSaved(const CString& why);

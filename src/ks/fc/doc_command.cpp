@@ -1,5 +1,7 @@
 #include "ks/fc/doc_command.h"
 
+#include <QTimer>
+
 CDocumentCommand::CDocumentCommand(CKsDoc& document, const QString& text) : m_document(document)
 {
     setText(text);
@@ -7,6 +9,12 @@ CDocumentCommand::CDocumentCommand(CKsDoc& document, const QString& text) : m_do
 
 void CDocumentCommand::Run(bool forward)
 {
+    if (!m_repeated && !IsAllowed()) {
+        setObsolete(true); // no step comes of it; who made it shows the document as it is
+        QTimer::singleShot(0, &m_document,
+                           [document = &m_document] { document->UpdateAllViews(nullptr, CKsDoc::ReloadHint); });
+        return;
+    }
     const ChangePlace place = forward ? Apply() : Revert();
     m_document.UpdateAll();
     // The first time the change comes from what the user is looking at.

@@ -6,8 +6,8 @@
 
 #include <QUndoCommand>
 
-/// Every change marks the document modified and reloads the views. A change that undo or redo brings back is also
-/// shown to the user, wherever it is.
+/// Every change marks the document modified and reloads the views. A document that may not be changed takes no new
+/// step. A change that undo or redo brings back is also shown to the user, wherever it is.
 class KS_API CDocumentCommand : public QUndoCommand
 {
 public:
@@ -18,6 +18,8 @@ public:
 protected:
     virtual ChangePlace Apply() = 0;
     virtual ChangePlace Revert() = 0;
+    /// Asked before the step is made; false when the user has been told why not.
+    virtual bool IsAllowed() { return m_document.MayChange(); }
 
 private:
     void Run(bool forward);
@@ -43,6 +45,7 @@ protected:
         return {};
     }
     ChangePlace Revert() override { return Apply(); }
+    bool IsAllowed() override { return true; } // it is what somebody has kept or written already
 
 private:
     T& m_target;

@@ -1,5 +1,6 @@
 #include "ks/fc/doc_template.h"
 
+#include "files/safe_file.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
@@ -82,13 +83,26 @@ CKsDoc* CMultiDocTemplate::FindDocument(const CString& path) const
     return nullptr;
 }
 
-std::unique_ptr<CKsDoc> CMultiDocTemplate::LoadDocument(const CString& path)
+/// By another name of the file, too (a hard link).
+CKsDoc* CMultiDocTemplate::FindOpen(const CString& path) const
+{
+    if (CKsDoc* document = FindDocument(path))
+        return document;
+    for (CKsDoc* document : Documents())
+        if (!IsClosing(document) && SameFile(document->GetPathName().toStdString(), path.toStdString()))
+            return document;
+    return nullptr;
+}
+
+std::unique_ptr<CKsDoc> CMultiDocTemplate::LoadDocument(const CString& path, bool hold)
 {
     std::unique_ptr<CKsDoc> document(m_classes.document());
     if (!document)
         return nullptr;
     document->m_template = this;
     document->m_executing = true;
+    if (hold && !path.isEmpty())
+        document->HoldFile(path);
     const bool loaded = path.isEmpty() ? document->OnNewDocument() : document->OnOpenDocument(path);
     document->m_executing = false;
     if (!loaded)
@@ -122,7 +136,7 @@ std::unique_ptr<CKsDoc> CMultiDocTemplate::ReadDocument(const CString& path)
 {
     const CKsKeptMessages untold;
     const int untitled = m_untitled;
-    auto document = LoadDocument(path);
+    auto document = LoadDocument(path, false);
     m_untitled = untitled;
     return document;
 }
@@ -161,13 +175,13 @@ CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString
 CKsDoc* CMultiDocTemplate::Open(CKsMDIFrameWnd* frame, const CString& path)
 {
     const CString absolute = path.isEmpty() ? path : KsExistingSpelling(QFileInfo(path).absoluteFilePath());
-    if (CKsDoc* open = absolute.isEmpty() ? nullptr : FindDocument(absolute)) {
+    if (CKsDoc* open = absolute.isEmpty() ? nullptr : FindOpen(absolute)) {
         if (auto* window = open->Views().empty() ? nullptr : CKsMDIChildWnd::Of(open->Views().front()))
             window->BringToFront();
         emit DocumentShown(open);
         return open;
     }
-    auto loaded = LoadDocument(absolute);
+    auto loaded = LoadDocument(absolute, true);
     if (!loaded)
         return nullptr;
     CKsDoc* document = loaded.release();

@@ -77,8 +77,9 @@ signals:
 
 private:
     friend class CKsMDIChildWnd;
-    std::unique_ptr<CKsDoc> LoadDocument(const CString& path);
+    std::unique_ptr<CKsDoc> LoadDocument(const CString& path, bool hold);
     CKsDoc* Open(CKsMDIFrameWnd* frame, const CString& path);
+    CKsDoc* FindOpen(const CString& path) const;
     bool ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame);
     void CloseDocument(CKsDoc* document);
     QList<CKsDoc*> Documents() const { return findChildren<CKsDoc*>(Qt::FindDirectChildrenOnly); }

@@ -4,6 +4,7 @@
 #include "ks/fc/file_bar.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/project_doc.h"
+#include "ks/fc/system_reason.h"
 
 void CKsProjectDoc::AddNoticeSource(KsNoticeSource source)
 {
@@ -14,10 +15,38 @@ void CKsProjectDoc::AddNoticeSource(KsNoticeSource source)
 std::vector<KsFileNotice> CKsProjectDoc::Notices()
 {
     std::vector<KsFileNotice> notices;
+    UseNotice(notices);
     for (const KsNoticeSource& source : m_noticeSources)
         source(notices);
     OwnNotice(notices);
     return notices;
+}
+
+void CKsProjectDoc::UseNotice(std::vector<KsFileNotice>& notices)
+{
+    const CString name = KsShownFileName(m_file.Path());
+    const KsNoticeAction copy{CKsFileBar::tr("Edit a Copy..."), [this](CKsFileBar&) { EditCopy(); }};
+    if (IsInUse() && m_use.IsFree()) {
+        notices.push_back(
+            {CKsFileBar::tr("%1 can be edited now: it is no longer in use by %2. What has been written to "
+                            "it meanwhile is read first.")
+                 .arg(name, m_use.Holder()),
+             {{CKsFileBar::tr("Edit"), [this](CKsFileBar&) { EditFreed(); }}, copy}});
+    } else if (IsInUse()) {
+        notices.push_back({CKsFileBar::tr("%1 is in use by %2. Here it can be looked at and copied, not changed.")
+                               .arg(name, m_use.Holder()),
+                           {copy}});
+    } else if (m_use.WhyNone() && !m_isUseClosed) {
+        notices.push_back(
+            {CKsFileBar::tr("Other programs cannot be told that %1 is in use here: %2. Nobody else should "
+                            "change it now.")
+                 .arg(name, KsSystemReason(m_use.WhyNone())),
+             {},
+             [this] {
+                 m_isUseClosed = true;
+                 emit FileStateChanged();
+             }});
+    }
 }
 
 void CKsProjectDoc::OwnNotice(std::vector<KsFileNotice>& notices)
@@ -31,7 +60,7 @@ void CKsProjectDoc::OwnNotice(std::vector<KsFileNotice>& notices)
         KsFileNotice notice{CKsFileBar::tr("%1 could not be read. What is shown here are default values, not its "
                                            "content.\n%2")
                                 .arg(name, m_file.Error())};
-        if (m_isReadOnly)
+        if (m_showsDefaults)
             notice.actions = {{CKsFileBar::tr("Edit Default Values"), [this](CKsFileBar&) { EditUnreadable(); }}};
         notices.push_back(std::move(notice));
         return;

@@ -82,7 +82,10 @@ void CKsOutsideChange::Refresh()
 KsFileNotice CKsOutsideChange::OtherContent()
 {
     KsFileNotice notice;
-    notice.text = (m_document.IsModified()
+    const bool isReadOnly = m_document.IsReadOnly();
+    notice.text = (isReadOnly
+                       ? tr("%1 was changed by another program (%2). What is shown is the content before.")
+                   : m_document.IsModified()
                        ? tr("%1 was changed by another program (%2), and the changes made here are not saved. Reload "
                             "takes the file; undo brings back what is shown. Keep Both saves what is shown under "
                             "another name. Overwrite saves it here; the file as it is stays in a copy beside it.")
@@ -94,9 +97,11 @@ KsFileNotice CKsOutsideChange::OtherContent()
         notice.text +=
             u'\n' + tr("The file cannot be loaded as it is, and what is shown stays: %1").arg(m_whyNotReloaded);
     notice.actions = {{tr("Reload"), [this](CKsFileBar&) { Reload(); }},
-                      {tr("Compare..."), [this](CKsFileBar& bar) { Compare(&bar); }},
-                      {tr("Keep Both..."), [this](CKsFileBar&) { KeepBoth(); }},
-                      {tr("Overwrite"), [this](CKsFileBar&) { Overwrite(); }}};
+                      {tr("Compare..."), [this](CKsFileBar& bar) { Compare(&bar); }}};
+    if (!isReadOnly) {
+        notice.actions.push_back({tr("Keep Both..."), [this](CKsFileBar&) { KeepBoth(); }});
+        notice.actions.push_back({tr("Overwrite"), [this](CKsFileBar&) { Overwrite(); }});
+    }
     return notice;
 }
 
@@ -112,8 +117,10 @@ void CKsOutsideChange::Append(std::vector<KsFileNotice>& notices)
         notice.text = tr("%1 was removed or renamed by another program (%2). What is shown is nowhere else until it is "
                          "saved again.")
                           .arg(Name(), TimeText(Sight().time));
-        notice.actions = {{tr("Save Again"), [this](CKsFileBar&) { m_document.DoSave(m_document.GetPathName()); }},
-                          saveAs};
+        if (!m_document.IsInUse())
+            notice.actions.push_back(
+                {tr("Save Again"), [this](CKsFileBar&) { m_document.DoSave(m_document.GetPathName()); }});
+        notice.actions.push_back(saveAs);
     } else {
         notice.text = tr("%1 cannot be read any more: %2. What is shown stays; to be safe save it under another name.")
                           .arg(Name(), KsSystemReason(Sight().why));

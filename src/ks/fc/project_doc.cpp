@@ -2,6 +2,7 @@
 
 #include "files/structure.h"
 #include "ks/fc/exchange.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/outside_change.h"
 
 #include <QTimer>
@@ -12,12 +13,13 @@
 CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind), m_outside(new CKsOutsideChange(*this))
 {
     connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
+    connect(&m_use, &CKsFileUse::Changed, this, &CKsProjectDoc::ReadOnlyChanged);
 }
 
 void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load)
 {
     m_file.Read(path, SavePathFor(path), load);
-    m_isReadOnly = m_file.IsUnreadable();
+    m_showsDefaults = m_file.IsUnreadable();
     FileIsKnown();
 }
 
@@ -34,7 +36,7 @@ bool CKsProjectDoc::Reload(CString& why)
     if (!step || !why.isEmpty())
         return false;
     m_file = std::move(file);
-    m_isReadOnly = false;
+    m_showsDefaults = false;
     UndoStack().push(step.release());
     UndoStack().setClean();
     SetModifiedFlag(false);
@@ -60,9 +62,20 @@ bool CKsProjectDoc::SaveOverOthers()
 
 bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
 {
+    if (!m_use.TakeTarget(target)) {
+        TellNotSaved(
+            tr("%1 was left as it is: it is in use by %2.").arg(KsShownFileName(target), m_use.TargetHolder()));
+        return false;
+    }
     const bool written = m_file.Write(target, write);
     if (!written && !m_file.WhyNotWritten().isEmpty())
         TellNotSaved(m_file.WhyNotWritten());
+    try {
+        if (written)
+            EditUnreadable(); // a save may end with a step of its own
+        m_use.TargetWritten(written);
+    } catch (const std::bad_alloc&) { // the file is what it is; the bar is shown anew with the next news
+    }
     return written;
 }
 
@@ -71,7 +84,6 @@ void CKsProjectDoc::FileWritten()
     UndoStack().setClean();
     SetPathName(m_file.Path());
     SetModifiedFlag(false);
-    m_isReadOnly = false;
     try {
         FileIsKnown();
     } catch (const std::bad_alloc&) { // it is saved all the same; what others do to it shows at the next save
@@ -80,8 +92,39 @@ void CKsProjectDoc::FileWritten()
 
 void CKsProjectDoc::EditUnreadable()
 {
-    m_isReadOnly = false;
+    if (std::exchange(m_showsDefaults, false))
+        ReadOnlyChanged();
+}
+
+/// The views take what may be changed from the document whenever they show it.
+void CKsProjectDoc::ReadOnlyChanged()
+{
     emit FileStateChanged();
+    if (!IsExecuting())
+        UpdateAllViews(nullptr, ReloadHint);
+}
+
+void CKsProjectDoc::EditFreed()
+{
+    m_use.Take(GetPathName());
+    if (IsInUse()) // somebody else was faster
+        return;
+    if (!StatusBehind(GetPathName().toStdString()).IsUnchanged(m_file.Seen()))
+        return m_outside->Reload();
+    UndoStack().setClean(); // it is what the file holds
+    SetModifiedFlag(false);
+}
+
+void CKsProjectDoc::EditCopy()
+{
+    m_outside->KeepBoth();
+}
+
+CString CKsProjectDoc::WhyReadOnly() const
+{
+    const CString name = KsShownFileName(m_file.Path());
+    return IsInUse() ? tr("%1 is in use by %2, and is not changed here.").arg(name, m_use.Holder())
+                     : tr("%1 could not be read, and is not changed.").arg(name);
 }
 
 bool CKsProjectDoc::TakeContent(std::string text, const CString& step)
@@ -94,8 +137,7 @@ bool CKsProjectDoc::TakeContent(std::string text, const CString& step)
     const auto findings = report.Take();
     if (!command || (!findings.empty() && findings.front().kind == Finding::NoTarget))
         return false;
-    if (m_isReadOnly) // somebody has edited it already
-        EditUnreadable();
+    EditUnreadable(); // somebody has edited it already
     UndoStack().push(command.release());
     return true;
 }
@@ -132,6 +174,11 @@ void CKsProjectDoc::LeaveProject(CView* view)
 /// once.
 void CKsProjectDoc::StepMade()
 {
+    if (IsInUse() && UndoStack().count() > 0) // the file was read again; going back would be a change
+        QTimer::singleShot(0, this, [this] {
+            UndoStack().clear();
+            SetModifiedFlag(false);
+        });
     if (!m_project || UndoStack().count() == 0) // a cleared stack is no step
         return;
     if (m_untold++ == 0)

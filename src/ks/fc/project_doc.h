@@ -5,6 +5,7 @@
 #include "ks/fc/doc.h"
 #include "ks/fc/document_file.h"
 #include "ks/fc/file_notice.h"
+#include "ks/fc/file_use.h"
 #include "ks/fc/package.h"
 
 #include <QStringList>
@@ -22,9 +23,17 @@ public:
 
     /// The file last opened or saved.
     const CKsDocumentFile& File() const { return m_file; }
-    /// It could not be parsed, and nobody has asked to edit what is shown instead.
-    bool IsReadOnly() const { return m_isReadOnly; }
+    /// Another program has the file, or it could not be parsed and nobody has asked to edit what is shown instead.
+    bool IsReadOnly() const final { return IsInUse() || m_showsDefaults; }
+    bool IsInUse() const final { return m_use.IsElsewhere(); }
+    bool ShowsDefaults() const { return m_showsDefaults; }
+    /// What is shown instead of a file that could not be parsed may be edited.
     void EditUnreadable();
+    /// So may a file that nobody else has any more; what has been written to it meanwhile is read first.
+    void EditFreed();
+    /// The document becomes one of another name, for which the user is asked.
+    void EditCopy();
+    void HoldFile(const CString& path) final { m_use.Take(path); }
     /// What there is to say of the file, for the bar above the views; in the order in which it is shown.
     std::vector<KsFileNotice> Notices();
     /// Who has something to say of the file adds it here for as long as the document lives, and has the notices shown
@@ -87,11 +96,16 @@ protected:
 private:
     void FileIsKnown();
     void StepMade();
+    CString WhyReadOnly() const final;
+    void ReadOnlyChanged();
+    void UseNotice(std::vector<KsFileNotice>& notices);
     void OwnNotice(std::vector<KsFileNotice>& notices);
     LRESULT Send(CKsWindow* window, unsigned message, WPARAM request, CView* sender, CObList* objects) const;
 
     int m_kind;
-    bool m_isReadOnly = false;
+    CKsFileUse m_use;
+    bool m_showsDefaults = false;
+    bool m_isUseClosed = false; // the notice that the file cannot be kept from others
     std::vector<KsNoticeSource> m_noticeSources;
     bool m_isNoticeClosed = false; // what was to be said of the last open or save
     std::intptr_t m_project = 0;

@@ -197,6 +197,37 @@ Save?</source>
         <source>Close this bar</source>
         <translation>このバーを閉じる</translation>
     </message>
+    <message>
+        <source>%1 is in use by %2. Here it can be looked at and copied, not changed.</source>
+        <translation>%1 は %2 が使用中です。ここでは表示とコピーだけができ、変更はできません。</translation>
+    </message>
+    <message>
+        <source>%1 can be edited now: it is no longer in use by %2. What has been written to it meanwhile is read first.</source>
+        <translation>%1 を編集できるようになりました。%2 は使用を終えています。その間にファイルに書き込まれた内容を先に読み込みます。</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>編集</translation>
+    </message>
+    <message>
+        <source>Edit a Copy...</source>
+        <translation>コピーを編集...</translation>
+    </message>
+    <message>
+        <source>Other programs cannot be told that %1 is in use here: %2. Nobody else should change it now.</source>
+        <translation>%1 をここで使用中であることを他のプログラムに知らせることができません: %2。今は他の人が変更しないようにしてください。</translation>
+    </message>
+</context>
+<context>
+    <name>CKsFileUse</name>
+    <message>
+        <source>another program</source>
+        <translation>他のプログラム</translation>
+    </message>
+    <message>
+        <source>%1 on %2 (%3, process %4) since %5</source>
+        <translation>%2 の %1 (%3、プロセス %4、%5 から)</translation>
+    </message>
 </context>
 <context>
     <name>CKsOutsideChange</name>
@@ -672,6 +703,21 @@ Used instead</source>
     <message>
         <source>%1.</source>
         <translation>%1。</translation>
+    </message>
+</context>
+<context>
+    <name>CKsProjectDoc</name>
+    <message>
+        <source>%1 was left as it is: it is in use by %2.</source>
+        <translation>%1 はそのままです。%2 が使用中です。</translation>
+    </message>
+    <message>
+        <source>%1 is in use by %2, and is not changed here.</source>
+        <translation>%1 は %2 が使用中のため、ここでは変更しません。</translation>
+    </message>
+    <message>
+        <source>%1 could not be read, and is not changed.</source>
+        <translation>%1 は読み込めなかったため、変更しません。</translation>
     </message>
 </context>
 </TS>

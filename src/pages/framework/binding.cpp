@@ -190,7 +190,7 @@ void CBindings::Add(QCheckBox* box, bool& value, std::function<void(bool checked
         });
     }
     connect(box, &QCheckBox::clicked, this, [this, &value, consequences](bool checked) {
-        if (!consequences)
+        if (!consequences || m_document->IsReadOnly()) // which refuses the value
             return Store(value, checked);
         QUndoStack& steps = m_document->UndoStack();
         steps.beginMacro(LoadString(Str::UndoValue));
@@ -312,6 +312,8 @@ void CBindings::ShowWhen(std::function<bool()> rule, std::initializer_list<QWidg
 
 void CBindings::Show()
 {
+    for (const CTyping* typing : m_typed)
+        static_cast<QLineEdit*>(typing->parent())->setReadOnly(m_document->IsReadOnly());
     for (const Control& control : m_controls)
         control.show();
     ApplyRules();

@@ -59,6 +59,8 @@ void CGeoFileEdit::SetUp(const CKavo0_hdDoc& document, FileKind kind)
 
 void CGeoFileEdit::Browse()
 {
+    if (m_field->isReadOnly())
+        return;
     if (const auto chosen = BrowseForFile(*m_document, m_field->text(), m_kind, this)) {
         m_field->setText(*chosen);
         emit Chosen();

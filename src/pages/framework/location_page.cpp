@@ -174,7 +174,7 @@ void CLocationPage::AppendLine()
 
 void CLocationPage::InsertLocation(const QString& riverName, const QString& chainageText)
 {
-    if (!m_list)
+    if (!m_list || !GetDocument()->MayChange())
         return;
     CGridModel& model = *GetGrid()->Model();
     const QString refusal = model.Refusal(model.rowCount(), 1, chainageText);

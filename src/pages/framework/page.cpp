@@ -258,8 +258,7 @@ bool CGenPropertyPage::eventFilter(QObject* object, QEvent* event)
         return !(pressed->modifiers() & Qt::ControlModifier) && key != Qt::Key_Tab && key != Qt::Key_Backtab &&
                key != Qt::Key_Escape;
     };
-    const bool mayAct =
-        !isAct() || ((m_bindings.TakesFieldAway(object) || m_bindings.Take()) && CommitGrids());
+    const bool mayAct = !isAct() || ((m_bindings.TakesFieldAway(object) || m_bindings.Take()) && CommitGrids());
     return !mayAct || QWidget::eventFilter(object, event);
 }
 
@@ -280,6 +279,6 @@ void CGenPropertyPage::keyPressEvent(QKeyEvent* event)
         UndoRedo(true);
     else if (event->matches(QKeySequence::Redo))
         UndoRedo(false);
-    else
+    else if (event->text().isEmpty() || !event->text().front().isPrint() || m_document->MayChange()) // typed in vain?
         QWidget::keyPressEvent(event);
 }

@@ -76,6 +76,14 @@ The editors read %2.</source>
         <translation>最近使ったファイルを開きます</translation>
     </message>
     <message>
+        <source>Open in the Runnin&amp;g Program</source>
+        <translation>実行中のプログラムで開く(&amp;G)</translation>
+    </message>
+    <message>
+        <source>A further start of the program hands its files to the one that runs</source>
+        <translation>もう一度起動すると、ファイルを実行中のプログラムに渡します</translation>
+    </message>
+    <message>
         <source>&amp;Save</source>
         <translation>上書き保存(&amp;S)</translation>
     </message>
@@ -549,6 +557,10 @@ Shell of the river model editors.</source>
     <message>
         <source>Files and projects to open.</source>
         <translation>開くファイルまたはプロジェクト</translation>
+    </message>
+    <message>
+        <source>Start a program of its own, whether one runs already or not.</source>
+        <translation>すでに実行中でも、別のプログラムとして起動します。</translation>
     </message>
 </context>
 <context>

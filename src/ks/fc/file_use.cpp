@@ -1,0 +1,100 @@
+#include "ks/fc/file_use.h"
+
+#include "ks/fc/shown_text.h"
+
+#include <QDateTime>
+#include <utility>
+
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr char Program[] = "kvrshell";
+constexpr auto ShortUse = 1000ms; // what a command needs that changes a file
+constexpr auto Interval = 2000ms; // between two looks at a file that somebody has
+
+CString HolderName(const FileLock& lock)
+{
+    const LockHolder holder = lock.HeldBy().value_or(LockHolder());
+    const auto text = [](const std::string& each) { return KsVisibleText(QString::fromStdString(each)); };
+    if (holder.user.empty() || !holder.process)
+        return CKsFileUse::tr("another program");
+    return CKsFileUse::tr("%1 on %2 (%3, process %4) since %5")
+        .arg(text(holder.user), text(holder.host), text(holder.program), QString::number(holder.process),
+             QDateTime::fromSecsSinceEpoch(holder.since).toString(QStringLiteral("yyyy-MM-dd HH:mm:ss")));
+}
+
+} // namespace
+
+CKsFileUse::CKsFileUse(QObject* parent) : QObject(parent)
+{
+    m_timer.setInterval(Interval);
+    connect(&m_timer, &QTimer::timeout, this, &CKsFileUse::Look);
+}
+
+/// Of the programs that hold a file for long, this is the one.
+FileLock CKsFileUse::Lock(const CString& path)
+{
+    FileLock lock = FileLock::Try(path.toStdString(), Program);
+    return lock.HeldBy() && lock.HeldBy()->program != Program ? FileLock::WaitFor(path.toStdString(), Program, ShortUse)
+                                                              : std::move(lock);
+}
+
+void CKsFileUse::Take(const CString& path)
+{
+    m_path = path;
+    m_lock = Lock(path);
+    m_isFree = false;
+    if (IsElsewhere())
+        m_timer.start();
+    else
+        m_timer.stop();
+    emit Changed();
+}
+
+/// It is let go at once: whoever wants to edit the file asks for it, and until then others may.
+void CKsFileUse::Look()
+{
+    const FileLock look = FileLock::Try(m_path.toStdString(), Program);
+    if (std::exchange(m_isFree, !look.HeldBy()) != m_isFree)
+        emit Changed();
+}
+
+CString CKsFileUse::Holder() const
+{
+    return HolderName(m_lock);
+}
+
+std::error_code CKsFileUse::WhyNone() const
+{
+    const std::error_code why = m_lock.WhyNone();
+    // Where the user may make no file he writes none either.
+    const bool cannotWrite = why == std::errc::permission_denied || why == std::errc::operation_not_permitted ||
+                             why == std::errc::read_only_file_system || why == std::errc::no_such_file_or_directory;
+    return cannotWrite ? std::error_code() : why;
+}
+
+bool CKsFileUse::TakeTarget(const CString& target)
+{
+    m_target = FileLock();
+    if (m_lock.IsFor(target.toStdString()))
+        return true;
+    m_target = Lock(target);
+    return !m_target.HeldBy();
+}
+
+CString CKsFileUse::TargetHolder() const
+{
+    return HolderName(m_target);
+}
+
+void CKsFileUse::TargetWritten(bool written)
+{
+    FileLock target = std::exchange(m_target, FileLock());
+    if (!written || (!target.IsHeld() && !target.WhyNone())) // the lock of the file itself stays
+        return;
+    m_lock = std::move(target);
+    m_isFree = false;
+    m_timer.stop();
+    emit Changed();
+}

@@ -1,0 +1,52 @@
+// Who may write a document's file while it is open.
+#pragma once
+
+#include "files/file_lock.h"
+#include "ks/fc/types.h"
+#include "ks/ks_export.h"
+
+#include <QObject>
+#include <QTimer>
+
+/// Holds the lock of a document's file from before it is read until the document is closed or saved elsewhere. While
+/// another program has it, this looks now and then whether it still does.
+class KS_API CKsFileUse : public QObject
+{
+    Q_OBJECT
+public:
+    explicit CKsFileUse(QObject* parent = nullptr);
+
+    /// A lock of this program. A command that changes the file and ends is waited for.
+    static FileLock Lock(const CString& path);
+
+    /// The document's file from now on.
+    void Take(const CString& path);
+
+    /// Somebody else has the file, or had it when it was taken.
+    bool IsElsewhere() const { return m_lock.HeldBy().has_value(); }
+    /// He has let go of it; it is not taken yet.
+    bool IsFree() const { return m_isFree; }
+    /// Who has it, or had it: "anna on server (kvrshell, process 4711) since 2026-03-05 14:07:00".
+    CString Holder() const;
+    /// Why nobody can be kept from writing a file that can be written; empty when that is no matter.
+    std::error_code WhyNone() const;
+
+    /// A save is about to write a file, which may be another one: false when somebody else has that.
+    bool TakeTarget(const CString& target);
+    /// Who has it then.
+    CString TargetHolder() const;
+    /// Whether it was written: then it is the document's file.
+    void TargetWritten(bool written);
+
+signals:
+    /// Whether somebody else has it is another matter now.
+    void Changed();
+
+private:
+    void Look();
+
+    CString m_path;
+    FileLock m_lock, m_target;
+    bool m_isFree = false;
+    QTimer m_timer;
+};
