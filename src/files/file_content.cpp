@@ -161,13 +161,9 @@ std::error_code FollowLinks(PlatformFile& platform, std::filesystem::path& path,
 
 FileStatus StatusBehind(const std::string& path)
 {
-    try {
-        std::filesystem::path target = PathFromUtf8(path);
-        FileStatus status;
-        return FollowLinks(PlatformFile::Native(), target, status) ? FileStatus() : status;
-    } catch (const std::bad_alloc&) {
-        return {};
-    }
+    std::filesystem::path target = PathFromUtf8(path);
+    FileStatus status;
+    return FollowLinks(PlatformFile::Native(), target, status) ? FileStatus() : status;
 }
 
 std::error_code IsSameFile(PlatformFile& platform, const std::filesystem::path& a, const std::filesystem::path& b,

@@ -29,8 +29,7 @@ std::error_code IsSameFile(PlatformFile& platform, const std::filesystem::path& 
                            bool& same);
 /// What a chain of symbolic links ends at, and its status, whether it exists or not.
 std::error_code FollowLinks(PlatformFile& platform, std::filesystem::path& path, FileStatus& status);
-/// The status of what a path (UTF-8) leads to; of kind None also where the system does not say, or
-/// memory ends: it is asked for after a save, which has succeeded then.
+/// The status of what a path (UTF-8) leads to; of kind None also where the system does not say.
 FileStatus StatusBehind(const std::string& path);
 /// The folder of a path, which may be relative.
 std::filesystem::path FolderOf(const std::filesystem::path& path);

@@ -3,6 +3,8 @@
 #include "base/utf8_path.h"
 #include "files/temporary_file.h"
 
+#include <new>
+
 namespace fs = std::filesystem;
 
 namespace {
@@ -32,7 +34,7 @@ private:
     Result<void> WriteInPlace(TemporaryFile& temporary, std::string_view text);
     std::error_code Overwrite(std::string_view text, bool& begun);
     Result<void> KeepTarget();
-    bool Rename();
+    bool Rename(const fs::path& from, const fs::path& to);
     Error Failed(std::error_code reason) const { return NotWritten(m_path, reason); }
     Error FailedKeeping(std::error_code reason, const fs::path& kept) const;
 
@@ -140,12 +142,16 @@ Result<void> SafeWriter::PutInPlace(TemporaryFile& temporary)
     for (int attempt = 0; attempt < 2; ++attempt) {
         if (exists && (error = temporary.Protect()))
             break;
+        std::string name = exists ? Utf8FromPath(temporary.Path()) : std::string();
+        m_report.displaced.swap(name); // should it have to stay there; behind the swap there may be no memory
         error =
             exists ? m_platform.Exchange(temporary.Path(), m_target) : m_platform.RenameNew(temporary.Path(), m_target);
         if (error != (exists ? std::errc::no_such_file_or_directory : std::errc::file_exists))
             break;
         exists = !exists; // it has come or gone meanwhile
     }
+    if (error || !exists)
+        m_report.displaced.clear();
     if (error == std::errc::function_not_supported)
         return Replace(temporary);
     if (error)
@@ -162,15 +168,17 @@ Result<void> SafeWriter::PutInPlace(TemporaryFile& temporary)
 void SafeWriter::KeepDisplaced(TemporaryFile& temporary)
 {
     if (IsExpected(temporary.Path())) {
+        m_report.displaced.clear();
         temporary.Unprotect(); // waiting for the disk takes long enough for the program to end meanwhile
         return;
     }
-    fs::path kept;
-    if (temporary.KeepAs(m_target, "displaced", kept)) {
-        kept = temporary.Path();
-        temporary.Release();
+    try {
+        fs::path kept;
+        if (!temporary.KeepAs(m_target, "displaced", kept))
+            m_report.displaced = Utf8FromPath(kept);
+    } catch (const std::bad_alloc&) { // the file is written, and what came out stays, be it under that name
     }
-    m_report.displaced = Utf8FromPath(kept);
+    temporary.Release();
 }
 
 Result<void> SafeWriter::KeepTarget()
@@ -244,12 +252,11 @@ std::error_code SafeWriter::Overwrite(std::string_view text, bool& begun)
     return error ? error : closed;
 }
 
-/// Gives the entry - a link itself - its new spelling. The content is safe already.
-bool SafeWriter::Rename()
+/// Gives the entry - a link itself - its new spelling, if any. The content is safe already.
+bool SafeWriter::Rename(const fs::path& from, const fs::path& to)
 {
-    if (m_options.renameTo.empty())
+    if (to.empty())
         return false;
-    const fs::path from = PathFromUtf8(m_path), to = PathFromUtf8(m_options.renameTo);
     m_report.notRenamed = m_replacesOther ? m_platform.Rename(from, to) : m_platform.RenameNew(from, to);
     return !m_report.notRenamed;
 }
@@ -276,18 +283,20 @@ Result<WriteReport> SafeWriter::Write(std::string_view text)
         return Failed(std::make_error_code(std::errc::operation_canceled));
     if (const std::error_code error = temporary.Finish(m_options.sync))
         return Failed(error);
+    // What is done behind this asks for no memory: the file is written, and that has to be said.
+    const fs::path entry = PathFromUtf8(m_path), spelling = PathFromUtf8(m_options.renameTo),
+                   entryFolder = FolderOf(entry);
     if (const Result<void> put = m_report.inPlace ? WriteInPlace(temporary, text) : PutInPlace(temporary); !put)
         return put.error();
     m_report.version = VersionOfText(text);
     // The new content is in place and whole. Should a folder not reach the medium before the power fails, the old
     // content is found whole instead: no failure, but not what a user takes "saved" for either.
-    const bool renamed = Rename();
-    const fs::path entryFolder = FolderOf(PathFromUtf8(m_path));
+    const bool renamed = Rename(entry, spelling);
     if (m_options.sync && !m_report.inPlace)
         m_report.unconfirmed = m_platform.SyncFolder(m_folder);
     if (m_options.sync && renamed && !m_report.unconfirmed && (m_report.inPlace || entryFolder != m_folder))
         m_report.unconfirmed = m_platform.SyncFolder(entryFolder);
-    return m_report;
+    return std::move(m_report);
 }
 
 } // namespace

@@ -1,6 +1,7 @@
 #include "files/temporary_file.h"
 
 #include <algorithm>
+#include <new>
 #include <random>
 
 namespace fs = std::filesystem;
@@ -110,7 +111,10 @@ std::error_code TemporaryFile::Protect()
 
 void TemporaryFile::Unprotect()
 {
-    EndNameWith(Suffix); // should that fail, it goes all the same unless the program ends before
+    try {
+        EndNameWith(Suffix);
+    } catch (const std::bad_alloc&) { // as where that fails, it goes all the same unless the program ends before
+    }
 }
 
 std::error_code TemporaryFile::KeepAs(const fs::path& path, std::string_view why, fs::path& kept)

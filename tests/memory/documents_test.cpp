@@ -71,8 +71,9 @@ protected:
     }
     QByteArray Content() const
     {
-        EXPECT_EQ(QDir(folder.path()).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot).size(), 1)
-            << "something was left behind";
+        QStringList names = QDir(folder.path()).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot);
+        names.removeIf([](const QString& name) { return name.endsWith(".lock"); }); // of the document that is open
+        EXPECT_EQ(names.size(), 1) << names.join(u' ').toStdString();
         QFile file(path);
         return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
     }
@@ -206,11 +207,7 @@ TEST_F(MemoryTest, ADocumentIsSavedOrStaysAsItIs)
                           EXPECT_TRUE(document->IsModified());
                           EXPECT_EQ(document->UndoStack().count(), steps);
                           EXPECT_EQ(document->ContentText().value(), content);
-                          // Memory may end when the file has changed places already, which the document does not know.
-                          const QByteArray now = Content();
-                          EXPECT_TRUE(now == before || now == saved[isOther]) << now.toStdString();
-                          if (now != std::exchange(before, now))
-                              open();
+                          EXPECT_EQ(Content(), before);
                       }
                   }),
                   60);

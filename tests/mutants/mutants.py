@@ -85,7 +85,7 @@ MUTANTS = [
     ('document', 'document/purged_lines.cpp', 'while (all.size() < lines.rows[i])',
      'while (all.size() + 1 < lines.rows[i])'),
     ('document', 'document/document.cpp', 'purged->PutBack(); // what is in memory stays as the user left it\n', ''),
-    ('document', 'ks/fc/project_doc.cpp', '    UndoStack().setClean();\n', ''),
+    ('document', 'ks/fc/project_doc.cpp', '    UndoStack().setClean();\n    SetPathName', '    SetPathName'),
     ('document', 'document/list_rows.cpp', 'row > 0 ? row - 1 : 0, std::move(block)', 'row, std::move(block)'),
     ('pages', 'pages/resistance_formula.cpp', 'Put(tools.MinRes, Inverse(largest));',
      'Put(tools.MinRes, Inverse(largest < smallest ? largest : smallest));'),

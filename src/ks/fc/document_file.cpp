@@ -241,7 +241,10 @@ Result<void> CKsDocumentFile::Save(const CString& target, const KsFileWriter& wr
     written.m_version = written.m_report.version;
     written.m_savedAs = target;
     written.m_path = written.m_report.notRenamed ? entry.value() : target;
-    written.m_seen = StatusBehind(written.m_path.toStdString());
+    try {
+        written.m_seen = StatusBehind(written.m_path.toStdString());
+    } catch (const std::bad_alloc&) { // then it looks like another file, and is read to see that it is not
+    }
     if (replaces.value()) {
         written.m_keptCopy = m_keptCopy;
         written.m_otherNames = m_otherNames;

@@ -236,6 +236,10 @@ Save?</source>
         <translation>%1 がほかのプログラムによって変更されました (%2)。ここで行った変更はまだ保存されていません。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示を保存し、今のファイルのコピーを隣に残します。</translation>
     </message>
     <message>
+        <source>%1 was changed by another program (%2). What is shown is the content before.</source>
+        <translation>%1 がほかのプログラムによって変更されました (%2)。表示されているのは変更前の内容です。</translation>
+    </message>
+    <message>
         <source>%1 was changed by another program (%2). What is shown is the content before. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite puts it back; the file as it is stays in a copy beside it.</source>
         <translation>%1 がほかのプログラムによって変更されました (%2)。表示されているのは変更前の内容です。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示をファイルに書き戻し、今のファイルのコピーを隣に残します。</translation>
     </message>
