@@ -55,10 +55,16 @@ private:
     Result<void> ParseField(const Field& field, void* object)
     {
         if (Result<void> read = Visit(field, object, [&](auto&& value) { return ParseValue(field.name, value); });
-            !read || field.kind != FieldKind::Number || field.bounds.Allow(field.In<double>(object)))
+            !read || field.kind != FieldKind::Number || IsAllowed(field, field.In<double>(object)))
             return read;
         return Error{std::string(field.name) + " should be " + BoundsWords(field.bounds) + ", found \"" +
                      m_texts[m_next - 1] + '"'};
+    }
+
+    static bool IsAllowed(const Field& field, double value)
+    {
+        const bool isKnown = !std::isnan(value) || field.mayBeUnknown || field.bounds == Bounds();
+        return isKnown && field.bounds.Allow(value);
     }
 
     Result<void> ParseValue(std::string_view name, double& value)

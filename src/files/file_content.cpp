@@ -101,9 +101,14 @@ FileVersion VersionOfText(std::string_view text)
     return {text.size(), hash.Finish(text.substr(whole), text.size())};
 }
 
-std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::path& path, FileVersion& version)
+std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::path& path, FileVersion& version,
+                              const std::optional<FileVersion>& expected)
 {
-    return WithContent(platform, path, [&](PlatformFile::Handle file, std::uint64_t) {
+    constexpr std::uint64_t largest = std::uint64_t(1) << 31; // the library of parameter files reads none
+    return WithContent(platform, path, [&](PlatformFile::Handle file, std::uint64_t size) {
+        version = {.size = size};
+        if (size > largest || (expected && size != expected->size))
+            return std::error_code();
         std::array<char, std::size_t(1) << 16> buffer; // a save looks at files when it can no longer do without an answer
         ContentHash hash;
         version = {};

@@ -8,6 +8,7 @@
 #include "base/result.h"
 #include "files/platform_file.h"
 
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -18,8 +19,10 @@ struct FileVersion
     bool operator==(const FileVersion&) const = default;
 };
 FileVersion VersionOfText(std::string_view text);
-/// Of a file, which is read for it.
-std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::path& path, FileVersion& version);
+/// Of a file, which is read for it. One that is larger than any of the product's, or of another size than `expected`,
+/// is another content without being read: then the hash is 0.
+std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::path& path, FileVersion& version,
+                              const std::optional<FileVersion>& expected = {});
 
 /// The content of a file, byte for byte.
 Result<std::string> ReadWholeFile(const std::string& path, PlatformFile* platform = nullptr);

@@ -170,23 +170,29 @@ bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformF
     if (m_whyNone)
         return true;
     const std::error_code locked = platform.Lock(file);
-    FileStatus opened, named;
-    if (!locked)
-        m_whyNone = platform.StatusOf(file, opened);
-    else if (locked == std::errc::resource_unavailable_try_again)
+    if (locked == std::errc::resource_unavailable_try_again) {
         m_heldBy = ReadHolder(platform, file);
-    else
-        m_whyNone = locked;
-    const bool isOurs = !platform.StatusOf(file, opened) && IsLockFile(platform, path, opened);
-    if (!locked && !m_whyNone)
-        m_whyNone = isOurs ? platform.Status(path, named) : std::make_error_code(std::errc::file_exists);
-    const bool isHeld = !locked && !m_whyNone && named.IsSameFile(opened);
-    if (!isHeld) {
+        platform.Close(file);
+        return true;
+    }
+    FileStatus opened, named;
+    std::error_code unknown = platform.StatusOf(file, opened);
+    if (!unknown)
+        unknown = platform.Status(path, named);
+    if (!locked && !unknown && !named.IsSameFile(opened)) { // who had it has removed it meanwhile
+        platform.Close(file);
+        return false;
+    }
+    const bool isOurs = !unknown && IsLockFile(platform, path, opened);
+    m_whyNone = locked ? locked : unknown;
+    if (!m_whyNone && !isOurs)
+        m_whyNone = std::make_error_code(std::errc::file_exists);
+    if (m_whyNone) {
         // Where there are no locks, a file made for one is of no use; one that holds a name may be another's.
-        if (m_whyNone && isOurs && (!locked || opened.size == 0))
+        if (isOurs && (!locked || opened.size == 0))
             platform.Remove(path);
         platform.Close(file);
-        return locked || m_whyNone;
+        return true;
     }
     m_platform = &platform;
     m_file = file;
@@ -255,6 +261,13 @@ bool FileLock::IsFor(const std::string& path) const
     bool isSame = false;
     return m_platform && !LockPath(*m_platform, beside, status) && !IsSameFile(*m_platform, beside, m_path, isSame) &&
            isSame;
+}
+
+void FileLock::ShareWithCopies()
+{
+    HeldFiles& held = TheHeldFiles();
+    const std::lock_guard guard(held.guard);
+    std::erase(held.files, std::pair(m_platform, m_file));
 }
 
 void FileLock::LeaveToOriginal()

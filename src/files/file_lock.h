@@ -40,7 +40,9 @@ public:
     /// Why the folder takes no lock.
     std::error_code WhyNone() const { return m_whyNone; }
     void Release();
-    /// In a copy of the process: what is held is the original's alone, and ends with it.
+    /// Copies of the process (process_copy.h) hold it, too, for as long as they work.
+    void ShareWithCopies();
+    /// In a copy of the process: what is not shared is the original's alone, and ends with it.
     static void LeaveToOriginal();
 
 private:

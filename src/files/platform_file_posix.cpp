@@ -97,6 +97,10 @@ public:
                            : purpose == Purpose::Change ? O_WRONLY
                                                         : O_RDWR | O_CREAT | O_NOFOLLOW);
         int fd = Retry([&] { return ::open(path.c_str(), flags, 0666); });
+        // Others have to read a lock to see whose it is, whatever the user keeps to himself otherwise.
+        struct stat is;
+        if (fd != -1 && purpose == Purpose::Lock && ::fstat(fd, &is) == 0 && is.st_size == 0 && is.st_uid == ::geteuid())
+            ::fchmod(fd, 0644);
         if (fd == -1 && errno == EACCES &&
             purpose == Purpose::Lock) // somebody else's, which can be locked all the same
             fd = Retry([&] { return ::open(path.c_str(), O_CLOEXEC | O_NONBLOCK | O_RDONLY | O_NOFOLLOW); });

@@ -84,7 +84,7 @@ Result<void> SafeWriter::AskBefore()
         return {};
     if (m_options.expected) {
         FileVersion found;
-        if (const std::error_code error = VersionOfFile(m_platform, m_target, found))
+        if (const std::error_code error = VersionOfFile(m_platform, m_target, found, m_options.expected))
             return Failed(error);
         m_isExpected = found == *m_options.expected;
         if (!m_isExpected && !m_options.ask)
@@ -123,7 +123,7 @@ bool SafeWriter::IsExpected(const fs::path& path, std::error_code& unknown) cons
     if (!m_options.expected || (m_isExpected && m_isSettled && status.IsUnchanged(m_seen)))
         return status.IsUnchanged(m_seen);
     FileVersion found;
-    unknown = VersionOfFile(m_platform, path, found);
+    unknown = VersionOfFile(m_platform, path, found, m_options.expected);
     return !unknown && found == *m_options.expected;
 }
 

@@ -73,17 +73,20 @@ struct KeptCopy
 /// Keeps a copy of a file beside it under such a name, never over an existing one.
 Result<KeptCopy> KeepOriginal(const std::string& path, std::string_view why, PlatformFile* platform = nullptr);
 
-/// The parts of the metadata, and what each is called in English.
+/// The parts of the metadata, and what each is called in English (translations in ks/language).
 struct LostPart
 {
     bool LostMetadata::*member;
     const char* name;
 };
-inline constexpr LostPart LostParts[] = {{&LostMetadata::owner, "owner"},
-                                         {&LostMetadata::group, "group"},
-                                         {&LostMetadata::mode, "mode"},
-                                         {&LostMetadata::accessList, "access list"},
-                                         {&LostMetadata::attributes, "extended attributes"}};
+#define TQL_TEXT(context, english) english
+inline constexpr LostPart LostParts[] = {
+    {&LostMetadata::owner, TQL_TEXT("CKsDocumentFile", "owner")},
+    {&LostMetadata::group, TQL_TEXT("CKsDocumentFile", "group")},
+    {&LostMetadata::mode, TQL_TEXT("CKsDocumentFile", "mode")},
+    {&LostMetadata::accessList, TQL_TEXT("CKsDocumentFile", "access list")},
+    {&LostMetadata::attributes, TQL_TEXT("CKsDocumentFile", "extended attributes")}};
+#undef TQL_TEXT
 /// What of the metadata was lost, in English words: "owner, access list".
 std::string LostText(const LostMetadata& lost);
 

@@ -32,9 +32,9 @@ QByteArray SocketName()
     return QDir::isAbsolutePath(folder) && name.size() < qsizetype(sizeof(sockaddr_un::sun_path)) ? name : QByteArray();
 }
 
-int NewSocket()
+int NewSocket(int flags = 0)
 {
-    return ::socket(AF_UNIX, SOCK_SEQPACKET | SOCK_CLOEXEC, 0); // a message comes whole
+    return ::socket(AF_UNIX, SOCK_SEQPACKET | SOCK_CLOEXEC | flags, 0); // a message comes whole
 }
 
 /// connect or bind.
@@ -44,6 +44,17 @@ bool AtName(int (*call)(int, const sockaddr*, socklen_t), int socket, const QByt
     address.sun_family = AF_UNIX;
     std::memcpy(address.sun_path, name.constData(), std::size_t(name.size()));
     return call(socket, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
+}
+
+/// One that nobody listens at: a program that has died leaves it. Other things of that name are left alone.
+bool IsLeftOver(const QByteArray& name)
+{
+    struct stat status;
+    const int socket = NewSocket(SOCK_NONBLOCK); // a program that hangs has many who wait to be taken
+    const bool isLeft = ::lstat(name.constData(), &status) == 0 && S_ISSOCK(status.st_mode) &&
+                        !AtName(&::connect, socket, name) && errno == ECONNREFUSED;
+    ::close(socket);
+    return isLeft;
 }
 
 bool IsOwnUser(int connection)
@@ -96,13 +107,9 @@ CHandover::CHandover(Taker take) : m_take(std::move(take))
         return;
     const mode_t mask = ::umask(0177);
     bool isBound = AtName(&::bind, m_socket, name);
-    if (!isBound && errno == EADDRINUSE) {
-        const int other = NewSocket();
-        if (!AtName(&::connect, other, name) && errno == ECONNREFUSED) { // one that has died leaves its socket
-            ::unlink(name.constData());
-            isBound = AtName(&::bind, m_socket, name);
-        }
-        ::close(other);
+    if (!isBound && errno == EADDRINUSE && IsLeftOver(name)) {
+        ::unlink(name.constData());
+        isBound = AtName(&::bind, m_socket, name);
     }
     ::umask(mask);
     if (!isBound || ::listen(m_socket, MostConnections) != 0) {

@@ -175,6 +175,7 @@ void CRecoveryDialog::Open()
         return;
     if (m_recovery.Open(m_items[std::size_t(row)]))
         Remove(row);
+    activateWindow(); // the window of the document has come to the front, and gets no keys while this is open
 }
 
 void CRecoveryDialog::Compare()

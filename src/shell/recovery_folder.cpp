@@ -53,8 +53,10 @@ void RemoveTemporaries(const QString& folder)
 
 FileLock LockOf(const QString& folder)
 {
-    return FileLock::Try((folder + QStringLiteral("/session")).toStdString(),
-                         QCoreApplication::applicationName().toStdString());
+    FileLock lock = FileLock::Try((folder + QStringLiteral("/session")).toStdString(),
+                                  QCoreApplication::applicationName().toStdString());
+    lock.ShareWithCopies(); // they write here when the program has ended already
+    return lock;
 }
 
 /// Whether the process that took a lock has ended, so that a copy of it is all that still holds it.

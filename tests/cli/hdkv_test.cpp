@@ -110,6 +110,7 @@ TEST_F(Hdkv, ExitCodesAndMessages)
         {"set a.hdkv ResisZone 1 2", 2, "", "ZoneResistance2 is missing"},
         {"set a.hdkv G_f 1e400", 2, "", "should be a number"},
         {"set a.hdkv delta 0.4999", 2, "", "delta should be 0.5 to 1, found \"0.4999\""},
+        {"set a.hdkv delta nan", 2, "", "delta should be 0.5 to 1"},
         {"set a.hdkv zeta_min -- -1", 2, "", "zeta_min should be at least 0, found \"-1\""},
         {"set a.hdkv MarkTitles 2 A", 2, "", "does not fit the 1 values behind it"},
         {"set a.hdkv LimitedPeriodStart 2024 2 30 0 0 0", 2, "", "found 2024-02-30 00:00:00"},

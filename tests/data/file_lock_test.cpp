@@ -5,6 +5,7 @@
 #include "files/platform_process.h"
 #include "files/process_copy.h"
 
+#include <atomic>
 #include <ctime>
 #include <thread>
 
@@ -114,14 +115,17 @@ TEST_F(Locks, AFolderThatTakesNoneSaysWhy)
 TEST_F(Locks, OnlyOneHoldsItHoweverTheyComeAndGo)
 {
     int holders = 0, most = 0, times = 0; // only ever touched under the lock
+    std::atomic<int> without = 0;
     {
         std::vector<std::jthread> threads;
         for (int i = 0; i < 4; ++i)
             threads.emplace_back([&] {
                 for (int round = 0; round < 100;) {
                     const FileLock lock = FileLock::Try(Path("a.hdkv"), "thread");
-                    if (!lock.IsHeld())
+                    if (!lock.IsHeld()) {
+                        without += !lock.HeldBy();
                         continue;
+                    }
                     most = std::max(most, ++holders);
                     ++times;
                     ++round;
@@ -129,6 +133,7 @@ TEST_F(Locks, OnlyOneHoldsItHoweverTheyComeAndGo)
                 }
             });
     }
+    EXPECT_EQ(without, 0) << "a lock that is gone is no reason to go on without";
     EXPECT_EQ(most, 1);
     EXPECT_EQ(times, 400);
 }

@@ -120,6 +120,7 @@ TEST(FileLock, IsHeldUntilTheLastCopyOfADeadProcessHasEnded)
         static std::optional<FileLock> lock;
         static std::optional<ProcessCopy> copy;
         lock = take();
+        lock->ShareWithCopies();
         copy = std::move(ProcessCopy::Start([&] {
                              Comes([&] { return Exists(go); });
                              return std::error_code();

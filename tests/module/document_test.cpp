@@ -208,6 +208,37 @@ TEST_F(DocumentTest, WhatAnotherProgramHasWrittenIsAskedAboutAndKept)
     EXPECT_TRUE(document.OnSaveDocument(Path("river.HDKV")));
     EXPECT_EQ(boxes.size(), 2);
     EXPECT_EQ(document.File().SaveNotes(), "");
+
+    // Who has been told may go on, that once.
+    document.SetPathName(Path("river.HDKV"));
+    Write(Path("river.HDKV"), "theirs again");
+    EXPECT_TRUE(document.SaveOverOthers());
+    EXPECT_EQ(Read(Path("river.HDKV.displaced-2")), "theirs again");
+    EXPECT_EQ(boxes.size(), 2);
+    Write(Path("river.HDKV"), "theirs once more");
+    answer = QMessageBox::No;
+    EXPECT_FALSE(document.OnSaveDocument(Path("river.HDKV")));
+    EXPECT_EQ(boxes.size(), 3);
+}
+
+// The default values that stand there for a file that cannot be read are nothing that undo could bring back.
+TEST_F(DocumentTest, AFileThatWasMendedIsReadAndNotUndone)
+{
+    Write(Path("river.HDKV"), "[KAVO0_HD]\n[broken");
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+    document.SetPathName(Path("river.HDKV"));
+    ASSERT_TRUE(document.IsReadOnly());
+    CString why;
+    EXPECT_FALSE(document.Reload(why));
+    EXPECT_FALSE(why.isEmpty());
+    Write(Path("river.HDKV"), SmallFile);
+    ASSERT_TRUE(document.Reload(why));
+    EXPECT_FALSE(document.IsReadOnly() || document.IsModified() || document.UndoStack().canUndo());
+    EXPECT_EQ(document.Parameters().InitList.GetCount(), 3u);
+    Write(Path("river.HDKV"), "[KAVO0_HD]\n[/KAVO0_HD]\n");
+    ASSERT_TRUE(document.Reload(why));
+    document.UndoStack().undo();
+    EXPECT_EQ(document.Parameters().InitList.GetCount(), 3u);
 }
 
 #ifndef _WIN32

@@ -378,10 +378,8 @@ TEST_F(ViewTest, AFileThatSomebodyElseHasIsLookedAtUntilHeLetsGo)
     EXPECT_FALSE(document.IsModified());
     EXPECT_EQ(boxes, QStringList()) << "the status bar says why";
     EXPECT_TRUE(frame.statusBar()->currentMessage().contains("is not changed here"));
-    answer = QMessageBox::No;
     EXPECT_FALSE(document.DoSave(Path("river.hdkv")));
-    ASSERT_EQ(boxes.size(), 1);
-    EXPECT_TRUE(boxes[0].contains("river.HDKV was left as it is: it is in use by")) << qPrintable(boxes[0]);
+    EXPECT_EQ(boxes, QStringList()) << "there is nothing to lose";
     EXPECT_EQ(Read(Path("river.hdkv")), SmallFile);
 
     other.Release();

@@ -11,8 +11,10 @@ void CDocumentCommand::Run(bool forward)
 {
     if (!m_repeated && !IsAllowed()) {
         setObsolete(true); // no step comes of it; who made it shows the document as it is
-        QTimer::singleShot(0, &m_document,
-                           [document = &m_document] { document->UpdateAllViews(nullptr, CKsDoc::ReloadHint); });
+        QTimer::singleShot(0, &m_document, [document = &m_document] {
+            document->UpdateAllViews(nullptr, CKsDoc::ReloadHint);
+            document->MayChange(); // it says why not; the views have said where they are
+        });
         return;
     }
     const ChangePlace place = forward ? Apply() : Revert();

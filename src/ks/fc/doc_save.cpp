@@ -61,6 +61,8 @@ BOOL CKsDoc::DoSave(const CString& path, const CString& proposal)
 {
     if (!MayLeave())
         return false;
+    if (!path.isEmpty() && path == m_path && IsInUse() && !m_modified)
+        return MayChange(); // there is nothing to lose, and so nothing to ask
     CString target = path;
     do {
         if (target.isEmpty())

@@ -38,15 +38,10 @@ CString Sentence(const Error& error)
 
 CString LostWords(const LostMetadata& lost)
 {
-    const std::pair<bool, CString> words[] = {{lost.owner, CKsDocumentFile::tr("owner")},
-                                              {lost.group, CKsDocumentFile::tr("group")},
-                                              {lost.mode, CKsDocumentFile::tr("mode")},
-                                              {lost.accessList, CKsDocumentFile::tr("access list")},
-                                              {lost.attributes, CKsDocumentFile::tr("extended attributes")}};
     QStringList text;
-    for (const auto& [isLost, word] : words)
-        if (isLost)
-            text << word;
+    for (const LostPart& part : LostParts)
+        if (lost.*part.member)
+            text << CKsDocumentFile::tr(part.name);
     return text.join(CKsDocumentFile::tr(", "));
 }
 
@@ -287,7 +282,12 @@ CString CKsDocumentFile::NotesOn(const CString& path, const WriteReport& report)
         notes << tr("%1 is saved, but the disk has not confirmed it: %2. Should the power fail soon, the file may be "
                     "found as it was before.")
                      .arg(NameOf(path), KsSystemReason(report.unconfirmed));
-    if (!report.displaced.empty())
+    if (!report.displaced.empty() && report.unknown)
+        notes << tr("What %1 held just before is kept in %2: whether another program had written to it could not be "
+                    "seen (%3).")
+                     .arg(NameOf(path), NameOf(QString::fromStdString(report.displaced)),
+                          KsSystemReason(report.unknown));
+    else if (!report.displaced.empty())
         notes << tr("What another program had written to %1 is kept in %2.")
                      .arg(NameOf(path), NameOf(QString::fromStdString(report.displaced)));
     if (report.lost.Any())

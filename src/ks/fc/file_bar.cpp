@@ -5,9 +5,11 @@
 #include "ks/fc/project_doc.h"
 
 #include <QEvent>
+#include <QGridLayout>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
+#include <QResizeEvent>
 #include <QToolButton>
 #include <QVBoxLayout>
 #include <algorithm>
@@ -44,10 +46,14 @@ CKsFileBar::Row CKsFileBar::MakeRow(std::size_t number)
         if (const auto close = m_notices.at(number).close) // a copy: it ends the notice
             close();
     });
-    auto* layout = new QHBoxLayout(row.widget);
-    layout->addWidget(row.text, 1);
-    layout->addWidget(row.close);
-    this->layout()->addWidget(row.widget);
+    row.actions = new QWidget(row.widget);
+    auto* buttons = new QHBoxLayout(row.actions);
+    buttons->setContentsMargins(0, 0, 0, 0);
+    auto* cells = new QGridLayout(row.widget);
+    cells->setColumnStretch(0, 1);
+    cells->addWidget(row.text, 0, 0);
+    cells->addWidget(row.close, 0, 2, Qt::AlignTop);
+    layout()->addWidget(row.widget);
     return row;
 }
 
@@ -63,9 +69,9 @@ void CKsFileBar::Show(Row& row, std::size_t number)
     row.text->setText(notice.text);
     row.text->setAccessibleName(notice.text);
     while (row.buttons.size() < notice.actions.size()) {
-        auto* button = new QPushButton(row.widget);
+        auto* button = new QPushButton(row.actions);
         connect(button, &QPushButton::clicked, this, [this, number, i = row.buttons.size()] { Run(number, i); });
-        static_cast<QHBoxLayout*>(row.widget->layout())->insertWidget(int(row.buttons.size()) + 1, button);
+        row.actions->layout()->addWidget(button);
         row.buttons.push_back(button);
         QWidget::setTabOrder(button, row.close);
     }
@@ -74,6 +80,14 @@ void CKsFileBar::Show(Row& row, std::size_t number)
             row.buttons[i]->setText(notice.actions[i].label);
         row.buttons[i]->setVisible(i < notice.actions.size());
     }
+    // One stands beside the text; several, whose text is long, below it.
+    auto* cells = static_cast<QGridLayout*>(row.widget->layout());
+    cells->removeWidget(row.actions);
+    if (notice.actions.size() > 1)
+        cells->addWidget(row.actions, 1, 0, Qt::AlignLeft);
+    else
+        cells->addWidget(row.actions, 0, 1);
+    row.actions->setVisible(!notice.actions.empty());
     row.close->setToolTip(tr("Close this bar"));
     row.close->setAccessibleName(tr("Close this bar"));
     row.close->setVisible(notice.close != nullptr);
@@ -90,6 +104,7 @@ void CKsFileBar::Refresh()
         m_rows[i].widget->setVisible(i < m_notices.size());
     }
     setVisible(!m_notices.empty());
+    KeepHeight();
     if (m_document.File().Findings().empty() && m_dialog)
         m_dialog->close();
 }
@@ -102,6 +117,20 @@ void CKsFileBar::ShowList()
         m_dialog = new CKsFindingsDialog(m_document.File().Path(), m_document.File().Findings(), this);
     m_dialog->show();
     m_dialog->raise();
+}
+
+/// The view gives way, and no line of a text is cut off.
+void CKsFileBar::KeepHeight()
+{
+    layout()->activate();
+    setMinimumHeight(std::max(layout()->totalHeightForWidth(width()), 0));
+}
+
+void CKsFileBar::resizeEvent(QResizeEvent* event)
+{
+    QFrame::resizeEvent(event);
+    if (event->size().width() != event->oldSize().width())
+        KeepHeight();
 }
 
 void CKsFileBar::changeEvent(QEvent* event)

@@ -27,6 +27,7 @@ public:
 
 protected:
     void changeEvent(QEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
 
 private:
     /// The widgets that show one notice, children of the bar; they stay for what is shown there next.
@@ -34,11 +35,13 @@ private:
     {
         QWidget* widget = nullptr;
         QLabel* text = nullptr;
+        QWidget* actions = nullptr; // holds the buttons
         std::vector<QPushButton*> buttons{};
         QToolButton* close = nullptr;
     };
 
     void Refresh();
+    void KeepHeight();
     Row MakeRow(std::size_t number);
     void Show(Row& row, std::size_t number);
     void Run(std::size_t number, std::size_t action);

@@ -6,6 +6,16 @@
 #include "ks/fc/project_doc.h"
 #include "ks/fc/system_reason.h"
 
+/// Of a folder, in which the lock would stand.
+static CString WhyNoLock(std::error_code why)
+{
+    const bool hasNone = why == std::errc::operation_not_supported || why == std::errc::function_not_supported ||
+                         why == std::errc::no_lock_available;
+    return hasNone                         ? CKsFileBar::tr("its file system has no locks")
+           : why == std::errc::file_exists ? CKsFileBar::tr("another file has the name of the lock")
+                                           : KsSystemReason(why);
+}
+
 void CKsProjectDoc::AddNoticeSource(KsNoticeSource source)
 {
     m_noticeSources.push_back(std::move(source));
@@ -40,7 +50,7 @@ void CKsProjectDoc::UseNotice(std::vector<KsFileNotice>& notices)
         notices.push_back(
             {CKsFileBar::tr("Other programs cannot be told that %1 is in use here: %2. Nobody else should "
                             "change it now.")
-                 .arg(name, KsSystemReason(m_use.WhyNone())),
+                 .arg(name, WhyNoLock(m_use.WhyNone())),
              {},
              [this] {
                  m_isUseClosed = true;

@@ -1,8 +1,10 @@
 #include "ks/fc/file_use.h"
 
 #include "ks/fc/shown_text.h"
+#include "ks/language/date_time.h"
 
 #include <QDateTime>
+#include <QDeadlineTimer>
 #include <utility>
 
 namespace {
@@ -11,6 +13,7 @@ using namespace std::chrono_literals;
 
 constexpr char Program[] = "kvrshell";
 constexpr auto ShortUse = 1000ms; // what a command needs that changes a file
+constexpr auto Rest = 10s;
 constexpr auto Interval = 2000ms; // between two looks at a file that somebody has
 
 CString HolderName(const FileLock& lock)
@@ -21,7 +24,7 @@ CString HolderName(const FileLock& lock)
         return CKsFileUse::tr("another program");
     return CKsFileUse::tr("%1 on %2 (%3, process %4) since %5")
         .arg(text(holder.user), text(holder.host), text(holder.program), QString::number(holder.process),
-             QDateTime::fromSecsSinceEpoch(holder.since).toString(QStringLiteral("yyyy-MM-dd HH:mm:ss")));
+             KsDateTimeText(QDateTime::fromSecsSinceEpoch(holder.since)));
 }
 
 } // namespace
@@ -35,9 +38,14 @@ CKsFileUse::CKsFileUse(QObject* parent) : QObject(parent)
 /// Of the programs that hold a file for long, this is the one.
 FileLock CKsFileUse::Lock(const CString& path)
 {
+    static QDeadlineTimer rest; // after a wait in vain: who opens many files waits once
     FileLock lock = FileLock::Try(path.toStdString(), Program);
-    return lock.HeldBy() && lock.HeldBy()->program != Program ? FileLock::WaitFor(path.toStdString(), Program, ShortUse)
-                                                              : std::move(lock);
+    if (!lock.HeldBy() || lock.HeldBy()->program == Program || !rest.hasExpired())
+        return lock;
+    lock = FileLock::WaitFor(path.toStdString(), Program, ShortUse);
+    if (lock.HeldBy())
+        rest.setRemainingTime(Rest);
+    return lock;
 }
 
 void CKsFileUse::Take(const CString& path)
@@ -55,8 +63,11 @@ void CKsFileUse::Take(const CString& path)
 /// It is let go at once: whoever wants to edit the file asks for it, and until then others may.
 void CKsFileUse::Look()
 {
-    const FileLock look = FileLock::Try(m_path.toStdString(), Program);
-    if (std::exchange(m_isFree, !look.HeldBy()) != m_isFree)
+    FileLock look = FileLock::Try(m_path.toStdString(), Program);
+    const bool isFree = !look.HeldBy(), isOther = !isFree && HolderName(look) != Holder();
+    if (isOther)
+        m_lock = std::move(look);
+    if (std::exchange(m_isFree, isFree) != isFree || isOther)
         emit Changed();
 }
 

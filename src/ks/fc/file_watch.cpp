@@ -56,7 +56,7 @@ struct CKsFileWatch::Look
 
 /// In the reader's thread.
 CKsFileWatch::Look CKsFileWatch::LookAt(const std::string& path, const FileStatus& seen, const FileVersion& version,
-                                        bool isTrusted)
+                                        bool isTrusted, const std::optional<FileVersion>& known)
 {
     PlatformFile& platform = PlatformFile::Native();
     Look look;
@@ -75,7 +75,9 @@ CKsFileWatch::Look CKsFileWatch::LookAt(const std::string& path, const FileStatu
         look.version = version;
         return look;
     }
-    look.why = VersionOfFile(platform, target, look.version);
+    look.why = VersionOfFile(platform, target, look.version, known);
+    if (look.version.hash == 0) // it was not read, and may be another one of this size next time
+        look.version.hash = std::uint64_t(look.status.touched);
     FileStatus after;
     const bool isThere = !FollowLinks(platform, target, after);
     look.isMoving = !isThere || !IsUntouched(look.status, after);
@@ -129,8 +131,8 @@ void CKsFileWatch::Start()
     // files.
     CWatchedFiles& files = CWatchedFiles::Instance();
     const auto look = [&files, watch = QPointer(this), path = m_path.toStdString(), seen = m_seen, version = m_version,
-                       isTrusted = m_isTrusted, generation = m_generation] {
-        const Look found = LookAt(path, seen, version, isTrusted);
+                       isTrusted = m_isTrusted, known = m_known, generation = m_generation] {
+        const Look found = LookAt(path, seen, version, isTrusted, known);
         QMetaObject::invokeMethod(
             &files,
             [watch, found, generation] {

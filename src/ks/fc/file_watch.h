@@ -50,7 +50,7 @@ signals:
 private:
     struct Look;
     friend class CWatchedFiles;
-    static Look LookAt(const std::string& path, const FileStatus& seen, const FileVersion& version, bool isTrusted);
+    static Look LookAt(const std::string& path, const FileStatus& seen, const FileVersion& version, bool isTrusted, const std::optional<FileVersion>& known);
     void Start();
     void Looked(const Look& look, int generation);
     void Take(KsFileSight sight);

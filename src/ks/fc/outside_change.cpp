@@ -7,6 +7,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/project_doc.h"
 #include "ks/fc/system_reason.h"
+#include "ks/language/date_time.h"
 
 #include <QApplication>
 #include <QDateTime>
@@ -16,12 +17,9 @@
 
 namespace {
 
-/// "14:07:12", and with its date what did not happen today.
 CString TimeText(std::int64_t nanoseconds)
 {
-    const QDateTime time = QDateTime::fromMSecsSinceEpoch(nanoseconds / 1'000'000);
-    return time.date() == QDate::currentDate() ? time.toString(QStringLiteral("HH:mm:ss"))
-                                               : time.toString(QStringLiteral("yyyy-MM-dd HH:mm:ss"));
+    return KsDateTimeText(QDateTime::fromMSecsSinceEpoch(nanoseconds / 1'000'000));
 }
 
 /// The first of NAME-2, -3, ... that is free.

@@ -35,9 +35,13 @@ bool CKsProjectDoc::Reload(CString& why)
     why = file.WhyNothing();
     if (!step || !why.isEmpty())
         return false;
+    // What stood there for a file that could not be read was nobody's content.
+    const bool undoes = !m_file.IsUnreadable() || IsModified();
     m_file = std::move(file);
     m_showsDefaults = false;
     UndoStack().push(step.release());
+    if (!undoes)
+        UndoStack().clear();
     UndoStack().setClean();
     SetModifiedFlag(false);
     FileIsKnown();

@@ -19,6 +19,11 @@ CWatchedFiles& CWatchedFiles::Instance()
 CWatchedFiles::CWatchedFiles(QObject* parent) : QObject(parent)
 {
     m_reader.setMaxThreadCount(1);
+    // A folder that is moved away and made anew, links on the way, other machines: of these the system tells nothing. A
+    // look costs next to nothing where the file is as it was.
+    m_timer.setInterval(2000);
+    connect(&m_timer, &QTimer::timeout, this, &CWatchedFiles::LookAtAll);
+    m_timer.start();
     connect(&m_watcher, &QFileSystemWatcher::fileChanged, this, &CWatchedFiles::Touched);
     connect(&m_watcher, &QFileSystemWatcher::directoryChanged, this, &CWatchedFiles::Touched);
     connect(qGuiApp, &QGuiApplication::applicationStateChanged, this, [this](Qt::ApplicationState state) {

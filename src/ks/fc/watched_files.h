@@ -5,6 +5,7 @@
 #include <QHash>
 #include <QSet>
 #include <QThreadPool>
+#include <QTimer>
 
 class CKsFileWatch;
 
@@ -26,6 +27,7 @@ private:
     void LookAtAll();
 
     QFileSystemWatcher m_watcher;
+    QTimer m_timer;
     QThreadPool m_reader;
     QSet<CKsFileWatch*> m_watches;
     QHash<QString, int> m_counts; // of the watches of a path

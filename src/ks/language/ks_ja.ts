@@ -71,6 +71,10 @@
 <context>
     <name>CKsDocumentFile</name>
     <message>
+        <source>What %1 held just before is kept in %2: whether another program had written to it could not be seen (%3).</source>
+        <translation>%1 の直前の内容は %2 に残されています。ほかのプログラムが書き込んだかどうかは確認できませんでした (%3)。</translation>
+    </message>
+    <message>
         <source>Could not read &quot;%1&quot;: %2.</source>
         <translation>「%1」を読み込めませんでした: %2。</translation>
     </message>
@@ -171,6 +175,14 @@ Save?</source>
 </context>
 <context>
     <name>CKsFileBar</name>
+    <message>
+        <source>its file system has no locks</source>
+        <translation>ファイル システムにロックの機能がありません</translation>
+    </message>
+    <message>
+        <source>another file has the name of the lock</source>
+        <translation>ロックと同じ名前の別のファイルがあります</translation>
+    </message>
     <message>
         <source>%1 could not be read. What is shown here are default values, not its content.
 %2</source>

@@ -338,6 +338,10 @@ The editors read %2.</source>
 <context>
     <name>CMainFrame</name>
     <message>
+        <source>Not opened, as what is being typed here is no value: %1</source>
+        <translation>入力中の内容が値として正しくないため、開きませんでした: %1</translation>
+    </message>
+    <message>
         <source>The changes to %1 cannot be kept for the case of a crash: %2.</source>
         <translation>%1 の変更を異常終了に備えて保持できません: %2。</translation>
     </message>
