@@ -22,7 +22,7 @@ CWatchedFiles::CWatchedFiles(QObject* parent) : QObject(parent)
     // A folder that is moved away and made anew, links on the way, other machines: of these the system tells nothing. A
     // look costs next to nothing where the file is as it was.
     m_timer.setInterval(2000);
-    connect(&m_timer, &QTimer::timeout, this, &CWatchedFiles::LookAtAll);
+    connect(&m_timer, &QTimer::timeout, this, &CWatchedFiles::LookSoon);
     m_timer.start();
     connect(&m_watcher, &QFileSystemWatcher::fileChanged, this, &CWatchedFiles::Touched);
     connect(&m_watcher, &QFileSystemWatcher::directoryChanged, this, &CWatchedFiles::Touched);
@@ -82,6 +82,11 @@ void CWatchedFiles::LookAtAll()
     if (m_counts.isEmpty())
         return;
     m_watcher.addPaths(m_counts.keys()); // those that are not watched
+    LookSoon();
+}
+
+void CWatchedFiles::LookSoon()
+{
     for (CKsFileWatch* watch : std::as_const(m_watches))
         watch->LookSoon();
 }

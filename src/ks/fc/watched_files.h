@@ -25,6 +25,7 @@ private:
     void Touched(const QString& path);
     void WatchAgain();
     void LookAtAll();
+    void LookSoon();
 
     QFileSystemWatcher m_watcher;
     QTimer m_timer;
