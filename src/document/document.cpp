@@ -1,11 +1,11 @@
 #include "document/document.h"
 
 #include "data/hd_file.h"
+#include "document/purged_lines.h"
 #include "files/extensions.h"
+#include "grid/row_source.h"
 #include "ks/fc/doc_command.h"
 #include "ks/fc/message_box.h"
-#include "document/purged_lines.h"
-#include "grid/row_source.h"
 #include "res/strings.h"
 
 #include <QDir>
@@ -122,7 +122,8 @@ std::size_t CKavo0_hdDoc::UnwrittenSetups() const
     return unwritten;
 }
 
-/// Writes the whole content but for what is purged, which stays out; on failure the user has been told and the file is what it was.
+/// Writes the whole content but for what is purged, which stays out; on failure the user has been told and the file is
+/// what it was.
 bool CKavo0_hdDoc::WriteData(const CString& path, CPurgedLines& purged)
 {
     FirstRows defaults;

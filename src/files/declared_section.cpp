@@ -176,7 +176,8 @@ void WriteKeywords(tqlHandle structure, const DeclaredSection& in, const Declare
             WriteKeyword(structure, declared.name, group.Elements(), group[i], group.ExtraOf(i));
         return;
     }
-    if (declared.presence == Presence::WhenSet && IsEmptyText(fields.front(), object) && !HoldsPlace(in, declared, object))
+    if (declared.presence == Presence::WhenSet && IsEmptyText(fields.front(), object) &&
+        !HoldsPlace(in, declared, object))
         return;
     const auto& all = in.kept.constOf(object).keywords;
     const auto found = all.find(&declared);

@@ -74,8 +74,8 @@ bool Read(ParamCursor& params, const Field& field, const void* object, double& v
 {
     const tqlHandle at = params.param;
     double read = 0;
-    if (params.Take(&read) &&
-        (!params.onlyFinite || std::isfinite(read) || (field.mayBeUnknown && std::isnan(read)))) [[likely]]
+    if (params.Take(&read) && (!params.onlyFinite || std::isfinite(read) || (field.mayBeUnknown && std::isnan(read))))
+        [[likely]]
         value = read;
     else
         ReportType(params, at, field, object, false); // every number is read as one
@@ -130,8 +130,8 @@ bool Read(ParamCursor& params, const Field& field, const void* object, HDDateTim
     return true;
 }
 
-/// An empty group is followed by one element with default values, which is not kept: others are reported. `count` is the
-/// parameter that the cursor has just passed.
+/// An empty group is followed by one element with default values, which is not kept: others are reported. `count` is
+/// the parameter that the cursor has just passed.
 void ReadPadding(ParamCursor& params, tqlHandle count, const Field& field, const void* object, GroupValue<void> group)
 {
     const int number = params.number - 1, behind = params.Left();

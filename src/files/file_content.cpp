@@ -109,7 +109,8 @@ std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::pat
         version = {.size = size};
         if (size > largest || (expected && size != expected->size))
             return std::error_code();
-        std::array<char, std::size_t(1) << 16> buffer; // a save looks at files when it can no longer do without an answer
+        std::array<char, std::size_t(1) << 16>
+            buffer; // a save looks at files when it can no longer do without an answer
         ContentHash hash;
         version = {};
         for (std::size_t got = buffer.size(); got == buffer.size(); version.size += got) {

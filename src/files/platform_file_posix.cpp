@@ -99,7 +99,8 @@ public:
         int fd = Retry([&] { return ::open(path.c_str(), flags, 0666); });
         // Others have to read a lock to see whose it is, whatever the user keeps to himself otherwise.
         struct stat is;
-        if (fd != -1 && purpose == Purpose::Lock && ::fstat(fd, &is) == 0 && is.st_size == 0 && is.st_uid == ::geteuid())
+        if (fd != -1 && purpose == Purpose::Lock && ::fstat(fd, &is) == 0 && is.st_size == 0 &&
+            is.st_uid == ::geteuid())
             ::fchmod(fd, 0644);
         if (fd == -1 && errno == EACCES &&
             purpose == Purpose::Lock) // somebody else's, which can be locked all the same

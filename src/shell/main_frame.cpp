@@ -168,8 +168,8 @@ bool CMainFrame::TakeFiles(const QStringList& files, const QString& token)
         activateWindow();
         qunsetenv("XDG_ACTIVATION_TOKEN");
         if (!MayLeave())
-            return TellStatus(tr("Not opened, as what is being typed here is no value: %1")
-                                  .arg(KsShownFileName(files.front())));
+            return TellStatus(
+                tr("Not opened, as what is being typed here is no value: %1").arg(KsShownFileName(files.front())));
         for (const QString& file : files)
             OpenFile(file, true);
     });

@@ -129,7 +129,8 @@ CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
     return read;
 }
 
-Result<WriteReport> SaveCrossSections(const CCrossSections& sections, const std::string& path, const SafeFileOptions& options)
+Result<WriteReport> SaveCrossSections(const CCrossSections& sections, const std::string& path,
+                                      const SafeFileOptions& options)
 {
     return SaveDeclaredFile(path, file, &sections, options);
 }

@@ -81,8 +81,7 @@ KsFileNotice CKsOutsideChange::OtherContent()
 {
     KsFileNotice notice;
     const bool isReadOnly = m_document.IsReadOnly();
-    notice.text = (isReadOnly
-                       ? tr("%1 was changed by another program (%2). What is shown is the content before.")
+    notice.text = (isReadOnly ? tr("%1 was changed by another program (%2). What is shown is the content before.")
                    : m_document.IsModified()
                        ? tr("%1 was changed by another program (%2), and the changes made here are not saved. Reload "
                             "takes the file; undo brings back what is shown. Keep Both saves what is shown under "
