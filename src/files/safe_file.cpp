@@ -27,7 +27,6 @@ private:
     WriteAnswer Ask(WriteQuestion::Kind kind) const;
     std::error_code Fill(TemporaryFile& temporary, std::string_view text);
     bool IsExpected(const fs::path& path);
-    bool IsExpected(const fs::path& path, std::error_code& unknown) const;
     Result<void> PutInPlace(TemporaryFile& temporary);
     void KeepDisplaced(TemporaryFile& temporary);
     Result<void> Replace(TemporaryFile& temporary);
@@ -113,10 +112,12 @@ std::error_code SafeWriter::Fill(TemporaryFile& temporary, std::string_view text
 }
 
 /// Whether a file is what the save was meant to replace. Where the content is known, it is read again unless the time
-/// of the last change is far enough back that another one would show in it. What the system does not answer is no.
-bool SafeWriter::IsExpected(const fs::path& path, std::error_code& unknown) const
+/// of the last change is far enough back that another one would show in it. What the system does not answer is no, and
+/// the report says why.
+bool SafeWriter::IsExpected(const fs::path& path)
 {
     FileStatus status;
+    std::error_code& unknown = m_report.unknown;
     unknown = m_platform.Status(path, status);
     if (unknown || m_seen.kind == Kind::None || status.kind != Kind::File)
         return false;
@@ -125,12 +126,6 @@ bool SafeWriter::IsExpected(const fs::path& path, std::error_code& unknown) cons
     FileVersion found;
     unknown = VersionOfFile(m_platform, path, found, m_options.expected);
     return !unknown && found == *m_options.expected;
-}
-
-/// The same, and the report says should it not be known.
-bool SafeWriter::IsExpected(const fs::path& path)
-{
-    return IsExpected(path, m_report.unknown);
 }
 
 /// Puts the finished temporary file in the place of the target. Whether somebody wrote to the target in the last moment
