@@ -3,9 +3,9 @@
 #include "base/not_given.h"
 #include "grid/date_time_text.h"
 #include "grid/grid_texts.h"
-#include "files/read_number.h"
 #include "grid/typing.h"
 #include "ks/fc/branch_name.h"
+#include "ks/units/typed_number.h"
 
 #include <cmath>
 
@@ -17,6 +17,11 @@ bool IsEmpty(const ColumnSpec& column, const CellValue& value)
         return true;
     const auto* number = std::get_if<double>(&value);
     return number && column.emptyIsNotGiven && *number == NotGiven;
+}
+
+CellReading Refused(const QString& complaint, const QString& otherwise)
+{
+    return {{}, complaint.isEmpty() ? otherwise : complaint};
 }
 
 } // namespace
@@ -97,14 +102,14 @@ CellReading ReadCell(const ColumnSpec& column, const QString& text)
         return {{}, GridTexts::tr("One of these is required: %1").arg(column.choices.entries().join(", "))};
     }
     if (column.Kind() == CellKind::Integer) {
-        const auto integer = ReadInteger(text.toStdString());
-        return integer ? CellReading{*integer, {}} : CellReading{{}, GridTexts::tr("Please enter an integer.")};
+        const auto integer = KsReadTypedInteger(text);
+        return integer.value ? CellReading{*integer.value, {}}
+                             : Refused(integer.complaint, GridTexts::tr("Please enter an integer."));
     }
-    const auto number = ReadNumber(text.toStdString());
-    if (!number)
-        return {{}, GridTexts::tr("Floating point number required")};
-    const double value = column.style.UnitConvertFromBase(*number, 0);
-    if (!column.bounds.Allow(value))
+    const auto number = KsReadTyped(text, column.style, column.UnitSymbol());
+    if (!number.value)
+        return Refused(number.complaint, GridTexts::tr("Floating point number required"));
+    if (!column.bounds.Allow(*number.value))
         return {{}, OutOfRange()};
-    return {value, {}};
+    return {*number.value, {}};
 }

@@ -19,8 +19,11 @@ TEST_F(KsTest, AnIntegerFieldTakesIntegersOfItsRangeAndNothingElse)
     EXPECT_FALSE(edit.CheckedValue());
     EXPECT_EQ(asked.takeLast(), "Enter an integer from 1 to 10.");
     EXPECT_EQ(edit.selectedText(), "11") << "ready to be typed over";
-    edit.SetValue(10);
+    edit.setText("=20/2");
     EXPECT_EQ(edit.CheckedValue(), 10);
+    edit.setText("=20/3");
+    EXPECT_FALSE(edit.CheckedValue());
+    EXPECT_EQ(asked.takeLast(), "The result of \"20/3\" is no integer.");
 }
 
 TEST_F(KsTest, DDXMovesANumberBetweenFieldAndVariable)
@@ -36,10 +39,13 @@ TEST_F(KsTest, DDXMovesANumberBetweenFieldAndVariable)
     EXPECT_EQ(value, -25);
     edit.clear();
     EXPECT_TRUE(DDX_KSedit(true, edit, value, style)) << "an empty field changes nothing";
-    for (const char* text : {"1,5", "1,500", "abc", "1e999", "nan", "1 2"}) {
+    for (const char* text : {"1,5", "1,500", "abc", "1e999", "nan", "1 2", "=1,5", "3 kg"}) {
         edit.setText(text);
         EXPECT_FALSE(DDX_KSedit(true, edit, value, style)) << text;
     }
-    EXPECT_EQ(asked.size(), 6);
+    EXPECT_EQ(asked.size(), 8);
     EXPECT_EQ(value, -25);
+    edit.setText("1.2 km");
+    EXPECT_TRUE(DDX_KSedit(true, edit, value, style));
+    EXPECT_EQ(value, 1200);
 }

@@ -62,7 +62,54 @@
     </message>
 </context>
 <context>
+    <name>CKsFormula</name>
+    <message>
+        <source>&quot;%1&quot; is no name or function known here.</source>
+        <translation>「%1」はここで使える名前または関数ではありません。</translation>
+    </message>
+    <message>
+        <source>The brackets of &quot;%1&quot; do not match.</source>
+        <translation>「%1」の括弧が対応していません。</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; has too many or too few values in its brackets.</source>
+        <translation>「%1」の括弧内の値の数が正しくありません。</translation>
+    </message>
+    <message>
+        <source>The formula ends where a number is expected.</source>
+        <translation>数値が必要な位置で式が終わっています。</translation>
+    </message>
+    <message>
+        <source>The formula cannot be read at character %1.</source>
+        <translation>式の %1 文字目を解釈できません。</translation>
+    </message>
+    <message>
+        <source>The formula is longer than %1 characters.</source>
+        <translation>式が %1 文字を超えています。</translation>
+    </message>
+    <message>
+        <source>The formula has a comma outside of brackets; the decimal separator is the point.</source>
+        <translation>式の括弧の外にコンマがあります。小数点にはピリオドを使ってください。</translation>
+    </message>
+</context>
+<context>
     <name>CKsEditStyle</name>
+    <message>
+        <source>The result of &quot;%1&quot; is no number.</source>
+        <translation>「%1」の結果は数値になりません。</translation>
+    </message>
+    <message>
+        <source>The result of &quot;%1&quot; is no integer.</source>
+        <translation>「%1」の結果は整数になりません。</translation>
+    </message>
+    <message>
+        <source>This number has no unit; &quot;%1&quot; cannot stand here.</source>
+        <translation>この数値には単位がありません。「%1」は入力できません。</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no unit of this quantity. Possible are %2.</source>
+        <translation>「%1」はこの量の単位ではありません。使える単位: %2。</translation>
+    </message>
     <message>
         <source>Unit: %1</source>
         <translation>単位: %1</translation>

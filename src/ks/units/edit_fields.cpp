@@ -2,6 +2,7 @@
 
 #include "files/read_number.h"
 #include "ks/fc/message_box.h"
+#include "ks/units/typed_number.h"
 
 namespace {
 
@@ -26,15 +27,17 @@ void CKsEditLong::SetValue(std::int32_t value)
 
 std::optional<std::int32_t> CKsEditLong::Value() const
 {
-    return Complaint().isEmpty() ? ReadInteger(text().toStdString()) : std::nullopt;
+    return Complaint().isEmpty() ? KsReadTypedInteger(text()).value : std::nullopt;
 }
 
 CString CKsEditLong::Complaint() const
 {
-    const auto value = ReadInteger(text().toStdString());
-    return !value                     ? tr("Enter an integer.")
-           : m_range.Contains(*value) ? CString()
-                                      : tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high);
+    const auto typed = KsReadTypedInteger(text());
+    if (!typed.value)
+        return typed.complaint.isEmpty() ? tr("Enter an integer.") : typed.complaint;
+    return m_range.Contains(*typed.value)
+               ? CString()
+               : tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high);
 }
 
 std::optional<std::int32_t> CKsEditLong::CheckedValue()
@@ -54,11 +57,11 @@ bool DDX_KSedit(bool save, QLineEdit& edit, double& value, const CKsEditStyle& s
     }
     if (edit.text().isEmpty())
         return true;
-    const auto number = ReadNumber(edit.text().toStdString());
-    if (!number) {
-        Refuse(edit, CKsEditLong::tr("Enter a number."));
+    const auto typed = KsReadTyped(edit.text(), style);
+    if (!typed.value) {
+        Refuse(edit, typed.complaint.isEmpty() ? CKsEditLong::tr("Enter a number.") : typed.complaint);
         return false;
     }
-    value = *number;
+    value = ReadNumber(edit.text().toStdString()).value_or(style.UnitConvertFromBase(*typed.value, 1));
     return true;
 }

@@ -47,6 +47,7 @@ public:
 
     /// `unit` -1 takes the display unit of the user's unit system, 0 the base unit itself.
     void SetEumUnitBaseGroup(UnitGroup group, int unit = -1);
+    UnitGroup Group() const { return m_group; }
     /// A printf format for one double ("%-lf", "%.6lg", "%-.3E"). The C locale plays no part.
     void SetFormat(const CString& format) { m_format = format; }
     const CString& GetFormat() const { return m_format; }

@@ -1,9 +1,14 @@
 #include "ks/units/unit_groups.h"
 
 #include <QDebug>
+#include <QRegularExpression>
 #include <algorithm>
 #include <array>
+#include <cmath>
+#include <cstdio>
+#include <cstdlib>
 #include <functional>
+#include <limits>
 #include <memory>
 #include <udunits2.h>
 
@@ -20,25 +25,30 @@ constexpr KsUnit Degree{"degree", "°"};
 constexpr KsUnit Number{"1", ""};       // a ratio
 constexpr KsUnit AsStored{nullptr, ""}; // the file format leaves the unit open, so nothing may be converted
 
+// What a user may type besides these two, as far as it is worth saying.
+constexpr auto Lengths = "mm, cm, km, in, yd, mi", Areas = "ha, km2, acre", Volumes = "l, acre_foot",
+               Discharges = "l/s, m3/h, m3/d, cfs, gpm, mgd", Velocities = "cm/s, km/h, mph, knot",
+               Viscosities = "mm2/s", PerLength = "1/cm", Ratios = "%, ‰", Angles = "rad";
+
 constexpr std::array Groups{
-    KsUnitGroupRow{UnitGroup::WaterLevel, "water level or depth", Metre, Foot},
-    KsUnitGroupRow{UnitGroup::Discharge, "discharge", CubicMetrePerSecond, CubicFootPerSecond},
-    KsUnitGroupRow{UnitGroup::Velocity, "velocity", MetrePerSecond, FootPerSecond},
-    KsUnitGroupRow{UnitGroup::Volume, "volume", CubicMetre, CubicFoot},
-    KsUnitGroupRow{UnitGroup::Slope, "slope", Number, Number},
-    KsUnitGroupRow{UnitGroup::Area, "area", SquareMetre, SquareFoot},
-    KsUnitGroupRow{UnitGroup::Radius, "radius", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::WaterLevel, "water level or depth", Metre, Foot, Lengths},
+    KsUnitGroupRow{UnitGroup::Discharge, "discharge", CubicMetrePerSecond, CubicFootPerSecond, Discharges},
+    KsUnitGroupRow{UnitGroup::Velocity, "velocity", MetrePerSecond, FootPerSecond, Velocities},
+    KsUnitGroupRow{UnitGroup::Volume, "volume", CubicMetre, CubicFoot, Volumes},
+    KsUnitGroupRow{UnitGroup::Slope, "slope", Number, Number, Ratios},
+    KsUnitGroupRow{UnitGroup::Area, "area", SquareMetre, SquareFoot, Areas},
+    KsUnitGroupRow{UnitGroup::Radius, "radius", Metre, Foot, Lengths},
     KsUnitGroupRow{UnitGroup::FloodPlainResistance, "flood plain resistance", AsStored, AsStored},
-    KsUnitGroupRow{UnitGroup::Viscosity, "kinematic viscosity", SquareMetrePerSecond, SquareFootPerSecond},
-    KsUnitGroupRow{UnitGroup::Chainage, "chainage", Metre, Foot},
-    KsUnitGroupRow{UnitGroup::Factor, "factor", Number, Number},
-    KsUnitGroupRow{UnitGroup::Width, "width", Metre, Foot},
-    KsUnitGroupRow{UnitGroup::GeoAngle, "latitude or longitude", Degree, Degree},
-    KsUnitGroupRow{UnitGroup::Coordinate, "map coordinate", Metre, Foot},
-    KsUnitGroupRow{UnitGroup::Rotation, "rotation", Degree, Degree},
-    KsUnitGroupRow{UnitGroup::GridSize, "grid size", Metre, Foot},
+    KsUnitGroupRow{UnitGroup::Viscosity, "kinematic viscosity", SquareMetrePerSecond, SquareFootPerSecond, Viscosities},
+    KsUnitGroupRow{UnitGroup::Chainage, "chainage", Metre, Foot, Lengths},
+    KsUnitGroupRow{UnitGroup::Factor, "factor", Number, Number, Ratios},
+    KsUnitGroupRow{UnitGroup::Width, "width", Metre, Foot, Lengths},
+    KsUnitGroupRow{UnitGroup::GeoAngle, "latitude or longitude", Degree, Degree, Angles},
+    KsUnitGroupRow{UnitGroup::Coordinate, "map coordinate", Metre, Foot, Lengths},
+    KsUnitGroupRow{UnitGroup::Rotation, "rotation", Degree, Degree, Angles},
+    KsUnitGroupRow{UnitGroup::GridSize, "grid size", Metre, Foot, Lengths},
     KsUnitGroupRow{UnitGroup::TimeDisplacement, "time displacement", AsStored, AsStored},
-    KsUnitGroupRow{UnitGroup::LightAttenuation, "light attenuation", PerMetre, PerFoot},
+    KsUnitGroupRow{UnitGroup::LightAttenuation, "light attenuation", PerMetre, PerFoot, PerLength},
     KsUnitGroupRow{UnitGroup::LeakageCoefficient, "leakage coefficient", AsStored, AsStored},
 };
 
@@ -53,20 +63,42 @@ bool IsSame(const KsUnit& base, const KsUnit& display)
 
 using UnitPtr = std::unique_ptr<ut_unit, decltype(&ut_free)>;
 
-double FactorToBase(ut_system* system, const KsUnitGroupRow& row)
+/// Read at the first need: that takes time which whoever types plain metric numbers need not spend. Null when the
+/// definitions cannot be read.
+ut_system* Definitions()
+{
+    static const std::unique_ptr<ut_system, decltype(&ut_free_system)> system = [] {
+        ut_set_error_message_handler(ut_ignore);
+        return std::unique_ptr<ut_system, decltype(&ut_free_system)>(ut_read_xml(nullptr), ut_free_system);
+    }();
+    return system.get();
+}
+
+UnitPtr Parse(const char* spelling)
+{
+    return {Definitions() ? ut_parse(Definitions(), spelling, UT_UTF8) : nullptr, ut_free};
+}
+
+/// Nothing where there is no conversion, and where it is more than a factor: the definitions also convert a metre into
+/// a 1/metre, by dividing.
+std::optional<double> FactorBetween(const UnitPtr& from, const UnitPtr& to)
+{
+    cv_converter* converter = from && to ? ut_get_converter(from.get(), to.get()) : nullptr;
+    if (!converter)
+        return std::nullopt;
+    const double factor = cv_convert_double(converter, 1), twice = cv_convert_double(converter, 2);
+    cv_free(converter);
+    return std::fabs(twice - 2 * factor) <= 1e-12 * std::fabs(twice) ? std::optional(factor) : std::nullopt;
+}
+
+double FactorToBase(const KsUnitGroupRow& row)
 {
     if (IsSame(row.base, row.usCustomary))
         return 1;
-    const UnitPtr from(ut_parse(system, row.usCustomary.spelling, UT_ASCII), ut_free);
-    const UnitPtr to(ut_parse(system, row.base.spelling, UT_ASCII), ut_free);
-    cv_converter* converter = from && to ? ut_get_converter(from.get(), to.get()) : nullptr;
-    if (!converter) {
+    const auto factor = FactorBetween(Parse(row.usCustomary.spelling), Parse(row.base.spelling));
+    if (!factor)
         qDebug("units: no conversion of %s from %s to %s", row.quantity, row.usCustomary.spelling, row.base.spelling);
-        return 1;
-    }
-    const double factor = cv_convert_double(converter, 1);
-    cv_free(converter);
-    return factor;
+    return factor.value_or(1);
 }
 
 /// Of the US customary units, row by row.
@@ -74,14 +106,49 @@ std::array<double, Groups.size()> Factors()
 {
     std::array<double, Groups.size()> factors;
     factors.fill(1);
-    ut_set_error_message_handler(ut_ignore);
-    ut_system* system = ut_read_xml(nullptr);
-    if (system)
-        std::ranges::transform(Groups, factors.begin(), [system](auto& row) { return FactorToBase(system, row); });
+    if (Definitions())
+        std::ranges::transform(Groups, factors.begin(), FactorToBase);
     else
         qDebug("units: the unit definitions could not be read; values are shown as stored");
-    ut_free_system(system);
     return factors;
+}
+
+/// What water people write and the definitions do not know, or know as something else.
+constexpr std::pair<const char*, const char*> Spellings[] = {
+    {"cfs", "ft3/s"},       {"cms", "m3/s"}, {"gpm", "gallon/min"}, {"mgd", "1e6 gallon/day"},
+    {"mph", "mi/h"},        {"fps", "ft/s"}, {"kph", "km/h"},       {"ac-ft", "acre_foot"},
+    {"\xE2\x80\xB0", "0.001"}, // per mille
+};
+
+/// Units multiplied and divided, without numbers and blanks between them: the definitions would take "12 5" for 60 and
+/// "12 m 3 cm" for an area.
+bool IsUnitText(const CString& text)
+{
+    static const QRegularExpression form(
+        QStringLiteral("^(1?/)?U([/*·]U)*$")
+            .replace(u'U', QStringLiteral("[\\p{L}%‰°µ_][\\p{L}_]*(-ft|\\^?-?[1-9]|⁻?[¹²³])?")));
+    return form.match(text).hasMatch();
+}
+
+UnitPtr Parsed(CString unit)
+{
+    for (const auto& [written, spelling] : Spellings)
+        if (unit == QLatin1String(written) || unit == CString::fromUtf8(written))
+            unit = CString::fromUtf8(spelling);
+    if (unit.startsWith(u'/'))
+        unit.prepend(u'1');
+    return Parse(unit.toUtf8().constData());
+}
+
+/// The definitions multiply out of powers of ten, which leaves something in the last places: 0.0010000000000000002
+/// for a litre. The factors themselves are decimal numbers.
+long double AsDecimal(double factor)
+{
+    char text[32];
+    std::snprintf(text, sizeof text, "%.14Lg", static_cast<long double>(factor));
+    const long double decimal = std::strtold(text, nullptr);
+    constexpr double LastPlaces = 4 * std::numeric_limits<double>::epsilon();
+    return std::fabs(double(decimal) - factor) <= LastPlaces * factor ? decimal : factor;
 }
 
 } // namespace
@@ -99,4 +166,29 @@ double KsUnitFactor(UnitGroup group, KsUnitSystem system)
         return 1;
     static const auto factors = Factors(); // reading the unit definitions takes time that metric users need not spend
     return factors[std::size_t(row - Groups.data())];
+}
+
+std::optional<long double> KsTypedUnitFactor(UnitGroup group, const CString& unit)
+{
+    const KsUnitGroupRow* row = KsFindUnitGroup(group);
+    if (!row || !row->base.spelling || !IsUnitText(unit))
+        return std::nullopt;
+    for (const KsUnit& own : {row->base, row->usCustomary})
+        if (unit == CString::fromUtf8(own.symbol))
+            return AsDecimal(own.spelling == row->base.spelling ? 1 : FactorToBase(*row));
+    // An angle is a ratio to the definitions, but a slope of 5 degrees is none of 0.087.
+    const bool isRatio = row->base.spelling == Number.spelling;
+    if (isRatio && unit != u'%' && unit != u'‰')
+        return std::nullopt;
+    const UnitPtr base = Parse(row->base.spelling);
+    auto factor = FactorBetween(Parsed(unit), base);
+    if (!factor)
+        factor = FactorBetween(Parsed(unit.toLower()), base);
+    return factor && *factor > 0 ? std::optional(AsDecimal(*factor)) : std::nullopt;
+}
+
+bool KsIsUnit(const CString& unit)
+{
+    // "12e" is a number that somebody has not finished, rather than twelve electrons.
+    return unit.toLower() != u'e' && IsUnitText(unit) && (Parsed(unit) || Parsed(unit.toLower()));
 }

@@ -65,10 +65,9 @@ void CCtrlEdit::UpdateToolTip()
     setToolTip(NumberToolTip(m_style, *m_value, m_shown, UnitSymbol()));
 }
 
-std::optional<double> CCtrlEdit::Typed() const
+KsTyped<double> CCtrlEdit::Typed() const
 {
-    const auto number = ReadNumber(text().toStdString());
-    return number ? std::optional(m_style.UnitConvertFromBase(*number, 0)) : std::nullopt;
+    return KsReadTyped(text(), m_style, UnitSymbol());
 }
 
 /// An empty text is none: the value stays.
@@ -76,15 +75,17 @@ QString CCtrlEdit::Complaint() const
 {
     if (!m_value || text().isEmpty())
         return {};
-    if (!IsValidNumber(text().toStdString()))
-        return LoadString(Str::InvalidNumber);
-    const auto value = Typed();
-    return value && m_bounds.Allow(*value) ? QString() : OutOfRange();
+    const auto typed = Typed();
+    if (typed.value)
+        return m_bounds.Allow(*typed.value) ? QString() : OutOfRange();
+    if (!typed.complaint.isEmpty())
+        return typed.complaint;
+    return IsValidNumber(text().toStdString()) ? OutOfRange() : LoadString(Str::InvalidNumber); // too large for one
 }
 
 void CCtrlEdit::Store()
 {
-    const auto value = m_value && !text().isEmpty() ? Typed() : std::nullopt;
+    const auto value = m_value && !text().isEmpty() ? Typed().value : std::nullopt;
     if (value && *value != *m_value)
         m_store(*value);
     ShowValue();

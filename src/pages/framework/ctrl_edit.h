@@ -3,11 +3,10 @@
 
 #include "files/field.h"
 #include "grid/typing.h"
-#include "ks/units/edit_style.h"
+#include "ks/units/typed_number.h"
 
 #include <QLineEdit>
 #include <functional>
-#include <optional>
 
 class CCtrlEdit : public QLineEdit
 {
@@ -37,7 +36,7 @@ private:
     void ShowValue();
     void UpdateToolTip();
     void Store();
-    std::optional<double> Typed() const; // in base units; nothing for a text that is no number
+    KsTyped<double> Typed() const; // in base units
     QString Complaint() const;
 
     CKsEditStyle m_style;

@@ -1,0 +1,113 @@
+#include "ks/units/typed_number.h"
+
+#include "files/read_number.h"
+#include "ks/units/formula.h"
+#include "ks/units/unit_groups.h"
+
+#include <QCoreApplication>
+#include <QStringList>
+#include <cmath>
+#include <limits>
+
+namespace {
+
+CString Text(const char* text)
+{
+    return QCoreApplication::translate("CKsEditStyle", text);
+}
+
+/// How long the number is that the text begins with; 0 for none.
+qsizetype NumberLength(const CString& text)
+{
+    qsizetype length = 0;
+    while (length < text.size() && QStringView(u"0123456789.eE+-").contains(text[length]))
+        ++length;
+    while (length > 0 && !IsValidNumber(text.first(length).toStdString()))
+        --length; // "12e" may be an amount of e
+    return length;
+}
+
+KsTyped<double> ReadFormula(const CString& text)
+{
+    const CKsFormula formula(text);
+    if (!formula.Fault().isEmpty())
+        return {{}, formula.Fault()};
+    const double value = formula.Value();
+    if (!std::isfinite(value))
+        return {{}, Text(QT_TRANSLATE_NOOP("CKsEditStyle", "The result of \"%1\" is no number.")).arg(text)};
+    return {value};
+}
+
+/// What may be typed instead, for the message.
+CString PossibleUnits(const CKsEditStyle& style, const CString& symbol)
+{
+    QStringList units;
+    const auto add = [&units](const CString& unit) {
+        if (!unit.isEmpty() && !units.contains(unit))
+            units << unit;
+    };
+    add(symbol);
+    if (const KsUnitGroupRow* row = KsFindUnitGroup(style.Group())) {
+        add(CString::fromUtf8(row->base.symbol));
+        add(CString::fromUtf8(row->usCustomary.symbol));
+        for (const CString& unit : CString::fromUtf8(row->alsoTyped).split(QStringLiteral(", "), Qt::SkipEmptyParts))
+            add(unit);
+    }
+    return units.join(QStringLiteral(", "));
+}
+
+KsTyped<double> ReadAmount(double number, const CString& unit, const CKsEditStyle& style, const CString& symbol)
+{
+    if (!symbol.isEmpty() && unit == symbol)
+        return {style.UnitConvertFromBase(number, 0)}; // as without it, to the last bit
+    if (const auto factor = KsTypedUnitFactor(style.Group(), unit)) {
+        const double value = double(number * *factor);
+        return std::isfinite(value) ? KsTyped<double>{value} : KsTyped<double>{};
+    }
+    if (!KsIsUnit(unit))
+        return {};
+    const CString possible = PossibleUnits(style, symbol);
+    return {{}, possible.isEmpty()
+                    ? Text(QT_TRANSLATE_NOOP("CKsEditStyle", "This number has no unit; \"%1\" cannot stand here.")).arg(unit)
+                    : Text(QT_TRANSLATE_NOOP("CKsEditStyle", "\"%1\" is no unit of this quantity. Possible are %2."))
+                          .arg(unit, possible)};
+}
+
+} // namespace
+
+KsTyped<double> KsReadTyped(const CString& text, const CKsEditStyle& style)
+{
+    return KsReadTyped(text, style, style.UnitSymbol());
+}
+
+KsTyped<double> KsReadTyped(const CString& text, const CKsEditStyle& style, const CString& symbol)
+{
+    const std::string plain = text.toStdString();
+    if (const auto number = ReadNumber(plain))
+        return {style.UnitConvertFromBase(*number, 0)};
+    if (IsValidNumber(plain)) // too large for a number
+        return {};
+    if (text.startsWith(u'=')) {
+        KsTyped<double> result = ReadFormula(text.sliced(1));
+        if (result.value)
+            result.value = style.UnitConvertFromBase(*result.value, 0);
+        return result;
+    }
+    const qsizetype length = NumberLength(text);
+    const auto number = ReadNumber(plain.substr(0, std::size_t(length))); // its characters are bytes
+    return number ? ReadAmount(*number, text.sliced(length).trimmed(), style, symbol) : KsTyped<double>();
+}
+
+KsTyped<std::int32_t> KsReadTypedInteger(const CString& text)
+{
+    if (!text.startsWith(u'='))
+        return {ReadInteger(text.toStdString())};
+    const KsTyped<double> result = ReadFormula(text.sliced(1));
+    using Limits = std::numeric_limits<std::int32_t>;
+    if (!result.value)
+        return {{}, result.complaint};
+    if (*result.value != std::floor(*result.value) || *result.value < Limits::min() || *result.value > Limits::max())
+        return {{}, Text(QT_TRANSLATE_NOOP("CKsEditStyle", "The result of \"%1\" is no integer."))
+                        .arg(text.sliced(1))};
+    return {std::int32_t(*result.value)};
+}

@@ -1,0 +1,23 @@
+// What a user may type for a number: the number; an amount with its unit ("12 ft"); or, behind "=", a formula.
+#pragma once
+
+#include "ks/units/edit_style.h"
+
+#include <cstdint>
+#include <optional>
+
+template <typename Value>
+struct KsTyped
+{
+    std::optional<Value> value = {};
+    /// Why an amount or a formula is none, for the user. Empty also where the text is no number, unit or formula at all:
+    /// whoever asks has words of its own for that.
+    CString complaint = {};
+};
+
+/// The number in base units. `symbol` is the unit that numbers without one are in, and which may always be typed; the
+/// style's own where it is not given.
+KS_API KsTyped<double> KsReadTyped(const CString& text, const CKsEditStyle& style);
+KS_API KsTyped<double> KsReadTyped(const CString& text, const CKsEditStyle& style, const CString& symbol);
+/// An integer or a formula whose result is one.
+KS_API KsTyped<std::int32_t> KsReadTypedInteger(const CString& text);
