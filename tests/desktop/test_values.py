@@ -49,3 +49,27 @@ class Levels(Case):
         editor.put(1, 2, '100')
         editor.save()
         self.assertEqual(self.saved().records('InitList'), ['"INN", 100, 5, 12'])
+
+
+class TypedUnits(Case):
+    """An amount is converted where it is typed; another quantity is refused, and the box says what is possible."""
+    TEXT = samples.hd_text({'InitList': ['"MOORBECK", 1500, 1, 10']})
+
+    def test_amounts_and_formulas_in_cells_and_fields(self):
+        editor = self.open(self.TEXT)
+        editor.fill('Water Level', '12 ft')
+        editor.put(1, 2, '1.2 km', speed=10)
+        editor.put(1, 3, '=10+5', speed=10)
+        editor.put(1, 4, '350 l/s', speed=10)
+        editor.put(1, 4, '3 kg')
+        box = editor.box_texts()
+        self.assertIn('"kg" is no unit of this quantity', box[0])
+        self.assertIn('cfs', box[0])
+        editor.answer()
+        editor.press('Escape')
+        editor.menu('View', 'Units', 'US Customary')
+        editor.fill('Water Level', '10')
+        editor.put(1, 3, '2 m')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), ['"MOORBECK", 1200, 2, 0.35'])
+        self.assertEqual(self.saved().value('G_waterlevel'), '3.048')
