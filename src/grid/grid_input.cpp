@@ -1,5 +1,6 @@
 #include "grid/grid_input.h"
 
+#include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_clipboard.h"
 #include "grid/grid_host.h"
@@ -47,6 +48,13 @@ void CGridInput::Run(GridAction action)
         return CopyCells(m_grid);
     case GridAction::Paste:
         PasteCells(m_grid);
+        return;
+    case GridAction::FillDown:
+    case GridAction::FillSeries:
+    case GridAction::Interpolate:
+    case GridAction::Calculate:
+        if (CanRunOnCells(m_grid, action))
+            RunOnCells(m_grid, action);
         return;
     case GridAction::SelectLine:
         return m_grid.SelectLines(m_grid.CurrentRow(), m_grid.CurrentRow());
@@ -106,6 +114,9 @@ void CGridInput::ShowMenu(const QPoint& at)
     menu.addSeparator();
     add(GridAction::Copy, CanCopyCells(m_grid));
     add(GridAction::Paste, changes && CanPasteCells(m_grid));
+    menu.addSeparator();
+    for (const GridAction action : CellActions)
+        add(action, CanRunOnCells(m_grid, action));
     if (m_grid.Host() && m_grid.Host()->CanSearch(m_grid)) {
         menu.addSeparator();
         add(GridAction::Search, true);

@@ -19,6 +19,10 @@ enum class GridAction
     Paste,
     SearchAgain,
     Search,
+    FillDown,
+    FillSeries,
+    Interpolate,
+    Calculate,
     Undo,
     Redo
 };

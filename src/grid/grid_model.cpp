@@ -9,20 +9,7 @@
 #include <QScopedValueRollback>
 #include <QUndoStack>
 #include <algorithm>
-#include <bit>
 #include <utility>
-
-namespace {
-
-/// Equal to the last bit; numbers that are none are equal to themselves.
-bool Same(const CellValue& a, const CellValue& b)
-{
-    const auto* x = std::get_if<double>(&a);
-    const auto* y = std::get_if<double>(&b);
-    return x && y ? std::bit_cast<std::uint64_t>(*x) == std::bit_cast<std::uint64_t>(*y) : a == b;
-}
-
-} // namespace
 
 // ---- what views see ----------------------------------------------------------------------------
 
@@ -205,7 +192,7 @@ bool CGridModel::StoreOffered(const Overlay& typed, BlankRule rule)
     for (auto cell = first; cell != typed.end(); ++cell) {
         const CellAccess& access = *Column(cell->first.second).access;
         const CellValue value = Resolved(cell->first.second, cell->second.value, rule);
-        if (Same(access.get(row), value))
+        if (SameCell(access.get(row), value))
             continue;
         access.set(row, value);
         changed = true;
@@ -219,7 +206,7 @@ bool CGridModel::StoreOffered(const Overlay& typed, BlankRule rule)
 
 bool CGridModel::StoreRows(const Overlay& typed, BlankRule rule)
 {
-    std::vector<CellChange> changes;
+    CCellChanges changes;
     std::size_t place = 0;
     for (const auto& [cell, what] : typed) {
         const auto& [row, column] = cell;
@@ -227,13 +214,13 @@ bool CGridModel::StoreRows(const Overlay& typed, BlankRule rule)
             continue;
         const auto& access = Column(column).access;
         CellValue before = access->get(m_rows->Object(row)), after = Resolved(column, what.value, rule);
-        if (Same(before, after))
+        if (SameCell(before, after))
             continue;
-        if (changes.empty())
+        if (changes.IsEmpty())
             place = what.row;
-        changes.push_back({row, column + 1, access, std::move(before), std::move(after)});
+        changes.Add(row, column + 1, access, std::move(before), std::move(after));
     }
-    if (changes.empty())
+    if (changes.IsEmpty())
         return false;
     Change(GridTexts::tr("Change of cells"), int(place),
            [&] { SetCells(*m_document, m_rows, std::move(changes), place); });
@@ -247,7 +234,7 @@ void CGridModel::Paste(int row, int column, const std::vector<QStringList>& text
     Store();
     const int last = StoredRows();
     row = std::min(row, last);
-    std::vector<CellChange> changes;
+    CCellChanges changes;
     auto added = row + int(texts.size()) > last ? NewLines(row + int(texts.size()) - last) : nullptr;
     for (int r = 0; r < int(texts.size()); ++r) {
         for (int c = 0; c < texts[std::size_t(r)].size(); ++c) {
@@ -260,17 +247,25 @@ void CGridModel::Paste(int row, int column, const std::vector<QStringList>& text
             }
             CellValue before = Value(row + r, column + c);
             if (text != EditText(spec, before))
-                changes.push_back({NameOf(row + r), column + c + 1, spec.access, before, after()});
+                changes.Add(NameOf(row + r), column + c + 1, spec.access, before, after());
         }
     }
-    if (changes.empty() && !added)
+    if (changes.IsEmpty() && !added)
         return;
     Change(step, row, [&] {
-        if (!changes.empty())
+        if (!changes.IsEmpty())
             SetCells(*m_document, m_rows, std::move(changes), std::size_t(row));
         if (added)
             InsertLines(*m_document, m_rows, std::size_t(last), std::move(added));
     });
+    Sync();
+}
+
+void CGridModel::ChangeCells(const QString& step, int row, CCellChanges changes)
+{
+    if (changes.IsEmpty() || !m_document->MayChange())
+        return;
+    Change(step, row, [&] { SetCells(*m_document, m_rows, std::move(changes), std::size_t(row)); });
     Sync();
 }
 

@@ -2,6 +2,7 @@
 // change that is stored is a step to undo.
 #pragma once
 
+#include "grid/cell_changes.h"
 #include "grid/table_rows.h"
 
 #include <QAbstractTableModel>
@@ -43,6 +44,8 @@ public:
     /// Puts `texts` into the cells from (row, column) on, rows past the last one being added: one undo step with the
     /// text `step`. Every text must have passed Refusal.
     void Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step);
+    /// Changes cells, the first of which stands in `row`: one undo step with the text `step`. What was typed is stored.
+    void ChangeCells(const QString& step, int row, CCellChanges changes);
     /// A new line before `row`, with the columns' fill values: an undo step. The offered row becomes a line before it.
     /// Returns the row where it went.
     int InsertRow(int row);

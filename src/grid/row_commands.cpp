@@ -85,34 +85,23 @@ struct Arrangement
 struct Cells
 {
     std::shared_ptr<IRowSource> rows;
-    std::vector<CellChange> changes;
+    CCellChanges changes;
     std::size_t row;
 
     ChangePlace Apply()
     {
-        for (CellChange& change : changes) {
-            void* object = rows->Object(change.row);
-            if (change.access->restore)
-                change.restore = change.access->restore(object);
-            change.access->set(object, change.after);
-        }
+        changes.Apply(*rows);
         return Place();
     }
     ChangePlace Revert()
     {
-        for (auto change = changes.rbegin(); change != changes.rend(); ++change) {
-            void* object = rows->Object(change->row);
-            if (change->restore)
-                change->restore(object);
-            else
-                change->access->set(object, change->before);
-        }
+        changes.Revert(*rows);
         return Place();
     }
     ChangePlace Place()
     {
-        row = rows->RowOf(changes.front().row, row);
-        return PlaceOf(*rows, row, changes.front().column);
+        row = rows->RowOf(changes.FirstRow(), row);
+        return PlaceOf(*rows, row, changes.FirstColumn());
     }
 };
 
@@ -139,7 +128,8 @@ void ArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vecto
     Push(document, {}, Arrangement{std::move(rows), std::move(order), std::move(places), row});
 }
 
-void SetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<CellChange> changes, std::size_t row)
+void SetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, CCellChanges changes, std::size_t row)
 {
+    changes.ShrinkToFit();
     Push(document, GridTexts::tr("Change of cells"), Cells{std::move(rows), std::move(changes), row});
 }

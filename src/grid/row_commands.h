@@ -2,8 +2,7 @@
 // the document's undo stack.
 #pragma once
 
-#include "grid/column_spec.h"
-#include "grid/row_source.h"
+#include "grid/cell_changes.h"
 #include "ks/fc/doc_command.h"
 
 #include <vector>
@@ -20,14 +19,5 @@ void DeleteLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t
 /// `row`.
 void ArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<std::size_t> order, std::size_t row);
 
-/// One cell of a row, before and after. The row may be in the list or in a command that took it out.
-struct CellChange
-{
-    RowKey row;
-    int column; // from 1
-    std::shared_ptr<const CellAccess> access;
-    CellValue before, after;
-    std::function<void(void* row)> restore = {}; // instead of setting `before`; see CellAccess
-};
 /// Changes cells, and nothing but them. `changes` is not empty; `row` (from 0) is where the first of them stands.
-void SetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<CellChange> changes, std::size_t row);
+void SetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, CCellChanges changes, std::size_t row);

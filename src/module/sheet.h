@@ -25,6 +25,7 @@ public:
     /// Makes the next page that has not been made; false when all have.
     bool MakeNextPage();
     int PageCount() const { return count(); }
+    Str CaptionOf(int tab) const { return m_tabs[std::size_t(tab)].caption; }
     /// Switches to a tab: the active page is asked, and only then anything changes. False when it refuses to be left.
     bool SetActivePage(int tab);
 

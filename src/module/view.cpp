@@ -1,12 +1,15 @@
 #include "module/view.h"
 
+#include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
 #include "ks/fc/after_paint.h"
+#include "module/find_field.h"
 #include "module/sheet.h"
 #include "pages/framework/page.h"
 #include "pages/page_table.h"
 #include "res/strings.h"
 
+#include <QLineEdit>
 #include <QTimer>
 #include <QUndoStack>
 #include <algorithm>
@@ -145,6 +148,18 @@ void CKavo0_hdView::EnableLinesMenu(bool enable)
         frame->EnableMenuItem(LinesMenuPosition, enable);
 }
 
+void CKavo0_hdView::FindField()
+{
+    const std::vector<FoundField> fields = FieldsOf(*m_sheet, *GetDocument());
+    const auto found = AskForField(fields, *this);
+    if (!found || !m_sheet->SetActivePage(found->tab))
+        return;
+    if (found->place.data)
+        m_sheet->PageAt(found->tab)->Reveal(found->place, true);
+    if (auto* field = qobject_cast<QLineEdit*>(window()->focusWidget()))
+        field->selectAll(); // as when one comes with Tab: what is typed next takes its place
+}
+
 void CKavo0_hdView::RevealChange(const ChangePlace& place)
 {
     int tab = m_sheet->currentIndex();
@@ -166,6 +181,8 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
             {Command::FetchLocation, LoadString(Str::MenuFetchLocation), QKeySequence(Qt::CTRL | Qt::Key_L)});
     menu.push_back({Command::DeleteLine, LoadString(Str::MenuDeleteLine)});
     menu.emplace_back();
+    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
+    menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     return menu;
 }
@@ -174,8 +191,10 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
 {
     if (id == KsCommand::Help)
         return true;
+    if (id == KsCommand::FindField)
+        return m_sheet && m_sheet->isEnabled();
     const auto* page = ActivePage();
-    const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine;
+    const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || CCellCommands::Knows(id);
     const CGenGrid* grid = !page ? nullptr : isForLines ? page->LinesGrid() : page->GetGrid();
     if (!m_linesEnabled || !grid || !grid->isEnabled())
         return false;
@@ -184,6 +203,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     return id == Command::InsertLine      ? true
            : id == Command::DeleteLine    ? grid->HasLinesToDelete()
            : id == Command::FetchLocation ? GetDocument()->ProjectHandle() != 0
+           : CCellCommands::Knows(id)     ? CCellCommands::CanRun(id, grid)
                                           : m_search.CanRun(id, grid);
 }
 
@@ -200,6 +220,10 @@ bool CKavo0_hdView::OnCommand(int id)
         FetchLocation();
     else if (id == KsCommand::Help)
         page->OnHelp();
+    else if (id == KsCommand::FindField)
+        FindField();
+    else if (CCellCommands::Knows(id))
+        CCellCommands::Run(id, *page->LinesGrid());
     else
         m_search.Run(id, *page->GetGrid());
     return true;

@@ -54,6 +54,7 @@ protected:
 
 private:
     void FetchLocation();
+    void FindField();
     void TellLocationLater();
     void TellLocation();
 

@@ -70,19 +70,20 @@ private:
     void Change(std::size_t row, const CKvrCBELocation& place)
     {
         const auto& columns = m_page.GetGrid()->Model()->Columns();
-        const std::size_t before = m_changes.size();
+        bool isChanged = false;
         for (std::size_t c = 0; c < columns.size(); ++c) {
             const double value = ValueFor(columns[c], place);
             if (!std::isfinite(value) || columns[c].IsLocked(m_rows->At(row)))
                 continue;
             CellValue old = columns[c].access->get(m_rows->At(row));
-            if (old != CellValue(value))
-                m_changes.push_back({m_rows->KeyAt(row), int(c) + 1, columns[c].access, std::move(old), value});
+            if (old == CellValue(value))
+                continue;
+            if (m_changes.IsEmpty())
+                m_firstChanged = row;
+            m_changes.Add(m_rows->KeyAt(row), int(c) + 1, columns[c].access, std::move(old), value);
+            isChanged = true;
         }
-        if (m_changes.size() != before) {
-            ++m_result.changed;
-            m_firstChanged = before == 0 ? row : m_firstChanged;
-        }
+        m_result.changed += isChanged;
     }
 
     std::unique_ptr<IRowBlock> NewLines() const
@@ -105,11 +106,11 @@ private:
     void Push()
     {
         m_result.added = int(m_new.size());
-        if (m_new.empty() && m_changes.empty())
+        if (m_new.empty() && m_changes.IsEmpty())
             return;
         CKavo0_hdDoc& document = *m_page.GetDocument();
         document.UndoStack().beginMacro(LoadString(Str::UndoLoad));
-        if (!m_changes.empty())
+        if (!m_changes.IsEmpty())
             SetCells(document, m_rows, std::move(m_changes), m_firstChanged);
         if (!m_new.empty())
             InsertLines(document, m_rows, m_rows->Count(), NewLines());
@@ -122,7 +123,7 @@ private:
     std::map<Place, std::size_t> m_known; // the row of each place
     std::set<Place> m_taken;
     std::vector<const CKvrCBELocation*> m_new;
-    std::vector<CellChange> m_changes;
+    CCellChanges m_changes;
     std::size_t m_firstChanged = 0;
     LoadedLocations m_result;
 };

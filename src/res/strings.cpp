@@ -1,6 +1,7 @@
 #include "res/strings.h"
 
 #include <QCoreApplication>
+#include <QTranslator>
 #include <algorithm>
 #include <iterator>
 
@@ -19,12 +20,26 @@ constexpr Row Rows[] = {
 #undef KVR_STRING
 };
 
+constexpr const char* Context = "Kavo0_hd";
+
+/// Null for a number that is not in the table.
+const char* SourceOf(int number)
+{
+    const auto* row = std::find_if(std::begin(Rows), std::end(Rows), [&](const Row& r) { return r.number == number; });
+    return row == std::end(Rows) ? nullptr : row->text;
+}
+
+QString LineOfText(const QString& text, int line)
+{
+    return line < 0 ? text : text.split(u'\n').value(line);
+}
+
 } // namespace
 
 QString LoadString(int number)
 {
-    const auto* row = std::find_if(std::begin(Rows), std::end(Rows), [&](const Row& r) { return r.number == number; });
-    return row == std::end(Rows) ? QString() : QCoreApplication::translate("Kavo0_hd", row->text);
+    const char* source = SourceOf(number);
+    return source ? QCoreApplication::translate(Context, source) : QString();
 }
 
 QString LoadString(Str id)
@@ -34,7 +49,14 @@ QString LoadString(Str id)
 
 QString LoadLine(Str id, int line)
 {
-    return line < 0 ? LoadString(id) : LoadString(id).split(u'\n').value(line);
+    return LineOfText(LoadString(id), line);
+}
+
+QString LoadLineIn(const QTranslator& language, Str id, int line)
+{
+    const char* source = SourceOf(int(id));
+    const QString translated = source ? language.translate(Context, source) : QString();
+    return LineOfText(translated.isEmpty() ? QString::fromUtf8(source) : translated, line);
 }
 
 QString LoadCounted(std::size_t count, Str one, Str many)

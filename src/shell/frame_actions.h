@@ -39,6 +39,7 @@ public:
     QKeySequence::StandardKey key = QKeySequence::UnknownKey;
     const char* icon = nullptr; // also puts it onto the standard tool bar
     bool shownOnly = false;     // the key belongs to what has the focus, and the command is part of the typing
+    const char* ownKey = nullptr; // in place of a standard one
 
     static std::span<const CFrameAction> Table();
     /// The desktop's keys for the command, Tab spelled as on the keyboard; none for a key that is only shown.

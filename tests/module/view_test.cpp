@@ -8,6 +8,7 @@
 #include "ks/fc/doc_template.h"
 #include "ks/fc/file_bar.h"
 #include "ks/fc/findings_dialog.h"
+#include "module/find_field.h"
 #include "module/kavo0_hd.h"
 #include "module/sheet.h"
 #include "module/view.h"
@@ -405,3 +406,39 @@ TEST_F(ViewTest, ACleanFileHasNoBar)
 }
 
 } // namespace
+
+TEST_F(ViewTest, FieldsAreFoundByAnyOfTheirNames)
+{
+    CKavo0_hdView* view = Open();
+    ASSERT_TRUE(view);
+    const std::vector<FoundField> fields = FieldsOf(*view->Sheet(), *view->GetDocument());
+    for (const FoundField& field : fields) {
+        EXPECT_FALSE(field.title.isEmpty() || field.page.isEmpty()) << field.keyword.toStdString();
+        EXPECT_TRUE(!field.place.data || view->Sheet()->PageAt(field.tab)->Shows(field.place)) << field.title.toStdString();
+    }
+    EXPECT_GT(fields.size(), 150u);
+    const auto first = [&](const QString& text) {
+        const auto found = Matching(fields, text);
+        return found.empty() ? QString() : found.front()->title + u'|' + found.front()->keyword;
+    };
+    EXPECT_EQ(first("theta"), "Theta|theta");
+    EXPECT_EQ(first("g_WATERlevel"), first("water level"));
+    EXPECT_TRUE(first("manning").endsWith("|resist_num")) << first("manning").toStdString();
+    EXPECT_EQ(first("初期条件"), first("initial")) << "in a program in English";
+    EXPECT_EQ(first("WindList"), "Wind|WindList");
+    EXPECT_EQ(first("no such thing"), "");
+
+    // Ctrl+K as the menu has it: what is chosen is in front and has the focus.
+    QTimer::singleShot(0, view, [] {
+        auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+        ASSERT_TRUE(dialog);
+        QTest::keyClicks(dialog->focusWidget(), "zeta_min");
+        QTest::keyClick(dialog->focusWidget(), Qt::Key_Return);
+        dialog->close();
+    });
+    EXPECT_TRUE(view->OnCommand(KsCommand::FindField));
+    auto* field = qobject_cast<QLineEdit*>(view->window()->focusWidget());
+    ASSERT_TRUE(field);
+    EXPECT_TRUE(view->ActivePage()->isAncestorOf(field));
+    EXPECT_EQ(field->selectedText(), "0.1") << "to be typed over";
+}

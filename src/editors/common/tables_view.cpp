@@ -260,7 +260,7 @@ bool CTablesView::IsCommandEnabled(int id) const
     case Command::DeleteLine:
         return m_lines->HasLinesToDelete();
     default:
-        return m_search.CanRun(id, m_main.grid);
+        return CCellCommands::Knows(id) ? CCellCommands::CanRun(id, m_lines) : m_search.CanRun(id, m_main.grid);
     }
 }
 
@@ -274,6 +274,8 @@ bool CTablesView::OnCommand(int id)
         InsertLine();
     else if (id == Command::DeleteLine)
         m_lines->DeleteSelectedLines();
+    else if (CCellCommands::Knows(id))
+        CCellCommands::Run(id, *m_lines);
     else
         m_search.Run(id, *m_main.grid);
     return true;

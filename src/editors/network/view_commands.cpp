@@ -41,6 +41,8 @@ std::vector<CKsMenuCommand> CNetworkView::LinesMenu() const
     menu.push_back({Command::InsertLine, tr("&Insert Line"), {}, tr("Adds a line to the channel of the branch")});
     menu.push_back({Command::DeleteLine, tr("&Delete Lines"), {}, tr("Deletes the selected lines of the table")});
     menu.emplace_back();
+    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
+    menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     menu.push_back({NetworkCommand::FitAll, tr("Sho&w All"), {}, tr("Shows the whole network on the map")});

@@ -275,5 +275,169 @@
         <source>at most %1</source>
         <translation>%1 以下</translation>
     </message>
+    <message>
+        <source>Fill down</source>
+        <translation>下方向へコピー</translation>
+    </message>
+    <message>
+        <source>Fill with a series</source>
+        <translation>連続データで埋める</translation>
+    </message>
+    <message>
+        <source>Interpolate along the chainage</source>
+        <translation>追加距離に沿って補間</translation>
+    </message>
+    <message>
+        <source>Calculate</source>
+        <translation>計算</translation>
+    </message>
+    <message>
+        <source>Fill Dow&amp;n</source>
+        <translation>下方向へコピー(&amp;N)</translation>
+    </message>
+    <message>
+        <source>Fill with a Se&amp;ries...</source>
+        <translation>連続データで埋める(&amp;R)...</translation>
+    </message>
+    <message>
+        <source>Inter&amp;polate...</source>
+        <translation>補間(&amp;P)...</translation>
+    </message>
+    <message>
+        <source>&amp;Calculate...</source>
+        <translation>計算(&amp;C)...</translation>
+    </message>
+    <message>
+        <source>1 cell changed</source>
+        <translation>1 個のセルを変更しました</translation>
+    </message>
+    <message>
+        <source>%1 cells changed</source>
+        <translation>%1 個のセルを変更しました</translation>
+    </message>
+    <message>
+        <source>1 stays as it was</source>
+        <translation>1 個は元のままです</translation>
+    </message>
+    <message>
+        <source>%1 stay as they were</source>
+        <translation>%1 個は元のままです</translation>
+    </message>
+    <message>
+        <source>Line</source>
+        <translation>行</translation>
+    </message>
+    <message>
+        <source>Column</source>
+        <translation>列</translation>
+    </message>
+    <message>
+        <source>Now</source>
+        <translation>現在</translation>
+    </message>
+    <message>
+        <source>Then</source>
+        <translation>変更後</translation>
+    </message>
+    <message>
+        <source>First results</source>
+        <translation>最初の結果</translation>
+    </message>
+    <message>
+        <source>These stay as they are:</source>
+        <translation>次のセルは変わりません:</translation>
+    </message>
+    <message>
+        <source>Reason</source>
+        <translation>理由</translation>
+    </message>
+    <message>
+        <source>No cell would change.</source>
+        <translation>変わるセルはありません。</translation>
+    </message>
+    <message>
+        <source>1 cell changes:</source>
+        <translation>1 個のセルが変わります:</translation>
+    </message>
+    <message>
+        <source>%1 cells change; the first of them:</source>
+        <translation>%1 個のセルが変わります。最初のもの:</translation>
+    </message>
+    <message>
+        <source>1 cell stays as it is:</source>
+        <translation>1 個のセルは変わりません:</translation>
+    </message>
+    <message>
+        <source>%1 cells stay as they are; the first of them:</source>
+        <translation>%1 個のセルは変わりません。最初のもの:</translation>
+    </message>
+    <message>
+        <source>Formula</source>
+        <translation>式</translation>
+    </message>
+    <message>
+        <source>&amp;Formula:</source>
+        <translation>式(&amp;F):</translation>
+    </message>
+    <message>
+        <source>&quot;value&quot; is the number of the cell itself. Numbers are in the units shown. Other columns of the line: %1. Functions: min, max, abs, sqrt, rint, ln, log10, exp, sin, ...</source>
+        <translation>「value」はセル自身の数値です。数値は表示中の単位です。同じ行のほかの列: %1。関数: min, max, abs, sqrt, rint, ln, log10, exp, sin など</translation>
+    </message>
+    <message>
+        <source>Fill with a Series</source>
+        <translation>連続データで埋める</translation>
+    </message>
+    <message>
+        <source>Step</source>
+        <translation>増分</translation>
+    </message>
+    <message>
+        <source>&amp;Step from line to line:</source>
+        <translation>行ごとの増分(&amp;S):</translation>
+    </message>
+    <message>
+        <source>Interpolate</source>
+        <translation>補間</translation>
+    </message>
+    <message>
+        <source>Between the &amp;first and the last selected line of each branch</source>
+        <translation>各河川の選択した最初の行と最後の行の間(&amp;F)</translation>
+    </message>
+    <message>
+        <source>Between the lines of the branch that are &amp;not selected</source>
+        <translation>選択していない同じ河川の行の間(&amp;N)</translation>
+    </message>
+    <message>
+        <source>&amp;Also beyond the last known values (extrapolate)</source>
+        <translation>既知の値の外側も(外挿)(&amp;A)</translation>
+    </message>
+    <message>
+        <source>The result is no number.</source>
+        <translation>結果が数値になりません。</translation>
+    </message>
+    <message>
+        <source>The result is no integer.</source>
+        <translation>結果が整数になりません。</translation>
+    </message>
+    <message>
+        <source>Line %1: %2</source>
+        <translation>%1 行目: %2</translation>
+    </message>
+    <message>
+        <source>The cell is empty.</source>
+        <translation>セルが空です。</translation>
+    </message>
+    <message>
+        <source>The line has no branch or no chainage.</source>
+        <translation>行に河川名または追加距離がありません。</translation>
+    </message>
+    <message>
+        <source>There is no known value on both sides of it.</source>
+        <translation>両側に既知の値がありません。</translation>
+    </message>
+    <message>
+        <source>A cell that the formula names is empty.</source>
+        <translation>式で使うセルが空です。</translation>
+    </message>
 </context>
 </TS>

@@ -11,9 +11,11 @@
 #include <QToolBar>
 #include <vector>
 
-/// Numbers of the commands that the main frame's Edit and Help menus hand to whatever has the focus (CCommandTarget).
+/// Numbers of the commands that the main frame's Edit and Help menus hand to whatever has the focus, or to the active
+/// view (CCommandTarget).
 namespace KsCommand {
 inline constexpr int Copy = 57634, Cut = 57635, Paste = 57637, Help = 57670;
+inline constexpr int FindField = 57680; // leads to a page or a field by its name
 } // namespace KsCommand
 
 /// A command of a view in the frame's "Lines" menu. Without a text it is a separator.

@@ -69,6 +69,13 @@ void KsLangFreeResDll(KsResourceHandle handle)
     Modules().erase(QString(handle->name));
 }
 
+std::unique_ptr<QTranslator> KsLangTranslator(const CString& module, const CString& language)
+{
+    auto translator = std::make_unique<QTranslator>();
+    static_cast<void>(translator->load(module + u'_' + language, KsLanguage::Instance().TranslationFolder()));
+    return translator;
+}
+
 QFont KsLangGetUserFont()
 {
     return QApplication::font();

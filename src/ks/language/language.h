@@ -8,6 +8,8 @@
 #include <QLocale>
 #include <QObject>
 #include <QStringList>
+#include <QTranslator>
+#include <memory>
 
 struct KsResourceModule; // the translations of one module in the user's language
 using KsResourceHandle = KsResourceModule*;
@@ -17,6 +19,9 @@ using KsResourceHandle = KsResourceModule*;
 KS_API KsResourceHandle KsLangLoadResDll(const char* name, KsResourceHandle* handle, int flags);
 /// Removes a resource module. Null is allowed.
 KS_API void KsLangFreeResDll(KsResourceHandle handle);
+/// The translations of a module into one of KsLanguage::Available(), whatever the program's own is: for looking up only.
+/// Empty where the texts in the sources are in that language.
+KS_API std::unique_ptr<QTranslator> KsLangTranslator(const CString& module, const CString& language);
 /// The user's interface font.
 KS_API QFont KsLangGetUserFont();
 

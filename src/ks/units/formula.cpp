@@ -51,6 +51,10 @@ CKsFormula::CKsFormula(const CString& text, const QStringList& names) : m_parser
     }
     m_parser->numbers.resize(std::size_t(names.size()));
     try {
+        std::string letters = "0123456789_abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ";
+        for (int byte = 0x80; byte <= 0xff; ++byte) // of letters in UTF-8
+            letters += char(byte);
+        m_parser->parser.DefineNameChars(letters.c_str());
         for (qsizetype name = 0; name < names.size(); ++name)
             m_parser->parser.DefineVar(names[name].toStdString(), &m_parser->numbers[std::size_t(name)]);
         m_parser->parser.SetExpr(text.toStdString());
@@ -66,6 +70,14 @@ CKsFormula::CKsFormula(const CString& text, const QStringList& names) : m_parser
 
 CKsFormula::~CKsFormula() = default;
 CKsFormula::CKsFormula(CKsFormula&&) noexcept = default;
+
+bool CKsFormula::Uses(std::size_t name) const
+{
+    const auto& used = m_parser->parser.GetUsedVar();
+    return std::ranges::any_of(used, [&](const auto& variable) {
+        return variable.second == &m_parser->numbers[name];
+    });
+}
 
 double CKsFormula::Value(std::span<const double> numbers) const
 {

@@ -12,13 +12,15 @@
 class KS_API CKsFormula
 {
 public:
-    /// `names` stand for the numbers that Value is given; ASCII letters, digits and _ only.
+    /// `names` stand for the numbers that Value is given: letters, digits and _, no digit first, each once.
     explicit CKsFormula(const CString& text, const QStringList& names = {});
     ~CKsFormula();
     CKsFormula(CKsFormula&&) noexcept;
 
     /// Why the text is no formula, for the user; empty when it is one.
     const CString& Fault() const { return m_fault; }
+    /// Whether the number of this name matters.
+    bool Uses(std::size_t name) const;
     /// With a number for each name, in their order. May be infinite or no number. Only without a fault.
     double Value(std::span<const double> numbers = {}) const;
 

@@ -668,6 +668,26 @@ Replace it Yes/No ?</source>
         <translation>不完全な行の削除</translation>
     </message>
     <message>
+        <source>Go to Field or Page</source>
+        <translation>項目またはページへ移動</translation>
+    </message>
+    <message>
+        <source>A word of its name, or its keyword in the file</source>
+        <translation>名前の一部、またはファイル内のキーワード</translation>
+    </message>
+    <message>
+        <source>Fields and pages found</source>
+        <translation>見つかった項目とページ</translation>
+    </message>
+    <message>
+        <source>Name
+Page
+Keyword</source>
+        <translation>名前
+ページ
+キーワード</translation>
+    </message>
+    <message>
         <source>&amp;Insert Line</source>
         <translation>行の挿入(&amp;I)</translation>
     </message>

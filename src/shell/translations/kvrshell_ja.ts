@@ -144,6 +144,14 @@ The editors read %2.</source>
         <translation>切り取り(&amp;T)</translation>
     </message>
     <message>
+        <source>&amp;Go to Field...</source>
+        <translation>項目へ移動(&amp;G)...</translation>
+    </message>
+    <message>
+        <source>Leads to a field or a page by its name or its keyword</source>
+        <translation>名前またはキーワードで項目やページへ移動します</translation>
+    </message>
+    <message>
         <source>Moves the selection to the clipboard</source>
         <translation>選択範囲を切り取ってクリップボードに入れます</translation>
     </message>

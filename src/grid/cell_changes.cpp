@@ -1,0 +1,111 @@
+#include "grid/cell_changes.h"
+
+#include <algorithm>
+#include <bit>
+#include <cstdint>
+#include <numeric>
+
+bool SameCell(const CellValue& a, const CellValue& b)
+{
+    const auto* x = std::get_if<double>(&a);
+    const auto* y = std::get_if<double>(&b);
+    return x && y ? std::bit_cast<std::uint64_t>(*x) == std::bit_cast<std::uint64_t>(*y) : a == b;
+}
+
+void CCellValues::Add(CellValue value)
+{
+    if (!std::exchange(m_hasType, true))
+        std::visit(
+            [this]<typename T>(const T&) {
+                if constexpr (std::is_same_v<T, std::monostate>)
+                    m_values = std::vector<CellValue>();
+                else
+                    m_values = std::vector<T>();
+            },
+            value);
+    const bool isTaken = std::visit(
+        [&value]<typename T>(std::vector<T>& values) {
+            if constexpr (std::is_same_v<T, CellValue>) {
+                values.push_back(std::move(value));
+                return true;
+            } else {
+                auto* const own = std::get_if<T>(&value);
+                if (own)
+                    values.push_back(std::move(*own));
+                return own != nullptr;
+            }
+        },
+        m_values);
+    if (isTaken)
+        return;
+    // One of another type: from now on they are mixed.
+    std::vector<CellValue> mixed = std::visit(
+        [](auto& values) {
+            return std::vector<CellValue>(std::make_move_iterator(values.begin()), std::make_move_iterator(values.end()));
+        },
+        m_values);
+    mixed.push_back(std::move(value));
+    m_values = std::move(mixed);
+}
+
+CellValue CCellValues::operator[](std::size_t index) const
+{
+    return std::visit([index](const auto& values) { return CellValue(values[index]); }, m_values);
+}
+
+void CCellValues::ShrinkToFit()
+{
+    std::visit([](auto& values) { values.shrink_to_fit(); }, m_values);
+}
+
+void CCellChanges::Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, CellValue before,
+                       CellValue after)
+{
+    auto place = std::ranges::find(m_columns, column, &Column::column);
+    if (place == m_columns.end())
+        place = m_columns.insert(place, Column{column, access, {}, {}, {}});
+    place->rows.push_back(row);
+    place->before.Add(std::move(before));
+    place->after.Add(std::move(after));
+}
+
+std::size_t CCellChanges::Count() const
+{
+    return std::accumulate(m_columns.begin(), m_columns.end(), std::size_t(0),
+                           [](std::size_t sum, const Column& column) { return sum + column.rows.size(); });
+}
+
+void CCellChanges::Apply(IRowSource& rows)
+{
+    for (Column& column : m_columns) {
+        column.restore.clear();
+        for (std::size_t i = 0; i < column.rows.size(); ++i) {
+            void* object = rows.Object(column.rows[i]);
+            if (column.access->restore)
+                column.restore.push_back(column.access->restore(object));
+            column.access->set(object, column.after[i]);
+        }
+    }
+}
+
+void CCellChanges::Revert(IRowSource& rows)
+{
+    for (auto column = m_columns.rbegin(); column != m_columns.rend(); ++column) {
+        for (std::size_t i = column->rows.size(); i-- > 0;) {
+            void* object = rows.Object(column->rows[i]);
+            if (column->access->restore)
+                column->restore[i](object);
+            else
+                column->access->set(object, column->before[i]);
+        }
+    }
+}
+
+void CCellChanges::ShrinkToFit()
+{
+    for (Column& column : m_columns) {
+        column.rows.shrink_to_fit();
+        column.before.ShrinkToFit();
+        column.after.ShrinkToFit();
+    }
+}

@@ -1,0 +1,59 @@
+// Cells of the rows of a source, before and after. Kept column by column: of a million numbers nothing but the rows and
+// the two numbers of each.
+#pragma once
+
+#include "grid/column_spec.h"
+#include "grid/row_source.h"
+
+#include <variant>
+#include <vector>
+
+/// Equal to the last bit; numbers that are none are equal to themselves.
+bool SameCell(const CellValue& a, const CellValue& b);
+
+/// What many cells of one column hold.
+class CCellValues
+{
+public:
+    void Add(CellValue value);
+    CellValue operator[](std::size_t index) const;
+    void ShrinkToFit();
+
+private:
+    // As values of one type as long as they are of one, which they are but for empty cells.
+    std::variant<std::vector<double>, std::vector<std::int32_t>, std::vector<std::string>, std::vector<HDDateTime>,
+                 std::vector<CellValue>>
+        m_values;
+    bool m_hasType = false;
+};
+
+class CCellChanges
+{
+public:
+    /// The row may be in the source or in a command that took it out. `column` counts from 1. The columns of a row are
+    /// changed in the order in which they came first.
+    void Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, CellValue before,
+             CellValue after);
+    bool IsEmpty() const { return m_columns.empty(); }
+    std::size_t Count() const;
+    // Of the first cell that was added; not for an empty one.
+    RowKey FirstRow() const { return m_columns.front().rows.front(); }
+    int FirstColumn() const { return m_columns.front().column; }
+
+    void Apply(IRowSource& rows);
+    void Revert(IRowSource& rows);
+    /// Nothing is added any more.
+    void ShrinkToFit();
+
+private:
+    struct Column
+    {
+        int column;
+        std::shared_ptr<const CellAccess> access;
+        std::vector<RowKey> rows;
+        CCellValues before, after;
+        std::vector<std::function<void(void* row)>> restore = {}; // instead of setting `before`; see CellAccess
+    };
+
+    std::vector<Column> m_columns;
+};

@@ -1,0 +1,14 @@
+// What the commands on many cells ask for, with the first results and the cells that would stay as they are.
+#pragma once
+
+#include "grid/cell_results.h"
+#include "grid/grid_keys.h"
+
+#include <optional>
+
+class CGridModel;
+class QWidget;
+
+/// For the actions of CellActions that ask; nothing when the user thinks better of it.
+std::optional<CCellResults> AskForCells(GridAction action, const CGridModel& model, const CellBlock& block,
+                                        QWidget& parent);

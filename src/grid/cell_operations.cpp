@@ -1,0 +1,238 @@
+#include "grid/cell_operations.h"
+
+#include "base/not_given.h"
+#include "grid/grid_texts.h"
+#include "ks/fc/branch_name.h"
+#include "ks/units/formula.h"
+
+#include <QRegularExpression>
+#include <algorithm>
+#include <cmath>
+#include <map>
+
+namespace {
+
+bool HasNumbers(const ColumnSpec& column)
+{
+    return column.Kind() == CellKind::Number || column.Kind() == CellKind::Integer;
+}
+
+/// In the unit shown; nothing for an empty cell and for what is no number.
+std::optional<double> ShownNumber(const CTableRows& rows, int row, int column)
+{
+    const CellValue value = rows.Value(row, column);
+    if (const auto* integer = std::get_if<std::int32_t>(&value))
+        return *integer;
+    const auto* number = std::get_if<double>(&value);
+    if (!number || *number == NotGiven || std::isnan(*number))
+        return std::nullopt;
+    return rows.Column(column).style.UnitConvertFromBase(*number, 1);
+}
+
+template <typename Do>
+void ForCells(const CTableRows& rows, const CellBlock& block, const Do& action)
+{
+    for (int column = block.left; column <= block.right; ++column)
+        for (int row = block.top; row <= std::min(block.bottom, rows.StoredRows() - 1); ++row)
+            action(row, column);
+}
+
+} // namespace
+
+// ---- fill --------------------------------------------------------------------------------------
+
+CCellResults FillDown(const CTableRows& rows, CellBlock block)
+{
+    if (block.top == block.bottom)
+        block.top = std::max(block.top - 1, 0);
+    CCellResults results(rows);
+    ForCells(rows, {block.top + 1, block.left, block.bottom, block.right}, [&](int row, int column) {
+        const CellKind kind = rows.Column(column).Kind();
+        if (kind != CellKind::Button)
+            results.Add(row, column, rows.Value(block.top, column));
+    });
+    return results;
+}
+
+double StepOf(const CTableRows& rows, const CellBlock& block)
+{
+    const auto isNumber = [&](int column) { return HasNumbers(rows.Column(column)); };
+    for (int column = block.left; column <= block.right && block.bottom > block.top; ++column) {
+        if (!isNumber(column))
+            continue;
+        const auto first = ShownNumber(rows, block.top, column), second = ShownNumber(rows, block.top + 1, column);
+        return first && second ? *second - *first : 0;
+    }
+    return 0;
+}
+
+CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double step)
+{
+    CCellResults results(rows);
+    ForCells(rows, block, [&](int row, int column) {
+        if (!HasNumbers(rows.Column(column)))
+            return;
+        if (const auto first = ShownNumber(rows, block.top, column))
+            results.AddShown(row, column, *first + step * (row - block.top));
+        else if (row == block.top)
+            results.Keep(row, column, GridTexts::tr("The cell is empty."));
+    });
+    return results;
+}
+
+// ---- interpolate -------------------------------------------------------------------------------
+
+namespace {
+
+constexpr int BranchColumn = 0, ChainageColumn = 1;
+
+struct LineOfBranch
+{
+    double chainage;
+    int row;
+    bool isInBlock;
+};
+using Branches = std::vector<std::vector<LineOfBranch>>;
+
+/// The lines of each branch by chainage. Lines of one branch mostly follow each other.
+Branches LinesByBranch(const CTableRows& rows, const CellBlock& block, CCellResults& results)
+{
+    std::map<QString, std::size_t> places;
+    Branches branches;
+    std::string last;
+    std::size_t place = 0;
+    for (int row = rows.FixedRows(); row < rows.StoredRows(); ++row) {
+        const CellValue name = rows.Value(row, BranchColumn), chainage = rows.Value(row, ChainageColumn);
+        const auto& branch = std::get<std::string>(name);
+        const auto* number = std::get_if<double>(&chainage);
+        const bool isInBlock = row >= block.top && row <= block.bottom;
+        if (branch.empty() || !number || *number == NotGiven) {
+            if (isInBlock)
+                results.Keep(row, ChainageColumn, GridTexts::tr("The line has no branch or no chainage."));
+            continue;
+        }
+        if (branches.empty() || branch != last) {
+            place = places.try_emplace(KsBranchKey(QString::fromStdString(branch)), branches.size()).first->second;
+            branches.resize(std::max(branches.size(), place + 1));
+            last = branch;
+        }
+        branches[place].push_back({*number, row, isInBlock});
+    }
+    for (auto& lines : branches)
+        if (!std::ranges::is_sorted(lines, {}, &LineOfBranch::chainage))
+            std::ranges::stable_sort(lines, {}, &LineOfBranch::chainage);
+    return branches;
+}
+
+struct Known
+{
+    double chainage, value;
+};
+
+/// On the line through the two known values around the chainage, or the two nearest ones.
+std::optional<double> OnLine(const std::vector<Known>& known, double chainage, bool extrapolates)
+{
+    if (known.empty())
+        return std::nullopt;
+    const bool isBeyond = chainage < known.front().chainage || chainage > known.back().chainage;
+    if (isBeyond && (!extrapolates || known.size() == 1))
+        return std::nullopt;
+    auto after = std::ranges::lower_bound(known, chainage, {}, &Known::chainage);
+    if (after != known.end() && after->chainage == chainage)
+        return after->value;
+    after = std::clamp(after, known.begin() + 1, known.end() - 1);
+    const auto before = after - 1;
+    const double part = (chainage - before->chainage) / (after->chainage - before->chainage);
+    return before->value + part * (after->value - before->value);
+}
+
+/// Of two values at one place the first one counts.
+std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column, KnownValues which)
+{
+    std::vector<Known> known;
+    for (const LineOfBranch& line : lines) {
+        if (line.isInBlock != (which == KnownValues::Ends))
+            continue;
+        const auto value = ShownNumber(rows, line.row, column);
+        if (value && (known.empty() || known.back().chainage != line.chainage))
+            known.push_back({line.chainage, *value});
+    }
+    if (which == KnownValues::Ends && known.size() > 2)
+        known = {known.front(), known.back()};
+    return known;
+}
+
+} // namespace
+
+CCellResults Interpolate(const CTableRows& rows, const CellBlock& block, KnownValues which, bool extrapolates)
+{
+    CCellResults results(rows);
+    const Branches branches = LinesByBranch(rows, block, results);
+    for (int column = std::max(block.left, ChainageColumn + 1); column <= block.right; ++column) {
+        if (rows.Column(column).Kind() != CellKind::Number)
+            continue;
+        for (const auto& lines : branches) {
+            if (std::ranges::none_of(lines, &LineOfBranch::isInBlock))
+                continue;
+            const std::vector<Known> known = KnownOf(rows, lines, column, which);
+            for (const LineOfBranch& line : lines) {
+                if (!line.isInBlock)
+                    continue;
+                if (const auto value = OnLine(known, line.chainage, extrapolates))
+                    results.AddShown(line.row, column, *value);
+                else
+                    results.Keep(line.row, column, GridTexts::tr("There is no known value on both sides of it."));
+            }
+        }
+    }
+    return results;
+}
+
+// ---- calculate ---------------------------------------------------------------------------------
+
+FormulaNames NamesForFormula(const CTableRows& rows)
+{
+    static const QRegularExpression separator(QStringLiteral("[^\\p{L}\\p{N}]+"));
+    FormulaNames result{{QStringLiteral("value")}, {-1}};
+    const auto add = [&result](const QString& name, int column) {
+        if (name.isEmpty() || result.names.contains(name))
+            return;
+        result.names << name;
+        result.columns.push_back(column);
+    };
+    for (int column = 0; column < int(rows.Columns().size()); ++column) {
+        if (!HasNumbers(rows.Column(column)))
+            continue;
+        const QString title = rows.Column(column).header().section(u'[', 0, 0);
+        QString name = title.split(separator, Qt::SkipEmptyParts).join(u'_');
+        if (!name.isEmpty() && name.front().isDigit())
+            name.prepend(u'_');
+        add(name, column);
+        add(name.toLower(), column);
+    }
+    return result;
+}
+
+CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKsFormula& formula,
+                       const FormulaNames& names)
+{
+    std::vector<std::size_t> used;
+    for (std::size_t name = 0; name < names.columns.size(); ++name)
+        if (formula.Uses(name))
+            used.push_back(name);
+    CCellResults results(rows);
+    std::vector<double> numbers(names.columns.size());
+    ForCells(rows, block, [&](int row, int column) {
+        if (!HasNumbers(rows.Column(column)))
+            return;
+        for (const std::size_t name : used) {
+            const int from = names.columns[name] < 0 ? column : names.columns[name];
+            const auto number = ShownNumber(rows, row, from);
+            if (!number)
+                return results.Keep(row, column, GridTexts::tr("A cell that the formula names is empty."));
+            numbers[name] = *number;
+        }
+        results.AddShown(row, column, formula.Value(numbers));
+    });
+    return results;
+}

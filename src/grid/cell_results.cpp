@@ -1,0 +1,78 @@
+#include "grid/cell_results.h"
+
+#include "grid/cell_text.h"
+#include "grid/grid_texts.h"
+#include "grid/typing.h"
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+namespace {
+
+constexpr std::size_t Listed = 100; // more is nothing that anybody reads
+
+} // namespace
+
+void CCellResults::Add(int row, int column, const CellValue& after)
+{
+    const ColumnSpec& spec = m_rows->Column(column);
+    CellValue before = m_rows->Value(row, column);
+    if (SameCell(before, after))
+        return;
+    if (m_rows->IsLocked(row, column))
+        return Keep(row, column, GridTexts::tr("The cell is locked."));
+    if (const auto* number = std::get_if<double>(&after); number && !spec.bounds.Allow(*number))
+        return Keep(row, column, OutOfRange());
+    if (m_changes.IsEmpty())
+        m_firstRow = row;
+    if (m_changed.size() < Listed)
+        m_changed.push_back({row, column, EditText(spec, before), EditText(spec, after)});
+    if (m_rows->Rows()->HasRules())
+        m_texts.push_back({{row, column}, EditText(spec, after)});
+    m_changes.Add(m_rows->NameOf(row), column + 1, spec.access, std::move(before), after);
+}
+
+void CCellResults::AddShown(int row, int column, double after)
+{
+    using Limits = std::numeric_limits<std::int32_t>;
+    const ColumnSpec& spec = m_rows->Column(column);
+    const CellValue before = m_rows->Value(row, column);
+    const auto* number = std::get_if<double>(&before);
+    // What a conversion of units makes of the last place is no change.
+    if (number && spec.style.UnitConvertFromBase(*number, 1) == after)
+        return;
+    if (!std::isfinite(after))
+        Keep(row, column, GridTexts::tr("The result is no number."));
+    else if (spec.Kind() == CellKind::Number)
+        Add(row, column, spec.style.UnitConvertFromBase(after, 0));
+    else if (after != std::floor(after) || after < Limits::min() || after > Limits::max())
+        Keep(row, column, GridTexts::tr("The result is no integer."));
+    else
+        Add(row, column, std::int32_t(after));
+}
+
+void CCellResults::Keep(int row, int column, const QString& why)
+{
+    if (m_keptCount++ < Listed)
+        m_kept.push_back({row, column, EditText(m_rows->Column(column), m_rows->Value(row, column)), why});
+}
+
+QString CCellResults::RuleFault() const
+{
+    if (m_texts.empty())
+        return {};
+    const auto byRow = [](const auto& cell) { return cell.first.first; };
+    const int top = std::ranges::min(m_texts, {}, byRow).first.first;
+    const int bottom = std::ranges::max(m_texts, {}, byRow).first.first;
+    std::vector<QStringList> texts;
+    for (int row = top; row <= bottom; ++row) {
+        QStringList& line = texts.emplace_back();
+        for (int column = 0; column < int(m_rows->Columns().size()); ++column)
+            line << EditText(m_rows->Column(column), m_rows->Value(row, column));
+    }
+    for (const auto& [cell, text] : m_texts)
+        texts[std::size_t(cell.first - top)][cell.second] = text;
+    const auto fault = m_rows->Fault(top, 0, texts);
+    return fault ? GridTexts::tr("Line %1: %2").arg(QString::number(top + int(fault->row) + 1), fault->text) : QString();
+}

@@ -1,0 +1,50 @@
+// What an operation on many cells comes to, before anything changes: it is shown first.
+#pragma once
+
+#include "grid/cell_changes.h"
+#include "grid/table_rows.h"
+
+#include <QString>
+
+/// Cells of a table, each bound included; rows and columns count from 0.
+struct CellBlock
+{
+    int top = 0, left = 0, bottom = -1, right = -1;
+};
+
+class CCellResults
+{
+public:
+    explicit CCellResults(const CTableRows& rows) : m_rows(&rows) {}
+
+    /// The cell becomes `after` unless it holds that already, or cannot.
+    void Add(int row, int column, const CellValue& after);
+    /// The number in the unit that the user sees; an integer for a column of them.
+    void AddShown(int row, int column, double after);
+    /// The cell stays as it is.
+    void Keep(int row, int column, const QString& why);
+
+    struct Cell
+    {
+        int row, column;
+        QString before, after; // as texts to edit; `after` is the reason for a cell that stays
+    };
+    /// The first cells that change, and the first that cannot, as many as one looks at.
+    const std::vector<Cell>& Changed() const { return m_changed; }
+    const std::vector<Cell>& Kept() const { return m_kept; }
+    std::size_t KeptCount() const { return m_keptCount; }
+    std::size_t ChangedCount() const { return m_changes.Count(); }
+    /// What the rows together do not allow; empty when they do. See IRowSource::FindFault.
+    QString RuleFault() const;
+
+    int FirstRow() const { return m_firstRow; }
+    CCellChanges TakeChanges() { return std::move(m_changes); }
+
+private:
+    const CTableRows* m_rows;
+    CCellChanges m_changes;
+    std::vector<Cell> m_changed, m_kept;
+    std::vector<std::pair<std::pair<int, int>, QString>> m_texts; // of rows that have rules
+    std::size_t m_keptCount = 0;
+    int m_firstRow = 0;
+};

@@ -1,0 +1,28 @@
+// Finding a page, a field or a column by whatever somebody calls it: by the words of any of the program's languages, and
+// by the keyword that it has in the file.
+#pragma once
+
+#include "ks/fc/change_place.h"
+
+#include <QString>
+#include <optional>
+#include <vector>
+
+class CDlgPropertySheet;
+class CKavo0_hdDoc;
+class QWidget;
+
+struct FoundField
+{
+    int tab; // of the page
+    ChangePlace place = {}; // nothing for the page itself
+    QString title, page, keyword;
+    QString words; // all that it may be looked for by, case folded
+};
+
+/// Everything that the sheet's pages edit; makes those that have not been made yet.
+std::vector<FoundField> FieldsOf(CDlgPropertySheet& sheet, CKavo0_hdDoc& document);
+/// Those with every word of the text, the likeliest first.
+std::vector<const FoundField*> Matching(const std::vector<FoundField>& fields, const QString& text);
+/// Lets the user choose.
+std::optional<FoundField> AskForField(const std::vector<FoundField>& fields, QWidget& parent);

@@ -1,0 +1,61 @@
+"""Many cells at once, and the way to a field by its name."""
+import samples
+from case import Case
+
+
+class ManyCells(Case):
+    TEXT = samples.hd_text({'InitList': ['"A", 0, 10, 1', '"A", 100, 0, 2', '"A", 400, 20, 4', '"B", 50, 7, 3']})
+
+    def test_calculate_interpolate_and_fill(self):
+        editor = self.open(self.TEXT)
+        editor.click_cell(1, 3)
+        for _ in range(3):
+            editor.press('shift+Down')
+        editor.press('ctrl+shift+e')
+        self.assertIn('1 cell changes:', editor.box_texts())
+        editor.answer()
+        self.assertEqual([editor.table().line(n)[2] for n in (1, 2, 3, 4)], ['10', '12.5', '20', '7'])
+        editor.press('ctrl+e')
+        editor.box()
+        editor.type('value/')
+        editor.settle(0.6)
+        self.assertIn('The formula ends where a number is expected.', editor.box_texts())
+        editor.type('2 + initial_q')
+        editor.settle(0.6)
+        editor.press('Return')
+        editor.settle()
+        self.assertIn('4 cells changed', editor.status())
+        editor.press('ctrl+z')
+        editor.menu('Lines', 'Calculate...')
+        editor.box()
+        editor.press('Escape')
+        editor.click_cell(2, 4)
+        editor.press('ctrl+d')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'),
+                         ['"A", 0, 10, 1', '"A", 100, 12.5, 1', '"A", 400, 20, 4', '"B", 50, 7, 3'])
+        for _ in range(2):
+            editor.press('ctrl+z')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'),
+                         ['"A", 0, 10, 1', '"A", 100, 0, 2', '"A", 400, 20, 4', '"B", 50, 7, 3'])
+
+
+class WayToAField(Case):
+    def test_by_keyword_and_by_a_name_in_another_language(self):
+        editor = self.open(samples.hd_text({'InitList': []}))
+        editor.press('ctrl+k')
+        editor.box()
+        editor.type('theta')
+        editor.press('Return')
+        editor.settle(0.4)
+        self.assertEqual(editor.current_page(), 'Default Values')
+        editor.type('0.75')
+        editor.press('ctrl+k')  # stores it first
+        editor.box()
+        editor.type('manning')
+        editor.press('Return')
+        editor.settle(0.4)
+        self.assertEqual(editor.current_page(), 'Bed Resist.')
+        editor.save()
+        self.assertEqual(self.saved().value('theta'), '0.75')
