@@ -45,7 +45,7 @@ void CCellResults::AddShown(int row, int column, double after)
     if (!std::isfinite(after))
         Keep(row, column, GridTexts::tr("The result is no number."));
     else if (spec.Kind() == CellKind::Number)
-        Add(row, column, spec.style.UnitConvertFromBase(after, 0));
+        Add(row, column, spec.style.UnitConvertFromBase(KsFifteenDigits(after), 0));
     else if (after != std::floor(after) || after < Limits::min() || after > Limits::max())
         Keep(row, column, GridTexts::tr("The result is no integer."));
     else

@@ -19,7 +19,7 @@ public:
 
     /// The cell becomes `after` unless it holds that already, or cannot.
     void Add(int row, int column, const CellValue& after);
-    /// The number in the unit that the user sees; an integer for a column of them.
+    /// The number in the unit that the user sees, to fifteen digits; an integer for a column of them.
     void AddShown(int row, int column, double after);
     /// The cell stays as it is.
     void Keep(int row, int column, const QString& why);

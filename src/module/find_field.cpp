@@ -100,7 +100,9 @@ private:
         if (tab == m_sheet.PageCount())
             return; // no page edits it
         const QString name = QString::fromUtf8(field.name);
-        const QString title = field.title ? Plain(LoadLine(field.title.text, field.title.line)) : name;
+        const QString title = field.title   ? Plain(LoadLine(field.title.text, field.title.line))
+                              : field.choices ? LoadLine(field.choices.text, field.choices.line).replace(u'\n', QStringLiteral(" / "))
+                                              : name;
         Add({tab, place, title, {}, QString::fromUtf8(keyword.name), {}}, field.title, name, field.choices);
     }
 

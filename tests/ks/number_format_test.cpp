@@ -61,3 +61,13 @@ TEST(NumberFormat, TheShortestFormReadsBack)
         }
     }
 }
+
+TEST(NumberFormat, FifteenDigitsAreTheNearestDecimalNumber)
+{
+    for (const auto& [value, expected] : {std::pair(64.52 * 1.1, 70.972), {0.1 + 0.2, 0.3}, {-0.1 * 3, -0.3}, {0.0, 0.0},
+                                          {1e300 / 3, 1e300 / 3}, {1e15, 1e15}, {123456789012345678.0, 123456789012345678.0},
+                                          {5e-324, 5e-324}, {1e-7 * 3, 3e-7}})
+        EXPECT_EQ(KsFifteenDigits(value), expected) << value;
+    for (double value = 1e-7; value < 1e14; value *= 7.3)
+        EXPECT_EQ(KsFifteenDigits(value / 3), std::stod(KsFormatNumber("%.15lg", value / 3).toStdString())) << value;
+}

@@ -104,6 +104,7 @@ TEST_F(TypedNumber, AFormulaIsOneNumber)
     EXPECT_EQ(Read(Discharge, "=10+5"), 15);
     EXPECT_EQ(Read(Discharge, "= 2 * max(1.5, 3) ^ 2"), 18);
     EXPECT_EQ(Read(Discharge, "=-1e-3"), -0.001);
+    EXPECT_EQ(Read(Discharge, "=0.1+0.2"), 0.3) << "without stray digits";
     EXPECT_EQ(Complaint(Discharge, "=1,5"),
               "The formula has a comma outside of brackets; the decimal separator is the point.");
     EXPECT_EQ(Complaint(Discharge, "=width*2"), "\"width\" is no name or function known here.");

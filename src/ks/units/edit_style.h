@@ -80,5 +80,8 @@ private:
 
 /// Prints one double in a printf floating format, independent of the locale; in the shortest form when it is none.
 KS_API CString KsFormatNumber(const CString& format, double value);
+/// The nearest number of fifteen significant digits, as spreadsheets keep results: 0.3 for 0.1 + 0.2. One of a magnitude
+/// that no quantity has stays as it is.
+KS_API double KsFifteenDigits(double value);
 /// The fewest digits that read back to the same number, without exponent from 1e-5 up to 1e15.
 KS_API CString KsShortestNumber(double value);

@@ -2,6 +2,7 @@
 #include "ks/units/edit_style.h"
 
 #include <QRegularExpression>
+#include <array>
 #include <charconv>
 #include <cmath>
 #include <optional>
@@ -60,4 +61,24 @@ CString KsShortestNumber(double value)
     const auto end = plain ? std::to_chars(buffer, buffer + sizeof buffer, value, std::chars_format::fixed)
                            : std::to_chars(buffer, buffer + sizeof buffer, value);
     return CString::fromLatin1(buffer, int(end.ptr - buffer));
+}
+
+double KsFifteenDigits(double value)
+{
+    // Up to 10^22 powers of ten are doubles, and so is a whole number of fifteen digits: the quotient is the nearest
+    // double to the decimal number.
+    static constexpr int LargestPower = 22;
+    static const auto powers = [] {
+        std::array<double, LargestPower + 1> table{1};
+        for (int power = 1; power <= LargestPower; ++power)
+            table[std::size_t(power)] = table[std::size_t(power) - 1] * 10;
+        return table;
+    }();
+    if (value == 0 || !std::isfinite(value))
+        return value;
+    const int power = 14 - int(std::floor(std::log10(std::fabs(value))));
+    if (power < 0 || power > LargestPower)
+        return value;
+    const double scale = powers[std::size_t(power)];
+    return std::round(value * scale) / scale;
 }

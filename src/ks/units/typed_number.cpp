@@ -35,7 +35,7 @@ KsTyped<double> ReadFormula(const CString& text)
     const double value = formula.Value();
     if (!std::isfinite(value))
         return {{}, Text(QT_TRANSLATE_NOOP("CKsEditStyle", "The result of \"%1\" is no number.")).arg(text)};
-    return {value};
+    return {KsFifteenDigits(value)};
 }
 
 /// What may be typed instead, for the message.
