@@ -156,8 +156,11 @@ void CKsFileWatch::Looked(const Look& look, int generation)
     }
     m_wasMissed = isMissed;
     m_isTrusted = look.isTrusted && !isMissed;
+    const bool hasMoreNames = look.status.links > m_seen.links && look.status.links > 1;
     m_seen = look.status;
     m_version = look.version;
+    if (hasMoreNames)
+        emit HasMoreNames();
     if (isGone)
         Take({.kind = KsFileSight::Gone, .time = Now()});
     else if (look.why && m_known)
