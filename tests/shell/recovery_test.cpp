@@ -282,9 +282,11 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
         return QString();
     });
     for (const CMultiDocTemplate* documents : CMultiDocTemplate::All())
-        for (CKsDoc* document : documents->findChildren<CKsDoc*>(Qt::FindDirectChildrenOnly))
-            if (document->GetPathName().isEmpty() && document->GetTitle().contains("recovered"))
+        for (CKsDoc* document : documents->findChildren<CKsDoc*>(Qt::FindDirectChildrenOnly)) {
+            if (document->GetTitle().contains("recovered")) {
                 EXPECT_FALSE(document->DoSave({}));
+            }
+        }
     proposed.sort();
     EXPECT_EQ(proposed, (QStringList{Path("changed-2.HDKV"), Path("early-2.HDKV"), Path("edited-2.HDKV"),
                                      Path("missing.HDKV"), Path("other/changed-2.HDKV")}));
