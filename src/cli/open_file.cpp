@@ -37,7 +37,8 @@ void PrintFindings(std::ostream& stream, const std::string& path, const std::vec
         Listed& kind = kinds[finding.kind];
         if (++kind.count > Most)
             continue;
-        stream << file << ':' << finding.line << ':' << finding.column << ": " << Printable(FindingText(finding)) << '\n';
+        stream << file << ':' << finding.line << ':' << finding.column << ": " << Printable(FindingText(finding))
+               << '\n';
         kind.last = &finding;
     }
     for (const auto& [kind, listed] : kinds)

@@ -56,7 +56,7 @@ private:
     CWindowManager& m_windows;
     const CPlugins& m_plugins;
     CProjects m_projects;
-    CProjectTree* m_tree;                                              // the frame's
+    CProjectTree* m_tree; // the frame's
     struct Watched
     {
         std::unique_ptr<CKsFileWatch> watch;

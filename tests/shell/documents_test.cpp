@@ -75,6 +75,8 @@ TEST_F(ShellTest, FilesAreDroppedIn)
     for (int i = 300; i > 0; --i)
         many.prepend(QUrl::fromLocalFile(Path(QString("gone%1.tst").arg(i))));
     data.setUrls(many);
+    QDragEnterEvent enterMany(QPoint(5, 5), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    QApplication::sendEvent(frame.get(), &enterMany);
     QDropEvent dropMany(QPointF(5, 5), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
     QApplication::sendEvent(frame.get(), &dropMany);
     EXPECT_TRUE(ViewOf("last.tst"));

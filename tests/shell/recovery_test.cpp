@@ -468,7 +468,7 @@ TEST_F(RecoveryTest, TheDialogSaysWhatDiffersAndDoesWhatIsChosen)
         ASSERT_TRUE(IsKept(document));
     }
     QTest::qSleep(1000); // dates count seconds
-    Crash(); // finds them; another session asks again
+    Crash();             // finds them; another session asks again
     Restart();
     frame->OfferRecovery();
     auto* dialog = frame->findChild<CRecoveryDialog*>();

@@ -21,7 +21,7 @@ CString AskSavePath(const CKsDoc& document, const CString& proposal)
     KsFileQuestion question;
     question.save = true;
     question.title = CKsDoc::tr("Save As");
-    question.proposal = !proposal.isEmpty()                ? proposal
+    question.proposal = !proposal.isEmpty()                  ? proposal
                         : !document.GetPathName().isEmpty()  ? document.GetPathName()
                         : !document.StandsBeside().isEmpty() ? KsFreeFileName(document.StandsBeside())
                                                              : document.GetTitle();
@@ -43,8 +43,8 @@ CString AskSavePath(const CKsDoc& document, const CString& proposal)
             continue;
         }
         if (const CString holder = document.HolderOf(written); !holder.isEmpty()) {
-            KsMessageBox(CKsDoc::tr("%1 is in use by %2. Choose another name.")
-                             .arg(QDir::toNativeSeparators(written), holder));
+            KsMessageBox(
+                CKsDoc::tr("%1 is in use by %2. Choose another name.").arg(QDir::toNativeSeparators(written), holder));
             continue;
         }
         // A file whose name differs in its case only is the one that the user means.

@@ -164,15 +164,13 @@ void CKsFileBar::KeepHeight()
         int length = 0;
         for (const QPushButton* button : row.buttons)
             length += button->isHidden() ? 0 : button->sizeHint().width() + buttons->spacing();
-        QLayout* const cells = row.widget->layout();
-        const QMargins around = cells->contentsMargins();
+        const QMargins around = row.widget->layout()->contentsMargins();
         const bool fits = length <= width - around.left() - around.right();
         buttons->setDirection(fits ? QBoxLayout::LeftToRight : QBoxLayout::TopToBottom);
-        cells->invalidate(); // it would hear of that later
-        cells->activate();
+        for (QWidget* changed : {row.actions, row.widget}) // what is around them would hear of it later
+            changed->updateGeometry();
     }
     QLayout* const rows = m_area->widget()->layout();
-    rows->invalidate();
     rows->activate();
     setFixedHeight(std::clamp(rows->totalHeightForWidth(width), 0, most) + 2 * frameWidth());
 }

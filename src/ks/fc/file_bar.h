@@ -15,9 +15,9 @@ class QPushButton;
 class QScrollArea;
 class QToolButton;
 
-/// One row for each notice of the document; hidden while there is none. It takes no more than its share of the view, and
-/// scrolls when that is not enough. After an open it also shows the list of what
-/// was not taken, once the window has been painted.
+/// One row for each notice of the document; hidden while there is none. It takes no more than its share of the view,
+/// and scrolls when that is not enough. After an open it also shows the list of what was not taken, once the window has
+/// been painted.
 class KS_API CKsFileBar : public QFrame
 {
     Q_OBJECT
@@ -52,7 +52,7 @@ private:
     CKsProjectDoc& m_document;
     std::vector<KsFileNotice> m_notices; // as they are shown
     std::vector<Row> m_rows;             // at least as many; the others are hidden
-    QScrollArea* m_area;     // child, holds the rows
-    QPointer<QWidget> m_before; // had the focus before it came into the bar
+    QScrollArea* m_area;                 // child, holds the rows
+    QPointer<QWidget> m_before;          // had the focus before it came into the bar
     QPointer<CKsFindingsDialog> m_dialog;
 };

@@ -101,11 +101,12 @@ void CKsOutsideChange::Append(std::vector<KsFileNotice>& notices)
         notice = OtherContent();
     } else if (Sight().kind == KsFileSight::Gone) {
         const bool hasFolder = QFileInfo(m_document.File().Path()).dir().exists();
-        notice.text = (hasFolder ? tr("%1 was removed or renamed by another program (%2). What is shown is nowhere else "
-                                      "until it is saved again.")
-                                 : tr("The folder of %1 was removed or renamed by another program (%2). What is shown "
-                                      "can be saved under another name only."))
-                          .arg(Name(), TimeText(Sight().time));
+        notice.text =
+            (hasFolder ? tr("%1 was removed or renamed by another program (%2). What is shown is nowhere else "
+                            "until it is saved again.")
+                       : tr("The folder of %1 was removed or renamed by another program (%2). What is shown "
+                            "can be saved under another name only."))
+                .arg(Name(), TimeText(Sight().time));
         if (hasFolder && !m_document.IsInUse())
             notice.actions.push_back(
                 {tr("Save Again"), [this](CKsFileBar&) { m_document.DoSave(m_document.GetPathName()); }});
