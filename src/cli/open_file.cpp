@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <iostream>
+#include <map>
 
 int Complain(std::string_view message, int code)
 {
@@ -22,10 +23,28 @@ int ComplainUnread(const Error& error)
     return Complain(error.message, error.code == std::errc::not_enough_memory ? Exit::NoMemory : Exit::Unreadable);
 }
 
-void PrintFinding(std::ostream& stream, const std::string& path, const Finding& finding)
+void PrintFindings(std::ostream& stream, const std::string& path, const std::vector<Finding>& findings)
 {
-    stream << Printable(path) << ':' << finding.line << ':' << finding.column << ": " << Printable(FindingText(finding))
-           << '\n';
+    constexpr std::size_t Most = 1000; // of a kind: a file may have a finding in every line
+    struct Listed
+    {
+        std::size_t count = 0;
+        const Finding* last = nullptr; // that was printed
+    };
+    const std::string file = Printable(path);
+    std::map<Finding::Kind, Listed> kinds;
+    for (const Finding& finding : findings) {
+        Listed& kind = kinds[finding.kind];
+        if (++kind.count > Most)
+            continue;
+        stream << file << ':' << finding.line << ':' << finding.column << ": " << Printable(FindingText(finding))
+               << '\n';
+        kind.last = &finding;
+    }
+    for (const auto& [kind, listed] : kinds)
+        if (listed.count > Most)
+            stream << file << ": " << listed.count - Most << " more like the one in line " << listed.last->line
+                   << ", column " << listed.last->column << '\n';
 }
 
 int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters, FileVersion* version)
@@ -37,14 +56,13 @@ int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters
     if (!tqlTargetByNameNum(handle, HDTargetName, 1))
         return Complain(path + " is no HD parameter file: it has no target [" + HDTargetName + "].", Exit::Unreadable);
     LoadReport report(handle);
-    const UndatedObjects undated;
+    const DatedObjects undated{HDDateTime()};
     parameters = HD_Parameters();
     parameters.Load(handle, &report);
     if (purpose == Purpose::Read)
         return Exit::Fine;
     const auto findings = report.Take();
-    for (const Finding& finding : findings)
-        PrintFinding(std::cerr, path, finding);
+    PrintFindings(std::cerr, path, findings);
     if (std::ranges::any_of(findings, &Finding::LosesContent))
         return Complain("Nothing was written, because something of what is listed above would be lost.",
                         Exit::Findings);

@@ -35,5 +35,5 @@ int LockFile(const std::string& path, FileLock& lock);
 int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
             const std::optional<FileVersion>& expected = {});
 
-/// Prints "file:line:column: text".
-void PrintFinding(std::ostream& stream, const std::string& path, const Finding& finding);
+/// Prints "file:line:column: text" of each; of a kind the first thousand, and how many more there are.
+void PrintFindings(std::ostream& stream, const std::string& path, const std::vector<Finding>& findings);

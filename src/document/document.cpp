@@ -47,7 +47,14 @@ private:
 
 } // namespace
 
-CKavo0_hdDoc::CKavo0_hdDoc() : CKsProjectDoc(HDPackageKind) {}
+/// Here, as each library has the date of its own objects.
+HD_Parameters CKavo0_hdDoc::NewContent() const
+{
+    const DatedObjects dated(DateOfFile());
+    return {};
+}
+
+CKavo0_hdDoc::CKavo0_hdDoc() : CKsProjectDoc(HDPackageKind), m_parameters(NewContent()) {}
 
 bool CKavo0_hdDoc::HasExtension(const CString& path)
 {
@@ -152,7 +159,7 @@ Result<std::string> CKavo0_hdDoc::ContentText() const
 std::unique_ptr<QUndoCommand> CKavo0_hdDoc::MakeContentStep(tqlHandle structure, LoadReport& report,
                                                             const CString& text)
 {
-    HD_Parameters read;
+    HD_Parameters read = NewContent();
     read.Load(structure, &report);
     return std::make_unique<CReplaceContent<HD_Parameters>>(*this, text, m_parameters, std::move(read));
 }

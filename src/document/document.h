@@ -52,6 +52,7 @@ protected:
 
 private:
     bool WriteData(const CString& path, CPurgedLines& purged);
+    HD_Parameters NewContent() const;
     std::size_t UnwrittenSetups() const;
     /// Whether `target`, an existing file that this document was not read from, may be replaced.
     bool MayReplace(const CString& target, const CString& path);

@@ -5,24 +5,24 @@
 
 namespace {
 
-thread_local int undated = 0;
+thread_local const HDDateTime* dateOfObjects = nullptr; // of the innermost one
 
 } // namespace
 
-UndatedObjects::UndatedObjects()
+DatedObjects::DatedObjects(const HDDateTime& date) : m_before(dateOfObjects), m_date(date)
 {
-    ++undated;
+    dateOfObjects = &m_date;
 }
 
-UndatedObjects::~UndatedObjects()
+DatedObjects::~DatedObjects()
 {
-    --undated;
+    dateOfObjects = m_before;
 }
 
 HDDateTime HDDateTime::Now()
 {
-    if (undated)
-        return {};
+    if (dateOfObjects)
+        return *dateOfObjects;
     const std::time_t now = std::time(nullptr);
     const std::tm* const local = std::localtime(&now);
     if (!local)

@@ -1,6 +1,5 @@
 #include "files/difference.h"
 
-#include "files/field.h"
 #include "files/structure.h"
 
 #include <algorithm>
@@ -87,27 +86,6 @@ bool IsSameValue(tqlHandle a, tqlHandle b)
     std::string texts[2];
     return tqlGetType(a) == tqlGetType(b) && tqlGetString(a, &texts[0]) && tqlGetString(b, &texts[1]) &&
            texts[0] == texts[1];
-}
-
-constexpr int DateParameters = 6;
-
-/// The date that begins with a parameter; nothing when there is none.
-std::optional<HDDateTime> DateAt(tqlHandle param)
-{
-    std::int32_t parts[DateParameters] = {};
-    for (std::int32_t& part : parts) {
-        if (!param || !tqlGetInt(param, &part))
-            return {};
-        param = tqlNextParam(param);
-    }
-    return HDDateTime{parts[0], parts[1], parts[2], parts[3], parts[4], parts[5]};
-}
-
-bool IsDateOnOneSide(tqlHandle before, tqlHandle after)
-{
-    const auto old = DateAt(before), now = DateAt(after);
-    constexpr HDDateTime unset;
-    return old && now && ((*old == unset && now->IsValid()) || (*now == unset && old->IsValid()));
 }
 
 class Comparison
@@ -283,15 +261,10 @@ private:
     void Values(const Difference& place, tqlHandle before, tqlHandle after)
     {
         tqlHandle old = tqlParamByNum(before, 1), now = tqlParamByNum(after, 1);
-        int dateEnds = 0; // before this parameter
         for (int number = 1; old && now; ++number, old = tqlNextParam(old), now = tqlNextParam(now)) {
             const std::string_view texts[] = {tqlGetRawParam(old), tqlGetRawParam(now)};
-            if (number < dateEnds || texts[0] == texts[1] || IsSameValue(old, now))
+            if (texts[0] == texts[1] || IsSameValue(old, now))
                 continue;
-            if (IsDateOnOneSide(old, now)) {
-                dateEnds = number + DateParameters;
-                continue;
-            }
             Difference found = place;
             found.parameter = number;
             found.before = texts[0];

@@ -39,7 +39,6 @@ struct Differences
 
 /// Compares what two loaded structures say: numbers by value, however they are written. Lines are told to be another
 /// line's successor by what stands around them, so that a line put in is one difference. `most`: how many are listed.
-/// A date that is set on one side only is no difference: whoever reads a file that lacks it takes the time of day.
 Differences FindDifferences(tqlHandle before, tqlHandle after, std::size_t most = 1000);
 /// Likewise of two texts; nothing when one of them is no parameter file.
 std::optional<Differences> FindDifferences(std::string before, std::string after);

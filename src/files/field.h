@@ -20,22 +20,26 @@ struct HDDateTime
 {
     std::int32_t Year = 0, Month = 0, Day = 0, Hour = 0, Minute = 0, Second = 0;
 
-    /// Local time now, to the second; not set while there are UndatedObjects.
+    /// Local time now, to the second; what DatedObjects say while there are such.
     static HDDateTime Now();
     /// Whether the six integers are a date and time of the Gregorian calendar (years 100 to 9999).
     bool IsValid() const;
     friend bool operator==(const HDDateTime&, const HDDateTime&) = default;
 };
 
-/// While one lives, what this thread makes has dates that are not set where it would take the time now, for whoever
-/// reads files and must get the same from the same file.
-class UndatedObjects
+/// While one lives, what this thread makes has this date - which may be one that is not set - where it would take the
+/// time now, for whoever reads files and must get the same from the same file.
+class DatedObjects
 {
 public:
-    UndatedObjects();
-    ~UndatedObjects();
-    UndatedObjects(const UndatedObjects&) = delete;
-    UndatedObjects& operator=(const UndatedObjects&) = delete;
+    explicit DatedObjects(const HDDateTime& date);
+    ~DatedObjects();
+    DatedObjects(const DatedObjects&) = delete;
+    DatedObjects& operator=(const DatedObjects&) = delete;
+
+private:
+    const HDDateTime* m_before;
+    HDDateTime m_date;
 };
 
 enum class FieldKind

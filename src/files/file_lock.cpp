@@ -32,14 +32,20 @@ std::error_code LockPath(PlatformFile& platform, fs::path& path, FileStatus& sta
 }
 
 // What stands in a lock file: a line for each of these, the name and a blank before the value.
-constexpr const char *ProgramKey = "program ", *ProcessKey = "process ", *UserKey = "user ", *HostKey = "host ",
-                     *SinceKey = "since ";
+constexpr std::string_view ProgramKey = "program ", ProcessKey = "process ", UserKey = "user ", HostKey = "host ",
+                           SinceKey = "since ";
 
 std::string ThisHolder(std::string_view program)
 {
     const ProcessName process = ThisProcess();
-    return ProgramKey + std::string(program) + '\n' + ProcessKey + std::to_string(process.number) + '\n' + UserKey +
-           process.user + '\n' + HostKey + process.host + '\n' + SinceKey + std::to_string(std::time(nullptr)) + '\n';
+    std::string text;
+    const auto add = [&text](std::string_view key, std::string_view value) { text.append(key).append(value) += '\n'; };
+    add(ProgramKey, program);
+    add(ProcessKey, std::to_string(process.number));
+    add(UserKey, process.user);
+    add(HostKey, process.host);
+    add(SinceKey, std::to_string(std::time(nullptr)));
+    return text;
 }
 
 /// A value of a file that anybody may have written.
@@ -65,18 +71,52 @@ std::int64_t NumberOf(std::string_view text, std::string_view key)
     return number;
 }
 
-LockHolder ReadHolder(PlatformFile& platform, PlatformFile::Handle file)
+constexpr std::size_t LongestText = 1000; // of a lock file
+
+std::string ReadText(PlatformFile& platform, PlatformFile::Handle file)
 {
-    std::string text(1000, '\0');
+    std::string text(LongestText, '\0');
     std::size_t got = 0;
     if (platform.Read(file, text.data(), text.size(), got))
         got = 0;
     text.resize(got);
+    return text;
+}
+
+/// Whether it is what this program writes into a lock file, all of it, and nothing else.
+bool IsHolderText(std::string_view text)
+{
+    for (const std::string_view key : {ProgramKey, ProcessKey, UserKey, HostKey, SinceKey}) {
+        const std::size_t end = text.find('\n');
+        if (end == std::string_view::npos || !text.starts_with(key))
+            return false;
+        const std::string_view value = text.substr(key.size(), end - key.size());
+        const bool isNumber = key == ProcessKey || key == SinceKey;
+        if (isNumber && (value.empty() || value.find_first_not_of("0123456789") != std::string_view::npos))
+            return false;
+        text.remove_prefix(end + 1);
+    }
+    return text.empty();
+}
+
+LockHolder ReadHolder(PlatformFile& platform, PlatformFile::Handle file)
+{
+    const std::string text = ReadText(platform, file);
     return {.program = ValueOf(text, ProgramKey),
             .user = ValueOf(text, UserKey),
             .host = ValueOf(text, HostKey),
             .process = NumberOf(text, ProcessKey),
             .since = NumberOf(text, SinceKey)};
+}
+
+/// Of a file that is locked itself: the lock beside it that names its holder is that of a name which is not known here.
+LockHolder HolderOf(const FileStatus& file)
+{
+    ProcessName process = ProcessLocking(file.device, file.inode);
+    return {.program = std::move(process.program),
+            .user = std::move(process.user),
+            .host = std::move(process.host),
+            .process = process.number};
 }
 
 std::string TimeText(std::int64_t seconds)
@@ -114,9 +154,9 @@ bool IsLockFile(PlatformFile& platform, const fs::path& path, const FileStatus& 
     PlatformFile::Handle file = 0; // one of its own: it is read and then written from the start
     if (status.size == 0 || platform.Open(path, PlatformFile::Purpose::Read, file))
         return status.size == 0;
-    const LockHolder holder = ReadHolder(platform, file);
+    const std::string text = ReadText(platform, file);
     platform.Close(file);
-    return !holder.program.empty();
+    return text.size() == status.size && IsHolderText(text);
 }
 
 /// Of this process: a copy of it has their files open, too.
@@ -197,28 +237,40 @@ bool FileLock::TryOnce(const fs::path& path, std::string_view program, PlatformF
     m_platform = &platform;
     m_file = file;
     TheHeldFiles().Add(platform, file);
-    if (!platform.Cut(file, 0)) // a lock without a name on it is one, too
-        WriteAll(platform, file, ThisHolder(program));
+    // A lock without a name on it is one, too; half a name is not what the next one takes for left over.
+    if (!platform.Cut(file, 0) && WriteAll(platform, file, ThisHolder(program)))
+        platform.Cut(file, 0);
     return true;
 }
 
-/// Each of its names has a lock beside it. Who holds another one is not known.
-void FileLock::TryItself(const fs::path& path)
+/// Each of its names has a lock beside it, so a file of several is locked itself. False when somebody else has done so.
+bool FileLock::TryItself(const fs::path& path)
 {
     PlatformFile::Handle file = 0;
     if (m_platform->Open(path, PlatformFile::Purpose::Read, file))
-        return;
+        return true;
     const std::error_code locked = m_platform->Lock(file);
     if (!locked) {
         TheHeldFiles().Add(*m_platform, file);
         m_itself = file;
-        return;
+        return true;
     }
     m_platform->Close(file);
-    if (locked == std::errc::resource_unavailable_try_again) {
-        Release();
-        m_heldBy.emplace();
-    }
+    return locked != std::errc::resource_unavailable_try_again;
+}
+
+void FileLock::Follow(const std::string& path)
+{
+    fs::path file = PathFromUtf8(path);
+    FileStatus there, locked;
+    if (!m_platform || FollowLinks(*m_platform, file, there))
+        return;
+    if (m_itself && !m_platform->StatusOf(*m_itself, locked) && locked.IsSameFile(there))
+        return;
+    if (const auto before = std::exchange(m_itself, std::nullopt))
+        TheHeldFiles().Close(*m_platform, *before);
+    if (there.kind == FileStatus::Kind::File && there.links > 1)
+        TryItself(file); // who was faster edits it, as this program does
 }
 
 FileLock FileLock::Try(const std::string& path, std::string_view program, PlatformFile* platformOrNull)
@@ -236,8 +288,10 @@ FileLock FileLock::Try(const std::string& path, std::string_view program, Platfo
         isDone = lock.TryOnce(beside, program, platform);
     if (!isDone)
         lock.m_heldBy.emplace();
-    else if (lock.IsHeld() && status.kind == FileStatus::Kind::File && status.links > 1)
-        lock.TryItself(file);
+    else if (lock.IsHeld() && status.kind == FileStatus::Kind::File && status.links > 1 && !lock.TryItself(file)) {
+        lock.Release();
+        lock.m_heldBy = HolderOf(status);
+    }
     return lock;
 }
 

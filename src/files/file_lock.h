@@ -39,6 +39,8 @@ public:
     const std::optional<LockHolder>& HeldBy() const { return m_heldBy; }
     /// Why the folder takes no lock.
     std::error_code WhyNone() const { return m_whyNone; }
+    /// What stands there may be another file by now, or have got further names (hard links): these are kept out, too.
+    void Follow(const std::string& path);
     void Release();
     /// Copies of the process (process_copy.h) hold it, too, for as long as they work.
     void ShareWithCopies();
@@ -46,7 +48,7 @@ public:
     static void LeaveToOriginal();
 
 private:
-    void TryItself(const std::filesystem::path& file);
+    bool TryItself(const std::filesystem::path& file);
     bool TryOnce(const std::filesystem::path& path, std::string_view program, PlatformFile& platform);
 
     std::optional<LockHolder> m_heldBy;

@@ -8,9 +8,13 @@ struct ProcessName
 {
     std::string user{}, host{};
     std::int64_t number = 0;
+    std::string program{}; // of another process
 };
 /// Who runs this process and where, as far as the system tells; in UTF-8.
 ProcessName ThisProcess();
+/// The process of this computer that has locked a file (PlatformFile::Lock), as far as the system tells; otherwise
+/// number 0.
+ProcessName ProcessLocking(std::uint64_t device, std::uint64_t inode);
 /// Whether a process of this computer is surely gone.
 bool HasEnded(std::int64_t number);
 

@@ -60,7 +60,7 @@ CGenGrid::CGenGrid(QWidget* parent)
     connect(m_model, &CGridModel::layoutChanged, this, [this] {
         m_lastRow = CurrentRow();
         if (m_lastRow > 0)
-            m_currentLine = m_model->NameOf(m_lastRow - 1);
+            NoteLine(m_lastRow - 1);
     });
 }
 
@@ -97,11 +97,15 @@ void CGenGrid::Refresh()
 /// no other line takes its place: whoever types on would change one that nobody chose.
 void CGenGrid::FollowLine(int row, int column)
 {
+    const CKsDoc* const document = m_model->Document();
+    const bool isReplaced = document && std::exchange(m_contents, document->Contents()) != document->Contents();
     if (!m_currentLine || row == 0)
         return;
-    const int now = m_model->RowNamed(*m_currentLine, row - 1) + 1;
+    int now = m_model->RowNamed(*m_currentLine, row - 1) + 1;
+    if (now == 0 && isReplaced)
+        now = RowLikeCurrent(row);
     if (now > 0) {
-        m_currentLine = m_model->NameOf(now - 1);
+        NoteLine(now - 1);
         if (now != CurrentRow())
             SetCurrentCell(now, column);
     } else {
@@ -110,6 +114,32 @@ void CGenGrid::FollowLine(int row, int column)
         clearSelection();
         selectionModel()->clearCurrentIndex();
     }
+}
+
+void CGenGrid::NoteLine(int row)
+{
+    constexpr int First = 2; // branch and chainage, where a line is a place
+    m_currentLine = m_model->NameOf(row);
+    m_currentPlace.clear();
+    for (int column = 0; column < std::min(First, ColumnCount()); ++column)
+        m_currentPlace.push_back(m_model->Value(row, column));
+}
+
+/// Of other content: the line at the place of the one that was current, or else the one that stands where it stood.
+int CGenGrid::RowLikeCurrent(int row) const
+{
+    const auto isLike = [this](int line) {
+        for (int column = 0; column < int(m_currentPlace.size()); ++column)
+            if (m_model->Value(line - 1, column) != m_currentPlace[std::size_t(column)])
+                return false;
+        return true;
+    };
+    if (row <= RowCount() && isLike(row))
+        return row;
+    for (int line = m_model->FixedRows() + 1; line <= RowCount(); ++line)
+        if (isLike(line))
+            return line;
+    return std::min(row, RowCount());
 }
 
 void CGenGrid::Reload()
@@ -208,7 +238,7 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
     QTableView::currentChanged(current, previous); // closes an editor, whose text the cell takes
     if (!m_model->IsSyncing()) {
         if (currentIndex().isValid()) { // storing shows the rows afresh, with this line as the current one
-            m_currentLine = m_model->NameOf(currentIndex().row());
+            NoteLine(currentIndex().row());
             m_lineGone = false;
         }
         StoreEditedLine();

@@ -95,6 +95,8 @@ protected:
 private:
     bool LeaveField();
     void FollowLine(int row, int column);
+    void NoteLine(int row);
+    int RowLikeCurrent(int row) const;
 
     CGridModel* m_model; // these are children
     CGridDelegate* m_delegate;
@@ -104,6 +106,8 @@ private:
     IGridHost* m_host = nullptr;
     int m_lastRow = 0;                   // current at the last cell move
     std::optional<RowKey> m_currentLine; // its name; nothing where the line is gone
+    std::vector<CellValue> m_currentPlace; // what stands in its first cells
+    int m_contents = 0;                  // of the document, when the rows were last shown
     bool m_lineGone = false;
     bool m_modified = false; // since the last cell move
     int m_branchNameColumn = 0;

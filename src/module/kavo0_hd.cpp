@@ -12,23 +12,6 @@ CKsToolBarButton Button(int command, const char* icon)
     return {command, icon, LoadString(command)};
 }
 
-struct Undated
-{
-    UndatedObjects undated;
-};
-
-/// A document that is only read to be compared: dates that its file lacks are not set.
-class ComparedDocument : Undated, public CKavo0_hdDoc
-{
-};
-
-CKsDoc* MakeDocument()
-{
-    if (CMultiDocTemplate::ReadsToCompare())
-        return new ComparedDocument;
-    return new CKavo0_hdDoc;
-}
-
 } // namespace
 
 static void Load()
@@ -46,7 +29,7 @@ const KsSingleEditor& HDEditor()
         .documentResource = 4953,
         .bitmap = 4965,
         .documentStrings = [] { return LoadString(Str::DocumentTemplate); },
-        .classes = {MakeDocument, [] { return new CDlgFrame; }, [] { return new CKavo0_hdView; }},
+        .classes = {[] { return new CKavo0_hdDoc; }, [] { return new CDlgFrame; }, [] { return new CKavo0_hdView; }},
         .name = [] { return LoadString(Str::EditorName); },
         .toolBarName = [] { return LoadString(Str::ToolBarName); },
         .buttons = []() -> std::vector<CKsToolBarButton> {

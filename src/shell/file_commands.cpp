@@ -52,6 +52,30 @@ bool CFileCommands::Open(const QString& path, bool othersLater)
     return false;
 }
 
+void CFileCommands::OpenAll(const QStringList& paths)
+{
+    constexpr qsizetype MostTold = 10;
+    QStringList failed;
+    for (const QString& path : paths) {
+        bool opened = false;
+        QStringList said;
+        {
+            const CKsKeptMessages kept;
+            opened = Open(path, true);
+            said = kept.Texts();
+        }
+        if (!opened && !said.isEmpty()) // it was a question that ended it otherwise
+            failed << said.join(u'\n');
+        for (qsizetype i = 0; opened && i < said.size(); ++i)
+            KsMessageBox(said[i]);
+    }
+    const qsizetype more = failed.size() - MostTold;
+    if (more > 0)
+        failed = failed.first(MostTold) << tr("Files besides that could not be opened: %1").arg(more);
+    if (!failed.isEmpty())
+        KsMessageBox(failed.join(u'\n'));
+}
+
 void CFileCommands::New()
 {
     const auto& templates = CMultiDocTemplate::All();

@@ -18,6 +18,8 @@ public:
     /// Opens a document or a project; false when the user has been told why not. `othersLater`: see
     /// CProjectController::Open.
     bool Open(const QString& path, bool othersLater = false);
+    /// Opens several; what could not be opened is told together.
+    void OpenAll(const QStringList& paths);
     /// Whether a file may be one that can be opened, by its name.
     bool Knows(const QString& path) const;
 

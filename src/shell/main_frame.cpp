@@ -170,8 +170,7 @@ bool CMainFrame::TakeFiles(const QStringList& files, const QString& token)
         if (!MayLeave())
             return TellStatus(
                 tr("Not opened, as what is being typed here is no value: %1").arg(KsShownFileName(files.front())));
-        for (const QString& file : files)
-            OpenFile(file, true);
+        OpenFiles(files);
     });
     return true;
 }
@@ -259,10 +258,12 @@ void CMainFrame::dropEvent(QDropEvent* event)
     event->acceptProposedAction();
     if (!MayLeave())
         return;
+    QStringList files;
     for (const QUrl& url : urls) {
         if (url.isLocalFile())
-            OpenFile(url.toLocalFile());
+            files << url.toLocalFile();
     }
+    OpenFiles(files);
 }
 
 // ---- settings ----------------------------------------------------------------------------------

@@ -29,6 +29,8 @@ public:
     /// See CFileCommands::Open.
     bool OpenFile(const QString& path, bool othersLater = false) { return m_files.Open(path, othersLater); }
 
+    void OpenFiles(const QStringList& paths) { m_files.OpenAll(paths); }
+
     /// Those of another start of the program, which come to the front (CHandover). False while a question is open.
     bool TakeFiles(const QStringList& files, const QString& token);
 

@@ -13,6 +13,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QLayout>
+#include <utility>
 
 namespace {
 constexpr int ProjectTreeWidth = 190; // pixels, until the user pulls it
@@ -68,25 +69,29 @@ void CProjectController::Watch(CProjectHandle handle)
     auto watch = std::make_unique<CKsFileWatch>(nullptr);
     connect(watch.get(), &CKsFileWatch::Changed, this, [this, handle] { FileChanged(handle); });
     watch->Expect(project->path, project->version, project->seen);
-    m_watches[handle] = std::move(watch);
+    m_watches[handle].watch = std::move(watch);
 }
 
 /// Nothing of a project is edited here, so its file is simply read again. Files that are open stay open.
 void CProjectController::FileChanged(CProjectHandle handle)
 {
     const CProject* project = m_projects.Find(handle);
-    CKsFileWatch& watch = *m_watches.at(handle);
+    Watched& watched = m_watches.at(handle);
+    CKsFileWatch& watch = *watched.watch;
     const KsFileSight& sight = watch.Sight();
-    if (!project || sight.kind == KsFileSight::Known)
+    const bool wasAmiss = std::exchange(watched.isAmiss, false);
+    if (!project || (sight.kind == KsFileSight::Known && !wasAmiss))
         return;
     const QString name = KsShownFileName(project->path);
     if (sight.kind == KsFileSight::Gone) {
+        watched.isAmiss = true;
         m_frame.TellStatus(tr("%1 was removed or renamed by another program. Its files stay open.").arg(name));
         return;
     }
     const bool isOurs = sight.kind == KsFileSight::Other && sight.version == project->version;
     QString error = sight.why ? KsSystemSentence(sight.why) : QString();
     if (!isOurs && (sight.why || !m_projects.ReadAgain(handle, error))) {
+        watched.isAmiss = true;
         m_frame.TellStatus(tr("%1 was changed by another program and cannot be read: %2").arg(name, error));
         return;
     }
@@ -94,6 +99,8 @@ void CProjectController::FileChanged(CProjectHandle handle)
     if (isOurs)
         return;
     UpdateTree();
+    if (wasAmiss)
+        return m_frame.TellStatus(tr("%1 can be read again. The list of its files is that of the file.").arg(name));
     m_frame.TellStatus(tr("%1 was changed by another program. The list of its files has been read again.").arg(name));
 }
 

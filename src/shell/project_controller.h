@@ -56,6 +56,11 @@ private:
     CWindowManager& m_windows;
     const CPlugins& m_plugins;
     CProjects m_projects;
-    CProjectTree* m_tree;                                              // the frame's
-    std::map<CProjectHandle, std::unique_ptr<CKsFileWatch>> m_watches; // of the files of projects
+    CProjectTree* m_tree; // the frame's
+    struct Watched
+    {
+        std::unique_ptr<CKsFileWatch> watch;
+        bool isAmiss = false; // the user has been told that the file is gone or cannot be read
+    };
+    std::map<CProjectHandle, Watched> m_watches; // of the files of projects
 };

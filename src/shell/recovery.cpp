@@ -83,6 +83,7 @@ bool CRecovery::Open(const CRecoverable& item)
             tr("The changes to %1 could not be recovered: what was kept of them cannot be read.").arg(item.Name()));
         return false;
     }
+    const CKsDatesOfFiles dates(item.header.dateOfFile);
     const bool isSame = StateOf(item.header) == CRecoverable::Same;
     const CKsDoc* open = isSame ? m_plugins.FindDocument(item.header.path) : nullptr;
     bool isBeside = !isSame || (open && open->IsModified());
@@ -100,8 +101,10 @@ bool CRecovery::Open(const CRecoverable& item)
                          .arg(item.Name()));
         return false;
     }
-    if (isBeside && !item.header.path.isEmpty())
+    if (isBeside && !item.header.path.isEmpty()) {
+        document->StandBeside(item.header.path);
         document->SetTitle(FreeTitle(QFileInfo(item.header.path).completeBaseName()));
+    }
     if (CSnapshot* snapshot = m_snapshots.Of(document))
         snapshot->Continue(item.file);
     return true;
@@ -123,6 +126,7 @@ std::optional<Differences> CRecovery::Compare(const CRecoverable& item) const
         return {};
     // Both as the editor writes them: what is written otherwise in the file is no change.
     const bool hasFile = QFileInfo(item.header.path).isFile();
+    const CKsDatesOfFiles dates(item.header.dateOfFile);
     Result<std::string> before = item.editor->ContentOf(hasFile ? item.header.path : QString());
     return before ? FindDifferences(std::move(before.value()), std::move(content)) : std::nullopt;
 }

@@ -6,6 +6,7 @@
 #include <QCryptographicHash>
 #include <QDir>
 #include <QFileInfo>
+#include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <fstream>
@@ -17,7 +18,7 @@ constexpr std::uintmax_t LongestHeader = 64 * 1024, LongestContent = 0x7fff'ffff
 
 namespace Key {
 constexpr QLatin1String Format("format"), Path("file"), Size("fileSize"), Hash("fileHash"), Extension("extension"),
-    Title("title"), Time("time"), ContentSize("size"), ContentHash("hash");
+    Title("title"), Time("time"), DateOfFile("dateOfFile"), ContentSize("size"), ContentHash("hash");
 }
 
 QByteArray HashOf(const std::string& text)
@@ -35,6 +36,26 @@ bool IsHash(const QString& text)
     return text.size() == length && QByteArray::fromHex(text.toLatin1()).size() == length / 2;
 }
 
+constexpr std::int32_t HDDateTime::*DateParts[] = {&HDDateTime::Year, &HDDateTime::Month,  &HDDateTime::Day,
+                                                   &HDDateTime::Hour, &HDDateTime::Minute, &HDDateTime::Second};
+
+/// Nothing that is no date.
+HDDateTime DateFrom(const QJsonArray& parts)
+{
+    HDDateTime date;
+    for (qsizetype i = 0; i < parts.size() && i < qsizetype(std::size(DateParts)); ++i)
+        date.*DateParts[i] = parts[i].toInt();
+    return date.IsValid() ? date : HDDateTime();
+}
+
+QJsonArray PartsOf(const HDDateTime& date)
+{
+    QJsonArray parts;
+    for (const auto part : DateParts)
+        parts << date.*part;
+    return parts;
+}
+
 /// A header is what the program writes, or none: types, lengths, and a path that is one.
 std::optional<CRecoveryHeader> FromJson(const QJsonObject& json)
 {
@@ -49,7 +70,8 @@ std::optional<CRecoveryHeader> FromJson(const QJsonObject& json)
                            .hash = json.value(Key::Hash).toString().toLatin1(),
                            .extension = json.value(Key::Extension).toString(),
                            .title = json.value(Key::Title).toString(),
-                           .time = QDateTime::fromString(json.value(Key::Time).toString(), Qt::ISODateWithMs)};
+                           .time = QDateTime::fromString(json.value(Key::Time).toString(), Qt::ISODateWithMs),
+                           .dateOfFile = DateFrom(json.value(Key::DateOfFile).toArray())};
     const bool isPath = QDir::isAbsolutePath(header.path) && QDir::cleanPath(header.path) == header.path &&
                         header.path.endsWith(header.extension, Qt::CaseInsensitive);
     const bool isWhole = json.value(Key::Format).toInteger() == Format && header.time.isValid() &&
@@ -82,6 +104,7 @@ std::string RecoveryText(const CRecoveryHeader& header, const std::string& conte
                            {Key::Extension, header.extension},
                            {Key::Title, header.title},
                            {Key::Time, header.time.toUTC().toString(Qt::ISODateWithMs)},
+                           {Key::DateOfFile, PartsOf(header.dateOfFile)},
                            {Key::ContentSize, qint64(content.size())},
                            {Key::ContentHash, QString::fromLatin1(HashOf(content))}};
     std::string text = QJsonDocument(json).toJson(QJsonDocument::Compact).toStdString() + '\n';

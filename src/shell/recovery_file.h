@@ -1,6 +1,8 @@
 // The file that keeps what has not been saved of a document.
 #pragma once
 
+#include "files/field.h"
+
 #include <QByteArray>
 #include <QDateTime>
 #include <QString>
@@ -19,7 +21,8 @@ struct CRecoveryHeader
     QByteArray hash{};   // of that file as the document knew it; empty where somebody else has changed it since
     QString extension{}; // of the files of the document's kind
     QString title{};
-    QDateTime time{}; // of the content
+    QDateTime time{};        // of the content
+    HDDateTime dateOfFile{}; // what stands in the content for dates that the file lacked (CKsDoc); may be unset
 };
 
 /// The text of such a file.

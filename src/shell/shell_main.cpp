@@ -72,8 +72,7 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
     frame.LoadPlugins(parser.value(plugins));
     frame.show();
     // Before control returns to the event loop: the first thing painted is the first page, not an empty frame.
-    for (const QString& file : files)
-        frame.OpenFile(file, true);
+    frame.OpenFiles(files);
     std::optional<CHandover> others;
     if (!isSeparate)
         others.emplace(std::bind_front(&CMainFrame::TakeFiles, &frame));

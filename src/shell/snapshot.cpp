@@ -103,10 +103,13 @@ std::error_code CSnapshot::StartWriter()
     } else if (const Result<void> secured = m_folder.Secure(m_file); !secured) {
         return secured.error().code;
     }
-    const CRecoveryHeader header{.path = m_document.GetPathName(),
+    // What was recovered beside its file is that file's changes until it has one of its own.
+    const QString& path = m_document.GetPathName();
+    const CRecoveryHeader header{.path = path.isEmpty() ? m_document.StandsBeside() : path,
                                  .extension = m_document.GetDocTemplate()->GetDocString(CMultiDocTemplate::filterExt),
                                  .title = m_document.GetTitle(),
-                                 .time = QDateTime::currentDateTimeUtc()};
+                                 .time = QDateTime::currentDateTimeUtc(),
+                                 .dateOfFile = m_document.DateOfFile()};
     Result<ProcessCopy> writer = ProcessCopy::Start([&] { return WriteContent(m_document, header, m_file); });
     if (!writer)
         return writer.error().code;

@@ -54,7 +54,11 @@ TEST_F(Locks, AFileOfSeveralNamesHasOneLock)
     fs::create_hard_link(m_folder / "river.hdkv", m_folder / "other.hdkv");
     FileLock first = FileLock::Try(Path("river.hdkv"), "first");
     ASSERT_TRUE(first.IsHeld());
-    EXPECT_TRUE(FileLock::Try(Path("other.hdkv"), "second").HeldBy());
+    const FileLock second = FileLock::Try(Path("other.hdkv"), "second");
+    ASSERT_TRUE(second.HeldBy());
+    EXPECT_EQ(second.HeldBy()->process, ThisProcess().number) << "whoever has it is named by the system";
+    EXPECT_EQ(second.HeldBy()->user + second.HeldBy()->host, ThisProcess().user + ThisProcess().host);
+    EXPECT_TRUE(HolderText(*second.HeldBy()).ends_with("process " + std::to_string(ThisProcess().number) + ')'));
     // A copy of the process that goes on for a while holds nothing.
     auto copy = ProcessCopy::Start([] {
         std::this_thread::sleep_for(60s);
@@ -66,11 +70,23 @@ TEST_F(Locks, AFileOfSeveralNamesHasOneLock)
     EXPECT_TRUE(FileLock::WaitFor(Path("other.hdkv"), "second", 10s).IsHeld());
     copy.value().Stop();
     EXPECT_EQ(FileCount(), 2u);
+    // A name that is given to a file while it is in use, and a file that gets into the place of one.
+    Write("a.hdkv", "x");
+    FileLock late = FileLock::Try(Path("a.hdkv"), "first");
+    fs::create_hard_link(m_folder / "a.hdkv", m_folder / "b.hdkv");
+    EXPECT_TRUE(FileLock::Try(Path("b.hdkv"), "second").IsHeld());
+    late.Follow(Path("a.hdkv"));
+    EXPECT_TRUE(FileLock::Try(Path("b.hdkv"), "second").HeldBy());
+    fs::remove(m_folder / "a.hdkv");
+    Write("a.hdkv", "y");
+    late.Follow(Path("a.hdkv"));
+    EXPECT_TRUE(FileLock::Try(Path("b.hdkv"), "second").IsHeld()) << "it is another file";
+    EXPECT_TRUE(FileLock::Try(Path("a.hdkv"), "second").HeldBy());
 }
 
 TEST_F(Locks, WhatADeadProgramOrAnybodyElseLeavesIsNoLock)
 {
-    Write(".river.hdkv.lock", "program kvrshell\nprocess 1\n");
+    Write(".river.hdkv.lock", "program kvrshell\nprocess 1\nuser a b\nhost h\nsince 17\n");
     EXPECT_TRUE(FileLock::Try(Path("river.hdkv"), "second").IsHeld());
     // Whatever stands in a lock file that is held, it is shown as one short line.
     Write(".river.hdkv.lock", "user a\x1b[2J" + std::string(5000, 'u') + "\nprocess 99999999999999999999\nsince x\n");
@@ -100,9 +116,13 @@ TEST_F(Locks, AFolderThatTakesNoneSaysWhy)
         fs::remove(m_folder / ".river.hdkv.lock");
     }
     // A file of the user's that happens to be called so, or has another name besides, is left alone.
-    Write(".river.hdkv.lock", "what the user wrote");
-    EXPECT_EQ(FileLock::Try(Path("river.hdkv"), "first").WhyNone(), std::errc::file_exists);
-    EXPECT_EQ(Text(".river.hdkv.lock"), "what the user wrote");
+    for (const char* theirs : {"what the user wrote", "program for the summer\n", "program a\nprocess 1\nuser\n",
+                               "program a\nprocess 1\nuser b\nhost c\nsince then\n",
+                               "program a\nprocess 1\nuser b\nhost c\nsince 1\nand more"}) {
+        Write(".river.hdkv.lock", theirs);
+        EXPECT_EQ(FileLock::Try(Path("river.hdkv"), "first").WhyNone(), std::errc::file_exists);
+        EXPECT_EQ(Text(".river.hdkv.lock"), theirs);
+    }
     Write(".river.hdkv.lock", "");
     fs::create_hard_link(m_folder / ".river.hdkv.lock", m_folder / "kept");
     EXPECT_EQ(FileLock::Try(Path("river.hdkv"), "first").WhyNone(), std::errc::file_exists);

@@ -51,13 +51,19 @@ class Outside(Case):
 
     def test_reload_is_a_step_to_undo(self):
         editor = self.open()
-        self.write()
+        editor.click_cell(2, 4)  # MOORBECK, 200
+        self.write(new='"MOORBECK", 100, 7.5, 10.5\nDATA = "INN", 50, 1, 2')
         self.wait_told(CHANGED, 'moor.HDKV', 'Reload takes the file')
         self.assertEqual(self.level(), '1.25', 'what is shown stays')
         self.choose('Reload')
         wait_for(lambda: self.level() == '7.5', 'the file is shown')
         self.wait_untold()
         self.assertFalse(editor.modified)
+        editor.type('9.25')  # the focus and the cell are where they were, on the same line
+        editor.press('Return')
+        wait_for(lambda: editor.table().line(3) == ['MOORBECK', '200', '1.5', '9.25'], 'its line has what is typed')
+        editor.press('ctrl+z')
+        wait_for(lambda: not editor.modified, 'undo takes it back')
         editor.press('ctrl+z')
         wait_for(lambda: self.level() == '1.25', 'undo brings back what was shown')
         self.assertTrue(editor.modified)
@@ -178,6 +184,11 @@ class Outside(Case):
         samples.write(self.path('moor.kvrp'), samples.project_text('moor.HDKV', 'moor.kvnw', 'new.kvxs'))
         wait_for(lambda: 'has been read again' in editor.status(), 'the status bar says so')
         self.assertEqual(editor.project_files(), ['moor.HDKV', 'moor.kvnw', 'new.kvxs (missing)'])
+        text = self.saved('moor.kvrp').text
+        samples.write(self.path('moor.kvrp'), '[KVR_PROJECT]\n[Members]\n')
+        wait_for(lambda: 'cannot be read' in editor.status(), 'so is a file that is damaged')
+        samples.write(self.path('moor.kvrp'), text)
+        wait_for(lambda: 'can be read again' in editor.status(), 'and one that has been put back')
         self.assertEqual(len(editor.windows()), 3)
 
     def test_japanese(self):

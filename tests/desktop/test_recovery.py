@@ -127,6 +127,13 @@ class Recovery(Case):
         self.assertIn('moor (recovered)', editor.title)
         self.assertEqual(editor.table().cell(1, 3).name, '2.625')
         self.assertEqual(self.saved().text, other)
+        editor.press('ctrl+s')
+        editor.box()
+        editor.press('Return')  # a free name beside that file is proposed
+        wait_for(lambda: 'moor-2.HDKV' in editor.title and not editor.modified, 'the changes stand beside the file')
+        self.assert_no_message()
+        self.assertIn('2.625', self.saved('moor-2.HDKV').records('InitList')[0])
+        self.assertEqual(self.saved().text, other)
 
     def test_what_cannot_be_kept_is_told_until_it_can(self):
         notice = '^Recovery after a crash does not work'

@@ -82,6 +82,12 @@ class ReadOnly(Two):
         self.press_button('Edit a Copy...')
         editor.box()
         editor.press('ctrl+a')
+        editor.type(f'{self.folder}/moor.HDKV')  # of all names the one that is in use
+        editor.press('Return')
+        wait_for(lambda: 'is in use by' in '\n'.join(editor.box_texts()), 'the name is refused')
+        self.assertIn('Choose another name', '\n'.join(editor.answer()))
+        editor.box()
+        editor.press('ctrl+a')
         editor.type(f'{self.folder}/copy.HDKV')
         editor.press('Return')
         wait_for(lambda: 'copy.HDKV' in editor.title, 'the window is that of the copy')

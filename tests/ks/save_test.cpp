@@ -258,4 +258,14 @@ TEST_F(KsTest, AnOpenFileIsFollowedByItsContent)
     QTest::qWait(900);
     EXPECT_EQ(news.count(), 1) << "a save of ours";
     EXPECT_EQ(direct.Sight().kind, KsFileSight::Known);
+
+    // What is too large to be read is what it was as long as nobody touches it.
+    constexpr std::uint64_t huge = (std::uint64_t(1) << 31) + 1;
+    ASSERT_TRUE(QFile::resize(path, qint64(huge)));
+    for (CKsFileWatch* watch : {&direct, &linked})
+        watch->Expect(path, FileVersion{.size = huge}, StatusBehind(path.toStdString()));
+    QTest::qWait(600);
+    EXPECT_EQ(direct.Sight().kind, KsFileSight::Known);
+    std::filesystem::last_write_time(path.toStdString(), std::filesystem::file_time_type::clock::now());
+    EXPECT_TRUE(becomes(KsFileSight::Other));
 }

@@ -70,6 +70,20 @@ TEST_F(ShellTest, FilesAreDroppedIn)
     QApplication::sendEvent(frame.get(), &drop);
     EXPECT_EQ(Texts().findChildren<CKsDoc*>().size(), 2);
 
+    // What cannot be opened is told once, however many there are; the others open.
+    QList<QUrl> many{QUrl::fromLocalFile(Write("last.tst"))};
+    for (int i = 300; i > 0; --i)
+        many.prepend(QUrl::fromLocalFile(Path(QString("gone%1.tst").arg(i))));
+    data.setUrls(many);
+    QDragEnterEvent enterMany(QPoint(5, 5), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    QApplication::sendEvent(frame.get(), &enterMany);
+    QDropEvent dropMany(QPointF(5, 5), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
+    QApplication::sendEvent(frame.get(), &dropMany);
+    EXPECT_TRUE(ViewOf("last.tst"));
+    ASSERT_EQ(asked.size(), 1);
+    EXPECT_TRUE(asked[0].contains("gone1.tst") && asked[0].contains("gone10.tst") && !asked[0].contains("gone11.tst"));
+    EXPECT_TRUE(asked[0].endsWith("could not be opened: 290")) << asked[0].toStdString();
+
     data.setUrls({QUrl::fromLocalFile(Write("c.png"))});
     QDragEnterEvent other(QPoint(5, 5), Qt::CopyAction, &data, Qt::LeftButton, Qt::NoModifier);
     other.ignore();

@@ -275,6 +275,21 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
     EXPECT_EQ(titles.join(", "), "changed (recovered 2), changed (recovered), early (recovered), edited (recovered), "
                                  "missing (recovered)");
     EXPECT_EQ(Content(changed), others);
+    // Each is saved beside the file whose changes it has, under a name that is free; of one that is gone it is its own.
+    QStringList proposed;
+    KsSetFileDialogHandler([&proposed](const KsFileQuestion& question) {
+        proposed << question.proposal;
+        return QString();
+    });
+    for (const CMultiDocTemplate* documents : CMultiDocTemplate::All())
+        for (CKsDoc* document : documents->findChildren<CKsDoc*>(Qt::FindDirectChildrenOnly)) {
+            if (document->GetTitle().contains("recovered")) {
+                EXPECT_FALSE(document->DoSave({}));
+            }
+        }
+    proposed.sort();
+    EXPECT_EQ(proposed, (QStringList{Path("changed-2.HDKV"), Path("early-2.HDKV"), Path("edited-2.HDKV"),
+                                     Path("missing.HDKV"), Path("other/changed-2.HDKV")}));
 }
 
 TEST_F(RecoveryTest, ADamagedFileDoesNoHarm)
@@ -443,23 +458,30 @@ TEST_F(RecoveryTest, TheDialogSaysWhatDiffersAndDoesWhatIsChosen)
 {
     frame->OfferRecovery();
     EXPECT_EQ(frame->findChild<CRecoveryDialog*>(), nullptr) << "nothing to offer";
-    for (const char* name : {"a.HDKV", "b.HDKV", "c.HDKV"}) {
-        CKsDoc* document = Open(Write(name, HDText));
+    // Dates that a file lacks stand in the document as the time when it was opened, which is no change; another is one.
+    const QByteArray dated = HDText, undated = QByteArray(HDText).replace("LimitedPeriod", "OtherPeriod");
+    for (const auto& [name, text] : {std::pair("a.HDKV", undated), {"b.HDKV", undated}, {"c.HDKV", dated}}) {
+        CKsDoc* document = Open(Write(name, text));
         Change(document, "1.5", "2.5");
+        if (name == QString("b.HDKV"))
+            Change(document, "LimitedPeriodEnd = 20", "LimitedPeriodEnd = 19");
         ASSERT_TRUE(IsKept(document));
     }
-    Crash(); // finds them; another session asks again
+    QTest::qSleep(1000); // dates count seconds
+    Crash();             // finds them; another session asks again
     Restart();
     frame->OfferRecovery();
     auto* dialog = frame->findChild<CRecoveryDialog*>();
     ASSERT_TRUE(dialog);
     auto* table = dialog->findChild<QTableWidget*>();
     ASSERT_EQ(table->rowCount(), 3);
-    EXPECT_TRUE(QTest::qWaitFor([&] { return table->item(2, 2)->text() != "Comparing..."; }));
+    EXPECT_TRUE(QTest::qWaitFor([&] { return table->item(2, 2) && table->item(2, 2)->text() != "Comparing..."; }));
     EXPECT_EQ(table->item(0, 0)->text(), "c.HDKV") << "the latest first";
     EXPECT_TRUE(QRegularExpression("^\\d+/\\d+/\\d{4} \\d+:\\d\\d:\\d\\d").match(table->item(0, 1)->text()).hasMatch())
         << table->item(0, 1)->text().toStdString();
     EXPECT_EQ(table->item(0, 2)->text(), "Sections: 1; values changed: 1.");
+    EXPECT_EQ(table->item(1, 2)->text(), "Sections: 2; values changed: 2.");
+    EXPECT_EQ(table->item(2, 2)->text(), "Sections: 1; values changed: 1.");
     const auto press = [&](const char* text) {
         for (auto* button : dialog->findChildren<QPushButton*>())
             if (button->text() == text)

@@ -14,7 +14,19 @@
 #include <fstream>
 #include <utility>
 
-CKsDoc::CKsDoc() : m_undo(new QUndoStack(this))
+static std::optional<HDDateTime> dateOfFiles;
+
+CKsDatesOfFiles::CKsDatesOfFiles(const HDDateTime& date)
+    : m_before(std::exchange(dateOfFiles, date.IsValid() ? std::optional(date) : dateOfFiles))
+{
+}
+
+CKsDatesOfFiles::~CKsDatesOfFiles()
+{
+    dateOfFiles = m_before;
+}
+
+CKsDoc::CKsDoc() : m_dateOfFile(dateOfFiles.value_or(HDDateTime::Now())), m_undo(new QUndoStack(this))
 {
     // Undoing back to what was saved leaves nothing to save.
     connect(m_undo, &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
@@ -70,6 +82,11 @@ bool CKsDoc::TakeContent(std::string, const CString&)
 }
 
 void CKsDoc::HoldFile(const CString&) {}
+
+CString CKsDoc::HolderOf(const CString&) const
+{
+    return {};
+}
 
 bool CKsDoc::MayChange()
 {

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "base/result.h"
+#include "files/field.h"
 #include "files/platform_file.h"
 #include "ks/fc/change_place.h"
 #include "ks/fc/messages.h"
@@ -56,6 +57,20 @@ private:
     CKsDoc* m_document = nullptr;
 };
 
+/// While one lives, documents that are made take this for the dates that their file lacks: those that are compared with
+/// each other have the same. One that is not set changes nothing.
+class KS_API CKsDatesOfFiles
+{
+public:
+    explicit CKsDatesOfFiles(const HDDateTime& date);
+    ~CKsDatesOfFiles();
+    CKsDatesOfFiles(const CKsDatesOfFiles&) = delete;
+    CKsDatesOfFiles& operator=(const CKsDatesOfFiles&) = delete;
+
+private:
+    std::optional<HDDateTime> m_before;
+};
+
 /// A document: one file, its views, its modified flag and its undo stack. Owned by its template.
 class KS_API CKsDoc : public QObject
 {
@@ -91,6 +106,8 @@ public:
     virtual void HoldFile(const CString& path);
     /// Another program edits the file.
     virtual bool IsInUse() const { return false; }
+    /// Which other program has a file that a save might write, as users are told; empty when none has.
+    virtual CString HolderOf(const CString& path) const;
     /// Nothing may be changed.
     virtual bool IsReadOnly() const { return false; }
     /// Asked before whatever changes the content; undo steps ask by themselves. False: the user has been told why not,
@@ -99,6 +116,9 @@ public:
 
     /// What the file on the disk was when the document was read from it or written to it.
     virtual FileStatus Seen() const { return {}; }
+    /// What stands in the document for dates that its file lacked: the time when it was made, unless CKsDatesOfFiles
+    /// say another.
+    const HDDateTime& DateOfFile() const { return m_dateOfFile; }
 
     /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
     /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the user
@@ -110,6 +130,9 @@ public:
     /// Asks every view whether what is being typed there can be taken; see CView::MayLeave.
     bool MayLeave();
     bool IsExecuting() const { return m_executing; } // in the middle of an open or a save
+    /// A document without a file belongs beside this one: its first save proposes the name, or a free one like it.
+    void StandBeside(const CString& path) { m_beside = path; }
+    const CString& StandsBeside() const { return m_beside; }
 
     const CString& GetPathName() const { return m_path; } // empty until first saved
     void SetPathName(const CString& path);
@@ -126,6 +149,9 @@ public:
     /// The content changed: marks the document modified, updates all views but the sender, and gives the sender the
     /// focus back. Every command of the undo stack calls it (CDocumentCommand).
     virtual void UpdateAll(CView* sender = nullptr, int hint = ReloadHint, CHint* object = nullptr);
+    /// The whole content has become another: lines that views know are there no more, though their like may be.
+    void ContentReplaced() { ++m_contents; }
+    int Contents() const { return m_contents; } // how many it has had
     /// A step that is being undone or redone shows here; told (Reveal) when the step is complete.
     void StepShows(const ChangePlace& place) { m_stepShows = place; }
     /// Tells the user in passing.
@@ -157,7 +183,9 @@ private:
     void StepMade(int index);
     bool SaveTo(const CString& target);
 
-    CString m_path, m_title, m_whyNotSaved;
+    CString m_path, m_title, m_whyNotSaved, m_beside;
+    HDDateTime m_dateOfFile;
+    int m_contents = 0;
     std::vector<CView*> m_views;
     QUndoStack* m_undo = nullptr; // child object
     CMultiDocTemplate* m_template = nullptr;

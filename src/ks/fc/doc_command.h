@@ -20,6 +20,7 @@ protected:
     virtual ChangePlace Revert() = 0;
     /// Asked before the step is made; false when the user has been told why not.
     virtual bool IsAllowed() { return m_document.MayChange(); }
+    void ContentReplaced() { m_document.ContentReplaced(); }
 
 private:
     void Run(bool forward);
@@ -42,6 +43,7 @@ protected:
     ChangePlace Apply() override
     {
         std::swap(m_target, m_other);
+        ContentReplaced();
         return {};
     }
     ChangePlace Revert() override { return Apply(); }

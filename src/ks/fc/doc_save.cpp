@@ -21,9 +21,10 @@ CString AskSavePath(const CKsDoc& document, const CString& proposal)
     KsFileQuestion question;
     question.save = true;
     question.title = CKsDoc::tr("Save As");
-    question.proposal = !proposal.isEmpty()                ? proposal
-                        : document.GetPathName().isEmpty() ? document.GetTitle()
-                                                           : document.GetPathName();
+    question.proposal = !proposal.isEmpty()                  ? proposal
+                        : !document.GetPathName().isEmpty()  ? document.GetPathName()
+                        : !document.StandsBeside().isEmpty() ? KsFreeFileName(document.StandsBeside())
+                                                             : document.GetTitle();
     const CMultiDocTemplate* const documents = document.GetDocTemplate();
     if (documents) {
         question.filters = documents->FileDialogFilter();
@@ -39,6 +40,11 @@ CString AskSavePath(const CKsDoc& document, const CString& proposal)
         if (other && other != &document) {
             KsMessageBox(CKsDoc::tr("%1 is open in another window. Choose another name.")
                              .arg(QDir::toNativeSeparators(written)));
+            continue;
+        }
+        if (const CString holder = document.HolderOf(written); !holder.isEmpty()) {
+            KsMessageBox(
+                CKsDoc::tr("%1 is in use by %2. Choose another name.").arg(QDir::toNativeSeparators(written), holder));
             continue;
         }
         // A file whose name differs in its case only is the one that the user means.

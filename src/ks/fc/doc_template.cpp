@@ -9,14 +9,11 @@
 
 #include <QDir>
 #include <QFileInfo>
-#include <QScopedValueRollback>
 #include <QUndoStack>
 #include <algorithm>
 #include <new>
 
 namespace {
-
-bool readsToCompare = false;
 
 std::vector<CMultiDocTemplate*>& Templates()
 {
@@ -143,17 +140,11 @@ std::unique_ptr<CKsDoc> CMultiDocTemplate::ReadDocument(const CString& path)
 
 Result<std::string> CMultiDocTemplate::ContentOf(const CString& path)
 {
-    const QScopedValueRollback reading(readsToCompare, true);
     const auto document = ReadDocument(path);
     const auto* const read = dynamic_cast<const CKsProjectDoc*>(document.get());
     if (!document || (read && read->File().IsUnreadable()))
         return Error{};
     return document->ContentText();
-}
-
-bool CMultiDocTemplate::ReadsToCompare()
-{
-    return readsToCompare;
 }
 
 CKsDoc* CMultiDocTemplate::OpenDocumentFile(CKsMDIFrameWnd* frame, const CString& path)

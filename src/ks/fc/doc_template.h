@@ -62,11 +62,8 @@ public:
     /// document is the caller's.
     std::unique_ptr<CKsDoc> ReadDocument(const CString& path);
     /// Everything in a file - of a new document when the path is empty - as the editor writes it, for a comparison: what
-    /// is written otherwise in the file is no difference, and dates that it lacks are not set. An error when it cannot
-    /// be read.
+    /// is written otherwise in the file is no difference. An error when it cannot be read.
     Result<std::string> ContentOf(const CString& path);
-    /// The document that is being made is for ContentOf: an editor leaves dates unset that it would give the time now.
-    static bool ReadsToCompare();
     /// The open document of a file; null when there is none.
     CKsDoc* FindDocument(const CString& path) const;
 

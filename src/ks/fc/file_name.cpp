@@ -38,6 +38,15 @@ CString KsShownFileName(const CString& path)
     return name.size() <= Longest ? name : name.first(Side) + u'\u2026' + name.last(Side);
 }
 
+CString KsFreeFileName(const CString& path)
+{
+    const QFileInfo info(path);
+    CString name = path;
+    for (int number = 2; QFileInfo::exists(KsExistingSpelling(name)); ++number)
+        name = info.dir().filePath(info.completeBaseName() + u'-' + CString::number(number) + u'.' + info.suffix());
+    return name;
+}
+
 CString KsFileKey(const CString& path)
 {
     if (path.isEmpty())

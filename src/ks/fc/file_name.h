@@ -13,6 +13,8 @@ KS_API bool KsHasExtension(const CString& path, const CString& extension);
 KS_API CString KsFileFilter(const CString& name, const CString& extension);
 /// The name of a file for a text on the screen: one that is very long is cut in its middle.
 KS_API CString KsShownFileName(const CString& path);
+/// The path, or where something stands there the first of NAME-2, NAME-3, ... that is free.
+KS_API CString KsFreeFileName(const CString& path);
 /// Names a file, whichever of its paths is given: another spelling, a way through other folders, a link to it.
 KS_API CString KsFileKey(const CString& path);
 /// Whether two paths name one file as a user means it, in whatever case; an empty path names none. SameFile of

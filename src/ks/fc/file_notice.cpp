@@ -11,9 +11,11 @@ static CString WhyNoLock(std::error_code why)
 {
     const bool hasNone = why == std::errc::operation_not_supported || why == std::errc::function_not_supported ||
                          why == std::errc::no_lock_available;
-    return hasNone                         ? CKsFileBar::tr("its file system has no locks")
-           : why == std::errc::file_exists ? CKsFileBar::tr("another file has the name of the lock")
-                                           : KsSystemReason(why);
+    const bool isTaken = why == std::errc::file_exists || why == std::errc::is_a_directory ||
+                         why == std::errc::too_many_symbolic_link_levels;
+    return hasNone   ? CKsFileBar::tr("its file system has no locks")
+           : isTaken ? CKsFileBar::tr("another file has the name of the lock")
+                     : KsSystemReason(why);
 }
 
 void CKsProjectDoc::AddNoticeSource(KsNoticeSource source)

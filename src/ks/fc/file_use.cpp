@@ -22,8 +22,12 @@ CString HolderName(const FileLock& lock)
     const auto text = [](const std::string& each) { return KsVisibleText(QString::fromStdString(each)); };
     if (holder.user.empty() || !holder.process)
         return CKsFileUse::tr("another program");
+    const CString number = QString::number(holder.process);
+    if (!holder.since)
+        return CKsFileUse::tr("%1 on %2 (%3, process %4)")
+            .arg(text(holder.user), text(holder.host), text(holder.program), number);
     return CKsFileUse::tr("%1 on %2 (%3, process %4) since %5")
-        .arg(text(holder.user), text(holder.host), text(holder.program), QString::number(holder.process),
+        .arg(text(holder.user), text(holder.host), text(holder.program), number,
              KsDateTimeText(QDateTime::fromSecsSinceEpoch(holder.since)));
 }
 
@@ -99,12 +103,28 @@ CString CKsFileUse::TargetHolder() const
     return HolderName(m_target);
 }
 
-void CKsFileUse::TargetWritten(bool written)
+CString CKsFileUse::HolderOf(const CString& path) const
+{
+    if (m_lock.IsFor(path.toStdString()))
+        return {};
+    const FileLock lock = Lock(path);
+    return lock.HeldBy() ? HolderName(lock) : CString();
+}
+
+void CKsFileUse::Follow(const CString& path)
+{
+    m_lock.Follow(path.toStdString());
+}
+
+void CKsFileUse::TargetWritten(bool written, const CString& path)
 {
     FileLock target = std::exchange(m_target, FileLock());
-    if (!written || (!target.IsHeld() && !target.WhyNone())) // the lock of the file itself stays
+    if (!written)
         return;
+    if (!target.IsHeld() && !target.WhyNone()) // the lock of the file itself stays
+        return Follow(path);
     m_lock = std::move(target);
+    Follow(path);
     m_isFree = false;
     m_timer.stop();
     emit Changed();

@@ -35,8 +35,12 @@ public:
     bool TakeTarget(const CString& target);
     /// Who has it then.
     CString TargetHolder() const;
-    /// Whether it was written: then it is the document's file.
-    void TargetWritten(bool written);
+    /// Whether it was written: then it is the document's file, at this path.
+    void TargetWritten(bool written, const CString& path);
+    /// Who else has a file at present; empty when nobody has.
+    CString HolderOf(const CString& path) const;
+    /// The document's file may have got other names, or be another.
+    void Follow(const CString& path);
 
 signals:
     /// Whether somebody else has it is another matter now.

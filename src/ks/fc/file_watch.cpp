@@ -77,7 +77,7 @@ CKsFileWatch::Look CKsFileWatch::LookAt(const std::string& path, const FileStatu
     }
     look.why = VersionOfFile(platform, target, look.version, known);
     if (look.version.hash == 0) // it was not read, and may be another one of this size next time
-        look.version.hash = std::uint64_t(look.status.touched);
+        look.version.hash = IsUntouched(look.status, seen) ? version.hash : std::uint64_t(look.status.touched);
     FileStatus after;
     const bool isThere = !FollowLinks(platform, target, after);
     look.isMoving = !isThere || !IsUntouched(look.status, after);
@@ -156,8 +156,11 @@ void CKsFileWatch::Looked(const Look& look, int generation)
     }
     m_wasMissed = isMissed;
     m_isTrusted = look.isTrusted && !isMissed;
+    const bool hasMoreNames = look.status.links > m_seen.links && look.status.links > 1;
     m_seen = look.status;
     m_version = look.version;
+    if (hasMoreNames)
+        emit HasMoreNames();
     if (isGone)
         Take({.kind = KsFileSight::Gone, .time = Now()});
     else if (look.why && m_known)

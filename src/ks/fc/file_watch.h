@@ -46,6 +46,8 @@ public:
 signals:
     /// Sight() is another.
     void Changed();
+    /// The file has more names (hard links) than when it was last looked at.
+    void HasMoreNames();
 
 private:
     struct Look;

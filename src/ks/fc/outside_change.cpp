@@ -22,18 +22,6 @@ CString TimeText(std::int64_t nanoseconds)
     return KsDateTimeText(QDateTime::fromMSecsSinceEpoch(nanoseconds / 1'000'000));
 }
 
-/// The first of NAME-2, -3, ... that is free.
-CString FreeName(const CString& path)
-{
-    const QFileInfo info(path);
-    for (int number = 2;; ++number) {
-        const CString name =
-            info.dir().filePath(info.completeBaseName() + u'-' + CString::number(number) + u'.' + info.suffix());
-        if (!QFileInfo(KsExistingSpelling(name)).exists())
-            return name;
-    }
-}
-
 } // namespace
 
 CKsOutsideChange::CKsOutsideChange(CKsProjectDoc& document)
@@ -44,6 +32,7 @@ CKsOutsideChange::CKsOutsideChange(CKsProjectDoc& document)
         m_whyNotReloaded.clear();
         Refresh();
     });
+    connect(m_watch, &CKsFileWatch::HasMoreNames, &document, &CKsProjectDoc::FileHasMoreNames);
     // What a choice means depends on whether something is unsaved.
     connect(&document, &CKsDoc::TitleChanged, this, [this] {
         if (Sight().kind != KsFileSight::Known)
@@ -111,10 +100,14 @@ void CKsOutsideChange::Append(std::vector<KsFileNotice>& notices)
     if (Sight().kind == KsFileSight::Other) {
         notice = OtherContent();
     } else if (Sight().kind == KsFileSight::Gone) {
-        notice.text = tr("%1 was removed or renamed by another program (%2). What is shown is nowhere else until it is "
-                         "saved again.")
-                          .arg(Name(), TimeText(Sight().time));
-        if (!m_document.IsInUse())
+        const bool hasFolder = QFileInfo(m_document.File().Path()).dir().exists();
+        notice.text =
+            (hasFolder ? tr("%1 was removed or renamed by another program (%2). What is shown is nowhere else "
+                            "until it is saved again.")
+                       : tr("The folder of %1 was removed or renamed by another program (%2). What is shown "
+                            "can be saved under another name only."))
+                .arg(Name(), TimeText(Sight().time));
+        if (hasFolder && !m_document.IsInUse())
             notice.actions.push_back(
                 {tr("Save Again"), [this](CKsFileBar&) { m_document.DoSave(m_document.GetPathName()); }});
         notice.actions.push_back(saveAs);
@@ -145,6 +138,7 @@ void CKsOutsideChange::Compare(QWidget* parent)
         return;
     QApplication::setOverrideCursor(Qt::WaitCursor);
     Result<std::string> shown = m_document.ContentText();
+    const CKsDatesOfFiles dates(m_document.DateOfFile());
     Result<std::string> there = m_document.GetDocTemplate()->ContentOf(m_document.File().Path());
     const auto differences =
         shown && there ? FindDifferences(std::move(shown.value()), std::move(there.value())) : std::nullopt;
@@ -160,7 +154,7 @@ void CKsOutsideChange::Compare(QWidget* parent)
 
 void CKsOutsideChange::KeepBoth()
 {
-    m_document.DoSave({}, FreeName(m_document.GetPathName()));
+    m_document.DoSave({}, KsFreeFileName(m_document.GetPathName()));
 }
 
 void CKsOutsideChange::Overwrite()

@@ -77,7 +77,7 @@ bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
     try {
         if (written)
             EditUnreadable(); // a save may end with a step of its own
-        m_use.TargetWritten(written);
+        m_use.TargetWritten(written, m_file.Path());
     } catch (const std::bad_alloc&) { // the file is what it is; the bar is shown anew with the next news
     }
     return written;

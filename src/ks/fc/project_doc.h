@@ -34,6 +34,9 @@ public:
     /// The document becomes one of another name, for which the user is asked.
     void EditCopy();
     void HoldFile(const CString& path) final { m_use.Take(path); }
+    CString HolderOf(const CString& path) const final { return m_use.HolderOf(path); }
+    /// The file has got further names (hard links).
+    void FileHasMoreNames() { m_use.Follow(m_file.Path()); }
     /// What there is to say of the file, for the bar above the views; in the order in which it is shown.
     std::vector<KsFileNotice> Notices();
     /// Who has something to say of the file adds it here for as long as the document lives, and has the notices shown

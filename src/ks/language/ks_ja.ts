@@ -30,6 +30,10 @@
         <translation>%1 は別のウィンドウで開かれています。別の名前を指定してください。</translation>
     </message>
     <message>
+        <source>%1 is in use by %2. Choose another name.</source>
+        <translation>%1 は %2 が使用中です。別の名前を指定してください。</translation>
+    </message>
+    <message>
         <source>%1 exists already. Replace it?</source>
         <translation>%1 は既に存在します。置き換えますか?</translation>
     </message>
@@ -287,6 +291,10 @@ Save?</source>
         <source>%1 on %2 (%3, process %4) since %5</source>
         <translation>%2 の %1 (%3、プロセス %4、%5 から)</translation>
     </message>
+    <message>
+        <source>%1 on %2 (%3, process %4)</source>
+        <translation>%2 の %1 (%3、プロセス %4)</translation>
+    </message>
 </context>
 <context>
     <name>CKsOutsideChange</name>
@@ -333,6 +341,10 @@ Save?</source>
     <message>
         <source>%1 was removed or renamed by another program (%2). What is shown is nowhere else until it is saved again.</source>
         <translation>%1 はほかのプログラムによって削除されたか、名前が変更されました (%2)。表示されている内容は、もう一度保存するまでほかのどこにもありません。</translation>
+    </message>
+    <message>
+        <source>The folder of %1 was removed or renamed by another program (%2). What is shown can be saved under another name only.</source>
+        <translation>%1 のフォルダがほかのプログラムによって削除されたか、名前が変更されました (%2)。表示中の内容は別の名前でのみ保存できます。</translation>
     </message>
     <message>
         <source>%1 cannot be read any more: %2. What is shown stays; to be safe save it under another name.</source>

@@ -40,6 +40,10 @@ The editors read %2.</source>
         <source>Open Project</source>
         <translation>プロジェクトを開く</translation>
     </message>
+    <message>
+        <source>Files besides that could not be opened: %1</source>
+        <translation>このほかに開けなかったファイルの数: %1</translation>
+    </message>
 </context>
 <context>
     <name>CFrameAction</name>
@@ -391,6 +395,10 @@ The editors read %2.</source>
     <message>
         <source>%1 was changed by another program. The list of its files has been read again.</source>
         <translation>%1 はほかのプログラムによって変更されました。ファイルの一覧を読み込み直しました。</translation>
+    </message>
+    <message>
+        <source>%1 can be read again. The list of its files is that of the file.</source>
+        <translation>%1 を再び読み込めるようになりました。ファイルの一覧はこのファイルのとおりです。</translation>
     </message>
     <message>
         <source>The project could not be opened.
