@@ -255,8 +255,8 @@ bool CKsMDIFrameWnd::LeavesView(const QWidget* clicked) const
            !QApplication::activeModalWidget();
 }
 
-/// Asked when the frame's window gets the click: the widget that gets it afterwards has the focus by then, and its window
-/// is the active one.
+/// Asked when the frame's window gets the click: the widget that gets it afterwards has the focus by then, and its
+/// window is the active one.
 bool CKsMDIFrameWnd::eventFilter(QObject* object, QEvent* event)
 {
     if (event->type() == QEvent::MouseButtonPress && object == windowHandle()) {
