@@ -274,8 +274,19 @@ class WhileTyping(Case):
         self.assert_told_once('Invalid floating point number!', 'Delta', 'abc')
         editor.press('ctrl+a')
         editor.type('0.75\t')
+        editor.fill('NoIter', '1x', leave=None)  # waits for the page, and so for the window
+        editor.click(editor.table('Branches of the river network').cell(2, 2))
+        self.assert_told_once('NoIter', '1x')
+        self.assertIn('moor.HDKV', editor.title)
+        editor.press('Escape')
+        editor.go_to('Initial')
+        editor.empty(2, 3)
+        editor.click(editor.table('Branches of the river network').cell(2, 2))
+        self.assert_no_message()
+        editor.click_cell(1, 1)
         editor.save()
         self.assertEqual(self.saved().value('delta'), '0.75')
+        self.assertEqual(self.saved().records('InitList')[1].split(', ')[2], '3.5')
 
     def assert_borders_leave_the_cell_open(self, table, line, column):
         """Whoever drags a column's border, or double-clicks it, goes on typing in the open cell."""

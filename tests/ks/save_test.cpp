@@ -201,13 +201,16 @@ TEST_F(KsTest, WhatCannotBeTakenStopsSavingAndClosing)
     QObject::connect(button, &QPushButton::clicked, [&] { ++clicked; });
     bar->addWidget(button);
     frame.show();
-    QTest::mouseClick(button, Qt::LeftButton);
+    const auto click = [this](QWidget* widget) {
+        QTest::mouseClick(frame.windowHandle(), Qt::LeftButton, {}, widget->mapTo(&frame, widget->rect().center()));
+    };
+    click(button);
     EXPECT_EQ(clicked, 0);
     view->edit->setText("right");
-    QTest::mouseClick(button, Qt::LeftButton);
+    click(button);
     EXPECT_EQ(clicked, 1);
     LogView::log.clear();
-    QTest::mouseClick(view->edit, Qt::LeftButton);
+    click(view->edit);
     QTest::mouseClick(frame.menuBar(), Qt::LeftButton);
     EXPECT_EQ(LogView::log, QStringList());
 }

@@ -255,12 +255,14 @@ bool CKsMDIFrameWnd::LeavesView(const QWidget* clicked) const
            !QApplication::activeModalWidget();
 }
 
+/// Asked when the frame's window gets the click: the widget that gets it afterwards has the focus by then, and its
+/// window is the active one.
 bool CKsMDIFrameWnd::eventFilter(QObject* object, QEvent* event)
 {
-    if (event->type() == QEvent::MouseButtonPress && object->isWidgetType()) {
-        const QPointer<QWidget> clicked = static_cast<QWidget*>(object);
+    if (event->type() == QEvent::MouseButtonPress && object == windowHandle()) {
+        const QPointer<QWidget> clicked = childAt(static_cast<QMouseEvent*>(event)->position().toPoint());
         // What the question changes may take the clicked widget away.
-        if (LeavesView(clicked) && (!MayLeave() || !clicked))
+        if (clicked && LeavesView(clicked) && (!MayLeave() || !clicked))
             return true;
     }
     return QMainWindow::eventFilter(object, event);
