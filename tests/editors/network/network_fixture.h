@@ -117,7 +117,7 @@ protected:
     }
     static QString WriteNetwork(const QString& path, const CNetwork& network)
     {
-        const auto saved = SaveNetwork(network, path.toStdString());
+        const auto saved = SaveDeclaredFile(path.toStdString(), DeclaredNetworkFile(), &network);
         return saved ? QString() : QString::fromStdString(saved.error().message);
     }
     /// Opens the small network in a window.
