@@ -16,7 +16,7 @@ MUTANTS = [
     ('files', 'files/field_read.cpp', 'if (!tqlGetDouble(param, &number) || std::trunc(number) != number ||',
      'if (!tqlGetDouble(param, &number) ||'),
     ('files', 'files/field_read.cpp', 'number != 0 && number != 1', 'number < 0'),
-    ('files', 'files/temporary_file.cpp', 'sync ? m_platform.Sync(m_file) : std::error_code()', 'std::error_code()'),
+    ('files', 'files/temporary_file.cpp', 'sync ? m_platform.Sync(m_file)', 'sync ? std::error_code()'),
     ('files', 'files/safe_file.cpp', 'return error ? error : closed;', 'return closed ? error : error;'),
     ('files', 'files/temporary_file.cpp', 'text.remove_prefix(written);', 'text = {};'),
     ('files', 'files/safe_file.cpp', 'now.kind == Kind::None || m_platform.Status(m_target, left)',
