@@ -7,10 +7,10 @@
 
 std::string CheckNetworkFile(const std::string& text)
 {
-    return CheckFile(
-        text, [](tqlHandle structure, LoadReport& report) { const CNetwork network = LoadNetwork(structure, report);
-            return DeclaredText(DeclaredNetworkFile(), &network);
-        });
+    return CheckFile(text, [](tqlHandle structure, LoadReport& report) {
+        const CNetwork network = LoadNetwork(structure, report);
+        return DeclaredText(DeclaredNetworkFile(), &network);
+    });
 }
 
 std::string CheckSectionFile(const std::string& text)

@@ -19,6 +19,7 @@ FieldList LocationFields()
     return fields;
 }
 
+// clang-format off: a field a line
 KVR_FIELDS(HD_Initial,
            Number<&Self::InitialH>("InitialH", U::WaterLevel).Title(Str::InitialH),
            Number<&Self::InitialQ>("InitialQ", U::Discharge).Title(Str::InitialQ))

@@ -31,7 +31,8 @@ QStringList TextsOf(const QWidget& page)
     QStringList texts;
     for (const QWidget* widget : page.findChildren<QWidget*>()) {
         const auto* label = qobject_cast<const QLabel*>(widget);
-        texts << widget->objectName() + ": " + (label ? label->text() : TextOf(widget)) + '|' + widget->accessibleName();
+        texts << widget->objectName() + ": " + (label ? label->text() : TextOf(widget)) + '|' +
+                     widget->accessibleName();
         if (const auto* list = qobject_cast<const QComboBox*>(widget))
             for (int entry = 0; entry < list->count(); ++entry)
                 texts << list->itemText(entry);

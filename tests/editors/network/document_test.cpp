@@ -23,10 +23,9 @@ TEST_F(NetworkTest, EveryChangeIsUndoneRedoneAndTold)
 
     const QStringList states[] = {
         {"MAIN", "SIDE"}, {"MAIN", "SIDE", "A", "B", "C"}, {"MAIN", "LEFT", "A", "B", "C"}, {"LEFT", "A", "B", "C"}};
-    const std::function<void()> changes[] = {
-        [&] { document.AppendBranches(more, "EPSG:25832", "append"); },
-        [&] { Edit(view->Branches(), 1, BranchName, " LEFT "); },
-        [&] { Remove(document, view->Branches()->Model()->Rows(), 0, 1); }};
+    const std::function<void()> changes[] = {[&] { document.AppendBranches(more, "EPSG:25832", "append"); },
+                                             [&] { Edit(view->Branches(), 1, BranchName, " LEFT "); },
+                                             [&] { Remove(document, view->Branches()->Model()->Rows(), 0, 1); }};
     for (int i = 0; i < 3; ++i) {
         log.clear();
         changes[i]();

@@ -163,9 +163,9 @@ protected:
     bool hdOpen = true;
     std::vector<CMapLocation> hdLocations{
         {"MAIN", 2000, HDInitialData, {}}, {"MAIN", 5000, HDBedData, {}},
-        {"MAIN", 9000, HDBedData, {}},                                                  // behind the end
+        {"MAIN", 9000, HDBedData, {}},                                         // behind the end
         {"LOST", 100, HDWindData, {}},     {"SIDE", 250, HDDataTypeCount, {}}, // no such kind
-        {"", 100, HDInitialData, {}}, // lines that are not complete
+        {"", 100, HDInitialData, {}},                                          // lines that are not complete
         {"MAIN", 1e10, HDInitialData, {}}};
     FakeHDDoc hdDoc;
     FakeHDView hdView; // goes before its document
