@@ -39,7 +39,7 @@ MUTANTS = [
      'magnitude >= 1e-3 && magnitude < 1e15'),
     ('ks', 'ks/units/number_format.cpp', 'isGiven ? precision : 6', 'precision'),
     ('ks', 'ks/fc/branch_name.cpp', 'return key.trimmed().toUpper();', 'return key.toUpper();'),
-    ('ks', 'ks/fc/file_name.cpp', 'file.fileName(), Qt::CaseInsensitive', 'file.fileName(), Qt::CaseSensitive'),
+    ('ks', 'ks/fc/file_name.cpp', 'target.fileName(), Qt::CaseInsensitive', 'target.fileName(), Qt::CaseSensitive'),
     ('ks', 'ks/fc/doc_save.cpp', 'case QMessageBox::Discard:\n        return true;',
      'case QMessageBox::Discard:\n        return false;'),
     ('documents', 'ks/fc/document_file.cpp', 'if (!error && !replaces && status', 'if (false && status'),
