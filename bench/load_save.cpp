@@ -177,12 +177,12 @@ int MeasureSave(const Files& files, int rounds)
             })();
         };
     };
-    std::vector<Candidate> candidates{{"hand-coded writer", fresh([&] { HandCodedWrite(plain, files.saved); })},
-                                      {"HD_Parameters to file, without sync", fresh([&] {
-                                           if (const auto saved = SaveHDFile(parameters, files.saved, {.file = {.sync = false}});
-                                               !saved)
-                                               std::fprintf(stderr, "%s\n", saved.error().message.c_str());
-                                       })}};
+    std::vector<Candidate> candidates{
+        {"hand-coded writer", fresh([&] { HandCodedWrite(plain, files.saved); })},
+        {"HD_Parameters to file, without sync", fresh([&] {
+             if (const auto saved = SaveHDFile(parameters, files.saved, {.file = {.sync = false}}); !saved)
+                 std::fprintf(stderr, "%s\n", saved.error().message.c_str());
+         })}};
     RunInterleaved(candidates, rounds);
     Table table("Save", "ms");
     table.Row(candidates[0].name, candidates[0].Median());

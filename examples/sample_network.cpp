@@ -152,7 +152,7 @@ void AddChannel(tqlHandle file, const Course& course, const std::vector<Point>& 
     const auto at = [&](double chainage) {
         const double distance = chainage / course.length * along.back();
         const auto after = std::lower_bound(along.begin(), along.end(), distance);
-        return river[std::min(static_cast<std::size_t>(after - along.begin()), river.size() - 1)];
+        return river[std::min(std::size_t(after - along.begin()), river.size() - 1)];
     };
     constexpr double spacing = 1250, chord = 250;
     for (double chainage = 0;; chainage = std::min(chainage + spacing, course.length)) {

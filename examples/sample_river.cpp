@@ -108,7 +108,7 @@ void FillFlow(HD_Parameters& p)
             continue;
         auto wave = ends[i].Record<HD_Wavetype>();
         wave.DownstreamChainage = ends[i + 1].chainage;
-        wave.WaveApproximation = static_cast<std::int32_t>(i % 4);
+        wave.WaveApproximation = std::int32_t(i % 4);
         p.WaveList.Add(wave);
         auto point = ends[i].Record<HDOutputGridPoint>();
         point.PointValue = ends[i + 1].chainage;
@@ -125,7 +125,7 @@ void FillMarksAndIncrements(HD_Parameters& p)
             mark.MarkLevels.push_back(Rounded(at.bed + at.depth + above * noise.Between(0.9, 1.1), 0.01));
         p.WaterLevelMarkList.Add(mark);
         auto curve = at.Record<HDWLCurve>();
-        curve.CurveOption = static_cast<std::int32_t>(p.WLCurveList.GetCount() % 5);
+        curve.CurveOption = std::int32_t(p.WLCurveList.GetCount() % 5);
         curve.CurveValue1 = Rounded(noise.Between(25, 70), 0.5);
         curve.CurveValue2 = Rounded(noise.Between(180, 900), 10);
         curve.CurveValue3 = Rounded(noise.Between(0.5, 1.6), 0.05);
@@ -315,10 +315,10 @@ HD_Parameters LongRiver(std::size_t count)
         const Reach& reach = reaches[branch];
         const std::size_t share = count / branches + (branch < count % branches);
         for (std::size_t i = 0; i < share; ++i) {
-            const double along = static_cast<double>(i) / static_cast<double>(share);
+            const double along = double(i) / double(share);
             HD_Initial initial;
             initial.RiverName = reach.name;
-            initial.Chainage = static_cast<double>(i) * spacing;
+            initial.Chainage = double(i) * spacing;
             initial.InitialH = Rounded(reach.bedUp + reach.depth - (reach.bedUp - reach.bedDown) * along, 0.001);
             initial.InitialQ = Rounded(reach.discharge * (1 + 0.1 * along), 0.001);
             list.Add(std::move(initial));

@@ -7,14 +7,17 @@
 
 std::string CheckNetworkFile(const std::string& text)
 {
-    return CheckFile(
-        text, [](tqlHandle structure, LoadReport& report) { return NetworkText(LoadNetwork(structure, report)); });
+    return CheckFile(text, [](tqlHandle structure, LoadReport& report) {
+        const CNetwork network = LoadNetwork(structure, report);
+        return DeclaredText(DeclaredNetworkFile(), &network);
+    });
 }
 
 std::string CheckSectionFile(const std::string& text)
 {
     return CheckFile(text, [](tqlHandle structure, LoadReport& report) {
-        return CrossSectionsText(LoadCrossSections(structure, report));
+        const CCrossSections sections = LoadCrossSections(structure, report);
+        return DeclaredText(DeclaredSectionFile(), &sections);
     });
 }
 

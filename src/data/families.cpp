@@ -19,6 +19,8 @@ FieldList LocationFields()
     return fields;
 }
 
+// A field a line.
+// clang-format off
 KVR_FIELDS(HD_Initial,
            Number<&Self::InitialH>("InitialH", U::WaterLevel).Title(Str::InitialH),
            Number<&Self::InitialQ>("InitialQ", U::Discharge).Title(Str::InitialQ))

@@ -13,7 +13,8 @@ Result<HD_Parameters> LoadHDFile(const std::string& path)
 std::vector<Finding> CheckHDStructure(tqlHandle structure)
 {
     LoadReport report(structure, LoadReport::Wanted::Everything);
-    HD_Parameters parameters; // no temporary with braces: should memory end there, the compiler destroys parts of it twice
+    // No temporary with braces: should memory end there, the compiler destroys parts of it twice.
+    HD_Parameters parameters;
     parameters.Load(structure, &report);
     return report.Take();
 }

@@ -112,7 +112,7 @@ bool CKavo0_hdDoc::MayReplace(const CString& target, const CString& path)
 {
     // Only a plain save whose name changes case can meet a file nobody was asked about: Save As has asked already.
     if (path != GetPathName() || path == target || !QFileInfo::exists(target) ||
-        SameFile(path.toStdString(), target.toStdString()))
+        IsSameFile(path.toStdString(), target.toStdString()))
         return true;
     const CString question =
         LoadString(Str::ReplaceOtherSpelling).arg(QFileInfo(target).fileName(), QFileInfo(path).fileName());

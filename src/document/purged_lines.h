@@ -19,8 +19,8 @@ public:
     /// What is taken out, in the user's language; empty for nothing.
     QString Summary() const;
 
-    // For a save, which pushes the command when the file is written. Taking out costs one pass a list. Putting back asks
-    // for no memory, and works when taking out has ended for want of it.
+    // For a save, which pushes the command when the file is written. Taking out costs one pass a list. Putting back
+    // asks for no memory, and works when taking out has ended for want of it.
     void TakeOut();
     void PutBack();
 

@@ -71,7 +71,8 @@ template <auto Member>
 constexpr KeptAccess Keeps()
 {
     using Class = typename field_detail::MemberOf<decltype(Member)>::Class;
-    return {&field_detail::Tag<Class>, [](void* object) -> KeptContent& { return static_cast<Class*>(object)->*Member; },
+    return {&field_detail::Tag<Class>,
+            [](void* object) -> KeptContent& { return static_cast<Class*>(object)->*Member; },
             [](const void* object) -> const KeptContent& { return static_cast<const Class*>(object)->*Member; }};
 }
 

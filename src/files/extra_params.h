@@ -12,7 +12,8 @@ class ExtraParams
 {
 public:
     ExtraParams() = default;
-    ExtraParams(const ExtraParams& other) : m_text(other.m_text ? std::make_unique<std::string>(*other.m_text) : nullptr)
+    ExtraParams(const ExtraParams& other)
+        : m_text(other.m_text ? std::make_unique<std::string>(*other.m_text) : nullptr)
     {
     }
     ExtraParams(ExtraParams&&) noexcept = default;

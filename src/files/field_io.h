@@ -18,7 +18,7 @@ struct ParamCursor
     tqlHandle param; // null behind the last
     int number = 1;
     int count;
-    LoadReport* report; // may be null
+    LoadReport* report;      // may be null
     bool onlyFinite = false; // numbers have to be some, unless their field may be unknown
 
     explicit ParamCursor(tqlHandle itsKeyword, LoadReport* itsReport = nullptr)

@@ -186,6 +186,12 @@ std::error_code IsSameFile(PlatformFile& platform, const std::filesystem::path& 
     return {};
 }
 
+bool IsSameFile(const std::string& a, const std::string& b)
+{
+    bool same = false;
+    return !IsSameFile(PlatformFile::Native(), PathFromUtf8(a), PathFromUtf8(b), same) && same;
+}
+
 std::filesystem::path FolderOf(const std::filesystem::path& path)
 {
     return path.has_parent_path() ? path.parent_path() : std::filesystem::path(".");

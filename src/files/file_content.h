@@ -27,9 +27,12 @@ std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::pat
 /// The content of a file, byte for byte.
 Result<std::string> ReadWholeFile(const std::string& path, PlatformFile* platform = nullptr);
 
-/// Whether both paths lead to one existing file.
+/// Whether both paths lead to one existing file on the disk. Where a name is meant that a user gave, in whatever case,
+/// ask the shell's library (KsSameFile).
 std::error_code IsSameFile(PlatformFile& platform, const std::filesystem::path& a, const std::filesystem::path& b,
                            bool& same);
+/// Likewise of paths in UTF-8; no where the system does not say.
+bool IsSameFile(const std::string& a, const std::string& b);
 /// What a chain of symbolic links ends at, and its status, whether it exists or not.
 std::error_code FollowLinks(PlatformFile& platform, std::filesystem::path& path, FileStatus& status);
 /// The status of what a path (UTF-8) leads to; of kind None also where the system does not say.

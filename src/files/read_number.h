@@ -1,4 +1,5 @@
-// The number syntax of cells, fields, dialogs and command lines. No blanks, no thousands separators, the point as decimal separator.
+// The number syntax of cells, fields, dialogs and command lines. No blanks, no thousands separators, the point as
+// decimal separator.
 #pragma once
 
 #include <cstdint>

@@ -346,9 +346,3 @@ std::string LostText(const LostMetadata& lost)
         }
     return text;
 }
-
-bool SameFile(const std::string& a, const std::string& b)
-{
-    bool same = false;
-    return !IsSameFile(PlatformFile::Native(), PathFromUtf8(a), PathFromUtf8(b), same) && same;
-}

@@ -89,7 +89,3 @@ inline constexpr LostPart LostParts[] = {
 #undef TQL_TEXT
 /// What of the metadata was lost, in English words: "owner, access list".
 std::string LostText(const LostMetadata& lost);
-
-/// Whether both paths name one existing file on the disk. Where a name is meant that a user gave, in whatever case, ask
-/// the shell's library (KsSameFile).
-bool SameFile(const std::string& a, const std::string& b);

@@ -222,7 +222,8 @@ QString DateTimeRefusal(const QString& text)
     const HDDateTime example{2024, 5, 31, 18, 0, 0};
     const QString expected = DateTimeText(example);
     if (ReadNumbers(text.trimmed(), KsLangGetUserLocale()).cutsSecond)
-        return GridTexts::tr("\"%1\" holds a part of a second. Times are kept to the whole second. Expected one such as %2.")
+        return GridTexts::tr(
+                   "\"%1\" holds a part of a second. Times are kept to the whole second. Expected one such as %2.")
             .arg(text, expected);
     return GridTexts::tr("\"%1\" is no date and time. Expected one such as %2.").arg(text, expected);
 }

@@ -28,8 +28,7 @@ qsizetype CommonEnd(const QString& a, const QString& b)
 
 bool StaysBeingEdited(Qt::FocusReason reason)
 {
-    return reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason ||
-           reason == Qt::MenuBarFocusReason;
+    return reason == Qt::ActiveWindowFocusReason || reason == Qt::PopupFocusReason || reason == Qt::MenuBarFocusReason;
 }
 
 void TellRefusal(QWidget& widget, const QString& message, const QString& details)

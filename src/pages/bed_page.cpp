@@ -32,8 +32,8 @@ public:
         // The values of the approach not in use are kept.
         const auto column = [&](const double& global, bool ofZones) {
             return ColumnSpec{.fill = &global,
-                                 .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
-                                 .unitText = unit};
+                              .locked = [usesZones, ofZones](const void*) { return usesZones() != ofZones; },
+                              .unitText = unit};
         };
         using R = HD_Resistfact;
         Grid(m_ui.grid_1307)

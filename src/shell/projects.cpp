@@ -92,10 +92,8 @@ const CProject* CProjects::FindByView(const CView* view) const
 
 const CProject* CProjects::FindByMember(const QString& path) const
 {
-    const QString key = KsFileKey(path);
-    const auto has = [&key](const CProject& project) {
-        return std::any_of(project.members.begin(), project.members.end(),
-                           [&key](const QString& member) { return KsFileKey(member) == key; });
+    const auto has = [key = KsFileKey(path)](const CProject& project) {
+        return std::ranges::find(project.members, key, KsFileKey) != project.members.end();
     };
     const CProject* preferred = Find(m_preferred);
     if (preferred && has(*preferred))

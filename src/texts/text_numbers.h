@@ -1,5 +1,5 @@
-// The numbers of the module's texts, free of any library, so that a declaration of data can say how its value is called.
-// The texts stand in string_table.inc, res/strings.h gives them in the user's language.
+// The numbers of the module's texts, free of any library, so that a declaration of data can say how its value is
+// called. The texts stand in string_table.inc, res/strings.h gives them in the user's language.
 #pragma once
 
 #include <string>

@@ -39,6 +39,15 @@ inline std::string ReadText(const std::filesystem::path& path)
     return {std::istreambuf_iterator<char>(stream), {}};
 }
 
+/// Whether a text is the one that a file of the sources records.
+inline void ExpectRecorded(const std::string& text, const std::filesystem::path& record)
+{
+    if (std::getenv("KVR_UPDATE_RECORDS"))
+        std::ofstream(record, std::ios::binary) << text;
+    else
+        EXPECT_EQ(ReadText(record), text) << "if it is meant: ninja update_records, and look at what has changed";
+}
+
 /// Gives every field, and in groups every element, another value. `seed` makes results differ.
 inline void Disturb(FieldList fields, void* object, int& seed)
 {

@@ -576,9 +576,9 @@ TEST_F(SafeFile, SameFileSeesThroughNames)
 {
     Write("a", "");
     Write("b", "");
-    EXPECT_TRUE(SameFile(Path("a"), Path("../") + m_folder.filename().string() + "/a"));
-    EXPECT_FALSE(SameFile(Path("a"), Path("b")));
-    EXPECT_FALSE(SameFile(Path("a"), Path("missing")));
+    EXPECT_TRUE(IsSameFile(Path("a"), Path("../") + m_folder.filename().string() + "/a"));
+    EXPECT_FALSE(IsSameFile(Path("a"), Path("b")));
+    EXPECT_FALSE(IsSameFile(Path("a"), Path("missing")));
 }
 
 TEST_F(SafeFile, AnHDFileThatCannotBeWrittenOrReadSaysSo)

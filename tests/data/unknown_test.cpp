@@ -115,14 +115,14 @@ TEST(Unknown, IsKeptAtEveryDepthBehindTheKnown)
         {R"(note = "n")", "[Sub]", "[InitList]"},
         {"mode = 2", "[/Encroachment_Setup]", "[Encroachment_Setup]"},
         {"[/Encroachment_Setup]", "[Other_Setup]", "[Enc_Simulation]"},
-        {"[/LeakageList]", "loose = 1", "[KAVO0_HD]"},
-        {"[InitList]", R"(DATA = "SECOND", 1, 2, 3)", "[/LeakageList]"},
-        {"[DikeList]", R"(DATA = "R", 1)", "[/LeakageList]"},
+        {"[InitList]", R"(DATA = "SECOND", 1, 2, 3)", "loose = 1"},
+        {"[DikeList]", R"(DATA = "R", 1)", "loose = 1"},
         {"[/KAVO0_HD]", "[KAVO0_HD]", "[DikeList]"},
         {"[S]", "k = 7", "[KVR_OTHER]"},
     };
     for (const auto& c : cases)
         EXPECT_EQ(Behind(lines, c.line, c.from), c.behind) << text;
+    EXPECT_EQ(Behind(lines, "[/" + std::string(HDLists().back().section) + "]", "[KAVO0_HD]"), "loose = 1") << text;
 
     HD_Parameters again;
     again.Load(Parsed(text).Get());

@@ -1,5 +1,6 @@
-// Loaded before the C library (LD_PRELOAD): counts the calls on files of one folder, and lets one of them fail, come back
-// with less than was asked for, or be the last thing the program does. faults.py maps the same record and says which.
+// Loaded before the C library (LD_PRELOAD): counts the calls on files of one folder, and lets one of them fail, come
+// back with less than was asked for, or be the last thing the program does. faults.py maps the same record and says
+// which.
 #include <atomic>
 #include <cerrno>
 #include <csignal>

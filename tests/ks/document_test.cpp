@@ -80,14 +80,6 @@ TEST_F(KsTest, TheTitleFollowsNameAndModifiedFlag)
     EXPECT_FALSE(WindowOf(document)->isWindowModified());
 }
 
-TEST_F(KsTest, EmptyingADocumentForgetsItsUndo)
-{
-    TextDoc* document = Open({});
-    document->UndoStack().push(new QUndoCommand("edit"));
-    document->DeleteContents();
-    EXPECT_EQ(document->UndoStack().count(), 0);
-}
-
 TEST_F(KsTest, TheViewGoesBeforeItsDocument)
 {
     TextDoc* document = Open(Write("river.tst", "abc"));

@@ -53,11 +53,3 @@ TEST(Resizer, CellsOfAGridLayoutStretchOnlyWhereAnchored)
     EXPECT_EQ(layout->rowStretch(1), 1);
     EXPECT_EQ(layout->columnStretch(0), 0);
 }
-
-TEST(Resizer, AControlOutsideThePageOrWithoutLayoutIsRefused)
-{
-    QWidget page, stranger, loose(&page);
-    const CWndResizer resizer(&page);
-    EXPECT_FALSE(resizer.SetAnchor(&stranger, CWndResizer::All));
-    EXPECT_FALSE(resizer.SetAnchor(&loose, CWndResizer::All));
-}

@@ -36,17 +36,6 @@ TEST_F(KsTest, TheNameWrittenBecomesTheDocumentsName)
     }
 }
 
-TEST_F(KsTest, AFailedSaveKeepsNameAndFlag)
-{
-    TextDoc* document = Open(Write("a.TST", "old"));
-    document->SetModifiedFlag();
-    document->canSave = false;
-    EXPECT_FALSE(document->DoSave(Path("b.TST")));
-    EXPECT_EQ(document->GetPathName(), Path("a.TST"));
-    EXPECT_TRUE(document->IsModified());
-    EXPECT_FALSE(document->IsExecuting());
-}
-
 TEST_F(KsTest, ASaveThatFailedOffersAnotherName)
 {
     TextDoc* document = Open(Write("a.TST", "old"));

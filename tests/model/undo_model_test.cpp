@@ -180,7 +180,7 @@ void UndoModelTest::Step(RandomUser& user, QStringList& log)
     }
     log << user.Done();
     document->UpdateAllViews(nullptr, CKsDoc::StoreHint); // what is still being typed belongs to this step
-    if (!boxes.isEmpty()) {                         // refused, and told; the user takes it back
+    if (!boxes.isEmpty()) {                               // refused, and told; the user takes it back
         log << "box: " + boxes.join('|');
         for (int i = 0; i < 2 && QApplication::focusWidget(); ++i)
             QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);

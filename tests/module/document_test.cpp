@@ -126,6 +126,12 @@ TEST_F(DocumentTest, ValuesThatWereNotTakenAreListedAskedAboutOnceAndKeptInACopy
     ASSERT_TRUE(document.OnSaveDocument(Path("other.HDKV")));
     EXPECT_EQ(boxes.size(), 2) << "a save elsewhere leaves the file alone";
     EXPECT_EQ(Read(Path("river.HDKV")), text);
+
+    ASSERT_TRUE(document.OnOpenDocument(Path("river.HDKV")));
+    ASSERT_TRUE(QDir(folder.path()).mkdir("sub"));
+    ASSERT_TRUE(document.OnSaveDocument(Path("sub/../river.HDKV")));
+    EXPECT_EQ(boxes.size(), 3) << "it is that file, whichever way leads to it";
+    EXPECT_EQ(Read(Path("river.HDKV.original-2")), text);
 }
 
 #ifndef _WIN32

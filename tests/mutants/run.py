@@ -45,8 +45,8 @@ def write(path, text):
         file.write(text)
 
 
-def run(*command):
-    return subprocess.run(command, cwd=ROOT, capture_output=True, text=True, timeout=60 * MINUTES,
+def run(*command, minutes=None):
+    return subprocess.run(command, cwd=ROOT, capture_output=True, text=True, timeout=minutes and 60 * minutes,
                           env={**os.environ, 'QT_QPA_PLATFORM': 'offscreen'}, errors='replace')
 
 
@@ -55,7 +55,7 @@ def notices(program):
     if run('ninja', '-C', BUILD, program).returncode:
         raise ValueError('does not compile')
     try:
-        result = run(f'{BUILD}/bin/{program}', '--gtest_fail_fast')
+        result = run(f'{BUILD}/bin/{program}', '--gtest_fail_fast', minutes=MINUTES)
     except subprocess.TimeoutExpired:
         return f'{program} hangs'
     if result.returncode == 0:

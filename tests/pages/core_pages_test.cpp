@@ -16,19 +16,6 @@ namespace {
 
 constexpr QSize SmallestPage(900, 640);
 
-/// The parts of a page that a user works with, without those that they are made of.
-QList<QWidget*> Controls(const QWidget& page)
-{
-    QList<QWidget*> controls;
-    for (QWidget* widget : page.findChildren<QWidget*>()) {
-        const bool control = qobject_cast<QLineEdit*>(widget) || qobject_cast<QComboBox*>(widget) ||
-                             qobject_cast<QAbstractButton*>(widget) || qobject_cast<QAbstractItemView*>(widget);
-        if (control && !controls.contains(widget->parentWidget()) && !widget->objectName().startsWith("qt_"))
-            controls << widget;
-    }
-    return controls;
-}
-
 QString Named(const CGenPropertyPage& page, const QWidget* widget)
 {
     return QString("%1 %2").arg(page.objectName(), widget->objectName());

@@ -48,34 +48,6 @@ protected:
     CGenMetaList<HDEncroach>& setups = document.Parameters().EncroachList;
 };
 
-TEST_F(EncroachPageTest, EveryFieldHasItsColumn)
-{
-    AddSetup({"A", "B"});
-    HDEncroach& line = setups.GetAt(0).GetAt(0);
-    line.EncOption1 = 2;
-    line.EncOption2 = 6; // nobody knows it
-    for (int i = 0; i < 5; ++i) {
-        line.EncValues1[i] = i;
-        line.EncValues2[i] = 10 + i;
-    }
-    Open(MakeEncroachPage);
-    EXPECT_EQ(Headers().join('|'), "River Name|Chainage|Method|Banks|Left offset|Right offset|Left position|"
-                                   "Right position|Width|Reduction|Total reduction|Left reduction|Right reduction|"
-                                   "Target level|Target energy");
-    EXPECT_EQ(Texts(1), "A|1|2 Fixed width|6|0|1|2|3|4|1 Equal on both banks|10|11|12|13|14");
-    int column = 2;
-    for (const Field& field : HDEncroach::DeclaredFields())
-        EXPECT_TRUE(grid->model()
-                        ->headerData(column++, Qt::Horizontal, Qt::ToolTipRole)
-                        .toString()
-                        .contains(QString::fromStdString(std::string(field.name))));
-    Enter(1, 3, "5");
-    EXPECT_EQ(line.EncOption1, 5) << "the numbers in front of the entries choose them";
-    Enter(1, 14, "0.5");
-    EXPECT_EQ(line.EncValues2[3], 0.5);
-    EXPECT_EQ(line.EncOption2, 6);
-}
-
 TEST_F(EncroachPageTest, TheMethodLocksWhatItDoesNotUse)
 {
     AddSetup({"A", "B"});

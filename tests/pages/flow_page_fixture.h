@@ -38,41 +38,4 @@ protected:
                 changed << line.trimmed();
         return changed;
     }
-    struct Edit
-    {
-        int control;
-        const char* typed; // into a field; a key for anything else
-        const char* line;  // of the file
-    };
-    /// Each edit changes its keyword and nothing else, marks the document, and is one step to undo.
-    void EachChangesItsKeyword(std::initializer_list<Edit> edits)
-    {
-        for (const Edit& edit : edits) {
-            SCOPED_TRACE(edit.line);
-            const QStringList before = Lines();
-            document.SetModifiedFlag(false);
-            const int steps = document.UndoStack().index();
-            QWidget* control = Find(edit.control);
-            if (qobject_cast<QLineEdit*>(control)) {
-                TypeInto(edit.control, edit.typed);
-            } else {
-                control->setFocus();
-                QTest::keyClick(control, *edit.typed == ' ' ? Qt::Key_Space : Qt::Key_Up);
-            }
-            EXPECT_EQ(Changed(before).join('\n').toStdString(), edit.line);
-            EXPECT_TRUE(document.IsModified());
-            EXPECT_EQ(document.UndoStack().index(), steps + 1);
-            QTest::keyClick(control, Qt::Key_Z, Qt::ControlModifier);
-            EXPECT_TRUE(Lines() == before) << "undone";
-            document.UndoStack().redo();
-        }
-        EXPECT_EQ(boxes, QStringList());
-    }
-    QStringList Headers() const
-    {
-        QStringList headers;
-        for (int column = 0; column < grid->ColumnCount(); ++column)
-            headers << grid->model()->headerData(column, Qt::Horizontal).toString();
-        return headers;
-    }
 };

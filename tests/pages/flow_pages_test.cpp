@@ -1,4 +1,4 @@
-// The pages of wind, numerical scheme, heat balance, stratification, leakage, flood plains and water loss.
+// The pages of wind, numerical scheme, heat balance, stratification, leakage and flood plains.
 #include "flow_page_fixture.h"
 #include "pages/page_table.h"
 
@@ -7,128 +7,6 @@
 
 #include <QCheckBox>
 #include <QGroupBox>
-
-TEST_F(FlowPagesTest, ControlsChangeTheirKeywords)
-{
-    Open(MakeWindPage);
-    EachChangesItsKeyword({{1159, " ", "wind_shear_stress = true"},
-                           {1004, "0.875", "G_wind_factor = 0.875"},
-                           {1006, "0.003", "G_friction_factor = 0.003"}});
-    Open(MakeDefaultPage);
-    EachChangesItsKeyword({{1012, "0.75", "delta = 0.75"},
-                           {1013, "0.0125", "delhs = 0.0125"},
-                           {1014, "0.25", "delh = 0.25"},
-                           {1015, "1.5", "alpha = 1.5"},
-                           {1016, "0.5", "theta = 0.5"},
-                           {1017, "0.25", "eps = 0.25"},
-                           {1018, "0.125", "dh_node = 0.125"},
-                           {1019, "0.5", "zeta_min = 0.5"},
-                           {1020, "0.5", "struc_fac = 0.5"},
-                           {1021, "-11", "inter1_max = -11"},
-                           {1024, "3", "no_iter = 3"},
-                           {1026, "2147483647", "max_iter = 2147483647"},
-                           {1027, "0.75", "froude_max = 0.75"},
-                           {1028, "2", "froude_exp = 2"}});
-    Open(MakeHeatBalancePage);
-    EachChangesItsKeyword({{1148, " ", "Calc = true"},
-                           {1149, "-33.5", "Latitude = -33.5"},
-                           {1150, "12.25", "Longitude = 12.25"},
-                           {1151, "15", "TimeZone = 15"},
-                           {1152, "0.5", "DisTime = 0.5"},
-                           {1153, "2.5", "LightAtt = 2.5"},
-                           {1154, "0.25", "betaBeer = 0.25"},
-                           {1155, "0.375", "RadA = 0.375"},
-                           {1156, "0.625", "RadB = 0.625"},
-                           {1157, "1.25", "VapA = 1.25"},
-                           {1158, "1.5", "VapB = 1.5"}});
-    Open(MakeStratificationPage);
-    EachChangesItsKeyword({{1175, "12", "npv = 12"},
-                           {1176, "0.25", "visc = 0.25"},
-                           {1177, "up", "vmf = 2"},
-                           {1179, " ", "Rich = false"},
-                           {1148, " ", "dens = false"},
-                           {1180, "0.5", "bpr1 = 0.5"},
-                           {1181, "0.25", "bpr2 = 0.25"},
-                           {1184, "0.625", "uu = 0.625"},
-                           {1185, "0.75", "uw = 0.75"},
-                           {1186, "0.875", "uwc = 0.875"},
-                           {1182, "1.25", "dfx = 1.25"},
-                           {1183, "1.5", "dfz = 1.5"}});
-    Open(MakeLeakagePage);
-    EachChangesItsKeyword({{1228, " ", "IncludeLeakage = true"}, {1238, "4e-07", "LeakageCoefficient = 4e-07"}});
-    Open(MakeFloodPage);
-    EachChangesItsKeyword({{1040, "25", "G_flood_plan_res = 25"}});
-}
-
-TEST_F(FlowPagesTest, ControlsShowTheDefaults)
-{
-    globals.struc_fac = 0.26;
-    Open(MakeDefaultPage);
-    const std::pair<int, const char*> shown[] = {{1012, "0.5"}, {1013, "0.01"}, {1016, "1"},  {1017, "0.0001"},
-                                                 {1020, "0.3"}, {1021, "10"},   {1027, "-1"}, {1024, "1"}};
-    for (const auto& [number, text] : shown)
-        EXPECT_EQ(Find<QLineEdit>(number)->text(), text) << number;
-    EXPECT_TRUE(view->page->OnKillActive());
-    EXPECT_EQ(globals.struc_fac, 0.26) << "whatever is shown of it";
-    // In US customary units lengths show in feet; a Delta is a ratio.
-    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
-    EXPECT_EQ(Find<QLineEdit>(1014)->text(), "0.328");
-    EXPECT_EQ(Find<QLineEdit>(1012)->text(), "0.5");
-    EXPECT_EQ(view->page->findChild<QLabel*>("unit_1014")->text(), "ft");
-    TypeInto(1014, "1");
-    EXPECT_EQ(globals.delh, 0.3048);
-    EXPECT_EQ(globals.delhs, 0.01);
-}
-
-TEST_F(FlowPagesTest, Ranges)
-{
-    Open(MakeDefaultPage);
-    const struct
-    {
-        int control;
-        const char* typed;
-        double& value;
-        bool taken;
-    } cases[] = {
-        {1012, "0.49", globals.delta, false},    {1012, "1.01", globals.delta, false},
-        {1012, "1", globals.delta, true},        {1012, "0.5", globals.delta, true},
-        {1019, "-0.1", globals.zeta_min, false}, {1019, "0", globals.zeta_min, true},
-        {1019, "1e9", globals.zeta_min, true},
-    };
-    for (const auto& c : cases) {
-        SCOPED_TRACE(c.typed);
-        boxes.clear();
-        const double before = c.value;
-        TypeInto(c.control, c.typed);
-        EXPECT_EQ(boxes, c.taken ? QStringList() : QStringList("Floating-point value is out of range"));
-        EXPECT_EQ(c.value, c.taken ? std::atof(c.typed) : before);
-        QTest::qWait(0);
-        if (!c.taken)
-            QTest::keyClick(Find(c.control), Qt::Key_Escape);
-    }
-}
-
-TEST_F(FlowPagesTest, AWrongIntegerKeepsThePage)
-{
-    Open(MakeDefaultPage);
-    for (const char* wrong : {"x", "1.5", "2147483648", "-", ""}) {
-        SCOPED_TRACE(wrong);
-        boxes.clear();
-        auto* field = Find<QLineEdit>(1026);
-        field->setFocus();
-        field->selectAll();
-        QTest::keyClicks(field, wrong);
-        if (!*wrong)
-            QTest::keyClick(field, Qt::Key_Delete);
-        EXPECT_FALSE(view->page->OnKillActive());
-        EXPECT_EQ(boxes.size(), 1);
-        EXPECT_TRUE(field->hasFocus());
-        EXPECT_EQ(globals.max_iter, 100);
-    }
-    TypeInto(1026, "101");
-    EXPECT_TRUE(view->page->OnKillActive());
-    EXPECT_EQ(globals.max_iter, 101);
-}
 
 TEST_F(FlowPagesTest, TheSheetStaysOnAPageWithAWrongEntry)
 {
@@ -258,36 +136,6 @@ TEST_F(FlowPagesTest, LeakageShowsItsTableWhenIncluded)
     EXPECT_EQ(list.GetCount(), 1u);
     view->page->UndoRedo(true);
     EXPECT_TRUE(grid->isVisible());
-}
-
-TEST_F(FlowPagesTest, TablesShowTheirFields)
-{
-    auto& all = document.Parameters();
-    const auto at = [](auto& record) -> auto&
-    {
-        record.RiverName = "A";
-        record.Chainage = 1500.6;
-        return record;
-    };
-    at(all.WindList.Add()).WindFactor = 0.12345;
-    at(all.FloodList.Add()).FloodPlainResistance = 12.5;
-    auto& loss = at(all.WaterList.Add());
-    loss.WaterLoss1 = 0.0052;
-    loss.WaterLoss4 = 4;
-    const QStringList location{"River Name", "Chainage"};
-    Open(MakeWindPage);
-    EXPECT_EQ(Headers(), location + QStringList{"Topographical factor"});
-    EXPECT_EQ(Texts(1), "A|1501|0.123");
-    Open(MakeFloodPage);
-    EXPECT_EQ(Headers(), location + QStringList{"Flood Pl. Res"});
-    EXPECT_EQ(Texts(1), "A|1501|12.500");
-    Open(MakeLossPage);
-    EXPECT_EQ(Headers(), location + QStringList({"Water Loss 1", "Water Loss 2", "Water Loss 3", "Water Loss 4"}));
-    EXPECT_EQ(Texts(1), "A|1501|0.0052|0|0|4");
-    Enter(1, 5, "2.5");
-    EXPECT_EQ(loss.WaterLoss3, 2.5);
-    const auto record = view->page->GetRecordAt(1);
-    EXPECT_EQ(dynamic_cast<HD_Waterloss&>(*record).WaterLoss3, 2.5);
 }
 
 TEST_F(FlowPagesTest, WhatBlankCellsBecome)

@@ -31,10 +31,14 @@ QStringList TextsOf(const QWidget& page)
     QStringList texts;
     for (const QWidget* widget : page.findChildren<QWidget*>()) {
         const auto* label = qobject_cast<const QLabel*>(widget);
-        texts << widget->objectName() + ": " + (label ? label->text() : TextOf(widget)) + '|' + widget->accessibleName();
+        texts << widget->objectName() + ": " + (label ? label->text() : TextOf(widget)) + '|' +
+                     widget->accessibleName();
         if (const auto* list = qobject_cast<const QComboBox*>(widget))
             for (int entry = 0; entry < list->count(); ++entry)
                 texts << list->itemText(entry);
+        if (const auto* table = qobject_cast<const QAbstractItemView*>(widget); table && table->model())
+            for (int column = 0; column < table->model()->columnCount(); ++column)
+                texts << table->model()->headerData(column, Qt::Horizontal).toString();
     }
     return texts;
 }

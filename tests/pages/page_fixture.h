@@ -5,6 +5,8 @@
 #include "open_editor.h"
 #include "pages/framework/location_page.h"
 
+#include <QAbstractButton>
+#include <QAbstractItemView>
 #include <QComboBox>
 #include <QTest>
 #include <QUndoStack>
@@ -83,6 +85,19 @@ public:
                               {.header = [name = std::string(field.name)] { return QString::fromStdString(name); }});
     }
 };
+
+/// The parts of a page that a user works with, without those that they are made of.
+inline QList<QWidget*> Controls(const QWidget& page)
+{
+    QList<QWidget*> controls;
+    for (QWidget* widget : page.findChildren<QWidget*>()) {
+        const bool control = qobject_cast<QLineEdit*>(widget) || qobject_cast<QComboBox*>(widget) ||
+                             qobject_cast<QAbstractButton*>(widget) || qobject_cast<QAbstractItemView*>(widget);
+        if (control && !controls.contains(widget->parentWidget()) && !widget->objectName().startsWith("qt_"))
+            controls << widget;
+    }
+    return controls;
+}
 
 class PageTest : public testing::Test
 {

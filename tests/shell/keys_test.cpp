@@ -8,14 +8,12 @@
 #include <QMenuBar>
 #include <QSettings>
 #include <QShortcut>
-#include <QTabWidget>
 #include <QTableView>
 #include <QTest>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <set>
 
-using testing::ElementsAre;
 using testing::IsEmpty;
 
 namespace {
@@ -121,7 +119,6 @@ protected:
         }
         return nullptr;
     }
-    QTabWidget* Sheet() const { return frame->findChild<QTabWidget*>(QStringLiteral("sheet")); }
     static std::set<int> AltLetters()
     {
         std::set<int> keys;
@@ -147,28 +144,6 @@ TEST_P(KeysTest, NoKeyIsAmbiguousInAnyWindow)
                 widget->setFocus();
                 EXPECT_THAT(Ambiguous(keys), IsEmpty()) << extension << (tabs ? " in tabs" : " in windows");
             }
-        }
-    }
-}
-
-TEST_P(KeysTest, NoLetterOfAPageIsAmbiguousOrTakenFromTheMenuBar)
-{
-    Activate(QStringLiteral(".hdkv"));
-    std::set<int> ofMenus;
-    for (const QAction* menu : frame->menuBar()->actions())
-        ofMenus.insert(QKeySequence::mnemonic(menu->text())[0].toCombined());
-    ASSERT_EQ(ofMenus.size(), std::size_t(frame->menuBar()->actions().size()));
-    for (int tab = 0; tab < Sheet()->count(); ++tab) {
-        Sheet()->setCurrentIndex(tab);
-        const QString page = Sheet()->tabText(tab);
-        EXPECT_THAT(Ambiguous(AltLetters()), IsEmpty()) << qPrintable(page);
-        KeyWatcher watcher;
-        for (const QAction* menu : frame->menuBar()->actions()) {
-            if (!menu->isEnabled())
-                continue;
-            watcher.Press(QKeySequence::mnemonic(menu->text())[0]);
-            EXPECT_THAT(watcher.receivers, ElementsAre(frame->menuBar()))
-                << qPrintable(page) << qPrintable(menu->text());
         }
     }
 }

@@ -18,11 +18,18 @@ BOOL CParameterDoc::OnSaveDocument(const CString& path)
     UpdateAllViews(nullptr, StoreHint);
     if (!m_file.MayReplace(path) ||
         !WriteFile(path, [this](const std::string& written, const SafeFileOptions& options) {
-            return Save(written, options);
+            const Declared content = Content();
+            return SaveDeclaredFile(written, content.file, content.object, options);
         }))
         return false;
     FileWritten();
     if (!m_file.Renamed().isEmpty())
         Say(m_file.Renamed());
     return true;
+}
+
+Result<std::string> CParameterDoc::ContentText() const
+{
+    const Declared content = Content();
+    return DeclaredText(content.file, content.object);
 }

@@ -1,6 +1,7 @@
 // The document of an editor that keeps one parameter file.
 #pragma once
 
+#include "files/declared_section.h"
 #include "ks/fc/project_doc.h"
 
 class CParameterDoc : public CKsProjectDoc
@@ -14,8 +15,15 @@ public:
     BOOL OnOpenDocument(const CString& path) override;
     /// When that fails, the document stays as it is, after a message that tells why.
     BOOL OnSaveDocument(const CString& path) override;
+    Result<std::string> ContentText() const override;
 
 protected:
+    /// The object that the document keeps, and how its file is declared.
+    struct Declared
+    {
+        const DeclaredSection& file;
+        const void* object;
+    };
+    virtual Declared Content() const = 0;
     virtual void Load(tqlHandle structure, LoadReport& report) = 0;
-    virtual Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const = 0;
 };

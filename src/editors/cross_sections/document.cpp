@@ -1,6 +1,5 @@
 #include "editors/cross_sections/document.h"
 
-#include "editors/cross_sections/section_file.h"
 #include "ks/fc/doc_command.h"
 
 namespace {
@@ -18,16 +17,6 @@ const CCrossSection* CCrossSectionDoc::Section(int index) const
 void CCrossSectionDoc::Load(tqlHandle structure, LoadReport& report)
 {
     m_sections = LoadCrossSections(structure, report);
-}
-
-Result<WriteReport> CCrossSectionDoc::Save(const std::string& path, const SafeFileOptions& options) const
-{
-    return SaveCrossSections(m_sections, path, options);
-}
-
-Result<std::string> CCrossSectionDoc::ContentText() const
-{
-    return CrossSectionsText(m_sections);
 }
 
 std::unique_ptr<QUndoCommand> CCrossSectionDoc::MakeContentStep(tqlHandle structure, LoadReport& report,

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "editors/common/parameter_doc.h"
+#include "editors/cross_sections/section_file.h"
 #include "editors/cross_sections/section_rules.h"
 
 class CCrossSectionDoc : public CParameterDoc
@@ -17,14 +18,13 @@ public:
     const CCrossSection* Section(int index) const;
 
     void DeleteContents() override;
-    Result<std::string> ContentText() const override;
 
     /// For the first section of a document: a branch that the project has.
     QString NewBranch() const;
 
 protected:
     void Load(tqlHandle structure, LoadReport& report) override;
-    Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const override;
+    Declared Content() const override { return {DeclaredSectionFile(), &m_sections}; }
     std::unique_ptr<QUndoCommand> MakeContentStep(tqlHandle structure, LoadReport& report,
                                                   const CString& text) override;
 

@@ -129,13 +129,7 @@ CCrossSections LoadCrossSections(tqlHandle structure, LoadReport& report)
     return read;
 }
 
-Result<WriteReport> SaveCrossSections(const CCrossSections& sections, const std::string& path,
-                                      const SafeFileOptions& options)
+const DeclaredSection& DeclaredSectionFile()
 {
-    return SaveDeclaredFile(path, file, &sections, options);
-}
-
-Result<std::string> CrossSectionsText(const CCrossSections& sections)
-{
-    return DeclaredText(file, &sections);
+    return file;
 }

@@ -1,6 +1,5 @@
 #include "editors/network/document.h"
 
-#include "editors/network/network_file.h"
 #include "editors/network/network_tables.h"
 #include "grid/row_commands.h"
 
@@ -23,16 +22,6 @@ void CNetworkDoc::Load(tqlHandle structure, LoadReport& report)
 {
     m_reference.reset();
     m_network = LoadNetwork(structure, report);
-}
-
-Result<WriteReport> CNetworkDoc::Save(const std::string& path, const SafeFileOptions& options) const
-{
-    return SaveNetwork(m_network, path, options);
-}
-
-Result<std::string> CNetworkDoc::ContentText() const
-{
-    return NetworkText(m_network);
 }
 
 std::unique_ptr<QUndoCommand> CNetworkDoc::MakeContentStep(tqlHandle structure, LoadReport& report, const CString& text)

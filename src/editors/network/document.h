@@ -3,7 +3,7 @@
 
 #include "editors/common/parameter_doc.h"
 #include "editors/network/linear_reference.h"
-#include "editors/network/network.h"
+#include "editors/network/network_file.h"
 
 #include <memory>
 
@@ -20,7 +20,6 @@ public:
     const CLinearReference& Reference() const;
 
     void DeleteContents() override;
-    Result<std::string> ContentText() const override;
 
     /// An import: one step to undo. The network names `system` as its coordinate system from then on.
     void AppendBranches(std::vector<CNetworkBranch> branches, const QString& system, const QString& text);
@@ -32,7 +31,7 @@ signals:
 
 protected:
     void Load(tqlHandle structure, LoadReport& report) override;
-    Result<WriteReport> Save(const std::string& path, const SafeFileOptions& options) const override;
+    Declared Content() const override { return {DeclaredNetworkFile(), &m_network}; }
     std::unique_ptr<QUndoCommand> MakeContentStep(tqlHandle structure, LoadReport& report,
                                                   const CString& text) override;
 

@@ -22,11 +22,11 @@ struct CChannelRow
 struct CNetworkBranch
 {
     std::string name;
-    double start = 0, end = 0;                // chainages of the first and the last vertex, metres; they differ
-    bool downstream = true;                   // water flows towards increasing chainage
-    std::vector<QPointF> line;                // map coordinates, metres: x to the east, y to the north
-    std::vector<CChannelRow> channel;         // by increasing chainage
-    KeptContent kept;                         // what the file says beyond that
+    double start = 0, end = 0;        // chainages of the first and the last vertex, metres; they differ
+    bool downstream = true;           // water flows towards increasing chainage
+    std::vector<QPointF> line;        // map coordinates, metres: x to the east, y to the north
+    std::vector<CChannelRow> channel; // by increasing chainage
+    KeptContent kept;                 // what the file says beyond that
 
     static FieldList DeclaredFields();
     QString Name() const { return QString::fromStdString(name); }

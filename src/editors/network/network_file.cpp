@@ -132,12 +132,7 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
     return network;
 }
 
-Result<WriteReport> SaveNetwork(const CNetwork& network, const std::string& path, const SafeFileOptions& options)
+const DeclaredSection& DeclaredNetworkFile()
 {
-    return SaveDeclaredFile(path, file, &network, options);
-}
-
-Result<std::string> NetworkText(const CNetwork& network)
-{
-    return DeclaredText(file, &network);
+    return file;
 }

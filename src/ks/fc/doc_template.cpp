@@ -86,7 +86,7 @@ CKsDoc* CMultiDocTemplate::FindOpen(const CString& path) const
     if (CKsDoc* document = FindDocument(path))
         return document;
     for (CKsDoc* document : Documents())
-        if (!IsClosing(document) && SameFile(document->GetPathName().toStdString(), path.toStdString()))
+        if (!IsClosing(document) && IsSameFile(document->GetPathName().toStdString(), path.toStdString()))
             return document;
     return nullptr;
 }

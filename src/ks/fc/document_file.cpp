@@ -2,6 +2,7 @@
 
 #include "base/utf8_path.h"
 #include "files/structure.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/syntax_error.h"
 #include "ks/fc/system_reason.h"
@@ -52,31 +53,6 @@ CString DisplacedName(const CString& path)
     FileStatus status;
     FollowLinks(PlatformFile::Native(), target, status);
     return NameOf(QString::fromStdString(FreeCopyName(Utf8FromPath(target), "displaced")));
-}
-
-/// An existing file of that name in whatever case it is spelt, or the path itself. A folder that cannot be read is no
-/// empty one: the file would be written a second time, in another case.
-Result<CString> ExistingEntry(const CString& target)
-{
-    PlatformFile& platform = PlatformFile::Native();
-    const auto path = QFileInfo(target).filesystemFilePath();
-    FileStatus status;
-    std::vector<PlatformFile::Path> names;
-    std::error_code error = platform.Status(path, status);
-    if (error || status.kind != FileStatus::Kind::None)
-        return error ? Result<CString>(NotWritten(target.toStdString(), error)) : target;
-    error = platform.List(FolderOf(path), names);
-    if (error == std::errc::no_such_file_or_directory || error == std::errc::permission_denied)
-        return target; // as writing will say; a folder may be open to writing alone
-    if (error)
-        return NotWritten(target.toStdString(), error);
-    std::ranges::sort(names);
-    for (const auto& each : names) {
-        const CString name = QString::fromStdString(Utf8FromPath(each));
-        if (name.compare(QFileInfo(target).fileName(), Qt::CaseInsensitive) == 0)
-            return QFileInfo(target).dir().filePath(name);
-    }
-    return target;
 }
 
 } // namespace
@@ -210,7 +186,7 @@ Result<void> CKsDocumentFile::Save(const CString& target, const KsFileWriter& wr
     if (replaces.value() && CopySuffix() && m_keptCopy.isEmpty())
         if (const Result<void> kept = KeepCopy(); !kept)
             return kept;
-    const Result<CString> entry = replaces.value() ? m_path : ExistingEntry(target);
+    const Result<CString> entry = replaces.value() ? m_path : KsExistingEntry(target);
     if (!entry)
         return entry.error();
     // Where the file system tells the spellings apart, the file is written under its old one and then renamed: so it

@@ -1,9 +1,13 @@
 #include "ks/fc/file_name.h"
 
+#include "base/utf8_path.h"
+#include "files/file_content.h"
 #include "ks/fc/shown_text.h"
 
 #include <QDir>
 #include <QFileInfo>
+#include <algorithm>
+#include <vector>
 
 CString KsExistingSpelling(const CString& path)
 {
@@ -11,13 +15,30 @@ CString KsExistingSpelling(const CString& path)
     if (path.isEmpty() || file.exists() || file.fileName().isEmpty())
         return path;
     const CString given = file.path(), folder = QFileInfo::exists(given) ? given : KsExistingSpelling(given);
-    const CString same = QDir(folder).filePath(file.fileName());
-    if (QFileInfo::exists(same))
-        return same;
-    const auto names = QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot, QDir::Name);
-    for (const CString& name : names)
-        if (name.compare(file.fileName(), Qt::CaseInsensitive) == 0)
-            return QDir(folder).filePath(name);
+    const Result<CString> entry = KsExistingEntry(QDir(folder).filePath(file.fileName()));
+    return entry && QFileInfo::exists(entry.value()) ? entry.value() : path;
+}
+
+Result<CString> KsExistingEntry(const CString& path)
+{
+    PlatformFile& platform = PlatformFile::Native();
+    const QFileInfo target(path);
+    FileStatus status;
+    std::vector<PlatformFile::Path> names;
+    std::error_code error = platform.Status(target.filesystemFilePath(), status);
+    if (error || status.kind != FileStatus::Kind::None)
+        return error ? Result<CString>(NotWritten(path.toStdString(), error)) : path;
+    error = platform.List(FolderOf(target.filesystemFilePath()), names);
+    if (error == std::errc::no_such_file_or_directory || error == std::errc::permission_denied)
+        return path; // as writing will say; a folder may be open to writing alone
+    if (error)
+        return NotWritten(path.toStdString(), error);
+    std::ranges::sort(names);
+    for (const auto& each : names) {
+        const CString name = QString::fromStdString(Utf8FromPath(each));
+        if (name.compare(target.fileName(), Qt::CaseInsensitive) == 0)
+            return target.dir().filePath(name);
+    }
     return path;
 }
 

@@ -1,8 +1,9 @@
 // The functions that the HD parameter editor exports for other editors; find them with KsFindExport.
 //
-// All are called on the user-interface thread and never throw. A null list, an unknown type, a record that is not there,
-// a file that cannot be read: nothing happens, and the answer is null. Whoever makes a list owns it and its items: the
-// caller owns what it passes, and the lists that the first three functions return are the caller's to delete.
+// All are called on the user-interface thread and never throw. A null list, an unknown type, a record that is not
+// there, a file that cannot be read: nothing happens, and the answer is null. Whoever makes a list owns it and its
+// items: the caller owns what it passes, and the lists that the first three functions return are the caller's to
+// delete.
 #pragma once
 
 #include "ks/fc/exchange.h"

@@ -18,8 +18,8 @@ KS_API QMessageBox::StandardButton KsMessageBox(const CString& text,
                                                 QWidget* parent = nullptr, const CString& details = {},
                                                 QMessageBox::StandardButton defaultButton = QMessageBox::NoButton);
 
-/// While it lives, messages that ask nothing are kept instead of shown, so that they can be told together. Questions are
-/// asked at once. The innermost one keeps.
+/// While it lives, messages that ask nothing are kept instead of shown, so that they can be told together. Questions
+/// are asked at once. The innermost one keeps.
 class KS_API CKsKeptMessages
 {
 public:

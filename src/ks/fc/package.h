@@ -23,9 +23,9 @@ using CObList = std::vector<std::unique_ptr<CKsCBEItem>>;
 class KS_API CKSComm_Package : public CKsCBEItem
 {
 public:
-    CView* view = nullptr;     // the sender
-    CString text;              // a document's path name
-    int kind = 0;              // 8: HD parameters
-    std::intptr_t project = 0; // handle from joining, 0 for none
+    CView* view = nullptr;      // the sender
+    CString text;               // a document's path name
+    int kind = 0;               // 8: HD parameters
+    std::intptr_t project = 0;  // handle from joining, 0 for none
     CObList* objects = nullptr; // the sender's list, for what the request asks or brings; null for none
 };

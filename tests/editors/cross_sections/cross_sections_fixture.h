@@ -102,7 +102,7 @@ protected:
     }
     static QString WriteCrossSections(const QString& path, const CCrossSections& sections)
     {
-        const auto saved = SaveCrossSections(sections, path.toStdString());
+        const auto saved = SaveDeclaredFile(path.toStdString(), DeclaredSectionFile(), &sections);
         return saved ? QString() : QString::fromStdString(saved.error().message);
     }
     /// Opens sections in a window.

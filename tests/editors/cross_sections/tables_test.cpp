@@ -256,17 +256,6 @@ TEST_F(CrossSectionTest, LinesAreSearchedByBranchAndChainage)
     EXPECT_EQ(boxes, QStringList{"The last occurence of searched item already found"});
 }
 
-TEST_F(CrossSectionTest, NumbersShowWhatTheyHide)
-{
-    CCrossSectionView* view = Open();
-    EXPECT_TRUE(Edit(view->Sections(), Main2500, SectionWidth, "20.123567"));
-    EXPECT_EQ(Text(view->Sections(), Main2500, SectionWidth), "20.124");
-    EXPECT_TRUE(view->Sections()->Model()->HidesDigits(Main2500, SectionWidth));
-    KsUnits::Instance().SetAllDigits(true);
-    EXPECT_EQ(Text(view->Sections(), Main2500, SectionWidth), "20.123567");
-    KsUnits::Instance().SetAllDigits(false);
-}
-
 TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
 {
     CCrossSectionView* view = Open();
@@ -292,8 +281,7 @@ TEST_F(CrossSectionTest, CommandsStepThroughTheSections)
     EXPECT_GE(changed.count(), 1) << "tool bars hear of what can be done now";
     std::set<int> known;
     for (const CKsMenuCommand& command : view->LinesMenu())
-        known.insert(command.id);
-    EXPECT_EQ(known.size(), 8u) << "seven commands and a separator";
+        EXPECT_TRUE(command.id == 0 || known.insert(command.id).second) << command.id;
 }
 
 TEST_F(CrossSectionTest, TheContextMenuIsAboutTheTableItWasAskedFor)

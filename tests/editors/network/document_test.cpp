@@ -1,4 +1,4 @@
-// The document: undo of every change, the modified flag, and what the project hears.
+// The document: undo of every change, and what the project hears.
 #include "editors/network/document.h"
 #include "network_fixture.h"
 
@@ -23,10 +23,9 @@ TEST_F(NetworkTest, EveryChangeIsUndoneRedoneAndTold)
 
     const QStringList states[] = {
         {"MAIN", "SIDE"}, {"MAIN", "SIDE", "A", "B", "C"}, {"MAIN", "LEFT", "A", "B", "C"}, {"LEFT", "A", "B", "C"}};
-    const std::function<void()> changes[] = {
-        [&] { document.AppendBranches(more, "EPSG:25832", "append"); },
-        [&] { Edit(view->Branches(), 1, BranchName, " LEFT "); },
-        [&] { Remove(document, view->Branches()->Model()->Rows(), 0, 1); }};
+    const std::function<void()> changes[] = {[&] { document.AppendBranches(more, "EPSG:25832", "append"); },
+                                             [&] { Edit(view->Branches(), 1, BranchName, " LEFT "); },
+                                             [&] { Remove(document, view->Branches()->Model()->Rows(), 0, 1); }};
     for (int i = 0; i < 3; ++i) {
         log.clear();
         changes[i]();
@@ -62,28 +61,6 @@ TEST_F(NetworkTest, TheReferenceFollowsTheNetwork)
     EXPECT_EQ(view->Document()->Reference().PointAt(0, 5000), QPointF(3000, 0));
     view->Document()->UndoStack().undo();
     EXPECT_EQ(view->Document()->Reference().PointAt(0, 4000), QPointF(3000, 0));
-}
-
-TEST_F(NetworkTest, AViewJoinsItsProjectAndLeavesIt)
-{
-    CNetworkView* view = Open();
-    EXPECT_EQ(view->Document()->ProjectHandle(), 7);
-    EXPECT_TRUE(log.contains("shell 25"));
-    log.clear();
-    frame.reset();
-    EXPECT_EQ(log.mid(0, 2), (QStringList{"shell 24", "others 522"}));
-
-    project = 0; // a file of no project
-    view = Open();
-    log.clear();
-    Remove(*view->Document(), view->Branches()->Model()->Rows(), 0, 1);
-    QCoreApplication::processEvents();
-    EXPECT_EQ(view->Document()->ProjectViews(view).size(), 0u);
-    EXPECT_TRUE(log.isEmpty()) << log.join(';').toStdString();
-    project = 9; // now its project is opened
-    CKSComm_Package package;
-    KsSendMessage(view, KsMessage::ProjectManagement(), KsRequest::ProjectOpened, reinterpret_cast<LPARAM>(&package));
-    EXPECT_EQ(view->Document()->ProjectHandle(), 9);
 }
 
 } // namespace

@@ -35,10 +35,7 @@ protected:
         MakeGisFile(path.endsWith(".shp") ? "ESRI Shapefile" : "GPKG", path, layers);
         return path;
     }
-    static std::string Notes(const QStringList& notes)
-    {
-        return notes.join('\n').toStdString();
-    }
+    static std::string Notes(const QStringList& notes) { return notes.join('\n').toStdString(); }
     static QStringList Names(const CImportPlan& plan)
     {
         QStringList names;

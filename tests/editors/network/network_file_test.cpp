@@ -119,46 +119,6 @@ TEST_F(NetworkTest, AFileWithFaultsOpensUnderABarAndIsKeptWhenSavedOver)
     EXPECT_THAT(saved.toStdString(), HasSubstr("DATA = 2000, nan, 30"));
 }
 
-TEST_F(NetworkTest, AFileThatIsNoneIsNotOpened)
-{
-    QByteArray other(SmallNetwork), broken(SmallNetwork);
-    EXPECT_EQ(Open(other.replace("KVR_NETWORK", "KAVO0_HD")), nullptr);
-    EXPECT_EQ(Open(broken.replace("[/Channel]\n    [Bridges]", "[Bridges]")), nullptr);
-    ASSERT_EQ(boxes.size(), 2);
-    EXPECT_EQ(boxes[0], "river.kvnw is no file of this kind: it has no section [KVR_NETWORK].");
-    EXPECT_THAT(boxes[1].toStdString(), HasSubstr("river.kvnw, line 23, column 3: expected [/Channel]"));
-}
-
-TEST_F(NetworkTest, ASaveThatFailsTellsWhyAndLeavesTheDocumentModified)
-{
-    CNetworkView* view = Open();
-    EXPECT_TRUE(Edit(view->Branches(), 0, BranchName, "OTHER"));
-    const QString nowhere = folder.filePath("missing/river.kvnw");
-    EXPECT_FALSE(view->Document()->DoSave(nowhere));
-    ASSERT_EQ(boxes.size(), 1);
-    EXPECT_THAT(boxes[0].toStdString(), HasSubstr("Could not write \""));
-    EXPECT_TRUE(view->Document()->IsModified());
-    EXPECT_TRUE(view->Document()->DoSave(folder.filePath("river.kvnw")));
-    EXPECT_FALSE(view->Document()->IsModified());
-    EXPECT_THAT(Read(folder.filePath("river.kvnw")).toStdString(), HasSubstr("Name = \"OTHER\""));
-}
-
-#ifndef Q_OS_WIN
-TEST_F(NetworkTest, ASaveKeepsWhatIsAboutTheFile)
-{
-    CNetwork network;
-    const QString file = Write("own.kvnw", SmallNetwork), link = folder.filePath("link.kvnw");
-    ASSERT_EQ(ReadNetwork(file, network), "");
-    const auto ofOwner = QFile::ReadOwner | QFile::WriteOwner;
-    ASSERT_TRUE(QFile::setPermissions(file, ofOwner) && QFile::link("own.kvnw", link));
-    network.branches[0].name = "OTHER";
-    ASSERT_EQ(WriteNetwork(link, network), "");
-    EXPECT_TRUE(QFileInfo(link).isSymLink());
-    EXPECT_TRUE(Read(file).contains("OTHER"));
-    EXPECT_FALSE(QFile::permissions(file) & (QFile::ReadGroup | QFile::ReadOther));
-}
-#endif
-
 TEST_F(NetworkTest, TheSampleNetworkFitsTheSampleParameters)
 {
     const QString committed = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.kvnw");

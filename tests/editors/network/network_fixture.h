@@ -117,7 +117,7 @@ protected:
     }
     static QString WriteNetwork(const QString& path, const CNetwork& network)
     {
-        const auto saved = SaveNetwork(network, path.toStdString());
+        const auto saved = SaveDeclaredFile(path.toStdString(), DeclaredNetworkFile(), &network);
         return saved ? QString() : QString::fromStdString(saved.error().message);
     }
     /// Opens the small network in a window.
@@ -163,9 +163,9 @@ protected:
     bool hdOpen = true;
     std::vector<CMapLocation> hdLocations{
         {"MAIN", 2000, HDInitialData, {}}, {"MAIN", 5000, HDBedData, {}},
-        {"MAIN", 9000, HDBedData, {}},                                                  // behind the end
+        {"MAIN", 9000, HDBedData, {}},                                         // behind the end
         {"LOST", 100, HDWindData, {}},     {"SIDE", 250, HDDataTypeCount, {}}, // no such kind
-        {"", 100, HDInitialData, {}}, // lines that are not complete
+        {"", 100, HDInitialData, {}},                                          // lines that are not complete
         {"MAIN", 1e10, HDInitialData, {}}};
     FakeHDDoc hdDoc;
     FakeHDView hdView; // goes before its document

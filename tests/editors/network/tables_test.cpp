@@ -164,15 +164,6 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     EXPECT_EQ(chainages(), "2000 4000 6000");
 }
 
-TEST_F(NetworkTest, WhatIsBeingTypedIsStoredBeforeASave)
-{
-    CNetworkView* view = Open();
-    ASSERT_NE(Type(view->Channel(), 0, ChannelWidth, "31.5"), nullptr);
-    EXPECT_TRUE(view->Document()->DoSave(folder.filePath("river.kvnw")));
-    EXPECT_THAT(Read(folder.filePath("river.kvnw")).toStdString(), testing::HasSubstr("DATA = 2000, 400, 31.5"));
-    EXPECT_FALSE(view->Document()->IsModified());
-}
-
 TEST_F(NetworkTest, WhatCannotBeStoredStaysInItsEditorAndIsToldOnce)
 {
     CNetworkView* view = Open();
