@@ -145,8 +145,17 @@ class Round:
             self.base = now if now and now[0] == shown else (shown,)
             self.account.settled.update(mine)
 
+    def offered(self, shell, *names):
+        """A button of the bar, which comes soon when the file is another."""
+        end = time.monotonic() + 3 * (self.account.standing() != self.base)
+        while True:
+            button = next(filter(None, map(shell.button, names)), None)
+            if button or time.monotonic() >= end:
+                return button
+            time.sleep(0.1)
+
     def reload(self, shell):
-        button, before = shell.button('Reload'), self.account.standing()
+        button, before = self.offered(shell, 'Reload'), self.account.standing()
         if not button:
             return
         shell.editor.click(button)
@@ -160,7 +169,7 @@ class Round:
                 self.account.settled.add(each)
 
     def overwrite(self, shell):
-        button = shell.button('Overwrite') or shell.button('Save Again')
+        button = self.offered(shell, 'Overwrite', 'Save Again')
         if not button:
             return
         shell.editor.click(button)
@@ -168,13 +177,14 @@ class Round:
         shown, now = self.shown(shell), self.account.standing()
         self.steps.append(f'overwrites: {now} stands there')
         shell.said += shell.notices()
-        if not shell.editor.modified:
-            self.base = now if now and now[0] == shown else (shown,)
-            self.account.settled.add(self.base)
+        self.counts['overwrites'] += 1
+        if not shell.editor.modified and now and now[0] == shown:
+            self.base = now
+            self.account.settled.add(now)
 
     def keep_both(self, shell):
         """The document is another file's then."""
-        button = shell.button('Keep Both...')
+        button = self.offered(shell, 'Keep Both...')
         if button:
             shell.editor.click(button)
             shell.editor.box()
@@ -324,7 +334,7 @@ class Round:
 
 def run(folder, rounds, seed):
     """Why not all is well, or nothing."""
-    counts, broken = dict.fromkeys(('steps', 'saves', 'questions', 'reloads', 'copies'), 0), 0
+    counts, broken = dict.fromkeys(('steps', 'saves', 'questions', 'reloads', 'overwrites', 'copies'), 0), 0
     for number in range(rounds):
         each = Round(f'{folder}/{number}', f'{seed}.{number}', counts)
         try:

@@ -4,6 +4,9 @@
 #include "ks/fc/project_doc.h"
 #include "shell_fixture.h"
 
+#include <QSignalSpy>
+#include <algorithm>
+
 namespace {
 
 class OthersTest : public ShellTest
@@ -48,8 +51,10 @@ TEST_F(OthersTest, AFileIsTakenOverWhenNobodyHasIt)
     EXPECT_TRUE(document.IsInUse() && IsTold(document, "is in use by"));
     theirs.Release();
     EXPECT_TRUE(QTest::qWaitFor([&] { return IsTold(document, "can be edited now"); }));
+    QSignalSpy news(&document, &CKsProjectDoc::FileStateChanged);
     theirs = FileLock::Try(path.toStdString(), "kvrshell");
-    EXPECT_TRUE(QTest::qWaitFor([&] { return !IsTold(document, "can be edited now"); })) << "somebody was faster";
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !news.isEmpty() && !IsTold(document, "can be edited now"); }))
+        << "somebody was faster, and the bar is told";
     Write("a.HDKV", TextWith("2.5"));
     document.EditFreed();
     EXPECT_TRUE(document.IsInUse());
