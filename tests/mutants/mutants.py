@@ -52,7 +52,6 @@ MUTANTS = [
     ('documents', 'ks/fc/project_doc.cpp', '    if (IsInUse()) // somebody else was faster\n        return;\n', ''),
     ('documents', 'ks/fc/outside_change.cpp', '        m_isClosed = false;\n', ''),
     ('documents', 'ks/fc/file_use.cpp', '!= isFree || isOther)', '!= isFree && isFree)'),
-    ('ks', 'ks/fc/file_watch.cpp', 'a.IsUnchanged(b) && a.touched == b.touched', 'a.IsUnchanged(b)'),
     # The grid.
     ('files', 'files/read_number.cpp', 'result_out_of_range && IsTiny(text)', 'result_out_of_range && !IsTiny(text)'),
     ('grid', 'grid/table_text.cpp', "c == u'\\t' || c == u'\\n' || c == u'\\r' || c == u'\"'; });",
