@@ -83,22 +83,25 @@ class Desk:
 
     def _outcome(self):
         """Whether the program says that it has saved, and its words; None when it is no more."""
-        editor, end = self._editor, time.monotonic() + PATIENCE
         try:
-            while time.monotonic() < end:
-                if editor.process.poll() is not None:
-                    return None, ''
-                if texts := editor.no_message():
-                    editor.press('Escape')
-                    editor.settle()
-                    return not editor.modified, '\n'.join(texts)
-                if not editor.modified:
-                    return True, editor.status() + self._bar()
+            return self._look()
         except Exception:  # it went while it was looked at
             time.sleep(1)
-            if editor.process.poll() is None:
+            if self._editor.process.poll() is None:
                 raise
             return None, ''
+
+    def _look(self):
+        editor, end = self._editor, time.monotonic() + PATIENCE
+        while time.monotonic() < end:
+            if editor.process.poll() is not None:
+                return None, ''
+            if texts := editor.no_message():
+                editor.press('Escape')
+                editor.settle()
+                return not editor.modified, '\n'.join(texts)
+            if not editor.modified:
+                return True, editor.status() + self._bar()
         return False, ''
 
 
@@ -118,8 +121,8 @@ class ProjectDesk(Desk):
         super()._change()
         return self._guarded.text.replace('.hdkv', '.HDKV')
 
-    def _outcome(self):
-        saved, said = super()._outcome()
+    def _look(self):
+        saved, said = super()._look()
         if saved is None:
             return saved, said
         if texts := self._editor.no_message():  # it comes when the member is saved
@@ -149,4 +152,5 @@ def run(folder, orders, every, kinds):
                                   for sentence in desk.save(point)[1]]
                 finally:
                     desk.end()
+            print(f'shell, {name}: {count} points so far, {len(wrong)} violations', flush=True)
     return count, wrong
