@@ -1,5 +1,5 @@
-// How long the user-interface thread is held up when the changes of a large document are kept for recovery, and when its
-// file is read again because somebody has touched it. bench_snapshot FILE, for example of examples/make_million.
+// How long the user-interface thread is held up when the changes of a large document are kept for recovery, and when
+// its file is read again because somebody has touched it. bench_snapshot FILE, for example of examples/make_million.
 #include "bench/report.h"
 #include "shell/main_frame.h"
 
@@ -15,7 +15,7 @@
 namespace {
 
 constexpr int Rounds = 15;
-constexpr double Limit = 16; // milliseconds: one picture at 60 a second
+constexpr double Limit = 16;   // milliseconds: one picture at 60 a second
 constexpr int UntilRead = 800; // milliseconds, from a touch until the file has been read
 
 /// Notes how long each event takes.

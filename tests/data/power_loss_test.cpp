@@ -249,14 +249,16 @@ struct Way
     const char* renameTo = "";
     bool displaces = false; // what stands there is another program's, and the user saves all the same
 };
-constexpr Way ways[] = {
-    {.name = "a new file", .exists = false},     {.name = "an old one"},
-    {.name = "that is known", .expects = true},  {.name = "that cannot be swapped", .canExchange = false},
-    {.name = "of two names", .otherName = true}, {.name = "that is renamed", .renameTo = "A"},
-    {.name = "that somebody has changed", .displaces = true},
-    {.name = "changed, that cannot be swapped", .canExchange = false, .displaces = true},
-    {.name = "changed, of two names", .otherName = true, .displaces = true},
-    {.name = "changed, that is renamed", .renameTo = "A", .displaces = true}};
+constexpr Way ways[] = {{.name = "a new file", .exists = false},
+                        {.name = "an old one"},
+                        {.name = "that is known", .expects = true},
+                        {.name = "that cannot be swapped", .canExchange = false},
+                        {.name = "of two names", .otherName = true},
+                        {.name = "that is renamed", .renameTo = "A"},
+                        {.name = "that somebody has changed", .displaces = true},
+                        {.name = "changed, that cannot be swapped", .canExchange = false, .displaces = true},
+                        {.name = "changed, of two names", .otherName = true, .displaces = true},
+                        {.name = "changed, that is renamed", .renameTo = "A", .displaces = true}};
 
 Result<WriteReport> Save(const Way& way, MemoryDisk& disk)
 {

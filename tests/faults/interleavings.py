@@ -3,9 +3,9 @@
 
 In each round the shell has a file of one of the four kinds open, with real keys, while others write over it, replace,
 remove or touch it, make it a link, or set a value by hdkv; in some a second shell opens it, too. What another program
-has written never goes unless its writer, or the user, has seen it: it stands in the file, in a copy that is named, or was
-loaded. What the shell says about a save is so; in the end it tells a change exactly when there is one; nothing is left
-over.
+has written never goes unless its writer, or the user, has seen it: it stands in the file, in a copy that is named, or
+was loaded. What the shell says about a save is so; in the end it tells a change exactly when there is one; nothing is
+left over.
 
     KVR_BIN=build/dev/bin tests/faults/interleavings.py 100 1 5
 """

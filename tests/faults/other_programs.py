@@ -134,8 +134,8 @@ class OtherPrograms:
             self._account.settled.add(before)
         elif now and now[-1] == level:
             self.wrong.append(f'hdkv ends with {result.returncode} and has written')
-        elif result.returncode == 0 and all(self._account.standing(each) is None or self._account.standing(each)[-1] != level
-                                            for each in self._account.files()):
+        elif result.returncode == 0 and not any(each and each[-1] == level
+                                                for each in map(self._account.standing, self._account.files())):
             self.wrong.append(f'hdkv says that {level} is written')
         elif result.returncode not in (0, 1, 2, 3, 4) or (result.returncode and not result.stderr.strip()):
             self.wrong.append(f'hdkv ends with {result.returncode}: {result.stderr}')

@@ -1,4 +1,5 @@
 """Every fault at every file call of a save in the shell, for the files of all its editors, with real keys."""
+import glob
 import os
 import re
 import shutil
@@ -125,14 +126,17 @@ class ProjectDesk(Desk):
         saved, said = super()._look()
         if saved is None:
             return saved, said
+        end = time.monotonic() + PATIENCE  # the project is written behind its member
+        while glob.glob(f'{self._folder}/**/.*.lock', recursive=True) and time.monotonic() < end:
+            time.sleep(0.05)
         if texts := self._editor.no_message():  # it comes when the member is saved
             said += '\n'.join(texts)
         return saved and 'still names' not in said, said
 
 
 def run(folder, orders, every, kinds):
-    """Goes through every nth point; of projects, which take a start each, fewer. Gives back how many there were and what
-    did not hold."""
+    """Goes through every nth point; of projects, which take a start each, fewer. Gives back how many there were and
+    what did not hold."""
     from session import Session
 
     count, wrong = 0, []

@@ -256,12 +256,9 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
     Change(Open(edited), "1.5", "7.5");
     for (const CRecoverable& item : found) {
         const QString name = item.header.path.isEmpty() ? "new" : QFileInfo(item.header.path).completeBaseName();
-        const std::map<QString, CRecoverable::State> states{{"changed", CRecoverable::Changed},
-                                                            {"early", CRecoverable::Changed},
-                                                            {"missing", CRecoverable::Missing},
-                                                            {"edited", CRecoverable::Same},
-                                                            {"used", CRecoverable::Same},
-                                                            {"new", CRecoverable::New}};
+        const std::map<QString, CRecoverable::State> states{
+            {"changed", CRecoverable::Changed}, {"early", CRecoverable::Changed}, {"missing", CRecoverable::Missing},
+            {"edited", CRecoverable::Same},     {"used", CRecoverable::Same},     {"new", CRecoverable::New}};
         EXPECT_EQ(item.state, states.at(name)) << name.toStdString();
         ASSERT_TRUE(frame->Recovery().Open(item));
         const CKsDoc* document = frame->ActiveDocument();

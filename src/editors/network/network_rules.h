@@ -41,5 +41,6 @@ public:
 
 private:
     CBranchKeys m_taken;
-    std::unordered_map<QString, int> m_numbers; // the last one that was tried, by the key of what was wanted: many may want the same
+    std::unordered_map<QString, int>
+        m_numbers; // the last one that was tried, by the key of what was wanted: many may want the same
 };
