@@ -47,10 +47,9 @@ bool LosesContent(const Read& read)
     return std::ranges::any_of(read.findings, &Finding::LosesContent);
 }
 
-/// Whether something stands in the file otherwise than it was written.
-bool TakesForAnother(const Read& read)
+bool Has(const Read& read, Finding::Kind kind)
 {
-    return std::ranges::any_of(read.findings, [](const Finding& each) { return each.kind == Finding::OtherType; });
+    return std::ranges::any_of(read.findings, [kind](const Finding& each) { return each.kind == kind; });
 }
 
 } // namespace
@@ -63,11 +62,15 @@ std::string CheckFile(const std::string& text, const RoundTrip& trip)
     const Read second = ReadText(first.text, trip);
     if (second.isOther || !second.fault.empty())
         return "what was written cannot be read: " + second.fault + '\n' + first.text;
+    const bool isTold = LosesContent(first) || Has(first, Finding::OtherType);
+    if (!isTold && !std::ranges::includes(second.words, first.words))
+        return "something is lost that was not reported:\n" + text + "\nbecame\n" + first.text;
+    // What was not read for want of another keyword is read when that has been written: a text like any other.
+    if (Has(first, Finding::NotRead) && first.text != text)
+        return CheckFile(first.text, trip);
     if (second.text != first.text)
         return "read and written again, it is another text:\n" + first.text + "\nbecame\n" + second.text;
     if (LosesContent(second))
         return "what was written is not taken as it stands:\n" + first.text;
-    if (!LosesContent(first) && !TakesForAnother(first) && !std::ranges::includes(second.words, first.words))
-        return "something is lost that was not reported:\n" + text + "\nbecame\n" + first.text;
     return "";
 }

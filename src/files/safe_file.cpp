@@ -252,6 +252,8 @@ bool SafeWriter::Rename(const fs::path& from, const fs::path& to)
 {
     if (to.empty())
         return false;
+    if (m_options.sync && !m_report.displaced.empty()) // it has its name on the medium before the file loses its own
+        m_platform.SyncFolder(m_folder);
     m_report.notRenamed = m_replacesOther ? m_platform.Rename(from, to) : m_platform.RenameNew(from, to);
     return !m_report.notRenamed;
 }

@@ -59,6 +59,17 @@ TEST(Difference, IsToldValueByValue)
     EXPECT_EQ(Told("K = 1\nM = 1\n", "K = 2\nM = 2\n", 1), " K 1.1@2: 1 -> 2\n2 0 0 1") << "counted beyond the list";
 }
 
+TEST(Difference, IsToldOfFurtherTargets)
+{
+    const TqlStructure a = Parsed("[T]\n[/T]\n[U]\nK = 1\n[/U]\n"),
+                       b = Parsed("[T]\n[/T]\n[U]\nK = 2\n[/U]\n[V]\nM = 1\n[/V]\n");
+    const Differences found = FindDifferences(a.Get(), b.Get());
+    ASSERT_EQ(found.list.size(), 2u);
+    EXPECT_EQ(found.list[0].section + found.list[0].before + found.list[0].after, "U12");
+    EXPECT_EQ(found.list[1].section + found.list[1].keyword, "V");
+    EXPECT_EQ(found.changed + 10 * found.added, 11u);
+}
+
 TEST(Difference, LinesInAnotherOrderAreFewAndLongFilesTakeNoTimeToSpeakOf)
 {
     constexpr int many = 50'000;

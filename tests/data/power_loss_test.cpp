@@ -3,6 +3,7 @@
 
 #include "base/utf8_path.h"
 
+#include <algorithm>
 #include <functional>
 #include <gtest/gtest.h>
 #include <map>
@@ -246,11 +247,18 @@ struct Way
     const char* name;
     bool exists = true, otherName = false, canExchange = true, expects = false;
     const char* renameTo = "";
+    bool displaces = false; // what stands there is another program's, and the user saves all the same
 };
-constexpr Way ways[] = {
-    {.name = "a new file", .exists = false},     {.name = "an old one"},
-    {.name = "that is known", .expects = true},  {.name = "that cannot be swapped", .canExchange = false},
-    {.name = "of two names", .otherName = true}, {.name = "that is renamed", .renameTo = "A"}};
+constexpr Way ways[] = {{.name = "a new file", .exists = false},
+                        {.name = "an old one"},
+                        {.name = "that is known", .expects = true},
+                        {.name = "that cannot be swapped", .canExchange = false},
+                        {.name = "of two names", .otherName = true},
+                        {.name = "that is renamed", .renameTo = "A"},
+                        {.name = "that somebody has changed", .displaces = true},
+                        {.name = "changed, that cannot be swapped", .canExchange = false, .displaces = true},
+                        {.name = "changed, of two names", .otherName = true, .displaces = true},
+                        {.name = "changed, that is renamed", .renameTo = "A", .displaces = true}};
 
 Result<WriteReport> Save(const Way& way, MemoryDisk& disk)
 {
@@ -263,6 +271,10 @@ Result<WriteReport> Save(const Way& way, MemoryDisk& disk)
     SafeFileOptions options{.platform = &disk, .renameTo = way.renameTo};
     if (way.expects)
         options.expected = VersionOfText(Old);
+    if (way.displaces) {
+        options.expected = VersionOfText("what the user has seen");
+        options.ask = [](const WriteQuestion&) { return WriteAnswer::Yes; };
+    }
     return WriteFileSafely("a", New, options);
 }
 
@@ -272,9 +284,12 @@ bool Stands(const Disk& disk, const std::string& name, const std::string& conten
     return found != disk.end() && found->second == content;
 }
 
-/// The file is there whole, old or new, once; of one that is written over, at least a whole copy.
+/// The file is there whole, old or new, once; of one that is written over, at least a whole copy. What nobody has seen
+/// is there in any case.
 bool IsWhole(const Way& way, const Disk& disk)
 {
+    if (way.displaces && std::ranges::none_of(disk, [](const auto& entry) { return entry.second == Old; }))
+        return false;
     const bool renamed = disk.contains("A");
     if (!way.exists && !disk.contains("a"))
         return true;
@@ -304,6 +319,7 @@ TEST(PowerLoss, LeavesTheOldOrTheNewContentWhole)
                     continue;
                 const char* const name = *way.renameTo && !result.value().notRenamed ? way.renameTo : "a";
                 ASSERT_TRUE(Stands(found, name, New)) << "said to be on the disk, " << way.name << ", " << mask;
+                ASSERT_TRUE(!way.displaces || Stands(found, result.value().displaced, Old)) << way.name << ", " << mask;
             }
         }
     RecordProperty("states", int(states));

@@ -9,17 +9,11 @@ Several displays share the cycles: a cycle is mostly waiting.
 
     KVR_BIN=build/dev/bin tests/faults/recovery.py 200 1 5
 """
-import os
 import random
 import re
-import subprocess
-import sys
-import tempfile
 import time
 
-HERE = os.path.dirname(os.path.abspath(__file__))
-sys.path.insert(0, f'{HERE}/../desktop')
-from session import Session  # noqa: E402
+import displays
 
 MOST_LOST = 10.0  # seconds
 TABLES = {'moor.HDKV': ('Local ', 3), 'moor.kvnw': ('Radius and width', 2),
@@ -134,34 +128,14 @@ class Cycles:
                   f'{max(self.losses):.1f} s', flush=True)
 
 
-def run_here(number, seed):
-    """The cycles on a display of their own. Why they ended early, or nothing."""
-    with Session() as desktop, tempfile.TemporaryDirectory() as work:
-        cycles = Cycles(work, seed)
-        try:
-            cycles.run(number)
-        except Exception as error:
-            picture = f'{tempfile.gettempdir()}/recovery-failed-{seed}.png'
-            desktop.picture(picture)
-            return f'{type(error).__name__}: {error}; screen: {picture}'
-        finally:
-            if cycles.editor:
-                cycles.editor.end()
-    return None
-
-
-def run_on(displays, number, seed):
-    """The cycles on several displays, each in a process that has it in its environment."""
-    shares = [number // displays + (each < number % displays) for each in range(displays)]
-    runs = [subprocess.Popen([sys.executable, '-B', __file__, str(share), str(seed + each)])
-            for each, share in enumerate(shares) if share]
-    failed = sum(run.wait() != 0 for run in runs)
-    return f'{failed} of {len(runs)} displays ended early' if failed else None
+def run(folder, number, seed):
+    cycles = Cycles(folder, seed)
+    try:
+        cycles.run(number)
+    finally:
+        if cycles.editor:
+            cycles.editor.end()
 
 
 if __name__ == '__main__':
-    if len(sys.argv) not in (2, 3, 4):
-        sys.exit(__doc__)
-    os.environ['KVR_BIN'] = os.path.abspath(os.environ.get('KVR_BIN', f'{HERE}/../../build/dev/bin'))
-    cycles, seed, displays = (*map(int, sys.argv[1:]), *(1, 1)[len(sys.argv) - 2:])
-    sys.exit(run_on(displays, cycles, seed) if displays > 1 else run_here(cycles, seed))
+    displays.main(run, __file__, __doc__)

@@ -1,6 +1,8 @@
 """Every fault at every file call of a save in the shell, for the files of all its editors, with real keys."""
+import glob
 import os
 import re
+import shutil
 import sys
 import time
 
@@ -29,10 +31,9 @@ class Desk:
         self._guarded = Guarded(self._folder, name, text(), linked)
         self._value, self._editor = 1, None
 
-    def start(self):
+    def _start(self):
         from editor import Editor  # only inside of a session: it looks up the accessibility bus
 
-        self.end()
         os.environ.update(self._orders.environment)
         try:
             self._editor = Editor(self._home, f'{self._folder}/{self._name}')
@@ -45,17 +46,23 @@ class Desk:
             self._editor.end()
         self._editor = None
 
-    def save(self, point=None):
-        """Types another value and saves, with a fault. Gives back the calls that the save took and what did not hold
-        afterwards."""
-        editor, (table, line, column) = self._editor, self._cell
+    def _change(self):
+        """Types another value. What the file holds when that is saved."""
+        if not self._editor:
+            self._start()
+        table, line, column = self._cell
         self._value += 1
         value = f'1.{self._value:04}1'
-        editor.put(line, column, value, leave='Return', table=editor.table(table))
+        self._editor.put(line, column, value, leave='Return', table=self._editor.table(table))
         # The value is the only thing that may be new, once the file has been written as the program writes it.
-        new = re.sub(re.escape(self._before) + r'[^,\n]*', self._before + value, self._guarded.content(), count=1)
+        return re.sub(re.escape(self._before) + r'[^,\n]*', self._before + value, self._guarded.content(), count=1)
+
+    def save(self, point=None):
+        """Changes something and saves, with a fault. Gives back the calls that the save took and what did not hold
+        afterwards."""
+        new = self._change()
         self._orders.arm(self._folder, point)
-        editor.press('ctrl+s')
+        self._editor.press('ctrl+s')
         saved, said = self._outcome()
         calls = self._orders.disarm()
         found = [] if point is None else self._guarded.violations(new, saved, said, may_litter=saved is None or point.keeps_files)
@@ -64,7 +71,7 @@ class Desk:
         if saved is None and not point.kills:
             found.append('the program ended')
         if saved is None:
-            self.start()
+            self.end()
         self._guarded.start_over()
         return calls, found
 
@@ -77,42 +84,77 @@ class Desk:
 
     def _outcome(self):
         """Whether the program says that it has saved, and its words; None when it is no more."""
-        editor, end = self._editor, time.monotonic() + PATIENCE
         try:
-            while time.monotonic() < end:
-                if editor.process.poll() is not None:
-                    return None, ''
-                if texts := editor.no_message():
-                    editor.press('Escape')
-                    editor.settle()
-                    return not editor.modified, '\n'.join(texts)
-                if not editor.modified:
-                    return True, editor.status() + self._bar()
+            return self._look()
         except Exception:  # it went while it was looked at
             time.sleep(1)
-            if editor.process.poll() is None:
+            if self._editor.process.poll() is None:
                 raise
             return None, ''
+
+    def _look(self):
+        editor, end = self._editor, time.monotonic() + PATIENCE
+        while time.monotonic() < end:
+            if editor.process.poll() is not None:
+                return None, ''
+            if texts := editor.no_message():
+                editor.press('Escape')
+                editor.settle()
+                return not editor.modified, '\n'.join(texts)
+            if not editor.modified:
+                return True, editor.status() + self._bar()
         return False, ''
 
 
-def run(folder, orders, every):
-    """Goes through every nth point. Gives back how many there were and what did not hold."""
+class ProjectDesk(Desk):
+    """The shell with a project whose member gets a new name by its first save: then the project is written anew."""
+
+    def __init__(self, folder, orders, linked):
+        super().__init__(folder, orders, 'moor.HDKV', linked)
+        self._name, self._linked, self._member = 'moor.kvrp', linked, f'{folder}/member'
+
+    def _change(self):
+        self.end()
+        shutil.rmtree(self._member, ignore_errors=True)
+        os.makedirs(self._member)
+        samples.write(f'{self._member}/moor.hdkv', samples.hd_text())
+        self._guarded = Guarded(self._folder, self._name, samples.project_text('../member/moor.hdkv'), self._linked)
+        super()._change()
+        return self._guarded.text.replace('.hdkv', '.HDKV')
+
+    def _look(self):
+        saved, said = super()._look()
+        if saved is None:
+            return saved, said
+        end = time.monotonic() + PATIENCE  # the project is written behind its member
+        while glob.glob(f'{self._folder}/**/.*.lock', recursive=True) and time.monotonic() < end:
+            time.sleep(0.05)
+        if texts := self._editor.no_message():  # it comes when the member is saved
+            said += '\n'.join(texts)
+        return saved and 'still names' not in said, said
+
+
+def run(folder, orders, every, kinds):
+    """Goes through every nth point; of projects, which take a start each, fewer. Gives back how many there were and
+    what did not hold."""
     from session import Session
 
     count, wrong = 0, []
     with Session():
-        for name in KINDS:
+        for name in (*KINDS, 'moor.kvrp'):
+            if kinds and name not in kinds:
+                continue
             for linked in (False, True):
-                desk = Desk(folder, orders, name, linked)
+                is_project = name not in KINDS
+                desk = ProjectDesk(folder, orders, linked) if is_project else Desk(folder, orders, name, linked)
                 try:
-                    desk.start()
                     desk.save()  # as the program writes it
                     calls, _ = desk.save()
-                    for point in list(faults.points(calls))[::every]:
+                    for point in list(faults.points(calls))[::every * 4 if is_project and every > 1 else every]:
                         count += 1
                         wrong += [f'shell, {name}{" through a link" if linked else ""}, {point}: {sentence}'
                                   for sentence in desk.save(point)[1]]
                 finally:
                     desk.end()
+            print(f'shell, {name}: {count} points so far, {len(wrong)} violations', flush=True)
     return count, wrong

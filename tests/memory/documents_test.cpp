@@ -1,7 +1,6 @@
 // Memory ends at every place where the documents of the shell ask for it: the user is told, and document and file are
 // what they were. Two things are left out: Qt's own strings and lists do not ask operator new, and end the program
-// where they get nothing; its objects and hashes do not stand it, so that documents and windows are made whole, and of
-// networks, whose branches are looked up in a hash, only the saving is tried.
+// where they get nothing; its objects do not stand it, so that documents and windows are made whole.
 #include "document/document.h"
 #include "editors/cross_sections/document.h"
 #include "editors/network/document.h"
@@ -127,8 +126,6 @@ const Kind kinds[] = {
 TEST_F(MemoryTest, ADocumentIsOpenedWholeOrNot)
 {
     for (const Kind& kind : kinds) {
-        if (QByteArrayView(kind.name).endsWith(".kvnw"))
-            continue;
         SCOPED_TRACE(kind.name);
         std::filesystem::remove(path.toStdString());
         Write(kind.name, kind.other);

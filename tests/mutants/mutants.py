@@ -21,6 +21,9 @@ MUTANTS = [
     ('files', 'files/temporary_file.cpp', 'text.remove_prefix(written);', 'text = {};'),
     ('files', 'files/safe_file.cpp', 'now.kind == Kind::None || m_platform.Status(m_target, left)',
      'true || m_platform.Status(m_target, left)'),
+    ('files', 'files/safe_file.cpp', 'm_isExpected && m_isSettled && status', 'm_isExpected && status'),
+    ('files', 'files/safe_file.cpp', 'm_options.sync && !m_report.displaced.empty()', 'false'),
+    ('files', 'files/difference.cpp', '            else\n                Part({}, old, now);\n', ''),
     ('files', 'files/finding.cpp', 'std::pair(f.line, f.column)', 'std::pair(f.column, f.line)'),
     ('files', 'files/finding.cpp',
      'while (end > 0 && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80)\n        --end;',
@@ -46,6 +49,9 @@ MUTANTS = [
     ('documents', 'ks/fc/document_file.cpp', 'options.expected = m_version;', ''),
     ('documents', 'ks/fc/document_file.cpp', 'written.m_report.notRenamed ? entry.value() : target', 'target'),
     ('documents', 'ks/fc/document_file.cpp', 'if (replaces.value()) {', 'if (true) {'),
+    ('documents', 'ks/fc/project_doc.cpp', '    if (IsInUse()) // somebody else was faster\n        return;\n', ''),
+    ('documents', 'ks/fc/outside_change.cpp', '        m_isClosed = false;\n', ''),
+    ('documents', 'ks/fc/file_use.cpp', '!= isFree || isOther)', '!= isFree && isFree)'),
     # The grid.
     ('files', 'files/read_number.cpp', 'result_out_of_range && IsTiny(text)', 'result_out_of_range && !IsTiny(text)'),
     ('grid', 'grid/table_text.cpp', "c == u'\\t' || c == u'\\n' || c == u'\\r' || c == u'\"'; });",
@@ -145,6 +151,7 @@ MUTANTS = [
      'ReadSections(section, inner, object);'),
     ('cross_sections', 'files/declared_section.cpp', 'return; // a consequence of what was told of it', '{}'),
     # The host.
+    ('shell', 'shell/recovery.cpp', 'if (document && document->IsInUse()) {', 'if (false) {'),
     ('shell', 'shell/recent_files.cpp', 'files.removeAll(clean);\n', ''),
     ('shell', 'shell/recent_files.cpp', 'Write(files.mid(0, Longest));', 'Write(files);'),
     ('shell', 'shell/project_respell.cpp', 'before.path() != after.path() ||\n', ''),

@@ -229,8 +229,8 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
 {
     const QString changed = Write("changed.HDKV", HDText), missing = Write("missing.HDKV", HDText),
                   edited = Write("edited.HDKV", HDText), early = Write("early.HDKV", HDText),
-                  twin = Write("other/changed.HDKV", HDText);
-    for (const QString& path : {changed, missing, edited, early, twin}) {
+                  twin = Write("other/changed.HDKV", HDText), used = Write("used.HDKV", HDText);
+    for (const QString& path : {changed, missing, edited, early, twin, used}) {
         CKsDoc* document = Open(path);
         if (path == early)
             Write("early.HDKV", QByteArray(HDText).replace("30", "31")); // before anything is kept
@@ -249,16 +249,16 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
     QFile::remove(missing);
 
     const auto found = Crash();
-    ASSERT_EQ(found.size(), 6u);
+    ASSERT_EQ(found.size(), 7u);
+    const FileLock lock = FileLock::Try(used.toStdString(), "kvrshell"); // another program has it now
+    ASSERT_TRUE(lock.IsHeld());
     QStringList titles;
     Change(Open(edited), "1.5", "7.5");
     for (const CRecoverable& item : found) {
         const QString name = item.header.path.isEmpty() ? "new" : QFileInfo(item.header.path).completeBaseName();
-        const std::map<QString, CRecoverable::State> states{{"changed", CRecoverable::Changed},
-                                                            {"early", CRecoverable::Changed},
-                                                            {"missing", CRecoverable::Missing},
-                                                            {"edited", CRecoverable::Same},
-                                                            {"new", CRecoverable::New}};
+        const std::map<QString, CRecoverable::State> states{
+            {"changed", CRecoverable::Changed}, {"early", CRecoverable::Changed}, {"missing", CRecoverable::Missing},
+            {"edited", CRecoverable::Same},     {"used", CRecoverable::Same},     {"new", CRecoverable::New}};
         EXPECT_EQ(item.state, states.at(name)) << name.toStdString();
         ASSERT_TRUE(frame->Recovery().Open(item));
         const CKsDoc* document = frame->ActiveDocument();
@@ -273,7 +273,7 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
     }
     titles.sort();
     EXPECT_EQ(titles.join(", "), "changed (recovered 2), changed (recovered), early (recovered), edited (recovered), "
-                                 "missing (recovered)");
+                                 "missing (recovered), used (recovered)");
     EXPECT_EQ(Content(changed), others);
     // Each is saved beside the file whose changes it has, under a name that is free; of one that is gone it is its own.
     QStringList proposed;

@@ -89,7 +89,7 @@ void SetEndsApart(CNetworkBranch& branch)
 }
 
 /// What a branch has to fulfil beside its declaration: it is made to, and that is reported. `met`: the branches before.
-void Mend(CNetworkBranch& branch, const QSet<QString>& met, CBranchNames& names, tqlHandle section, LoadReport& report)
+void Mend(CNetworkBranch& branch, const CBranchKeys& met, CBranchNames& names, tqlHandle section, LoadReport& report)
 {
     for (CBranchFault fault; (fault = FindFault(branch, met)).rule != CBranchFault::None;) {
         const auto rule = [fault] { return fault.Text().toStdString(); };
@@ -122,7 +122,7 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
     ReadDeclaredFile(structure, file, &network, report);
     const tqlHandle target = tqlTargetByNameNum(structure, file.name, 1);
     CBranchNames names(network);
-    QSet<QString> met;
+    CBranchKeys met;
     for (std::size_t i = 0; i < network.branches.size(); ++i) {
         CNetworkBranch& branch = network.branches[i];
         branch.SortChannel();

@@ -28,7 +28,7 @@ QString CBranchFault::Text() const
     }
 }
 
-CBranchFault FindFault(const CNetworkBranch& branch, const QSet<QString>& taken)
+CBranchFault FindFault(const CNetworkBranch& branch, const CBranchKeys& taken)
 {
     const QString name = branch.Name(), key = KsBranchKey(name);
     if (key.isEmpty())
@@ -40,7 +40,7 @@ CBranchFault FindFault(const CNetworkBranch& branch, const QSet<QString>& taken)
 
 CBranchNames::CBranchNames(const CNetwork& network)
 {
-    m_taken.reserve(qsizetype(network.branches.size()));
+    m_taken.reserve(network.branches.size());
     for (const CNetworkBranch& branch : network.branches)
         m_taken.insert(KsBranchKey(branch.Name()));
 }

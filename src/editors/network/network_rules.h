@@ -3,8 +3,12 @@
 
 #include "editors/network/network.h"
 
-#include <QHash>
-#include <QSet>
+#include <QString>
+#include <unordered_map>
+#include <unordered_set>
+
+/// Keys of names. Unlike a set of Qt it stands it when memory ends while a network is loaded.
+using CBranchKeys = std::unordered_set<QString>;
 
 /// What is wrong with a branch.
 struct CBranchFault
@@ -24,7 +28,7 @@ struct CBranchFault
 };
 
 /// `taken`: the keys of the names of other branches.
-CBranchFault FindFault(const CNetworkBranch& branch, const QSet<QString>& taken);
+CBranchFault FindFault(const CNetworkBranch& branch, const CBranchKeys& taken);
 
 /// Names for the branches that a network gets.
 class CBranchNames
@@ -36,6 +40,7 @@ public:
     QString Take(const QString& wanted, const QString& numbered);
 
 private:
-    QSet<QString> m_taken;         // keys
-    QHash<QString, int> m_numbers; // the last one that was tried, by the key of what was wanted: many may want the same
+    CBranchKeys m_taken;
+    std::unordered_map<QString, int>
+        m_numbers; // the last one that was tried, by the key of what was wanted: many may want the same
 };

@@ -33,7 +33,7 @@ public:
     bool HasRules() const override { return true; }
     std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
     {
-        QSet<QString> taken; // by the others
+        CBranchKeys taken; // by the others
         for (std::size_t row = 0; row < Count(); ++row) {
             if (row < first || row >= first + rows.Count())
                 taken.insert(KsBranchKey(Rows()[row].Name()));

@@ -1,0 +1,80 @@
+// What other programs do to an open file, as the bar tells it: who has it, and that it is another.
+#include "files/file_lock.h"
+#include "ks/fc/file_notice.h"
+#include "ks/fc/project_doc.h"
+#include "shell_fixture.h"
+
+#include <QSignalSpy>
+#include <algorithm>
+
+namespace {
+
+class OthersTest : public ShellTest
+{
+protected:
+    OthersTest()
+    {
+        frame.reset();
+        frame = std::make_unique<CMainFrame>();
+        frame->LoadPlugins(QStringLiteral(KVR_BUILD_DIR "/bin/plugins"));
+        frame->show();
+    }
+    ~OthersTest() override { frame.reset(); }
+
+    static QByteArray TextWith(const char* level)
+    {
+        return QByteArray("[KAVO0_HD]\n[Global_Variables]\n[Global_Values]\nG_waterlevel = ") + level +
+               "\n[/Global_Values]\n[/Global_Variables]\n[/KAVO0_HD]\n";
+    }
+    CKsProjectDoc* Open(const QString& path)
+    {
+        EXPECT_TRUE(frame->OpenFile(path));
+        return qobject_cast<CKsProjectDoc*>(frame->ActiveDocument());
+    }
+    static bool Shows(CKsProjectDoc& document, const char* level)
+    {
+        return document.ContentText().value().find(std::string("G_waterlevel = ") + level) != std::string::npos;
+    }
+    static bool IsTold(CKsProjectDoc& document, const char* words)
+    {
+        return std::ranges::any_of(document.Notices(), [&](const auto& each) { return each.text.contains(words); });
+    }
+};
+
+} // namespace
+
+TEST_F(OthersTest, AFileIsTakenOverWhenNobodyHasIt)
+{
+    const QString path = Write("a.HDKV", TextWith("1.5"));
+    FileLock theirs = FileLock::Try(path.toStdString(), "kvrshell");
+    CKsProjectDoc& document = *Open(path);
+    EXPECT_TRUE(document.IsInUse() && IsTold(document, "is in use by"));
+    theirs.Release();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return IsTold(document, "can be edited now"); }));
+    QSignalSpy news(&document, &CKsProjectDoc::FileStateChanged);
+    theirs = FileLock::Try(path.toStdString(), "kvrshell");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !news.isEmpty() && !IsTold(document, "can be edited now"); }))
+        << "somebody was faster, and the bar is told";
+    Write("a.HDKV", TextWith("2.5"));
+    document.EditFreed();
+    EXPECT_TRUE(document.IsInUse());
+    EXPECT_TRUE(Shows(document, "1.5")) << "it may be half of a file";
+    theirs.Release();
+    document.EditFreed();
+    EXPECT_FALSE(document.IsInUse());
+    EXPECT_TRUE(Shows(document, "2.5"));
+}
+
+TEST_F(OthersTest, ANoticeThatWasClosedComesBackWithTheNextChange)
+{
+    CKsProjectDoc& document = *Open(Write("a.HDKV", TextWith("1.5")));
+    const auto isTold = [&] { return IsTold(document, "was changed by another program"); };
+    Write("a.HDKV", TextWith("2.5"));
+    EXPECT_TRUE(QTest::qWaitFor(isTold));
+    for (const KsFileNotice& notice : document.Notices())
+        if (notice.close)
+            notice.close();
+    EXPECT_FALSE(isTold());
+    Write("a.HDKV", TextWith("3.5"));
+    EXPECT_TRUE(QTest::qWaitFor(isTold));
+}
