@@ -20,7 +20,14 @@ enum class GridAction
     SearchAgain,
     Search,
     Undo,
-    Redo
+    Redo,
+    SortAscending,
+    SortDescending,
+    SortByPlace,
+    FileOrder,
+    Filter,
+    ShowAfresh,
+    None // of no key
 };
 
 struct GridKey

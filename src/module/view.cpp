@@ -1,6 +1,7 @@
 #include "module/view.h"
 
 #include "grid/gen_grid.h"
+#include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/sheet.h"
 #include "pages/framework/page.h"
@@ -167,6 +168,8 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
     menu.push_back({Command::DeleteLine, LoadString(Str::MenuDeleteLine)});
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
+    menu.emplace_back();
+    std::ranges::move(LinesView::MenuCommands(), std::back_inserter(menu));
     return menu;
 }
 
@@ -176,7 +179,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
         return true;
     const auto* page = ActivePage();
     const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine;
-    const CGenGrid* grid = !page ? nullptr : isForLines ? page->LinesGrid() : page->GetGrid();
+    const CGenGrid* grid = !page ? nullptr : isForLines || LinesView::Knows(id) ? page->LinesGrid() : page->GetGrid();
     if (!m_linesEnabled || !grid || !grid->isEnabled())
         return false;
     if (GetDocument()->IsReadOnly() && (isForLines || id == Command::FetchLocation))
@@ -184,6 +187,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     return id == Command::InsertLine      ? true
            : id == Command::DeleteLine    ? grid->HasLinesToDelete()
            : id == Command::FetchLocation ? GetDocument()->ProjectHandle() != 0
+           : LinesView::Knows(id)         ? LinesView::CanRun(id, grid)
                                           : m_search.CanRun(id, grid);
 }
 
@@ -200,6 +204,8 @@ bool CKavo0_hdView::OnCommand(int id)
         FetchLocation();
     else if (id == KsCommand::Help)
         page->OnHelp();
+    else if (LinesView::Knows(id))
+        LinesView::Run(id, *page->LinesGrid());
     else
         m_search.Run(id, *page->GetGrid());
     return true;
