@@ -87,9 +87,11 @@ QString CGenGrid::LineText() const
     if (line > 0 && column >= 0) {
         const ColumnSpec& spec = m_model->Column(column);
         const CellValue value = m_model->Value(CurrentRow() - 1, column);
-        texts << (m_model->HidesDigits(CurrentRow() - 1, column)
-                      ? GridTexts::tr("Line %1 of %2, %3: %4").arg(line).arg(lines).arg(spec.header(), FullText(spec, value))
-                      : GridTexts::tr("Line %1 of %2").arg(line).arg(lines));
+        texts << (m_model->HidesDigits(CurrentRow() - 1, column) ? GridTexts::tr("Line %1 of %2, %3: %4")
+                                                                       .arg(line)
+                                                                       .arg(lines)
+                                                                       .arg(spec.header(), FullText(spec, value))
+                                                                 : GridTexts::tr("Line %1 of %2").arg(line).arg(lines));
     }
     if (isFiltered)
         texts << GridTexts::tr("%1 of %2 shown").arg(m_model->StoredRows() - fixed).arg(lines);

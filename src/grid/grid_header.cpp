@@ -11,6 +11,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
+#include <QPainter>
 #include <QScrollBar>
 #include <QSignalBlocker>
 #include <QStyle>
@@ -19,6 +20,21 @@
 namespace {
 
 constexpr int MostTexts = 500; // that a field offers
+constexpr QSize ArrowSize(9, 6);
+
+/// A triangle that points down, to be seen on light and dark.
+QIcon DownIcon(const QPalette& colours)
+{
+    QPixmap picture(16, 16);
+    picture.fill(Qt::transparent);
+    QPainter painter(&picture);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(colours.color(QPalette::PlaceholderText));
+    painter.drawPolygon(QPolygonF({{3, 6}, {13, 6}, {8, 11}}));
+    painter.end();
+    return picture;
+}
 
 /// What it does not need is no key of the grid below it.
 class CFilterField : public QLineEdit
@@ -47,8 +63,8 @@ CGridHeader::CGridHeader(CGenGrid& grid) : QHeaderView(Qt::Horizontal, &grid), m
     setHighlightSections(false);
     m_count->hide();
     m_count->setObjectName(QStringLiteral("shownLines"));
-    m_count->setMargin(2);
-    connect(this, &QHeaderView::sectionDoubleClicked, this, [this](int column) { LinesView::SortByClick(m_grid, column); });
+    connect(this, &QHeaderView::sectionDoubleClicked, this,
+            [this](int column) { LinesView::SortByClick(m_grid, column); });
     connect(this, &QHeaderView::sectionResized, this, &CGridHeader::PlaceFields);
     connect(grid.horizontalScrollBar(), &QScrollBar::valueChanged, this, &CGridHeader::PlaceFields);
     connect(grid.Model(), &CGridModel::ViewChanged, this, [this] {
@@ -84,10 +100,6 @@ void CGridHeader::initStyleOptionForIndex(QStyleOptionHeader* option, int column
     QHeaderView::initStyleOptionForIndex(option, column);
     if (const QString unit = m_grid.Model()->Column(column).UnitLine(); !unit.isEmpty())
         option->text += u'\n' + unit;
-    const auto& keys = m_grid.Model()->SortedBy();
-    const auto key = std::ranges::find(keys, column, &SortKey::column);
-    if (key != keys.end())
-        option->sortIndicator = key->descending ? QStyleOptionHeader::SortUp : QStyleOptionHeader::SortDown;
 }
 
 /// Room for the unit's line.
@@ -102,6 +114,17 @@ QSize CGridHeader::sectionSizeFromContents(int column) const
 void CGridHeader::paintSection(QPainter* painter, const QRect& rect, int column) const
 {
     QHeaderView::paintSection(painter, rect.adjusted(0, 0, 0, -FieldHeight()), column);
+    const auto& keys = m_grid.Model()->SortedBy();
+    const auto key = std::ranges::find(keys, column, &SortKey::column);
+    if (key == keys.end())
+        return;
+    // Above the text: beside it, where styles have it, there is no room in columns as wide as their numbers.
+    QStyleOptionHeader arrow;
+    arrow.initFrom(this);
+    arrow.rect =
+        QRect(rect.center().x() - ArrowSize.width() / 2, rect.top() + 1, ArrowSize.width(), ArrowSize.height());
+    const auto up = QStyle::PE_IndicatorArrowUp, down = QStyle::PE_IndicatorArrowDown;
+    style()->drawPrimitive(key->descending ? down : up, &arrow, painter, this);
 }
 
 void CGridHeader::contextMenuEvent(QContextMenuEvent* event)
@@ -117,14 +140,18 @@ void CGridHeader::ShowCount()
     const bool isFiltered = model.Shown().IsFiltered();
     if (isFiltered) {
         const int fixed = model.FixedRows();
-        m_count->setText(GridTexts::tr("%1 of %2 shown")
-                             .arg(model.StoredRows() - fixed)
-                             .arg(int(model.Rows()->Count()) - fixed));
+        m_count->setText(
+            GridTexts::tr("%1 of %2 shown").arg(model.StoredRows() - fixed).arg(int(model.Rows()->Count()) - fixed));
     }
     if (m_count->isVisibleTo(&m_grid) == isFiltered)
         return;
-    if (isFiltered)
+    if (isFiltered) {
+        QFont font = m_grid.font(); // that fits beside a scroll bar
+        font.setPixelSize(std::min(m_grid.fontMetrics().ascent(),
+                                   style()->pixelMetric(QStyle::PM_ScrollBarExtent, nullptr, &m_grid) - 4));
+        m_count->setFont(font);
         m_grid.addScrollBarWidget(m_count, Qt::AlignLeft);
+    }
     m_count->setVisible(isFiltered);
     m_grid.setHorizontalScrollBarPolicy(isFiltered ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAsNeeded);
 }
@@ -151,7 +178,7 @@ void CGridHeader::MakeFields()
         field->installEventFilter(this);
         connect(field, &QLineEdit::textChanged, this, &CGridHeader::Typed);
         if (OffersTexts(m_grid.Model()->Column(column))) {
-            auto* offer = field->addAction(style()->standardIcon(QStyle::SP_ArrowDown), QLineEdit::TrailingPosition);
+            auto* offer = field->addAction(DownIcon(palette()), QLineEdit::TrailingPosition);
             connect(offer, &QAction::triggered, this, [this, column] { OfferTexts(column); });
         }
         m_fields.push_back(field);
@@ -202,10 +229,10 @@ void CGridHeader::ShowTexts()
         field.setAccessibleName(GridTexts::tr("Filter of %1").arg(column.header()));
         field.setPlaceholderText(GridTexts::tr("Filter"));
         const QString refusal = CCellFilter(column, text).Refusal();
-        field.setToolTip(!refusal.isEmpty()     ? refusal
+        field.setToolTip(!refusal.isEmpty()    ? refusal
                          : OffersTexts(column) ? GridTexts::tr("Text that the cells contain; =text for the whole cell, "
-                                                                "\"\" for empty ones. Alt+Down shows what there is.")
-                                                : GridTexts::tr("12.5, >5, <=3, 2..7, =4, !=4, \"\" for empty cells"));
+                                                               "\"\" for empty ones. Alt+Down shows what there is.")
+                                               : GridTexts::tr("12.5, >5, <=3, 2..7, =4, !=4, \"\" for empty cells"));
         QPalette colours = palette();
         if (!refusal.isEmpty())
             colours.setColor(QPalette::Text, Qt::red);

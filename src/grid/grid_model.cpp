@@ -310,8 +310,7 @@ bool CGridModel::StoreRows(const Overlay& typed, BlankRule rule)
     }
     if (changes.empty())
         return false;
-    Change(GridTexts::tr("Change of cells"), place,
-           [&] { SetCells(*m_document, m_rows, std::move(changes), place); });
+    Change(GridTexts::tr("Change of cells"), place, [&] { SetCells(*m_document, m_rows, std::move(changes), place); });
     return true;
 }
 

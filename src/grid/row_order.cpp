@@ -82,14 +82,13 @@ Ranks RanksBy(IRowSource& rows, const ColumnSpec& column, bool descending)
     const bool isText = column.Kind() == CellKind::Text || column.Kind() == CellKind::TextChoice;
     for (std::size_t row = first; row < count; ++row) {
         CellValue value = column.access->get(rows.At(row));
-        ranks[row] = std::visit(Overloads{[](std::monostate) { return Last; },
-                                          [](double number) {
-                                              return std::isnan(number) || number == NotGiven ? Last : RankOf(number);
-                                          },
-                                          [](std::int32_t number) { return RankOf(double(number)); },
-                                          [&](std::string& text) { return names.Number(std::move(text)); },
-                                          [](const HDDateTime& time) { return RankOf(time); }},
-                                value);
+        ranks[row] = std::visit(
+            Overloads{[](std::monostate) { return Last; },
+                      [](double number) { return std::isnan(number) || number == NotGiven ? Last : RankOf(number); },
+                      [](std::int32_t number) { return RankOf(double(number)); },
+                      [&](std::string& text) { return names.Number(std::move(text)); },
+                      [](const HDDateTime& time) { return RankOf(time); }},
+            value);
     }
     if (isText) {
         const Ranks places = names.Places();
