@@ -85,13 +85,13 @@ QString CGenGrid::LineText() const
     const int lines = isFiltered ? int(m_model->Rows()->Count()) - fixed : RowCount() - fixed;
     QStringList texts;
     if (line > 0 && column >= 0) {
-        const ColumnSpec& spec = m_model->Column(column);
-        const CellValue value = m_model->Value(CurrentRow() - 1, column);
-        texts << (m_model->HidesDigits(CurrentRow() - 1, column) ? GridTexts::tr("Line %1 of %2, %3: %4")
-                                                                       .arg(line)
-                                                                       .arg(lines)
-                                                                       .arg(spec.header(), FullText(spec, value))
-                                                                 : GridTexts::tr("Line %1 of %2").arg(line).arg(lines));
+        QString text = GridTexts::tr("Line %1 of %2").arg(line).arg(lines);
+        if (m_model->HidesDigits(CurrentRow() - 1, column)) {
+            const ColumnSpec& spec = m_model->Column(column);
+            const QString number = FullText(spec, m_model->Value(CurrentRow() - 1, column));
+            text = GridTexts::tr("Line %1 of %2, %3: %4").arg(line).arg(lines).arg(spec.header(), number);
+        }
+        texts << text;
     }
     if (isFiltered)
         texts << GridTexts::tr("%1 of %2 shown").arg(m_model->StoredRows() - fixed).arg(lines);

@@ -20,7 +20,7 @@
 namespace {
 
 constexpr int MostTexts = 500; // that a field offers
-constexpr QSize ArrowSize(9, 6);
+constexpr int ArrowHeight = 4;
 
 /// A triangle that points down, to be seen on light and dark.
 QIcon DownIcon(const QPalette& colours)
@@ -119,12 +119,14 @@ void CGridHeader::paintSection(QPainter* painter, const QRect& rect, int column)
     if (key == keys.end())
         return;
     // Above the text: beside it, where styles have it, there is no room in columns as wide as their numbers.
-    QStyleOptionHeader arrow;
-    arrow.initFrom(this);
-    arrow.rect =
-        QRect(rect.center().x() - ArrowSize.width() / 2, rect.top() + 1, ArrowSize.width(), ArrowSize.height());
-    const auto up = QStyle::PE_IndicatorArrowUp, down = QStyle::PE_IndicatorArrowDown;
-    style()->drawPrimitive(key->descending ? down : up, &arrow, painter, this);
+    const double middle = rect.center().x(), top = rect.top() + 1;
+    const double base = top + (key->descending ? 0 : ArrowHeight), tip = top + (key->descending ? ArrowHeight : 0);
+    painter->save();
+    painter->setRenderHint(QPainter::Antialiasing);
+    painter->setPen(Qt::NoPen);
+    painter->setBrush(palette().color(QPalette::ButtonText));
+    painter->drawPolygon(QPolygonF({{middle - ArrowHeight, base}, {middle + ArrowHeight, base}, {middle, tip}}));
+    painter->restore();
 }
 
 void CGridHeader::contextMenuEvent(QContextMenuEvent* event)

@@ -8,8 +8,9 @@
 
 void* CTableRows::RowObject(int row) const
 {
-    if (!IsOffered(row))
-        return m_rows->At(SourceRow(row));
+    // A row that the source has lost, as long as nobody has looked, is one that it does not have yet.
+    if (const std::size_t place = SourceRow(row); !IsOffered(row) && place < m_rows->Count())
+        return m_rows->At(place);
     if (!m_offered)
         m_offered = NewLines(1);
     return m_offered->At(0);
@@ -79,7 +80,8 @@ void CTableRows::FollowSource()
 
 RowKey CTableRows::NameOf(int row) const
 {
-    return IsOffered(row) ? OfferedKey : m_rows->KeyAt(SourceRow(row));
+    const std::size_t place = SourceRow(row);
+    return IsOffered(row) || place >= m_rows->Count() ? OfferedKey : m_rows->KeyAt(place);
 }
 
 int CTableRows::RowNamed(RowKey name, int row) const
