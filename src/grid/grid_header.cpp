@@ -20,7 +20,6 @@
 namespace {
 
 constexpr int MostTexts = 500; // that a field offers
-constexpr int ArrowHeight = 4;
 
 /// A triangle that points down, to be seen on light and dark.
 QIcon DownIcon(const QPalette& colours)
@@ -100,6 +99,10 @@ void CGridHeader::initStyleOptionForIndex(QStyleOptionHeader* option, int column
     QHeaderView::initStyleOptionForIndex(option, column);
     if (const QString unit = m_grid.Model()->Column(column).UnitLine(); !unit.isEmpty())
         option->text += u'\n' + unit;
+    const auto& keys = m_grid.Model()->SortedBy();
+    const auto key = std::ranges::find(keys, column, &SortKey::column);
+    if (key != keys.end())
+        option->sortIndicator = key->descending ? QStyleOptionHeader::SortUp : QStyleOptionHeader::SortDown;
 }
 
 /// Room for the unit's line.
@@ -114,19 +117,6 @@ QSize CGridHeader::sectionSizeFromContents(int column) const
 void CGridHeader::paintSection(QPainter* painter, const QRect& rect, int column) const
 {
     QHeaderView::paintSection(painter, rect.adjusted(0, 0, 0, -FieldHeight()), column);
-    const auto& keys = m_grid.Model()->SortedBy();
-    const auto key = std::ranges::find(keys, column, &SortKey::column);
-    if (key == keys.end())
-        return;
-    // Above the text: beside it, where styles have it, there is no room in columns as wide as their numbers.
-    const double middle = rect.center().x(), top = rect.top() + 1;
-    const double base = top + (key->descending ? 0 : ArrowHeight), tip = top + (key->descending ? ArrowHeight : 0);
-    painter->save();
-    painter->setRenderHint(QPainter::Antialiasing);
-    painter->setPen(Qt::NoPen);
-    painter->setBrush(palette().color(QPalette::ButtonText));
-    painter->drawPolygon(QPolygonF({{middle - ArrowHeight, base}, {middle + ArrowHeight, base}, {middle, tip}}));
-    painter->restore();
 }
 
 void CGridHeader::contextMenuEvent(QContextMenuEvent* event)
