@@ -34,6 +34,7 @@ public:
     // Records stay where they are in memory, so their address names them.
     RowKey KeyAt(std::size_t row) override { return reinterpret_cast<RowKey>(At(row)); }
     void* Object(RowKey key) override { return Record(key); }
+    bool KeysLast() const override { return true; }
     std::size_t RowOf(RowKey key, std::size_t hint) override
     {
         if (hint < Count() && KeyAt(hint) == key)
@@ -62,6 +63,14 @@ public:
         taken->records = m_list.RemoveAt(row, count);
         return taken;
     }
+    void Rearrange(const std::vector<std::size_t>& order) override
+    {
+        Records arranged(order.size()), records; // asks for memory before anything is moved
+        m_list.Swap(records);
+        for (std::size_t place = 0; place < order.size(); ++place)
+            arranged[place] = std::move(records[order[place]]);
+        m_list.Swap(arranged);
+    }
     const void* Data() const override { return &m_list; }
     const void* List() const override { return &m_list; }
 
@@ -85,6 +94,7 @@ public:
 
     RowKey KeyAt(std::size_t row) override { return row == 0 ? GlobalKey() : m_lines->KeyAt(row - 1); }
     void* Object(RowKey key) override { return key == GlobalKey() ? m_globals : m_lines->Object(key); }
+    bool KeysLast() const override { return true; }
     std::size_t RowOf(RowKey key, std::size_t hint) override
     {
         return key == GlobalKey() ? 0 : 1 + m_lines->RowOf(key, hint > 0 ? hint - 1 : 0);
@@ -98,6 +108,13 @@ public:
     std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) override
     {
         return m_lines->Take(row - 1, count);
+    }
+    void Rearrange(const std::vector<std::size_t>& order) override
+    {
+        std::vector<std::size_t> lines(order.begin() + 1, order.end());
+        for (std::size_t& line : lines)
+            --line;
+        m_lines->Rearrange(lines);
     }
     const void* Data() const override { return m_lines->Data(); }
     const void* List() const override { return m_lines->List(); }

@@ -23,7 +23,7 @@ constexpr MenuText MenuTexts[] = {
     {GridAction::FillDown, QT_TRANSLATE_NOOP("GridTexts", "Fill Dow&n")},
     {GridAction::FillSeries, QT_TRANSLATE_NOOP("GridTexts", "Fill with a Se&ries...")},
     {GridAction::Interpolate, QT_TRANSLATE_NOOP("GridTexts", "Inter&polate...")},
-    {GridAction::Calculate, QT_TRANSLATE_NOOP("GridTexts", "&Calculate...")},
+    {GridAction::Calculate, QT_TRANSLATE_NOOP("GridTexts", "Calc&ulate...")},
 };
 
 const GridKey& KeyOf(GridAction action)

@@ -106,6 +106,12 @@ CellValue ColumnSpec::NewLineValue() const
     return emptyIsNotGiven ? CellValue(NotGiven) : CellValue();
 }
 
+QString ColumnSpec::UnitLine() const
+{
+    const QString unit = unitBelow ? UnitSymbol() : QString();
+    return unit.isEmpty() ? unit : QStringLiteral("[%1]").arg(unit);
+}
+
 QString ColumnSpec::ToolTip(bool isHeader) const
 {
     const QString unitTip = KsUnitToolTip(UnitSymbol());

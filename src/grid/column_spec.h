@@ -120,6 +120,7 @@ struct ColumnSpec
     CKsEditStyle style = {}; // unit group and format
     Bounds bounds = {};      // of a number
     bool isRequired = false; // an empty cell is refused
+    bool unitBelow = false;  // the unit stands below the header, which does not name it
     std::shared_ptr<const CellAccess> access = {};
 
     CellKind Kind() const { return control.kind; }
@@ -134,6 +135,8 @@ struct ColumnSpec
     /// What a new line holds; nothing where the record's own default stands.
     CellValue NewLineValue() const;
     QString UnitSymbol() const { return unitText ? unitText() : style.UnitSymbol(); }
+    /// What stands below the header: "[m³/s]"; empty for nothing.
+    QString UnitLine() const;
     /// Unit of the cells, and on a header also what the column is.
     QString ToolTip(bool header) const;
 };

@@ -2,11 +2,13 @@
 
 #include "grid/cell_text.h"
 #include "grid/grid_editors.h"
+#include "grid/grid_header.h"
 #include "grid/grid_host.h"
 #include "grid/grid_input.h"
 #include "grid/grid_keys.h"
 #include "grid/grid_texts.h"
 #include "grid/grid_widths.h"
+#include "grid/selection_summary.h"
 #include "grid/typing.h"
 #include "ks/fc/doc.h"
 #include "ks/language/language.h"
@@ -38,8 +40,11 @@ CGenGrid::CGenGrid(QWidget* parent)
     setFont(KsLangGetUserFont());
     setModel(m_model);
     setItemDelegate(m_delegate);
+    m_header = new CGridHeader(*this);
+    setHorizontalHeader(m_header);
     m_selection = new CGridSelection(*this);
     m_input = new CGridInput(*this);
+    m_summary = new CSelectionSummary(*this);
     setTabKeyNavigation(false); // the key table moves
     setEditTriggers(DoubleClicked | EditKeyPressed | AnyKeyPressed);
     setSelectionMode(ContiguousSelection);
@@ -75,14 +80,24 @@ CGenGrid::~CGenGrid()
 
 QString CGenGrid::LineText() const
 {
-    const int fixed = m_model->FixedRows(), line = CurrentRow() - fixed, column = CurrentColumn() - 1;
-    if (line <= 0 || column < 0)
-        return {};
-    if (!m_model->HidesDigits(CurrentRow() - 1, column))
-        return GridTexts::tr("Line %1 of %2").arg(line).arg(RowCount() - fixed);
-    const ColumnSpec& spec = m_model->Column(column);
-    const QString number = FullText(spec, m_model->Value(CurrentRow() - 1, column));
-    return GridTexts::tr("Line %1 of %2, %3: %4").arg(line).arg(RowCount() - fixed).arg(spec.header(), number);
+    const int fixed = m_model->FixedRows(), line = CurrentLine() - fixed, column = CurrentColumn() - 1;
+    const bool isFiltered = m_model->Shown().IsFiltered();
+    const int lines = isFiltered ? int(m_model->Rows()->Count()) - fixed : RowCount() - fixed;
+    QStringList texts;
+    if (line > 0 && column >= 0) {
+        QString text = GridTexts::tr("Line %1 of %2").arg(line).arg(lines);
+        if (m_model->HidesDigits(CurrentRow() - 1, column)) {
+            const ColumnSpec& spec = m_model->Column(column);
+            const QString number = FullText(spec, m_model->Value(CurrentRow() - 1, column));
+            text = GridTexts::tr("Line %1 of %2, %3: %4").arg(line).arg(lines).arg(spec.header(), number);
+        }
+        texts << text;
+    }
+    if (isFiltered)
+        texts << GridTexts::tr("%1 of %2 shown").arg(m_model->StoredRows() - fixed).arg(lines);
+    if (!m_summary->Text().isEmpty())
+        texts << m_summary->Text();
+    return texts.join(QStringLiteral("   "));
 }
 
 void CGenGrid::Refresh()
@@ -91,6 +106,8 @@ void CGenGrid::Refresh()
     m_model->Sync();
     FollowLine(row, column);
     m_widths->Update();
+    if (!m_model->Shown().IsPlain())
+        verticalHeader()->viewport()->update();
 }
 
 /// Where lines came or went - with a save, by another editor - the current cell goes with its line. When that is gone
@@ -99,7 +116,7 @@ void CGenGrid::FollowLine(int row, int column)
 {
     const CKsDoc* const document = m_model->Document();
     const bool isReplaced = document && std::exchange(m_contents, document->Contents()) != document->Contents();
-    if (!m_currentLine || row == 0)
+    if (!m_currentLine || (row == 0 && !m_lineGone))
         return;
     int now = m_model->RowNamed(*m_currentLine, row - 1) + 1;
     if (now == 0 && isReplaced)
@@ -109,7 +126,8 @@ void CGenGrid::FollowLine(int row, int column)
         if (now != CurrentRow())
             SetCurrentCell(now, column);
     } else {
-        m_currentLine.reset();
+        if (!m_model->Shown().IsFiltered())
+            m_currentLine.reset(); // else it may come back into sight
         m_lineGone = true;
         clearSelection();
         selectionModel()->clearCurrentIndex();
@@ -134,12 +152,37 @@ int CGenGrid::RowLikeCurrent(int row) const
                 return false;
         return true;
     };
-    if (row <= RowCount() && isLike(row))
+    if (row > 0 && row <= RowCount() && isLike(row))
         return row;
     for (int line = m_model->FixedRows() + 1; line <= RowCount(); ++line)
         if (isLike(line))
             return line;
     return std::min(row, RowCount());
+}
+
+void CGenGrid::ChangeView(const std::function<void(CGridModel& model)>& change)
+{
+    StoreEditedLine();
+    const int row = CurrentRow(), column = CurrentColumn();
+    if (row > 0) // the others that are selected would be other lines
+        selectionModel()->select(currentIndex(), QItemSelectionModel::ClearAndSelect);
+    change(*m_model);
+    FollowLine(row, column);
+    m_widths->Update();
+    verticalHeader()->viewport()->update();
+    viewport()->update();
+    if (m_host)
+        m_host->CellCurrent(*this);
+}
+
+void CGenGrid::ShowLine(int number, int column)
+{
+    const int line = std::max(number, 1) - 1;
+    if (m_model->Unhide(std::size_t(line)))
+        m_model->Document()->Say(
+            GridTexts::tr("Line %1 does not pass the filter; it is shown until the filter changes.").arg(number));
+    const bool isThere = m_model->Rows() && std::size_t(line) < m_model->Rows()->Count();
+    SetCurrentCell(isThere ? m_model->ShownRow(std::size_t(line)) + 1 : RowCount(), column);
 }
 
 void CGenGrid::Reload()
@@ -152,12 +195,14 @@ void CGenGrid::Reload()
 void CGenGrid::paintEvent(QPaintEvent* event)
 {
     QTableView::paintEvent(event);
-    if (RowCount() > 0 || !MayGrow() || !isEnabled())
+    const bool isFiltered = m_model->Shown().IsFiltered();
+    if (RowCount() > 0 || !(MayGrow() || isFiltered) || !isEnabled())
         return;
     QPainter painter(viewport());
     painter.setPen(palette().color(QPalette::PlaceholderText));
     painter.drawText(viewport()->rect().adjusted(4, 4, -4, -4), Qt::AlignTop | Qt::AlignHCenter | Qt::TextWordWrap,
-                     GridTexts::tr("No lines. Insert adds one."));
+                     isFiltered ? GridTexts::tr("No line passes the filter.")
+                                : GridTexts::tr("No lines. Insert adds one."));
 }
 
 void CGenGrid::changeEvent(QEvent* event)
@@ -318,7 +363,7 @@ void CGenGrid::mousePressEvent(QMouseEvent* event)
 
 void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
 {
-    if (RowCount() == 0 && MayGrow())
+    if (RowCount() == 0 && MayGrow() && !m_model->Shown().IsFiltered())
         return m_input->Run(GridAction::AppendLine);
     // Two clicks with keys between them may be a double click, and the keys have moved on from the cell clicked first.
     const QModelIndex cell = indexAt(event->position().toPoint());

@@ -8,8 +8,10 @@
 #include <QTableView>
 
 class CGridDelegate;
+class CGridHeader;
 class CGridInput;
 class CGridWidths;
+class CSelectionSummary;
 class IGridHost;
 
 class CGenGrid : public QTableView
@@ -25,6 +27,7 @@ public:
     CGridModel* Model() const { return m_model; }
     CGridInput& Input() const { return *m_input; }
     CGridWidths& Widths() const { return *m_widths; }
+    CGridHeader& Header() const { return *m_header; }
 
     int RowCount() const { return m_model->rowCount(); }
     int ColumnCount() const { return m_model->columnCount(); }
@@ -34,11 +37,18 @@ public:
     /// Makes a cell current and shows it. A row past the end is the last row.
     void SetCurrentCell(int row, int column);
     void GotoLine(int row) { SetCurrentCell(row, columnAt(0) + 1); }
+    /// The same for a line by its number in the file. One that the filter hides is shown, and the user is told.
+    void ShowLine(int number, int column);
+    void ShowLine(int number) { ShowLine(number, columnAt(0) + 1); }
+    /// The number of the current line in the file; 0 without one.
+    int CurrentLine() const { return CurrentRow() > 0 ? m_model->LineNumber(CurrentRow() - 1) : 0; }
+    /// Sorts or filters; the current cell goes with its line, and what was selected is no longer.
+    void ChangeView(const std::function<void(CGridModel& model)>& change);
     /// The line that was current is gone, and nobody has chosen another one yet.
     bool HasLostItsLine() const { return m_lineGone; }
     QString TextAt(int row, int column) const { return m_model->index(row - 1, column - 1).data().toString(); }
-    /// "Line 3 of 120", with the whole number of the current cell where the cell leaves digits out; empty without a
-    /// current line.
+    /// "Line 3 of 120", with the whole number of the current cell where the cell leaves digits out, how many lines are
+    /// shown when others are hidden, and what the selected numbers come to.
     QString LineText() const;
 
     /// Column whose cells offer the branch names of the network; 0 for none.
@@ -103,6 +113,8 @@ private:
     CGridWidths* m_widths;
     CGridSelection* m_selection;
     CGridInput* m_input;
+    CGridHeader* m_header;
+    CSelectionSummary* m_summary;
     IGridHost* m_host = nullptr;
     int m_lastRow = 0;                   // current at the last cell move
     std::optional<RowKey> m_currentLine; // its name; nothing where the line is gone

@@ -49,11 +49,11 @@ static QString PasteRefusal(const CGridModel& model, int top, int left, const st
     const auto header = [&](int column) { return model.Column(column).header(); };
     const auto refused = [&](int row, int column, const QString& text, const QString& reason) {
         return GridTexts::tr("Nothing was pasted. Line %1, column \"%2\" cannot take \"%3\":\n%4")
-            .arg(QString::number(row + 1), header(column), text, reason);
+            .arg(QString::number(model.LineNumber(row)), header(column), text, reason);
     };
     if (!model.Rows()->MayGrow() && top + int(cells.size()) > model.StoredRows())
         return GridTexts::tr("Nothing was pasted. From line %1 on the table has only %2 lines.")
-            .arg(top + 1)
+            .arg(model.LineNumber(top))
             .arg(model.StoredRows() - top);
     for (std::size_t r = 0; r < cells.size(); ++r) {
         const int row = top + int(r), width = int(cells[r].size());

@@ -254,7 +254,8 @@ bool CGridDelegate::Commit()
     }
     const QScopedValueRollback telling(m_telling, true);
     const ColumnSpec& column = m_grid->Model()->Column(m_index.column());
-    const QString place = GridTexts::tr("%1, line %2").arg(column.header(), QString::number(m_index.row() + 1));
+    const QString place =
+        GridTexts::tr("%1, line %2").arg(column.header(), QString::number(m_grid->Model()->LineNumber(m_index.row())));
     TellRefusal(*editor, refusal,
                 RefusalDetails(place, TextOf(editor), BoundsText(column.bounds, column.style), column.UnitSymbol()));
     return false;

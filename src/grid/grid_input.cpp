@@ -3,8 +3,10 @@
 #include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_clipboard.h"
+#include "grid/grid_header.h"
 #include "grid/grid_host.h"
 #include "grid/grid_keys.h"
+#include "grid/lines_view.h"
 #include "ks/fc/doc.h"
 
 #include <QKeyEvent>
@@ -22,7 +24,7 @@ bool CGridInput::eventFilter(QObject* object, QEvent* event)
     if (event->type() != QEvent::ShortcutOverride && event->type() != QEvent::KeyPress)
         return QObject::eventFilter(object, event);
     const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
-    if (!key)
+    if (!key || m_grid.Header().IsTypingFilter())
         return QObject::eventFilter(object, event);
     event->accept();
     if (event->type() == QEvent::KeyPress)
@@ -59,6 +61,8 @@ void CGridInput::Run(GridAction action)
     case GridAction::SelectLine:
         return m_grid.SelectLines(m_grid.CurrentRow(), m_grid.CurrentRow());
     default:
+        if (const int command = LinesView::CommandOf(action))
+            return LinesView::Run(command, m_grid);
         return Ask(action);
     }
 }
@@ -121,5 +125,9 @@ void CGridInput::ShowMenu(const QPoint& at)
         menu.addSeparator();
         add(GridAction::Search, true);
     }
+    menu.addSeparator();
+    for (const GridAction action : {GridAction::SortAscending, GridAction::SortDescending, GridAction::FileOrder,
+                                    GridAction::Filter, GridAction::ShowAfresh})
+        add(action, LinesView::CanRun(LinesView::CommandOf(action), &m_grid));
     menu.exec(at);
 }

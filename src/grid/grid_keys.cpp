@@ -31,12 +31,18 @@ constexpr GridKey Keys[] = {
     {Qt::Key_F3, None, None, GridAction::SearchAgain, true},
     {Qt::Key_F7, None, None, GridAction::Search, true},
     {Qt::Key_D, Ctrl, All, GridAction::FillDown, false},
-    {Qt::Key_D, CtrlShift, All, GridAction::FillSeries, false},
+    {Qt::Key_R, CtrlShift, All, GridAction::FillSeries, false},
     {Qt::Key_E, CtrlShift, All, GridAction::Interpolate, false},
     {Qt::Key_E, Ctrl, All, GridAction::Calculate, false},
     {Qt::Key_Z, Ctrl, All, GridAction::Undo, false},
     {Qt::Key_Y, Ctrl, All, GridAction::Redo, false},
     {Qt::Key_Z, CtrlShift, All, GridAction::Redo, false},
+    {Qt::Key_A, CtrlShift, All, GridAction::SortAscending, false},
+    {Qt::Key_D, CtrlShift, All, GridAction::SortDescending, false},
+    {Qt::Key_B, CtrlShift, All, GridAction::SortByPlace, false},
+    {Qt::Key_O, CtrlShift, All, GridAction::FileOrder, false},
+    {Qt::Key_F, CtrlShift, All, GridAction::Filter, false},
+    {Qt::Key_F5, None, All, GridAction::ShowAfresh, false},
 };
 
 // What the actions do, in their order.
@@ -58,8 +64,14 @@ constexpr const char* Descriptions[] = {
     QT_TRANSLATE_NOOP("GridTexts", "Calculate"),
     QT_TRANSLATE_NOOP("GridTexts", "Undo"),
     QT_TRANSLATE_NOOP("GridTexts", "Redo"),
+    QT_TRANSLATE_NOOP("GridTexts", "Sort by the current column, smallest first"),
+    QT_TRANSLATE_NOOP("GridTexts", "Sort by the current column, largest first"),
+    QT_TRANSLATE_NOOP("GridTexts", "Sort by branch and chainage"),
+    QT_TRANSLATE_NOOP("GridTexts", "Order of the file"),
+    QT_TRANSLATE_NOOP("GridTexts", "Filter the lines"),
+    QT_TRANSLATE_NOOP("GridTexts", "Sort and filter afresh"),
 };
-static_assert(std::size(Descriptions) == std::size_t(GridAction::Redo) + 1);
+static_assert(std::size(Descriptions) == std::size_t(GridAction::None));
 
 } // namespace
 

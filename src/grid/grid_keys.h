@@ -24,7 +24,14 @@ enum class GridAction
     Interpolate,
     Calculate,
     Undo,
-    Redo
+    Redo,
+    SortAscending,
+    SortDescending,
+    SortByPlace,
+    FileOrder,
+    Filter,
+    ShowAfresh,
+    None // of no key
 };
 
 struct GridKey

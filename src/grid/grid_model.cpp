@@ -28,6 +28,14 @@ void CGridModel::RemoveColumnsFrom(int count)
     beginRemoveColumns({}, count, columnCount() - 1);
     m_columns.resize(std::size_t(count));
     endRemoveColumns();
+    std::erase_if(m_sortedBy, [count](const SortKey& key) { return key.column >= count; });
+    m_filters = m_filters.first(std::min(m_filters.size(), qsizetype(count)));
+    if (m_shown.IsPlain())
+        return;
+    ApplySort();
+    ApplyFilters();
+    Sync();
+    emit ViewChanged();
 }
 
 void CGridModel::SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows)
@@ -37,8 +45,12 @@ void CGridModel::SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows)
     m_rows = std::move(rows);
     m_pending.clear();
     m_offered.reset();
+    m_shown.Clear();
+    m_sortedBy.clear();
+    m_filters.clear();
     m_rowCount = ShownRows();
     endResetModel();
+    emit ViewChanged();
 }
 
 void CGridModel::Sync()
@@ -48,6 +60,7 @@ void CGridModel::Sync()
     const QScopedValueRollback syncing(m_syncing, true);
     m_offered.reset(); // what fills a new line may have changed
     PruneOverlay();
+    FollowSource();
     // Views keep their current cell, selection and scroll position by row number, so only the length matters to them.
     const int count = ShownRows();
     if (count > m_rowCount) {
@@ -102,7 +115,7 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
 QVariant CGridModel::headerData(int section, Qt::Orientation orientation, int role) const
 {
     if (orientation == Qt::Vertical)
-        return role == Qt::DisplayRole ? QVariant(section + 1) : QVariant();
+        return role == Qt::DisplayRole ? QVariant(LineNumber(section)) : QVariant();
     if (section < 0 || section >= columnCount())
         return {};
     if (role == Qt::DisplayRole)
@@ -128,16 +141,77 @@ bool CGridModel::setData(const QModelIndex& index, const QVariant& value, int ro
     const ColumnSpec& column = Column(index.column());
     if (text == EditText(column, Value(index.row(), index.column())))
         return true;
-    m_pending[{NameOf(index.row()), index.column()}] = {ReadCell(column, text).value, std::size_t(index.row())};
+    m_pending[{NameOf(index.row()), index.column()}] = {ReadCell(column, text).value, SourceRow(index.row())};
     emit dataChanged(index, index);
     emit CellModified();
     return true;
 }
 
+// ---- order and filter --------------------------------------------------------------------------
+
+void CGridModel::SortBy(std::vector<SortKey> keys)
+{
+    Store();
+    m_sortedBy = std::move(keys);
+    ApplySort();
+    Sync();
+    emit ViewChanged();
+}
+
+void CGridModel::Filter(const QStringList& texts)
+{
+    Store();
+    m_filters = texts;
+    ApplyFilters();
+    Sync();
+    emit ViewChanged();
+}
+
+void CGridModel::ShowAfresh()
+{
+    Store();
+    ApplySort();
+    ApplyFilters();
+    Sync();
+    emit ViewChanged();
+}
+
+bool CGridModel::Unhide(std::size_t sourceRow)
+{
+    if (!m_rows || sourceRow >= m_rows->Count() || ShownRow(sourceRow) >= 0)
+        return false;
+    m_shown.Show(sourceRow);
+    Sync();
+    emit ViewChanged();
+    return true;
+}
+
+std::size_t CGridModel::KeepOrder(int row)
+{
+    const std::size_t line = SourceRow(std::max(row, 0));
+    if (!m_shown.IsSorted() || !m_document->MayChange())
+        return line;
+    Store();
+    std::vector<std::size_t> order(m_shown.Order().begin(), m_shown.Order().end());
+    const auto place = std::size_t(std::ranges::find(order, line) - order.begin());
+    if (!std::ranges::is_sorted(order))
+        Change(GridTexts::tr("Sorting of lines"), 0,
+               [&] { ArrangeLines(*m_document, m_rows, std::move(order), line); });
+    m_sortedBy.clear();
+    if (m_rows->KeysLast())
+        ApplySort(); // the lines that are hidden stay so
+    else
+        ShowAfresh();
+    Sync();
+    emit ViewChanged();
+    return place;
+}
+
 // ---- steps -------------------------------------------------------------------------------------
 
-/// Makes what is one step of the user's; then the rows stand in their order. Returns where the line at `row` is.
-int CGridModel::Change(const QString& step, int row, const std::function<void()>& make)
+/// Makes what is one step of the user's; then the rows of the source stand in their order. Returns where that at `row`
+/// is.
+std::size_t CGridModel::Change(const QString& step, std::size_t row, const std::function<void()>& make)
 {
     m_document->UndoStack().beginMacro(step);
     make();
@@ -147,7 +221,7 @@ int CGridModel::Change(const QString& step, int row, const std::function<void()>
 }
 
 /// The current cell and the selection go with their lines.
-int CGridModel::Arrange(int row)
+std::size_t CGridModel::Arrange(std::size_t row)
 {
     const auto order = m_rows->Order();
     if (order.empty())
@@ -155,14 +229,14 @@ int CGridModel::Arrange(int row)
     Sync();
     const QScopedValueRollback syncing(m_syncing, true);
     emit layoutAboutToBeChanged({}, VerticalSortHint);
-    ArrangeLines(*m_document, m_rows, order, std::size_t(row));
-    const auto placeOf = [&order](int was) {
-        return int(std::find(order.begin(), order.end(), std::size_t(was)) - order.begin());
+    ArrangeLines(*m_document, m_rows, order, row);
+    const auto placeOf = [&order](std::size_t was) {
+        return std::size_t(std::find(order.begin(), order.end(), was) - order.begin());
     };
     const QModelIndexList before = persistentIndexList();
     QModelIndexList after;
     for (const QModelIndex& cell : before)
-        after << index(placeOf(cell.row()), cell.column());
+        after << index(int(placeOf(std::size_t(cell.row()))), cell.column());
     changePersistentIndexList(before, after);
     emit layoutChanged({}, VerticalSortHint);
     return placeOf(row);
@@ -199,7 +273,8 @@ bool CGridModel::StoreOffered(const Overlay& typed, BlankRule rule)
     }
     if (!changed)
         return false;
-    InsertLines(*m_document, m_rows, std::size_t(StoredRows()), std::move(m_offered), GridTexts::tr("Change of cells"));
+    const QScopedValueRollback place(m_changedAt, std::optional(m_rows->Count()));
+    InsertLines(*m_document, m_rows, m_rows->Count(), std::move(m_offered), GridTexts::tr("Change of cells"));
     Sync();
     return true;
 }
@@ -222,8 +297,7 @@ bool CGridModel::StoreRows(const Overlay& typed, BlankRule rule)
     }
     if (changes.IsEmpty())
         return false;
-    Change(GridTexts::tr("Change of cells"), int(place),
-           [&] { SetCells(*m_document, m_rows, std::move(changes), place); });
+    Change(GridTexts::tr("Change of cells"), place, [&] { SetCells(*m_document, m_rows, std::move(changes), place); });
     return true;
 }
 
@@ -252,11 +326,13 @@ void CGridModel::Paste(int row, int column, const std::vector<QStringList>& text
     }
     if (changes.IsEmpty() && !added)
         return;
-    Change(step, row, [&] {
+    const std::size_t end = m_rows->Count(), first = SourceRow(row);
+    const QScopedValueRollback changed(m_changedAt, std::optional(end));
+    Change(step, first, [&] {
         if (!changes.IsEmpty())
-            SetCells(*m_document, m_rows, std::move(changes), std::size_t(row));
+            SetCells(*m_document, m_rows, std::move(changes), first);
         if (added)
-            InsertLines(*m_document, m_rows, std::size_t(last), std::move(added));
+            InsertLines(*m_document, m_rows, end, std::move(added));
     });
     Sync();
 }
@@ -265,7 +341,8 @@ void CGridModel::ChangeCells(const QString& step, int row, CCellChanges changes)
 {
     if (changes.IsEmpty() || !m_document->MayChange())
         return;
-    Change(step, row, [&] { SetCells(*m_document, m_rows, std::move(changes), std::size_t(row)); });
+    const std::size_t first = SourceRow(row);
+    Change(step, first, [&] { SetCells(*m_document, m_rows, std::move(changes), first); });
     Sync();
 }
 
@@ -274,13 +351,15 @@ int CGridModel::InsertRow(int row)
     if (!m_rows || !m_document->MayChange())
         return row;
     Store();
-    const int at = std::min(std::max(row, FixedRows()), StoredRows());
+    const int shownAt = std::min(std::max(row, FixedRows()), StoredRows());
+    const std::size_t at = SourceRow(shownAt);
     auto lines = CTableRows::NewLines(1 + OffersRow(), at);
-    const int place = Change(GridTexts::tr("Insertion of lines"), at,
-                             [&] { InsertLines(*m_document, m_rows, std::size_t(at), std::move(lines)); });
+    const QScopedValueRollback changed(m_changedAt, std::optional(at));
+    const std::size_t place = Change(GridTexts::tr("Insertion of lines"), at,
+                                     [&] { InsertLines(*m_document, m_rows, at, std::move(lines)); });
     m_document->Say(GridTexts::tr("Line inserted"));
     Sync();
-    return place + row - at; // behind an offered row, if there was one
+    return ShownRow(place) + row - shownAt; // behind an offered row, if there was one
 }
 
 void CGridModel::AppendRow(const QStringList& texts)
@@ -299,8 +378,36 @@ void CGridModel::RemoveRows(int row, int count)
     count = std::min(count, StoredRows() - row);
     if (count <= 0)
         return;
-    DeleteLines(*m_document, m_rows, std::size_t(row), std::size_t(count));
+    std::vector<std::size_t> lines(static_cast<std::size_t>(count));
+    std::ranges::generate(lines, [this, row]() mutable { return SourceRow(row++); });
+    std::ranges::sort(lines);
+    const QScopedValueRollback changed(m_changedAt, std::optional(lines.front()));
+    if (lines.back() - lines.front() + 1 == lines.size())
+        DeleteLines(*m_document, m_rows, lines.front(), lines.size());
+    else
+        RemoveScattered(lines);
     m_document->Say(
         GridTexts::Counted(std::size_t(count), GridTexts::tr("Line deleted"), GridTexts::tr("%1 lines deleted")));
     Sync();
+}
+
+/// Lines between which hidden ones stand, or others that are shown elsewhere. They go to the end before they are taken
+/// out: one by one it would cost the square of their number.
+void CGridModel::RemoveScattered(const std::vector<std::size_t>& lines)
+{
+    std::vector<std::size_t> order;
+    order.reserve(m_rows->Count());
+    for (std::size_t row = 0, next = 0; row < m_rows->Count(); ++row) {
+        if (next < lines.size() && lines[next] == row)
+            ++next;
+        else
+            order.push_back(row);
+    }
+    const std::size_t kept = order.size();
+    order.insert(order.end(), lines.begin(), lines.end());
+    m_changedAt.reset(); // where they stood, nothing that a place tells
+    Change(GridTexts::tr("Deletion of lines"), lines.front(), [&] {
+        ArrangeLines(*m_document, m_rows, std::move(order), lines.front());
+        DeleteLines(*m_document, m_rows, kept, lines.size());
+    });
 }

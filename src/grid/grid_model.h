@@ -23,8 +23,21 @@ public:
     void SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows);
     CKsDoc* Document() const { return m_document; }
 
-    /// Shows the source as it is now. Costs the same for any number of rows.
+    /// Shows the source as it is now. Costs the same for any number of rows, unless they are sorted or filtered.
     void Sync();
+
+    // What is shown, and in which order: no step of the document. What was typed is stored before.
+    /// By these keys, the most important one first; by none as in the file. Changes of cells move no line until then.
+    void SortBy(std::vector<SortKey> keys);
+    /// Hides the lines that do not pass what the user typed for the first columns (CCellFilter).
+    void Filter(const QStringList& texts);
+    /// Sorts and filters by the values of now.
+    void ShowAfresh();
+    /// A hidden line of the source comes into sight, until the filter is another. False when it was no hidden one.
+    bool Unhide(std::size_t sourceRow);
+    /// The order shown becomes the file's, hidden lines included: an undo step. Returns where the source has the line of
+    /// `row` then.
+    std::size_t KeepOrder(int row);
     /// Rows are coming or going: no moment to store anything.
     bool IsSyncing() const { return m_syncing; }
 
@@ -57,10 +70,13 @@ public:
 signals:
     /// The user changed a cell.
     void CellModified();
+    /// Sorted or filtered by something else, or by nothing.
+    void ViewChanged();
 
 private:
-    int Change(const QString& step, int row, const std::function<void()>& make);
-    int Arrange(int row);
+    std::size_t Change(const QString& step, std::size_t row, const std::function<void()>& make);
+    std::size_t Arrange(std::size_t row);
+    void RemoveScattered(const std::vector<std::size_t>& lines);
     bool StoreOffered(const Overlay& typed, BlankRule rule);
     bool StoreRows(const Overlay& typed, BlankRule rule);
 

@@ -103,7 +103,7 @@ void CGridSearch::Goto(CGenGrid& grid)
     CGotoDlg dialog(&grid);
     if (dialog.exec() != QDialog::Accepted)
         return;
-    grid.GotoLine(dialog.Line());
+    grid.ShowLine(dialog.Line());
     grid.setFocus(Qt::OtherFocusReason);
 }
 
@@ -130,7 +130,9 @@ void CGridSearch::Next(CGenGrid& grid)
         return;
     }
     const bool hadFound = std::exchange(m_found, false);
-    KsMessageBox(hadFound ? GridTexts::tr("The last occurence of searched item already found")
-                          : GridTexts::tr("Searched item not found"),
-                 QMessageBox::Ok, &grid);
+    QString text = hadFound ? GridTexts::tr("The last occurence of searched item already found")
+                            : GridTexts::tr("Searched item not found");
+    if (grid.Model()->Shown().IsFiltered())
+        text += u'\n' + GridTexts::tr("Lines that the filter hides were not looked at.");
+    KsMessageBox(text, QMessageBox::Ok, &grid);
 }

@@ -75,7 +75,6 @@ CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid), m_lette
     grid.verticalHeader()->setHighlightSections(false);
     grid.verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
     UpdateRowNumbers();
-    grid.horizontalHeader()->setHighlightSections(false);
     connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGridWidths::MakeRoom);
     connect(
         &KsUnits::Instance(), &KsUnits::Changed, this,
@@ -93,7 +92,8 @@ void CGridWidths::UpdateRowNumbers()
     const int height = font.height() + 8;
     if (numbers.defaultSectionSize() != height) // setting it visits every row
         numbers.setDefaultSectionSize(height);
-    const int longest = font.horizontalAdvance(QString::number(std::max(m_grid.RowCount(), 100))) + 12;
+    const int lines = m_grid.Model()->LineNumber(m_grid.RowCount()) - 1;
+    const int longest = font.horizontalAdvance(QString::number(std::max(lines, 100))) + 12;
     const int width = std::max(int(NumberColumnWidth * m_letters.scale), longest);
     if (numbers.width() != width)
         numbers.setFixedWidth(width);
@@ -135,6 +135,7 @@ int CGridWidths::WidthOfTexts(int column, int most, int least)
             width = std::max(width, font.horizontalAdvance(text));
     };
     make(m_grid.Model()->Column(column).header());
+    make(m_grid.Model()->Column(column).UnitLine());
     qsizetype longest = 0;
     const auto measure = [&](int row) {
         const QString text = m_grid.TextAt(row, column + 1);

@@ -31,6 +31,8 @@ public:
 
     virtual RowKey KeyAt(std::size_t row) = 0;
     virtual void* Object(RowKey key) = 0;
+    /// Whether a key names its row also when others come and go. Otherwise it is the row's place.
+    virtual bool KeysLast() const { return false; }
     /// Row of the key, looked for at `hint` first; Count() when it is not in the source.
     virtual std::size_t RowOf(RowKey key, std::size_t hint) = 0;
 
@@ -67,6 +69,8 @@ public:
     /// Where rows stand in an order of their own: for each place the row that belongs there; empty when all do.
     virtual std::vector<std::size_t> Order() const { return {}; }
     virtual void Rearrange(const std::vector<std::size_t>& /*order*/) {}
+    /// Where a row stands is part of what it says: the rows are always shown as they stand, and all of them.
+    virtual bool IsSequence() const { return false; }
 
     /// The list or table of the document that the rows are kept in.
     virtual const void* Data() const = 0;

@@ -2,22 +2,24 @@
 
 #include "grid/cell_text.h"
 #include "grid/grid_texts.h"
+#include "grid/row_filter.h"
 
 #include <algorithm>
 
 void* CTableRows::RowObject(int row) const
 {
-    if (!IsOffered(row))
-        return m_rows->At(std::size_t(row));
+    // A row that the source has lost, as long as nobody has looked, is one that it does not have yet.
+    if (const std::size_t place = SourceRow(row); !IsOffered(row) && place < m_rows->Count())
+        return m_rows->At(place);
     if (!m_offered)
         m_offered = NewLines(1);
     return m_offered->At(0);
 }
 
-std::unique_ptr<IRowBlock> CTableRows::NewLines(int count, int at) const
+std::unique_ptr<IRowBlock> CTableRows::NewLines(int count, std::size_t at) const
 {
     auto lines = m_rows->NewRows(std::size_t(count));
-    m_rows->Fit(*lines, std::size_t(at));
+    m_rows->Fit(*lines, at);
     for (const ColumnSpec& column : m_columns) {
         const CellValue value = column.NewLineValue();
         for (std::size_t i = 0; i < lines->Count() && !std::holds_alternative<std::monostate>(value); ++i)
@@ -26,11 +28,60 @@ std::unique_ptr<IRowBlock> CTableRows::NewLines(int count, int at) const
     return lines;
 }
 
+// ---- which rows, and where ---------------------------------------------------------------------
+
+std::size_t CTableRows::SourceRow(int row) const
+{
+    if (m_shown.IsPlain())
+        return std::size_t(row);
+    const auto shown = std::size_t(row);
+    return shown < m_shown.Count() ? m_shown.SourceRow(shown) : m_rows->Count() + shown - m_shown.Count();
+}
+
+int CTableRows::ShownRow(std::size_t sourceRow) const
+{
+    if (m_shown.IsPlain())
+        return int(sourceRow);
+    const auto row = m_shown.RowOf(sourceRow);
+    return row ? int(*row) : -1;
+}
+
+void* CTableRows::StoredObject(int row) const
+{
+    return row >= 0 && row < StoredRows() ? RowObject(row) : nullptr;
+}
+
+void CTableRows::ApplySort()
+{
+    if (m_rows && !m_sortedBy.empty())
+        m_shown.Sort(*m_rows, SortedRows(*m_rows, m_columns, m_sortedBy));
+    else
+        m_shown.SortAsSource();
+}
+
+void CTableRows::ApplyFilters()
+{
+    auto hidden = m_rows ? HiddenRows(*m_rows, m_columns, m_filters) : std::vector<bool>();
+    if (hidden.empty())
+        m_shown.HideNothing();
+    else
+        m_shown.Hide(*m_rows, std::move(hidden));
+}
+
+void CTableRows::FollowSource()
+{
+    if (m_shown.Follow(*m_rows, m_changedAt))
+        return;
+    ApplySort();
+    ApplyFilters();
+}
+
 // ---- rows by name ------------------------------------------------------------------------------
 
 RowKey CTableRows::NameOf(int row) const
 {
-    return IsOffered(row) ? OfferedKey : m_rows->KeyAt(std::size_t(row));
+    const std::size_t place = SourceRow(row);
+    return IsOffered(row) || place >= m_rows->Count() ? OfferedKey : m_rows->KeyAt(place);
 }
 
 int CTableRows::RowNamed(RowKey name, int row) const
@@ -38,8 +89,10 @@ int CTableRows::RowNamed(RowKey name, int row) const
     if (name == OfferedKey && IsRow(row))
         return row; // it may have become a line
     const bool isLine = m_rows && name != OfferedKey;
-    const int found = isLine ? int(m_rows->RowOf(name, std::size_t(std::max(row, 0)))) : StoredRows();
-    return found < ShownRows() ? found : -1;
+    const std::size_t found = isLine ? m_rows->RowOf(name, SourceRow(std::max(row, 0))) : 0;
+    if (isLine && found < m_rows->Count())
+        return ShownRow(found);
+    return OffersRow() ? StoredRows() : -1;
 }
 
 void CTableRows::PruneOverlay()
@@ -120,21 +173,35 @@ QString CTableRows::Refusal(int row, int column, const QString& text, bool isAlo
 
 std::optional<IRowSource::Fault> CTableRows::Fault(int row, int column, const std::vector<QStringList>& texts) const
 {
-    if (!m_rows || !m_rows->HasRules())
+    if (!m_rows || !m_rows->HasRules() || texts.empty())
         return std::nullopt;
-    const int last = StoredRows();
-    const auto rows = m_rows->NewRows(texts.size());
-    const auto lines = NewLines(std::max(0, row + int(texts.size()) - last)); // what the new ones among them start from
+    // The source is asked about the rows from the first to the last one of these, be others among them or not.
+    std::vector<std::size_t> places;
+    for (int r = 0; r < int(texts.size()); ++r)
+        places.push_back(SourceRow(row + r));
+    const auto [low, high] = std::ranges::minmax(places);
+    const std::size_t first = low, stored = m_rows->Count();
+    const auto rows = m_rows->NewRows(high - low + 1);
+    // what the new ones among them start from
+    const auto lines = NewLines(int(std::max(high + 1, stored) - stored));
+    for (std::size_t i = 0; i < rows->Count(); ++i)
+        for (const ColumnSpec& spec : m_columns)
+            spec.access->set(rows->At(i), spec.access->get(first + i < stored ? m_rows->At(first + i)
+                                                                              : lines->At(first + i - stored)));
     for (int r = 0; r < int(texts.size()); ++r) {
         const QStringList& given = texts[std::size_t(r)];
         for (int c = 0; c < int(m_columns.size()); ++c) {
-            const ColumnSpec& spec = Column(c);
             const bool isGiven = c >= column && c - column < given.size();
-            const CellValue value = isGiven          ? ReadCell(spec, given[c - column]).value
-                                    : row + r < last ? Value(row + r, c)
-                                                     : spec.access->get(lines->At(std::size_t(row + r - last)));
-            spec.access->set(rows->At(std::size_t(r)), Resolved(c, value));
+            if (!isGiven && row + r >= StoredRows())
+                continue;
+            const CellValue value = isGiven ? ReadCell(Column(c), given[c - column]).value : Value(row + r, c);
+            Column(c).access->set(rows->At(places[std::size_t(r)] - first), Resolved(c, value));
         }
     }
-    return m_rows->FindFault(std::size_t(row), *rows);
+    auto fault = m_rows->FindFault(first, *rows);
+    if (fault) { // told of the text, which stands elsewhere
+        const auto place = std::ranges::find(places, first + fault->row);
+        fault->row = place == places.end() ? 0 : std::size_t(place - places.begin());
+    }
+    return fault;
 }

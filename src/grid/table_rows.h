@@ -5,8 +5,7 @@
 // new line would hold now, and enters the source, as a step to undo, when something typed into it is stored.
 #pragma once
 
-#include "grid/column_spec.h"
-#include "grid/row_source.h"
+#include "grid/row_order.h"
 
 #include <map>
 #include <vector>
@@ -18,17 +17,33 @@ enum class BlankRule
     Fill  // as the column's fill value, where it has one
 };
 
-/// Rows and columns count from 0.
+/// Rows and columns count from 0. A row is a line as it is shown; see CShownRows.
 class CTableRows
 {
 public:
     const std::vector<ColumnSpec>& Columns() const { return m_columns; }
     const ColumnSpec& Column(int column) const { return m_columns[std::size_t(column)]; }
     const std::shared_ptr<IRowSource>& Rows() const { return m_rows; }
-    /// Rows of the source, without the offered one.
-    int StoredRows() const { return m_rows ? int(m_rows->Count()) : 0; }
+    /// Rows that are lines of the source, without the offered one.
+    int StoredRows() const { return !m_rows ? 0 : int(m_shown.IsPlain() ? m_rows->Count() : m_shown.Count()); }
     /// Rows at the top that are no lines of the table.
     int FixedRows() const { return m_rows ? int(m_rows->FixedRows()) : 0; }
+
+    /// Which of the source's rows are shown, and where.
+    const CShownRows& Shown() const { return m_shown; }
+    /// The row of the source; those behind the last row shown go on behind the last one of the source.
+    std::size_t SourceRow(int row) const;
+    /// Where a row of the source is shown; -1 for a hidden one.
+    int ShownRow(std::size_t sourceRow) const;
+    /// The number of a line, from 1, as the user knows it: that in the file.
+    int LineNumber(int row) const { return int(SourceRow(row)) + 1; }
+    /// The object of a row of the source; null for the offered one.
+    void* StoredObject(int row) const;
+    const std::vector<SortKey>& SortedBy() const { return m_sortedBy; }
+    /// What the user typed to filter the first columns.
+    const QStringList& Filters() const { return m_filters; }
+    /// Whether the user may sort and filter.
+    bool MayRearrangeView() const { return m_rows && !m_rows->IsSequence(); }
 
     /// What the cell holds, typed or stored.
     CellValue Value(int row, int column) const;
@@ -51,14 +66,14 @@ public:
     int RowNamed(RowKey name, int row) const;
 
     /// New lines with the columns' fill values, not in the source; they fit at its end.
-    std::unique_ptr<IRowBlock> NewLines(int count) const { return NewLines(count, StoredRows()); }
+    std::unique_ptr<IRowBlock> NewLines(int count) const { return NewLines(count, m_rows->Count()); }
 
 protected:
     using CellKey = std::pair<RowKey, int>;
     struct Typed
     {
         CellValue value;
-        std::size_t row; // where the row was
+        std::size_t row; // where the source had it
     };
     using Overlay = std::map<CellKey, Typed>;
     static constexpr RowKey OfferedKey = RowKey(-1); // no place and no address
@@ -68,7 +83,12 @@ protected:
     bool IsRow(int row) const { return row >= 0 && row < ShownRows(); }
     void* RowObject(int row) const;
     CellValue Resolved(int column, const CellValue& value, BlankRule rule = BlankRule::Zero) const;
-    std::unique_ptr<IRowBlock> NewLines(int count, int at) const;
+    std::unique_ptr<IRowBlock> NewLines(int count, std::size_t at) const;
+    /// Order and filter, as they are now, on what the source holds now.
+    void ApplySort();
+    void ApplyFilters();
+    /// Rows of the source have come or gone.
+    void FollowSource();
     /// Forgets what was typed into rows that are gone.
     void PruneOverlay();
 
@@ -76,6 +96,10 @@ protected:
     std::shared_ptr<IRowSource> m_rows;
     Overlay m_pending;
     mutable std::unique_ptr<IRowBlock> m_offered; // made when it is asked for
+    CShownRows m_shown;
+    std::vector<SortKey> m_sortedBy;
+    QStringList m_filters;
+    std::optional<std::size_t> m_changedAt; // where a step that is being made puts lines in or takes them out
 
 private:
     bool IsOffered(int row) const { return OffersRow() && row == StoredRows(); }

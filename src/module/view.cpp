@@ -2,6 +2,7 @@
 
 #include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
+#include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
 #include "module/sheet.h"
@@ -184,6 +185,8 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
     std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
+    menu.emplace_back();
+    std::ranges::move(LinesView::MenuCommands(), std::back_inserter(menu));
     return menu;
 }
 
@@ -195,7 +198,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
         return m_sheet && m_sheet->isEnabled();
     const auto* page = ActivePage();
     const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || CCellCommands::Knows(id);
-    const CGenGrid* grid = !page ? nullptr : isForLines ? page->LinesGrid() : page->GetGrid();
+    const CGenGrid* grid = !page ? nullptr : isForLines || LinesView::Knows(id) ? page->LinesGrid() : page->GetGrid();
     if (!m_linesEnabled || !grid || !grid->isEnabled())
         return false;
     if (GetDocument()->IsReadOnly() && (isForLines || id == Command::FetchLocation))
@@ -204,6 +207,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
            : id == Command::DeleteLine    ? grid->HasLinesToDelete()
            : id == Command::FetchLocation ? GetDocument()->ProjectHandle() != 0
            : CCellCommands::Knows(id)     ? CCellCommands::CanRun(id, grid)
+           : LinesView::Knows(id)         ? LinesView::CanRun(id, grid)
                                           : m_search.CanRun(id, grid);
 }
 
@@ -224,6 +228,8 @@ bool CKavo0_hdView::OnCommand(int id)
         FindField();
     else if (CCellCommands::Knows(id))
         CCellCommands::Run(id, *page->LinesGrid());
+    else if (LinesView::Knows(id))
+        LinesView::Run(id, *page->LinesGrid());
     else
         m_search.Run(id, *page->GetGrid());
     return true;

@@ -68,6 +68,7 @@ public:
     // With places as keys, only rows behind the end are stale.
     RowKey KeyAt(std::size_t row) override { return row; }
     void* Object(RowKey key) override { return At(key); }
+    bool IsSequence() const override { return true; } // of the levels
     std::size_t RowOf(RowKey key, std::size_t) override { return std::min(std::size_t(key), Count()); }
 
     std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override

@@ -3,6 +3,7 @@
 #include "editors/common/branch_names.h"
 #include "grid/grid_keys.h"
 #include "grid/grid_widths.h"
+#include "grid/lines_view.h"
 
 #include <QApplication>
 #include <QHeaderView>
@@ -103,7 +104,7 @@ void CTablesView::changeEvent(QEvent* event)
 int CTablesView::CurrentLine() const
 {
     const auto rows = m_main.grid ? m_main.grid->Model()->Rows() : nullptr;
-    return rows ? std::min(m_main.grid->CurrentRow(), int(rows->Count())) - 1 : -1;
+    return rows ? std::min(m_main.grid->CurrentLine(), int(rows->Count())) - 1 : -1;
 }
 
 void CTablesView::LineCurrent(CGenGrid& grid)
@@ -137,9 +138,9 @@ void CTablesView::RevealChange(const ChangePlace& place)
     if ((!isPart && place.data != lines) || IsEditing() || (!IsActive() && ProjectDoc()->Views().size() > 1))
         return;
     const int column = std::max(place.column, 1);
-    m_main.grid->SetCurrentCell(isPart ? place.listRow : place.row, isPart ? m_main.grid->CurrentColumn() : column);
+    m_main.grid->ShowLine(isPart ? place.listRow : place.row, isPart ? m_main.grid->CurrentColumn() : column);
     if (isPart)
-        m_parts.grid->SetCurrentCell(place.row, column);
+        m_parts.grid->ShowLine(place.row, column);
     if (IsActive())
         (isPart ? m_parts : m_main).grid->setFocus(Qt::OtherFocusReason);
 }
@@ -260,7 +261,7 @@ bool CTablesView::IsCommandEnabled(int id) const
     case Command::DeleteLine:
         return m_lines->HasLinesToDelete();
     default:
-        return CCellCommands::Knows(id) ? CCellCommands::CanRun(id, m_lines) : m_search.CanRun(id, m_main.grid);
+        return CCellCommands::CanRun(id, m_lines) || LinesView::CanRun(id, m_lines) || m_search.CanRun(id, m_main.grid);
     }
 }
 
@@ -276,6 +277,8 @@ bool CTablesView::OnCommand(int id)
         m_lines->DeleteSelectedLines();
     else if (CCellCommands::Knows(id))
         CCellCommands::Run(id, *m_lines);
+    else if (LinesView::Knows(id))
+        LinesView::Run(id, *m_lines);
     else
         m_search.Run(id, *m_main.grid);
     return true;

@@ -108,6 +108,7 @@ public:
                 point = {before.offset + (at > 1 ? points[at - 1].offset - points[at - 2].offset : step), before.level};
         }
     }
+    bool IsSequence() const override { return true; }
     bool HasRules() const override { return true; }
     std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
     {

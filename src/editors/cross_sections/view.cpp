@@ -55,7 +55,7 @@ QString CCrossSectionView::PartTitle() const
 void CCrossSectionView::GoToSection(int section)
 {
     if (Document()->Section(section))
-        Sections()->SetCurrentCell(section + 1, Sections()->CurrentColumn());
+        Sections()->ShowLine(section + 1, Sections()->CurrentColumn());
 }
 
 void CCrossSectionView::Retranslate()

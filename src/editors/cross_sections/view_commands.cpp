@@ -1,6 +1,8 @@
 // The commands of the cross sections' view.
 #include "editors/cross_sections/view.h"
 
+#include "grid/lines_view.h"
+
 #include <algorithm>
 #include <iterator>
 
@@ -14,6 +16,8 @@ std::vector<CKsMenuCommand> CCrossSectionView::LinesMenu() const
     std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
+    menu.emplace_back();
+    std::ranges::move(LinesView::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     menu.push_back({CrossSectionCommand::Previous, tr("P&revious Cross Section"),
                     QKeySequence(Qt::ALT | Qt::Key_PageUp), tr("Shows the cross section above")});

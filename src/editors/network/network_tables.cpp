@@ -102,6 +102,7 @@ public:
         }
         return std::nullopt;
     }
+    bool IsSequence() const override { return true; }
     std::vector<std::size_t> Order() const override
     {
         const auto& channel = Rows();

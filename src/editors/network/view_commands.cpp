@@ -2,6 +2,7 @@
 #include "editors/network/import_dialog.h"
 #include "editors/network/view.h"
 #include "grid/grid_widths.h"
+#include "grid/lines_view.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/fc/message_box.h"
 
@@ -44,6 +45,8 @@ std::vector<CKsMenuCommand> CNetworkView::LinesMenu() const
     std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
+    menu.emplace_back();
+    std::ranges::move(LinesView::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     menu.push_back({NetworkCommand::FitAll, tr("Sho&w All"), {}, tr("Shows the whole network on the map")});
     menu.push_back({NetworkCommand::ZoomIn, tr("&Zoom In"), {}, tr("Enlarges the map")});
@@ -124,7 +127,7 @@ void CNetworkView::Import(const QString& path)
     const QString report = ReportOf(dialog.Import(), Document()->Network()).text;
     const auto first = int(Document()->Network().branches.size());
     Document()->AppendBranches(dialog.Import().plan.branches, dialog.NetworkSystem(), tr("Import Branches"));
-    Branches()->SetCurrentCell(first + 1, BranchName + 1);
+    Branches()->ShowLine(first + 1, BranchName + 1);
     Branches()->Widths().MakeRoom();
     m_map->FitAll();
     ShowImportReport(report, this);

@@ -143,7 +143,7 @@ void CNetworkView::PickedChanged()
     const auto picked = m_map->Marks().Picked();
     const int branch = picked ? Document()->Network().FindBranch(picked->branch) : -1;
     if (branch >= 0 && branch != CurrentLine() && !IsEditing()) // what is refused stays in its cell
-        Branches()->SetCurrentCell(branch + 1, BranchName + 1);
+        Branches()->ShowLine(branch + 1, BranchName + 1);
 }
 
 std::unique_ptr<QMenu> CNetworkView::MapMenu()

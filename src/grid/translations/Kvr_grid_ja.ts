@@ -304,8 +304,8 @@
         <translation>補間(&amp;P)...</translation>
     </message>
     <message>
-        <source>&amp;Calculate...</source>
-        <translation>計算(&amp;C)...</translation>
+        <source>Calc&amp;ulate...</source>
+        <translation>計算(&amp;U)...</translation>
     </message>
     <message>
         <source>1 cell changed</source>
@@ -438,6 +438,118 @@
     <message>
         <source>A cell that the formula names is empty.</source>
         <translation>式で使うセルが空です。</translation>
+    </message>
+    <message>
+        <source>Sort As&amp;cending</source>
+        <translation>昇順に並べ替え(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Sort D&amp;escending</source>
+        <translation>降順に並べ替え(&amp;E)</translation>
+    </message>
+    <message>
+        <source>Sort by &amp;Branch and Chainage</source>
+        <translation>河川名と追加距離で並べ替え(&amp;B)</translation>
+    </message>
+    <message>
+        <source>Order of the &amp;File</source>
+        <translation>ファイルの順序(&amp;F)</translation>
+    </message>
+    <message>
+        <source>Ma&amp;ke This the Order of the File</source>
+        <translation>この順序をファイルの順序にする(&amp;K)</translation>
+    </message>
+    <message>
+        <source>Fil&amp;ter</source>
+        <translation>絞り込み(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Show A&amp;ll Lines</source>
+        <translation>すべての行を表示(&amp;L)</translation>
+    </message>
+    <message>
+        <source>Sort and Filter Afres&amp;h</source>
+        <translation>並べ替えと絞り込みをやり直す(&amp;H)</translation>
+    </message>
+    <message>
+        <source>Sort by the current column, smallest first</source>
+        <translation>現在の列で昇順に並べ替え</translation>
+    </message>
+    <message>
+        <source>Sort by the current column, largest first</source>
+        <translation>現在の列で降順に並べ替え</translation>
+    </message>
+    <message>
+        <source>Sort by branch and chainage</source>
+        <translation>河川名と追加距離で並べ替え</translation>
+    </message>
+    <message>
+        <source>Order of the file</source>
+        <translation>ファイルの順序</translation>
+    </message>
+    <message>
+        <source>Filter the lines</source>
+        <translation>行の絞り込み</translation>
+    </message>
+    <message>
+        <source>Sort and filter afresh</source>
+        <translation>並べ替えと絞り込みをやり直す</translation>
+    </message>
+    <message>
+        <source>Sorting of lines</source>
+        <translation>行の並べ替え</translation>
+    </message>
+    <message>
+        <source>%1 of %2 shown</source>
+        <translation>%2 行中 %1 行を表示</translation>
+    </message>
+    <message>
+        <source>Filter of %1</source>
+        <translation>%1 の絞り込み</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>絞り込み</translation>
+    </message>
+    <message>
+        <source>Text that the cells contain; =text for the whole cell, &quot;&quot; for empty ones. Alt+Down shows what there is.</source>
+        <translation>セルに含まれる文字列。=文字列 はセル全体、&quot;&quot; は空のセル。Alt+↓ で候補を表示します。</translation>
+    </message>
+    <message>
+        <source>12.5, &gt;5, &lt;=3, 2..7, =4, !=4, &quot;&quot; for empty cells</source>
+        <translation>12.5、&gt;5、&lt;=3、2..7、=4、!=4、空のセルは &quot;&quot;</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no condition for numbers. Possible are 5, =5, !=5, &gt;5, &gt;=5, &lt;5, &lt;=5, 2..7 and &quot;&quot; for empty cells.</source>
+        <translation>「%1」は数値の条件ではありません。5、=5、!=5、&gt;5、&gt;=5、&lt;5、&lt;=5、2..7、空のセルには &quot;&quot; を使えます。</translation>
+    </message>
+    <message>
+        <source>All</source>
+        <translation>すべて</translation>
+    </message>
+    <message>
+        <source>(empty)</source>
+        <translation>(空)</translation>
+    </message>
+    <message>
+        <source>No line passes the filter.</source>
+        <translation>絞り込みに該当する行がありません。</translation>
+    </message>
+    <message>
+        <source>Line %1 does not pass the filter; it is shown until the filter changes.</source>
+        <translation>%1 行目は絞り込みに該当しませんが、絞り込みを変更するまで表示します。</translation>
+    </message>
+    <message>
+        <source>Lines that the filter hides were not looked at.</source>
+        <translation>絞り込みで隠れている行は検索していません。</translation>
+    </message>
+    <message>
+        <source>%1 cells selected</source>
+        <translation>%1 セルを選択</translation>
+    </message>
+    <message>
+        <source>%1: sum %2, mean %3, min %4, max %5</source>
+        <translation>%1: 合計 %2、平均 %3、最小 %4、最大 %5</translation>
     </message>
 </context>
 </TS>

@@ -83,11 +83,11 @@ std::size_t CLocationPage::RowOf(const CGenList& list, const HD_RiverPos& record
 
 HD_RiverPos* CLocationPage::CurrentRecord() const
 {
-    if (!GetGrid())
+    if (!GetGrid() || !m_list)
         return nullptr;
-    const int row = GetGrid()->CurrentRow() - GetGrid()->Model()->FixedRows();
-    return m_list && row >= 1 && std::size_t(row) <= m_list->GetCount() ? &m_list->GetAt(std::size_t(row) - 1)
-                                                                        : nullptr;
+    const int row = GetGrid()->CurrentRow() - 1;
+    const CGridModel& model = *GetGrid()->Model();
+    return row >= model.FixedRows() ? static_cast<HD_RiverPos*>(model.StoredObject(row)) : nullptr;
 }
 
 void CLocationPage::ShowParts()

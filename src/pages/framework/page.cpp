@@ -86,7 +86,7 @@ CGenGrid* CGenPropertyPage::LinesGrid() const
 void CGenPropertyPage::GotoLine(int row)
 {
     if (m_grid)
-        m_grid->GotoLine(row);
+        m_grid->ShowLine(row);
 }
 
 /// The grid over that list or table; null for none.
@@ -109,10 +109,10 @@ void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
     QWidget* shown = m_bindings.ControlFor(place.data);
     // A table of a line is shown once the line is current.
     if (m_grid && place.list && place.list == GetList() && place.data != place.list && place.listRow > 0)
-        m_grid->GotoLine(place.listRow + m_grid->Model()->FixedRows());
+        m_grid->ShowLine(place.listRow + m_grid->Model()->FixedRows());
     if (CGenGrid* grid = GridOf(place.data)) {
         if (place.row > 0)
-            grid->SetCurrentCell(place.row, std::min(std::max(place.column, 1), grid->ColumnCount()));
+            grid->ShowLine(place.row, std::min(std::max(place.column, 1), grid->ColumnCount()));
         shown = grid;
     }
     if (!shown)

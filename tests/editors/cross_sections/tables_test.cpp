@@ -1,5 +1,6 @@
 // The tables beside the plot: models, editing with units and undo, lines by keys, and what is refused.
 #include "cross_sections_fixture.h"
+#include "grid/lines_view.h"
 #include "ks/language/language.h"
 
 #include <QAbstractItemModelTester>
@@ -45,6 +46,32 @@ TEST_F(CrossSectionTest, TablesShowTheSectionsInTheUsersUnits)
     EXPECT_EQ(view->Plot()->Title(), "");
     UndoAll(view);
     EXPECT_EQ(view->Sections()->model()->rowCount(), SmallRows);
+}
+
+/// The rows of a vector have no names of their own.
+TEST_F(CrossSectionTest, SortedAndFilteredSections)
+{
+    CCrossSectionView* view = Open();
+    CGenGrid* sections = view->Sections();
+    const auto& stored = view->Document()->Sections().sections;
+    EXPECT_FALSE(LinesView::CanRun(Command::SortAscending, view->Points())) << "where a point stands is what it says";
+    sections->ChangeView([](CGridModel& model) { model.SortBy({{SectionWidth}}); });
+    sections->SetCurrentCell(2, SectionTopoId + 1);
+    EXPECT_EQ(sections->CurrentLine(), Main2500 + 1) << "after the one of 7 m";
+    EXPECT_EQ(view->CurrentSection(), Main2500);
+    EXPECT_EQ(view->Points()->RowCount(), 4);
+    sections->ChangeView([](CGridModel& model) { model.Filter(QStringList{"", "", "", "7..20"}); });
+    ASSERT_EQ(sections->RowCount(), 2);
+    sections->SelectLines(1, 2);
+    sections->DeleteSelectedLines();
+    ASSERT_EQ(stored.size(), 2u) << "others stand between those that are shown";
+    EXPECT_EQ(stored[0].chainage, 1000);
+    EXPECT_EQ(stored[1].topoId, "2021");
+    EXPECT_EQ(view->Document()->UndoStack().count(), 1);
+    UndoAll(view);
+    ASSERT_EQ(stored.size(), 4u);
+    EXPECT_EQ(stored[Main2500].topoId, "2019");
+    EXPECT_EQ(stored[Side300].width, 7);
 }
 
 TEST_F(CrossSectionTest, EveryCellCanBeEditedAndUndone)
