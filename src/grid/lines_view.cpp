@@ -27,7 +27,7 @@ constexpr Entry Entries[] = {
     {Command::KeepOrder, QT_TRANSLATE_NOOP("GridTexts", "Ma&ke This the Order of the File"), GridAction::None},
     {},
     {Command::Filter, QT_TRANSLATE_NOOP("GridTexts", "Fil&ter"), GridAction::Filter},
-    {Command::ShowAllLines, QT_TRANSLATE_NOOP("GridTexts", "Show A&ll Lines"), GridAction::None},
+    {Command::ShowAllLines, QT_TRANSLATE_NOOP("GridTexts", "Show Ever&y Line"), GridAction::None},
     {Command::ShowAfresh, QT_TRANSLATE_NOOP("GridTexts", "Sort and Filter Afres&h"), GridAction::ShowAfresh},
 };
 

@@ -44,16 +44,6 @@ class Numbers(Case):
         self.assertFalse(editor.modified)
 
 
-    def test_what_is_not_available_cannot_be_chosen(self):
-        editor = self.open()
-        editor.go_to('Default Values')
-        modes = editor.frame.find('combo box', '^Water Level')
-        editor.click(modes)
-        editor.press('Down', 'Return', 'End', 'parenleft')
-        editor.settle()
-        self.assertEqual(modes.name, 'Water Level')
-
-
 class BranchNames(Case):
     def test_typed_name_is_not_completed(self):
         editor = self.open_project()

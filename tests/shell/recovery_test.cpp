@@ -289,7 +289,7 @@ TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
         }
     proposed.sort();
     EXPECT_EQ(proposed, (QStringList{Path("changed-2.HDKV"), Path("early-2.HDKV"), Path("edited-2.HDKV"),
-                                     Path("missing.HDKV"), Path("other/changed-2.HDKV")}));
+                                     Path("missing.HDKV"), Path("other/changed-2.HDKV"), Path("used-2.HDKV")}));
 }
 
 TEST_F(RecoveryTest, ADamagedFileDoesNoHarm)

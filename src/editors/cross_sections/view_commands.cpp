@@ -19,9 +19,9 @@ std::vector<CKsMenuCommand> CCrossSectionView::LinesMenu() const
     menu.emplace_back();
     std::ranges::move(LinesView::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
-    menu.push_back({CrossSectionCommand::Previous, tr("P&revious Cross Section"),
+    menu.push_back({CrossSectionCommand::Previous, tr("Pre&vious Cross Section"),
                     QKeySequence(Qt::ALT | Qt::Key_PageUp), tr("Shows the cross section above")});
-    menu.push_back({CrossSectionCommand::Next, tr("&Next Cross Section"), QKeySequence(Qt::ALT | Qt::Key_PageDown),
+    menu.push_back({CrossSectionCommand::Next, tr("Ne&xt Cross Section"), QKeySequence(Qt::ALT | Qt::Key_PageDown),
                     tr("Shows the cross section below")});
     return menu;
 }

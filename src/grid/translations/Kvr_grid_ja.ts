@@ -464,8 +464,8 @@
         <translation>絞り込み(&amp;T)</translation>
     </message>
     <message>
-        <source>Show A&amp;ll Lines</source>
-        <translation>すべての行を表示(&amp;L)</translation>
+        <source>Show Ever&amp;y Line</source>
+        <translation>すべての行を表示(&amp;Y)</translation>
     </message>
     <message>
         <source>Sort and Filter Afres&amp;h</source>

@@ -16,7 +16,6 @@
 #include <QKeyEvent>
 #include <QLabel>
 #include <QRadioButton>
-#include <QStandardItemModel>
 #include <QUndoStack>
 #include <algorithm>
 
@@ -265,9 +264,6 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
 
 void CBindings::AddUnbound(QComboBox* box)
 {
-    const auto* entries = qobject_cast<const QStandardItemModel*>(box->model());
-    for (int entry = 1; entries && entry < entries->rowCount(); ++entry)
-        entries->item(entry)->setEnabled(false);
     Add(box, nullptr, [box] { box->setCurrentIndex(0); });
 }
 

@@ -57,7 +57,7 @@ public:
     void Add(QComboBox* box, std::int32_t& index, std::function<void(std::int32_t chosen)> choose);
     /// Button n stands for the value n. Another value is kept, with no button pressed.
     void Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& value);
-    /// A list that stands for no value: it shows its first entry, and the others cannot be chosen.
+    /// A list that stands for no value: whatever is chosen, it shows its first entry when the page is shown afresh.
     void AddUnbound(QComboBox* box);
 
     /// The widgets, with label and unit beside them, are enabled, or visible, exactly while the rule holds; it is asked

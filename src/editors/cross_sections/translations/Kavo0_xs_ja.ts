@@ -47,16 +47,16 @@
         <translation>選択した横断面または測点を削除します</translation>
     </message>
     <message>
-        <source>P&amp;revious Cross Section</source>
-        <translation>前の横断面(&amp;R)</translation>
+        <source>Pre&amp;vious Cross Section</source>
+        <translation>前の横断面(&amp;V)</translation>
     </message>
     <message>
         <source>Shows the cross section above</source>
         <translation>1つ上の横断面を表示します</translation>
     </message>
     <message>
-        <source>&amp;Next Cross Section</source>
-        <translation>次の横断面(&amp;N)</translation>
+        <source>Ne&amp;xt Cross Section</source>
+        <translation>次の横断面(&amp;X)</translation>
     </message>
     <message>
         <source>Shows the cross section below</source>
