@@ -9,6 +9,8 @@
 #include <algorithm>
 #include <cmath>
 #include <map>
+#include <ranges>
+#include <span>
 
 namespace {
 
@@ -18,15 +20,18 @@ bool HasNumbers(const ColumnSpec& column)
 }
 
 /// In the unit shown; nothing for an empty cell and for what is no number.
-std::optional<double> ShownNumber(const CTableRows& rows, int row, int column)
+std::optional<double> ShownNumber(const ColumnSpec& column, const CellValue& value)
 {
-    const CellValue value = rows.Value(row, column);
     if (const auto* integer = std::get_if<std::int32_t>(&value))
         return *integer;
     const auto* number = std::get_if<double>(&value);
     if (!number || *number == NotGiven || std::isnan(*number))
         return std::nullopt;
-    return rows.Column(column).style.UnitConvertFromBase(*number, 1);
+    return column.style.UnitConvertFromBase(*number, 1);
+}
+std::optional<double> ShownNumber(const CTableRows& rows, int row, int column)
+{
+    return ShownNumber(rows.Column(column), rows.Value(row, column));
 }
 
 template <typename Do>
@@ -49,7 +54,7 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block)
     ForCells(rows, {block.top + 1, block.left, block.bottom, block.right}, [&](int row, int column) {
         const CellKind kind = rows.Column(column).Kind();
         if (kind != CellKind::Button)
-            results.Add(row, column, rows.Value(block.top, column));
+            results.Add(row, column, rows.Value(row, column), rows.Value(block.top, column));
     });
     return results;
 }
@@ -69,13 +74,17 @@ double StepOf(const CTableRows& rows, const CellBlock& block)
 CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double step)
 {
     CCellResults results(rows);
+    std::optional<double> first;
     ForCells(rows, block, [&](int row, int column) {
         if (!HasNumbers(rows.Column(column)))
             return;
-        if (const auto first = ShownNumber(rows, block.top, column))
-            results.AddShown(row, column, *first + step * (row - block.top));
-        else if (row == block.top)
-            results.Keep(row, column, GridTexts::tr("The cell is empty."));
+        if (row == block.top) {
+            first = ShownNumber(rows, row, column);
+            if (!first)
+                results.Keep(row, column, GridTexts::tr("The cell is empty."));
+        } else if (first) {
+            results.AddShown(row, column, rows.Value(row, column), *first + step * (row - block.top));
+        }
     });
     return results;
 }
@@ -146,19 +155,30 @@ std::optional<double> OnLine(const std::vector<Known>& known, double chainage, b
     return before->value + part * (after->value - before->value);
 }
 
+/// The first of the lines that is in the block, or is not, and has a value.
+std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, int column, bool isInBlock)
+{
+    for (const LineOfBranch& line : lines)
+        if (const auto value = line.isInBlock == isInBlock ? ShownNumber(rows, line.row, column) : std::nullopt)
+            return Known{line.chainage, *value};
+    return std::nullopt;
+}
+
 /// Of two values at one place the first one counts.
 std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column, KnownValues which)
 {
     std::vector<Known> known;
-    for (const LineOfBranch& line : lines) {
-        if (line.isInBlock != (which == KnownValues::Ends))
-            continue;
-        const auto value = ShownNumber(rows, line.row, column);
-        if (value && (known.empty() || known.back().chainage != line.chainage))
-            known.push_back({line.chainage, *value});
+    const auto add = [&known](const std::optional<Known>& value) {
+        if (value && (known.empty() || known.back().chainage != value->chainage))
+            known.push_back(*value);
+    };
+    if (which == KnownValues::Ends) {
+        add(FirstKnown(rows, std::views::all(lines), column, true));
+        add(FirstKnown(rows, std::views::reverse(lines), column, true));
+        return known;
     }
-    if (which == KnownValues::Ends && known.size() > 2)
-        known = {known.front(), known.back()};
+    for (std::size_t line = 0; line < lines.size(); ++line)
+        add(FirstKnown(rows, std::span(lines).subspan(line, 1), column, false));
     return known;
 }
 
@@ -179,7 +199,7 @@ CCellResults Interpolate(const CTableRows& rows, const CellBlock& block, KnownVa
                 if (!line.isInBlock)
                     continue;
                 if (const auto value = OnLine(known, line.chainage, extrapolates))
-                    results.AddShown(line.row, column, *value);
+                    results.AddShown(line.row, column, rows.Value(line.row, column), *value);
                 else
                     results.Keep(line.row, column, GridTexts::tr("There is no known value on both sides of it."));
             }
@@ -225,14 +245,15 @@ CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKs
     ForCells(rows, block, [&](int row, int column) {
         if (!HasNumbers(rows.Column(column)))
             return;
+        const CellValue before = rows.Value(row, column);
         for (const std::size_t name : used) {
-            const int from = names.columns[name] < 0 ? column : names.columns[name];
-            const auto number = ShownNumber(rows, row, from);
+            const int from = names.columns[name];
+            const auto number = from < 0 ? ShownNumber(rows.Column(column), before) : ShownNumber(rows, row, from);
             if (!number)
                 return results.Keep(row, column, GridTexts::tr("A cell that the formula names is empty."));
             numbers[name] = *number;
         }
-        results.AddShown(row, column, formula.Value(numbers));
+        results.AddShown(row, column, before, formula.Value(numbers));
     });
     return results;
 }

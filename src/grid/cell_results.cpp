@@ -14,12 +14,11 @@ constexpr std::size_t Listed = 100; // more is nothing that anybody reads
 
 } // namespace
 
-void CCellResults::Add(int row, int column, const CellValue& after)
+void CCellResults::Add(int row, int column, const CellValue& before, const CellValue& after)
 {
-    const ColumnSpec& spec = m_rows->Column(column);
-    CellValue before = m_rows->Value(row, column);
     if (SameCell(before, after))
         return;
+    const ColumnSpec& spec = m_rows->Column(column);
     if (m_rows->IsLocked(row, column))
         return Keep(row, column, GridTexts::tr("The cell is locked."));
     if (const auto* number = std::get_if<double>(&after); number && !spec.bounds.Allow(*number))
@@ -30,14 +29,13 @@ void CCellResults::Add(int row, int column, const CellValue& after)
         m_changed.push_back({row, column, EditText(spec, before), EditText(spec, after)});
     if (m_rows->Rows()->HasRules())
         m_texts.push_back({{row, column}, EditText(spec, after)});
-    m_changes.Add(m_rows->NameOf(row), column + 1, spec.access, std::move(before), after);
+    m_changes.Add(m_rows->NameOf(row), column + 1, spec.access, before, after);
 }
 
-void CCellResults::AddShown(int row, int column, double after)
+void CCellResults::AddShown(int row, int column, const CellValue& before, double after)
 {
     using Limits = std::numeric_limits<std::int32_t>;
     const ColumnSpec& spec = m_rows->Column(column);
-    const CellValue before = m_rows->Value(row, column);
     const auto* number = std::get_if<double>(&before);
     // What a conversion of units makes of the last place is no change.
     if (number && spec.style.UnitConvertFromBase(*number, 1) == after)
@@ -45,11 +43,11 @@ void CCellResults::AddShown(int row, int column, double after)
     if (!std::isfinite(after))
         Keep(row, column, GridTexts::tr("The result is no number."));
     else if (spec.Kind() == CellKind::Number)
-        Add(row, column, spec.style.UnitConvertFromBase(KsFifteenDigits(after), 0));
+        Add(row, column, before, spec.style.UnitConvertFromBase(KsFifteenDigits(after), 0));
     else if (after != std::floor(after) || after < Limits::min() || after > Limits::max())
         Keep(row, column, GridTexts::tr("The result is no integer."));
     else
-        Add(row, column, std::int32_t(after));
+        Add(row, column, before, std::int32_t(after));
 }
 
 void CCellResults::Keep(int row, int column, const QString& why)

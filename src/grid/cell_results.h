@@ -17,10 +17,10 @@ class CCellResults
 public:
     explicit CCellResults(const CTableRows& rows) : m_rows(&rows) {}
 
-    /// The cell becomes `after` unless it holds that already, or cannot.
-    void Add(int row, int column, const CellValue& after);
+    /// The cell, which holds `before`, becomes `after` unless that is the same, or cannot be.
+    void Add(int row, int column, const CellValue& before, const CellValue& after);
     /// The number in the unit that the user sees, to fifteen digits; an integer for a column of them.
-    void AddShown(int row, int column, double after);
+    void AddShown(int row, int column, const CellValue& before, double after);
     /// The cell stays as it is.
     void Keep(int row, int column, const QString& why);
 

@@ -188,9 +188,10 @@ bool CGridModel::Unhide(std::size_t sourceRow)
 
 std::size_t CGridModel::KeepOrder(int row)
 {
-    const std::size_t line = SourceRow(std::max(row, 0));
-    if (!m_shown.IsSorted() || !m_document->MayChange())
-        return line;
+    const std::size_t shown = SourceRow(std::max(row, 0));
+    if (!m_shown.IsSorted() || m_shown.Order().empty() || !m_document->MayChange())
+        return shown;
+    const std::size_t line = std::min(shown, m_shown.Order().size() - 1); // none may be in sight
     Store();
     std::vector<std::size_t> order(m_shown.Order().begin(), m_shown.Order().end());
     const auto place = std::size_t(std::ranges::find(order, line) - order.begin());

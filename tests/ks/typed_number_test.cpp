@@ -47,7 +47,8 @@ TEST_F(TypedNumber, AnAmountIsStoredInTheBaseUnitWithoutStrayDigits)
         {Discharge, "45 cfs", 1.27425809664}, {Discharge, "36 m3/h", 0.01},   {Discharge, "-1 ft³/s", -0.028316846592},
         {Velocity, "36 km/h", 10},           {Area, "2 ha", 20000},           {Factor, "5 %", 0.05},
         {LightAttenuation, "2 1/cm", 200},   {LightAttenuation, "2 /cm", 200}, {Rotation, "30°", 30},
-        {Viscosity, "1.3 mm2/s", 1.3e-6},    {Discharge, "0.1 M3/S", 0.1},
+        {Viscosity, "1.3 mm2/s", 1.3e-6},    {Discharge, "0.1 M3/S", 0.1},     {Chainage, "5 NMI", 9260},
+        {Volume, "2 hm3", 2e6},              {Discharge, "100 gal/min", 0.00630901964}, {Rotation, "2 deg", 2},
     };
     for (const Case& each : cases)
         EXPECT_DOUBLE_EQ(Read(each.group, each.text), each.expected) << each.text;
@@ -91,6 +92,10 @@ TEST_F(TypedNumber, WhatIsNoAmountIsRefused)
     EXPECT_EQ(Complaint(None, "3 m"), "This number has no unit; \"m\" cannot stand here.");
     EXPECT_NE(Complaint(WaterLevel, "5 1/m"), "") << "not a fifth of a metre";
     EXPECT_NE(Complaint(Slope, "5°"), "") << "the tangent was meant";
+    EXPECT_NE(Complaint(GeoAngle, "5 %"), "");
+    for (const char* text : {"5 kmi", "5 din", "5 Mm"}) // with prefixes that nobody means
+        EXPECT_EQ(Complaint(WaterLevel, text), "") << text;
+    EXPECT_EQ(Complaint(Volume, "5 Mm3"), "");
     // What is no unit at all has the words of the field.
     for (const char* text : {"12 5", "12 -5", "12 m 5", "12 m.5", "12 m @ 5", "12 m from 1", "12 (m)", " 12 m", "12,5 m",
                              "12 abcdef", "12e", "12e m", "1.e5 m", "m", "ft 12", "", "12 ", "1.", "1_m", "0x10", "12 m5x"})

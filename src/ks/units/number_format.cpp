@@ -5,6 +5,7 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstdint>
 #include <optional>
 
 namespace {
@@ -76,9 +77,14 @@ double KsFifteenDigits(double value)
     }();
     if (value == 0 || !std::isfinite(value))
         return value;
-    const int power = 14 - int(std::floor(std::log10(std::fabs(value))));
+    constexpr double MostDigits = 1e15, Log2 = 0.30102999566398120; // decimal
+    int exponent = 0;
+    std::frexp(value, &exponent); // 2^(exponent - 1) is not more than the number
+    int power = 14 - int(std::floor((exponent - 1) * Log2));
+    if (power >= 1 && power <= LargestPower && std::fabs(value) * powers[std::size_t(power)] >= MostDigits)
+        --power;
     if (power < 0 || power > LargestPower)
         return value;
     const double scale = powers[std::size_t(power)];
-    return std::round(value * scale) / scale;
+    return double(std::int64_t(value * scale + std::copysign(0.5, value))) / scale;
 }

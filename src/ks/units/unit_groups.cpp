@@ -115,29 +115,61 @@ std::array<double, Groups.size()> Factors()
 
 /// What water people write and the definitions do not know, or know as something else.
 constexpr std::pair<const char*, const char*> Spellings[] = {
-    {"cfs", "ft3/s"},       {"cms", "m3/s"}, {"gpm", "gallon/min"}, {"mgd", "1e6 gallon/day"},
-    {"mph", "mi/h"},        {"fps", "ft/s"}, {"kph", "km/h"},       {"ac-ft", "acre_foot"},
+    {"cfs", "ft3/s"},       {"cms", "m3/s"}, {"gpm", "231 in3/min"},  {"mgd", "231e6 in3/day"},  {"gal", "231 in3"}, {"gallon", "231 in3"},
+    {"mph", "mi/h"},        {"fps", "ft/s"}, {"kph", "km/h"},         {"ac-ft", "acre_foot"},    {"deg", "degree"},
     {"\xE2\x80\xB0", "0.001"}, // per mille
+    {"nmi", "nautical_mile"},
 };
+
+constexpr const char* AngleUnits[] = {"\xC2\xB0", "deg", "degree", "degrees", "rad", "radian", "radians"};
+
+/// A word of a unit, and the exponent behind it.
+constexpr auto Word = "[\\p{L}%‰°µ_][\\p{L}_]*(?:-ft)?";
+constexpr auto Exponent = "(?:\\^?-?[1-9]|⁻?[¹²³])?";
 
 /// Units multiplied and divided, without numbers and blanks between them: the definitions would take "12 5" for 60 and
 /// "12 m 3 cm" for an area.
 bool IsUnitText(const CString& text)
 {
-    static const QRegularExpression form(
-        QStringLiteral("^(1?/)?U([/*·]U)*$")
-            .replace(u'U', QStringLiteral("[\\p{L}%‰°µ_][\\p{L}_]*(-ft|\\^?-?[1-9]|⁻?[¹²³])?")));
+    static const QRegularExpression form(QStringLiteral("^(1?/)?U([/*·]U)*$")
+                                             .replace(u'U', CString::fromUtf8(Word) + CString::fromUtf8(Exponent)));
     return form.match(text).hasMatch();
 }
 
-UnitPtr Parsed(CString unit)
+/// The definitions put prefixes before every unit: "nmi" are thousand millionths of a mile to them, "Mm3" are a million
+/// million million cubic metres. Nobody means these.
+bool HasOddPrefix(const CString& word)
 {
-    for (const auto& [written, spelling] : Spellings)
-        if (unit == QLatin1String(written) || unit == CString::fromUtf8(written))
-            unit = CString::fromUtf8(spelling);
-    if (unit.startsWith(u'/'))
-        unit.prepend(u'1');
-    return Parse(unit.toUtf8().constData());
+    static const QRegularExpression odd(
+        QStringLiteral("^([YZEPTGMkhdcmunpfazyµ]|da)(mi|mile|in|inch|ft|foot|feet|yd|yard|acre|gallon|min|knot)s?$|^Mm$"));
+    return word != QStringLiteral("min") && odd.match(word).hasMatch();
+}
+
+/// Null for what is no unit.
+UnitPtr Parsed(const CString& unit)
+{
+    static const QRegularExpression words(CString::fromUtf8(Word));
+    CString spelt;
+    qsizetype end = 0;
+    for (auto match = words.globalMatch(unit); match.hasNext();) {
+        const auto word = match.next();
+        CString text = word.captured();
+        for (const auto& [written, spelling] : Spellings)
+            if (text == CString::fromUtf8(written))
+                text = u'(' + CString::fromUtf8(spelling) + u')';
+        if (HasOddPrefix(text))
+            return {nullptr, ut_free};
+        spelt += unit.mid(end, word.capturedStart() - end) + text;
+        end = word.capturedEnd();
+    }
+    spelt += unit.mid(end);
+    return Parse((spelt.startsWith(u'/') ? u'1' + spelt : spelt).toUtf8().constData());
+}
+
+/// In capitals throughout, "FT" or "M3/S", it is read as if it were not, unless it is a unit.
+CString InItsCase(const CString& unit)
+{
+    return unit == unit.toUpper() && !Parsed(unit) ? unit.toLower() : unit;
 }
 
 /// The definitions multiply out of powers of ten, which leaves something in the last places: 0.0010000000000000002
@@ -161,8 +193,10 @@ const KsUnitGroupRow* KsFindUnitGroup(UnitGroup group)
 
 double KsUnitFactor(UnitGroup group, KsUnitSystem system)
 {
+    if (system == KsUnitSystem::Metric)
+        return 1;
     const KsUnitGroupRow* row = KsFindUnitGroup(group);
-    if (system == KsUnitSystem::Metric || !row || IsSame(row->base, row->usCustomary))
+    if (!row || IsSame(row->base, row->usCustomary))
         return 1;
     static const auto factors = Factors(); // reading the unit definitions takes time that metric users need not spend
     return factors[std::size_t(row - Groups.data())];
@@ -176,19 +210,19 @@ std::optional<long double> KsTypedUnitFactor(UnitGroup group, const CString& uni
     for (const KsUnit& own : {row->base, row->usCustomary})
         if (unit == CString::fromUtf8(own.symbol))
             return AsDecimal(own.spelling == row->base.spelling ? 1 : FactorToBase(*row));
-    // An angle is a ratio to the definitions, but a slope of 5 degrees is none of 0.087.
-    const bool isRatio = row->base.spelling == Number.spelling;
-    if (isRatio && unit != u'%' && unit != u'‰')
+    // An angle is a ratio to the definitions, but a slope of 5 degrees is none of 0.087, and no latitude is given in %.
+    const auto is = [&unit](const char* written) { return unit == CString::fromUtf8(written); };
+    if (row->base.spelling == Number.spelling && unit != u'%' && unit != u'‰')
+        return std::nullopt;
+    if (row->base.spelling == Degree.spelling && std::ranges::none_of(AngleUnits, is))
         return std::nullopt;
     const UnitPtr base = Parse(row->base.spelling);
-    auto factor = FactorBetween(Parsed(unit), base);
-    if (!factor)
-        factor = FactorBetween(Parsed(unit.toLower()), base);
+    const auto factor = FactorBetween(Parsed(InItsCase(unit)), base);
     return factor && *factor > 0 ? std::optional(AsDecimal(*factor)) : std::nullopt;
 }
 
 bool KsIsUnit(const CString& unit)
 {
     // "12e" is a number that somebody has not finished, rather than twelve electrons.
-    return unit.toLower() != u'e' && IsUnitText(unit) && (Parsed(unit) || Parsed(unit.toLower()));
+    return unit.toLower() != u'e' && IsUnitText(unit) && Parsed(InItsCase(unit));
 }
