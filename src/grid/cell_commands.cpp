@@ -9,6 +9,7 @@
 #include "ks/fc/message_box.h"
 
 #include <algorithm>
+#include <span>
 
 namespace {
 
@@ -25,11 +26,6 @@ constexpr MenuText MenuTexts[] = {
     {GridAction::Interpolate, QT_TRANSLATE_NOOP("GridTexts", "Inter&polate...")},
     {GridAction::Calculate, QT_TRANSLATE_NOOP("GridTexts", "Calc&ulate...")},
 };
-
-const GridKey& KeyOf(GridAction action)
-{
-    return *std::ranges::find(GridKeys(), action, &GridKey::action);
-}
 
 CellBlock BlockOf(const CGenGrid& grid)
 {
@@ -66,17 +62,19 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
         model.StoredRows() == 0)
         return false;
     const CellBlock block = BlockOf(grid);
-    const auto hasNumbers = [&] {
-        return std::any_of(model.Columns().begin() + block.left, model.Columns().begin() + block.right + 1,
-                           [](const ColumnSpec& column) { return column.IsRightAligned(); });
+    const auto has = [&](const auto& isMeant) {
+        return std::ranges::any_of(std::span(model.Columns()).subspan(std::size_t(block.left), std::size_t(block.right - block.left + 1)),
+                                   isMeant);
     };
+    const auto hasNumbers = [&] { return has(&ColumnSpec::IsNumeric); };
     switch (action) {
     case GridAction::FillDown:
-        return block.bottom > 0;
+        return block.top < block.bottom || block.top > model.FixedRows(); // no line stands above the first one
     case GridAction::FillSeries:
         return block.bottom > block.top && hasNumbers();
     case GridAction::Interpolate:
-        return grid.Host() && grid.Host()->CanSearch(grid) && block.right > 1 && block.bottom > block.top && hasNumbers();
+        return grid.Host() && grid.Host()->CanSearch(grid) && block.right > 1 && block.bottom > block.top &&
+               has([](const ColumnSpec& column) { return column.Kind() == CellKind::Number; });
     default:
         return hasNumbers();
     }
@@ -88,19 +86,17 @@ void RunOnCells(CGenGrid& grid, GridAction action)
     const CGridModel& model = *grid.Model();
     const CellBlock block = BlockOf(grid);
     if (action == GridAction::FillDown)
-        return Make(grid, FillDown(model, block), KeyOf(action).Text());
+        return Make(grid, FillDown(model, block), TextOf(action));
     if (auto results = AskForCells(action, model, block, grid))
-        Make(grid, std::move(*results), KeyOf(action).Text());
+        Make(grid, std::move(*results), TextOf(action));
 }
 
 std::vector<CKsMenuCommand> CCellCommands::MenuCommands()
 {
     std::vector<CKsMenuCommand> commands;
-    for (const MenuText& entry : MenuTexts) {
-        const GridKey& key = KeyOf(entry.action);
-        commands.push_back({FirstCommand + int(commands.size()), GridTexts::tr(entry.text),
-                            QKeySequence(QKeyCombination(key.held, key.key)), key.Text()});
-    }
+    for (const MenuText& entry : MenuTexts)
+        commands.push_back({FirstCommand + int(commands.size()), GridTexts::tr(entry.text), KeyOf(entry.action),
+                            TextOf(entry.action)});
     return commands;
 }
 

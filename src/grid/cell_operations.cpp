@@ -1,6 +1,7 @@
 #include "grid/cell_operations.h"
 
 #include "base/not_given.h"
+#include "grid/cell_text.h"
 #include "grid/grid_texts.h"
 #include "ks/fc/branch_name.h"
 #include "ks/units/formula.h"
@@ -14,18 +15,13 @@
 
 namespace {
 
-bool HasNumbers(const ColumnSpec& column)
-{
-    return column.Kind() == CellKind::Number || column.Kind() == CellKind::Integer;
-}
-
 /// In the unit shown; nothing for an empty cell and for what is no number.
 std::optional<double> ShownNumber(const ColumnSpec& column, const CellValue& value)
 {
     if (const auto* integer = std::get_if<std::int32_t>(&value))
         return *integer;
     const auto* number = std::get_if<double>(&value);
-    if (!number || *number == NotGiven || std::isnan(*number))
+    if (!number || IsEmptyCell(column, value) || std::isnan(*number))
         return std::nullopt;
     return column.style.UnitConvertFromBase(*number, 1);
 }
@@ -61,12 +57,14 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block)
 
 double StepOf(const CTableRows& rows, const CellBlock& block)
 {
-    const auto isNumber = [&](int column) { return HasNumbers(rows.Column(column)); };
+    const auto isNumber = [&](int column) { return rows.Column(column).IsNumeric(); };
     for (int column = block.left; column <= block.right && block.bottom > block.top; ++column) {
         if (!isNumber(column))
             continue;
         const auto first = ShownNumber(rows, block.top, column), second = ShownNumber(rows, block.top + 1, column);
-        return first && second ? *second - *first : 0;
+        if (!first || !second)
+            return 0;
+        return KsFifteenDigits(*second - *first, std::max(std::fabs(*first), std::fabs(*second)));
     }
     return 0;
 }
@@ -76,7 +74,7 @@ CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double s
     CCellResults results(rows);
     std::optional<double> first;
     ForCells(rows, block, [&](int row, int column) {
-        if (!HasNumbers(rows.Column(column)))
+        if (!rows.Column(column).IsNumeric())
             return;
         if (row == block.top) {
             first = ShownNumber(rows, row, column);
@@ -98,7 +96,8 @@ constexpr int BranchColumn = 0, ChainageColumn = 1;
 struct LineOfBranch
 {
     double chainage;
-    int row;
+    std::size_t line; // of the source: what is known of a line that is hidden is known
+    int row;          // where it is shown
     bool isInBlock;
 };
 using Branches = std::vector<std::vector<LineOfBranch>>;
@@ -110,8 +109,11 @@ Branches LinesByBranch(const CTableRows& rows, const CellBlock& block, CCellResu
     Branches branches;
     std::string last;
     std::size_t place = 0;
-    for (int row = rows.FixedRows(); row < rows.StoredRows(); ++row) {
-        const CellValue name = rows.Value(row, BranchColumn), chainage = rows.Value(row, ChainageColumn);
+    IRowSource& source = *rows.Rows();
+    const CellAccess &names = *rows.Column(BranchColumn).access, &chainages = *rows.Column(ChainageColumn).access;
+    for (std::size_t line = source.FixedRows(); line < source.Count(); ++line) {
+        const int row = rows.ShownRow(line);
+        const CellValue name = names.get(source.At(line)), chainage = chainages.get(source.At(line));
         const auto& branch = std::get<std::string>(name);
         const auto* number = std::get_if<double>(&chainage);
         const bool isInBlock = row >= block.top && row <= block.bottom;
@@ -125,7 +127,7 @@ Branches LinesByBranch(const CTableRows& rows, const CellBlock& block, CCellResu
             branches.resize(std::max(branches.size(), place + 1));
             last = branch;
         }
-        branches[place].push_back({*number, row, isInBlock});
+        branches[place].push_back({*number, line, row, isInBlock});
     }
     for (auto& lines : branches)
         if (!std::ranges::is_sorted(lines, {}, &LineOfBranch::chainage))
@@ -158,13 +160,17 @@ std::optional<double> OnLine(const std::vector<Known>& known, double chainage, b
 /// The first of the lines that is in the block, or is not, and has a value.
 std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, int column, bool isInBlock)
 {
-    for (const LineOfBranch& line : lines)
-        if (const auto value = line.isInBlock == isInBlock ? ShownNumber(rows, line.row, column) : std::nullopt)
+    const ColumnSpec& spec = rows.Column(column);
+    for (const LineOfBranch& line : lines) {
+        if (line.isInBlock != isInBlock)
+            continue;
+        if (const auto value = ShownNumber(spec, spec.access->get(rows.Rows()->At(line.line))))
             return Known{line.chainage, *value};
+    }
     return std::nullopt;
 }
 
-/// Of two values at one place the first one counts.
+/// Of two values at one place the first one counts, or at the end of the block the last.
 std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column, KnownValues which)
 {
     std::vector<Known> known;
@@ -221,7 +227,7 @@ FormulaNames NamesForFormula(const CTableRows& rows)
         result.columns.push_back(column);
     };
     for (int column = 0; column < int(rows.Columns().size()); ++column) {
-        if (!HasNumbers(rows.Column(column)))
+        if (!rows.Column(column).IsNumeric())
             continue;
         const QString title = rows.Column(column).header().section(u'[', 0, 0);
         QString name = title.split(separator, Qt::SkipEmptyParts).join(u'_');
@@ -229,6 +235,7 @@ FormulaNames NamesForFormula(const CTableRows& rows)
             name.prepend(u'_');
         add(name, column);
         add(name.toLower(), column);
+        add(QString::fromUtf8(rows.Column(column).name), column); // in every language
     }
     return result;
 }
@@ -243,7 +250,7 @@ CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKs
     CCellResults results(rows);
     std::vector<double> numbers(names.columns.size());
     ForCells(rows, block, [&](int row, int column) {
-        if (!HasNumbers(rows.Column(column)))
+        if (!rows.Column(column).IsNumeric())
             return;
         const CellValue before = rows.Value(row, column);
         for (const std::size_t name : used) {

@@ -19,7 +19,7 @@ double StepOf(const CTableRows& rows, const CellBlock& block);
 enum class KnownValues
 {
     Ends,      // of each branch the first and the last line of the block, by their chainages
-    Neighbours // of each branch all lines that are not in the block
+    Neighbours // of each branch all lines that are not in the block, also those that are not shown
 };
 /// Numbers on straight lines between known ones of the same branch, in proportion to the chainage. The first two
 /// columns are branch name and chainage. What lies beyond the known ones stays, or goes on along the line of the two

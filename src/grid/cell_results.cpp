@@ -43,7 +43,7 @@ void CCellResults::AddShown(int row, int column, const CellValue& before, double
     if (!std::isfinite(after))
         Keep(row, column, GridTexts::tr("The result is no number."));
     else if (spec.Kind() == CellKind::Number)
-        Add(row, column, before, spec.style.UnitConvertFromBase(KsFifteenDigits(after), 0));
+        Add(row, column, before, KsFifteenDigits(spec.style.UnitConvertFromBase(after, 0)));
     else if (after != std::floor(after) || after < Limits::min() || after > Limits::max())
         Keep(row, column, GridTexts::tr("The result is no integer."));
     else

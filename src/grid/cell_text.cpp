@@ -11,14 +11,6 @@
 
 namespace {
 
-bool IsEmpty(const ColumnSpec& column, const CellValue& value)
-{
-    if (std::holds_alternative<std::monostate>(value))
-        return true;
-    const auto* number = std::get_if<double>(&value);
-    return number && column.emptyIsNotGiven && *number == NotGiven;
-}
-
 CellReading Refused(const QString& complaint, const QString& otherwise)
 {
     return {{}, complaint.isEmpty() ? otherwise : complaint};
@@ -26,12 +18,22 @@ CellReading Refused(const QString& complaint, const QString& otherwise)
 
 } // namespace
 
+bool IsEmptyCell(const ColumnSpec& column, const CellValue& value)
+{
+    if (std::holds_alternative<std::monostate>(value))
+        return true;
+    if (const auto* number = std::get_if<double>(&value))
+        return column.emptyIsNotGiven && (*number == NotGiven || std::isnan(*number));
+    const auto* text = std::get_if<std::string>(&value);
+    return text && text->empty();
+}
+
 QString ShownText(const ColumnSpec& column, const CellValue& value)
 {
     if (column.ActsAtOnce())
         return {}; // a picture
     const auto* number = std::get_if<double>(&value);
-    if (!number || IsEmpty(column, value))
+    if (!number || IsEmptyCell(column, value))
         return EditText(column, value);
     // Decimals are those of the number itself; cut to significant digits first, it would end in zeros that it has not.
     const int decimals = column.control.decimals;
@@ -45,7 +47,7 @@ QString ShownText(const ColumnSpec& column, const CellValue& value)
 bool HidesDigits(const ColumnSpec& column, const CellValue& value, const QString& shown)
 {
     const auto* number = std::get_if<double>(&value);
-    return number && !IsEmpty(column, value) && column.style.HidesDigits(*number, shown);
+    return number && !IsEmptyCell(column, value) && column.style.HidesDigits(*number, shown);
 }
 
 QString FullText(const ColumnSpec& column, const CellValue& value)
@@ -58,14 +60,14 @@ QString CellToolTip(const ColumnSpec& column, const CellValue& value)
     if (column.Kind() == CellKind::Text)
         return ShownText(column, value); // may be longer than its cell, a path in particular
     const auto* number = std::get_if<double>(&value);
-    if (!number || IsEmpty(column, value))
+    if (!number || IsEmptyCell(column, value))
         return column.ToolTip(false);
     return NumberToolTip(column.style, *number, ShownText(column, value), column.UnitSymbol());
 }
 
 QString EditText(const ColumnSpec& column, const CellValue& value)
 {
-    if (IsEmpty(column, value))
+    if (IsEmptyCell(column, value))
         return {};
     if (const auto* number = std::get_if<double>(&value))
         return column.style.FullText(*number);

@@ -3,6 +3,8 @@
 
 #include "grid/column_spec.h"
 
+/// Nothing, the mark of a number that is not given where the column shows that as empty, or a text without letters.
+bool IsEmptyCell(const ColumnSpec& column, const CellValue& value);
 /// The text of a cell that is not being edited.
 QString ShownText(const ColumnSpec& column, const CellValue& value);
 /// Whether `shown`, the text of a cell, leaves out digits of its number.

@@ -8,6 +8,7 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <string_view>
 #include <variant>
 
 /// What a cell holds, in base units. Nothing stands for an empty cell.
@@ -116,6 +117,7 @@ struct ColumnSpec
     std::int32_t* globalIndex = nullptr;
 
     // What follows from the field.
+    std::string_view name = {}; // of the field in the file
     GridControl control = Control::Number;
     CKsEditStyle style = {}; // unit group and format
     Bounds bounds = {};      // of a number
@@ -124,7 +126,7 @@ struct ColumnSpec
     std::shared_ptr<const CellAccess> access = {};
 
     CellKind Kind() const { return control.kind; }
-    bool IsRightAligned() const { return Kind() == CellKind::Number || Kind() == CellKind::Integer; }
+    bool IsNumeric() const { return Kind() == CellKind::Number || Kind() == CellKind::Integer; }
     /// The cells have no editor: a click or the space bar acts at once.
     bool ActsAtOnce() const { return Kind() == CellKind::Flag || Kind() == CellKind::Button; }
     bool IsLocked(const void* row) const { return locked && locked(row); }

@@ -60,6 +60,7 @@ FieldColumns& FieldColumns::Add(const Field& field, CellAccess access, ColumnSpe
             return named == UnitGroup::None ? text(title) : WithUnit(text(title), named);
         };
     }
+    column.name = field.name;
     column.style = CKsEditStyle(field.unit);
     if (field.digits)
         column.style.SetFormat(QStringLiteral("%.%1lg").arg(field.digits));

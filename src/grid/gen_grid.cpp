@@ -58,6 +58,14 @@ CGenGrid::CGenGrid(QWidget* parent)
     for (QWidget* part : {verticalHeader()->viewport(), horizontalHeader()->viewport(), corner})
         part->installEventFilter(this);
     connect(m_model, &CGridModel::CellModified, this, [this] { m_modified = true; });
+    // The numbers of a filter are in the unit shown.
+    connect(
+        &KsUnits::Instance(), &KsUnits::Changed, this,
+        [this] {
+            if (m_model->Shown().IsFiltered())
+                ChangeView([](CGridModel& model) { model.Filter(QStringList(model.Filters())); });
+        },
+        Qt::QueuedConnection); // what was typed in the other unit has been stored
     connect(m_model, &CGridModel::modelReset, this, [this] { // other rows, none of which is current
         m_modified = m_lineGone = false;
         m_currentLine.reset();
@@ -185,6 +193,15 @@ void CGenGrid::ShowLine(int number, int column)
     SetCurrentCell(isThere ? m_model->ShownRow(std::size_t(line)) + 1 : RowCount(), column);
 }
 
+void CGenGrid::ShowPlace(int number, int column)
+{
+    for (int line = std::max(number, 1) - 1; line >= 0; --line)
+        if (const int row = m_model->ShownRow(std::size_t(line)); row >= 0)
+            return SetCurrentCell(row + 1, column);
+    if (RowCount() > 0)
+        SetCurrentCell(1, column);
+}
+
 void CGenGrid::Reload()
 {
     Refresh();
@@ -199,7 +216,7 @@ void CGenGrid::paintEvent(QPaintEvent* event)
     if (RowCount() > 0 || !(MayGrow() || isFiltered) || !isEnabled())
         return;
     QPainter painter(viewport());
-    painter.setPen(palette().color(QPalette::PlaceholderText));
+    painter.setPen(palette().color(QPalette::Text));
     painter.drawText(viewport()->rect().adjusted(4, 4, -4, -4), Qt::AlignTop | Qt::AlignHCenter | Qt::TextWordWrap,
                      isFiltered ? GridTexts::tr("No line passes the filter.")
                                 : GridTexts::tr("No lines. Insert adds one."));

@@ -39,6 +39,8 @@ public:
     void GotoLine(int row) { SetCurrentCell(row, columnAt(0) + 1); }
     /// The same for a line by its number in the file. One that the filter hides is shown, and the user is told.
     void ShowLine(int number, int column);
+    /// Shows where a line was that is gone: no other one comes into sight for it.
+    void ShowPlace(int number, int column);
     void ShowLine(int number) { ShowLine(number, columnAt(0) + 1); }
     /// The number of the current line in the file; 0 without one.
     int CurrentLine() const { return CurrentRow() > 0 ? m_model->LineNumber(CurrentRow() - 1) : 0; }

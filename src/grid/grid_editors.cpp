@@ -182,7 +182,7 @@ void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cel
         text = cell.fontMetrics.elidedText(text, cell.textElideMode, inside.width());
         width = cell.fontMetrics.horizontalAdvance(text);
     }
-    const bool isRight = m_grid->Model()->Column(index.column()).IsRightAligned();
+    const bool isRight = m_grid->Model()->Column(index.column()).IsNumeric();
     const int x = isRight ? inside.right() + 1 - width : inside.left();
     const int y = inside.top() + (inside.height() - cell.fontMetrics.height() + 1) / 2 + cell.fontMetrics.ascent();
     const bool enabled = cell.state.testFlag(QStyle::State_Enabled);

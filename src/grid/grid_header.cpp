@@ -29,7 +29,7 @@ QIcon DownIcon(const QPalette& colours)
     QPainter painter(&picture);
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(Qt::NoPen);
-    painter.setBrush(colours.color(QPalette::PlaceholderText));
+    painter.setBrush(colours.color(QPalette::Text));
     painter.drawPolygon(QPolygonF({{3, 6}, {13, 6}, {8, 11}}));
     painter.end();
     return picture;
@@ -168,6 +168,11 @@ void CGridHeader::MakeFields()
         auto* field = new CFilterField(this);
         field->setObjectName(QStringLiteral("filter%1").arg(column + 1));
         field->installEventFilter(this);
+        QPalette colours = palette(); // a theme may have one for hints that nobody sees
+        QColor hint = colours.color(QPalette::Text);
+        hint.setAlphaF(0.6F);
+        colours.setColor(QPalette::PlaceholderText, hint);
+        field->setPalette(colours);
         connect(field, &QLineEdit::textChanged, this, &CGridHeader::Typed);
         if (OffersTexts(m_grid.Model()->Column(column))) {
             auto* offer = field->addAction(DownIcon(palette()), QLineEdit::TrailingPosition);

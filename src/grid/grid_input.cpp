@@ -107,10 +107,7 @@ void CGridInput::ShowMenu(const QPoint& at)
 {
     QMenu menu(&m_grid);
     const auto add = [&](GridAction action, bool enabled) {
-        const GridKey& key = *std::ranges::find(GridKeys(), action, &GridKey::action);
-        menu.addAction(key.Text(), QKeySequence(QKeyCombination(key.held, key.key)), this,
-                       [this, action] { Run(action); })
-            ->setEnabled(enabled);
+        menu.addAction(TextOf(action), KeyOf(action), this, [this, action] { Run(action); })->setEnabled(enabled);
     };
     const bool changes = m_grid.Model()->Document() && !m_grid.Model()->Document()->IsReadOnly();
     add(GridAction::AppendLine, changes && m_grid.Model()->Rows());

@@ -75,7 +75,7 @@ static_assert(std::size(Descriptions) == std::size_t(GridAction::None));
 
 } // namespace
 
-QString GridKey::Text() const
+QString TextOf(GridAction action)
 {
     return GridTexts::tr(Descriptions[std::size_t(action)]);
 }
@@ -83,6 +83,12 @@ QString GridKey::Text() const
 std::span<const GridKey> GridKeys()
 {
     return Keys;
+}
+
+QKeySequence KeyOf(GridAction action)
+{
+    const auto* row = std::ranges::find(Keys, action, &GridKey::action);
+    return row == std::end(Keys) ? QKeySequence() : QKeySequence(QKeyCombination(row->held, row->key));
 }
 
 const GridKey* FindGridKey(const QKeyEvent& event)

@@ -1,6 +1,7 @@
 // The keys of the grid: one row a key.
 #pragma once
 
+#include <QKeySequence>
 #include <QString>
 #include <span>
 
@@ -34,6 +35,9 @@ enum class GridAction
     None // of no key
 };
 
+/// What it does, in the user's language.
+QString TextOf(GridAction action);
+
 struct GridKey
 {
     Qt::Key key;
@@ -42,10 +46,11 @@ struct GridKey
     GridAction action;
     bool whileEditing; // also when a cell editor has the focus
 
-    /// What it does, in the user's language.
-    QString Text() const;
+    QString Text() const { return TextOf(action); }
 };
 
 std::span<const GridKey> GridKeys();
+/// The first key of an action; none for one without.
+QKeySequence KeyOf(GridAction action);
 /// The row of the key; null when the grid leaves it to the table widget.
 const GridKey* FindGridKey(const QKeyEvent& event);

@@ -48,6 +48,7 @@ void CGridModel::SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows)
     m_shown.Clear();
     m_sortedBy.clear();
     m_filters.clear();
+    m_contents = document.Contents();
     m_rowCount = ShownRows();
     endResetModel();
     emit ViewChanged();
@@ -60,6 +61,11 @@ void CGridModel::Sync()
     const QScopedValueRollback syncing(m_syncing, true);
     m_offered.reset(); // what fills a new line may have changed
     PruneOverlay();
+    // Other content: places say nothing of which line is which.
+    if (std::exchange(m_contents, m_document->Contents()) != m_document->Contents() && !m_rows->KeysLast()) {
+        ApplySort();
+        ApplyFilters();
+    }
     FollowSource();
     // Views keep their current cell, selection and scroll position by row number, so only the length matters to them.
     const int count = ShownRows();
@@ -97,7 +103,7 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
     case Qt::AccessibleTextRole:
         return EditText(column, value());
     case Qt::TextAlignmentRole:
-        return int(Qt::AlignVCenter | (column.IsRightAligned() ? Qt::AlignRight : Qt::AlignLeft));
+        return int(Qt::AlignVCenter | (column.IsNumeric() ? Qt::AlignRight : Qt::AlignLeft));
     case Qt::CheckStateRole:
         if (column.Kind() != CellKind::Flag)
             return {};

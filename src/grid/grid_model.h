@@ -83,4 +83,5 @@ private:
     CKsDoc* m_document = nullptr;
     int m_rowCount = 0; // as the views know it
     bool m_syncing = false;
+    int m_contents = 0; // which content of the document is shown
 };

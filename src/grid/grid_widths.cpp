@@ -4,6 +4,7 @@
 
 #include <QHeaderView>
 #include <QMouseEvent>
+#include <QStyle>
 #include <algorithm>
 #include <limits>
 
@@ -107,6 +108,20 @@ void CGridWidths::Update()
         m_grid.setColumnWidth(column, WidthOfTexts(column, RowsAtStart, width));
     }
     m_columnsSet = m_grid.ColumnCount();
+    MakeRoomForMarks();
+}
+
+/// The mark of a sorted column stands beside the header's text.
+void CGridWidths::MakeRoomForMarks()
+{
+    const int mark = m_grid.style()->pixelMetric(QStyle::PM_HeaderMarkSize) + Margin;
+    for (const SortKey& key : m_grid.Model()->SortedBy()) {
+        const ColumnSpec& column = m_grid.Model()->Column(key.column);
+        const int text = std::max(m_grid.fontMetrics().horizontalAdvance(column.header()),
+                                  m_grid.fontMetrics().horizontalAdvance(column.UnitLine()));
+        if (m_grid.columnWidth(key.column) < text + 2 * mark)
+            m_grid.setColumnWidth(key.column, text + 2 * mark);
+    }
 }
 
 void CGridWidths::Reset()

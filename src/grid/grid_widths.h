@@ -19,6 +19,7 @@ public:
     void Reset();
     /// Makes columns wider that their texts do not fit into; what the user has made wider stays.
     void MakeRoom();
+    void MakeRoomForMarks();
 
 private:
     /// Of the grid's font.

@@ -31,13 +31,6 @@ constexpr Entry Entries[] = {
     {Command::ShowAfresh, QT_TRANSLATE_NOOP("GridTexts", "Sort and Filter Afres&h"), GridAction::ShowAfresh},
 };
 
-QKeySequence KeyOf(GridAction action)
-{
-    const auto keys = GridKeys();
-    const auto key = std::ranges::find(keys, action, &GridKey::action);
-    return key == keys.end() ? QKeySequence() : QKeySequence(QKeyCombination(key->held, key->key));
-}
-
 /// What was sorted by before decides where the new column has the same values.
 std::vector<SortKey> KeysWith(const CGenGrid& grid, SortKey key)
 {

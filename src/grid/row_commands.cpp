@@ -50,7 +50,9 @@ struct Lines
     ChangePlace Hold(std::unique_ptr<IRowBlock> taken)
     {
         block = std::move(taken);
-        return PlaceOf(*rows, row);
+        ChangePlace place = PlaceOf(*rows, row);
+        place.isGone = true;
+        return place;
     }
 };
 struct Insertion : Lines

@@ -1,6 +1,5 @@
 #include "grid/row_filter.h"
 
-#include "base/not_given.h"
 #include "files/read_number.h"
 #include "grid/cell_text.h"
 #include "grid/grid_texts.h"
@@ -22,21 +21,6 @@ struct Range
     double from = -Infinite, to = Infinite;
     bool open = false, inverted = false;
 };
-
-bool IsNumeric(const ColumnSpec& column)
-{
-    return column.Kind() == CellKind::Number || column.Kind() == CellKind::Integer;
-}
-
-bool IsEmptyCell(const ColumnSpec& column, const CellValue& value)
-{
-    if (std::holds_alternative<std::monostate>(value))
-        return true;
-    if (const auto* number = std::get_if<double>(&value))
-        return std::isnan(*number) || (column.emptyIsNotGiven && *number == NotGiven);
-    const auto* text = std::get_if<std::string>(&value);
-    return text && text->empty();
-}
 
 std::optional<double> Number(const QString& text)
 {
@@ -115,7 +99,7 @@ CCellFilter::CCellFilter(const ColumnSpec& column, const QString& typed)
     else if (text == QStringLiteral("!=\"\""))
         m_passes = EmptyCells(column, false);
     else
-        m_passes = IsNumeric(column) ? NumberCondition(column, text) : TextCondition(column, text);
+        m_passes = column.IsNumeric() ? NumberCondition(column, text) : TextCondition(column, text);
 }
 
 CCellFilter::Condition CCellFilter::EmptyCells(const ColumnSpec& column, bool wanted)

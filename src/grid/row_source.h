@@ -69,6 +69,8 @@ public:
     /// Where rows stand in an order of their own: for each place the row that belongs there; empty when all do.
     virtual std::vector<std::size_t> Order() const { return {}; }
     virtual void Rearrange(const std::vector<std::size_t>& /*order*/) {}
+    /// How often that was done, where keys do not tell it.
+    virtual std::size_t Rearranged() const { return 0; }
     /// Where a row stands is part of what it says: the rows are always shown as they stand, and all of them.
     virtual bool IsSequence() const { return false; }
 

@@ -1,6 +1,6 @@
 #include "grid/selection_summary.h"
 
-#include "base/not_given.h"
+#include "grid/cell_text.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_host.h"
 #include "grid/grid_texts.h"
@@ -19,11 +19,11 @@ struct Numbers
     qsizetype count = 0;
     double sum = 0, least = std::numeric_limits<double>::infinity(), most = -least;
 
-    void Add(const CellValue& value)
+    void Add(const ColumnSpec& column, const CellValue& value)
     {
         const auto* integer = std::get_if<std::int32_t>(&value);
         const auto* number = std::get_if<double>(&value);
-        if (!integer && (!number || std::isnan(*number) || *number == NotGiven))
+        if (!integer && (!number || std::isnan(*number) || IsEmptyCell(column, value)))
             return;
         const double given = integer ? *integer : *number;
         ++count;
@@ -67,13 +67,13 @@ QString CSelectionSummary::Found() const
     Numbers numbers;
     for (int c = block->left(); c <= block->right() && cells <= MostCells; ++c) {
         const ColumnSpec& each = model.Column(c);
-        if (!each.IsRightAligned())
+        if (!each.IsNumeric())
             continue;
         if (column && column->UnitSymbol() != each.UnitSymbol())
             return count;
         column = &each;
         for (int row = block->top(); row <= std::min(block->bottom(), model.StoredRows() - 1); ++row)
-            numbers.Add(model.Value(row, c));
+            numbers.Add(each, model.Value(row, c));
     }
     if (numbers.count == 0)
         return count;

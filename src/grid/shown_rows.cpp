@@ -16,6 +16,7 @@ void CShownRows::Look(IRowSource& rows)
     m_keys.resize(rows.Count());
     for (std::size_t row = 0; row < m_keys.size(); ++row)
         m_keys[row] = rows.KeyAt(row);
+    m_rearranged = rows.Rearranged();
 }
 
 void CShownRows::Derive()
@@ -88,7 +89,7 @@ bool CShownRows::Follow(IRowSource& rows, std::optional<std::size_t> changedAt)
         while (tail < common - head && m_keys[was - 1 - tail] == rows.KeyAt(is - 1 - tail))
             ++tail;
     } else if (was == is) {
-        return true;
+        return m_rearranged == rows.Rearranged();
     } else if (!changedAt) {
         return false;
     } else {

@@ -57,4 +57,5 @@ private:
     SourceRows m_rows;          // of the source, as they are shown
     SourceRows m_places;        // where the source's rows are shown, or Nowhere
     std::vector<RowKey> m_keys; // of the source's rows, as they were at the last look
+    std::size_t m_rearranged = 0; // how often they had been put in order by then
 };

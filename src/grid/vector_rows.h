@@ -79,7 +79,9 @@ public:
         for (const std::size_t row : order)
             arranged.push_back(std::move(m_rows()[row]));
         m_rows() = std::move(arranged);
+        ++m_rearranged;
     }
+    std::size_t Rearranged() const override { return m_rearranged; }
 
     const void* Data() const override { return &m_rows(); }
     bool MayBeEmpty() const override { return m_whenEmpty == WhenEmpty::Nothing; }
@@ -101,4 +103,5 @@ private:
     std::function<std::vector<T>&()> m_rows;
     VectorOwner m_owner;
     WhenEmpty m_whenEmpty;
+    std::size_t m_rearranged = 0;
 };

@@ -117,11 +117,11 @@ private:
         for (const Field& field : list.Fields()) {
             if (!field.title || !grid)
                 continue;
-            const QString title = LoadLine(field.title.text, field.title.line);
             const auto& columns = grid->Model()->Columns();
-            const auto column = std::ranges::find_if(columns, [&](const ColumnSpec& each) { return each.header() == title; });
+            const auto column = std::ranges::find(columns, field.name, &ColumnSpec::name);
             if (column == columns.end())
                 continue;
+            const QString title = column->header();
             const ChangePlace cell{&list, 1, int(column - columns.begin()) + 1, &list, 1};
             Add({tab, cell, Plain(title), {}, QString::fromUtf8(section), {}}, field.title, QString::fromUtf8(field.name),
                 field.choices);

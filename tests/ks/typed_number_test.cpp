@@ -115,7 +115,7 @@ TEST_F(TypedNumber, AFormulaIsOneNumber)
     EXPECT_EQ(Complaint(Discharge, "=width*2"), "\"width\" is no name or function known here.");
     EXPECT_EQ(Complaint(Discharge, "=(1+2"), "The brackets of \"(1+2\" do not match.");
     EXPECT_EQ(Complaint(Discharge, "=1/0"), "The result of \"1/0\" is no number.");
-    for (const char* text : {"=", "=1+", "=1 2", "=a=5", "=\"x\"", "=1+é", "=max()", "==1", "=1;2"})
+    for (const char* text : {"=", "=1+", "=1 2", "=a=5", "=pi=3", "=\"x\"", "=1+é", "=max()", "==1", "=1;2"})
         EXPECT_NE(Complaint(Discharge, text), "") << text;
     EXPECT_NE(Complaint(Discharge, ("=" + std::string(100000, '(')).c_str()), "");
     EXPECT_EQ(KsReadTypedInteger("=7-2").value, 5);

@@ -105,10 +105,13 @@ TEST_F(CellOperationsTest, InterpolationGoesAlongEachBranch)
     EXPECT_DOUBLE_EQ(levels({1, Level, 1, Level}, KnownValues::Neighbours, false, 0)[1], 10 - 10.0 / 3);
     EXPECT_EQ(levels({3, Level, 3, Level}, KnownValues::Neighbours, false, 1), (QList<double>{10, 0, 7, 20, 0}));
     EXPECT_EQ(levels({2, Level, 2, Level}, KnownValues::Neighbours, true, 1), Levels()) << "one line, nothing known";
+    grid->ChangeView([](CGridModel& model) { model.Filter({"", "!=0"}); }); // hides the first of A, which is known
+    EXPECT_DOUBLE_EQ(levels({0, Level, 0, Level}, KnownValues::Neighbours, false, 0)[1], 10 - 10.0 / 3);
+    grid->ChangeView([](CGridModel& model) { model.Filter({}); });
     init.GetAt(4).InitialH = 6;
     EXPECT_EQ(levels({3, Level, 3, Level}, KnownValues::Neighbours, true, 0), (QList<double>{10, 0, 7, 9, 6}));
     init.GetAt(4).Chainage = 400; // two at one place
-    EXPECT_EQ(levels(all, KnownValues::Ends, false, 0), (QList<double>{10, 12.5, 7, 20, 20}));
+    EXPECT_EQ(levels(all, KnownValues::Ends, false, 0), (QList<double>{10, 9, 7, 6, 6})) << "the last of them";
     init.GetAt(0).Chainage = NotGiven;
     EXPECT_EQ(levels(all, KnownValues::Ends, false, 1)[0], 10);
 }
@@ -134,6 +137,12 @@ TEST_F(CellOperationsTest, WhatCannotChangeStaysAndIsListed)
     EXPECT_EQ(FillSeries(rows, {0, Level, 0, Level}, 1).ChangedCount(), 0u);
     Make(Calculated({0, Level, 0, Level}, "value * 0 + 1"));
     EXPECT_EQ(init.GetAt(0).InitialH, 0.3048) << "one foot";
+    init.GetAt(0).InitialH = 100;
+    Make(Calculated({0, Level, 0, Level}, "value + 1"));
+    EXPECT_EQ(init.GetAt(0).InitialH, 100.3048) << "without what the conversion makes of the last places";
+    init.GetAt(0).InitialH = 8.5 * 0.3048;
+    init.GetAt(1).InitialH = 8.7 * 0.3048;
+    EXPECT_EQ(StepOf(rows, {0, Level, 1, Level}), 0.2);
 }
 
 TEST_F(CellOperationsTest, TheDialogShowsWhatWouldChangeAndKeysRunIt)

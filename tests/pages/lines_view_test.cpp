@@ -116,6 +116,43 @@ TEST_F(LinesViewTest, TheOrderShownBecomesTheFilesOrder)
     EXPECT_EQ(Stored(), before);
 }
 
+TEST_F(LinesViewTest, TheOrderIsKeptWithNoLineInSight)
+{
+    Sort(Chainage, true);
+    Filter(H, ">1000");
+    ASSERT_EQ(grid->RowCount(), 0);
+    LinesView::Run(Command::KeepOrder, *grid);
+    Filter(H, "");
+    EXPECT_EQ(init.GetAt(0).Chainage, 300);
+    Undo();
+    EXPECT_EQ(init.GetAt(1).Chainage, 100.4);
+}
+
+TEST_F(LinesViewTest, UndoBringsIntoSightOnlyWhatItChanges)
+{
+    Filter(Name, "rhine");
+    ASSERT_EQ(Lines(), "1 3 4");
+    grid->SetCurrentCell(3, Name);
+    grid->InsertLine();
+    Undo();
+    EXPECT_EQ(Lines(), "1 3 4") << "where the line was another one has come, which nobody touched";
+    init.GetAt(1).InitialH = 99;
+    grid->SetCurrentCell(2, Name);
+    grid->SelectLines(2, 2);
+    grid->DeleteSelectedLines();
+    Undo();
+    EXPECT_EQ(Lines(), "1 3 4");
+}
+
+TEST_F(LinesViewTest, AFilterIsInTheUnitShown)
+{
+    Filter(H, ">2.5");
+    ASSERT_EQ(Lines(), "1 5");
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    QTest::qWait(1);
+    EXPECT_EQ(Lines(), "1 2 3 4 5") << "the lowest is 3.3 feet";
+}
+
 TEST_F(LinesViewTest, Conditions)
 {
     struct

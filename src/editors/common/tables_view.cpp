@@ -138,9 +138,12 @@ void CTablesView::RevealChange(const ChangePlace& place)
     if ((!isPart && place.data != lines) || IsEditing() || (!IsActive() && ProjectDoc()->Views().size() > 1))
         return;
     const int column = std::max(place.column, 1);
-    m_main.grid->ShowLine(isPart ? place.listRow : place.row, isPart ? m_main.grid->CurrentColumn() : column);
+    const auto show = [](CGenGrid& grid, int row, int itsColumn, bool isGone) {
+        isGone ? grid.ShowPlace(row, itsColumn) : grid.ShowLine(row, itsColumn);
+    };
     if (isPart)
-        m_parts.grid->ShowLine(place.row, column);
+        show(*m_main.grid, place.listRow, m_main.grid->CurrentColumn(), false);
+    show(isPart ? *m_parts.grid : *m_main.grid, place.row, column, place.isGone);
     if (IsActive())
         (isPart ? m_parts : m_main).grid->setFocus(Qt::OtherFocusReason);
 }

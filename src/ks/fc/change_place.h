@@ -8,4 +8,5 @@ struct ChangePlace
     int row = 0, column = 0;    // of a list or a table
     const void* list = nullptr; // the list itself, or the one whose line `listRow` the table is part of
     int listRow = 0;
+    bool isGone = false; // what changed is no more; this is where it was
 };

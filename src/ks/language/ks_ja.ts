@@ -88,6 +88,10 @@
         <translation>式の %1 文字目を解釈できません。</translation>
     </message>
     <message>
+        <source>A formula sets nothing: two numbers are compared with &quot;==&quot;.</source>
+        <translation>式で値の代入はできません。比較には「==」を使ってください。</translation>
+    </message>
+    <message>
         <source>The formula is longer than %1 characters.</source>
         <translation>式が %1 文字を超えています。</translation>
     </message>

@@ -83,5 +83,7 @@ KS_API CString KsFormatNumber(const CString& format, double value);
 /// The nearest number of fifteen significant digits, as spreadsheets keep results: 0.3 for 0.1 + 0.2. One of a magnitude
 /// that no quantity has stays as it is.
 KS_API double KsFifteenDigits(double value);
+/// Likewise to the last of the fifteen digits of a number as large as `of`: a difference of such numbers has no more.
+KS_API double KsFifteenDigits(double value, double of);
 /// The fewest digits that read back to the same number, without exponent from 1e-5 up to 1e15.
 KS_API CString KsShortestNumber(double value);

@@ -1,6 +1,7 @@
 #include "ks/units/formula.h"
 
 #include <QCoreApplication>
+#include <QRegularExpression>
 #include <algorithm>
 #include <muParser.h>
 #include <vector>
@@ -45,6 +46,11 @@ CString FaultOf(const mu::ParserError& error, const CString& text)
 
 CKsFormula::CKsFormula(const CString& text, const QStringList& names) : m_parser(std::make_unique<Parser>())
 {
+    static const QRegularExpression assignment(QStringLiteral("(?<![=<>!])=(?!=)"));
+    if (assignment.match(text).hasMatch()) {
+        m_fault = Text(QT_TRANSLATE_NOOP("CKsFormula", "A formula sets nothing: two numbers are compared with \"==\"."));
+        return;
+    }
     if (text.size() > LongestText) {
         m_fault = Text(QT_TRANSLATE_NOOP("CKsFormula", "The formula is longer than %1 characters.")).arg(LongestText);
         return;

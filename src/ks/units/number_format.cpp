@@ -66,6 +66,11 @@ CString KsShortestNumber(double value)
 
 double KsFifteenDigits(double value)
 {
+    return KsFifteenDigits(value, value);
+}
+
+double KsFifteenDigits(double value, double of)
+{
     // Up to 10^22 powers of ten are doubles, and so is a whole number of fifteen digits: the quotient is the nearest
     // double to the decimal number.
     static constexpr int LargestPower = 22;
@@ -75,13 +80,13 @@ double KsFifteenDigits(double value)
             table[std::size_t(power)] = table[std::size_t(power) - 1] * 10;
         return table;
     }();
-    if (value == 0 || !std::isfinite(value))
+    if (of == 0 || !std::isfinite(of) || !std::isfinite(value))
         return value;
     constexpr double MostDigits = 1e15, Log2 = 0.30102999566398120; // decimal
     int exponent = 0;
-    std::frexp(value, &exponent); // 2^(exponent - 1) is not more than the number
+    std::frexp(of, &exponent); // 2^(exponent - 1) is not more than the number
     int power = 14 - int(std::floor((exponent - 1) * Log2));
-    if (power >= 1 && power <= LargestPower && std::fabs(value) * powers[std::size_t(power)] >= MostDigits)
+    if (power >= 1 && power <= LargestPower && std::fabs(of) * powers[std::size_t(power)] >= MostDigits)
         --power;
     if (power < 0 || power > LargestPower)
         return value;

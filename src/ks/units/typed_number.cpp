@@ -35,7 +35,7 @@ KsTyped<double> ReadFormula(const CString& text)
     const double value = formula.Value();
     if (!std::isfinite(value))
         return {{}, Text(QT_TRANSLATE_NOOP("CKsEditStyle", "The result of \"%1\" is no number.")).arg(text)};
-    return {KsFifteenDigits(value)};
+    return {value};
 }
 
 /// What may be typed instead, for the message.
@@ -90,7 +90,7 @@ KsTyped<double> KsReadTyped(const CString& text, const CKsEditStyle& style, cons
     if (text.startsWith(u'=')) {
         KsTyped<double> result = ReadFormula(text.sliced(1));
         if (result.value)
-            result.value = style.UnitConvertFromBase(*result.value, 0);
+            result.value = KsFifteenDigits(style.UnitConvertFromBase(*result.value, 0));
         return result;
     }
     const qsizetype length = NumberLength(text);

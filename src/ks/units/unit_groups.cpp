@@ -118,7 +118,7 @@ constexpr std::pair<const char*, const char*> Spellings[] = {
     {"cfs", "ft3/s"},       {"cms", "m3/s"}, {"gpm", "231 in3/min"},  {"mgd", "231e6 in3/day"},  {"gal", "231 in3"}, {"gallon", "231 in3"},
     {"mph", "mi/h"},        {"fps", "ft/s"}, {"kph", "km/h"},         {"ac-ft", "acre_foot"},    {"deg", "degree"},
     {"\xE2\x80\xB0", "0.001"}, // per mille
-    {"nmi", "nautical_mile"},
+    {"nmi", "nautical_mile"}, {"lps", "l/s"}, {"ac", "acre"},
 };
 
 constexpr const char* AngleUnits[] = {"\xC2\xB0", "deg", "degree", "degrees", "rad", "radian", "radians"};

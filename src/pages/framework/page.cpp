@@ -111,8 +111,9 @@ void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
     if (m_grid && place.list && place.list == GetList() && place.data != place.list && place.listRow > 0)
         m_grid->ShowLine(place.listRow + m_grid->Model()->FixedRows());
     if (CGenGrid* grid = GridOf(place.data)) {
+        const int column = std::min(std::max(place.column, 1), grid->ColumnCount());
         if (place.row > 0)
-            grid->ShowLine(place.row, std::min(std::max(place.column, 1), grid->ColumnCount()));
+            place.isGone ? grid->ShowPlace(place.row, column) : grid->ShowLine(place.row, column);
         shown = grid;
     }
     if (!shown)

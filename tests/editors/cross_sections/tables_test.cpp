@@ -72,6 +72,23 @@ TEST_F(CrossSectionTest, SortedAndFilteredSections)
     ASSERT_EQ(stored.size(), 4u);
     EXPECT_EQ(stored[Main2500].topoId, "2019");
     EXPECT_EQ(stored[Side300].width, 7);
+
+    // Where rows have changed places, the filter goes with what they hold.
+    const auto widths = [&] {
+        QList<double> shown;
+        for (int row = 0; row < sections->RowCount(); ++row)
+            shown << std::get<double>(sections->Model()->Value(row, SectionWidth));
+        std::ranges::sort(shown);
+        return shown;
+    };
+    const QList<double> passing = widths();
+    EXPECT_EQ(passing.size(), 2);
+    LinesView::Run(Command::KeepOrder, *sections);
+    EXPECT_EQ(widths(), passing);
+    UndoAll(view);
+    EXPECT_EQ(widths(), passing);
+    view->Document()->UndoStack().redo();
+    EXPECT_EQ(widths(), passing);
 }
 
 TEST_F(CrossSectionTest, EveryCellCanBeEditedAndUndone)
