@@ -68,6 +68,21 @@ protected:
         return out;
     }
 
+    /// Whether `out` has these lines, apart from further columns behind them.
+    void ExpectLines(const std::string& expected) const
+    {
+        std::istringstream lines(out), beginnings(expected);
+        for (std::string line, beginning; std::getline(beginnings, beginning);) {
+            ASSERT_TRUE(std::getline(lines, line)) << out;
+            beginning.erase(std::min(beginning.find('}'), beginning.size()));
+            EXPECT_TRUE(line.starts_with(beginning)) << line;
+            EXPECT_TRUE(line.size() == beginning.size() ||
+                        std::string_view(" ,}").find(line[beginning.size()]) != std::string_view::npos)
+                << line;
+        }
+        EXPECT_EQ(std::ranges::count(out, '\n'), std::ranges::count(expected, '\n')) << out;
+    }
+
     std::string out, err, m_prefix;
 };
 
@@ -140,7 +155,8 @@ TEST_F(Hdkv, ValuesOfAnotherTypeAreTakenWhenTheirMeaningIsBeyondDoubt)
     EXPECT_EQ(Run("set taken.hdkv G_f 1"), 0) << err;
     EXPECT_EQ(err, "taken.hdkv:3:19: WaveList: parameter 4 (WaveApproximation) should be an integer, found a number; "
                    "taken as 2\n");
-    EXPECT_NE(Text("taken.hdkv").find("DATA = \"R\", 1, 2, 2\n"), std::string::npos);
+    EXPECT_NE(Text("taken.hdkv").find("DATA = \"R\", 1, 2, 2"), std::string::npos);
+    EXPECT_EQ(Text("taken.hdkv").find("2.0"), std::string::npos);
     EXPECT_EQ(Run("check taken.hdkv"), 0) << out;
 }
 
@@ -164,7 +180,7 @@ TEST_F(Hdkv, NamesAreShownSoThatTheyDoNothing)
 
     Write("names.hdkv", "[KAVO0_HD]\n[WindList]\nDATA = \"a\\u{1B}c\\n\", 1, 2\n[/WindList]\n[/KAVO0_HD]\n");
     EXPECT_EQ(Run("show names.hdkv WindList"), 0);
-    EXPECT_EQ(out, "RiverName   Chainage  WindFactor\na\\x1Bc\\x0A         1           2\n");
+    ExpectLines("RiverName   Chainage  WindFactor\na\\x1Bc\\x0A         1           2\n");
 }
 
 TEST_F(Hdkv, FindingsWithoutEndAreCounted)
@@ -237,7 +253,7 @@ TEST_F(Hdkv, ShowFormats)
          "1,E,1e+10,1,1,0,0,0,0,0,1,0,0,0,0,0\n"}};
     for (const auto& c : cases) {
         EXPECT_EQ(Run(std::string("show a.hdkv ") + c.arguments), 0) << err;
-        EXPECT_EQ(out, c.printed);
+        ExpectLines(c.printed);
     }
     EXPECT_EQ(Run("show a.hdkv Enc_Simulation --format json"), 0) << err;
     EXPECT_TRUE(out.starts_with("[\n  {\"Set\": 1, \"RiverName\": \"E\", ")) << out;
@@ -253,7 +269,7 @@ TEST_F(Hdkv, ShowEscapesWhatItsFormatsCannotHold)
     }
     ASSERT_TRUE(SaveHDFile(parameters, Path("e.hdkv")));
     EXPECT_EQ(Run("show e.hdkv WindList --format csv"), 0) << err;
-    EXPECT_EQ(out, "RiverName,Chainage,WindFactor\n\"\"\"\",1e+10,0\na\x0F\x10\x1F\x7F,1e+10,0\n");
+    ExpectLines("RiverName,Chainage,WindFactor\n\"\"\"\",1e+10,0\na\x0F\x10\x1F\x7F,1e+10,0\n");
     EXPECT_EQ(Run("show e.hdkv WindList --format json"), 0) << err;
     EXPECT_NE(out.find("\"a\\u000f\\u0010\\u001f\x7F\""), std::string::npos) << out;
 }
@@ -262,7 +278,7 @@ TEST_F(Hdkv, FmtAndNewWriteCanonicalFiles)
 {
     EXPECT_EQ(Run("fmt found.hdkv -o b.hdkv"), 0) << err;
     EXPECT_EQ(Run("fmt --check b.hdkv"), 0) << err;
-    EXPECT_NE(Text("b.hdkv").find("    DATA = \"\", 1, 2, 3\n"), std::string::npos); // incomplete lines too
+    EXPECT_NE(Text("b.hdkv").find("    DATA = \"\", 1, 2, 3"), std::string::npos); // incomplete lines too
     EXPECT_EQ(Run("fmt found.hdkv"), 0);
     EXPECT_EQ(Run("check found.hdkv"), 1);
     EXPECT_NE(Text("found.hdkv").find("LimitedPeriodEnd = 0, 0, 0, 0, 0, 0\n"), std::string::npos)

@@ -79,7 +79,8 @@ TEST(Check, FindsWhatIsNotInOrder)
         {InList("LeakageList", "DATA = \"R\", 1e10, 2"),
          "3:1: LeakageList: incomplete line, the chainage is not given"},
         {InList("BedList", "DATA = \"R\", 1, 2"), nullptr},
-        {InList("BedList", "DATA = \"R\", 1, 2, 3, 4"), "3:1: BedList: parameter 6 (ZoneResistance3) is missing"},
+        {InList("BedList", "DATA = \"R\", 1, 2, 3"),
+         "3:1: BedList: parameter 5 (ZoneResistance2) and those behind it are missing"},
         {InList("WindList", "// \xC3\xBC\nnote = 1"), "4:1: unknown keyword \"note\""},
         {InList("Enc_Simulation", "[Encroachment_Setup]\nDATA = \"\", 1, 1, 1, 0, 0, 0, 0, 0, 1, 0, 0, 0, 0, 0\n"
                                   "[/Encroachment_Setup]"),
@@ -158,7 +159,8 @@ TEST(Check, OpeningTellsWhatWasNotTakenAsItStands)
         EXPECT_EQ(finding.keyword, expected[i].keyword) << i;
         EXPECT_EQ(finding.parameter, expected[i].parameter) << i;
         EXPECT_EQ(finding.found, expected[i].found) << i;
-        EXPECT_EQ(finding.used, expected[i].used) << i;
+        const std::string used = finding.used + ", "; // of all values from there on
+        EXPECT_TRUE(used.starts_with(std::string(expected[i].used) + ", ")) << i << ": " << used;
     }
 }
 

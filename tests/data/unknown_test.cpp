@@ -55,7 +55,7 @@ constexpr const char* file = R"([KAVO0_HD]
   [InitList]
     DATA = "R", 1, 2, 3, 4, "five"
     note = "n"
-    DATA = "R", 2, 2, 3
+    DATA = "R", 2, 2, 3, 4
     [Sub]
     [/Sub]
   [/InitList]
@@ -110,8 +110,8 @@ TEST(Unknown, IsKeptAtEveryDepthBehindTheKnown)
         {"[/Leakage]", R"(wind = "w")", "[Global_Variables]"},
         {"[Global_Values]", "G_f = 3", "[/Leakage]"},
         {"[Ice]", "Thickness = 0.3", "[/Leakage]"},
-        {R"(DATA = "R", 1, 2, 3, 4, "five")", R"(DATA = "R", 2, 2, 3)", "[InitList]"},
-        {R"(DATA = "R", 2, 2, 3)", R"(note = "n")", "[InitList]"},
+        {R"(DATA = "R", 1, 2, 3, 4, "five")", R"(DATA = "R", 2, 2, 3, 4)", "[InitList]"},
+        {R"(DATA = "R", 2, 2, 3, 4)", R"(note = "n")", "[InitList]"},
         {R"(note = "n")", "[Sub]", "[InitList]"},
         {"mode = 2", "[/Encroachment_Setup]", "[Encroachment_Setup]"},
         {"[/Encroachment_Setup]", "[Other_Setup]", "[Enc_Simulation]"},
@@ -135,14 +135,17 @@ TEST(Unknown, IsKeptAtEveryDepthBehindTheKnown)
 
 TEST(Unknown, ParametersTravelWithTheirRecord)
 {
-    const HD_Parameters read = FromTarget("[LeakageList]\nDATA = \"R\", 1, 2, 1.50, <f>, \"t\", false, -3\n"
-                                          "DATA = \"S\", 1, 2\n[/LeakageList]");
+    std::string known;
+    for (std::size_t i = 0; i < HDLeakage::DeclaredFields().size(); ++i)
+        known += ", 2";
+    const std::string r = "DATA = \"R\", 1" + known + ", 1.50, <f>, \"t\", false, -3\n";
+    const std::string s = "DATA = \"S\", 1" + known + '\n';
+    const HD_Parameters read = FromTarget("[LeakageList]\n" + r + s + "[/LeakageList]");
     HD_Parameters copy;
     copy.LeakageList.Add(read.LeakageList.GetAt(1));
     copy.LeakageList.Add(read.LeakageList.GetAt(0));
     copy.LeakageList.GetAt(1) = copy.LeakageList.GetAt(1);
-    EXPECT_NE(HDFileText(copy).find("\"S\", 1, 2\n    DATA = \"R\", 1, 2, 1.50, <f>, \"t\", false, -3\n"),
-              std::string::npos);
+    EXPECT_NE(HDFileText(copy).find(s + "    " + r), std::string::npos);
 }
 
 TEST(Unknown, GlobalParametersAreReplacedByTheNextFile)

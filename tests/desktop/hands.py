@@ -4,6 +4,8 @@ import re
 import subprocess
 import time
 
+from waiting import wait_for
+
 DOUBLE_CLICK = 0.5  # seconds; two clicks farther apart are two clicks
 KEYS = {'\t': 'Tab', '\n': 'Return'}
 
@@ -12,6 +14,7 @@ class Hands:
     def __init__(self):
         self.log = []
         self._clicked = None, 0.0  # where and when last
+        self._desktops = 2
 
     def press(self, *keys, pause=20):
         """Keys by their X names, with what is held: 'Tab', 'ctrl+s', 'shift+F3'. `pause`: milliseconds after each."""
@@ -40,6 +43,14 @@ class Hands:
         let_go = ['keyup', held] if held else []
         self._do('mousemove', x, y, *hold, 'click', '--repeat', times, '--delay', 40, button, *let_go)
         self._clicked = (x, y), time.monotonic()
+        self._let_it_arrive()
+
+    def _let_it_arrive(self):
+        """The window manager gets a click first, and on a busy machine keys overtake what it holds back: they would go
+        to the widget that had the focus before. It answers requests in their order."""
+        self._desktops = 5 - self._desktops
+        self._do('set_num_desktops', self._desktops)
+        wait_for(lambda: self._answer('get_num_desktops') == str(self._desktops), 'the window manager passes a click on')
 
     def wheel(self, x, y, down):
         self._do('mousemove', x, y, 'click', 5 if down else 4)
@@ -51,6 +62,7 @@ class Hands:
             self._do('mousemove', *(a + (b - a) * step // 5 for a, b in zip(start, end)))
             time.sleep(0.02)
         self._do('mouseup', 1)
+        self._let_it_arrive()
 
     @contextlib.contextmanager
     def holding(self, key):
@@ -65,6 +77,10 @@ class Hands:
     def rest(self, x, y):
         """Moves the pointer out of the way."""
         self._do('mousemove', x, y)
+
+    @staticmethod
+    def _answer(question):
+        return subprocess.run(['xdotool', question], capture_output=True, text=True).stdout.strip()
 
     @staticmethod
     def _do(*arguments):

@@ -120,6 +120,8 @@ TEST_F(FlowPagesTest, LeakageShowsItsTableWhenIncluded)
     Enter(1, 1, "main");
     Enter(1, 3, "4.2e-07");
     EXPECT_EQ(Texts(1), "MAIN||4.2e-07");
+    grid->SetCurrentCell(1, grid->ColumnCount());
+    QTest::keyClick(grid, Qt::Key_Tab);
     EXPECT_EQ(list.GetCount(), 2u) << "behind the last cell a new line";
     Enter(1, 3, "");
     EXPECT_EQ(list.GetAt(0).LeakageCoefficient, 0);

@@ -317,8 +317,10 @@ TEST_F(LinesViewTest, HiddenLinesAreNeverTouched)
                 QGuiApplication::clipboard()->setText("5\t6\n7\t8\n9\t10");
                 ASSERT_TRUE(PasteCells(*grid));
                 for (int i = 0; i < 3; ++i) {
-                    if (row - 1 + i == expected.size())
-                        expected << "|||";
+                    if (row - 1 + i == expected.size()) {
+                        expected << Texts(row + i);
+                        ASSERT_TRUE(expected.back().startsWith("||")) << "a new line";
+                    }
                     QStringList cells = expected[row - 1 + i].split('|');
                     cells[2] = QString("%1.000").arg(5 + 2 * i);
                     cells[3] = QString("%1.000").arg(6 + 2 * i);

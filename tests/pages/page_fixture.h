@@ -99,6 +99,18 @@ inline QList<QWidget*> Controls(const QWidget& page)
     return controls;
 }
 
+/// What the cells of a line show, with a bar between them. It equals the texts of its first columns: others may be
+/// added behind them.
+struct LineTexts : QString
+{
+    bool operator==(const char* first) const
+    {
+        const QString expected = QString::fromUtf8(first);
+        return section('|', 0, int(expected.count('|'))) == expected;
+    }
+    friend void PrintTo(const LineTexts& texts, std::ostream* out) { *out << texts.toStdString(); }
+};
+
 class PageTest : public testing::Test
 {
 protected:
@@ -140,12 +152,12 @@ protected:
         record.InitialQ = q;
         return init.Add(record);
     }
-    QString Texts(int row) const
+    LineTexts Texts(int row) const
     {
         QStringList texts;
         for (int column = 1; column <= grid->ColumnCount(); ++column)
             texts << grid->TextAt(row, column);
-        return texts.join('|');
+        return {texts.join('|')};
     }
     /// The records of "InitList" to the last bit.
     QString Stored() const
