@@ -209,6 +209,21 @@ void FillLayersAndLosses(HD_Parameters& p)
     }
 }
 
+/// Lists that nothing was invented for have their defaults.
+void FillOtherLists(HD_Parameters& p)
+{
+    for (const ListEntry& entry : HDLists()) {
+        CListSection& lists = entry.list(p);
+        if (lists.ListCount() == 0 || !lists.ListAt(0).IsEmpty())
+            continue;
+        for (const Location& at : Locations(4000)) {
+            HD_RiverPos& record = lists.ListAt(0).AddTail(lists.ListAt(0).NewRecord());
+            record.RiverName = at.reach->name;
+            record.Chainage = at.chainage;
+        }
+    }
+}
+
 constexpr HDDateTime floodStart{2019, 3, 4, 6, 0, 0}, floodEnd{2019, 3, 11, 18, 0, 0};
 
 void FillSettings(HD_Global_Var& g)
@@ -298,6 +313,7 @@ HD_Parameters SampleRiver()
     FillMarksAndIncrements(parameters);
     FillResistanceTools(parameters);
     FillLayersAndLosses(parameters);
+    FillOtherLists(parameters);
     FillSettings(parameters.Global);
     FillOutput(parameters.Global);
     return parameters;

@@ -173,17 +173,31 @@ struct Field
     constexpr Field Title(Str text, int line) const { return Title({text, line}); }
     constexpr Field Choices(TextLine texts, std::int32_t first = 0) const
     {
+        if (kind != FieldKind::Integer && kind != FieldKind::Text)
+            throw "choices of what is neither a number of an entry nor its text";
         return With(&Field::choices, texts).With(&Field::firstChoice, first);
     }
     constexpr Field Range(std::optional<double> least, std::optional<double> most = {}) const
     {
         if (kind != FieldKind::Number)
             throw "bounds of what is no number";
+        if (least && most && *least > *most)
+            throw "bounds that no number keeps";
         return With(&Field::bounds, {least, most});
     }
-    constexpr Field Digits(int significant) const { return With(&Field::digits, significant); }
+    constexpr Field Digits(int significant) const
+    {
+        if (kind != FieldKind::Number)
+            throw "digits of what is no number";
+        return With(&Field::digits, significant);
+    }
     constexpr Field OptionalTail() const { return With(&Field::optionalTail, true); }
-    constexpr Field MayBeUnknown() const { return With(&Field::mayBeUnknown, true); }
+    constexpr Field MayBeUnknown() const
+    {
+        if (kind != FieldKind::Number)
+            throw "only a number may be unknown";
+        return With(&Field::mayBeUnknown, true);
+    }
     constexpr Field PadWhenEmpty() const { return With(&Field::padWhenEmpty, true); }
 
     /// The value inside `object`, of the type that the kind says.

@@ -2,6 +2,7 @@
 
 #include "files/private_folder.h"
 #include "files/safe_file.h"
+#include "ks/fc/file_name.h"
 
 #include <QCryptographicHash>
 #include <QDir>
@@ -73,7 +74,7 @@ std::optional<CRecoveryHeader> FromJson(const QJsonObject& json)
                            .time = QDateTime::fromString(json.value(Key::Time).toString(), Qt::ISODateWithMs),
                            .dateOfFile = DateFrom(json.value(Key::DateOfFile).toArray())};
     const bool isPath = QDir::isAbsolutePath(header.path) && QDir::cleanPath(header.path) == header.path &&
-                        header.path.endsWith(header.extension, Qt::CaseInsensitive);
+                        KsHasExtension(header.path, header.extension);
     const bool isWhole = json.value(Key::Format).toInteger() == Format && header.time.isValid() &&
                          header.extension.startsWith(u'.') && (header.path.isEmpty() || isPath) &&
                          (header.hash.isEmpty() || IsHash(QString::fromLatin1(header.hash))) &&

@@ -97,12 +97,16 @@ TEST(Unknown, IsKeptAtEveryDepthBehindTheKnown)
 
     const std::string text = HDFileText(parameters);
     const auto lines = Lines(text);
+    const auto& values = *std::ranges::find(HDGlobals().Sections(), "Global_Values", &DeclaredSection::name);
+    const std::string lastKeyword = *std::ranges::find_if(lines, [&](const std::string& line) {
+        return line.starts_with(std::string(values.keywords.back().name) + " =");
+    });
     const struct
     {
         const char *line, *behind, *from;
     } cases[] = {
         {"G_f = 1", "G_k_100 = 1", "[Global_Values]"},
-        {"ResisZone = 0, 30, 25, 20", "G_f = 2", "[Global_Values]"},
+        {lastKeyword.c_str(), "G_f = 2", "[Global_Values]"},
         {"G_f = 2", R"(Zukunft = <a\>b>, "\u{fc}", 0.10, -0)", "[Global_Values]"}, // in its own notation
         {"empty =", "[Inner]", "[Global_Values]"},
         {"[Deeper]", "k = 1", "[Inner]"},

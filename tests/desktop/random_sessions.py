@@ -19,11 +19,11 @@ from session import Session
 
 HERE = os.path.dirname(os.path.abspath(__file__))
 SPEEDS = (10, 10, 25, 50)
-# Pages with a table whose columns are a branch, a chainage and numbers: caption, list, number columns, and fields.
-TABLES = {'Initial': ('InitList', 2, {'Discharge': 'G_discharge'}),
-          'Wind': ('WindList', 1, {'Topographical': 'G_wind_factor'}),
-          'Flood Plain Resist.': ('FloodList', 1, {'Flood Plain': 'G_flood_plan_res'}),
-          'KLR Parameters': ('KlrParamList', 2, {'Maximum volume': 'maxvol'})}
+# Pages with a table whose columns are a branch, a chainage and numbers: caption, list, and fields.
+TABLES = {'Initial': ('InitList', {'Discharge': 'G_discharge'}),
+          'Wind': ('WindList', {'Topographical': 'G_wind_factor'}),
+          'Flood Plain Resist.': ('FloodList', {'Flood Plain': 'G_flood_plan_res'}),
+          'KLR Parameters': ('KlrParamList', {'Maximum volume': 'maxvol'})}
 FIELDS = {'Default Values': {'Alpha': 'alpha', 'Theta': 'theta', 'FroudeExp': 'froude_exp'}}
 
 
@@ -39,8 +39,9 @@ class RandomSession:
         self.samples, self.random = samples, random.Random(seed)
         self.folder = folder
         os.makedirs(folder, exist_ok=True)
+        self.columns = {page: self.number_columns(section) for page, (section, _) in TABLES.items()}
         self.lines = {page: [[self.name(), str(100 * n), *(self.number() for _ in range(columns))] for n in range(1, 6)]
-                      for page, (_, columns, _) in TABLES.items()}
+                      for page, columns in self.columns.items()}
         self.globals = {}
         lists = {TABLES[page][0]: [f'"{r[0]}", ' + ', '.join(r[1:]) for r in rows] for page, rows in self.lines.items()}
         samples.write_project(folder, samples.hd_text(lists))
@@ -50,6 +51,14 @@ class RandomSession:
         self.editor = Editor(folder, 'moor.kvrp')
         self.page = 'Initial'
         self.steps = 0
+
+    def number_columns(self, section):
+        """How many a list has, behind branch and chainage."""
+        hdkv, empty = os.path.join(os.environ['KVR_BIN'], 'hdkv'), f'{self.folder}/empty.hdkv'
+        if not os.path.exists(empty):
+            subprocess.run([hdkv, 'new', empty], check=True)
+        shown = subprocess.run([hdkv, 'show', empty, section, '--format', 'csv'], check=True, capture_output=True, text=True)
+        return len(shown.stdout.split('\n')[0].split(',')) - 2
 
     # ---- what is typed
 
@@ -109,7 +118,7 @@ class RandomSession:
         self.editor.press('ctrl+z')
 
     def append_line(self):
-        columns = TABLES[self.page][1]
+        columns = self.columns[self.page]
         row = [self.name(), self.number(), *(self.number() for _ in range(columns))]
         self.editor.click_cell(len(self.lines[self.page]), columns + 2)
         self.editor.press(self.random.choice(('Tab', 'Insert')))
@@ -121,7 +130,7 @@ class RandomSession:
 
     def append_incomplete_line(self):
         """Goes with the next save."""
-        columns = TABLES[self.page][1]
+        columns = self.columns[self.page]
         self.editor.click_cell(len(self.lines[self.page]), columns + 2)
         self.editor.press('Tab')
         self.editor.settle(0.05)
@@ -139,7 +148,7 @@ class RandomSession:
         del self.lines[self.page][line - 1]
 
     def change_field(self):
-        fields = TABLES[self.page][2]
+        fields = TABLES[self.page][1]
         self.fill(fields)
 
     def change_default_value(self):
@@ -175,7 +184,7 @@ class RandomSession:
     def difference(self):
         """The first value that the file has otherwise than the model."""
         saved = self.samples.Saved(self.path)
-        for page, (section, _, _) in TABLES.items():
+        for page, (section, _) in TABLES.items():
             records = [[part.strip('" ') for part in record.split(',')] for record in saved.records(section)]
             if len(records) != len(self.lines[page]):
                 return f'{page}: {len(records)} lines instead of {len(self.lines[page])}'

@@ -58,6 +58,16 @@ def write_project(folder, hd=None, branches=None):
     return write(f'{folder}/moor.kvrp', project_text('moor.HDKV', 'moor.kvnw', 'moor.kvxs'))
 
 
+class Record(str):
+    """A record as it is written. It equals the values of its first columns: others may be added behind them."""
+
+    def __eq__(self, first):
+        values = first.split(', ')
+        return self.split(', ')[:len(values)] == values
+
+    __hash__ = str.__hash__
+
+
 class Saved:
     """What stands in a saved file."""
 
@@ -73,7 +83,8 @@ class Saved:
     def records(self, section):
         """The records of a list as they are written."""
         found = re.search(rf'^\s*\[{section}\]\n(.*?)^\s*\[/{section}\]', self.text, re.M | re.S)
-        return re.findall(r'^\s*(?:DATA|data) = (.*)$', found.group(1), re.M) if found else []
+        written = re.findall(r'^\s*(?:DATA|data) = (.*)$', found.group(1), re.M) if found else []
+        return [Record(record) for record in written]
 
 
 def same_name(folder, name):

@@ -4,6 +4,7 @@
 #include "editors/network/join_lines.h"
 #include "editors/network/measured_line.h"
 #include "editors/network/network_rules.h"
+#include "files/read_number.h"
 
 #include <QCoreApplication>
 #include <QLibrary>
@@ -174,9 +175,7 @@ private:
 
     static std::optional<double> Number(const CGisFeature& feature, int field)
     {
-        bool good = false;
-        const double value = feature.values.value(field).toDouble(&good);
-        return good && std::isfinite(value) ? std::optional(value) : std::nullopt;
+        return ReadNumber(feature.values.value(field).trimmed().toStdString());
     }
 
     /// A line whose parts do not meet.
