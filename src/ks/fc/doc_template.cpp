@@ -91,17 +91,8 @@ CKsDoc* CMultiDocTemplate::FindOpen(const CString& path) const
     return nullptr;
 }
 
-/// Qt's objects do not stand memory that ends while they are made: the program would end with it. So there has to be
-/// plenty of it before a document or its window, which takes a third of this, is begun.
-static void RequireMemory()
-{
-    constexpr std::size_t plenty = std::size_t(32) << 20; // more than what the system's library keeps when it is freed
-    ::operator delete(::operator new(plenty));
-}
-
 std::unique_ptr<CKsDoc> CMultiDocTemplate::LoadDocument(const CString& path, bool hold)
 {
-    RequireMemory();
     std::unique_ptr<CKsDoc> document(m_classes.document());
     if (!document)
         return nullptr;
@@ -122,7 +113,6 @@ std::unique_ptr<CKsDoc> CMultiDocTemplate::LoadDocument(const CString& path, boo
 
 bool CMultiDocTemplate::ShowDocument(CKsDoc* document, CKsMDIFrameWnd* frame)
 {
-    RequireMemory();
     std::unique_ptr<CKsMDIChildWnd> window(m_classes.frame());
     std::unique_ptr<CView> view(m_classes.view());
     if (!window || !view)
