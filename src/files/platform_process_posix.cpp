@@ -12,29 +12,12 @@
 #include <sys/sysmacros.h>
 #endif
 
-/// Nearly everybody stands in the list of users of this system; asking all that may know users takes as long as all else
-/// that a lock costs.
-static passwd* FindUser(uid_t user, passwd& entry, char* buffer, std::size_t size)
-{
-    passwd* found = nullptr;
-#ifdef __GLIBC__
-    if (std::FILE* const list = std::fopen("/etc/passwd", "re")) {
-        while (::fgetpwent_r(list, &entry, buffer, size, &found) == 0 && entry.pw_uid != user)
-            found = nullptr;
-        std::fclose(list);
-    }
-#endif
-    if (!found && ::getpwuid_r(user, &entry, buffer, size, &found) != 0)
-        found = nullptr;
-    return found;
-}
-
 static std::string UserName(uid_t user)
 {
     char buffer[4096];
-    passwd entry{};
-    const passwd* const found = FindUser(user, entry, buffer, sizeof buffer);
-    return found ? found->pw_name : std::to_string(user);
+    passwd entry{}, *found = nullptr;
+    const bool isKnown = ::getpwuid_r(user, &entry, buffer, sizeof buffer, &found) == 0 && found;
+    return isKnown ? found->pw_name : std::to_string(user);
 }
 
 ProcessName ThisProcess()
