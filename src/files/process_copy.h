@@ -33,13 +33,15 @@ public:
     ProcessCopy& operator=(ProcessCopy&& other) noexcept
     {
         std::swap(m_process, other.m_process);
+        std::swap(m_letter, other.m_letter);
         std::swap(m_ended, other.m_ended);
         std::swap(m_answer, other.m_answer);
         return *this;
     }
     ~ProcessCopy(); // stops it
 
-    /// A descriptor that can be read when the copy has ended or is just about to; -1 when its end is known.
+    /// A descriptor that can be read when the copy has ended, and Wait does not wait any more; where the system does not
+    /// tell, when it is about to end. -1 when its end is known.
     int Ended() const { return m_ended; }
     /// Ends the copy whatever it is doing. What it was just doing may still come to its end until Wait returns.
     void Stop();
@@ -52,6 +54,7 @@ private:
     ProcessCopy() = default;
 
     std::intptr_t m_process = -1;
-    int m_ended = -1;
+    int m_letter = -1; // where the answer comes from
+    int m_ended = -1;  // the same where the system has nothing better
     Answer m_answer;
 };

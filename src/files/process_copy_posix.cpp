@@ -13,6 +13,7 @@
 #include <poll.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <sys/syscall.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -56,6 +57,17 @@ ProcessCopy::Answer Run(const std::function<ProcessCopy::Answer()>& work, Proces
     } catch (...) {
         return std::make_error_code(std::errc::io_error);
     }
+}
+
+/// Giving back what a large program has in memory takes the system tens of milliseconds after the answer has come. The
+/// descriptor can be read when that is over; -1 where the system has none of this kind.
+int EndOf([[maybe_unused]] pid_t process)
+{
+#ifdef SYS_pidfd_open
+    return int(::syscall(SYS_pidfd_open, process, 0));
+#else
+    return -1;
+#endif
 }
 
 /// The answer as it travels, in one piece that a pipe takes at once and that is there whole or not at all. A copy that
@@ -106,7 +118,9 @@ Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work, Pace
     }
     ProcessCopy copy;
     copy.m_process = process;
-    copy.m_ended = ends[0];
+    copy.m_letter = ends[0];
+    const int end = EndOf(process);
+    copy.m_ended = end == -1 ? copy.m_letter : end;
     return copy;
 }
 
@@ -130,9 +144,11 @@ const ProcessCopy::Answer& ProcessCopy::Wait()
     while (::waitpid(pid_t(m_process), &status, 0) == -1 && errno == EINTR) {
     }
     m_process = -1;
-    m_answer = Receive(m_ended, status);
-    ::close(m_ended);
-    m_ended = -1;
+    m_answer = Receive(m_letter, status);
+    if (m_ended != m_letter)
+        ::close(m_ended);
+    ::close(m_letter);
+    m_letter = m_ended = -1;
     return m_answer;
 }
 

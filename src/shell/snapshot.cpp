@@ -43,6 +43,7 @@ CSnapshot::~CSnapshot()
 {
     blockSignals(true); // there is nothing to ask it any more
     Drop();
+    FinishWriter();
 }
 
 void CSnapshot::Continue(const QString& file)
@@ -51,6 +52,7 @@ void CSnapshot::Continue(const QString& file)
         return;
     const int steps = m_steps;
     Drop();
+    FinishWriter();
     m_file = file;
     m_steps = steps;
     if (m_steps > 0)
@@ -133,8 +135,11 @@ void CSnapshot::WriterEnded()
     }
     const std::error_code answer = m_writer->Wait().error;
     m_writer.reset();
-    m_folder.WriterEnds(bool(answer));
-    if (answer) {
+    const bool isDropped = std::exchange(m_isDropped, false);
+    m_folder.WriterEnds(isDropped || answer);
+    if (isDropped)
+        QFile::remove(std::exchange(m_file, QString())); // it may have come nevertheless
+    else if (answer) {
         Fail(answer);
         return;
     }
@@ -164,19 +169,26 @@ void CSnapshot::SetFailure(std::error_code why)
         emit FailureChanged();
 }
 
-/// Nothing is left to save, or nobody wants it.
+/// Nothing is left to save, or nobody wants it. The end of a writer is not waited for: the system takes its time for it.
 void CSnapshot::Drop()
 {
     m_timer.stop();
     m_steps = 0;
-    m_writerEnds.reset();
+    if (!m_file.isEmpty())
+        QFile::remove(m_file);
     if (m_writer) {
         m_writer->Stop();
-        m_writer->Wait(); // only then nothing of it comes any more
-        m_writer.reset();
-        m_folder.WriterEnds(true);
+        m_isDropped = true;
+    } else {
+        m_file.clear();
     }
-    if (!m_file.isEmpty())
-        QFile::remove(std::exchange(m_file, QString()));
     SetFailure({});
+}
+
+/// Only then nothing of it comes any more.
+void CSnapshot::FinishWriter()
+{
+    m_writerEnds.reset();
+    if (m_writer)
+        WriterEnded();
 }

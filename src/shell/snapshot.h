@@ -48,6 +48,7 @@ private:
     void Fail(std::error_code why);
     void SetFailure(std::error_code why);
     void Drop();
+    void FinishWriter();
 
     CKsDoc& m_document;
     CRecoveryFolder& m_folder;
@@ -57,5 +58,6 @@ private:
     std::error_code m_failure;
     QString m_file;
     std::optional<ProcessCopy> m_writer;
+    bool m_isDropped = false; // what the writer was told to stop for is not wanted any more
     std::unique_ptr<QSocketNotifier> m_writerEnds;
 };

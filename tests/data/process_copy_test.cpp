@@ -10,6 +10,10 @@
 #include <new>
 #include <optional>
 #include <thread>
+#ifdef __linux__
+#include <poll.h>
+#include <sys/wait.h>
+#endif
 
 namespace {
 
@@ -94,6 +98,25 @@ TEST(ProcessCopy, AnswersWhyItFailed)
               std::errc::timed_out);
     EXPECT_LT(std::chrono::steady_clock::now() - begin, 2s);
 }
+
+#ifdef __linux__
+/// A large program's memory goes back to the system after the answer: whoever waits for the end must not wait for that.
+TEST(ProcessCopy, HasEndedWhenItIsSaidToHave)
+{
+    const std::string large(std::size_t(64) << 20, 'x');
+    Result<ProcessCopy> copy = ProcessCopy::Start([&] {
+        const std::string own = large;
+        return ProcessCopy::Answer({}, own.substr(own.size() - 1));
+    });
+    ASSERT_TRUE(copy);
+    pollfd end{.fd = copy->Ended(), .events = POLLIN, .revents = 0};
+    ASSERT_EQ(::poll(&end, 1, 10000), 1);
+    siginfo_t known{};
+    EXPECT_EQ(::waitid(P_ALL, 0, &known, WEXITED | WNOHANG | WNOWAIT), 0);
+    EXPECT_NE(known.si_pid, 0);
+    EXPECT_EQ(copy->Wait().text, "x");
+}
+#endif
 
 TEST(ProcessCopy, StopsAtOnceAndNothingOfItComesLater)
 {

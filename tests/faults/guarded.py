@@ -68,7 +68,9 @@ class Guarded:
             return [f'the file is gone: {error}']
         wrong = []
         if content not in (self.text, new):
-            wrong.append(f'neither old nor new content ({len(content)} characters)')
+            lines = new.splitlines()
+            strange = next((line for line in content.splitlines() if line not in lines), 'fewer lines')
+            wrong.append(f'neither old nor new content ({len(content)} characters for {len(new)}): {strange}')
         elif saved is not None and (content == new) != saved:
             wrong.append(f'said {"saved" if saved else "not saved"}, the content is {"new" if content == new else "old"}')
         now = self._metadata()
