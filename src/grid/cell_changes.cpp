@@ -12,9 +12,16 @@ bool SameCell(const CellValue& a, const CellValue& b)
     return x && y ? std::bit_cast<std::uint64_t>(*x) == std::bit_cast<std::uint64_t>(*y) : a == b;
 }
 
-void CCellValues::Add(CellValue value)
+/// Gives back what is worth a copy.
+static void Shrink(auto& values)
 {
-    if (!std::exchange(m_hasType, true))
+    if (values.capacity() - values.size() > values.size() / 100)
+        values.shrink_to_fit();
+}
+
+void CCellValues::Add(CellValue value, std::size_t expected)
+{
+    if (!std::exchange(m_hasType, true)) {
         std::visit(
             [this]<typename T>(const T&) {
                 if constexpr (std::is_same_v<T, std::monostate>)
@@ -23,6 +30,8 @@ void CCellValues::Add(CellValue value)
                     m_values = std::vector<T>();
             },
             value);
+        std::visit([expected](auto& values) { values.reserve(expected); }, m_values);
+    }
     const bool isTaken = std::visit(
         [&value]<typename T>(std::vector<T>& values) {
             if constexpr (std::is_same_v<T, CellValue>) {
@@ -41,7 +50,8 @@ void CCellValues::Add(CellValue value)
     // One of another type: from now on they are mixed.
     std::vector<CellValue> mixed = std::visit(
         [](auto& values) {
-            return std::vector<CellValue>(std::make_move_iterator(values.begin()), std::make_move_iterator(values.end()));
+            return std::vector<CellValue>(std::make_move_iterator(values.begin()),
+                                          std::make_move_iterator(values.end()));
         },
         m_values);
     mixed.push_back(std::move(value));
@@ -55,18 +65,20 @@ CellValue CCellValues::operator[](std::size_t index) const
 
 void CCellValues::ShrinkToFit()
 {
-    std::visit([](auto& values) { values.shrink_to_fit(); }, m_values);
+    std::visit([](auto& values) { Shrink(values); }, m_values);
 }
 
 void CCellChanges::Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, CellValue before,
                        CellValue after)
 {
     auto place = std::ranges::find(m_columns, column, &Column::column);
-    if (place == m_columns.end())
+    if (place == m_columns.end()) {
         place = m_columns.insert(place, Column{column, access, {}, {}, {}});
+        place->rows.reserve(m_expected);
+    }
     place->rows.push_back(row);
-    place->before.Add(std::move(before));
-    place->after.Add(std::move(after));
+    place->before.Add(std::move(before), m_expected);
+    place->after.Add(std::move(after), m_expected);
 }
 
 std::size_t CCellChanges::Count() const
@@ -104,7 +116,7 @@ void CCellChanges::Revert(IRowSource& rows)
 void CCellChanges::ShrinkToFit()
 {
     for (Column& column : m_columns) {
-        column.rows.shrink_to_fit();
+        Shrink(column.rows);
         column.before.ShrinkToFit();
         column.after.ShrinkToFit();
     }

@@ -15,7 +15,8 @@ bool SameCell(const CellValue& a, const CellValue& b);
 class CCellValues
 {
 public:
-    void Add(CellValue value);
+    /// The first one says of which type they are; then there is room for `expected` of them.
+    void Add(CellValue value, std::size_t expected = 0);
     CellValue operator[](std::size_t index) const;
     void ShrinkToFit();
 
@@ -34,6 +35,8 @@ public:
     /// changed in the order in which they came first.
     void Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, CellValue before,
              CellValue after);
+    /// So many cells of each column may come: makes room for them at once.
+    void Expect(std::size_t cells) { m_expected = cells; }
     bool IsEmpty() const { return m_columns.empty(); }
     std::size_t Count() const;
     // Of the first cell that was added; not for an empty one.
@@ -56,4 +59,5 @@ private:
     };
 
     std::vector<Column> m_columns;
+    std::size_t m_expected = 0;
 };

@@ -15,18 +15,6 @@ namespace {
 
 constexpr int FirstCommand = 42640; // of the menu; the actions follow
 
-struct MenuText
-{
-    GridAction action;
-    const char* text;
-};
-constexpr MenuText MenuTexts[] = {
-    {GridAction::FillDown, QT_TRANSLATE_NOOP("GridTexts", "Fill Dow&n")},
-    {GridAction::FillSeries, QT_TRANSLATE_NOOP("GridTexts", "Fill with a Se&ries...")},
-    {GridAction::Interpolate, QT_TRANSLATE_NOOP("GridTexts", "Inter&polate...")},
-    {GridAction::Calculate, QT_TRANSLATE_NOOP("GridTexts", "Calc&ulate...")},
-};
-
 CellBlock BlockOf(const CGenGrid& grid)
 {
     const auto selected = grid.SelectedBlock();
@@ -63,8 +51,8 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
         return false;
     const CellBlock block = BlockOf(grid);
     const auto has = [&](const auto& isMeant) {
-        return std::ranges::any_of(std::span(model.Columns()).subspan(std::size_t(block.left), std::size_t(block.right - block.left + 1)),
-                                   isMeant);
+        const std::size_t first = std::size_t(block.left), count = std::size_t(block.right - block.left + 1);
+        return std::ranges::any_of(std::span(model.Columns()).subspan(first, count), isMeant);
     };
     const auto hasNumbers = [&] { return has(&ColumnSpec::IsNumeric); };
     switch (action) {
@@ -86,31 +74,30 @@ void RunOnCells(CGenGrid& grid, GridAction action)
     const CGridModel& model = *grid.Model();
     const CellBlock block = BlockOf(grid);
     if (action == GridAction::FillDown)
-        return Make(grid, FillDown(model, block), TextOf(action));
+        return Make(grid, FillDown(model, block), NameOf(action));
     if (auto results = AskForCells(action, model, block, grid))
-        Make(grid, std::move(*results), TextOf(action));
+        Make(grid, std::move(*results), NameOf(action));
 }
 
 std::vector<CKsMenuCommand> CCellCommands::MenuCommands()
 {
     std::vector<CKsMenuCommand> commands;
-    for (const MenuText& entry : MenuTexts)
-        commands.push_back({FirstCommand + int(commands.size()), GridTexts::tr(entry.text), KeyOf(entry.action),
-                            TextOf(entry.action)});
+    for (const GridAction action : CellActions)
+        commands.push_back({FirstCommand + int(commands.size()), MenuText(action), KeyOf(action), TextOf(action)});
     return commands;
 }
 
 bool CCellCommands::Knows(int command)
 {
-    return command >= FirstCommand && command < FirstCommand + int(std::size(MenuTexts));
+    return command >= FirstCommand && command < FirstCommand + int(std::size(CellActions));
 }
 
 bool CCellCommands::CanRun(int command, const CGenGrid* grid)
 {
-    return Knows(command) && grid && CanRunOnCells(*grid, MenuTexts[command - FirstCommand].action);
+    return Knows(command) && grid && CanRunOnCells(*grid, CellActions[command - FirstCommand]);
 }
 
 void CCellCommands::Run(int command, CGenGrid& grid)
 {
-    RunOnCells(grid, MenuTexts[command - FirstCommand].action);
+    RunOnCells(grid, CellActions[command - FirstCommand]);
 }

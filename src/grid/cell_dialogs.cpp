@@ -142,19 +142,23 @@ class CCalculateDlg : public CCellsDlg
 {
 public:
     CCalculateDlg(const CGridModel& model, const CellBlock& block, QWidget& parent)
-        : CCellsDlg(GridTexts::tr("Calculate"), model, parent), m_block(block), m_names(NamesForFormula(model))
+        : CCellsDlg(NameOf(GridAction::Calculate), model, parent), m_block(block), m_names(NamesForFormula(model))
     {
         m_formula = new QLineEdit(QStringLiteral("=value"));
         m_formula->setAccessibleName(GridTexts::tr("Formula"));
         Form().addRow(GridTexts::tr("&Formula:"), m_formula);
-        QStringList names;
-        for (qsizetype name = 0; name < m_names.names.size(); ++name)
-            if (name == 0 || m_names.columns[std::size_t(name)] != m_names.columns[std::size_t(name) - 1])
+        QStringList names, keywords;
+        for (qsizetype name = 1; name < m_names.names.size(); ++name) {
+            const int column = m_names.columns[std::size_t(name)];
+            if (column != m_names.columns[std::size_t(name) - 1])
                 names << m_names.names[name]; // of a name in capitals and small letters the first is enough
+            if (m_names.names[name] == QString::fromUtf8(model.Column(column).name))
+                keywords << m_names.names[name];
+        }
         auto* hint = new QLabel(GridTexts::tr("\"value\" is the number of the cell itself. Numbers are in the units shown. "
-                                              "Other columns of the line: %1. Functions: min, max, abs, sqrt, rint, "
-                                              "ln, log10, exp, sin, ...")
-                                    .arg(names.mid(1).join(QStringLiteral(", "))));
+                                              "Other columns of the line: %1; in every language: %2. Functions: min, "
+                                              "max, abs, sqrt, rint, ln, log10, exp, sin, ...")
+                                    .arg(names.join(QStringLiteral(", ")), keywords.join(QStringLiteral(", "))));
         hint->setWordWrap(true);
         Form().addRow(hint);
         connect(m_formula, &QLineEdit::textChanged, this, [this] { Later(); });
@@ -184,7 +188,7 @@ class CSeriesDlg : public CCellsDlg
 {
 public:
     CSeriesDlg(const CGridModel& model, const CellBlock& block, QWidget& parent)
-        : CCellsDlg(GridTexts::tr("Fill with a Series"), model, parent), m_block(block)
+        : CCellsDlg(NameOf(GridAction::FillSeries), model, parent), m_block(block)
     {
         m_step = new QLineEdit(KsShortestNumber(StepOf(model, block)));
         m_step->setAccessibleName(GridTexts::tr("Step"));
@@ -212,7 +216,7 @@ class CInterpolateDlg : public CCellsDlg
 {
 public:
     CInterpolateDlg(const CGridModel& model, const CellBlock& block, QWidget& parent)
-        : CCellsDlg(GridTexts::tr("Interpolate"), model, parent), m_block(block)
+        : CCellsDlg(NameOf(GridAction::Interpolate), model, parent), m_block(block)
     {
         m_ends = new QRadioButton(GridTexts::tr("Between the &first and the last selected line of each branch"));
         m_neighbours = new QRadioButton(GridTexts::tr("Between the lines of the branch that are &not selected"));

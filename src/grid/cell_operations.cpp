@@ -33,8 +33,9 @@ std::optional<double> ShownNumber(const CTableRows& rows, int row, int column)
 template <typename Do>
 void ForCells(const CTableRows& rows, const CellBlock& block, const Do& action)
 {
+    const int last = std::min(block.bottom, rows.StoredRows() - 1);
     for (int column = block.left; column <= block.right; ++column)
-        for (int row = block.top; row <= std::min(block.bottom, rows.StoredRows() - 1); ++row)
+        for (int row = block.top; row <= last; ++row)
             action(row, column);
 }
 
@@ -46,7 +47,7 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block)
 {
     if (block.top == block.bottom)
         block.top = std::max(block.top - 1, 0);
-    CCellResults results(rows);
+    CCellResults results(rows, block);
     ForCells(rows, {block.top + 1, block.left, block.bottom, block.right}, [&](int row, int column) {
         const CellKind kind = rows.Column(column).Kind();
         if (kind != CellKind::Button)
@@ -71,7 +72,7 @@ double StepOf(const CTableRows& rows, const CellBlock& block)
 
 CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double step)
 {
-    CCellResults results(rows);
+    CCellResults results(rows, block);
     std::optional<double> first;
     ForCells(rows, block, [&](int row, int column) {
         if (!rows.Column(column).IsNumeric())
@@ -111,9 +112,10 @@ Branches LinesByBranch(const CTableRows& rows, const CellBlock& block, CCellResu
     std::size_t place = 0;
     IRowSource& source = *rows.Rows();
     const CellAccess &names = *rows.Column(BranchColumn).access, &chainages = *rows.Column(ChainageColumn).access;
-    for (std::size_t line = source.FixedRows(); line < source.Count(); ++line) {
+    for (std::size_t line = source.FixedRows(), end = source.Count(); line < end; ++line) {
         const int row = rows.ShownRow(line);
-        const CellValue name = names.get(source.At(line)), chainage = chainages.get(source.At(line));
+        const void* const object = source.At(line);
+        const CellValue name = names.get(object), chainage = chainages.get(object);
         const auto& branch = std::get<std::string>(name);
         const auto* number = std::get_if<double>(&chainage);
         const bool isInBlock = row >= block.top && row <= block.bottom;
@@ -192,7 +194,7 @@ std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranc
 
 CCellResults Interpolate(const CTableRows& rows, const CellBlock& block, KnownValues which, bool extrapolates)
 {
-    CCellResults results(rows);
+    CCellResults results(rows, block);
     const Branches branches = LinesByBranch(rows, block, results);
     for (int column = std::max(block.left, ChainageColumn + 1); column <= block.right; ++column) {
         if (rows.Column(column).Kind() != CellKind::Number)
@@ -247,7 +249,7 @@ CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKs
     for (std::size_t name = 0; name < names.columns.size(); ++name)
         if (formula.Uses(name))
             used.push_back(name);
-    CCellResults results(rows);
+    CCellResults results(rows, block);
     std::vector<double> numbers(names.columns.size());
     ForCells(rows, block, [&](int row, int column) {
         if (!rows.Column(column).IsNumeric())

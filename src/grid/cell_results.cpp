@@ -27,7 +27,7 @@ void CCellResults::Add(int row, int column, const CellValue& before, const CellV
         m_firstRow = row;
     if (m_changed.size() < Listed)
         m_changed.push_back({row, column, EditText(spec, before), EditText(spec, after)});
-    if (m_rows->Rows()->HasRules())
+    if (m_hasRules)
         m_texts.push_back({{row, column}, EditText(spec, after)});
     m_changes.Add(m_rows->NameOf(row), column + 1, spec.access, before, after);
 }

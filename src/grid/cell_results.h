@@ -5,6 +5,7 @@
 #include "grid/table_rows.h"
 
 #include <QString>
+#include <algorithm>
 
 /// Cells of a table, each bound included; rows and columns count from 0.
 struct CellBlock
@@ -15,7 +16,10 @@ struct CellBlock
 class CCellResults
 {
 public:
-    explicit CCellResults(const CTableRows& rows) : m_rows(&rows) {}
+    CCellResults(const CTableRows& rows, const CellBlock& block) : m_rows(&rows), m_hasRules(rows.Rows()->HasRules())
+    {
+        m_changes.Expect(std::size_t(std::max(block.bottom - block.top + 1, 0)));
+    }
 
     /// The cell, which holds `before`, becomes `after` unless that is the same, or cannot be.
     void Add(int row, int column, const CellValue& before, const CellValue& after);
@@ -42,6 +46,7 @@ public:
 
 private:
     const CTableRows* m_rows;
+    bool m_hasRules;
     CCellChanges m_changes;
     std::vector<Cell> m_changed, m_kept;
     std::vector<std::pair<std::pair<int, int>, QString>> m_texts; // of rows that have rules

@@ -61,7 +61,7 @@ QString CellToolTip(const ColumnSpec& column, const CellValue& value)
         return ShownText(column, value); // may be longer than its cell, a path in particular
     const auto* number = std::get_if<double>(&value);
     if (!number || IsEmptyCell(column, value))
-        return column.ToolTip(false);
+        return column.ToolTip();
     return NumberToolTip(column.style, *number, ShownText(column, value), column.UnitSymbol());
 }
 

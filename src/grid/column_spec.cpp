@@ -111,11 +111,3 @@ QString ColumnSpec::UnitLine() const
     const QString unit = unitBelow ? UnitSymbol() : QString();
     return unit.isEmpty() ? unit : QStringLiteral("[%1]").arg(unit);
 }
-
-QString ColumnSpec::ToolTip(bool isHeader) const
-{
-    const QString unitTip = KsUnitToolTip(UnitSymbol());
-    if (!isHeader || !hint)
-        return unitTip;
-    return unitTip.isEmpty() ? hint() : hint() + u'\n' + unitTip;
-}

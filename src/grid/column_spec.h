@@ -139,6 +139,6 @@ struct ColumnSpec
     QString UnitSymbol() const { return unitText ? unitText() : style.UnitSymbol(); }
     /// What stands below the header: "[m³/s]"; empty for nothing.
     QString UnitLine() const;
-    /// Unit of the cells, and on a header also what the column is.
-    QString ToolTip(bool header) const;
+    /// Unit of the cells.
+    QString ToolTip() const { return KsUnitToolTip(UnitSymbol()); }
 };

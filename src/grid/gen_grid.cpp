@@ -89,8 +89,7 @@ CGenGrid::~CGenGrid()
 QString CGenGrid::LineText() const
 {
     const int fixed = m_model->FixedRows(), line = CurrentLine() - fixed, column = CurrentColumn() - 1;
-    const bool isFiltered = m_model->Shown().IsFiltered();
-    const int lines = isFiltered ? int(m_model->Rows()->Count()) - fixed : RowCount() - fixed;
+    const int lines = std::max(m_model->LineCount(), RowCount() - fixed); // with the one that is offered
     QStringList texts;
     if (line > 0 && column >= 0) {
         QString text = GridTexts::tr("Line %1 of %2").arg(line).arg(lines);
@@ -101,11 +100,14 @@ QString CGenGrid::LineText() const
         }
         texts << text;
     }
-    if (isFiltered)
-        texts << GridTexts::tr("%1 of %2 shown").arg(m_model->StoredRows() - fixed).arg(lines);
-    if (!m_summary->Text().isEmpty())
-        texts << m_summary->Text();
+    texts << m_model->CountText();
+    texts.removeAll(QString());
     return texts.join(QStringLiteral("   "));
+}
+
+QString CGenGrid::SelectionText() const
+{
+    return m_summary->Text();
 }
 
 void CGenGrid::Refresh()
@@ -372,10 +374,29 @@ void CGenGrid::keyPressEvent(QKeyEvent* event)
         QTableView::keyPressEvent(event);
 }
 
+/// A selection is one block. A click with Ctrl, which adds a line or a cell to it elsewhere, does nothing but say so.
+bool CGenGrid::Scatters(const QMouseEvent& click) const
+{
+    if (!click.modifiers().testFlag(Qt::ControlModifier) || click.modifiers().testFlag(Qt::ShiftModifier) ||
+        click.button() != Qt::LeftButton)
+        return false;
+    if (m_model->Document())
+        m_model->Document()->Say(GridTexts::tr("Only what stands together can be selected: click where it begins and, "
+                                               "with Shift, where it ends."));
+    return true;
+}
+
 void CGenGrid::mousePressEvent(QMouseEvent* event)
 {
-    if (LeaveField())
+    m_isPressRefused = Scatters(*event) || !LeaveField();
+    if (!m_isPressRefused)
         QTableView::mousePressEvent(event);
+}
+
+void CGenGrid::mouseMoveEvent(QMouseEvent* event)
+{
+    if (!m_isPressRefused || event->buttons() == Qt::NoButton)
+        QTableView::mouseMoveEvent(event);
 }
 
 void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
@@ -405,6 +426,9 @@ bool CGenGrid::eventFilter(QObject* object, QEvent* event)
     const bool isBorder =
         isClick && object == horizontalHeader()->viewport() &&
         IsColumnBorder(*horizontalHeader(), static_cast<QMouseEvent*>(event)->position().toPoint().x());
+    const bool isHeader = object == verticalHeader()->viewport() || object == horizontalHeader()->viewport();
+    if (isClick && isHeader && !isBorder && Scatters(*static_cast<QMouseEvent*>(event)))
+        return true;
     const bool leaves = isClick && !isBorder && object != viewport();
     return (leaves && !CommitEditor()) || QTableView::eventFilter(object, event);
 }

@@ -49,9 +49,11 @@ public:
     /// The line that was current is gone, and nobody has chosen another one yet.
     bool HasLostItsLine() const { return m_lineGone; }
     QString TextAt(int row, int column) const { return m_model->index(row - 1, column - 1).data().toString(); }
-    /// "Line 3 of 120", with the whole number of the current cell where the cell leaves digits out, how many lines are
-    /// shown when others are hidden, and what the selected numbers come to.
+    /// "Line 3 of 120", with the whole number of the current cell where the cell leaves digits out, and how many lines
+    /// are shown when others are hidden.
     QString LineText() const;
+    /// What the selected numbers come to.
+    QString SelectionText() const;
 
     /// Column whose cells offer the branch names of the network; 0 for none.
     void SetBranchNameColumn(int column) { m_branchNameColumn = column; }
@@ -93,6 +95,7 @@ protected:
     bool eventFilter(QObject* object, QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
     void mouseDoubleClickEvent(QMouseEvent* event) override;
     void contextMenuEvent(QContextMenuEvent* event) override;
     void focusInEvent(QFocusEvent* event) override;
@@ -106,6 +109,7 @@ protected:
 
 private:
     bool LeaveField();
+    bool Scatters(const QMouseEvent& click) const;
     void FollowLine(int row, int column);
     void NoteLine(int row);
     int RowLikeCurrent(int row) const;
@@ -124,5 +128,6 @@ private:
     int m_contents = 0;                  // of the document, when the rows were last shown
     bool m_lineGone = false;
     bool m_modified = false; // since the last cell move
+    bool m_isPressRefused = false; // what follows the press of a button is none of the table's
     int m_branchNameColumn = 0;
 };

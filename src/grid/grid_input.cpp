@@ -1,6 +1,7 @@
 #include "grid/grid_input.h"
 
 #include "grid/cell_commands.h"
+#include "grid/filter_fields.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_clipboard.h"
 #include "grid/grid_header.h"
@@ -24,7 +25,7 @@ bool CGridInput::eventFilter(QObject* object, QEvent* event)
     if (event->type() != QEvent::ShortcutOverride && event->type() != QEvent::KeyPress)
         return QObject::eventFilter(object, event);
     const GridKey* key = FindGridKey(*static_cast<QKeyEvent*>(event));
-    if (!key || m_grid.Header().IsTypingFilter())
+    if (!key || m_grid.Header().Fields().HaveFocus())
         return QObject::eventFilter(object, event);
     event->accept();
     if (event->type() == QEvent::KeyPress)
@@ -107,13 +108,18 @@ void CGridInput::ShowMenu(const QPoint& at)
 {
     QMenu menu(&m_grid);
     const auto add = [&](GridAction action, bool enabled) {
-        menu.addAction(TextOf(action), KeyOf(action), this, [this, action] { Run(action); })->setEnabled(enabled);
+        menu.addAction(MenuText(action), KeyOf(action), this, [this, action] { Run(action); })->setEnabled(enabled);
     };
-    const bool changes = m_grid.Model()->Document() && !m_grid.Model()->Document()->IsReadOnly();
-    add(GridAction::AppendLine, changes && m_grid.Model()->Rows());
+    const CGridModel& model = *m_grid.Model();
+    const bool changes = model.Document() && !model.Document()->IsReadOnly();
+    const bool grows = changes && model.Rows() && m_grid.MayGrow(), copies = CanCopyCells(m_grid);
+    add(GridAction::AppendLine, changes && model.Rows());
+    add(GridAction::CopyAndAppend, grows && copies);
+    add(GridAction::PasteAndAppend, grows && CanPasteCells(m_grid));
     add(GridAction::DeleteLine, changes && m_grid.HasLinesToDelete());
+    add(GridAction::SelectLine, m_grid.CurrentRow() > 0);
     menu.addSeparator();
-    add(GridAction::Copy, CanCopyCells(m_grid));
+    add(GridAction::Copy, copies);
     add(GridAction::Paste, changes && CanPasteCells(m_grid));
     menu.addSeparator();
     for (const GridAction action : CellActions)
@@ -123,8 +129,6 @@ void CGridInput::ShowMenu(const QPoint& at)
         add(GridAction::Search, true);
     }
     menu.addSeparator();
-    for (const GridAction action : {GridAction::SortAscending, GridAction::SortDescending, GridAction::FileOrder,
-                                    GridAction::Filter, GridAction::ShowAfresh})
-        add(action, LinesView::CanRun(LinesView::CommandOf(action), &m_grid));
+    LinesView::AddTo(menu, m_grid, std::max(0, m_grid.CurrentColumn() - 1));
     menu.exec(at);
 }

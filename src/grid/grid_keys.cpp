@@ -3,6 +3,7 @@
 #include "grid/grid_texts.h"
 
 #include <QKeyEvent>
+#include <QRegularExpression>
 #include <algorithm>
 #include <iterator>
 
@@ -45,39 +46,63 @@ constexpr GridKey Keys[] = {
     {Qt::Key_F5, None, All, GridAction::ShowAfresh, false},
 };
 
-// What the actions do, in their order.
-constexpr const char* Descriptions[] = {
-    QT_TRANSLATE_NOOP("GridTexts", "Next cell; behind the last one a new line"),
-    QT_TRANSLATE_NOOP("GridTexts", "Previous cell"),
-    QT_TRANSLATE_NOOP("GridTexts", "Insert line"),
-    QT_TRANSLATE_NOOP("GridTexts", "Copy, then insert line"),
-    QT_TRANSLATE_NOOP("GridTexts", "Paste, then insert line"),
-    QT_TRANSLATE_NOOP("GridTexts", "Delete selected lines"),
-    QT_TRANSLATE_NOOP("GridTexts", "Select the line"),
-    QT_TRANSLATE_NOOP("GridTexts", "Copy"),
-    QT_TRANSLATE_NOOP("GridTexts", "Paste"),
-    QT_TRANSLATE_NOOP("GridTexts", "Search again"),
-    QT_TRANSLATE_NOOP("GridTexts", "Search"),
-    QT_TRANSLATE_NOOP("GridTexts", "Fill down"),
-    QT_TRANSLATE_NOOP("GridTexts", "Fill with a series"),
-    QT_TRANSLATE_NOOP("GridTexts", "Interpolate along the chainage"),
-    QT_TRANSLATE_NOOP("GridTexts", "Calculate"),
-    QT_TRANSLATE_NOOP("GridTexts", "Undo"),
-    QT_TRANSLATE_NOOP("GridTexts", "Redo"),
-    QT_TRANSLATE_NOOP("GridTexts", "Sort by the current column, smallest first"),
-    QT_TRANSLATE_NOOP("GridTexts", "Sort by the current column, largest first"),
-    QT_TRANSLATE_NOOP("GridTexts", "Sort by branch and chainage"),
-    QT_TRANSLATE_NOOP("GridTexts", "Order of the file"),
-    QT_TRANSLATE_NOOP("GridTexts", "Filter the lines"),
-    QT_TRANSLATE_NOOP("GridTexts", "Sort and filter afresh"),
+struct ActionTexts
+{
+    const char* name;                  // of the command, as menus have it
+    const char* description = nullptr; // where there is more to say
 };
-static_assert(std::size(Descriptions) == std::size_t(GridAction::None));
+
+// In the order of the actions.
+constexpr ActionTexts Texts[] = {
+    {QT_TRANSLATE_NOOP("GridTexts", "Next cell; behind the last one a new line")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Previous cell")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Insert line")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Copy, then insert line")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Paste, then insert line")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Delete selected lines")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Select the line")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Copy")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Paste")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Search &Again")},
+    {QT_TRANSLATE_NOOP("GridTexts", "&Search...")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Fill Dow&n")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Fill with a Se&ries...")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Inter&polate..."),
+     QT_TRANSLATE_NOOP("GridTexts", "Interpolate along the chainage")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Calc&ulate...")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Undo")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Redo")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Sort As&cending"),
+     QT_TRANSLATE_NOOP("GridTexts", "Sort by the current column, smallest first")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Sort D&escending"),
+     QT_TRANSLATE_NOOP("GridTexts", "Sort by the current column, largest first")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Sort by &Branch and Chainage")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Order of the &File")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Ma&ke This the Order of the File")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Fil&ter"), QT_TRANSLATE_NOOP("GridTexts", "Filter the lines")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Show Ever&y Line")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Sort and Filter Afres&h")},
+};
+static_assert(std::size(Texts) == std::size_t(GridAction::None));
 
 } // namespace
 
+QString MenuText(GridAction action)
+{
+    return GridTexts::tr(Texts[std::size_t(action)].name);
+}
+
+/// Letters stand in brackets, "(&N)", where they are no part of words.
+QString NameOf(GridAction action)
+{
+    static const QRegularExpression signs(QStringLiteral("\\(&.\\)|&|\\.\\.\\.$"));
+    return MenuText(action).remove(signs);
+}
+
 QString TextOf(GridAction action)
 {
-    return GridTexts::tr(Descriptions[std::size_t(action)]);
+    const char* const description = Texts[std::size_t(action)].description;
+    return description ? GridTexts::tr(description) : NameOf(action);
 }
 
 std::span<const GridKey> GridKeys()

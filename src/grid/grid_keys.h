@@ -30,12 +30,18 @@ enum class GridAction
     SortDescending,
     SortByPlace,
     FileOrder,
+    KeepOrder,
     Filter,
+    ShowAllLines,
     ShowAfresh,
-    None // of no key
+    None
 };
 
-/// What it does, in the user's language.
+/// What menus call it, with the letter of its key, in the user's language.
+QString MenuText(GridAction action);
+/// The same as plain text.
+QString NameOf(GridAction action);
+/// What it does: its name, unless there is more to say.
 QString TextOf(GridAction action);
 
 struct GridKey

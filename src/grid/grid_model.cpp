@@ -82,7 +82,12 @@ void CGridModel::Sync()
         return;
     if (m_rowCount > 0)
         emit dataChanged(index(0, 0), index(m_rowCount - 1, columnCount() - 1));
-    emit headerDataChanged(Qt::Horizontal, 0, columnCount() - 1);
+    // Painting headers costs as much as painting lines do, and they hardly ever change.
+    QStringList headers;
+    for (const ColumnSpec& column : m_columns)
+        headers << column.header() + u'\n' + column.UnitLine();
+    if (std::exchange(m_headers, headers) != headers)
+        emit headerDataChanged(Qt::Horizontal, 0, columnCount() - 1);
 }
 
 int CGridModel::columnCount(const QModelIndex& parent) const
@@ -126,7 +131,17 @@ QVariant CGridModel::headerData(int section, Qt::Orientation orientation, int ro
         return {};
     if (role == Qt::DisplayRole)
         return Column(section).header();
-    return role == Qt::ToolTipRole ? Column(section).ToolTip(true) : QVariant();
+    return role == Qt::ToolTipRole ? HeaderToolTip(section) : QVariant();
+}
+
+/// What the column is, and the unit of its cells.
+QString CGridModel::HeaderToolTip(int column) const
+{
+    const ColumnSpec& spec = Column(column);
+    const QString unit = spec.ToolTip();
+    if (!spec.hint)
+        return unit;
+    return unit.isEmpty() ? spec.hint() : spec.hint() + u'\n' + unit;
 }
 
 Qt::ItemFlags CGridModel::flags(const QModelIndex& index) const

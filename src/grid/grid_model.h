@@ -74,6 +74,7 @@ signals:
     void ViewChanged();
 
 private:
+    QString HeaderToolTip(int column) const;
     std::size_t Change(const QString& step, std::size_t row, const std::function<void()>& make);
     std::size_t Arrange(std::size_t row);
     void RemoveScattered(const std::vector<std::size_t>& lines);
@@ -83,5 +84,6 @@ private:
     CKsDoc* m_document = nullptr;
     int m_rowCount = 0; // as the views know it
     bool m_syncing = false;
+    QStringList m_headers; // as the views know them
     int m_contents = 0; // which content of the document is shown
 };

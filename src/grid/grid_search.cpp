@@ -1,11 +1,12 @@
 #include "grid/grid_search.h"
 
 #include "base/not_given.h"
+#include "files/read_number.h"
 #include "grid/cell_text.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_keys.h"
 #include "grid/grid_texts.h"
 #include "grid/line_dialogs.h"
-#include "files/read_number.h"
 #include "ks/fc/message_box.h"
 
 #include <algorithm>
@@ -40,26 +41,57 @@ bool ChainagePasses(double shown, double wanted, ChainageMatch match)
            (match == ChainageMatch::Equal && shown == wanted) || (match == ChainageMatch::Greater && shown > wanted);
 }
 
+/// Whether a line is looked for.
+class CLineMatch
+{
+public:
+    CLineMatch(const CGridModel& model, const LineQuery& query)
+        : m_query(query),
+          m_name(query.name.toUpper().toStdString()), // as the column stores them
+          m_chainageColumn(model.Column(1)),
+          m_chainage(AsShown(m_chainageColumn, query.chainage))
+    {
+    }
+    bool operator()(const CellValue& name, const CellValue& chainage) const
+    {
+        if (!NamePasses(InCapitals(std::get<std::string>(name)), m_name, m_query.nameMatch))
+            return false;
+        if (m_query.chainageMatch == ChainageMatch::Any)
+            return true;
+        const auto* number = std::get_if<double>(&chainage);
+        return ChainagePasses(AsShown(m_chainageColumn, number ? *number : NotGiven), m_chainage,
+                              m_query.chainageMatch);
+    }
+
+private:
+    const LineQuery& m_query;
+    std::string m_name;
+    const ColumnSpec& m_chainageColumn;
+    double m_chainage;
+};
+
+/// The number of the first line that the filter hides and that is looked for; 0 without one.
+int FindHidden(const CGridModel& model, const LineQuery& query)
+{
+    const CLineMatch passes(model, query);
+    IRowSource& rows = *model.Rows();
+    const CellAccess &names = *model.Column(0).access, &chainages = *model.Column(1).access;
+    for (std::size_t row = rows.FixedRows(); model.Shown().IsFiltered() && row < rows.Count(); ++row)
+        if (model.ShownRow(row) < 0 && passes(names.get(rows.At(row)), chainages.get(rows.At(row))))
+            return int(row) + 1;
+    return 0;
+}
+
 } // namespace
 
 bool SearchRows(CGenGrid& grid, int& row, const LineQuery& query)
 {
-    constexpr int NameColumn = 0, ChainageColumn = 1;
     const CGridModel& model = *grid.Model();
-    const std::string wantedName = query.name.toUpper().toStdString(); // as the column stores them
-    const ColumnSpec& chainageColumn = model.Column(ChainageColumn);
-    const double wanted = AsShown(chainageColumn, query.chainage);
+    const CLineMatch passes(model, query);
     for (row = std::max(row, model.FixedRows() + 1); row <= grid.RowCount();) {
         const int line = row++ - 1;
-        const std::string name = InCapitals(std::get<std::string>(model.Value(line, NameColumn)));
-        if (!NamePasses(name, wantedName, query.nameMatch))
+        if (!passes(model.Value(line, 0), model.Value(line, 1)))
             continue;
-        if (query.chainageMatch != ChainageMatch::Any) {
-            const CellValue value = model.Value(line, ChainageColumn);
-            const auto* number = std::get_if<double>(&value);
-            if (!ChainagePasses(AsShown(chainageColumn, number ? *number : NotGiven), wanted, query.chainageMatch))
-                continue;
-        }
         grid.clearSelection();
         grid.GotoLine(line + 1);
         return true;
@@ -73,8 +105,9 @@ std::vector<CKsMenuCommand> CGridSearch::MenuCommands()
     return {
         {Command::GotoLine, GridTexts::tr("&Go to Line..."), QKeySequence(Qt::CTRL | Qt::Key_G)},
         {},
-        {Command::Search, GridTexts::tr("&Search..."), QKeySequence(Qt::Key_F7)},
-        {Command::SearchAgain, GridTexts::tr("Search &Again"), QKeySequence(Qt::Key_F3)},
+        {Command::Search, MenuText(GridAction::Search), KeyOf(GridAction::Search), TextOf(GridAction::Search)},
+        {Command::SearchAgain, MenuText(GridAction::SearchAgain), KeyOf(GridAction::SearchAgain),
+         TextOf(GridAction::SearchAgain)},
     };
 }
 
@@ -132,7 +165,14 @@ void CGridSearch::Next(CGenGrid& grid)
     const bool hadFound = std::exchange(m_found, false);
     QString text = hadFound ? GridTexts::tr("The last occurence of searched item already found")
                             : GridTexts::tr("Searched item not found");
-    if (grid.Model()->Shown().IsFiltered())
-        text += u'\n' + GridTexts::tr("Lines that the filter hides were not looked at.");
-    KsMessageBox(text, QMessageBox::Ok, &grid);
+    const int hidden = FindHidden(*grid.Model(), m_query);
+    if (hidden == 0) {
+        KsMessageBox(text, QMessageBox::Ok, &grid);
+        return;
+    }
+    text += u'\n' + GridTexts::tr("Line %1 is what is searched, but hidden by the filter. Show it?").arg(hidden);
+    if (KsMessageBox(text, QMessageBox::Yes | QMessageBox::No, &grid) != QMessageBox::Yes)
+        return;
+    grid.ShowLine(hidden);
+    grid.setFocus(Qt::OtherFocusReason);
 }

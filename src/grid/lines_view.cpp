@@ -1,10 +1,10 @@
 #include "grid/lines_view.h"
 
+#include "grid/filter_fields.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_header.h"
 #include "grid/grid_host.h"
 #include "grid/grid_keys.h"
-#include "grid/grid_texts.h"
 #include "ks/fc/doc.h"
 
 #include <QMenu>
@@ -14,21 +14,20 @@ namespace {
 
 struct Entry
 {
-    int command;       // 0: a separator
-    const char* text;  // with mnemonic
-    GridAction action; // its key; None for none
+    int command = 0; // 0: a separator
+    GridAction action = GridAction::None;
 };
 
 constexpr Entry Entries[] = {
-    {Command::SortAscending, QT_TRANSLATE_NOOP("GridTexts", "Sort As&cending"), GridAction::SortAscending},
-    {Command::SortDescending, QT_TRANSLATE_NOOP("GridTexts", "Sort D&escending"), GridAction::SortDescending},
-    {Command::SortByPlace, QT_TRANSLATE_NOOP("GridTexts", "Sort by &Branch and Chainage"), GridAction::SortByPlace},
-    {Command::FileOrder, QT_TRANSLATE_NOOP("GridTexts", "Order of the &File"), GridAction::FileOrder},
-    {Command::KeepOrder, QT_TRANSLATE_NOOP("GridTexts", "Ma&ke This the Order of the File"), GridAction::None},
+    {Command::SortAscending, GridAction::SortAscending},
+    {Command::SortDescending, GridAction::SortDescending},
+    {Command::SortByPlace, GridAction::SortByPlace},
+    {Command::FileOrder, GridAction::FileOrder},
+    {Command::KeepOrder, GridAction::KeepOrder},
     {},
-    {Command::Filter, QT_TRANSLATE_NOOP("GridTexts", "Fil&ter"), GridAction::Filter},
-    {Command::ShowAllLines, QT_TRANSLATE_NOOP("GridTexts", "Show Ever&y Line"), GridAction::None},
-    {Command::ShowAfresh, QT_TRANSLATE_NOOP("GridTexts", "Sort and Filter Afres&h"), GridAction::ShowAfresh},
+    {Command::Filter, GridAction::Filter},
+    {Command::ShowAllLines, GridAction::ShowAllLines},
+    {Command::ShowAfresh, GridAction::ShowAfresh},
 };
 
 /// What was sorted by before decides where the new column has the same values.
@@ -65,9 +64,9 @@ void Run(int command, CGenGrid& grid, int column)
     case Command::ShowAfresh:
         return grid.ChangeView([](CGridModel& model) { model.ShowAfresh(); });
     case Command::Filter:
-        return grid.Header().EnterFilter(column);
+        return grid.Header().Fields().Enter(column);
     default:
-        return grid.Header().LeaveFilter();
+        return grid.Header().Fields().Leave();
     }
 }
 
@@ -77,7 +76,8 @@ std::vector<CKsMenuCommand> LinesView::MenuCommands()
 {
     std::vector<CKsMenuCommand> menu;
     for (const Entry& entry : Entries)
-        menu.push_back(entry.command ? CKsMenuCommand{entry.command, GridTexts::tr(entry.text), KeyOf(entry.action)}
+        menu.push_back(entry.command ? CKsMenuCommand{entry.command, MenuText(entry.action), KeyOf(entry.action),
+                                                      TextOf(entry.action)}
                                      : CKsMenuCommand());
     return menu;
 }
@@ -131,16 +131,14 @@ void LinesView::SortByClick(CGenGrid& grid, int column)
     grid.SetCurrentCell(grid.Model()->FixedRows() + 1, column + 1); // the line that was clicked is nobody's choice
 }
 
-void LinesView::ShowMenu(CGenGrid& grid, int column, const QPoint& at)
+void LinesView::AddTo(QMenu& menu, CGenGrid& grid, int column)
 {
-    QMenu menu(&grid);
     for (const Entry& entry : Entries) {
         if (entry.command)
-            menu.addAction(GridTexts::tr(entry.text), KeyOf(entry.action), &grid,
+            menu.addAction(MenuText(entry.action), KeyOf(entry.action), &grid,
                            [&grid, column, command = entry.command] { ::Run(command, grid, column); })
                 ->setEnabled(CanRun(entry.command, &grid));
         else
             menu.addSeparator();
     }
-    menu.exec(at);
 }

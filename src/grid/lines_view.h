@@ -4,7 +4,7 @@
 #include "ks/fc/frames.h"
 
 class CGenGrid;
-class QPoint;
+class QMenu;
 enum class GridAction;
 
 /// Numbered behind those of grid/grid_search.h and the pages.
@@ -31,6 +31,6 @@ void Run(int command, CGenGrid& grid);
 int CommandOf(GridAction action);
 /// A double click on a header: sorts by the column, and the other way round when it is sorted by it.
 void SortByClick(CGenGrid& grid, int column);
-/// The menu of a column's header.
-void ShowMenu(CGenGrid& grid, int column, const QPoint& at);
+/// The commands for a column, in the menu of its header or its cells.
+void AddTo(QMenu& menu, CGenGrid& grid, int column);
 } // namespace LinesView

@@ -44,15 +44,17 @@ CSelectionSummary::CSelectionSummary(CGenGrid& grid) : QObject(&grid), m_grid(gr
         if (m_grid.Host())
             m_grid.Host()->CellCurrent(m_grid);
     });
-    connect(grid.selectionModel(), &QItemSelectionModel::selectionChanged, this, [this] {
-        m_text.clear();
-        if (m_grid.SelectedBlock())
-            m_pause.start();
-        else
-            m_pause.stop();
-    });
-    // The numbers are others now; what is told of the change itself stands in the status bar until the user moves on.
-    connect(grid.Model(), &QAbstractItemModel::dataChanged, this, [this] { m_text.clear(); });
+    connect(grid.selectionModel(), &QItemSelectionModel::selectionChanged, this, &CSelectionSummary::FindAgain);
+    connect(grid.Model(), &QAbstractItemModel::dataChanged, this, &CSelectionSummary::FindAgain);
+}
+
+void CSelectionSummary::FindAgain()
+{
+    m_text.clear();
+    if (m_grid.SelectedBlock())
+        m_pause.start();
+    else
+        m_pause.stop();
 }
 
 QString CSelectionSummary::Found() const

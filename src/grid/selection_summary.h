@@ -7,7 +7,7 @@
 
 class CGenGrid;
 
-/// Found a moment after the selection was made, so that nobody who moves through a table waits for it.
+/// Found a moment after the selection was made or its numbers changed, so that nobody who moves through a table waits for it.
 class CSelectionSummary : public QObject
 {
 public:
@@ -19,6 +19,7 @@ public:
     const QString& Text() const { return m_text; }
 
 private:
+    void FindAgain();
     QString Found() const;
 
     CGenGrid& m_grid;

@@ -9,7 +9,7 @@
 void* CTableRows::RowObject(int row) const
 {
     // A row that the source has lost, as long as nobody has looked, is one that it does not have yet.
-    if (const std::size_t place = SourceRow(row); !IsOffered(row) && place < m_rows->Count())
+    if (const std::size_t place = SourceRow(row); place < m_rows->Count())
         return m_rows->At(place);
     if (!m_offered)
         m_offered = NewLines(1);
@@ -44,6 +44,13 @@ int CTableRows::ShownRow(std::size_t sourceRow) const
         return int(sourceRow);
     const auto row = m_shown.RowOf(sourceRow);
     return row ? int(*row) : -1;
+}
+
+QString CTableRows::CountText() const
+{
+    if (!m_shown.IsFiltered() || LineCount() == 0)
+        return {};
+    return GridTexts::tr("%1 of %2 shown").arg(StoredRows() - FixedRows()).arg(LineCount());
 }
 
 void* CTableRows::StoredObject(int row) const
@@ -81,7 +88,7 @@ void CTableRows::FollowSource()
 RowKey CTableRows::NameOf(int row) const
 {
     const std::size_t place = SourceRow(row);
-    return IsOffered(row) || place >= m_rows->Count() ? OfferedKey : m_rows->KeyAt(place);
+    return place < m_rows->Count() ? m_rows->KeyAt(place) : OfferedKey; // which stands behind the source's rows
 }
 
 int CTableRows::RowNamed(RowKey name, int row) const

@@ -35,6 +35,10 @@ public:
     std::size_t SourceRow(int row) const;
     /// Where a row of the source is shown; -1 for a hidden one.
     int ShownRow(std::size_t sourceRow) const;
+    /// How many lines the source has, shown or not, without fixed rows.
+    int LineCount() const { return m_rows ? int(m_rows->Count()) - FixedRows() : 0; }
+    /// "2 of 5 shown"; empty where no filter hides lines.
+    QString CountText() const;
     /// The number of a line, from 1, as the user knows it: that in the file.
     int LineNumber(int row) const { return int(SourceRow(row)) + 1; }
     /// The object of a row of the source; null for the offered one.
@@ -100,7 +104,4 @@ protected:
     std::vector<SortKey> m_sortedBy;
     QStringList m_filters;
     std::optional<std::size_t> m_changedAt; // where a step that is being made puts lines in or takes them out
-
-private:
-    bool IsOffered(int row) const { return OffersRow() && row == StoredRows(); }
 };

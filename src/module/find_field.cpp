@@ -2,6 +2,7 @@
 
 #include "document/document.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_texts.h"
 #include "ks/language/language.h"
 #include "module/sheet.h"
 #include "pages/framework/page.h"
@@ -155,6 +156,9 @@ public:
         m_ok = buttons->button(QDialogButtonBox::Ok);
         layout->addWidget(m_text);
         layout->addWidget(m_list);
+        m_none = new QLabel(GridTexts::tr("Searched item not found"));
+        m_none->setWordWrap(true);
+        layout->addWidget(m_none);
         layout->addWidget(buttons);
         connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
         connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
@@ -194,12 +198,14 @@ private:
             m_list->addTopLevelItem(new QTreeWidgetItem({field->title, field->page, field->keyword}));
         m_list->setCurrentItem(m_list->topLevelItem(0));
         m_ok->setEnabled(!m_matching.empty());
+        m_none->setVisible(m_matching.empty());
     }
 
     const std::vector<FoundField>& m_fields;
     std::vector<const FoundField*> m_matching;
     QLineEdit* m_text;
     QTreeWidget* m_list;
+    QLabel* m_none; // says that nothing is found
     QPushButton* m_ok;
 };
 

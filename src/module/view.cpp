@@ -142,6 +142,13 @@ CString CKavo0_hdView::PlaceText() const
     return grid ? grid->LineText() : CString();
 }
 
+CString CKavo0_hdView::SelectionText() const
+{
+    const auto* page = ActivePage();
+    const auto* grid = page ? page->LinesGrid() : nullptr;
+    return grid ? grid->SelectionText() : CString();
+}
+
 void CKavo0_hdView::EnableLinesMenu(bool enable)
 {
     m_linesEnabled = enable;

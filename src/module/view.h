@@ -51,6 +51,7 @@ protected:
     LRESULT OnRequest(WPARAM request, CKSComm_Package& package) override;
     void RevealChange(const ChangePlace& place) override;
     CString PlaceText() const override;
+    CString SelectionText() const override;
 
 private:
     void FetchLocation();

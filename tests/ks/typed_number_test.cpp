@@ -130,4 +130,6 @@ TEST_F(TypedNumber, NamesOfAFormulaStandForTheNumbersGiven)
     EXPECT_EQ(formula.Value(std::array{1.0, 10.0}), 20);
     EXPECT_EQ(formula.Value(std::array{3.0, 0.5}), 1.5);
     EXPECT_NE(CKsFormula("valu*2", {"value"}).Fault(), "");
+    EXPECT_EQ(CKsFormula(QString("1").leftJustified(1000)).Fault(), "");
+    EXPECT_NE(CKsFormula(QString("1").leftJustified(1001)).Fault(), "");
 }

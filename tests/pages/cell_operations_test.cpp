@@ -108,6 +108,9 @@ TEST_F(CellOperationsTest, InterpolationGoesAlongEachBranch)
     grid->ChangeView([](CGridModel& model) { model.Filter({"", "!=0"}); }); // hides the first of A, which is known
     EXPECT_DOUBLE_EQ(levels({0, Level, 0, Level}, KnownValues::Neighbours, false, 0)[1], 10 - 10.0 / 3);
     grid->ChangeView([](CGridModel& model) { model.Filter({}); });
+    init.GetAt(1).RiverName = "B";
+    EXPECT_EQ(levels({1, Level, 1, Level}, KnownValues::Neighbours, true, 1), Levels()) << "no line through one value";
+    init.GetAt(1).RiverName = "A";
     init.GetAt(4).InitialH = 6;
     EXPECT_EQ(levels({3, Level, 3, Level}, KnownValues::Neighbours, true, 0), (QList<double>{10, 0, 7, 9, 6}));
     init.GetAt(4).Chainage = 400; // two at one place
@@ -143,6 +146,29 @@ TEST_F(CellOperationsTest, WhatCannotChangeStaysAndIsListed)
     init.GetAt(0).InitialH = 8.5 * 0.3048;
     init.GetAt(1).InitialH = 8.7 * 0.3048;
     EXPECT_EQ(StepOf(rows, {0, Level, 1, Level}), 0.2);
+}
+
+TEST_F(CellOperationsTest, IntegersStayWithinTheirBounds)
+{
+    std::vector<std::int32_t> numbers{-1, 1};
+    CGridModel model;
+    model.AddColumn({.header = [] { return QString("Count"); },
+                     .control = Control::Integer,
+                     .access = std::make_shared<CellAccess>(
+                         CellAccess{[](const void* row) -> CellValue { return *static_cast<const std::int32_t*>(row); },
+                                    [](void* row, const CellValue& value) {
+                                        *static_cast<std::int32_t*>(row) = std::get<std::int32_t>(value);
+                                    }})});
+    model.SetSource(document, std::make_shared<VectorRows<std::int32_t>>(numbers));
+    const FormulaNames names = NamesForFormula(model);
+    const auto calculate = [&](const char* text) {
+        CCellResults results = Calculate(model, {0, 0, 1, 0}, CKsFormula(text, names.names), names);
+        EXPECT_EQ(results.ChangedCount() + results.KeptCount(), 2u);
+        return results.ChangedCount();
+    };
+    EXPECT_EQ(calculate("value * 2147483648"), 1u) << "the least, and one more than the largest";
+    EXPECT_EQ(calculate("value * 2147483647"), 2u);
+    EXPECT_EQ(calculate("value * 2147483649"), 0u);
 }
 
 TEST_F(CellOperationsTest, TheDialogShowsWhatWouldChangeAndKeysRunIt)

@@ -5,11 +5,21 @@
 #include "grid/grid_header.h"
 #include "grid/grid_search.h"
 #include "grid/lines_view.h"
+#include "grid/vector_rows.h"
 #include "pages/page_table.h"
 
 #include <QClipboard>
+#include <QDialogButtonBox>
+#include <QHeaderView>
+#include <QLabel>
 #include <QLineEdit>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QScrollBar>
+#include <QSignalSpy>
+#include <QTimer>
 #include <algorithm>
+#include <cmath>
 #include <random>
 
 class LinesViewTest : public PageTest
@@ -82,8 +92,10 @@ TEST_F(LinesViewTest, EditedLinesStayWhereTheyAre)
 {
     Sort(H);
     ASSERT_EQ(Lines(), "2 4 3 1 5");
+    QSignalSpy headers(grid->model(), &QAbstractItemModel::headerDataChanged);
     Enter(1, H, "9");
     EXPECT_EQ(init.GetAt(1).InitialH, 9) << "line 2 of the file";
+    EXPECT_EQ(headers.count(), 0) << "to paint them costs as much as the lines do";
     EXPECT_EQ(Lines(), "2 4 3 1 5");
     grid->SetCurrentCell(1, Q);
     QTest::keyClick(grid, Qt::Key_F5);
@@ -230,6 +242,106 @@ TEST_F(LinesViewTest, FieldsBelowTheHeaders)
     EXPECT_FALSE(field->isVisible());
 }
 
+TEST_F(LinesViewTest, TheStatusTellsOfWhatThereIs)
+{
+    grid->selectionModel()->select({grid->model()->index(0, H - 1), grid->model()->index(2, H - 1)},
+                                   QItemSelectionModel::ClearAndSelect);
+    const auto sum = [this] { return grid->SelectionText().section("sum ", 1).section(',', 0, 0); };
+    EXPECT_TRUE(QTest::qWaitFor([&] { return sum() == "6"; })) << grid->SelectionText().toStdString();
+    init.GetAt(0).InitialH = 13;
+    grid->Reload();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return sum() == "16"; })) << "of the numbers of now";
+    Filter(Name, "rhine");
+    SelectRows(1, 3);
+    view->page->DeleteLines();
+    EXPECT_EQ(grid->LineText(), "0 of 2 shown");
+    Filter(Name, "!=x");
+    SelectRows(1, 2);
+    view->page->DeleteLines();
+    EXPECT_TRUE(grid->LineText().startsWith("Line 1 of 1")) << grid->LineText().toStdString();
+}
+
+TEST_F(LinesViewTest, AClickWithCtrlSelectsNothingElsewhere)
+{
+    QStringList said;
+    QObject::connect(&document, &CKsDoc::Said, &document, [&said](const QString& text) { said << text; });
+    const auto click = [this](int row, Qt::KeyboardModifiers held) {
+        QTest::mouseClick(grid->verticalHeader()->viewport(), Qt::LeftButton, held,
+                          {5, grid->rowViewportPosition(row - 1) + 5});
+    };
+    click(1, {});
+    click(4, Qt::ControlModifier);
+    EXPECT_EQ(said.size(), 1);
+    view->page->DeleteLines();
+    EXPECT_EQ(init.GetCount(), 4u) << "nothing but the line that is shown selected";
+    click(1, {});
+    click(3, Qt::ShiftModifier);
+    view->page->DeleteLines();
+    EXPECT_EQ(init.GetCount(), 1u);
+}
+
+TEST_F(LinesViewTest, TheBarBesideTheCountIsThereToBeMoved)
+{
+    grid->resize(900, 300);
+    Filter(Name, "=RHINE");
+    QTest::qWait(10);
+    EXPECT_TRUE(grid->findChild<QLabel*>("shownLines")->isVisible());
+    EXPECT_FALSE(grid->horizontalScrollBar()->isVisible());
+    EXPECT_EQ(grid->findChild<QLineEdit*>("filter1")->cursorPosition(), 0) << "the beginning is in sight";
+    grid->setColumnWidth(0, 2000);
+    QTest::qWait(10);
+    EXPECT_TRUE(grid->horizontalScrollBar()->isVisible());
+    Filter(Name, "");
+    QTest::qWait(10);
+    EXPECT_TRUE(grid->horizontalScrollBar()->isVisible());
+}
+
+/// Rows that are named by their places.
+TEST(ShownRows, FollowsLinesThatComeAndGo)
+{
+    std::vector<double> numbers{5, 4, 3, 2, 1};
+    VectorRows<double> rows(numbers);
+    CShownRows shown;
+    shown.Sort(rows, {4, 3, 2, 1, 0});
+    shown.Hide(rows, {false, false, false, true, false});
+    const auto lines = [&] {
+        QStringList texts;
+        for (std::size_t row = 0; row < shown.Count(); ++row)
+            texts << QString::number(numbers[shown.SourceRow(row)]);
+        return texts.join(' ');
+    };
+    numbers.insert(numbers.begin() + 1, 9);
+    ASSERT_TRUE(shown.Follow(rows, 1));
+    EXPECT_EQ(lines(), "1 3 9 4 5");
+    numbers.erase(numbers.begin());
+    ASSERT_TRUE(shown.Follow(rows, 0));
+    EXPECT_EQ(lines(), "1 3 9 4");
+    numbers.push_back(8);
+    ASSERT_TRUE(shown.Follow(rows, 5));
+    EXPECT_EQ(lines(), "1 3 9 4 8");
+    numbers.pop_back();
+    EXPECT_FALSE(shown.Follow(rows, {})) << "nobody says where";
+}
+
+TEST(RowOrder, EqualNumbersStayAsTheyStandAndThoseThatAreNoneComeLast)
+{
+    std::vector<double> numbers{1};
+    VectorRows<double> rows(numbers);
+    std::vector<ColumnSpec> columns(1);
+    columns[0].access = std::make_shared<CellAccess>(
+        CellAccess{[](const void* row) -> CellValue { return *static_cast<const double*>(row); }, {}});
+    SourceRows expected;
+    for (std::uint32_t row = 1; row < 100; ++row) {
+        numbers.push_back(row % 2 ? 0.0 : -0.0);
+        expected.push_back(row);
+    }
+    expected.push_back(0);
+    EXPECT_EQ(SortedRows(rows, columns, {{0}}), expected);
+    numbers = {std::nan(""), 2, NotGiven, -1};
+    EXPECT_EQ(SortedRows(rows, columns, {{0}}), (SourceRows{3, 1, 0, 2}));
+    EXPECT_EQ(SortedRows(rows, columns, {{0, true}}), (SourceRows{1, 3, 0, 2}));
+}
+
 TEST_F(LinesViewTest, NewLinesStayInSight)
 {
     Filter(Name, "rhine");
@@ -269,6 +381,21 @@ TEST_F(LinesViewTest, WhatIsHiddenIsShownToWhoGoesThere)
     EXPECT_EQ(Current(), std::pair(2, int(H)));
     int row = 0;
     EXPECT_FALSE(SearchRows(*grid, row, {.name = "RHINE", .nameMatch = NameMatch::Whole}));
+
+    CGridSearch search;
+    answer = QMessageBox::Yes;
+    QTimer::singleShot(0, grid, [] {
+        auto* dialog = QApplication::activeModalWidget();
+        ASSERT_TRUE(dialog);
+        QTest::keyClicks(dialog->findChild<QLineEdit*>("riverName_1058"), "rhine");
+        dialog->findChild<QRadioButton*>("fullMatch_1060")->click();
+        dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->click();
+    });
+    search.Run(Command::Search, *grid);
+    ASSERT_EQ(boxes.size(), 1);
+    EXPECT_TRUE(boxes[0].contains("Line 1 ") && boxes[0].contains("hidden by the filter")) << boxes[0].toStdString();
+    EXPECT_EQ(Lines(), "1 2 4");
+    EXPECT_EQ(Current().first, 1);
 }
 
 /// Whatever is done to what is shown, hidden lines keep every bit and their order, and undo gives the file back.

@@ -192,14 +192,6 @@
         <translation>コピー</translation>
     </message>
     <message>
-        <source>Search again</source>
-        <translation>次を検索</translation>
-    </message>
-    <message>
-        <source>Search</source>
-        <translation>検索</translation>
-    </message>
-    <message>
         <source>Undo</source>
         <translation>元に戻す</translation>
     </message>
@@ -248,6 +240,10 @@
         <translation>検索した項目が見つかりません</translation>
     </message>
     <message>
+        <source>Line %1 is what is searched, but hidden by the filter. Show it?</source>
+        <translation>%1 行目が該当しますが、絞り込みで隠れています。表示しますか?</translation>
+    </message>
+    <message>
         <source>Deletion of lines</source>
         <translation>行の削除</translation>
     </message>
@@ -276,20 +272,8 @@
         <translation>%1 以下</translation>
     </message>
     <message>
-        <source>Fill down</source>
-        <translation>下方向へコピー</translation>
-    </message>
-    <message>
-        <source>Fill with a series</source>
-        <translation>連続データで埋める</translation>
-    </message>
-    <message>
         <source>Interpolate along the chainage</source>
         <translation>追加距離に沿って補間</translation>
-    </message>
-    <message>
-        <source>Calculate</source>
-        <translation>計算</translation>
     </message>
     <message>
         <source>Fill Dow&amp;n</source>
@@ -380,12 +364,8 @@
         <translation>式(&amp;F):</translation>
     </message>
     <message>
-        <source>&quot;value&quot; is the number of the cell itself. Numbers are in the units shown. Other columns of the line: %1. Functions: min, max, abs, sqrt, rint, ln, log10, exp, sin, ...</source>
-        <translation>「value」はセル自身の数値です。数値は表示中の単位です。同じ行のほかの列: %1。関数: min, max, abs, sqrt, rint, ln, log10, exp, sin など</translation>
-    </message>
-    <message>
-        <source>Fill with a Series</source>
-        <translation>連続データで埋める</translation>
+        <source>&quot;value&quot; is the number of the cell itself. Numbers are in the units shown. Other columns of the line: %1; in every language: %2. Functions: min, max, abs, sqrt, rint, ln, log10, exp, sin, ...</source>
+        <translation>「value」はセル自身の数値です。数値は表示中の単位です。同じ行のほかの列: %1 (どの言語でも: %2)。関数: min, max, abs, sqrt, rint, ln, log10, exp, sin など</translation>
     </message>
     <message>
         <source>Step</source>
@@ -394,10 +374,6 @@
     <message>
         <source>&amp;Step from line to line:</source>
         <translation>行ごとの増分(&amp;S):</translation>
-    </message>
-    <message>
-        <source>Interpolate</source>
-        <translation>補間</translation>
     </message>
     <message>
         <source>Between the &amp;first and the last selected line of each branch</source>
@@ -480,20 +456,8 @@
         <translation>現在の列で降順に並べ替え</translation>
     </message>
     <message>
-        <source>Sort by branch and chainage</source>
-        <translation>河川名と追加距離で並べ替え</translation>
-    </message>
-    <message>
-        <source>Order of the file</source>
-        <translation>ファイルの順序</translation>
-    </message>
-    <message>
         <source>Filter the lines</source>
         <translation>行の絞り込み</translation>
-    </message>
-    <message>
-        <source>Sort and filter afresh</source>
-        <translation>並べ替えと絞り込みをやり直す</translation>
     </message>
     <message>
         <source>Sorting of lines</source>
@@ -536,12 +500,12 @@
         <translation>絞り込みに該当する行がありません。</translation>
     </message>
     <message>
-        <source>Line %1 does not pass the filter; it is shown until the filter changes.</source>
-        <translation>%1 行目は絞り込みに該当しませんが、絞り込みを変更するまで表示します。</translation>
+        <source>Only what stands together can be selected: click where it begins and, with Shift, where it ends.</source>
+        <translation>選択できるのは連続した範囲だけです。先頭をクリックし、末尾を Shift を押しながらクリックしてください。</translation>
     </message>
     <message>
-        <source>Lines that the filter hides were not looked at.</source>
-        <translation>絞り込みで隠れている行は検索していません。</translation>
+        <source>Line %1 does not pass the filter; it is shown until the filter changes.</source>
+        <translation>%1 行目は絞り込みに該当しませんが、絞り込みを変更するまで表示します。</translation>
     </message>
     <message>
         <source>%1 cells selected</source>

@@ -72,7 +72,7 @@ void CKsProjectView::ShowStatus()
     const CString place = PlaceText();
     if (place != m_saidAt)
         m_said.clear();
-    QStringList parts{place, m_said};
+    QStringList parts{place, SelectionText(), m_said};
     parts.removeAll(CString());
     MainFrame()->TellStatus(parts.join(QStringLiteral("   ")));
 }

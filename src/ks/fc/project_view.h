@@ -29,6 +29,8 @@ protected:
     virtual void RevealChange(const ChangePlace&) {}
     /// Where the user is, for the status bar.
     virtual CString PlaceText() const { return {}; }
+    /// What is selected there. It may come later, and ends nothing that is told.
+    virtual CString SelectionText() const { return {}; }
     /// The content below the bar that tells of the document's file.
     void SetContent(QWidget* content);
     /// In the status bar, while this view is the active one: where the user is, and what has just been done.

@@ -3,6 +3,7 @@
 
 #include <QRegularExpression>
 #include <array>
+#include <bit>
 #include <charconv>
 #include <cmath>
 #include <cstdint>
@@ -74,7 +75,7 @@ double KsFifteenDigits(double value, double of)
     // Up to 10^22 powers of ten are doubles, and so is a whole number of fifteen digits: the quotient is the nearest
     // double to the decimal number.
     static constexpr int LargestPower = 22;
-    static const auto powers = [] {
+    static constexpr auto powers = [] {
         std::array<double, LargestPower + 1> table{1};
         for (int power = 1; power <= LargestPower; ++power)
             table[std::size_t(power)] = table[std::size_t(power) - 1] * 10;
@@ -82,10 +83,10 @@ double KsFifteenDigits(double value, double of)
     }();
     if (of == 0 || !std::isfinite(of) || !std::isfinite(value))
         return value;
-    constexpr double MostDigits = 1e15, Log2 = 0.30102999566398120; // decimal
-    int exponent = 0;
-    std::frexp(of, &exponent); // 2^(exponent - 1) is not more than the number
-    int power = 14 - int(std::floor((exponent - 1) * Log2));
+    constexpr double MostDigits = 1e15;
+    // 2^exponent is not more than the number, and 1233/4096 the decimal logarithm of 2 as far as there are powers.
+    const int exponent = int(std::bit_cast<std::uint64_t>(of) >> 52 & 0x7ff) - 1023;
+    int power = 14 - (exponent * 1233 >> 12);
     if (power >= 1 && power <= LargestPower && std::fabs(of) * powers[std::size_t(power)] >= MostDigits)
         --power;
     if (power < 0 || power > LargestPower)
