@@ -2,7 +2,6 @@
 
 #include "document/document.h"
 #include "grid/gen_grid.h"
-#include "grid/grid_texts.h"
 #include "ks/language/language.h"
 #include "module/sheet.h"
 #include "pages/framework/page.h"
@@ -156,7 +155,7 @@ public:
         m_ok = buttons->button(QDialogButtonBox::Ok);
         layout->addWidget(m_text);
         layout->addWidget(m_list);
-        m_none = new QLabel(GridTexts::tr("Searched item not found"));
+        m_none = new QLabel(LoadString(Str::FindFieldNone));
         m_none->setWordWrap(true);
         layout->addWidget(m_none);
         layout->addWidget(buttons);

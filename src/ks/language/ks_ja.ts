@@ -2,6 +2,51 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ja" sourcelanguage="en_US">
 <context>
+    <name>CKsDifferenceDialog</name>
+    <message>
+        <source>lines: %1</source>
+        <translation>行数: %1</translation>
+    </message>
+    <message>
+        <source>The first %1 places are listed.</source>
+        <translation>最初の %1 か所を表示しています。</translation>
+    </message>
+    <message>
+        <source>Section
+Keyword
+Number
+Parameter</source>
+        <translation>セクション
+キーワード
+番号
+パラメータ</translation>
+    </message>
+    <message>
+        <source>&amp;Close</source>
+        <translation>閉じる(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Nothing differs.</source>
+        <translation>相違はありません。</translation>
+    </message>
+    <message>
+        <source>values changed: %1</source>
+        <translation>変更された値: %1</translation>
+    </message>
+    <message>
+        <source>lines added: %1</source>
+        <translation>追加された行: %1</translation>
+    </message>
+    <message>
+        <source>lines removed: %1</source>
+        <translation>削除された行: %1</translation>
+    </message>
+    <message>
+        <source>Sections: %1; %2.</source>
+        <translation>セクション: %1; %2。</translation>
+    </message>
+</context>
+<context>
     <name>CKsDoc</name>
     <message>
         <source>The file does not exist.</source>
@@ -48,79 +93,6 @@
     <message>
         <source>Redone: %1</source>
         <translation>やり直しました: %1</translation>
-    </message>
-</context>
-<context>
-    <name>CKsEditLong</name>
-    <message>
-        <source>Enter an integer from %1 to %2.</source>
-        <translation>%1 から %2 までの整数を入力してください。</translation>
-    </message>
-    <message>
-        <source>Enter an integer.</source>
-        <translation>整数を入力してください。</translation>
-    </message>
-    <message>
-        <source>Enter a number.</source>
-        <translation>数値を入力してください。</translation>
-    </message>
-</context>
-<context>
-    <name>CKsFormula</name>
-    <message>
-        <source>&quot;%1&quot; is no name or function known here.</source>
-        <translation>「%1」はここで使える名前または関数ではありません。</translation>
-    </message>
-    <message>
-        <source>The brackets of &quot;%1&quot; do not match.</source>
-        <translation>「%1」の括弧が対応していません。</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; has too many or too few values in its brackets.</source>
-        <translation>「%1」の括弧内の値の数が正しくありません。</translation>
-    </message>
-    <message>
-        <source>The formula ends where a number is expected.</source>
-        <translation>数値が必要な位置で式が終わっています。</translation>
-    </message>
-    <message>
-        <source>The formula cannot be read at character %1.</source>
-        <translation>式の %1 文字目を解釈できません。</translation>
-    </message>
-    <message>
-        <source>A formula sets nothing: two numbers are compared with &quot;==&quot;.</source>
-        <translation>式で値の代入はできません。比較には「==」を使ってください。</translation>
-    </message>
-    <message>
-        <source>The formula is longer than %1 characters.</source>
-        <translation>式が %1 文字を超えています。</translation>
-    </message>
-    <message>
-        <source>The formula has a comma outside of brackets; the decimal separator is the point.</source>
-        <translation>式の括弧の外にコンマがあります。小数点にはピリオドを使ってください。</translation>
-    </message>
-</context>
-<context>
-    <name>CKsEditStyle</name>
-    <message>
-        <source>The result of &quot;%1&quot; is no number.</source>
-        <translation>「%1」の結果は数値になりません。</translation>
-    </message>
-    <message>
-        <source>The result of &quot;%1&quot; is no integer.</source>
-        <translation>「%1」の結果は整数になりません。</translation>
-    </message>
-    <message>
-        <source>This number has no unit; &quot;%1&quot; cannot stand here.</source>
-        <translation>この数値には単位がありません。「%1」は入力できません。</translation>
-    </message>
-    <message>
-        <source>&quot;%1&quot; is no unit of this quantity. Possible are %2.</source>
-        <translation>「%1」はこの量の単位ではありません。使える単位: %2。</translation>
-    </message>
-    <message>
-        <source>Unit: %1</source>
-        <translation>単位: %1</translation>
     </message>
 </context>
 <context>
@@ -229,6 +201,44 @@ Save?</source>
     </message>
 </context>
 <context>
+    <name>CKsEditLong</name>
+    <message>
+        <source>Enter an integer from %1 to %2.</source>
+        <translation>%1 から %2 までの整数を入力してください。</translation>
+    </message>
+    <message>
+        <source>Enter an integer.</source>
+        <translation>整数を入力してください。</translation>
+    </message>
+    <message>
+        <source>Enter a number.</source>
+        <translation>数値を入力してください。</translation>
+    </message>
+</context>
+<context>
+    <name>CKsEditStyle</name>
+    <message>
+        <source>The result of &quot;%1&quot; is no number.</source>
+        <translation>「%1」の結果は数値になりません。</translation>
+    </message>
+    <message>
+        <source>The result of &quot;%1&quot; is no integer.</source>
+        <translation>「%1」の結果は整数になりません。</translation>
+    </message>
+    <message>
+        <source>This number has no unit; &quot;%1&quot; cannot stand here.</source>
+        <translation>この数値には単位がありません。「%1」は入力できません。</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no unit of this quantity. Possible are %2.</source>
+        <translation>「%1」はこの量の単位ではありません。使える単位: %2。</translation>
+    </message>
+    <message>
+        <source>Unit: %1</source>
+        <translation>単位: %1</translation>
+    </message>
+</context>
+<context>
     <name>CKsFileBar</name>
     <message>
         <source>its file system has no locks</source>
@@ -298,129 +308,6 @@ Save?</source>
     <message>
         <source>%1 on %2 (%3, process %4)</source>
         <translation>%2 の %1 (%3、プロセス %4)</translation>
-    </message>
-</context>
-<context>
-    <name>CKsOutsideChange</name>
-    <message>
-        <source>%1 was changed by another program (%2), and the changes made here are not saved. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite saves it here; the file as it is stays in a copy beside it.</source>
-        <translation>%1 がほかのプログラムによって変更されました (%2)。ここで行った変更はまだ保存されていません。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示を保存し、今のファイルのコピーを隣に残します。</translation>
-    </message>
-    <message>
-        <source>%1 was changed by another program (%2). What is shown is the content before.</source>
-        <translation>%1 がほかのプログラムによって変更されました (%2)。表示されているのは変更前の内容です。</translation>
-    </message>
-    <message>
-        <source>%1 was changed by another program (%2). What is shown is the content before. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite puts it back; the file as it is stays in a copy beside it.</source>
-        <translation>%1 がほかのプログラムによって変更されました (%2)。表示されているのは変更前の内容です。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示をファイルに書き戻し、今のファイルのコピーを隣に残します。</translation>
-    </message>
-    <message>
-        <source>The file cannot be loaded as it is, and what is shown stays: %1</source>
-        <translation>今のファイルは読み込めないため、表示はそのままです: %1</translation>
-    </message>
-    <message>
-        <source>Reload</source>
-        <translation>再読み込み</translation>
-    </message>
-    <message>
-        <source>Compare...</source>
-        <translation>比較...</translation>
-    </message>
-    <message>
-        <source>Keep Both...</source>
-        <translation>両方残す...</translation>
-    </message>
-    <message>
-        <source>Overwrite</source>
-        <translation>上書き</translation>
-    </message>
-    <message>
-        <source>Save As...</source>
-        <translation>名前を付けて保存...</translation>
-    </message>
-    <message>
-        <source>Save Again</source>
-        <translation>もう一度保存</translation>
-    </message>
-    <message>
-        <source>%1 was removed or renamed by another program (%2). What is shown is nowhere else until it is saved again.</source>
-        <translation>%1 はほかのプログラムによって削除されたか、名前が変更されました (%2)。表示されている内容は、もう一度保存するまでほかのどこにもありません。</translation>
-    </message>
-    <message>
-        <source>The folder of %1 was removed or renamed by another program (%2). What is shown can be saved under another name only.</source>
-        <translation>%1 のフォルダがほかのプログラムによって削除されたか、名前が変更されました (%2)。表示中の内容は別の名前でのみ保存できます。</translation>
-    </message>
-    <message>
-        <source>%1 cannot be read any more: %2. What is shown stays; to be safe save it under another name.</source>
-        <translation>%1 を読み込めなくなりました: %2。表示はそのままです。念のため別の名前で保存してください。</translation>
-    </message>
-    <message>
-        <source>What differs is not known: the file cannot be read.</source>
-        <translation>相違点は不明です: ファイルを読み取れません。</translation>
-    </message>
-    <message>
-        <source>Changes of %1 by Another Program</source>
-        <translation>ほかのプログラムによる %1 の変更</translation>
-    </message>
-    <message>
-        <source>Shown</source>
-        <translation>表示中</translation>
-    </message>
-    <message>
-        <source>In the file</source>
-        <translation>ファイル</translation>
-    </message>
-</context>
-<context>
-    <name>CKsProjectDoc</name>
-    <message>
-        <source>Reload</source>
-        <translation>再読み込み</translation>
-    </message>
-</context>
-<context>
-    <name>CKsDifferenceDialog</name>
-    <message>
-        <source>lines: %1</source>
-        <translation>行数: %1</translation>
-    </message>
-    <message>
-        <source>The first %1 places are listed.</source>
-        <translation>最初の %1 か所を表示しています。</translation>
-    </message>
-    <message>
-        <source>Section
-Keyword
-Number
-Parameter</source>
-        <translation>セクション
-キーワード
-番号
-パラメータ</translation>
-    </message>
-    <message>
-        <source>&amp;Close</source>
-        <translation>閉じる(&amp;C)</translation>
-    </message>
-    <message>
-        <source>Nothing differs.</source>
-        <translation>相違はありません。</translation>
-    </message>
-    <message>
-        <source>values changed: %1</source>
-        <translation>変更された値: %1</translation>
-    </message>
-    <message>
-        <source>lines added: %1</source>
-        <translation>追加された行: %1</translation>
-    </message>
-    <message>
-        <source>lines removed: %1</source>
-        <translation>削除された行: %1</translation>
-    </message>
-    <message>
-        <source>Sections: %1; %2.</source>
-        <translation>セクション: %1; %2。</translation>
     </message>
 </context>
 <context>
@@ -529,6 +416,131 @@ Used instead</source>
 ファイルの内容
 期待される内容
 代わりに使う値</translation>
+    </message>
+</context>
+<context>
+    <name>CKsFormula</name>
+    <message>
+        <source>&quot;%1&quot; is no name or function known here.</source>
+        <translation>「%1」はここで使える名前または関数ではありません。</translation>
+    </message>
+    <message>
+        <source>The brackets of &quot;%1&quot; do not match.</source>
+        <translation>「%1」の括弧が対応していません。</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; has too many or too few values in its brackets.</source>
+        <translation>「%1」の括弧内の値の数が正しくありません。</translation>
+    </message>
+    <message>
+        <source>The formula ends where a number is expected.</source>
+        <translation>数値が必要な位置で式が終わっています。</translation>
+    </message>
+    <message>
+        <source>The formula cannot be read at character %1.</source>
+        <translation>式の %1 文字目を解釈できません。</translation>
+    </message>
+    <message>
+        <source>A formula sets nothing: two numbers are compared with &quot;==&quot;.</source>
+        <translation>式で値の代入はできません。比較には「==」を使ってください。</translation>
+    </message>
+    <message>
+        <source>The formula is longer than %1 characters.</source>
+        <translation>式が %1 文字を超えています。</translation>
+    </message>
+    <message>
+        <source>The formula has a comma outside of brackets; the decimal separator is the point.</source>
+        <translation>式の括弧の外にコンマがあります。小数点にはピリオドを使ってください。</translation>
+    </message>
+</context>
+<context>
+    <name>CKsOutsideChange</name>
+    <message>
+        <source>%1 was changed by another program (%2), and the changes made here are not saved. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite saves it here; the file as it is stays in a copy beside it.</source>
+        <translation>%1 がほかのプログラムによって変更されました (%2)。ここで行った変更はまだ保存されていません。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示を保存し、今のファイルのコピーを隣に残します。</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program (%2). What is shown is the content before.</source>
+        <translation>%1 がほかのプログラムによって変更されました (%2)。表示されているのは変更前の内容です。</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program (%2). What is shown is the content before. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite puts it back; the file as it is stays in a copy beside it.</source>
+        <translation>%1 がほかのプログラムによって変更されました (%2)。表示されているのは変更前の内容です。「再読み込み」はファイルの内容を取り込みます。元に戻すと、今の表示に戻ります。「両方残す」は今の表示を別の名前で保存します。「上書き」は今の表示をファイルに書き戻し、今のファイルのコピーを隣に残します。</translation>
+    </message>
+    <message>
+        <source>The file cannot be loaded as it is, and what is shown stays: %1</source>
+        <translation>今のファイルは読み込めないため、表示はそのままです: %1</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>再読み込み</translation>
+    </message>
+    <message>
+        <source>Compare...</source>
+        <translation>比較...</translation>
+    </message>
+    <message>
+        <source>Keep Both...</source>
+        <translation>両方残す...</translation>
+    </message>
+    <message>
+        <source>Overwrite</source>
+        <translation>上書き</translation>
+    </message>
+    <message>
+        <source>Save As...</source>
+        <translation>名前を付けて保存...</translation>
+    </message>
+    <message>
+        <source>Save Again</source>
+        <translation>もう一度保存</translation>
+    </message>
+    <message>
+        <source>%1 was removed or renamed by another program (%2). What is shown is nowhere else until it is saved again.</source>
+        <translation>%1 はほかのプログラムによって削除されたか、名前が変更されました (%2)。表示されている内容は、もう一度保存するまでほかのどこにもありません。</translation>
+    </message>
+    <message>
+        <source>The folder of %1 was removed or renamed by another program (%2). What is shown can be saved under another name only.</source>
+        <translation>%1 のフォルダがほかのプログラムによって削除されたか、名前が変更されました (%2)。表示中の内容は別の名前でのみ保存できます。</translation>
+    </message>
+    <message>
+        <source>%1 cannot be read any more: %2. What is shown stays; to be safe save it under another name.</source>
+        <translation>%1 を読み込めなくなりました: %2。表示はそのままです。念のため別の名前で保存してください。</translation>
+    </message>
+    <message>
+        <source>What differs is not known: the file cannot be read.</source>
+        <translation>相違点は不明です: ファイルを読み取れません。</translation>
+    </message>
+    <message>
+        <source>Changes of %1 by Another Program</source>
+        <translation>ほかのプログラムによる %1 の変更</translation>
+    </message>
+    <message>
+        <source>Shown</source>
+        <translation>表示中</translation>
+    </message>
+    <message>
+        <source>In the file</source>
+        <translation>ファイル</translation>
+    </message>
+</context>
+<context>
+    <name>CKsProjectDoc</name>
+    <message>
+        <source>Reload</source>
+        <translation>再読み込み</translation>
+    </message>
+    <message>
+        <source>%1 was left as it is: it is in use by %2.</source>
+        <translation>%1 はそのままです。%2 が使用中です。</translation>
+    </message>
+    <message>
+        <source>%1 is in use by %2, and is not changed here.</source>
+        <translation>%1 は %2 が使用中のため、ここでは変更しません。</translation>
+    </message>
+    <message>
+        <source>%1 could not be read, and is not changed.</source>
+        <translation>%1 は読み込めなかったため、変更しません。</translation>
     </message>
 </context>
 <context>
@@ -782,21 +794,6 @@ Used instead</source>
     <message>
         <source>%1.</source>
         <translation>%1。</translation>
-    </message>
-</context>
-<context>
-    <name>CKsProjectDoc</name>
-    <message>
-        <source>%1 was left as it is: it is in use by %2.</source>
-        <translation>%1 はそのままです。%2 が使用中です。</translation>
-    </message>
-    <message>
-        <source>%1 is in use by %2, and is not changed here.</source>
-        <translation>%1 は %2 が使用中のため、ここでは変更しません。</translation>
-    </message>
-    <message>
-        <source>%1 could not be read, and is not changed.</source>
-        <translation>%1 は読み込めなかったため、変更しません。</translation>
     </message>
 </context>
 </TS>

@@ -1905,5 +1905,9 @@ Time Step</source>
 地下水頭
 計算時間間隔</translation>
     </message>
+    <message>
+        <source>No field and no page has a name or keyword like this.</source>
+        <translation>この名前またはキーワードの項目やページはありません。</translation>
+    </message>
 </context>
 </TS>

@@ -473,126 +473,6 @@ To have one of them in %1, close its window and open it from the list of %1.</so
     </message>
 </context>
 <context>
-    <name>HelpCommands</name>
-    <message>
-        <source>About %1</source>
-        <translation>%1 のバージョン情報</translation>
-    </message>
-    <message>
-        <source>%1, version %2
-
-Shell of the river model editors.</source>
-        <translation>%1 バージョン %2
-
-河川モデルエディタのシェルです。</translation>
-    </message>
-    <message>
-        <source>Plug-ins</source>
-        <translation>プラグイン</translation>
-    </message>
-    <message>
-        <source>Editor</source>
-        <translation>エディタ</translation>
-    </message>
-    <message>
-        <source>File</source>
-        <translation>ファイル</translation>
-    </message>
-    <message>
-        <source>State</source>
-        <translation>状態</translation>
-    </message>
-    <message>
-        <source>In use</source>
-        <translation>使用中</translation>
-    </message>
-</context>
-<context>
-    <name>LibraryFile</name>
-    <message>
-        <source>it is no library of this system</source>
-        <translation>このシステムのライブラリではありません</translation>
-    </message>
-    <message>
-        <source>the file is cut off, it holds only %1 bytes</source>
-        <translation>ファイルが途中で切れており、%1 バイトしかありません</translation>
-    </message>
-</context>
-<context>
-    <name>LibraryTrial</name>
-    <message>
-        <source>it failed with the error &quot;%1&quot;</source>
-        <translation>エラー「%1」で失敗しました</translation>
-    </message>
-    <message>
-        <source>it failed with an error that it does not name</source>
-        <translation>名前のないエラーで失敗しました</translation>
-    </message>
-    <message>
-        <source>it ended the program that tried it (%1)</source>
-        <translation>試したプログラムが終了しました (%1)</translation>
-    </message>
-    <message>
-        <source>it ended the program that tried it</source>
-        <translation>試したプログラムが終了しました</translation>
-    </message>
-    <message>
-        <source>its start did not end within %1 seconds</source>
-        <translation>起動が %1 秒以内に終わりませんでした</translation>
-    </message>
-</context>
-<context>
-    <name>PluginLoader</name>
-    <message>
-        <source>Its document template %1 is missing or names no file extension.</source>
-        <translation>文書テンプレート %1 がないか、拡張子が定められていません。</translation>
-    </message>
-    <message>
-        <source>It could not be loaded: %1</source>
-        <translation>読み込めませんでした: %1</translation>
-    </message>
-    <message>
-        <source>%1. It is tried again when its file has changed</source>
-        <translation>%1。ファイルが変わると、もう一度試します</translation>
-    </message>
-    <message>
-        <source>It is no editor: it does not export %1.</source>
-        <translation>エディタではありません。次の関数が公開されていません: %1</translation>
-    </message>
-</context>
-<context>
-    <name>ShellMain</name>
-    <message>
-        <source>Shell of the river model editors</source>
-        <translation>河川モデルエディタのシェル</translation>
-    </message>
-    <message>
-        <source>Folder of the editors.</source>
-        <translation>エディタのフォルダ</translation>
-    </message>
-    <message>
-        <source>folder</source>
-        <translation>フォルダ</translation>
-    </message>
-    <message>
-        <source>Files and projects to open.</source>
-        <translation>開くファイルまたはプロジェクト</translation>
-    </message>
-    <message>
-        <source>Start a program of its own, whether one runs already or not.</source>
-        <translation>すでに実行中でも、別のプログラムとして起動します。</translation>
-    </message>
-</context>
-<context>
-    <name>ProjectRespell</name>
-    <message>
-        <source>The project %1 still names %2 and could not be changed: %3.
-The file is found all the same.</source>
-        <translation>プロジェクト %1 は %2 を指したままで、変更できませんでした: %3。
-ファイルはこのままでも見つかります。</translation>
-    </message>
-</context>
-<context>
     <name>CRecovery</name>
     <message>
         <source>The changes to %1 could not be recovered: what was kept of them cannot be read.</source>
@@ -704,6 +584,126 @@ The file is found all the same.</source>
     <message>
         <source>Recovered</source>
         <translation>復元後</translation>
+    </message>
+</context>
+<context>
+    <name>HelpCommands</name>
+    <message>
+        <source>About %1</source>
+        <translation>%1 のバージョン情報</translation>
+    </message>
+    <message>
+        <source>%1, version %2
+
+Shell of the river model editors.</source>
+        <translation>%1 バージョン %2
+
+河川モデルエディタのシェルです。</translation>
+    </message>
+    <message>
+        <source>Plug-ins</source>
+        <translation>プラグイン</translation>
+    </message>
+    <message>
+        <source>Editor</source>
+        <translation>エディタ</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>ファイル</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>状態</translation>
+    </message>
+    <message>
+        <source>In use</source>
+        <translation>使用中</translation>
+    </message>
+</context>
+<context>
+    <name>LibraryFile</name>
+    <message>
+        <source>it is no library of this system</source>
+        <translation>このシステムのライブラリではありません</translation>
+    </message>
+    <message>
+        <source>the file is cut off, it holds only %1 bytes</source>
+        <translation>ファイルが途中で切れており、%1 バイトしかありません</translation>
+    </message>
+</context>
+<context>
+    <name>LibraryTrial</name>
+    <message>
+        <source>it failed with the error &quot;%1&quot;</source>
+        <translation>エラー「%1」で失敗しました</translation>
+    </message>
+    <message>
+        <source>it failed with an error that it does not name</source>
+        <translation>名前のないエラーで失敗しました</translation>
+    </message>
+    <message>
+        <source>it ended the program that tried it (%1)</source>
+        <translation>試したプログラムが終了しました (%1)</translation>
+    </message>
+    <message>
+        <source>it ended the program that tried it</source>
+        <translation>試したプログラムが終了しました</translation>
+    </message>
+    <message>
+        <source>its start did not end within %1 seconds</source>
+        <translation>起動が %1 秒以内に終わりませんでした</translation>
+    </message>
+</context>
+<context>
+    <name>PluginLoader</name>
+    <message>
+        <source>Its document template %1 is missing or names no file extension.</source>
+        <translation>文書テンプレート %1 がないか、拡張子が定められていません。</translation>
+    </message>
+    <message>
+        <source>It could not be loaded: %1</source>
+        <translation>読み込めませんでした: %1</translation>
+    </message>
+    <message>
+        <source>%1. It is tried again when its file has changed</source>
+        <translation>%1。ファイルが変わると、もう一度試します</translation>
+    </message>
+    <message>
+        <source>It is no editor: it does not export %1.</source>
+        <translation>エディタではありません。次の関数が公開されていません: %1</translation>
+    </message>
+</context>
+<context>
+    <name>ProjectRespell</name>
+    <message>
+        <source>The project %1 still names %2 and could not be changed: %3.
+The file is found all the same.</source>
+        <translation>プロジェクト %1 は %2 を指したままで、変更できませんでした: %3。
+ファイルはこのままでも見つかります。</translation>
+    </message>
+</context>
+<context>
+    <name>ShellMain</name>
+    <message>
+        <source>Shell of the river model editors</source>
+        <translation>河川モデルエディタのシェル</translation>
+    </message>
+    <message>
+        <source>Folder of the editors.</source>
+        <translation>エディタのフォルダ</translation>
+    </message>
+    <message>
+        <source>folder</source>
+        <translation>フォルダ</translation>
+    </message>
+    <message>
+        <source>Files and projects to open.</source>
+        <translation>開くファイルまたはプロジェクト</translation>
+    </message>
+    <message>
+        <source>Start a program of its own, whether one runs already or not.</source>
+        <translation>すでに実行中でも、別のプログラムとして起動します。</translation>
     </message>
 </context>
 </TS>
