@@ -78,11 +78,14 @@ QString EditText(const ColumnSpec& column, const CellValue& value)
     return QString::fromStdString(std::get<std::string>(value));
 }
 
-CellReading ReadCell(const ColumnSpec& column, const QString& text)
+CellReading ReadCell(const ColumnSpec& column, const QString& given)
 {
+    const QString text = WithoutLineEnds(given);
     if (column.Kind() == CellKind::Text) {
-        const QString taken = column.control.trimmed ? text.trimmed() : text;
-        return {(column.control.upperCase ? KsBranchKey(taken) : taken).toStdString(), {}};
+        const QString taken = column.control.upperCase ? KsBranchKey(text)
+                              : column.control.trimmed ? text.trimmed()
+                                                       : text;
+        return {taken.toStdString(), UnseenRefusal(taken)};
     }
     if (text.isEmpty())
         return {{}, column.isRequired ? GridTexts::tr("Floating point number required") : QString()};

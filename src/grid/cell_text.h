@@ -21,5 +21,6 @@ struct CellReading
     CellValue value;
     QString refusal; // why the text is no value of the column; empty when it is one
 };
-/// What a typed or pasted text means. Nothing typed is the empty cell.
-CellReading ReadCell(const ColumnSpec& column, const QString& text);
+/// What a typed or pasted text means. Nothing typed is the empty cell. A text that is refused to the user is a value
+/// all the same: other editors may send it.
+CellReading ReadCell(const ColumnSpec& column, const QString& given);

@@ -92,8 +92,10 @@ bool PasteCells(CGenGrid& grid)
     grid.Model()->Paste(top, left, cells, GridTexts::tr("Paste"));
     const auto count = std::accumulate(cells.begin(), cells.end(), std::size_t(0),
                                        [](std::size_t sum, const auto& row) { return sum + std::size_t(row.size()); });
-    grid.Model()->Document()->Say(
-        GridTexts::Counted(count, GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted")));
+    QString done = GridTexts::Counted(count, GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted"));
+    if (std::ranges::any_of(cells, [&](const QStringList& row) { return row.size() != cells.front().size(); }))
+        done += GridTexts::tr("; shorter lines leave their other cells as they were");
+    grid.Model()->Document()->Say(done);
     if (grid.Host())
         grid.Host()->LineEdited(grid); // the project is told when locations came in
     grid.Reload();

@@ -62,5 +62,9 @@ std::vector<QStringList> ReadTable(const QString& text)
         if (at < text.size())
             at += text[at] == u'\r' && at + 1 < text.size() && text[at + 1] == u'\n' ? 2 : 1;
     }
+    // In a single column an empty line is an empty cell.
+    if (std::ranges::any_of(rows, [](const QStringList& row) { return row.size() > 1; }))
+        while (rows.back() == QStringList(QString()))
+            rows.pop_back();
     return rows;
 }

@@ -1,8 +1,9 @@
 #include "grid/typing.h"
 
-#include "ks/fc/message_box.h"
 #include "grid/column_spec.h"
 #include "grid/grid_texts.h"
+#include "ks/fc/message_box.h"
+#include "ks/fc/shown_text.h"
 
 #include <QKeyEvent>
 #include <QLineEdit>
@@ -22,6 +23,14 @@ qsizetype CommonStart(const QString& a, const QString& b)
 qsizetype CommonEnd(const QString& a, const QString& b)
 {
     return std::mismatch(a.rbegin(), a.rend(), b.rbegin(), b.rend()).first - a.rbegin();
+}
+
+QString UnseenName(QChar c)
+{
+    if (c == u'\n' || c == u'\r')
+        return GridTexts::tr("a line end");
+    return c == u'\t' ? GridTexts::tr("a tab")
+                      : QStringLiteral("U+%1").arg(uint(c.unicode()), 4, 16, QLatin1Char('0')).toUpper();
 }
 
 } // namespace
@@ -54,14 +63,32 @@ QString RefusalDetails(const QString& place, const QString& typed, const QString
     return lines.join(u'\n');
 }
 
+QString WithoutLineEnds(QString text)
+{
+    while (text.endsWith(u'\n') || text.endsWith(u'\r'))
+        text.chop(1);
+    return text;
+}
+
+QString UnseenRefusal(const QString& text, Tabs tabs)
+{
+    const QString seen = KsVisibleText(text);
+    for (qsizetype i = 0; i < text.size(); ++i) {
+        if (text[i] != seen[i] && (text[i] != u'\t' || tabs == Tabs::Refused))
+            return GridTexts::tr("A text takes no characters that cannot be seen. Character %1 of this one is %2.")
+                .arg(QString::number(i + 1), UnseenName(text[i]));
+    }
+    return {};
+}
+
 void DropLineEnds(QWidget& widget)
 {
     auto* field = qobject_cast<QLineEdit*>(&widget);
     if (!field && !(field = widget.findChild<QLineEdit*>()))
         return;
     QObject::connect(field, &QLineEdit::textEdited, field, [field] {
-        const int before = field->cursorPosition() - 1;
-        if (before >= 0 && (field->text()[before] == u'\n' || field->text()[before] == u'\r'))
+        const QString before = field->text().first(field->cursorPosition());
+        if (before != WithoutLineEnds(before))
             field->backspace(); // and again, should there be another one
     });
 }

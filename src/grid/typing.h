@@ -13,7 +13,17 @@ class QLineEdit;
 void TellRefusal(QWidget& widget, const QString& message, const QString& details);
 /// The details of such a message, a line each; `allowed` and `unit` may be empty.
 QString RefusalDetails(const QString& place, const QString& typed, const QString& allowed, const QString& unit);
-/// Has the field, or the one in the widget, take what is pasted without the line end behind it, which nobody sees.
+/// What was typed or pasted without the line ends behind it, which nobody sees.
+QString WithoutLineEnds(QString text);
+/// Why such a text is refused: it has characters that nobody sees, or that turn the direction of what follows. Empty
+/// when it has none.
+enum class Tabs
+{
+    Refused,
+    Taken
+};
+QString UnseenRefusal(const QString& text, Tabs tabs = Tabs::Refused);
+/// Has the field, or the one in the widget, take what is pasted without the line ends behind it.
 void DropLineEnds(QWidget& widget);
 /// Why a number that is out of these bounds is not taken.
 QString OutOfRange();

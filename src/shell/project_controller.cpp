@@ -117,7 +117,8 @@ void CProjectController::OpenOtherMembers(CProjectHandle handle, QStringList mis
             tr("These files of the project %1 could not be opened:\n%2").arg(project.name, missing.join(u'\n')));
     TellOfSharedMembers(project);
     if (m_windows.All().size() > 1 && !project.members.isEmpty() && !CWindowManager::ChoseTabs()) {
-        ShowMember(project.handle, project.members.front()); // the first file is the main one
+        if (CKsMDIChildWnd* main = WindowOf(KsExistingSpelling(project.members.front())))
+            m_frame.MdiArea().setActiveSubWindow(main);
         m_windows.PlaceSideBySide();
     }
     emit Changed();
@@ -198,6 +199,13 @@ QStringList CProjectController::OpenMembers(const CProject& project, const QStri
     return missing;
 }
 
+/// What an editor says of a file, with the file's name: some say no more than what they expect.
+static QString Named(const QString& member, const QString& text)
+{
+    const QString name = QFileInfo(member).fileName();
+    return text.contains(name) ? text : CProjectController::tr("%1: %2").arg(QDir::toNativeSeparators(member), text);
+}
+
 /// Why a member could not be opened; nothing when it was.
 QStringList CProjectController::OpenMemberWithReasons(const CProject& project, const QString& member)
 {
@@ -206,7 +214,8 @@ QStringList CProjectController::OpenMemberWithReasons(const CProject& project, c
     {
         const CKsKeptMessages kept;
         opened = OpenMember(project, member, false);
-        said = kept.Texts();
+        for (const QString& text : kept.Texts())
+            said << Named(member, text);
     }
     if (!opened)
         return said.isEmpty() ? QStringList(QDir::toNativeSeparators(member)) : said;
@@ -223,16 +232,22 @@ void CProjectController::ShowMember(CProjectHandle handle, const QString& stored
         OpenMember(CProject(*project), member, true);
 }
 
+/// That of a file that is open; null for none.
+CKsMDIChildWnd* CProjectController::WindowOf(const QString& member) const
+{
+    const CKsDoc* open = m_plugins.FindDocument(member);
+    return open && !open->Views().empty() ? m_windows.Of(open->Views().front()) : nullptr;
+}
+
 /// Opens a member, or, when it is open, brings it to the front if `show`.
 bool CProjectController::OpenMember(const CProject& project, const QString& member, bool show)
 {
-    if (const CKsDoc* open = m_plugins.FindDocument(member)) {
+    if (m_plugins.FindDocument(member)) {
         // A view joins when it first appears. One that is open already outside any project is opened anew.
-        const CView* view = open->Views().empty() ? nullptr : open->Views().front();
-        auto* window = m_windows.Of(view);
+        auto* window = WindowOf(member);
         if (show && window)
             m_frame.MdiArea().setActiveSubWindow(window);
-        if (m_projects.FindByView(view) || !window)
+        if (!window || m_projects.FindByView(window->GetActiveView()))
             return true;
         if (!window->close())
             return false; // kept by the user: not in this project

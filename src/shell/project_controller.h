@@ -8,6 +8,7 @@
 #include <QObject>
 #include <map>
 
+class CKsMDIChildWnd;
 class CKsMDIFrameWnd;
 class CPlugins;
 class CWindowManager;
@@ -28,7 +29,7 @@ public:
     /// Opens a project file with all its members; false when the user has been told why not. `othersLater`: the first
     /// file is there at once, the others when it has been painted.
     bool Open(const QString& path, bool othersLater = false);
-    /// Closes the project's windows; all questions come first. False, and everything as it was, when one was kept.
+    /// Closes the project's windows, see CKsMDIFrameWnd::CloseWindows; false when it stays open.
     bool Close(CProjectHandle handle);
     /// The project of the active view, otherwise the one opened last.
     void CloseActive();
@@ -43,6 +44,7 @@ private:
     void ShowMember(CProjectHandle handle, const QString& stored);
     CMemberState StateOf(const CProject& project, const QString& stored) const;
     const CProject* OwnerOf(const QString& member) const;
+    CKsMDIChildWnd* WindowOf(const QString& member) const;
     void TellOfSharedMembers(const CProject& project) const;
     void Watch(CProjectHandle handle);
     void FileChanged(CProjectHandle handle);

@@ -161,6 +161,39 @@ TEST_F(KsTest, OneRefusalKeepsAllWindows)
     EXPECT_EQ(documents.findChildren<CKsDoc*>().size(), 3);
     EXPECT_TRUE(documents.findChildren<CKsDoc*>()[0]->IsModified());
 
+    // What is to be saved is saved when all is answered.
+    const auto marks = [this] {
+        QString marks;
+        for (const CKsDoc* document : documents.findChildren<CKsDoc*>())
+            marks += document->IsModified() ? '*' : '-';
+        return marks.toStdString();
+    };
+    const auto contents = [this] { return Read(Path("a.TST")) + Read(Path("b.TST")) + Read(Path("c.TST")); };
+    const auto open = documents.findChildren<TextDoc*>();
+    for (TextDoc* document : open)
+        document->text = "new";
+    answers = {Button::Save, Button::Discard, Button::Cancel};
+    EXPECT_FALSE(frame.CloseAllWindows());
+    EXPECT_EQ(marks(), "***");
+    EXPECT_EQ(contents(), "xxx");
+    // A save that fails stops the closing; what was saved before it stays saved.
+    open[1]->canSave = false;
+    asked.clear();
+    answers = {Button::Save, Button::Save, Button::Save};
+    EXPECT_FALSE(frame.CloseAllWindows());
+    Settle();
+    EXPECT_EQ(asked.size(), 3);
+    EXPECT_EQ(marks(), "-**");
+    EXPECT_EQ(contents(), "newxx");
+    // So does an untitled document whose name is not given.
+    open[1]->SetPathName({});
+    open[1]->canSave = true;
+    answers = {Button::Save, Button::Discard};
+    EXPECT_FALSE(frame.CloseAllWindows());
+    EXPECT_EQ(questions.size(), 1u);
+    EXPECT_EQ(marks(), "-**");
+    open[0]->SetModifiedFlag();
+
     asked.clear();
     answers = {Button::Discard, Button::Discard, Button::Discard};
     EXPECT_TRUE(frame.CloseAllWindows());

@@ -290,10 +290,13 @@ TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
     const CView* const front = frame->GetActiveView();
     for (const char* name : {"a.tst", "b.tst", "c.tst"})
         TakeLog(ViewOf(name));
-    answers << QMessageBox::Discard << QMessageBox::Cancel;
-    Action("actionCloseProject")->trigger();
-    Settle();
-    EXPECT_EQ(asked.size(), 2);
+    for (const auto first : {QMessageBox::Discard, QMessageBox::Save}) {
+        answers << first << QMessageBox::Cancel;
+        Action("actionCloseProject")->trigger();
+        Settle();
+    }
+    EXPECT_EQ(asked.size(), 4);
+    EXPECT_EQ(QFileInfo(Path("b.tst")).size(), 1) << "not saved";
     EXPECT_EQ(Texts().findChildren<CKsDoc*>().size(), 3);
     ASSERT_TRUE(frame->Projects().Registry().Find(handle));
     EXPECT_EQ(frame->Projects().Registry().Find(handle)->views.size(), 3u);
@@ -303,10 +306,11 @@ TEST_F(ShellTest, CancelInCloseProjectLeavesEverythingAsItWas)
     EXPECT_TRUE(ViewOf("b.tst")->GetDocument()->IsModified());
 
     asked.clear();
-    answers << QMessageBox::Discard << QMessageBox::Discard;
+    answers << QMessageBox::Save << QMessageBox::Discard;
     Action("actionCloseProject")->trigger();
     Settle();
     EXPECT_EQ(asked.size(), 2) << "each question once";
+    EXPECT_EQ(QFileInfo(Path("b.tst")).size(), 5) << "saved";
     EXPECT_TRUE(Texts().findChildren<CKsDoc*>().empty());
     EXPECT_TRUE(frame->Projects().Registry().All().empty());
 }

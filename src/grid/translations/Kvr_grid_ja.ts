@@ -156,6 +156,22 @@
         <translation>%1 個のセルに貼り付けました</translation>
     </message>
     <message>
+        <source>; shorter lines leave their other cells as they were</source>
+        <translation>。短い行の残りのセルは元のままです</translation>
+    </message>
+    <message>
+        <source>a line end</source>
+        <translation>改行</translation>
+    </message>
+    <message>
+        <source>a tab</source>
+        <translation>タブ</translation>
+    </message>
+    <message>
+        <source>A text takes no characters that cannot be seen. Character %1 of this one is %2.</source>
+        <translation>文字列には目に見えない文字を入力できません。この文字列の %1 文字目は%2です。</translation>
+    </message>
+    <message>
         <source>%1, line %2</source>
         <translation>%1、%2 行目</translation>
     </message>

@@ -57,6 +57,14 @@ private:
     CKsDoc* m_document = nullptr;
 };
 
+/// What a user wants to become of a document that is about to close.
+enum class KsClosing
+{
+    Keep, // nothing closes
+    Save,
+    Close // as it is: there is nothing to save, or it is discarded
+};
+
 /// While one lives, documents that are made take this for the dates that their file lacks: those that are compared with
 /// each other have the same. One that is not set changes nothing.
 class KS_API CKsDatesOfFiles
@@ -121,11 +129,13 @@ public:
     const HDDateTime& DateOfFile() const { return m_dateOfFile; }
 
     /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
-    /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the user
-    /// is asked for another name, too, if he wants. `proposal` is what a question for the name begins with.
+    /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the
+    /// user is asked for another name, too, if he wants. `proposal` is what a question for the name begins with.
     BOOL DoSave(const CString& path, const CString& proposal = {});
-    /// Has the views take over what is being typed, then asks whether to save when the document is modified; false when
-    /// the user cancelled or the save failed.
+    /// Has the views take over what is being typed, then asks whether to save when the document is modified. Nothing is
+    /// saved yet.
+    KsClosing AskToClose();
+    /// Asks, and saves when that is the answer; false when the user cancelled or the save failed.
     BOOL SaveModified();
     /// Asks every view whether what is being typed there can be taken; see CView::MayLeave.
     bool MayLeave();

@@ -114,20 +114,26 @@ bool CKsDoc::MayLeave()
     return std::all_of(views.begin(), views.end(), [](CView* view) { return view->MayLeave(KsLeave::Page); });
 }
 
-BOOL CKsDoc::SaveModified()
+KsClosing CKsDoc::AskToClose()
 {
     if (!MayLeave())
-        return false;
+        return KsClosing::Keep;
     UpdateAllViews(nullptr, StoreHint);
     if (!m_modified)
-        return true;
+        return KsClosing::Close;
     switch (KsMessageBox(tr("Save the changes to %1?").arg(GetTitle()),
                          QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel)) {
     case QMessageBox::Save:
-        return DoSave(m_path);
+        return KsClosing::Save;
     case QMessageBox::Discard:
-        return true;
+        return KsClosing::Close;
     default:
-        return false;
+        return KsClosing::Keep;
     }
+}
+
+BOOL CKsDoc::SaveModified()
+{
+    const KsClosing answer = AskToClose();
+    return answer == KsClosing::Save ? DoSave(m_path) : answer == KsClosing::Close;
 }

@@ -13,6 +13,7 @@
 #include <QStatusTipEvent>
 #include <QStyle>
 #include <QTabBar>
+#include <algorithm>
 #include <set>
 #include <utility>
 
@@ -228,12 +229,20 @@ bool CKsMDIFrameWnd::CloseAllWindows()
 bool CKsMDIFrameWnd::CloseWindows(const QList<QMdiSubWindow*>& windows)
 {
     std::set<CKsDoc*> asked;
+    std::vector<CKsDoc*> toSave; // once every question is answered: a later Cancel takes back no save
     for (QMdiSubWindow* window : windows) {
         const auto* child = qobject_cast<CKsMDIChildWnd*>(window);
         CKsDoc* document = child && child->GetActiveView() ? child->GetActiveView()->GetDocument() : nullptr;
-        if (document && asked.insert(document).second && !document->SaveModified())
+        if (!document || !asked.insert(document).second)
+            continue;
+        const KsClosing answer = document->AskToClose();
+        if (answer == KsClosing::Keep)
             return false;
+        if (answer == KsClosing::Save)
+            toSave.push_back(document);
     }
+    if (!std::ranges::all_of(toSave, [](CKsDoc* document) { return document->DoSave(document->GetPathName()); }))
+        return false;
     for (QMdiSubWindow* window : windows) {
         if (auto* child = qobject_cast<CKsMDIChildWnd*>(window))
             child->m_asked = true;

@@ -111,7 +111,8 @@ public:
     void ShowWindow(CKsMDIChildWnd* window);
     /// Where windows are shown from now on, in the area; an empty place: where there is room.
     void PlaceNewWindows(const QRect& place) { m_newPlace = place; }
-    /// Asks for every modified document first, then closes all windows; false, and nothing closed, when one was kept.
+    /// Asks for every modified document, then saves those that shall be saved, then closes all windows. False, and
+    /// nothing closed, when one was kept, which leaves everything as it was, or when a save failed.
     bool CloseAllWindows();
     /// The same for some of them.
     bool CloseWindows(const QList<QMdiSubWindow*>& windows);

@@ -149,7 +149,8 @@ void CBindings::Add(CKsEditLong* field, std::int32_t& value)
 void CBindings::Add(QLineEdit* field, std::string& value)
 {
     AddTyped(field, &value,
-             {.store = [this, field, &value] { Store(value, field->text().toStdString()); },
+             {.complaint = [field] { return UnseenRefusal(field->text(), Tabs::Taken); }, // one may delimit columns
+              .store = [this, field, &value] { Store(value, field->text().toStdString()); },
               .show =
                   [field, &value] {
                       const QString text = QString::fromStdString(value);

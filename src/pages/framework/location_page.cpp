@@ -161,6 +161,10 @@ void CLocationPage::BrowseInto(CGenGrid& grid, int row, int column, const FileKi
     if (!chosen)
         return;
     CGridModel& model = *grid.Model();
+    if (const QString refusal = model.Refusal(row - 1, column - 1, *chosen); !refusal.isEmpty()) {
+        KsMessageBox(refusal, QMessageBox::Ok, this);
+        return;
+    }
     model.setData(model.index(row - 1, column - 1), *chosen, Qt::EditRole);
     grid.StoreEditedLine();
 }
