@@ -1,6 +1,8 @@
 // Content that no table knows comes back where it was, behind the known content of its section.
 #include "hd_support.h"
 
+#include <algorithm>
+
 namespace {
 
 /// The lines of a text without their indentation.

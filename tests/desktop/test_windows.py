@@ -56,18 +56,21 @@ class ClosingKeys(Case):
 
 class ClosingProject(Case):
     def test_cancel_leaves_everything(self):
-        """All questions come first: Cancel at the last one has closed nothing."""
+        """All questions come first: Cancel at the last one has saved and closed nothing."""
         editor = self.open_project()
         editor.put(1, 3, '2.5')
         editor.put(1, 2, '1500', leave='Return', table=editor.table('Radius and width'))
         editor.click_cell(1, 1)
         wait_for(lambda: editor.project_files() == ['moor.HDKV*', 'moor.kvnw*', 'moor.kvxs'], 'two files are modified')
-        editor.menu('File', 'Close Project')
-        editor.answer('Discard')
-        editor.answer('Cancel')
-        self.assert_no_message()
-        self.assertEqual(len(editor.windows()), 3)
-        self.assertEqual(editor.project_files(), ['moor.HDKV*', 'moor.kvnw*', 'moor.kvxs'])
+        before = self.saved().text
+        for first in ('Discard', 'Save'):
+            editor.menu('File', 'Close Project')
+            editor.answer(first)
+            editor.answer('Cancel')
+            self.assert_no_message()
+            self.assertEqual(len(editor.windows()), 3)
+            self.assertEqual(editor.project_files(), ['moor.HDKV*', 'moor.kvnw*', 'moor.kvxs'])
+        self.assertEqual(self.saved().text, before)
 
 
 class MenuLetters(Case):

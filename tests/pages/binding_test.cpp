@@ -7,6 +7,7 @@
 #include <QGridLayout>
 #include <QLabel>
 #include <QRadioButton>
+#include <QTemporaryDir>
 
 class BoundPage : public CGenPropertyPage
 {
@@ -128,6 +129,24 @@ TEST_F(BindingTest, UnknownNumbersAreKept)
     page.UndoRedo(true);
     EXPECT_EQ(globals.iLevelDepth, 5);
     EXPECT_FALSE(page.level.isChecked() || page.depth.isChecked()) << "as before the click";
+    globals.G_wave = -3;
+    page.LoadFromDocument(&document);
+    EXPECT_EQ(page.list.currentText(), "-3");
+}
+
+TEST_F(BindingTest, FieldsTakeNothingWhereTheDocumentMayNotBeChanged)
+{
+    const QTemporaryDir folder;
+    QFile file(folder.filePath("broken.HDKV"));
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+    file.write("[KAVO0_HD]\n[broken");
+    file.close();
+    auto& page = Open<BoundPage>();
+    EXPECT_FALSE(page.number.isReadOnly());
+    ASSERT_TRUE(document.OnOpenDocument(file.fileName()));
+    page.LoadFromDocument(&document);
+    EXPECT_TRUE(page.number.isReadOnly());
+    EXPECT_TRUE(page.integer.isReadOnly());
 }
 
 TEST_F(BindingTest, IntegersAreTakenWhenLeftOrStored)

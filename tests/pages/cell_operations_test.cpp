@@ -101,6 +101,8 @@ TEST_F(CellOperationsTest, InterpolationGoesAlongEachBranch)
         return result;
     };
     EXPECT_EQ(levels(all, KnownValues::Ends, false, 0), (QList<double>{10, 12.5, 7, 20, 17.5}));
+    init.GetAt(3).RiverName = "a"; // as a file may have it
+    EXPECT_EQ(levels(all, KnownValues::Ends, false, 0), (QList<double>{10, 12.5, 7, 20, 17.5}));
     // Of lines that are not selected: A at 0 and 400 for those between, nothing behind 300.
     EXPECT_DOUBLE_EQ(levels({1, Level, 1, Level}, KnownValues::Neighbours, false, 0)[1], 10 - 10.0 / 3);
     EXPECT_EQ(levels({3, Level, 3, Level}, KnownValues::Neighbours, false, 1), (QList<double>{10, 0, 7, 20, 0}));
@@ -146,6 +148,15 @@ TEST_F(CellOperationsTest, WhatCannotChangeStaysAndIsListed)
     init.GetAt(0).InitialH = 8.5 * 0.3048;
     init.GetAt(1).InitialH = 8.7 * 0.3048;
     EXPECT_EQ(StepOf(rows, {0, Level, 1, Level}), 0.2);
+
+    auto& beds = document.Parameters().BedList;
+    for (const double value : {30, 40})
+        beds.Add().Resistance = value;
+    globals.ResisZone = 1; // the zones count, the value of the whole section is locked
+    Open(MakeBedPage);
+    CCellResults locked = FillDown(*grid->Model(), {0, 2, 1, 2});
+    EXPECT_EQ(locked.KeptCount(), 1u);
+    EXPECT_TRUE(locked.TakeChanges().IsEmpty());
 }
 
 TEST_F(CellOperationsTest, IntegersStayWithinTheirBounds)

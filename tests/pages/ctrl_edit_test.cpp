@@ -102,6 +102,14 @@ TEST_F(CtrlEditTest, TypingWhatIsShownIsTyping)
         field.setSelection(3, 1);
         QTest::keyClicks(&field, "3");
     });
+    retype("the last digit, and one before the first that is taken out again", [&] {
+        QTest::keyClick(&field, Qt::Key_End);
+        QTest::keyClick(&field, Qt::Key_Backspace);
+        QTest::keyClicks(&field, "7");
+        QTest::keyClick(&field, Qt::Key_Home);
+        QTest::keyClicks(&field, "9");
+        QTest::keyClick(&field, Qt::Key_Backspace);
+    });
     // One single character, whose replacement looks like itself.
     Setup({.name = "level", .unit = UnitGroup::WaterLevel, .digits = 1});
     value = 2.4;
@@ -142,12 +150,16 @@ TEST_F(CtrlEditTest, ATextWhoseEndDoesNotFitIsRefused)
     EXPECT_EQ(value, 1.23456789);
     ASSERT_EQ(boxes.size(), 1);
     EXPECT_TRUE(boxes.front().startsWith("At most 20 characters fit")) << boxes.front().toStdString();
+    field.setSelection(3, 1);
+    QTest::keyClicks(&field, "3");
+    Leave();
+    EXPECT_EQ(boxes.size(), 2) << "the end is missing still";
     QTest::keyClick(&field, Qt::Key_End);
     QTest::keyClick(&field, Qt::Key_Backspace); // by somebody who sees what stands there
     QTest::keyClicks(&field, "9");
     Leave();
     EXPECT_EQ(value, 1.234567890123456e-9);
-    EXPECT_EQ(boxes.size(), 1);
+    EXPECT_EQ(boxes.size(), 2);
 }
 
 TEST_F(CtrlEditTest, AMenuInFrontLeavesTheTextAsItIs)

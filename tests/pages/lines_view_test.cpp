@@ -194,6 +194,7 @@ TEST_F(LinesViewTest, Conditions)
         {Chainage, "!=100", "1 2 4 5"},
         {Chainage, ">", "1 2 3 4 5"},
         {Q, "-1", "2"},
+        {Q, "1e1", "3 4"}, // 5 to 15 show so without a digit behind
         {Q, "<0", "2"},
         {Q, ">abc", "1 2 3 4 5"},
     };
@@ -248,6 +249,11 @@ TEST_F(LinesViewTest, TheStatusTellsOfWhatThereIs)
                                    QItemSelectionModel::ClearAndSelect);
     const auto sum = [this] { return grid->SelectionText().section("sum ", 1).section(',', 0, 0); };
     EXPECT_TRUE(QTest::qWaitFor([&] { return sum() == "6"; })) << grid->SelectionText().toStdString();
+    grid->selectionModel()->select({grid->model()->index(0, H - 1), grid->model()->index(2, Q - 1)},
+                                   QItemSelectionModel::ClearAndSelect);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return grid->SelectionText() == "6 cells"; })) << "levels and discharges";
+    grid->selectionModel()->select({grid->model()->index(0, H - 1), grid->model()->index(2, H - 1)},
+                                   QItemSelectionModel::ClearAndSelect);
     init.GetAt(0).InitialH = 13;
     grid->Reload();
     EXPECT_TRUE(QTest::qWaitFor([&] { return sum() == "16"; })) << "of the numbers of now";
