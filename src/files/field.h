@@ -173,8 +173,8 @@ struct Field
     constexpr Field Title(Str text, int line) const { return Title({text, line}); }
     constexpr Field Choices(TextLine texts, std::int32_t first = 0) const
     {
-        if (kind != FieldKind::Integer && kind != FieldKind::Text)
-            throw "choices of what is neither a number of an entry nor its text";
+        if (kind != FieldKind::Integer && kind != FieldKind::Boolean && kind != FieldKind::Text)
+            throw "choices of what is neither the number of an entry nor its text";
         return With(&Field::choices, texts).With(&Field::firstChoice, first);
     }
     constexpr Field Range(std::optional<double> least, std::optional<double> most = {}) const

@@ -203,7 +203,7 @@ QStringList CProjectController::OpenMembers(const CProject& project, const QStri
 static QString Named(const QString& member, const QString& text)
 {
     const QString name = QFileInfo(member).fileName();
-    return text.contains(name) ? text : CProjectController::tr("%1: %2").arg(QDir::toNativeSeparators(member), text);
+    return text.contains(name) ? text : QStringLiteral("%1: %2").arg(QDir::toNativeSeparators(member), text);
 }
 
 /// Why a member could not be opened; nothing when it was.

@@ -163,10 +163,10 @@ TEST_F(KsTest, OneRefusalKeepsAllWindows)
 
     // What is to be saved is saved when all is answered.
     const auto marks = [this] {
-        QString marks;
+        QString each;
         for (const CKsDoc* document : documents.findChildren<CKsDoc*>())
-            marks += document->IsModified() ? '*' : '-';
-        return marks.toStdString();
+            each += document->IsModified() ? '*' : '-';
+        return each.toStdString();
     };
     const auto contents = [this] { return Read(Path("a.TST")) + Read(Path("b.TST")) + Read(Path("c.TST")); };
     const auto open = documents.findChildren<TextDoc*>();

@@ -171,4 +171,5 @@ MUTANTS = [
     ('pages', 'grid/row_filter.cpp', 'text.size() > digits.size() ?', 'false ?'),
     ('pages', 'pages/framework/binding.cpp', 'setReadOnly(m_document->IsReadOnly())', 'setReadOnly(false)'),
     ('pages', 'pages/framework/binding.cpp', 'if (index < 0 || index >= entries)', 'if (index >= entries)'),
+    ('network', 'editors/network/map_selection.cpp', '(step > 0 ? -1 : count)', '-1'),
 ]

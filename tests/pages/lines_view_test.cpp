@@ -251,7 +251,8 @@ TEST_F(LinesViewTest, TheStatusTellsOfWhatThereIs)
     EXPECT_TRUE(QTest::qWaitFor([&] { return sum() == "6"; })) << grid->SelectionText().toStdString();
     grid->selectionModel()->select({grid->model()->index(0, H - 1), grid->model()->index(2, Q - 1)},
                                    QItemSelectionModel::ClearAndSelect);
-    EXPECT_TRUE(QTest::qWaitFor([&] { return grid->SelectionText() == "6 cells"; })) << "levels and discharges";
+    EXPECT_TRUE(QTest::qWaitFor([&] { return grid->SelectionText() == "6 cells selected"; }))
+        << "levels and discharges";
     grid->selectionModel()->select({grid->model()->index(0, H - 1), grid->model()->index(2, H - 1)},
                                    QItemSelectionModel::ClearAndSelect);
     init.GetAt(0).InitialH = 13;

@@ -153,6 +153,8 @@ TEST_F(NetworkTest, WithoutAMousePlacesAndLocationsAreReached)
     EXPECT_EQ(step(Qt::Key_P), 5000);
     QTest::keyClick(map, Qt::Key_Space);
     EXPECT_EQ(map->Marks().Selected(), nullptr);
+    EXPECT_EQ(step(Qt::Key_P), 5000) << "from the end";
+    QTest::keyClick(map, Qt::Key_Space);
     map->Marks().SetLocations({});
     QTest::keyClick(map, Qt::Key_N);
     EXPECT_EQ(map->Marks().Selected(), nullptr);
