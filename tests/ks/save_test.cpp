@@ -163,10 +163,10 @@ TEST_F(KsTest, OneRefusalKeepsAllWindows)
 
     // What is to be saved is saved when all is answered.
     const auto marks = [this] {
-        QString marks;
+        std::string shown;
         for (const CKsDoc* document : documents.findChildren<CKsDoc*>())
-            marks += document->IsModified() ? '*' : '-';
-        return marks.toStdString();
+            shown += document->IsModified() ? '*' : '-';
+        return shown;
     };
     const auto contents = [this] { return Read(Path("a.TST")) + Read(Path("b.TST")) + Read(Path("c.TST")); };
     const auto open = documents.findChildren<TextDoc*>();
