@@ -78,8 +78,8 @@ TEST_F(ClipboardTest, PastesRectangles)
     EXPECT_EQ(Stored(), "X 1 2 8,  1 5 5, Y 3 5 5, NECKAR 9 0 0");
     Paste(3, 2, "\"4\n\"\t6\n\n");
     EXPECT_EQ(Stored(), "X 1 2 8,  1 5 5, Y 4 6 5, NECKAR 9 0 0") << "a line end behind a number is none of it";
-    EXPECT_EQ(said, QStringList({"6 cells pasted; shorter lines leave their other cells as they were",
-                                 "2 cells pasted"}));
+    EXPECT_EQ(said,
+              QStringList({"6 cells pasted; shorter lines leave their other cells as they were", "2 cells pasted"}));
     EXPECT_EQ(boxes, QStringList());
 }
 
@@ -117,10 +117,10 @@ TEST_F(ClipboardTest, RefusesAsAWhole)
         {1, 3, " 1",
          "Nothing was pasted. Line 1, column \"Initial h\" cannot take \" 1\":\nFloating point number required"},
         {1, 1, "X\n\"Y\nZ\"",
-         "Nothing was pasted. Line 2, column \"Branch name\" cannot take \"Y\nZ\":\nA text takes no characters that "
+         "Nothing was pasted. Line 2, column \"River Name\" cannot take \"Y\nZ\":\nA text takes no characters that "
          "cannot be seen. Character 2 of this one is a line end."},
-        {1, 1, QString("XY\0", 3),
-         "Nothing was pasted. Line 1, column \"Branch name\" cannot take \"XY\uFFFD\":\nA text takes no characters "
+        {1, 1, QString("XY") + QChar(0),
+         "Nothing was pasted. Line 1, column \"River Name\" cannot take \"XY\uFFFD\":\nA text takes no characters "
          "that cannot be seen. Character 3 of this one is U+0000."},
     };
     for (const auto& c : cases) {
