@@ -425,6 +425,10 @@ To have one of them in %1, close its window and open it from the list of %1.</so
 %1 で使うには、そのウィンドウを閉じてから、%1 の一覧で開いてください。</translation>
     </message>
     <message>
+        <source>%1: %2</source>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
         <source>%1: the file does not exist</source>
         <translation>%1: ファイルがありません</translation>
     </message>
