@@ -96,6 +96,15 @@ class Names(Case):
         self.assertIn('moor.HDKV', editor.status())
 
 
+class FileThatCannotBeOpened(Case):
+    def test_the_first_one_is_told_once_by_its_name(self):
+        samples.write_project(self.folder)
+        os.rename(f'{self.folder}/moor.HDKV', f'{self.folder}/Moor.HdKv')
+        self.start('moor.kvrp')
+        self.assert_told_once('of the project moor could not be opened', 'Moor.HdKv: Unsupported file format')
+        self.assertEqual(len(self.editor.windows()), 2)
+
+
 class SharedFile(Case):
     def test_second_project_is_told(self):
         samples.write_project(self.folder)

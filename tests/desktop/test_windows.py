@@ -1,4 +1,5 @@
 """Windows and their keys."""
+import samples
 from case import Case
 from waiting import wait_for
 
@@ -56,21 +57,24 @@ class ClosingKeys(Case):
 
 class ClosingProject(Case):
     def test_cancel_leaves_everything(self):
-        """All questions come first: Cancel at the last one has saved and closed nothing."""
+        """All questions come first: Cancel at the last one has closed nothing."""
         editor = self.open_project()
         editor.put(1, 3, '2.5')
         editor.put(1, 2, '1500', leave='Return', table=editor.table('Radius and width'))
+        editor.put(1, 2, '12.5', leave='Return', table=editor.table('Points of the current cross section'))
         editor.click_cell(1, 1)
-        wait_for(lambda: editor.project_files() == ['moor.HDKV*', 'moor.kvnw*', 'moor.kvxs'], 'two files are modified')
-        before = self.saved().text
-        for first in ('Discard', 'Save'):
-            editor.menu('File', 'Close Project')
-            editor.answer(first)
-            editor.answer('Cancel')
+        modified = ['moor.HDKV*', 'moor.kvnw*', 'moor.kvxs*']
+        wait_for(lambda: editor.project_files() == modified, 'all files are modified')
+        for close, answers in ((lambda: editor.menu('File', 'Close Project'), ('Discard', 'Cancel')),
+                               (lambda: editor.menu('File', 'Close Project'), ('Save', 'Discard', 'Cancel')),
+                               (lambda: editor.press('ctrl+q'), ('Save', 'Cancel'))):
+            close()
+            for answer in answers:
+                editor.answer(answer)
             self.assert_no_message()
             self.assertEqual(len(editor.windows()), 3)
-            self.assertEqual(editor.project_files(), ['moor.HDKV*', 'moor.kvnw*', 'moor.kvxs'])
-        self.assertEqual(self.saved().text, before)
+            self.assertEqual(editor.project_files(), modified)
+        self.assertEqual(self.saved().text, samples.hd_text())
 
 
 class MenuLetters(Case):

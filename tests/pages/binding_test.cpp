@@ -4,6 +4,7 @@
 #include "pages/framework/ctrl_edit.h"
 
 #include <QCheckBox>
+#include <QClipboard>
 #include <QGridLayout>
 #include <QLabel>
 #include <QRadioButton>
@@ -16,7 +17,8 @@ public:
     {
         auto* cells = new QGridLayout(this);
         int row = 0;
-        for (QWidget* widget : std::initializer_list<QWidget*>{&box, &integer, &list, &level, &depth, &number, &hidden})
+        for (QWidget* widget :
+             std::initializer_list<QWidget*>{&box, &integer, &list, &level, &depth, &number, &hidden, &text})
             cells->addWidget(widget, row++, 1);
         HD_Global_Var& globals = Globals();
         Bindings().Add(&box, globals.wind_shear_stress);
@@ -24,6 +26,7 @@ public:
         Bindings().Add(&list, globals.G_wave);
         Bindings().Add({&level, &depth}, globals.iLevelDepth);
         Bindings().Add(&number, globals.delh);
+        Bindings().Add(&text, globals.TextOutput.Delimiter);
         Bindings().EnableWhen([this] { return box.isChecked(); }, {&number});
         Bindings().ShowWhen([this] { return Globals().iLevelDepth == 1; }, {&hidden});
     }
@@ -34,6 +37,7 @@ public:
     QRadioButton level, depth;
     CCtrlEdit number;
     QLabel hidden;
+    QLineEdit text;
 };
 
 class BindingTest : public PageTest
@@ -90,6 +94,32 @@ TEST_F(BindingTest, ControlsAreCalledAsTheirValuesAreDeclared)
     page.box.click();
     for (int column : {0, 2})
         EXPECT_EQ(beside(page.number, column)->isEnabled(), page.box.isChecked());
+}
+
+TEST_F(BindingTest, ATextTakesWhatCanBeSeen)
+{
+    auto& page = Open<BoundPage>();
+    const struct
+    {
+        QString pasted;
+        const char* stored;
+        QStringList told;
+    } cases[] = {
+        {"\t\r\n", "\t", {}}, // columns may be delimited by one
+        {"; \n", "; ", {}},
+        {QString::fromUtf8(";\u202E"),
+         "; ",
+         {"A text takes no characters that cannot be seen. Character 2 of this one is U+202E."}},
+    };
+    for (const auto& c : cases) {
+        page.text.setFocus();
+        page.text.selectAll();
+        QGuiApplication::clipboard()->setText(c.pasted);
+        page.text.paste();
+        QTest::keyClick(&page.text, Qt::Key_Return);
+        EXPECT_EQ(globals.TextOutput.Delimiter, c.stored);
+        EXPECT_EQ(std::exchange(boxes, {}), c.told);
+    }
 }
 
 TEST_F(BindingTest, TheWheelTurnsOnlyTheListThatHasTheFocus)

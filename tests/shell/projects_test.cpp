@@ -153,6 +153,12 @@ TEST_F(ShellTest, AFileOpenBeforeItsProjectJoinsWhenTheProjectOpens)
     frame->OpenFile(path);
     EXPECT_EQ(asked.size(), 2) << "the question, and that the file stays outside";
     EXPECT_EQ(ProjectOf("a.tst"), 0);
+    asked.clear();
+    answers << QMessageBox::Cancel;
+    Write("b.tst");
+    frame->OpenFile(WriteProject("q.kvrp", "File = <a.tst>\nFile = <b.tst>\n"));
+    EXPECT_EQ(asked.size(), 2) << "nor is it tried again as the first file of several";
+    frame->Projects().Close(ProjectOf("b.tst"));
 
     answers << QMessageBox::Save;
     frame->OpenFile(path);
@@ -206,6 +212,14 @@ TEST_F(ShellTest, WhatIsWrongWithAProjectIsSaid)
     EXPECT_TRUE(asked.at(0).contains("gone.tst"));
     EXPECT_FALSE(asked.at(0).contains("there.tst"));
     EXPECT_NE(ProjectOf("there.tst"), 0) << "the rest opens";
+
+    // What an editor says without a name is told with it, and once; nor is such a file shown as the first one.
+    asked.clear();
+    Write("odd.tst", "odd");
+    Write("other.tst");
+    EXPECT_TRUE(frame->OpenFile(WriteProject("odd.kvrp", "File = <odd.tst>\nFile = <other.tst>\n")));
+    EXPECT_EQ(asked, QStringList("These files of the project odd could not be opened:\n" +
+                                 QDir::toNativeSeparators(Path("odd.tst")) + ": This is no text."));
 
     EXPECT_TRUE(frame->OpenFile(Write("empty.kvrp", "[KVR_PROJECT]\n[/KVR_PROJECT]\n")));
     EXPECT_TRUE(frame->OpenFile(WriteProject("number.kvrp", "File = 7\nFile = <there.tst>\n")));

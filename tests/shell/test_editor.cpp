@@ -2,6 +2,7 @@
 // link it.
 #include "ks/fc/doc_template.h"
 #include "ks/fc/frames.h"
+#include "ks/fc/message_box.h"
 #include "ks/fc/package.h"
 #include "ks/fc/plugin.h"
 
@@ -15,6 +16,16 @@ namespace {
 class TestDoc : public CKsDoc
 {
 public:
+    BOOL OnOpenDocument(const CString& path) override
+    {
+        if (!CKsDoc::OnOpenDocument(path))
+            return false;
+        QFile file(path);
+        const bool isOdd = file.open(QIODevice::ReadOnly) && file.readAll() == "odd";
+        if (isOdd)
+            KsMessageBox("This is no text.");
+        return !isOdd;
+    }
     BOOL OnSaveDocument(const CString& path) override
     {
         QFile file(path);
