@@ -65,9 +65,10 @@ CGenGrid::CGenGrid(QWidget* parent)
             if (m_model->Shown().IsFiltered())
                 ChangeView([](CGridModel& model) { model.Filter(QStringList(model.Filters())); });
         },
-        Qt::QueuedConnection); // what was typed in the other unit has been stored
+        Qt::QueuedConnection);                               // what was typed in the other unit has been stored
     connect(m_model, &CGridModel::modelReset, this, [this] { // other rows, none of which is current
-        m_modified = m_lineGone = false;
+        m_modified = false;
+        m_goneFrom = 0;
         m_currentLine.reset();
     });
     connect(m_model, &CGridModel::layoutChanged, this, [this] {
@@ -126,7 +127,7 @@ void CGenGrid::FollowLine(int row, int column)
 {
     const CKsDoc* const document = m_model->Document();
     const bool isReplaced = document && std::exchange(m_contents, document->Contents()) != document->Contents();
-    if (!m_currentLine || (row == 0 && !m_lineGone))
+    if (!m_currentLine || (row == 0 && !HasLostItsLine()))
         return;
     int now = m_model->RowNamed(*m_currentLine, row - 1) + 1;
     if (now == 0 && isReplaced)
@@ -138,7 +139,7 @@ void CGenGrid::FollowLine(int row, int column)
     } else {
         if (!m_model->Shown().IsFiltered())
             m_currentLine.reset(); // else it may come back into sight
-        m_lineGone = true;
+        m_goneFrom = std::max(row, m_goneFrom);
         clearSelection();
         selectionModel()->clearCurrentIndex();
     }
@@ -207,7 +208,7 @@ void CGenGrid::ShowPlace(int number, int column)
 void CGenGrid::Reload()
 {
     Refresh();
-    if (!currentIndex().isValid() && RowCount() > 0 && !m_lineGone)
+    if (!currentIndex().isValid() && RowCount() > 0 && !HasLostItsLine())
         SetCurrentCell(1, 1);
 }
 
@@ -303,7 +304,7 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
     if (!m_model->IsSyncing()) {
         if (currentIndex().isValid()) { // storing shows the rows afresh, with this line as the current one
             NoteLine(currentIndex().row());
-            m_lineGone = false;
+            m_goneFrom = 0;
         }
         StoreEditedLine();
     }
@@ -372,6 +373,17 @@ void CGenGrid::keyPressEvent(QKeyEvent* event)
         m_selection->GrowTo(moveCursor(move->second, event->modifiers()));
     else
         QTableView::keyPressEvent(event);
+}
+
+/// From a line that is gone the keys go on where it stood: Qt begins at the first one.
+QModelIndex CGenGrid::moveCursor(CursorAction action, Qt::KeyboardModifiers held)
+{
+    if (!HasLostItsLine() || RowCount() == 0)
+        return QTableView::moveCursor(action, held);
+    const bool isFar = held.testFlag(Qt::ControlModifier);
+    if (isFar && action == MoveEnd)
+        return m_model->index(RowCount() - 1, ColumnCount() - 1);
+    return m_model->index(isFar && action == MoveHome ? 0 : std::min(m_goneFrom, RowCount()) - 1, 0);
 }
 
 /// A selection is one block. A click with Ctrl, which adds a line or a cell to it elsewhere, does nothing but say so.

@@ -47,7 +47,7 @@ public:
     /// Sorts or filters; the current cell goes with its line, and what was selected is no longer.
     void ChangeView(const std::function<void(CGridModel& model)>& change);
     /// The line that was current is gone, and nobody has chosen another one yet.
-    bool HasLostItsLine() const { return m_lineGone; }
+    bool HasLostItsLine() const { return m_goneFrom > 0; }
     QString TextAt(int row, int column) const { return m_model->index(row - 1, column - 1).data().toString(); }
     /// "Line 3 of 120", with the whole number of the current cell where the cell leaves digits out, and how many lines
     /// are shown when others are hidden.
@@ -94,6 +94,7 @@ public:
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
+    QModelIndex moveCursor(CursorAction action, Qt::KeyboardModifiers held) override;
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseDoubleClickEvent(QMouseEvent* event) override;
@@ -122,12 +123,12 @@ private:
     CGridHeader* m_header;
     CSelectionSummary* m_summary;
     IGridHost* m_host = nullptr;
-    int m_lastRow = 0;                   // current at the last cell move
-    std::optional<RowKey> m_currentLine; // its name; nothing where the line is gone
+    int m_lastRow = 0;                     // current at the last cell move
+    std::optional<RowKey> m_currentLine;   // its name; nothing where the line is gone
     std::vector<CellValue> m_currentPlace; // what stands in its first cells
-    int m_contents = 0;                  // of the document, when the rows were last shown
-    bool m_lineGone = false;
-    bool m_modified = false; // since the last cell move
-    bool m_isPressRefused = false; // what follows the press of a button is none of the table's
+    int m_contents = 0;                    // of the document, when the rows were last shown
+    int m_goneFrom = 0;                    // the row in which the line stood that was current and is gone
+    bool m_modified = false;               // since the last cell move
+    bool m_isPressRefused = false;         // what follows the press of a button is none of the table's
     int m_branchNameColumn = 0;
 };

@@ -12,6 +12,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QTimer>
+#include <algorithm>
 
 namespace {
 
@@ -81,8 +82,10 @@ void RespellMember(const CProjects& projects, const QString& oldPath, const QStr
         if (!project->members.contains(QDir::cleanPath(oldPath)))
             continue;
         const Result<WriteReport> respelt = Respell(project->path, oldPath, after.suffix().toUtf8());
-        if (respelt)
+        if (respelt) {
             project->version = respelt.value().version;
+            std::ranges::replace(project->members, QDir::cleanPath(oldPath), QDir::cleanPath(newPath));
+        }
         const QString text =
             respelt
                 ? CKsDocumentFile::NotesOn(project->path, respelt.value())

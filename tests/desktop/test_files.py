@@ -136,6 +136,17 @@ class WhatASaveDrops(Case):
         self.assertIn('2 lines without location dropped', editor.status())
         self.assertEqual(len(self.saved().records('InitList')), 3)
 
+    def test_keys_go_on_from_a_dropped_line(self):
+        editor = self.open()
+        editor.click_cell(editor.table().lines, 4)
+        editor.press('Tab')
+        editor.type('INN\t')
+        editor.save()
+        editor.press('ctrl+End')
+        editor.type('77')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList')[2], '"RIVER10", 300, 1.75, 77')
+
     def test_levels_of_untitled_marks(self):
         """What nobody has seen is not cleaned; what goes is told before."""
         text = samples.hd_text({'WaterLevelMarkList': ['"MOORBECK", 100, 2, 5.5, 6.5']},

@@ -93,6 +93,7 @@ class Names(Case):
         editor.save()
         self.assertEqual([f for f in os.listdir(self.folder) if f.lower() == 'moor.hdkv'], ['moor.HDKV'])
         self.assertIn('<moor.HDKV>', samples.Saved(f'{self.folder}/moor.kvrp').text)
+        self.assertEqual(editor.project_files()[0], 'moor.HDKV')
         self.assertIn('moor.HDKV', editor.status())
 
 

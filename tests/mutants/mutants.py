@@ -172,4 +172,7 @@ MUTANTS = [
     ('pages', 'pages/framework/binding.cpp', 'setReadOnly(m_document->IsReadOnly())', 'setReadOnly(false)'),
     ('pages', 'pages/framework/binding.cpp', 'if (index < 0 || index >= entries)', 'if (index >= entries)'),
     ('network', 'editors/network/map_selection.cpp', '(step > 0 ? -1 : count)', '-1'),
+    ('pages', 'grid/gen_grid.cpp', 'if (!HasLostItsLine() || RowCount() == 0)\n        return QTableView', 'if (true)\n        return QTableView'),
+    ('shell', 'shell/project_respell.cpp',
+     'std::ranges::replace(project->members, QDir::cleanPath(oldPath), QDir::cleanPath(newPath));', ''),
 ]

@@ -56,6 +56,27 @@ TEST_F(GridKeyTest, BehindTheLastCellALineIsAppended)
     EXPECT_EQ(init.GetCount(), 4u);
 }
 
+TEST_F(GridKeyTest, FromALineThatIsGoneTheKeysGoOnWhereItStood)
+{
+    Add("C", 3);
+    Add("D", 4);
+    view->page->LoadFromDocument(&document);
+    const auto after = [this](Qt::Key key, Qt::KeyboardModifiers held = {}) {
+        grid->SetCurrentCell(3, 2);
+        auto line = init.RemoveAt(2); // as a save does
+        view->page->LoadFromDocument(&document);
+        EXPECT_EQ(Current(), std::pair(0, 0));
+        Press(key, held);
+        const auto current = Current();
+        init.InsertAt(2, std::move(line));
+        view->page->LoadFromDocument(&document);
+        return current;
+    };
+    EXPECT_EQ(after(Qt::Key_End, Qt::ControlModifier), std::pair(3, grid->ColumnCount()));
+    EXPECT_EQ(after(Qt::Key_Home, Qt::ControlModifier), std::pair(1, 1));
+    EXPECT_EQ(after(Qt::Key_Down), std::pair(3, 1));
+}
+
 TEST_F(GridKeyTest, InsertCopiesOrPastesFirst)
 {
     auto* clipboard = QGuiApplication::clipboard();

@@ -85,6 +85,10 @@ TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
     EXPECT_EQ(content(),
               "[KVR_PROJECT]\n[Members]\nFile = 7\n  // main river\n  File = <one\\\\r\xC3\xBC.TST> // keep\n"
               "File=<b.tst>\nFile = true\nFile = \"one/r\xC3\xBC.TST\"\n[/Members]\n[/KVR_PROJECT]\n");
+    const CProject* project = frame->Projects().Registry().Find(ProjectOf("b.tst"));
+    EXPECT_EQ(project->members, (QStringList{Path("one/r\u00FC.TST"), Path("b.tst")})) << "nor does the tree keep it";
+    document->SetPathName(Path("one/r\u00FC.tst"));
+    EXPECT_EQ(content(), before) << "and back";
     EXPECT_TRUE(asked.isEmpty());
 }
 
