@@ -38,6 +38,14 @@ QWidget* ViewAround(QWidget* widget)
     return widget;
 }
 
+/// Also when the widget is a window of its own, like the pop-up of a list.
+bool IsPartOf(const QWidget* widget, const QWidget* whole)
+{
+    while (widget && widget != whole)
+        widget = widget->parentWidget();
+    return widget;
+}
+
 QLineEdit* MakeLineEdit(const GridControl& control, QWidget* parent)
 {
     auto* edit = new QLineEdit(parent);
@@ -269,7 +277,7 @@ void CGridDelegate::LostFocus(const QEvent* event)
     const QWidget* focus = QApplication::focusWidget();
     // The editor stays while another window or its own pop-up is in front, and a click into the grid is the grid's to
     // judge: it commits before the current cell moves.
-    const bool inGrid = focus && (focus == m_grid || m_grid->isAncestorOf(focus));
+    const bool inGrid = IsPartOf(focus, m_grid);
     if (StaysBeingEdited(reason) || inGrid || !m_grid->Host() || m_telling || !m_editor || !m_index.isValid())
         return;
     if (Refusal().isEmpty()) {

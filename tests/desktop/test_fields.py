@@ -63,6 +63,18 @@ class BranchNames(Case):
         editor.save()
         self.assertEqual(self.saved().records('InitList')[2].split(',')[0], '"MOORBECK"')
 
+    def test_all_names_of_an_emptied_cell(self):
+        editor = self.open_project()
+        editor.click_cell(1, 1)
+        editor.press('F2', 'BackSpace', 'alt+Down')
+        editor.settle(0.4)
+        self.assertFalse(editor.modified, 'the cell is still being edited')
+        editor.press('Down', 'Return')
+        editor.settle(0.4)
+        editor.press('Tab')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList')[0].split(',')[0], '"RIVER10"')
+
 
 class Dates(Case):
     PERIOD = samples.hd_text(sections={

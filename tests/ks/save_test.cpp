@@ -1,7 +1,9 @@
 #include "ks_fixture.h"
 
+#include "ks/fc/file_use.h"
 #include "ks/fc/file_watch.h"
 
+#include <QDeadlineTimer>
 #include <QDir>
 #include <QMenuBar>
 #include <QPushButton>
@@ -267,8 +269,10 @@ TEST_F(KsTest, AnOpenFileIsFollowedByItsContent)
     EXPECT_EQ(direct.Sight().version, VersionOfText("new"));
     Write("a.TST", "old"); // the file that took the place is followed, too
     EXPECT_TRUE(becomes(KsFileSight::Known));
+    const QDeadlineTimer twoLooks(2 * 200); // each when the file has been let be for so long
     QFile::remove(path);
     EXPECT_TRUE(becomes(KsFileSight::Gone));
+    EXPECT_TRUE(twoLooks.hasExpired()) << "it may be about to be replaced";
     ASSERT_TRUE(QDir().mkdir(path));
     EXPECT_TRUE(becomes(KsFileSight::Unreadable));
     QDir().rmdir(path);
@@ -293,4 +297,25 @@ TEST_F(KsTest, AnOpenFileIsFollowedByItsContent)
     EXPECT_EQ(direct.Sight().kind, KsFileSight::Known);
     std::filesystem::last_write_time(path.toStdString(), std::filesystem::file_time_type::clock::now());
     EXPECT_TRUE(becomes(KsFileSight::Other));
+}
+
+TEST_F(KsTest, OtherNamesOfAFileAreFreeWhenASaveHasPartedThem)
+{
+    for (const char* taken : {"a.TST", "b.TST"}) { // the name that is saved to is another one, or the document's own
+        SCOPED_TRACE(taken);
+        const std::string saved = Write("b.TST", "old").toStdString(), other = Path("c.TST").toStdString();
+        for (const std::string& name : {other, other + "2"}) { // of a file with one name that alone is locked
+            std::filesystem::remove(name);
+            std::filesystem::create_hard_link(saved, name);
+        }
+        Write("a.TST", "own");
+        CKsFileUse use;
+        use.Take(Path(taken));
+        ASSERT_TRUE(use.TakeTarget(Path("b.TST")));
+        EXPECT_TRUE(FileLock::Try(other, "test").HeldBy());
+        std::filesystem::rename(Write("written", "new").toStdString(), saved);
+        use.TargetWritten(true, Path("b.TST"));
+        EXPECT_FALSE(FileLock::Try(other, "test").HeldBy());
+        EXPECT_TRUE(FileLock::Try(saved, "test").HeldBy());
+    }
 }

@@ -175,4 +175,11 @@ MUTANTS = [
     ('pages', 'grid/gen_grid.cpp', 'if (!HasLostItsLine() || RowCount() == 0)\n        return QTableView', 'if (true)\n        return QTableView'),
     ('shell', 'shell/project_respell.cpp',
      'std::ranges::replace(project->members, QDir::cleanPath(oldPath), QDir::cleanPath(newPath));', ''),
+    ('shell', 'ks/fc/outside_change.cpp', '    m_whyNotReloaded = why;\n', ''),
+    ('ks', 'ks/fc/file_use.cpp', 'm_lock = std::move(target);\n    Follow(path);', 'm_lock = std::move(target);'),
+    ('ks', 'ks/fc/file_use.cpp', '        return Follow(path);', '        return;'),
+    ('ks', 'ks/fc/file_watch.cpp', ' || (isMissed && !m_wasMissed)) {', ') {'),
+    ('network', 'editors/network/plane_line.cpp', 'inside = inside && near;', ''),
+    ('cross_sections', 'editors/cross_sections/section_tables.cpp', '2 * before->chainage - previous->chainage',
+     'before->chainage + step'),
 ]

@@ -1,6 +1,6 @@
 // What other programs do to an open file, as the bar tells it: who has it, and that it is another.
 #include "files/file_lock.h"
-#include "ks/fc/file_notice.h"
+#include "ks/fc/file_bar.h"
 #include "ks/fc/project_doc.h"
 #include "shell_fixture.h"
 
@@ -77,4 +77,20 @@ TEST_F(OthersTest, ANoticeThatWasClosedComesBackWithTheNextChange)
     EXPECT_FALSE(isTold());
     Write("a.HDKV", TextWith("3.5"));
     EXPECT_TRUE(QTest::qWaitFor(isTold));
+}
+
+TEST_F(OthersTest, AReloadThatFailsSaysWhyAndKeepsWhatIsShown)
+{
+    CKsProjectDoc& document = *Open(Write("a.HDKV", TextWith("1.5")));
+    Write("a.HDKV", "[KAVO0_HD]\n[Global_Variables]\nG_waterlevel = \n");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return IsTold(document, "was changed by another program"); }));
+    CKsFileBar& bar = *frame->findChild<CKsFileBar*>();
+    const auto reload = [&] { document.Notices().front().actions.front().run(bar); };
+    reload();
+    EXPECT_TRUE(Shows(document, "1.5"));
+    EXPECT_TRUE(IsTold(document, "cannot be loaded as it is, and what is shown stays: "));
+    Write("a.HDKV", TextWith("2.5"));
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !IsTold(document, "cannot be loaded"); })) << "it is another one now";
+    reload();
+    EXPECT_TRUE(Shows(document, "2.5"));
 }

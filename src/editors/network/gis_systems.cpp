@@ -128,11 +128,17 @@ std::vector<std::vector<CGisLine>> PartsOf(const CGisLayer& layer)
     return parts;
 }
 
+/// Databases give a layer for which nobody has named a system one of this name.
+bool IsUndefined(const OGRSpatialReference& reference)
+{
+    return QLatin1String(reference.GetName()).startsWith(QLatin1String("Undefined"), Qt::CaseInsensitive);
+}
+
 } // namespace
 
 CGisSystem DescribeSystem(const OGRSpatialReference* reference)
 {
-    if (!reference || !(reference->IsProjected() || reference->IsGeographic()))
+    if (!reference || IsUndefined(*reference) || !(reference->IsProjected() || reference->IsGeographic()))
         return {};
     CGisSystem system;
     const QString code = CodeOf(*reference);

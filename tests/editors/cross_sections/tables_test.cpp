@@ -199,12 +199,12 @@ TEST_F(CrossSectionTest, SectionsAreInsertedAndDeletedWithKeys)
     EXPECT_EQ(chainages(), "AELDER0");
     for (int i = 0; i < 3; ++i)
         QTest::keyClick(table, Qt::Key_Insert);
-    QGuiApplication::clipboard()->setText("300\n400\n100\n200");
+    QGuiApplication::clipboard()->setText("350\n450\n100\n225");
     table->SetCurrentCell(1, SectionChainage + 1);
     QTest::keyClick(table, Qt::Key_V, Qt::ControlModifier);
     Select(table, 3);
     QTest::keyClick(table, Qt::Key_Insert);
-    EXPECT_EQ(chainages(), "AELDER300 AELDER400 AELDER100 AELDER200 AELDER500") << "300 and 400 are taken elsewhere";
+    EXPECT_EQ(chainages(), "AELDER350 AELDER450 AELDER100 AELDER225 AELDER550") << "as far again, but 350 and 450 are taken";
 }
 
 TEST_F(CrossSectionTest, PointsAreInsertedAndDeletedWithKeys)

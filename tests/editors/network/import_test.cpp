@@ -197,10 +197,13 @@ TEST_F(ImportTest, LengthsOnTheMapAreComparedWithTheGround)
         Library().Read(Make("feet.gpkg", {{"feet", 2263, {{"A", "LINESTRING (980000 200000, 981000 200000)"}}}}));
     EXPECT_NEAR(length(Library().MapOf(feet.layers[0], feet.layers[0].system)), 304.8006, 1e-3); // US survey feet
     // What no coordinate system is named for stays as it is, and nothing is said of the ground.
-    const CGisFile plain = Library().Read(Make("plain.shp", {{"plain", 0, {{"A", "LINESTRING (1 2, 4 6)"}}}}));
-    const CGisMap asItIs = Library().MapOf(plain.layers.at(0), {});
-    EXPECT_EQ(length(asItIs), 5);
-    EXPECT_TRUE(std::isnan(asItIs.scale));
+    for (const char* name : {"plain.shp", "plain.gpkg"}) {
+        const CGisFile plain = Library().Read(Make(name, {{"plain", 0, {{"A", "LINESTRING (1 2, 4 6)"}}}}));
+        EXPECT_FALSE(plain.layers.at(0).system.IsKnown()) << name;
+        const CGisMap asItIs = Library().MapOf(plain.layers.at(0), plain.layers.at(0).system);
+        EXPECT_EQ(length(asItIs), 5);
+        EXPECT_TRUE(std::isnan(asItIs.scale));
+    }
     // Many programs write metres without saying so, and GeoJSON then means degrees.
     const CGisFile metres = Library().Read(Write("metres.geojson", R"({"type":"LineString","coordinates":
         [[512000,5600000],[512100,5600000]]})"));

@@ -1,5 +1,6 @@
 // Points and places: nearest places, interpolated chainages, and the channel between the rows of its table.
 #include "editors/network/linear_reference.h"
+#include "editors/network/plane_line.h"
 
 #include <gtest/gtest.h>
 #include <random>
@@ -110,6 +111,33 @@ TEST(LinearReference, TheBoxesHideNoNearerPlace)
         EXPECT_NEAR(place->distance, nearest, 1e-9);
         EXPECT_FALSE(reference.Nearest(point, nearest * 0.999));
     }
+}
+
+TEST(PlaneLine, IsClippedToThePartsThatMeetTheWindow)
+{
+    // A wave in and out of the window's right half, then for long far from it, and back through the left half.
+    std::vector<QPointF> line;
+    for (int i = 0; i <= 64; ++i)
+        line.emplace_back(i < 32 ? 50 : 150, i % 2 ? 20 : 80);
+    for (int i = 0; i < 64; ++i)
+        line.emplace_back(1000 + i, i % 2 ? 20 : 80);
+    for (int i = 0; i < 20; ++i)
+        line.emplace_back(10, i % 2 ? 20 : 80);
+    const QRectF window(0, 0, 100, 100);
+    CMapProjection projection;
+    projection.origin = {0, 100};
+    const CPlaneLine plane(line, projection);
+    std::vector<std::pair<QPointF, QPointF>> expected, shown;
+    for (std::size_t i = 1; i < plane.Points().size(); ++i) {
+        const QPointF &a = plane.Points()[i - 1], &b = plane.Points()[i];
+        if (std::min(a.x(), b.x()) <= window.right())
+            expected.emplace_back(a, b);
+    }
+    for (const QPolygonF& part : plane.Clip(window)) {
+        for (qsizetype i = 1; i < part.size(); ++i)
+            shown.emplace_back(part[i - 1], part[i]);
+    }
+    EXPECT_EQ(shown, expected);
 }
 
 TEST(ChannelValues, AreInterpolatedBetweenRowsThatHaveThemAndNeverBeyond)
