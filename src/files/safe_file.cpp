@@ -186,7 +186,7 @@ Result<void> SafeWriter::KeepTarget()
 }
 
 /// Where files cannot be swapped: a last look, as late as can be, and one for the other. A replacement that fails half
-/// way may have cost the target; then the temporary file is all there is, and stays.
+/// way may have cost the target; unless that is seen to be there the temporary file may be all there is, and stays.
 Result<void> SafeWriter::Replace(TemporaryFile& temporary)
 {
     FileStatus now, last;
@@ -202,7 +202,8 @@ Result<void> SafeWriter::Replace(TemporaryFile& temporary)
         return {};
     }
     FileStatus left;
-    if (now.kind == Kind::None || m_platform.Status(m_target, left) || left.kind != Kind::None)
+    const bool isThere = !m_platform.Status(m_target, left) && left.kind != Kind::None;
+    if (now.kind == Kind::None || isThere)
         return Failed(error);
     const fs::path kept = temporary.Path();
     temporary.Release();

@@ -409,21 +409,27 @@ TEST_F(SafeFile, WhatIsSwappedOutIsNoLeftOver)
 // Where a replacement can fail half way, the finished temporary file may be the only copy there is.
 TEST_F(SafeFile, WhatIsLeftWhenTheTargetIsLostStaysAndIsNamed)
 {
-    Write("a.hdkv", "old content");
-    FaultyPlatform platform;
-    platform.canExchange = false;
-    platform.fault = [&](const std::string& call) {
-        if (call != "Replace")
-            return std::error_code();
-        fs::remove(m_folder / "a.hdkv");
-        return DiskFull();
-    };
-    const auto result = WriteFileSafely(Path("a.hdkv"), "new content", {.platform = &platform});
-    ASSERT_FALSE(result);
-    EXPECT_EQ(FileCount(), 1u);
-    EXPECT_EQ(ReadWholeFile(result.error().kept).value(), "new content");
-    EXPECT_NE(result.error().message.find(result.error().kept), std::string::npos) << result.error().message;
-    EXPECT_EQ(result.error().code, std::errc::no_space_on_device);
+    for (const bool canLook : {true, false}) { // whether the target is there is not known, either
+        SCOPED_TRACE(canLook);
+        Write("a.hdkv", "old content");
+        bool isReplaced = false;
+        FaultyPlatform platform;
+        platform.canExchange = false;
+        platform.fault = [&](const std::string& call) {
+            if (call == "Replace") {
+                isReplaced = true;
+                fs::remove(m_folder / "a.hdkv");
+            }
+            return call == "Replace" || (isReplaced && !canLook && call == "Status") ? DiskFull() : std::error_code();
+        };
+        const auto result = WriteFileSafely(Path("a.hdkv"), "new content", {.platform = &platform});
+        ASSERT_FALSE(result);
+        EXPECT_EQ(FileCount(), 1u);
+        EXPECT_EQ(ReadWholeFile(result.error().kept).value(), "new content");
+        EXPECT_NE(result.error().message.find(result.error().kept), std::string::npos) << result.error().message;
+        EXPECT_EQ(result.error().code, std::errc::no_space_on_device);
+        fs::remove(result.error().kept);
+    }
 }
 
 #ifdef __linux__
