@@ -179,9 +179,13 @@ void PaintOverlay(QPainter& painter, const CMapStyle& style, const QRect& window
         PaintLabel(painter, style, window, *at, label);
     PaintScaleBar(painter, style, window, scale);
     PaintLegend(painter, style, window, legend);
-    painter.setPen(style.muted);
-    painter.drawText(window, Qt::AlignCenter | Qt::TextWordWrap, hint);
-    painter.setPen(QPen(focus ? Faded(style.chosen, 150) : Qt::transparent, 1));
-    painter.setBrush(Qt::NoBrush);
-    painter.drawRect(QRectF(window).adjusted(0.5, 0.5, -0.5, -0.5));
+    if (!hint.isEmpty()) {
+        painter.setPen(style.muted);
+        painter.drawText(window, Qt::AlignCenter | Qt::TextWordWrap, hint);
+    }
+    if (focus) {
+        painter.setPen(QPen(Faded(style.chosen, 150), 1));
+        painter.setBrush(Qt::NoBrush);
+        painter.drawRect(QRectF(window).adjusted(0.5, 0.5, -0.5, -0.5));
+    }
 }
