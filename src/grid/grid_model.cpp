@@ -1,5 +1,6 @@
 #include "grid/grid_model.h"
 
+#include "grid/bounds.h"
 #include "grid/cell_text.h"
 #include "grid/grid_texts.h"
 #include "grid/row_commands.h"
@@ -134,14 +135,20 @@ QVariant CGridModel::headerData(int section, Qt::Orientation orientation, int ro
     return role == Qt::ToolTipRole ? HeaderToolTip(section) : QVariant();
 }
 
-/// What the column is, and the unit of its cells.
+/// What the column is, the unit and the range of its cells, what new lines hold, and how the file calls it.
 QString CGridModel::HeaderToolTip(int column) const
 {
     const ColumnSpec& spec = Column(column);
-    const QString unit = spec.ToolTip();
-    if (!spec.hint)
-        return unit;
-    return unit.isEmpty() ? spec.hint() : spec.hint() + u'\n' + unit;
+    QStringList lines{spec.hint ? spec.hint() : QString(), spec.ToolTip()};
+    if (const QString range = BoundsText(spec.bounds, spec.style); !range.isEmpty())
+        lines << GridTexts::tr("Range: %1").arg(NumberText(range, spec.UnitSymbol()));
+    if (const CellValue value = Rows() && !spec.name.empty() ? DefaultOf(spec) : CellValue(); !IsEmptyCell(spec, value))
+        lines << (spec.fill ? GridTexts::tr("New lines: %1, the global value") : GridTexts::tr("New lines: %1"))
+                     .arg(FullText(spec, value));
+    if (!spec.name.empty())
+        lines << GridTexts::tr("In the file: %1").arg(QString::fromUtf8(spec.name));
+    lines.removeAll(QString());
+    return lines.join(u'\n');
 }
 
 Qt::ItemFlags CGridModel::flags(const QModelIndex& index) const

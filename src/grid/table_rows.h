@@ -71,6 +71,8 @@ public:
 
     /// New lines with the columns' fill values, not in the source; they fit at its end.
     std::unique_ptr<IRowBlock> NewLines(int count) const { return NewLines(count, m_rows->Count()); }
+    /// What a cell of a new line holds.
+    CellValue DefaultOf(const ColumnSpec& column) const { return column.access->get(NewLines(1)->At(0)); }
 
 protected:
     using CellKey = std::pair<RowKey, int>;

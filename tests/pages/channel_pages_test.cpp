@@ -100,9 +100,10 @@ TEST_F(ChannelPagesTest, ResistanceApproachAndFormula)
         }
         for (int number : {1303, 1304, 1305, 1306})
             EXPECT_EQ(unit(number), units[index]);
+        const QString unitTip = *units[index] ? QString("Unit: %1\n").arg(units[index]) : QString();
         for (int column : {3, 4, 5, 6})
-            EXPECT_EQ(tip(column), *units[index] ? QString("Unit: %1").arg(units[index]) : QString());
-        EXPECT_EQ(Find<QLineEdit>(1303)->toolTip(), tip(3));
+            EXPECT_TRUE(tip(column).startsWith(unitTip + "New lines: ")) << tip(column).toStdString();
+        EXPECT_EQ(Find<QLineEdit>(1303)->toolTip(), unitTip.chopped(!unitTip.isEmpty()));
     }
     EXPECT_EQ(globals.G_resistance, 30) << "no value is converted";
     EXPECT_EQ(Texts(1), "A|1|33|30|25|20");

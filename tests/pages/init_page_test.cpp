@@ -95,10 +95,12 @@ TEST_F(InitPageTest, UnitsAreLive)
     const QString before = Stored();
     auto* level = Find<CCtrlEdit>("levelOrDepth_1001");
     const auto tip = [&](int column) {
-        return grid->model()->headerData(column - 1, Qt::Horizontal, Qt::ToolTipRole).toString();
+        return grid->model()->headerData(column - 1, Qt::Horizontal, Qt::ToolTipRole).toString().section('\n', 0, 0);
     };
     EXPECT_EQ(Texts(1), "A|305|3.048|28.317");
     EXPECT_EQ(tip(3), "Unit: m");
+    EXPECT_EQ(grid->model()->headerData(2, Qt::Horizontal, Qt::ToolTipRole).toString(),
+              "Unit: m\nNew lines: 3.048 m, the global value\nIn the file: InitialH");
     EXPECT_EQ(Find<QLabel>("unit_1001")->text(), "m");
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     EXPECT_EQ(level->text(), "10");

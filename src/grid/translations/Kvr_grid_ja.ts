@@ -531,5 +531,21 @@
         <source>%1: sum %2, mean %3, min %4, max %5</source>
         <translation>%1: 合計 %2、平均 %3、最小 %4、最大 %5</translation>
     </message>
+    <message>
+        <source>Range: %1</source>
+        <translation>範囲: %1</translation>
+    </message>
+    <message>
+        <source>New lines: %1, the global value</source>
+        <translation>新しい行: %1 (全体値)</translation>
+    </message>
+    <message>
+        <source>New lines: %1</source>
+        <translation>新しい行: %1</translation>
+    </message>
+    <message>
+        <source>In the file: %1</source>
+        <translation>ファイル内の名前: %1</translation>
+    </message>
 </context>
 </TS>
