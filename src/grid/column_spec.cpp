@@ -67,10 +67,10 @@ QString WithUnit(const QString& name, UnitGroup group)
     return QStringLiteral("%1 [%2]").arg(name, CKsEditStyle(group).UnitSymbol());
 }
 
-QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit)
+QString NumberToolTip(const CKsEditStyle& style, double value, bool hidesDigits, const QString& unit)
 {
     const QString unitTip = KsUnitToolTip(unit);
-    if (!style.HidesDigits(value, shown))
+    if (!hidesDigits)
         return unitTip;
     const QString full = GridTexts::tr("Full value: %1").arg(NumberText(style.FullText(value), unit));
     return unitTip.isEmpty() ? full : full + u'\n' + unitTip;

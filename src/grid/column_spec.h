@@ -88,8 +88,8 @@ struct Choices
 QString NumberText(const QString& number, const QString& unit);
 /// "Width [m]".
 QString WithUnit(const QString& name, UnitGroup group);
-/// The unit of a number and, where `shown` leaves some of its digits out, the whole number.
-QString NumberToolTip(const CKsEditStyle& style, double value, const QString& shown, const QString& unit);
+/// The unit of a number and, where some of its digits are not shown, the whole number.
+QString NumberToolTip(const CKsEditStyle& style, double value, bool hidesDigits, const QString& unit);
 
 /// What a column holds of a place that another editor sends, beside its branch and chainage.
 enum class LocationValue

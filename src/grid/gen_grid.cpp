@@ -257,6 +257,23 @@ bool CGenGrid::edit(const QModelIndex& index, EditTrigger trigger, QEvent* event
     return QTableView::edit(index, trigger, event);
 }
 
+/// Typing edits the cell; what comes here found none to edit. In a locked cell that is told: who types on with Tab would
+/// put what follows into the wrong columns.
+void CGenGrid::keyboardSearch(const QString& typed)
+{
+    const QModelIndex cell = currentIndex();
+    if (typed.isEmpty() || !typed.front().isPrint() || !cell.isValid() ||
+        !m_model->IsLocked(cell.row(), cell.column()) || !MayChange())
+        return;
+    TellRefusal(*this, GridTexts::tr("The cell is locked."), RefusalDetails(PlaceText(cell), typed, {}, {}));
+}
+
+QString CGenGrid::PlaceText(const QModelIndex& cell) const
+{
+    const QString line = QString::number(m_model->LineNumber(cell.row()));
+    return GridTexts::tr("%1, line %2").arg(m_model->Column(cell.column()).header(), line);
+}
+
 bool CGenGrid::LeaveField()
 {
     return m_host ? m_host->LeaveField() : CommitEditor();

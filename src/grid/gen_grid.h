@@ -52,6 +52,8 @@ public:
     /// "Line 3 of 120", with the whole number of the current cell where the cell leaves digits out, and how many lines
     /// are shown when others are hidden.
     QString LineText() const;
+    /// Names a cell in a message: "Chainage, line 3".
+    QString PlaceText(const QModelIndex& cell) const;
     /// What the selected numbers come to.
     QString SelectionText() const;
 
@@ -104,7 +106,7 @@ protected:
     void paintEvent(QPaintEvent* event) override;
     void changeEvent(QEvent* event) override;
     void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
-    void keyboardSearch(const QString&) override {} // typing edits the cell
+    void keyboardSearch(const QString& typed) override;
     bool edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) override;
     using QTableView::edit;
 

@@ -3,6 +3,7 @@
 #include "grid/cell_text.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_host.h"
+#include "grid/grid_widths.h"
 #include "grid/grid_texts.h"
 #include "grid/table_text.h"
 #include "ks/fc/doc.h"
@@ -99,5 +100,6 @@ bool PasteCells(CGenGrid& grid)
     if (grid.Host())
         grid.Host()->LineEdited(grid); // the project is told when locations came in
     grid.Reload();
+    grid.Widths().MakeRoom();
     return true;
 }

@@ -262,10 +262,9 @@ bool CGridDelegate::Commit()
     }
     const QScopedValueRollback telling(m_telling, true);
     const ColumnSpec& column = m_grid->Model()->Column(m_index.column());
-    const QString place =
-        GridTexts::tr("%1, line %2").arg(column.header(), QString::number(m_grid->Model()->LineNumber(m_index.row())));
     TellRefusal(*editor, refusal,
-                RefusalDetails(place, TextOf(editor), BoundsText(column.bounds, column.style), column.UnitSymbol()));
+                RefusalDetails(m_grid->PlaceText(m_index), TextOf(editor), BoundsText(column.bounds, column.style),
+                               column.UnitSymbol()));
     return false;
 }
 

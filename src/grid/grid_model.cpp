@@ -142,7 +142,8 @@ QString CGridModel::HeaderToolTip(int column) const
     QStringList lines{spec.hint ? spec.hint() : QString(), spec.ToolTip()};
     if (const QString range = BoundsText(spec.bounds, spec.style); !range.isEmpty())
         lines << GridTexts::tr("Range: %1").arg(NumberText(range, spec.UnitSymbol()));
-    if (const CellValue value = Rows() && !spec.name.empty() ? DefaultOf(spec) : CellValue(); !IsEmptyCell(spec, value))
+    const bool isFixed = spec.Kind() != CellKind::DateTime && spec.Kind() != CellKind::Button; // a date is that of now
+    if (const CellValue value = Rows() && isFixed ? DefaultOf(spec) : CellValue(); !IsEmptyCell(spec, value))
         lines << (spec.fill ? GridTexts::tr("New lines: %1, the global value") : GridTexts::tr("New lines: %1"))
                      .arg(FullText(spec, value));
     if (!spec.name.empty())
@@ -171,7 +172,7 @@ bool CGridModel::setData(const QModelIndex& index, const QVariant& value, int ro
         return true;
     m_pending[{NameOf(index.row()), index.column()}] = {ReadCell(column, text).value, SourceRow(index.row())};
     emit dataChanged(index, index);
-    emit CellModified();
+    emit CellModified(index);
     return true;
 }
 

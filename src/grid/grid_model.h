@@ -69,7 +69,7 @@ public:
 
 signals:
     /// The user changed a cell.
-    void CellModified();
+    void CellModified(const QModelIndex& cell);
     /// Sorted or filtered by something else, or by nothing.
     void ViewChanged();
 

@@ -77,6 +77,7 @@ CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid), m_lette
     grid.verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
     UpdateRowNumbers();
     connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGridWidths::MakeRoom);
+    connect(grid.Model(), &CGridModel::CellModified, this, &CGridWidths::MakeRoomFor);
     connect(
         &KsUnits::Instance(), &KsUnits::Changed, this,
         [this] {
@@ -137,6 +138,16 @@ void CGridWidths::MakeRoom()
 {
     for (int column = 0; column < std::min(m_columnsSet, m_grid.ColumnCount()); ++column)
         m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, m_grid.columnWidth(column)));
+}
+
+void CGridWidths::MakeRoomFor(const QModelIndex& cell)
+{
+    const QString text = m_grid.TextAt(cell.row() + 1, cell.column() + 1);
+    const int width = m_grid.columnWidth(cell.column());
+    if (cell.column() < m_columnsSet && m_letters.Bound(text) > width - Margin)
+        m_grid.setColumnWidth(cell.column(),
+                              std::max(width, std::min(m_grid.fontMetrics().horizontalAdvance(text) + Margin,
+                                                       MostOfAWindow)));
 }
 
 /// At least `least`, and what the header and the texts need: of `most` rows of the whole table, and of those in sight.

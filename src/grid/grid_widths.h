@@ -20,6 +20,8 @@ public:
     /// Makes columns wider that their texts do not fit into; what the user has made wider stays.
     void MakeRoom();
     void MakeRoomForMarks();
+    /// Likewise for the text of one cell.
+    void MakeRoomFor(const QModelIndex& cell);
 
 private:
     /// Of the grid's font.

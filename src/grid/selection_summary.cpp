@@ -48,13 +48,12 @@ CSelectionSummary::CSelectionSummary(CGenGrid& grid) : QObject(&grid), m_grid(gr
     connect(grid.Model(), &QAbstractItemModel::dataChanged, this, &CSelectionSummary::FindAgain);
 }
 
+/// Also where nothing is selected any more: who shows the text is told that it is gone.
 void CSelectionSummary::FindAgain()
 {
-    m_text.clear();
-    if (m_grid.SelectedBlock())
+    if (m_grid.SelectedBlock() || !m_text.isEmpty())
         m_pause.start();
-    else
-        m_pause.stop();
+    m_text.clear();
 }
 
 QString CSelectionSummary::Found() const

@@ -6,10 +6,12 @@
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
 #include "module/sheet.h"
+#include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page.h"
 #include "pages/page_table.h"
 #include "res/strings.h"
 
+#include <QApplication>
 #include <QLineEdit>
 #include <QTimer>
 #include <QUndoStack>
@@ -26,6 +28,10 @@ CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CKsProjectView(parent)
 {
     setObjectName("hdView");
     setWindowTitle(LoadString(Str::SheetCaption));
+    connect(qApp, &QApplication::focusChanged, this, [this](QWidget*, QWidget* now) {
+        if (isAncestorOf(now))
+            ShowStatus();
+    });
 }
 
 CKavo0_hdView::~CKavo0_hdView()
@@ -55,7 +61,10 @@ void CKavo0_hdView::OnInitialUpdate()
 
     CKsProjectView::OnInitialUpdate();
     AddTabs();
-    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, &CKavo0_hdView::MovedOn);
+    connect(m_sheet, &CDlgPropertySheet::PageChanged, this, [this] {
+        MovedOn();
+        TellLocationIfOther();
+    });
     if (auto* page = ActivePage())
         page->OnSetActive();
     KsAfterPaint(this, this, [this] { MakeOtherPages(); });
@@ -103,6 +112,7 @@ void CKavo0_hdView::OnUpdate(CView* sender, int hint, CHint* object)
     else if (hint == CKsDoc::ReloadHint)
         page->LoadFromDocument(GetDocument());
     CKsProjectView::OnUpdate(sender, hint, object);
+    TellLocationIfOther();
 }
 
 bool CKavo0_hdView::MayLeave(KsLeave what)
@@ -134,9 +144,12 @@ void CKavo0_hdView::CurrentLocationChanged()
         TellLocationLater();
 }
 
-/// The line of the table that is worked in, and the number of its current cell where the cell leaves digits out.
+/// The line of the table that is worked in, or the field; and its number where it leaves digits out.
 CString CKavo0_hdView::PlaceText() const
 {
+    if (const auto* field = qobject_cast<const CCtrlEdit*>(QApplication::focusWidget()); field && isAncestorOf(field))
+        if (const QString text = field->FullText(); !text.isEmpty())
+            return text;
     const auto* page = ActivePage();
     const auto* grid = page ? page->LinesGrid() : nullptr;
     return grid ? grid->LineText() : CString();

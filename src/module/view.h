@@ -57,7 +57,9 @@ private:
     void FetchLocation();
     void FindField();
     void TellLocationLater();
+    void TellLocationIfOther();
     void TellLocation();
+    std::pair<CString, double> CurrentLocation() const;
 
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
@@ -66,6 +68,7 @@ private:
     CDlgPropertySheet* m_sheet = nullptr;                      // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_tellLocation = false; // once the present event is over
+    std::pair<CString, double> m_toldLocation;
     CGridSearch m_search;
     bool m_linesEnabled = true;
 };

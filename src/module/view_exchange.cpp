@@ -41,16 +41,31 @@ void CKavo0_hdView::TellLocationLater()
         QTimer::singleShot(0, this, &CKavo0_hdView::TellLocation);
 }
 
+/// The current line may be at another place now, or another page has come to the front.
+void CKavo0_hdView::TellLocationIfOther()
+{
+    if (CurrentLocation() != m_toldLocation)
+        TellLocationLater();
+}
+
 void CKavo0_hdView::TellLocation()
 {
     m_tellLocation = false;
     if (!GetDocument())
         return;
+    m_toldLocation = CurrentLocation();
+    if (!m_toldLocation.first.isEmpty())
+        GetDocument()->LocationShown(this, m_toldLocation.first, m_toldLocation.second);
+}
+
+/// Of the current line; without a branch where there is none, or a blank one.
+std::pair<CString, double> CKavo0_hdView::CurrentLocation() const
+{
     const auto* page = ActivePage();
     const auto record = page && page->GetGrid() ? page->GetRecordAt(page->GetGrid()->CurrentRow()) : nullptr;
     if (!record || record->IsBlank())
-        return;
-    GetDocument()->LocationShown(this, QString::fromStdString(record->RiverName), record->Chainage);
+        return {};
+    return {QString::fromStdString(record->RiverName), record->Chainage};
 }
 
 QStringList CKavo0_hdView::BranchNames()

@@ -44,6 +44,22 @@ class Numbers(Case):
         self.assertFalse(editor.modified)
 
 
+class LockedCells(Case):
+    def test_typing_there_is_told(self):
+        """Who types on with Tab would put what follows into other columns."""
+        editor = self.open(samples.hd_text({'BedList': ['"MOORBECK", 100, 30, 31, 32, 33']},
+                                           {'Global_Values': ['ResisZone = 1, 30, 25, 20']}))
+        editor.go_to('Bed Resist.')
+        editor.click_cell(1, 2)
+        editor.press('Tab')
+        editor.type('0.5', speed=10)
+        self.assert_told_once('The cell is locked.', 'Resistance, line 1: "0" was typed.')
+        editor.press('Tab')
+        editor.type('0.75\t')
+        editor.save()
+        self.assertEqual(self.saved().records('BedList'), ['"MOORBECK", 100, 30, 0.75, 32, 33'])
+
+
 class BranchNames(Case):
     def test_typed_name_is_not_completed(self):
         editor = self.open_project()

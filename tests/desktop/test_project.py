@@ -23,6 +23,17 @@ class TypingWithANetwork(Case):
         self.assertEqual(self.saved().records('InitList'), expected)
         self.assert_clean()
 
+    def test_the_map_follows_a_line_that_moves(self):
+        editor = self.open_project()
+        plan = editor.frame.find('filler', '^Map of the river network')
+        for change, place in ((lambda: editor.put(1, 2, '6000'), 'MOORBECK 6000.0 m'),
+                              (lambda: editor.press('ctrl+z'), 'MOORBECK 100.0 m'),
+                              (lambda: editor.go_to('Wind'), 'MOORBECK 100.0 m'),
+                              (lambda: editor.put(1, 2, '700'), 'MOORBECK 700.0 m'),
+                              (lambda: editor.go_to('Initial'), 'MOORBECK 100.0 m')):
+            change()
+            wait_for(lambda: plan.description == place, f'the map shows {place}, not {plan.description}', 4)
+
     def test_fast_changes(self):
         """Down the columns, where every line that is left is told to the others."""
         lines = [f'"MOORBECK", {100 * n}, 1, 2' for n in range(1, 9)]

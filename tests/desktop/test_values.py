@@ -14,6 +14,21 @@ class HiddenDigits(Case):
         editor.click_cell(1, 2)
         wait_for(lambda: '1500.6' in editor.status(), f'the status bar gives 1500.6, not {editor.status()}', 3)
 
+    def test_status_bar_gives_the_full_value_of_a_field(self):
+        editor = self.open(self.TEXT)
+        editor.fill('Water Level', '1.23456789', leave=None)
+        editor.press('Tab', 'shift+Tab')
+        wait_for(lambda: 'Water Level: 1.23456789 m' in editor.status(), f'the field, not {editor.status()}', 3)
+        editor.press('Tab')
+        wait_for(lambda: 'Water Level' not in editor.status(), 'it goes with the focus', 3)
+
+    def test_a_long_number_is_shown_whole(self):
+        editor = self.open(self.TEXT)
+        cell = editor.table().cell(1, 4)
+        before = cell.place[2]
+        editor.put(1, 4, '12345678901.125')
+        self.assertGreater(cell.place[2], before)
+
     def test_all_digits(self):
         """What a cell hides is painted when the user wants to see it, and not when not."""
         editor = self.open(self.TEXT)

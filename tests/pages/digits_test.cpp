@@ -90,6 +90,7 @@ TEST_F(DigitsTest, AllDigitsShowsEveryCellAndFieldInFull)
     Open<FamilyPage>(init);
     auto* field = new CCtrlEdit(view.get());
     view->layout()->addWidget(field);
+    field->setFixedWidth(400);
     field->Setup(globals.G_waterlevel, {.name = "level", .unit = UnitGroup::WaterLevel, .digits = 3}, {});
     EXPECT_EQ(field->text(), "-1.23e-100");
     EXPECT_EQ(field->toolTip(), "Full value: -1.2345678901234567e-100 m\nUnit: m");
@@ -106,6 +107,10 @@ TEST_F(DigitsTest, AllDigitsShowsEveryCellAndFieldInFull)
     EXPECT_GT(grid->columnWidth(2), width) << "an elided number shows no digits";
     EXPECT_EQ(field->text(), "-1.2345678901234567e-100") << "longer than what may be typed";
     EXPECT_EQ(field->toolTip(), "Unit: m");
+    field->setFixedWidth(90);
+    view->layout()->activate();
+    field->Show();
+    EXPECT_EQ(field->toolTip(), "Full value: -1.2345678901234567e-100 m\nUnit: m") << "no room for all of it";
     EXPECT_TRUE(document.UndoStack().isClean());
 
     KsUnits::Instance().SetAllDigits(false);

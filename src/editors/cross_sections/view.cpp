@@ -16,7 +16,6 @@ void CCrossSectionView::OnInitialUpdate()
     MakeContent(*m_plot, 700, 500, "sectionTable", "pointTable");
     AddSectionColumns(*Sections()->Model());
     AddPointColumns(*Points()->Model());
-    Points()->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
     Sections()->Model()->SetSource(*Document(), MakeSectionRows(*Document()));
     setFocusProxy(Sections());
     connect(m_plot, &CSectionPlot::PointPicked, this, [this](int point) { Points()->GotoLine(point + 1); });

@@ -8,6 +8,7 @@
 
 #include <QPainter>
 #include <QStyle>
+#include <QStyleOptionFrame>
 #include <algorithm>
 
 namespace {
@@ -60,9 +61,45 @@ void CCtrlEdit::ShowValue()
     UpdateToolTip();
 }
 
+/// Because the number is rounded, or because the field has no room for all of it.
+bool CCtrlEdit::HidesDigits() const
+{
+    return m_value && (m_style.HidesDigits(*m_value, m_shown) ||
+                       fontMetrics().horizontalAdvance(m_shown) > width() - WidthBeside());
+}
+
+/// What frame and margins take.
+int CCtrlEdit::WidthBeside() const
+{
+    constexpr int margins = 2 * 2; // that a line edit leaves beside its text
+    QStyleOptionFrame option;
+    initStyleOption(&option);
+    return width() - style()->subElementRect(QStyle::SE_LineEditContents, &option, this).width() + margins;
+}
+
+QSize CCtrlEdit::minimumSizeHint() const
+{
+    const int number = fontMetrics().horizontalAdvance(QStringLiteral("0.031125"));
+    return {number + WidthBeside(), QLineEdit::minimumSizeHint().height()};
+}
+
+QString CCtrlEdit::FullText() const
+{
+    return HidesDigits() ? QStringLiteral("%1: %2").arg(accessibleName(),
+                                                        NumberText(m_style.FullText(*m_value), UnitSymbol()))
+                         : QString();
+}
+
 void CCtrlEdit::UpdateToolTip()
 {
-    setToolTip(NumberToolTip(m_style, *m_value, m_shown, UnitSymbol()));
+    setToolTip(NumberToolTip(m_style, *m_value, HidesDigits(), UnitSymbol()));
+}
+
+void CCtrlEdit::resizeEvent(QResizeEvent* event)
+{
+    QLineEdit::resizeEvent(event);
+    if (m_value)
+        UpdateToolTip();
 }
 
 KsTyped<double> CCtrlEdit::Typed() const
@@ -94,7 +131,7 @@ void CCtrlEdit::Store()
 void CCtrlEdit::paintEvent(QPaintEvent* event)
 {
     QLineEdit::paintEvent(event);
-    if (!m_value || m_typing->IsTyped() || !m_style.HidesDigits(*m_value, m_shown))
+    if (m_typing->IsTyped() || !HidesDigits())
         return;
     QPainter painter(this);
     const int frame = style()->pixelMetric(QStyle::PM_DefaultFrameWidth, nullptr, this) + 1;

@@ -28,11 +28,18 @@ public:
     /// Takes the text when the field is left. It is refused when it is no number or out of range; the user has been
     /// told, the field has the focus and the value is what it was. A text that nobody changed changes nothing.
     CTyping& Typing() const { return *m_typing; }
+    /// "Theta: 0.123456789", where the field shows fewer digits than the number has; empty otherwise.
+    QString FullText() const;
+    /// Room for a small number: "0.031125".
+    QSize minimumSizeHint() const override;
 
 protected:
     void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
 
 private:
+    bool HidesDigits() const;
+    int WidthBeside() const;
     void ShowValue();
     void UpdateToolTip();
     void Store();
