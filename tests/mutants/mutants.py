@@ -19,7 +19,7 @@ MUTANTS = [
     ('files', 'files/temporary_file.cpp', 'sync ? m_platform.Sync(m_file)', 'sync ? std::error_code()'),
     ('files', 'files/safe_file.cpp', 'return error ? error : closed;', 'return closed ? error : error;'),
     ('files', 'files/temporary_file.cpp', 'text.remove_prefix(written);', 'text = {};'),
-    ('files', 'files/safe_file.cpp', 'now.kind == Kind::None || isThere', 'true'),
+    ('files', 'files/safe_file.cpp', 'now.kind == Kind::None || isThere', 'isThere || true'),
     ('files', 'files/safe_file.cpp', '!m_platform.Status(m_target, left) &&', 'm_platform.Status(m_target, left) ||'),
     ('files', 'files/safe_file.cpp', 'm_isExpected && m_isSettled && status', 'm_isExpected && status'),
     ('files', 'files/safe_file.cpp', 'm_options.sync && !m_report.displaced.empty()', 'false'),
