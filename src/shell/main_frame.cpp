@@ -194,13 +194,20 @@ void CMainFrame::Update()
     m_menus.Update();
 }
 
+void CMainFrame::ShowModified()
+{
+    const CKsDoc* document = ActiveDocument();
+    if (const bool isModified = document && document->IsModified(); isWindowModified() != isModified)
+        setWindowModified(isModified);
+}
+
 void CMainFrame::UpdateTitle()
 {
     const CKsDoc* document = ActiveDocument();
     const QString program = QCoreApplication::applicationName();
     // This form is also the one that a maximised document window would make of it.
     setWindowTitle(document ? QStringLiteral("%1 - [%2[*]]").arg(program, KsTitleText(document->GetTitle())) : program);
-    setWindowModified(document && document->IsModified());
+    ShowModified();
     const CProject* project = m_projects.Registry().FindByView(GetActiveView());
     m_projectLabel->setText(project ? tr("Project: %1").arg(KsVisibleText(project->name)) : QString());
     m_projectLabel->setToolTip(project ? KsVisibleText(QDir::toNativeSeparators(project->path)) : QString());
@@ -232,6 +239,8 @@ void CMainFrame::changeEvent(QEvent* event)
         m_bars.Create();
         Retranslate();
     }
+    if (event->type() == QEvent::ModifiedChange)
+        ShowModified(); // a document window that is no longer maximised takes the mark away
     CKsMDIFrameWnd::changeEvent(event);
 }
 

@@ -64,6 +64,7 @@ private:
     void Retranslate();
     void Update();
     void UpdateTitle();
+    void ShowModified();
     void UpdatePluginLabel();
     void ReadSettings();
     void WriteSettings() const;

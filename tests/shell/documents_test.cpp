@@ -34,6 +34,11 @@ TEST_F(ShellTest, AMaximisedWindowDoesNotDoubleTheTitle)
     frame->ActiveDocument()->SetModifiedFlag();
     QCoreApplication::processEvents();
     EXPECT_EQ(frame->windowTitle().count("a.tst"), 1) << frame->windowTitle().toStdString();
+    for (const bool tabs : {true, false, true, false}) {
+        Action(tabs ? "actionTabs" : "actionSideBySide")->trigger();
+        QCoreApplication::processEvents();
+        EXPECT_TRUE(frame->isWindowModified()) << tabs;
+    }
 }
 
 TEST_F(ShellTest, ANewDocumentIsSavedUnderTheNameAskedFor)
