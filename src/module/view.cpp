@@ -36,7 +36,8 @@ CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CKsProjectView(parent)
 
 CKavo0_hdView::~CKavo0_hdView()
 {
-    delete m_sheet; // while this is still a host
+    disconnect(qApp, nullptr, this, nullptr); // the focus leaves the pages as they go
+    delete m_sheet;                           // while this is still a host
 }
 
 CKavo0_hdDoc* CKavo0_hdView::GetDocument() const
