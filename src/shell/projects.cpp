@@ -9,6 +9,7 @@
 
 #include <QDir>
 #include <QFileInfo>
+#include <QTimer>
 #include <algorithm>
 #include <iterator>
 #include <new>
@@ -131,6 +132,17 @@ LRESULT CProjects::Ask(WPARAM request, CKSComm_Package& package, bool all)
     return answered;
 }
 
+/// A file that comes back to its project is news to the others, once its view can answer what they then ask.
+void CProjects::TellOfNewView(CView& view, CProjectHandle project)
+{
+    QTimer::singleShot(0, &view, [this, &view, project] {
+        CKSComm_Package news;
+        news.view = &view;
+        news.project = project;
+        Forward(KsRequest::DataChanged, news);
+    });
+}
+
 LRESULT CProjects::SwitchBoard(WPARAM request, CKSComm_Package& package)
 {
     switch (request) {
@@ -139,8 +151,10 @@ LRESULT CProjects::SwitchBoard(WPARAM request, CKSComm_Package& package)
         if (!found)
             return 0;
         CProject* project = FindForChange(found->handle);
-        if (package.view && FindByView(package.view) != project)
+        if (package.view && FindByView(package.view) != project) {
             project->views.emplace_back(package.view);
+            TellOfNewView(*package.view, project->handle);
+        }
         return project->handle;
     }
     case KsRequest::LeaveProject:

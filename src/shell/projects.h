@@ -57,6 +57,7 @@ public:
 private:
     std::vector<QPointer<CView>> Others(const CKSComm_Package& package) const;
     LRESULT Ask(WPARAM request, CKSComm_Package& package, bool all);
+    void TellOfNewView(CView& view, CProjectHandle project);
     CProject* FindForChange(CProjectHandle handle);
     std::vector<std::unique_ptr<CProject>> m_projects; // in the order of opening
     CProjectHandle m_last = 0, m_preferred = 0;

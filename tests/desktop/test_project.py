@@ -1,6 +1,7 @@
 """The editors of a project beside each other."""
 import os
 
+import case
 import samples
 from case import Case
 from waiting import wait_for
@@ -47,6 +48,26 @@ class TypingWithANetwork(Case):
             editor.save()
             self.assertEqual(self.saved().records('InitList')[:8],
                              [f'"MOORBECK", {n}23{n}, {n}.{n}71, {n}0.5' for n in range(1, 9)])
+
+
+class ComingBack(Case):
+    def test_a_reopened_file_is_on_the_map(self):
+        editor = self.open_project()
+        plan = editor.frame.find('filler', '^Map of the river network')
+
+        def comes():
+            editor.settle(0.4)
+            return case.session.pixels(*plan.place)
+
+        editor.go_to('Bed Resist.')
+        shown = comes()
+        editor.press('ctrl+F4')
+        wait_for(lambda: len(editor.windows()) == 2, 'its window goes')
+        wait_for(lambda: comes() != shown, 'and so do its marks')
+        gone = comes()
+        editor.menu('File', 'Open Recent', '/moor.HDKV')
+        wait_for(lambda: len(editor.windows()) == 3, 'its window is back')
+        wait_for(lambda: comes() != gone, 'and so are its marks')
 
 
 class Redo(Case):
