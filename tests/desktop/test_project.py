@@ -55,19 +55,19 @@ class ComingBack(Case):
         editor = self.open_project()
         plan = editor.frame.find('filler', '^Map of the river network')
 
-        def comes():
+        def legend():  # counts the locations
             editor.settle(0.4)
-            return case.session.pixels(*plan.place)
+            x, y, width, _ = plan.place
+            return case.session.pixels(x + width - 160, y + 10, 150, 120)
 
-        editor.go_to('Bed Resist.')
-        shown = comes()
+        shown = legend()
         editor.press('ctrl+F4')
         wait_for(lambda: len(editor.windows()) == 2, 'its window goes')
-        wait_for(lambda: comes() != shown, 'and so do its marks')
-        gone = comes()
+        wait_for(lambda: legend() != shown, 'and so do its marks')
         editor.menu('File', 'Open Recent', '/moor.HDKV')
         wait_for(lambda: len(editor.windows()) == 3, 'its window is back')
-        wait_for(lambda: comes() != gone, 'and so are its marks')
+        editor.menu('Window', 'Side by Side')
+        wait_for(lambda: legend() == shown, 'and so are its marks')
 
 
 class Redo(Case):
