@@ -62,7 +62,8 @@ QString CellToolTip(const ColumnSpec& column, const CellValue& value)
     const auto* number = std::get_if<double>(&value);
     if (!number || IsEmptyCell(column, value))
         return column.ToolTip();
-    return NumberToolTip(column.style, *number, HidesDigits(column, value, ShownText(column, value)), column.UnitSymbol());
+    return NumberToolTip(column.style, *number, HidesDigits(column, value, ShownText(column, value)),
+                         column.UnitSymbol());
 }
 
 QString EditText(const ColumnSpec& column, const CellValue& value)

@@ -257,8 +257,8 @@ bool CGenGrid::edit(const QModelIndex& index, EditTrigger trigger, QEvent* event
     return QTableView::edit(index, trigger, event);
 }
 
-/// Typing edits the cell; what comes here found none to edit. In a locked cell that is told: who types on with Tab would
-/// put what follows into the wrong columns.
+/// Typing edits the cell; what comes here found none to edit. In a locked cell that is told: who types on with Tab
+/// would put what follows into the wrong columns.
 void CGenGrid::keyboardSearch(const QString& typed)
 {
     const QModelIndex cell = currentIndex();

@@ -35,8 +35,8 @@ public:
     void ShowAfresh();
     /// A hidden line of the source comes into sight, until the filter is another. False when it was no hidden one.
     bool Unhide(std::size_t sourceRow);
-    /// The order shown becomes the file's, hidden lines included: an undo step. Returns where the source has the line of
-    /// `row` then.
+    /// The order shown becomes the file's, hidden lines included: an undo step. Returns where the source has the line
+    /// of `row` then.
     std::size_t KeepOrder(int row);
     /// Rows are coming or going: no moment to store anything.
     bool IsSyncing() const { return m_syncing; }
@@ -85,5 +85,5 @@ private:
     int m_rowCount = 0; // as the views know it
     bool m_syncing = false;
     QStringList m_headers; // as the views know them
-    int m_contents = 0; // which content of the document is shown
+    int m_contents = 0;    // which content of the document is shown
 };

@@ -145,9 +145,9 @@ void CGridWidths::MakeRoomFor(const QModelIndex& cell)
     const QString text = m_grid.TextAt(cell.row() + 1, cell.column() + 1);
     const int width = m_grid.columnWidth(cell.column());
     if (cell.column() < m_columnsSet && m_letters.Bound(text) > width - Margin)
-        m_grid.setColumnWidth(cell.column(),
-                              std::max(width, std::min(m_grid.fontMetrics().horizontalAdvance(text) + Margin,
-                                                       MostOfAWindow)));
+        m_grid.setColumnWidth(
+            cell.column(),
+            std::max(width, std::min(m_grid.fontMetrics().horizontalAdvance(text) + Margin, MostOfAWindow)));
 }
 
 /// At least `least`, and what the header and the texts need: of `most` rows of the whole table, and of those in sight.

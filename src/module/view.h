@@ -67,7 +67,7 @@ private:
 
     CDlgPropertySheet* m_sheet = nullptr;                      // child
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
-    bool m_tellLocation = false; // once the present event is over
+    bool m_tellLocation = false;                               // once the present event is over
     std::pair<CString, double> m_toldLocation;
     CGridSearch m_search;
     bool m_linesEnabled = true;

@@ -1,11 +1,11 @@
 // The view and the other editors of the project: what it answers, what it asks and what it tells.
 #include "module/view.h"
 
+#include "grid/gen_grid.h"
 #include "ks/fc/branch_name.h"
 #include "ks/fc/exchange.h"
 #include "ks/fc/message_box.h"
 #include "module/kavo0_hd.h"
-#include "grid/gen_grid.h"
 #include "pages/framework/page.h"
 #include "res/strings.h"
 

@@ -85,9 +85,9 @@ QSize CCtrlEdit::minimumSizeHint() const
 
 QString CCtrlEdit::FullText() const
 {
-    return HidesDigits() ? QStringLiteral("%1: %2").arg(accessibleName(),
-                                                        NumberText(m_style.FullText(*m_value), UnitSymbol()))
-                         : QString();
+    return HidesDigits()
+               ? QStringLiteral("%1: %2").arg(accessibleName(), NumberText(m_style.FullText(*m_value), UnitSymbol()))
+               : QString();
 }
 
 void CCtrlEdit::UpdateToolTip()

@@ -204,7 +204,8 @@ TEST_F(CrossSectionTest, SectionsAreInsertedAndDeletedWithKeys)
     QTest::keyClick(table, Qt::Key_V, Qt::ControlModifier);
     Select(table, 3);
     QTest::keyClick(table, Qt::Key_Insert);
-    EXPECT_EQ(chainages(), "AELDER350 AELDER450 AELDER100 AELDER225 AELDER550") << "as far again, but 350 and 450 are taken";
+    EXPECT_EQ(chainages(), "AELDER350 AELDER450 AELDER100 AELDER225 AELDER550")
+        << "as far again, but 350 and 450 are taken";
 }
 
 TEST_F(CrossSectionTest, PointsAreInsertedAndDeletedWithKeys)
