@@ -1,6 +1,7 @@
 """Many cells at once, and the way to a field by its name."""
 import samples
 from case import Case
+from waiting import wait_for
 
 
 class ManyCells(Case):
@@ -39,6 +40,16 @@ class ManyCells(Case):
         editor.save()
         self.assertEqual(self.saved().records('InitList'),
                          ['"A", 0, 10, 1', '"A", 100, 0, 2', '"A", 400, 20, 4', '"B", 50, 7, 3'])
+
+
+class Sums(Case):
+    def test_the_sum_goes_with_the_selection(self):
+        editor = self.open()
+        editor.click_cell(1, 3)
+        editor.press('shift+Down')
+        wait_for(lambda: 'sum 2.75' in editor.status(), 'the sum of two levels is shown', 3)
+        editor.click_cell(3, 4)
+        wait_for(lambda: 'selected' not in editor.status(), 'it goes', 3)
 
 
 class WayToAField(Case):
