@@ -101,6 +101,7 @@ class WhereFilesStand(Case):
         os.symlink('shared/target.hdkv', f'{self.folder}/river.hdkv')
         path = self.open_river()
         self.assertEqual(os.readlink(path), 'shared/target.hdkv')
+        self.assertIn('.target.hdkv.lock', os.listdir(f'{self.folder}/shared'), 'others are kept out as before')
         self.assertEqual(samples.Saved(f'{self.folder}/shared/target.hdkv').records('InitList')[0],
                          '"MOORBECK", 100, 2.5, 10.5')
 
@@ -124,6 +125,18 @@ class WhereFilesStand(Case):
 
 
 class WhatASaveDrops(Case):
+    def test_what_is_said_outlives_the_dialog(self):
+        editor = self.open(samples.hd_text(sections={'MapOutput': ['GenerateOutput = true']}))
+        editor.go_to('Maps')
+        editor.click_cell(1, 1, editor.table('Map output files'))
+        editor.menu('File', 'Save As')
+        editor.box()
+        editor.press('ctrl+a')
+        editor.type('other.HDKV\n')
+        wait_for(lambda: 'other.HDKV' in editor.title, 'the new name is shown')
+        editor.settle(0.4)
+        self.assertIn('Saved', editor.status())
+
     def test_dropped_lines_are_said(self):
         editor = self.open()
         for _ in range(2):

@@ -1,10 +1,12 @@
 #include "ks/fc/file_use.h"
 
+#include "ks/fc/file_name.h"
 #include "ks/fc/shown_text.h"
 #include "ks/language/date_time.h"
 
 #include <QDateTime>
 #include <QDeadlineTimer>
+#include <QFileInfo>
 #include <utility>
 
 namespace {
@@ -92,7 +94,9 @@ std::error_code CKsFileUse::WhyNone() const
 bool CKsFileUse::TakeTarget(const CString& target)
 {
     m_target = FileLock();
-    if (m_lock.IsFor(target.toStdString()))
+    // The own entry is about to be respelt: a lock beside the new name of a link would not be that of its file.
+    const bool isRespelt = KsFileKey(target) == KsFileKey(m_path) && !QFileInfo::exists(target);
+    if (m_lock.IsFor(target.toStdString()) || (isRespelt && m_lock.IsHeld()))
         return true;
     m_target = Lock(target);
     return !m_target.HeldBy();

@@ -70,6 +70,8 @@ void CKsProjectView::ShowStatus()
     if (!MainFrame() || !IsActive())
         return;
     const CString place = PlaceText();
+    if (m_saidAt.isEmpty()) // while a dialog was up
+        m_saidAt = place;
     if (place != m_saidAt)
         m_said.clear();
     QStringList parts{place, SelectionText(), m_said};
