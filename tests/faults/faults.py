@@ -24,6 +24,12 @@ class Point:
     def kills(self):
         return self.fault == KILL
 
+    def met(self, calls):
+        """The point as it came to be, given the calls that were made: a program that looks at its files from time to time
+        is not always at the same call."""
+        met = calls[self.number - 1] if self.number <= len(calls) else self.call
+        return Point(self.number, met, self.fault, self.sticky)
+
     @property
     def keeps_files(self):
         """Whether the program may be unable to remove what it has made."""

@@ -59,13 +59,16 @@ class Desk:
 
     def save(self, point=None):
         """Changes something and saves, with a fault. Gives back the calls that the save took and what did not hold
-        afterwards."""
+        afterwards, with the fault as it was met."""
         new = self._change()
         self._orders.arm(self._folder, point)
         self._editor.press('ctrl+s')
         saved, said = self._outcome()
         calls = self._orders.disarm()
-        found = [] if point is None else self._guarded.violations(new, saved, said, may_litter=saved is None or point.keeps_files)
+        found = []
+        if point:
+            point = point.met(calls)
+            found = self._guarded.violations(new, saved, said, may_litter=saved is None or point.keeps_files)
         if saved is False and not said:
             found.append('nothing is said')
         if saved is None and not point.kills:
@@ -73,7 +76,7 @@ class Desk:
         if saved is None:
             self.end()
         self._guarded.start_over()
-        return calls, found
+        return calls, [f'{point}: {sentence}' for sentence in found]
 
     def _bar(self):
         """What stands above the view, when something is beside the file that was not there."""
@@ -152,7 +155,7 @@ def run(folder, orders, every, kinds):
                     calls, _ = desk.save()
                     for point in list(faults.points(calls))[::every * 4 if is_project and every > 1 else every]:
                         count += 1
-                        wrong += [f'shell, {name}{" through a link" if linked else ""}, {point}: {sentence}'
+                        wrong += [f'shell, {name}{" through a link" if linked else ""}: {sentence}'
                                   for sentence in desk.save(point)[1]]
                 finally:
                     desk.end()
