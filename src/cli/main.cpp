@@ -27,6 +27,7 @@ namespace {
 
 int main(int argc, char** argv)
 {
+    argv = SpeakUtf8(argc, argv);
     IgnoreFileSizeSignal();
     return Hdkv(argc, argv);
 }

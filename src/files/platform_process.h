@@ -21,3 +21,7 @@ bool HasEnded(std::int64_t number);
 /// A write beyond the largest size that the user may give files fails from now on as one to a full disk does. Without
 /// it the system ends the process, and with it all that is not saved. To be called before any file is written.
 void IgnoreFileSizeSignal();
+
+/// What a program of the command line is told and says is UTF-8 from now on: gives back main's arguments so, which
+/// stay as long as the process. To be called once, first.
+char** SpeakUtf8(int& argc, char** argv);

@@ -71,3 +71,8 @@ void IgnoreFileSizeSignal()
     ::sigaction(SIGXFSZ, &action, nullptr);
 #endif
 }
+
+char** SpeakUtf8(int&, char** argv)
+{
+    return argv; // it is what the user's terminal and file names are in
+}

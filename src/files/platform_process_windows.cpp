@@ -2,9 +2,16 @@
 
 #include "base/utf8_path.h"
 
+#include <string>
+#include <vector>
+
 #define WIN32_LEAN_AND_MEAN
+#ifndef NOMINMAX
 #define NOMINMAX
+#endif
 #include <windows.h>
+// It needs what windows.h declares.
+#include <shellapi.h>
 
 ProcessName ThisProcess()
 {
@@ -30,3 +37,22 @@ bool HasEnded(std::int64_t)
 }
 
 void IgnoreFileSizeSignal() {}
+
+char** SpeakUtf8(int& argc, char** argv)
+{
+    ::SetConsoleOutputCP(CP_UTF8);
+    int count = 0;
+    wchar_t** const wide = ::CommandLineToArgvW(::GetCommandLineW(), &count);
+    if (!wide)
+        return argv;
+    static std::vector<std::string> texts;
+    static std::vector<char*> pointers;
+    for (int i = 0; i < count; ++i)
+        texts.push_back(Utf8FromPath(std::filesystem::path(wide[i])));
+    ::LocalFree(wide);
+    for (std::string& text : texts)
+        pointers.push_back(text.data());
+    pointers.push_back(nullptr);
+    argc = count;
+    return pointers.data();
+}
