@@ -2,6 +2,7 @@
 
 #include "files/structure.h"
 #include "ks/fc/document_file.h"
+#include "ks/fc/file_name.h"
 #include "ks/fc/file_use.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/system_reason.h"
@@ -30,6 +31,13 @@ qsizetype OffsetOf(const QByteArray& text, const TqlPosition& place)
     return offset + QString::fromUtf8(text.mid(offset)).left(qsizetype(place.column) - 1).toUtf8().size();
 }
 
+/// Whether a member is the file of this path, which may be spelt in another case. It is not one that is beside it under
+/// the member's own spelling.
+bool Names(const QString& member, const QString& path)
+{
+    return QDir::cleanPath(KsExistingSpelling(member)) == QDir::cleanPath(path);
+}
+
 /// Where the extension of a file name in a parameter stands, for the entries that name `path`.
 QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text, const QString& path)
 {
@@ -45,7 +53,7 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
     for (const ProjectMember& member : project.members) {
         while (report.IsLeftOut(MemberKeyword(structure.value().Get(), ++number))) {
         }
-        if (member.PathIn(folder) != QDir::cleanPath(path))
+        if (!Names(member.PathIn(folder), path))
             continue;
         const tqlHandle param = tqlParamByNum(MemberKeyword(structure.value().Get(), number), 1);
         const auto length = qsizetype(tqlGetRawParam(param).size()) - 1 - QFileInfo(path).suffix().size();
@@ -79,12 +87,15 @@ void RespellMember(const CProjects& projects, const QString& oldPath, const QStr
         before.suffix().compare(after.suffix(), Qt::CaseInsensitive) != 0)
         return;
     for (const auto& project : projects.All()) {
-        if (!project->members.contains(QDir::cleanPath(oldPath)))
+        const auto isIt = [&, path = QDir::cleanPath(newPath)](const QString& member) {
+            return member != path && Names(member, path);
+        };
+        if (std::ranges::none_of(project->members, isIt))
             continue;
-        const Result<WriteReport> respelt = Respell(project->path, oldPath, after.suffix().toUtf8());
+        const Result<WriteReport> respelt = Respell(project->path, newPath, after.suffix().toUtf8());
         if (respelt) {
             project->version = respelt.value().version;
-            std::ranges::replace(project->members, QDir::cleanPath(oldPath), QDir::cleanPath(newPath));
+            std::ranges::replace_if(project->members, isIt, QDir::cleanPath(newPath));
         }
         const QString text =
             respelt

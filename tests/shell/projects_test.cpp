@@ -81,15 +81,26 @@ TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
         EXPECT_EQ(content(), before) << "another file is no other spelling: " << other;
         document->SetPathName(Path("one/r\u00FC.tst"));
     }
-    document->SetPathName(Path("one/r\u00FC.TST"));
+    const auto rename = [&](const char* from, const char* to) {
+        ASSERT_TRUE(QFile::rename(Path(from), Path(to)));
+        ViewOf(from)->GetDocument()->SetPathName(Path(to));
+    };
+    rename("one/r\u00FC.tst", "one/r\u00FC.TST");
     EXPECT_EQ(content(),
               "[KVR_PROJECT]\n[Members]\nFile = 7\n  // main river\n  File = <one\\\\r\xC3\xBC.TST> // keep\n"
               "File=<b.tst>\nFile = true\nFile = \"one/r\xC3\xBC.TST\"\n[/Members]\n[/KVR_PROJECT]\n");
     const CProject* project = frame->Projects().Registry().Find(ProjectOf("b.tst"));
     EXPECT_EQ(project->members, (QStringList{Path("one/r\u00FC.TST"), Path("b.tst")})) << "nor does the tree keep it";
-    document->SetPathName(Path("one/r\u00FC.tst"));
+    rename("one/r\u00FC.TST", "one/r\u00FC.tst");
     EXPECT_EQ(content(), before) << "and back";
     EXPECT_TRUE(asked.isEmpty());
+    const QString other = WriteProject("other.kvrp", "File = <C.tst>\n");
+    ASSERT_TRUE(frame->OpenFile(other));
+    rename("c.tst", "c.TST");
+    EXPECT_EQ(frame->Projects().Registry().Find(ProjectOf("c.TST"))->members, QStringList{Path("c.TST")})
+        << "a member that is spelt in another case is found, and follows as well";
+    QFile file(other);
+    EXPECT_TRUE(file.open(QIODevice::ReadOnly) && file.readAll().contains("File = <C.TST>"));
 }
 
 TEST_F(ShellTest, AProjectFileThatCannotFollowIsNamed)
@@ -101,7 +112,9 @@ TEST_F(ShellTest, AProjectFileThatCannotFollowIsNamed)
     asked.clear(); // b.tst is not there
     QFile::remove(path);
     QDir().mkdir(path); // nobody can write that
-    ViewOf("a.tst")->GetDocument()->SetPathName(Path("a.TST"));
+    CKsDoc* document = ViewOf("a.tst")->GetDocument();
+    ASSERT_TRUE(QFile::rename(Path("a.tst"), Path("a.TST")));
+    document->SetPathName(Path("a.TST"));
     EXPECT_TRUE(asked.isEmpty()) << "not in the middle of the save";
     QCoreApplication::processEvents();
     ASSERT_EQ(asked.size(), 1);
