@@ -203,7 +203,7 @@ Result<void> SafeWriter::Replace(TemporaryFile& temporary)
     }
     FileStatus left;
     const bool isThere = !m_platform.Status(m_target, left) && left.kind != Kind::None;
-    if (now.kind == Kind::None || isThere)
+    if (m_seen.kind == Kind::None || isThere)
         return Failed(error);
     const fs::path kept = temporary.Path();
     temporary.Release();

@@ -409,17 +409,21 @@ TEST_F(SafeFile, WhatIsSwappedOutIsNoLeftOver)
 // Where a replacement can fail half way, the finished temporary file may be the only copy there is.
 TEST_F(SafeFile, WhatIsLeftWhenTheTargetIsLostStaysAndIsNamed)
 {
-    for (const bool canLook : {true, false}) { // whether the target is there is not known, either
-        SCOPED_TRACE(canLook);
+    struct Case
+    {
+        const char* lostAt;
+        bool canLook; // whether the target is there is not known otherwise
+    };
+    for (const auto& [lostAt, canLook] : {Case{"Replace", true}, {"Replace", false}, {"Exchange", true}}) {
+        SCOPED_TRACE(std::string(lostAt) + (canLook ? "" : ", unknown"));
         Write("a.hdkv", "old content");
         bool isReplaced = false;
         FaultyPlatform platform;
         platform.canExchange = false;
         platform.fault = [&](const std::string& call) {
-            if (call == "Replace") {
-                isReplaced = true;
+            if (call == lostAt)
                 fs::remove(m_folder / "a.hdkv");
-            }
+            isReplaced = isReplaced || call == "Replace";
             return call == "Replace" || (isReplaced && !canLook && call == "Status") ? DiskFull() : std::error_code();
         };
         const auto result = WriteFileSafely(Path("a.hdkv"), "new content", {.platform = &platform});
