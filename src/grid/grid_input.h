@@ -22,6 +22,7 @@ protected:
 
 private:
     void Ask(GridAction action);
+    void Cut();
     void NextCell();
     void PreviousCell();
 

@@ -52,3 +52,58 @@ class SortedAndFiltered(Case):
         self.wait_for_lines(editor, 'RHINE 300', 'ELBE 100', 'RHINE 100', 'ELBE 50')
         editor.save()
         self.assertEqual(self.saved().records('InitList'), LINES)
+
+
+class LinesBesideTheCurrentOne(Case):
+    """Lines are inserted, duplicated, moved and cut where the user is."""
+
+    def open_lines(self, **more):
+        return self.open(samples.hd_text({'InitList': LINES}), **more)
+
+    def wait_for_chainages(self, editor, *chainages):
+        table = editor.table()
+        shown = lambda: [table.cell(line, 2).name for line in range(1, table.lines + 1)]
+        wait_for(lambda: shown() == list(chainages), f'{chainages} are shown, not {shown()}', 5)
+
+    def test_with_keys(self):
+        editor = self.open_lines()
+        editor.click_cell(2, 3)
+        editor.press('alt+shift+Insert')
+        editor.type('ELBE')
+        editor.press('Tab')
+        editor.type('75')
+        editor.press('alt+Insert')  # the cell is still open: what was typed is taken
+        self.wait_for_chainages(editor, '300', '100', '', '75', '100', '50')
+        editor.press('ctrl+z')
+        editor.click_cell(3, 2)
+        editor.press('ctrl+shift+l', 'ctrl+shift+Up', 'ctrl+shift+Up')
+        self.wait_for_chainages(editor, '300', '75', '100', '75', '100', '50')
+        editor.type('80')
+        editor.press('Return')
+        editor.save()
+        records = self.saved().records('InitList')
+        self.assertEqual(records[:2] + records[3:], [LINES[0], '"ELBE", 80, 3.5, 12', '"ELBE", 75, 3.5, 12', *LINES[2:]])
+        for _ in range(7):
+            editor.press('ctrl+z')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), LINES)
+
+    def test_the_menu_of_a_line_is_about_it_and_what_is_cut_goes(self):
+        editor = self.open_lines()
+        editor.click_line(2)
+        editor.click_line(3, held='shift')
+        editor.click_line(2, button=3)
+        editor.press('Escape')
+        wait_for(lambda: '8 cells selected' in editor.status(), 'the menu is about both lines', 3)
+        editor.click_line(4, button=3)
+        editor.press('Escape')
+        wait_for(lambda: '4 cells selected' in editor.status(), 'the menu is about the line that was clicked', 3)
+        editor.menu('Edit', 'Cut')
+        self.wait_for_chainages(editor, '300', '100', '100')
+        editor.click_cell(2, 3)
+        editor.press('Delete')
+        wait_for(lambda: 'whole lines' in editor.status(), 'it is said why nothing is deleted', 3)
+        self.assertIsNone(editor.no_message())
+        editor.press('ctrl+x')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), [LINES[0], '"ELBE", 100, 3.5, 11', LINES[2]])

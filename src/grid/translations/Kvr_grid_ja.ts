@@ -547,5 +547,93 @@
         <source>In the file: %1</source>
         <translation>ファイル内の名前: %1</translation>
     </message>
+    <message>
+        <source>Delete takes whole lines: select them by their numbers. Cut empties cells.</source>
+        <translation>削除は行全体に対して行われます。行番号で行を選択してください。セルを空にするには切り取りを使います。</translation>
+    </message>
+    <message>
+        <source>Delete Line</source>
+        <translation>行を削除</translation>
+    </message>
+    <message>
+        <source>Delete %1 Lines</source>
+        <translation>%1 行を削除</translation>
+    </message>
+    <message>
+        <source>Insert Line Above</source>
+        <translation>上に行を挿入</translation>
+    </message>
+    <message>
+        <source>Insert Line Below</source>
+        <translation>下に行を挿入</translation>
+    </message>
+    <message>
+        <source>Duplicate Lines</source>
+        <translation>行を複製</translation>
+    </message>
+    <message>
+        <source>Duplicate the selected lines, or the current one, below them</source>
+        <translation>選択した行、または現在の行をその下に複製します</translation>
+    </message>
+    <message>
+        <source>Move Lines Up</source>
+        <translation>行を上へ移動</translation>
+    </message>
+    <message>
+        <source>Move the selected lines, or the current one, up in the file</source>
+        <translation>選択した行、または現在の行をファイル内で上へ移動します</translation>
+    </message>
+    <message>
+        <source>Move Lines Down</source>
+        <translation>行を下へ移動</translation>
+    </message>
+    <message>
+        <source>Move the selected lines, or the current one, down in the file</source>
+        <translation>選択した行、または現在の行をファイル内で下へ移動します</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <translation>切り取り</translation>
+    </message>
+    <message>
+        <source>Copy, then delete the lines or empty the cells that are selected</source>
+        <translation>コピーしてから、選択した行を削除するか、選択したセルを空にします</translation>
+    </message>
+    <message>
+        <source>Reset to Global Value</source>
+        <translation>全体値に戻す</translation>
+    </message>
+    <message>
+        <source>Give the selected cells the global value of their column</source>
+        <translation>選択したセルをその列の全体値にします</translation>
+    </message>
+    <message>
+        <source>Duplication of lines</source>
+        <translation>行の複製</translation>
+    </message>
+    <message>
+        <source>Line duplicated</source>
+        <translation>1 行を複製しました</translation>
+    </message>
+    <message>
+        <source>%1 lines duplicated</source>
+        <translation>%1 行を複製しました</translation>
+    </message>
+    <message>
+        <source>The lines of this table stand in an order of their own.</source>
+        <translation>この表の行には固有の順序があります。</translation>
+    </message>
+    <message>
+        <source>Lines cannot be moved while they are sorted.</source>
+        <translation>並べ替えている間は行を移動できません。</translation>
+    </message>
+    <message>
+        <source>Movement of lines</source>
+        <translation>行の移動</translation>
+    </message>
+    <message>
+        <source>Sort and Filter</source>
+        <translation>並べ替えと絞り込み</translation>
+    </message>
 </context>
 </TS>
