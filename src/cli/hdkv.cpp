@@ -78,12 +78,21 @@ struct Arguments
     bool checkOnly = false;
 };
 
+/// What was said has to arrive.
+int EndOutput()
+{
+    std::cout.flush();
+    return std::cout ? Exit::Fine : Complain("Standard output could not be written.", Exit::NotWritten);
+}
+
 /// Prints help, or what is wrong with the command line, of which it holds pieces.
 int PrintAnswer(const CLI::App& app, const CLI::ParseError& error)
 {
     std::ostringstream help, complaint;
     const int code = app.exit(error, help, complaint);
     std::cout << help.str();
+    if (const int written = EndOutput(); written != Exit::Fine)
+        return written;
     std::istringstream lines(complaint.str());
     for (std::string line; std::getline(lines, line);)
         std::cerr << Printable(line) << '\n';
@@ -155,10 +164,8 @@ int Run(int argc, char** argv)
     else if (create->parsed())
         code = New(a.file);
 
-    std::cout.flush();
-    if (!std::cout)
-        return Complain("Standard output could not be written.", Exit::NotWritten);
-    return code;
+    const int written = EndOutput();
+    return written == Exit::Fine ? code : written;
 }
 
 } // namespace

@@ -88,7 +88,8 @@ int Rewrite(const HD_Parameters& parameters, const std::string& path, const File
     const std::string name = "\"" + path + "\" ";
     const WriteReport& report = saved.value();
     if (lock.WhyNone())
-        Complain(name + "was written without a lock, which its folder does not take: " + lock.WhyNone().message() + ".",
+        Complain(name + "was written without a lock: \"" + lock.Path() +
+                     "\" cannot be one: " + lock.WhyNone().message() + ".",
                  Exit::Fine);
     if (report.unconfirmed)
         Complain(name + "is saved, but the disk has not confirmed it: " + report.unconfirmed.message() + ".",

@@ -107,7 +107,7 @@ std::error_code VersionOfFile(PlatformFile& platform, const std::filesystem::pat
     constexpr std::uint64_t largest = std::uint64_t(1) << 31; // the library of parameter files reads none
     return WithContent(platform, path, [&](PlatformFile::Handle file, std::uint64_t size) {
         version = {.size = size};
-        if (size > largest || (expected && size != expected->size))
+        if (size >= largest || (expected && size != expected->size))
             return std::error_code();
         std::array<char, std::size_t(1) << 16>
             buffer; // a save looks at files when it can no longer do without an answer

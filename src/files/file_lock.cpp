@@ -83,9 +83,12 @@ std::string ReadText(PlatformFile& platform, PlatformFile::Handle file)
     return text;
 }
 
-/// Whether it is what this program writes into a lock file, all of it, and nothing else.
+/// Whether it is what this program writes into a lock file, all of it, and nothing else: or zeros, which is what a loss
+/// of power leaves of it.
 bool IsHolderText(std::string_view text)
 {
+    if (text.find_first_not_of('\0') == std::string_view::npos)
+        return true;
     for (const std::string_view key : {ProgramKey, ProcessKey, UserKey, HostKey, SinceKey}) {
         const std::size_t end = text.find('\n');
         if (end == std::string_view::npos || !text.starts_with(key))
@@ -330,6 +333,11 @@ void FileLock::LeaveToOriginal()
     const std::unique_lock guard(held.guard, std::try_to_lock); // whoever had it is not in the copy
     for (const auto& [platform, file] : held.files)
         platform->Close(file);
+}
+
+std::string FileLock::Path() const
+{
+    return Utf8FromPath(m_path);
 }
 
 void FileLock::Release()

@@ -99,7 +99,7 @@ public:
         int fd = Retry([&] { return ::open(path.c_str(), flags, 0666); });
         // Others have to read a lock to see whose it is, whatever the user keeps to himself otherwise.
         struct stat is;
-        if (fd != -1 && purpose == Purpose::Lock && ::fstat(fd, &is) == 0 && is.st_size == 0 &&
+        if (fd != -1 && purpose == Purpose::Lock && ::fstat(fd, &is) == 0 && is.st_size == 0 && is.st_nlink == 1 &&
             is.st_uid == ::geteuid())
             ::fchmod(fd, 0644);
         if (fd == -1 && errno == EACCES &&

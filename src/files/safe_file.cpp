@@ -52,6 +52,9 @@ private:
 /// "nothing" replaces links by files and forgets modes.
 std::error_code SafeWriter::Look()
 {
+    for (const std::string& path : {m_path, m_options.renameTo})
+        if (path.find('\0') != std::string::npos) // the system would take what stands before it for the name
+            return std::make_error_code(std::errc::invalid_argument);
     if (const std::error_code error = FollowLinks(m_platform, m_target, m_seen))
         return error;
     m_folder = FolderOf(m_target);

@@ -73,7 +73,8 @@ std::optional<CRecoveryHeader> FromJson(const QJsonObject& json)
                            .title = json.value(Key::Title).toString(),
                            .time = QDateTime::fromString(json.value(Key::Time).toString(), Qt::ISODateWithMs),
                            .dateOfFile = DateFrom(json.value(Key::DateOfFile).toArray())};
-    const bool isPath = QDir::isAbsolutePath(header.path) && QDir::cleanPath(header.path) == header.path &&
+    // The system takes a name up to its first zero: another file than the one that is looked at here.
+    const bool isPath = !header.path.contains(QChar::Null) && QDir::isAbsolutePath(header.path) && QDir::cleanPath(header.path) == header.path &&
                         KsHasExtension(header.path, header.extension);
     const bool isWhole = json.value(Key::Format).toInteger() == Format && header.time.isValid() &&
                          header.extension.startsWith(u'.') && (header.path.isEmpty() || isPath) &&

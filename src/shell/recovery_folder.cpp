@@ -65,6 +65,14 @@ bool IsOrphan(const FileLock& lock)
     return lock.HeldBy() && lock.HeldBy()->host == ThisProcess().host && HasEnded(lock.HeldBy()->process);
 }
 
+/// Something stands under its name that is no lock: no session that lives has made it.
+bool IsDamaged(const FileLock& lock)
+{
+    const std::error_code why = lock.WhyNone();
+    return why == std::errc::file_exists || why == std::errc::is_a_directory ||
+           why == std::errc::too_many_symbolic_link_levels;
+}
+
 } // namespace
 
 CRecoveryFolder::CRecoveryFolder() : m_root(StateFolder() + QStringLiteral("/recovery")) {}
@@ -126,19 +134,22 @@ Result<void> CRecoveryFolder::Secure(Session& session) const
     return {};
 }
 
-/// Nothing for the folder of a session that lives.
-std::optional<CRecoveryFolder::Session> CRecoveryFolder::Hold(const QString& folder)
+/// Nothing for the folder of a session that lives. `deadline`: for what sessions that have ended are still writing.
+std::optional<CRecoveryFolder::Session> CRecoveryFolder::Hold(const QString& folder, const QDeadlineTimer& deadline)
 {
     if (!MakePrivateFolder(folder.toStdString()))
         return {};
-    constexpr int patience = 5000, pause = 20; // milliseconds, for what a session that has ended is still writing
-    const QDeadlineTimer deadline(patience);
+    constexpr int pause = 20; // milliseconds
     while (true) {
         FileLock lock = LockOf(folder);
         if (lock.IsHeld())
             return Session{folder, std::move(lock)};
-        if (lock.WhyNone())
-            QDir().rmdir(folder); // that of a session that could not begin
+        if (lock.WhyNone() && QDir().rmdir(folder))
+            return {}; // of a session that could not begin
+        if (IsDamaged(lock)) {
+            QFile::remove(QString::fromStdString(lock.Path())); // nobody else's stands in a folder of the user's own
+            return Session{folder, LockOf(folder)};
+        }
         if (!IsOrphan(lock) || deadline.hasExpired())
             return {};
         QThread::msleep(pause);
@@ -159,6 +170,8 @@ void CRecoveryFolder::WriterEnds(bool stopped)
 
 QStringList CRecoveryFolder::TakeOver()
 {
+    constexpr int patience = 3000; // milliseconds, for all of them: nobody sees a window meanwhile
+    const QDeadlineTimer deadline(patience);
     QStringList files;
     if (!QDir(m_root).exists() || !MakePrivateFolder(m_root.toStdString()))
         return files;
@@ -166,7 +179,7 @@ QStringList CRecoveryFolder::TakeOver()
         const QString folder = m_root + u'/' + name;
         if (m_own && m_own->folder == folder)
             continue;
-        std::optional<Session> session = Hold(folder);
+        std::optional<Session> session = Hold(folder, deadline);
         if (!session)
             continue;
         Tidy(*session);

@@ -3,6 +3,7 @@
 
 #include "files/file_lock.h"
 
+#include <QDeadlineTimer>
 #include <QString>
 #include <QStringList>
 #include <optional>
@@ -35,7 +36,7 @@ private:
         QString folder;
         FileLock lock{};
     };
-    static std::optional<Session> Hold(const QString& folder);
+    static std::optional<Session> Hold(const QString& folder, const QDeadlineTimer& deadline);
     static void Tidy(Session& session);
     Result<void> Secure(Session& session) const;
 

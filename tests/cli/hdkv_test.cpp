@@ -307,7 +307,8 @@ TEST_F(Hdkv, AFullDiskCostsNothing)
     EXPECT_EQ(Text("a.hdkv"), before);
     EXPECT_EQ(FileCount(), files + 2); // the outputs of the run
     m_prefix.clear();
-    EXPECT_EQ(Run("show a.hdkv >/dev/full 2>err.txt; exit $? #"), 4);
+    for (const char* command : {"show a.hdkv", "--version", "set --help"})
+        EXPECT_EQ(Run(command + std::string(" >/dev/full 2>err.txt; exit $? #")), 4) << command;
 }
 
 TEST_F(Hdkv, ProgramsThatChangeOneFileAtOnceLoseNothing)

@@ -88,6 +88,8 @@ TEST_F(Locks, WhatADeadProgramOrAnybodyElseLeavesIsNoLock)
 {
     Write(".river.hdkv.lock", "program kvrshell\nprocess 1\nuser a b\nhost h\nsince 17\n");
     EXPECT_TRUE(FileLock::Try(Path("river.hdkv"), "second").IsHeld());
+    Write(".river.hdkv.lock", std::string(80, '\0')); // the power has gone
+    EXPECT_TRUE(FileLock::Try(Path("river.hdkv"), "second").IsHeld());
     // Whatever stands in a lock file that is held, it is shown as one short line.
     Write(".river.hdkv.lock", "user a\x1b[2J" + std::string(5000, 'u') + "\nprocess 99999999999999999999\nsince x\n");
     PlatformFile::Handle file = 0;
@@ -127,6 +129,9 @@ TEST_F(Locks, AFolderThatTakesNoneSaysWhy)
     fs::create_hard_link(m_folder / ".river.hdkv.lock", m_folder / "kept");
     EXPECT_EQ(FileLock::Try(Path("river.hdkv"), "first").WhyNone(), std::errc::file_exists);
     EXPECT_EQ(FileCount(), 2u);
+    fs::permissions(m_folder / "kept", fs::perms(0600));
+    EXPECT_EQ(FileLock::Try(Path("river.hdkv"), "first").Path(), Path(".river.hdkv.lock")) << "it can be named";
+    EXPECT_EQ(fs::status(m_folder / "kept").permissions(), fs::perms(0600));
     const FileLock nowhere = FileLock::WaitFor(Path("missing/river.hdkv"), "first", 10s);
     EXPECT_EQ(nowhere.WhyNone(), std::errc::no_such_file_or_directory);
 }

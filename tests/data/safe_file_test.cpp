@@ -528,6 +528,10 @@ TEST_F(SafeFile, AnOwnerThatCannotBeKeptIsLostWithTheRightsOfTheGroup)
 
 TEST_F(SafeFile, RefusesWhatIsNoFileToReplace)
 {
+    Write("river", "whole");
+    EXPECT_FALSE(WriteFileSafely(Path("river") + '\0' + ".hdkv", "new")) << "the system would write to another file";
+    EXPECT_EQ(Text("river"), "whole");
+    fs::remove(m_folder / "river");
     fs::create_directory(m_folder / "folder");
     const struct
     {

@@ -319,6 +319,7 @@ TEST_F(RecoveryTest, ADamagedFileDoesNoHarm)
                                 header("file", "/etc/passwd"),
                                 header("file", "a.HDKV"),
                                 header("file", "/tmp/../etc/a.HDKV"),
+                                header("file", Path("a.HDKV") + QChar::Null + ".HDKV"),
                                 header("fileSize", "many"),
                                 header("fileHash", "00"),
                                 header("extension", ""),
@@ -436,6 +437,23 @@ TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
         EXPECT_TRUE(third.TakeOver().isEmpty());
     }
     EXPECT_FALSE(QFile::exists(Folder() + "/empty"));
+    for (const char* damage : {"text", "folder", "link"}) { // what is kept beside a lock that is none is found
+        const QString damaged = Folder() + "/damaged-" + damage, lock = damaged + "/.session.lock";
+        QDir().mkpath(damage == std::string("folder") ? lock + "/a" : damaged);
+        for (const QString& name : {damaged + "/a.recovery", damage == std::string("text") ? lock : damaged + "/b"}) {
+            QFile made(name);
+            ASSERT_TRUE(made.open(QIODevice::WriteOnly));
+            made.write("garbage");
+        }
+        if (damage == std::string("link")) {
+            ASSERT_TRUE(QFile::link(file, lock));
+        }
+        CRecoveryFolder third;
+        EXPECT_EQ(third.TakeOver(), QStringList(damaged + "/a.recovery")) << damage;
+        EXPECT_EQ(CRecoveryFolder().TakeOver().isEmpty(), damage != std::string("folder")) << "and held now";
+        EXPECT_TRUE(QFile::exists(file));
+        QDir(damaged).removeRecursively();
+    }
     {
         CRecoveryFolder third; // that cannot make files
         rlimit files{}, none{};
