@@ -13,6 +13,8 @@
 
 namespace {
 
+constexpr int FirstCommand = 42640; // of the menu; the actions follow
+
 CellBlock BlockOf(const CGenGrid& grid)
 {
     const auto selected = grid.SelectedBlock();
@@ -61,8 +63,6 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
     case GridAction::Interpolate:
         return grid.Host() && grid.Host()->CanSearch(grid) && block.right > 1 && block.bottom > block.top &&
                has([](const ColumnSpec& column) { return column.Kind() == CellKind::Number; });
-    case GridAction::ResetToGlobal:
-        return has([](const ColumnSpec& column) { return bool(column.fill); });
     default:
         return hasNumbers();
     }
@@ -75,14 +75,29 @@ void RunOnCells(CGenGrid& grid, GridAction action)
     const CellBlock block = BlockOf(grid);
     if (action == GridAction::FillDown)
         return Make(grid, FillDown(model, block), NameOf(action));
-    if (action == GridAction::ResetToGlobal)
-        return Make(grid, ResetToGlobal(model, block), NameOf(action));
     if (auto results = AskForCells(action, model, block, grid))
         Make(grid, std::move(*results), NameOf(action));
 }
 
-void ClearCells(CGenGrid& grid, const QString& step)
+std::vector<CKsMenuCommand> CCellCommands::MenuCommands()
 {
-    grid.StoreEditedLine();
-    Make(grid, Clear(*grid.Model(), BlockOf(grid)), step);
+    std::vector<CKsMenuCommand> commands;
+    for (const GridAction action : CellActions)
+        commands.push_back({FirstCommand + int(commands.size()), MenuText(action), KeyOf(action), TextOf(action)});
+    return commands;
+}
+
+bool CCellCommands::Knows(int command)
+{
+    return command >= FirstCommand && command < FirstCommand + int(std::size(CellActions));
+}
+
+bool CCellCommands::CanRun(int command, const CGenGrid* grid)
+{
+    return Knows(command) && grid && CanRunOnCells(*grid, CellActions[command - FirstCommand]);
+}
+
+void CCellCommands::Run(int command, CGenGrid& grid)
+{
+    RunOnCells(grid, CellActions[command - FirstCommand]);
 }

@@ -56,27 +56,6 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block)
     return results;
 }
 
-CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block)
-{
-    CCellResults results(rows, block);
-    ForCells(rows, block, [&](int row, int column) {
-        if (const ColumnSpec& spec = rows.Column(column); spec.fill && row >= rows.FixedRows())
-            results.Add(row, column, rows.Value(row, column), spec.FillValue());
-    });
-    return results;
-}
-
-CCellResults Clear(const CTableRows& rows, const CellBlock& block)
-{
-    CCellResults results(rows, block);
-    ForCells(rows, block, [&](int row, int column) {
-        const ColumnSpec& spec = rows.Column(column);
-        if (spec.Kind() != CellKind::Button)
-            results.Add(row, column, rows.Value(row, column), spec.fill ? spec.FillValue() : spec.EmptyValue());
-    });
-    return results;
-}
-
 double StepOf(const CTableRows& rows, const CellBlock& block)
 {
     const auto isNumber = [&](int column) { return rows.Column(column).IsNumeric(); };
@@ -194,8 +173,7 @@ std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, int column, 
 }
 
 /// Of two values at one place the first one counts, or at the end of the block the last.
-std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column,
-                           KnownValues which)
+std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column, KnownValues which)
 {
     std::vector<Known> known;
     const auto add = [&known](const std::optional<Known>& value) {

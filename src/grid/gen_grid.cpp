@@ -364,12 +364,6 @@ int CGenGrid::InsertLine()
     return line;
 }
 
-int CGenGrid::LinesToDelete() const
-{
-    const auto lines = m_selection->Lines(m_model->FixedRows());
-    return lines ? lines->height() : 0;
-}
-
 bool CGenGrid::DeleteSelectedLines()
 {
     const auto lines = m_selection->Lines(m_model->FixedRows());
@@ -450,31 +444,13 @@ void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
 
 void CGenGrid::contextMenuEvent(QContextMenuEvent* event)
 {
-    if (!CommitEditor())
-        return;
-    const bool isByKey = event->reason() == QContextMenuEvent::Keyboard && currentIndex().isValid();
-    m_input->ShowMenu(isByKey ? viewport()->mapToGlobal(visualRect(currentIndex()).bottomLeft()) : event->globalPos());
-}
-
-/// The menu of a line's number is about that line, unless it is one of several that are selected.
-void CGenGrid::ShowMenuOfNumber(const QContextMenuEvent& event)
-{
-    const int row = verticalHeader()->logicalIndexAt(event.pos());
-    if (row >= 0 && !selectionModel()->isRowSelected(row)) {
-        SetCurrentCell(row + 1, std::max(1, CurrentColumn()));
-        SelectLines(row + 1, row + 1);
-    }
-    m_input->ShowMenu(event.globalPos());
+    if (CommitEditor())
+        m_input->ShowMenu(event->globalPos());
 }
 
 /// Of the headers. Whoever makes a column wider goes on typing in the open cell.
 bool CGenGrid::eventFilter(QObject* object, QEvent* event)
 {
-    if (event->type() == QEvent::ContextMenu && object == verticalHeader()->viewport()) {
-        if (CommitEditor())
-            ShowMenuOfNumber(*static_cast<QContextMenuEvent*>(event));
-        return true;
-    }
     const bool isClick = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick;
     const bool isBorder =
         isClick && object == horizontalHeader()->viewport() &&

@@ -78,8 +78,7 @@ public:
     /// More than the current cell, in one range.
     std::optional<QItemSelectionRange> SelectedBlock() const { return m_selection->Block(); }
     void SetLineChoice(LineChoice choice) { m_selection->SetChoice(choice); }
-    /// How many lines Delete takes.
-    int LinesToDelete() const;
+    bool HasLinesToDelete() const { return m_selection->Lines(m_model->FixedRows()).has_value(); }
     /// Deletes the lines that are chosen. A grid left empty gets a new line, unless its rows may be none.
     bool DeleteSelectedLines();
 
@@ -113,7 +112,6 @@ protected:
 
 private:
     bool LeaveField();
-    void ShowMenuOfNumber(const QContextMenuEvent& event);
     bool Scatters(const QMouseEvent& click) const;
     void FollowLine(int row, int column);
     void NoteLine(int row);

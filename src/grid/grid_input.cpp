@@ -4,11 +4,9 @@
 #include "grid/filter_fields.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_clipboard.h"
-#include "grid/grid_commands.h"
 #include "grid/grid_header.h"
 #include "grid/grid_host.h"
 #include "grid/grid_keys.h"
-#include "grid/grid_texts.h"
 #include "grid/lines_view.h"
 #include "ks/fc/doc.h"
 
@@ -54,18 +52,18 @@ void CGridInput::Run(GridAction action)
     case GridAction::Paste:
         PasteCells(m_grid);
         return;
-    case GridAction::Cut:
-        return Cut();
+    case GridAction::FillDown:
+    case GridAction::FillSeries:
+    case GridAction::Interpolate:
+    case GridAction::Calculate:
+        if (CanRunOnCells(m_grid, action))
+            RunOnCells(m_grid, action);
+        return;
     case GridAction::SelectLine:
         return m_grid.SelectLines(m_grid.CurrentRow(), m_grid.CurrentRow());
     default:
         if (const int command = LinesView::CommandOf(action))
             return LinesView::Run(command, m_grid);
-        if (GridCommands::Knows(action)) {
-            if (GridCommands::CanRun(action, m_grid) || GridCommands::SaysWhyNot(action))
-                GridCommands::Run(action, m_grid);
-            return;
-        }
         return Ask(action);
     }
 }
@@ -74,27 +72,10 @@ void CGridInput::Ask(GridAction action)
 {
     if ((action == GridAction::AppendLine || action == GridAction::DeleteLine) && !m_grid.MayChange())
         return;
-    if (action == GridAction::DeleteLine && m_grid.LinesToDelete() == 0 && m_grid.Model()->Document())
-        m_grid.Model()->Document()->Say(
-            GridTexts::tr("Delete takes whole lines: select them by their numbers. Cut empties cells."));
     if (action != GridAction::Undo && action != GridAction::Redo)
         m_grid.StoreEditedLine();
     if (m_grid.Host())
         m_grid.Host()->Run(m_grid, action);
-}
-
-/// Whole lines go; of others only what the cells hold does.
-void CGridInput::Cut()
-{
-    if (!CanCopyCells(m_grid) || !m_grid.MayChange())
-        return;
-    const auto selected = m_grid.SelectedBlock();
-    const bool isWhole = selected && selected->width() == m_grid.ColumnCount();
-    CopyCells(m_grid);
-    if (isWhole && m_grid.LinesToDelete() > 0)
-        Ask(GridAction::DeleteLine);
-    else if (m_grid.currentIndex().isValid())
-        ClearCells(m_grid, NameOf(GridAction::Cut));
 }
 
 void CGridInput::NextCell()
@@ -127,36 +108,27 @@ void CGridInput::ShowMenu(const QPoint& at)
 {
     QMenu menu(&m_grid);
     const auto add = [&](GridAction action, bool enabled) {
-        QAction* const entry = menu.addAction(MenuText(action), KeyOf(action), this, [this, action] { Run(action); });
-        entry->setEnabled(enabled);
-        return entry;
+        menu.addAction(MenuText(action), KeyOf(action), this, [this, action] { Run(action); })->setEnabled(enabled);
     };
     const CGridModel& model = *m_grid.Model();
     const bool changes = model.Document() && !model.Document()->IsReadOnly();
     const bool grows = changes && model.Rows() && m_grid.MayGrow(), copies = CanCopyCells(m_grid);
     add(GridAction::AppendLine, changes && model.Rows());
-    for (const GridAction action : GridCommands::OnLines())
-        add(action, GridCommands::CanRun(action, m_grid));
     add(GridAction::CopyAndAppend, grows && copies);
     add(GridAction::PasteAndAppend, grows && CanPasteCells(m_grid));
-    const int lines = m_grid.LinesToDelete();
-    QAction* const deletion = add(GridAction::DeleteLine, changes && lines > 0);
-    if (lines > 0)
-        deletion->setText(
-            GridTexts::Counted(std::size_t(lines), GridTexts::tr("Delete Line"), GridTexts::tr("Delete %1 Lines")));
+    add(GridAction::DeleteLine, changes && m_grid.HasLinesToDelete());
     add(GridAction::SelectLine, m_grid.CurrentRow() > 0);
     menu.addSeparator();
-    add(GridAction::Cut, changes && copies);
     add(GridAction::Copy, copies);
     add(GridAction::Paste, changes && CanPasteCells(m_grid));
     menu.addSeparator();
-    for (const GridAction action : GridCommands::OnCells())
-        add(action, GridCommands::CanRun(action, m_grid));
+    for (const GridAction action : CellActions)
+        add(action, CanRunOnCells(m_grid, action));
     if (m_grid.Host() && m_grid.Host()->CanSearch(m_grid)) {
         menu.addSeparator();
         add(GridAction::Search, true);
     }
     menu.addSeparator();
-    LinesView::AddTo(*menu.addMenu(GridTexts::tr("Sort and Filter")), m_grid, std::max(0, m_grid.CurrentColumn() - 1));
+    LinesView::AddTo(menu, m_grid, std::max(0, m_grid.CurrentColumn() - 1));
     menu.exec(at);
 }

@@ -22,7 +22,6 @@ protected:
 
 private:
     void Ask(GridAction action);
-    void Cut();
     void NextCell();
     void PreviousCell();
 

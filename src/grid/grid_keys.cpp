@@ -11,7 +11,6 @@ namespace {
 
 constexpr Qt::KeyboardModifiers None = Qt::NoModifier, Ctrl = Qt::ControlModifier, Shift = Qt::ShiftModifier;
 constexpr Qt::KeyboardModifiers CtrlShift = Ctrl | Shift;
-constexpr Qt::KeyboardModifiers Alt = Qt::AltModifier, AltShift = Alt | Shift;
 constexpr Qt::KeyboardModifiers All = CtrlShift | Qt::AltModifier | Qt::MetaModifier;
 
 // Insert, Delete, F3 and F7 never reach the table widget, whatever is held with them.
@@ -23,16 +22,10 @@ constexpr GridKey Keys[] = {
     {Qt::Key_Tab, Shift, All, GridAction::PreviousCell, true},
     {Qt::Key_Return, Shift, All, GridAction::PreviousCell, true},
     {Qt::Key_Enter, Shift, All, GridAction::PreviousCell, true},
-    {Qt::Key_Insert, Alt, All, GridAction::InsertAbove, true},
-    {Qt::Key_Insert, AltShift, All, GridAction::InsertBelow, true},
     {Qt::Key_Insert, None, CtrlShift, GridAction::AppendLine, true},
     {Qt::Key_Insert, Ctrl, Ctrl, GridAction::CopyAndAppend, false},
     {Qt::Key_Insert, Shift, CtrlShift, GridAction::PasteAndAppend, false},
     {Qt::Key_Delete, None, None, GridAction::DeleteLine, false},
-    {Qt::Key_L, CtrlShift, All, GridAction::DuplicateLines, true},
-    {Qt::Key_Up, CtrlShift, All, GridAction::MoveLinesUp, true},
-    {Qt::Key_Down, CtrlShift, All, GridAction::MoveLinesDown, true},
-    {Qt::Key_X, Ctrl, All, GridAction::Cut, false},
     {Qt::Key_C, Ctrl, All, GridAction::Copy, false},
     {Qt::Key_V, Ctrl, All, GridAction::Paste, false},
     {Qt::Key_Space, Shift, All, GridAction::SelectLine, false},
@@ -42,7 +35,6 @@ constexpr GridKey Keys[] = {
     {Qt::Key_R, CtrlShift, All, GridAction::FillSeries, false},
     {Qt::Key_E, CtrlShift, All, GridAction::Interpolate, false},
     {Qt::Key_E, Ctrl, All, GridAction::Calculate, false},
-    {Qt::Key_G, CtrlShift, All, GridAction::ResetToGlobal, false},
     {Qt::Key_Z, Ctrl, All, GridAction::Undo, false},
     {Qt::Key_Y, Ctrl, All, GridAction::Redo, false},
     {Qt::Key_Z, CtrlShift, All, GridAction::Redo, false},
@@ -67,18 +59,8 @@ constexpr ActionTexts Texts[] = {
     {QT_TRANSLATE_NOOP("GridTexts", "Insert line")},
     {QT_TRANSLATE_NOOP("GridTexts", "Copy, then insert line")},
     {QT_TRANSLATE_NOOP("GridTexts", "Paste, then insert line")},
-    {QT_TRANSLATE_NOOP("GridTexts", "Insert Line Above")},
-    {QT_TRANSLATE_NOOP("GridTexts", "Insert Line Below")},
-    {QT_TRANSLATE_NOOP("GridTexts", "Duplicate Lines"),
-     QT_TRANSLATE_NOOP("GridTexts", "Duplicate the selected lines, or the current one, below them")},
-    {QT_TRANSLATE_NOOP("GridTexts", "Move Lines Up"),
-     QT_TRANSLATE_NOOP("GridTexts", "Move the selected lines, or the current one, up in the file")},
-    {QT_TRANSLATE_NOOP("GridTexts", "Move Lines Down"),
-     QT_TRANSLATE_NOOP("GridTexts", "Move the selected lines, or the current one, down in the file")},
     {QT_TRANSLATE_NOOP("GridTexts", "Delete selected lines")},
     {QT_TRANSLATE_NOOP("GridTexts", "Select the line")},
-    {QT_TRANSLATE_NOOP("GridTexts", "Cut"),
-     QT_TRANSLATE_NOOP("GridTexts", "Copy, then delete the lines or empty the cells that are selected")},
     {QT_TRANSLATE_NOOP("GridTexts", "Copy")},
     {QT_TRANSLATE_NOOP("GridTexts", "Paste")},
     {QT_TRANSLATE_NOOP("GridTexts", "Search &Again")},
@@ -88,8 +70,6 @@ constexpr ActionTexts Texts[] = {
     {QT_TRANSLATE_NOOP("GridTexts", "Inter&polate..."),
      QT_TRANSLATE_NOOP("GridTexts", "Interpolate along the chainage")},
     {QT_TRANSLATE_NOOP("GridTexts", "Calc&ulate...")},
-    {QT_TRANSLATE_NOOP("GridTexts", "Reset to Global Value"),
-     QT_TRANSLATE_NOOP("GridTexts", "Give the selected cells the global value of their column")},
     {QT_TRANSLATE_NOOP("GridTexts", "Undo")},
     {QT_TRANSLATE_NOOP("GridTexts", "Redo")},
     {QT_TRANSLATE_NOOP("GridTexts", "Sort As&cending"),

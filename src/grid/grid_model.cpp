@@ -375,3 +375,69 @@ void CGridModel::ChangeCells(const QString& step, int row, CCellChanges changes)
     Change(step, first, [&] { SetCells(*m_document, m_rows, std::move(changes), first); });
     Sync();
 }
+
+int CGridModel::InsertRow(int row)
+{
+    if (!m_rows || !m_document->MayChange())
+        return row;
+    Store();
+    const int shownAt = std::min(std::max(row, FixedRows()), StoredRows());
+    const std::size_t at = SourceRow(shownAt);
+    auto lines = CTableRows::NewLines(1 + OffersRow(), at);
+    const QScopedValueRollback changed(m_changedAt, std::optional(at));
+    const std::size_t place = Change(GridTexts::tr("Insertion of lines"), at,
+                                     [&] { InsertLines(*m_document, m_rows, at, std::move(lines)); });
+    m_document->Say(GridTexts::tr("Line inserted"));
+    Sync();
+    return ShownRow(place) + row - shownAt; // behind an offered row, if there was one
+}
+
+void CGridModel::AppendRow(const QStringList& texts)
+{
+    if (!m_document->MayChange())
+        return;
+    Paste(StoredRows(), 0, {texts}, GridTexts::tr("Insertion of lines"));
+    m_document->Say(GridTexts::tr("Line inserted"));
+}
+
+void CGridModel::RemoveRows(int row, int count)
+{
+    if (!m_document->MayChange())
+        return;
+    Store();
+    count = std::min(count, StoredRows() - row);
+    if (count <= 0)
+        return;
+    std::vector<std::size_t> lines(static_cast<std::size_t>(count));
+    std::ranges::generate(lines, [this, row]() mutable { return SourceRow(row++); });
+    std::ranges::sort(lines);
+    const QScopedValueRollback changed(m_changedAt, std::optional(lines.front()));
+    if (lines.back() - lines.front() + 1 == lines.size())
+        DeleteLines(*m_document, m_rows, lines.front(), lines.size());
+    else
+        RemoveScattered(lines);
+    m_document->Say(
+        GridTexts::Counted(std::size_t(count), GridTexts::tr("Line deleted"), GridTexts::tr("%1 lines deleted")));
+    Sync();
+}
+
+/// Lines between which hidden ones stand, or others that are shown elsewhere. They go to the end before they are taken
+/// out: one by one it would cost the square of their number.
+void CGridModel::RemoveScattered(const std::vector<std::size_t>& lines)
+{
+    std::vector<std::size_t> order;
+    order.reserve(m_rows->Count());
+    for (std::size_t row = 0, next = 0; row < m_rows->Count(); ++row) {
+        if (next < lines.size() && lines[next] == row)
+            ++next;
+        else
+            order.push_back(row);
+    }
+    const std::size_t kept = order.size();
+    order.insert(order.end(), lines.begin(), lines.end());
+    m_changedAt.reset(); // where they stood, nothing that a place tells
+    Change(GridTexts::tr("Deletion of lines"), lines.front(), [&] {
+        ArrangeLines(*m_document, m_rows, std::move(order), lines.front());
+        DeleteLines(*m_document, m_rows, kept, lines.size());
+    });
+}

@@ -62,14 +62,6 @@ public:
     /// A new line before `row`, with the columns' fill values: an undo step. The offered row becomes a line before it.
     /// Returns the row where it went.
     int InsertRow(int row);
-    /// Likewise, shown next below the line of a row; -1 is above the first.
-    int InsertBelow(int row);
-    /// The same lines once more, shown below the last of them: an undo step. Where no two may be the same they get
-    /// places of their own. Returns the row where the first one went.
-    int Duplicate(int first, int last);
-    /// Lines change places with the one shown above (`step` -1) or below (1): an undo step. False where there is none.
-    /// Not while lines are sorted.
-    bool MoveRows(int first, int last, int step);
     /// A new line behind the last one, with these texts from its first cell on: an undo step.
     void AppendRow(const QStringList& texts);
     /// An undo step; the offered row stays. No fixed row is among the rows.
@@ -85,8 +77,6 @@ private:
     QString HeaderToolTip(int column) const;
     std::size_t Change(const QString& step, std::size_t row, const std::function<void()>& make);
     std::size_t Arrange(std::size_t row);
-    std::size_t PlaceBelow(int row) const;
-    int InsertAt(std::size_t at, int row, int shownAt);
     void RemoveScattered(const std::vector<std::size_t>& lines);
     bool StoreOffered(const Overlay& typed, BlankRule rule);
     bool StoreRows(const Overlay& typed, BlankRule rule);

@@ -84,23 +84,6 @@ struct Arrangement
     }
 };
 
-struct Movement
-{
-    std::shared_ptr<IRowSource> rows;
-    std::size_t from, to, shown;
-
-    ChangePlace Apply()
-    {
-        rows->Move(from, to);
-        return PlaceOf(*rows, shown);
-    }
-    ChangePlace Revert()
-    {
-        rows->Move(to, from);
-        return PlaceOf(*rows, from < to ? shown + 1 : shown - 1);
-    }
-};
-
 struct Cells
 {
     std::shared_ptr<IRowSource> rows;
@@ -145,11 +128,6 @@ void ArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vecto
     for (std::size_t place = 0; place < order.size(); ++place)
         places[order[place]] = place;
     Push(document, {}, Arrangement{std::move(rows), std::move(order), std::move(places), row});
-}
-
-void MoveLine(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t from, std::size_t to, std::size_t shown)
-{
-    Push(document, GridTexts::tr("Movement of lines"), Movement{std::move(rows), from, to, shown});
 }
 
 void SetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, CCellChanges changes, std::size_t row)

@@ -18,9 +18,6 @@ void DeleteLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t
 /// Puts the lines of a list into an order: for each place the row to stand there. The line to look at is the one at
 /// `row`.
 void ArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<std::size_t> order, std::size_t row);
-/// Takes a line to the place of another, past those between, which move up or down by one. The line to look at is the
-/// one at `shown` afterwards.
-void MoveLine(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t from, std::size_t to, std::size_t shown);
 
 /// Changes cells, and nothing but them. `changes` is not empty; `row` (from 0) is where the first of them stands.
 void SetCells(CKsDoc& document, std::shared_ptr<IRowSource> rows, CCellChanges changes, std::size_t row);

@@ -38,8 +38,6 @@ public:
 
     /// Rows with their defaults, not in the source.
     virtual std::unique_ptr<IRowBlock> NewRows(std::size_t count) const = 0;
-    /// The same as these rows, in this order, not in the source.
-    virtual std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) const = 0;
     /// Puts the rows in at `row` (at the end when there are fewer) and returns the row where they went.
     virtual std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) = 0;
     virtual std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) = 0;
@@ -47,9 +45,6 @@ public:
     virtual void Drop(std::size_t row, std::size_t count) { Take(row, count); }
     /// Takes rows out that Put has put in: all is as it was before.
     virtual std::unique_ptr<IRowBlock> TakeBack(std::size_t row, std::size_t count) { return Take(row, count); }
-
-    /// Takes a row from its place to another, behind those that stood between.
-    virtual void Move(std::size_t from, std::size_t to) { Put(to, Take(from, 1)); }
 
     /// The first rows that belong to the source itself: none of them comes, goes or moves.
     virtual std::size_t FixedRows() const { return 0; }

@@ -50,14 +50,6 @@ public:
     {
         return std::make_unique<Block>(std::vector<T>(count));
     }
-    std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) const override
-    {
-        std::vector<T> copies;
-        copies.reserve(rows.size());
-        for (const std::size_t row : rows)
-            copies.push_back(m_rows()[row]);
-        return std::make_unique<Block>(std::move(copies));
-    }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {
         row = std::min(row, Count());
@@ -80,12 +72,6 @@ public:
         m_rows().erase(first, first + std::ptrdiff_t(count));
     }
 
-    void Move(std::size_t from, std::size_t to) override
-    {
-        const auto begin = m_rows().begin(), row = begin + std::ptrdiff_t(from), place = begin + std::ptrdiff_t(to);
-        from < to ? std::rotate(row, row + 1, place + 1) : std::rotate(place, row, row + 1);
-        ++m_rearranged;
-    }
     void Rearrange(const std::vector<std::size_t>& order) override
     {
         std::vector<T> arranged;

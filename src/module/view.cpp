@@ -1,7 +1,7 @@
 #include "module/view.h"
 
+#include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
-#include "grid/grid_commands.h"
 #include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
@@ -203,9 +203,7 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
             {Command::FetchLocation, LoadString(Str::MenuFetchLocation), QKeySequence(Qt::CTRL | Qt::Key_L)});
     menu.push_back({Command::DeleteLine, LoadString(Str::MenuDeleteLine)});
     menu.emplace_back();
-    std::ranges::move(GridCommands::MenuCommands(GridCommands::OnLines()), std::back_inserter(menu));
-    menu.emplace_back();
-    std::ranges::move(GridCommands::MenuCommands(GridCommands::OnCells()), std::back_inserter(menu));
+    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
@@ -220,16 +218,16 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     if (id == KsCommand::FindField)
         return m_sheet && m_sheet->isEnabled();
     const auto* page = ActivePage();
-    const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || GridCommands::Knows(id);
+    const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || CCellCommands::Knows(id);
     const CGenGrid* grid = !page ? nullptr : isForLines || LinesView::Knows(id) ? page->LinesGrid() : page->GetGrid();
     if (!m_linesEnabled || !grid || !grid->isEnabled())
         return false;
     if (GetDocument()->IsReadOnly() && (isForLines || id == Command::FetchLocation))
         return false;
     return id == Command::InsertLine      ? true
-           : id == Command::DeleteLine    ? grid->LinesToDelete() > 0
+           : id == Command::DeleteLine    ? grid->HasLinesToDelete()
            : id == Command::FetchLocation ? GetDocument()->ProjectHandle() != 0
-           : GridCommands::Knows(id)      ? GridCommands::CanRun(id, grid)
+           : CCellCommands::Knows(id)     ? CCellCommands::CanRun(id, grid)
            : LinesView::Knows(id)         ? LinesView::CanRun(id, grid)
                                           : m_search.CanRun(id, grid);
 }
@@ -249,8 +247,8 @@ bool CKavo0_hdView::OnCommand(int id)
         page->OnHelp();
     else if (id == KsCommand::FindField)
         FindField();
-    else if (GridCommands::Knows(id))
-        GridCommands::Run(id, *page->LinesGrid());
+    else if (CCellCommands::Knows(id))
+        CCellCommands::Run(id, *page->LinesGrid());
     else if (LinesView::Knows(id))
         LinesView::Run(id, *page->LinesGrid());
     else

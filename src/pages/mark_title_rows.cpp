@@ -77,18 +77,6 @@ public:
         block->entries.resize(count);
         return block;
     }
-    /// Without the levels, which belong to a title alone.
-    std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) const override
-    {
-        auto block = std::make_unique<CTitleBlock>();
-        block->entries.resize(rows.size());
-        for (std::size_t i = 0; i < rows.size(); ++i) {
-            const MarkTitle title{&Globals(), rows[i], {}, false};
-            block->entries[i].title.title = title.Title();
-            block->entries[i].title.interpolate = title.Interpolate();
-        }
-        return block;
-    }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {
         row = std::min(row, Count());

@@ -55,6 +55,6 @@ bool CEditRouter::Can(int command) const
             return !line->isReadOnly();
         return line->hasSelectedText() && (command == KsCommand::Copy || !line->isReadOnly());
     }
-    // Tables cut, copy and paste; nothing else in a document window does.
-    return focus && focus->inherits("QAbstractItemView");
+    // A grid copies and pastes; nothing else in a document window does.
+    return focus && command != KsCommand::Cut && focus->inherits("QAbstractItemView");
 }

@@ -132,7 +132,7 @@ TEST_F(GridKeyTest, DeletesTheLineWhoseNumberIsClicked)
         grid->SetCurrentCell(1, 1);
         QTest::mouseClick(numbers.viewport(), Qt::LeftButton, {}, {5, y});
         EXPECT_EQ(Current().first, 2) << y;
-        EXPECT_TRUE(grid->LinesToDelete() > 0) << y;
+        EXPECT_TRUE(grid->HasLinesToDelete()) << y;
     }
     Press(Qt::Key_Delete);
     EXPECT_EQ(init.GetCount(), 2u);

@@ -262,9 +262,9 @@ bool CTablesView::IsCommandEnabled(int id) const
     case Command::InsertLine:
         return m_lines->Model()->Rows() != nullptr;
     case Command::DeleteLine:
-        return m_lines->LinesToDelete() > 0;
+        return m_lines->HasLinesToDelete();
     default:
-        return GridCommands::CanRun(id, m_lines) || LinesView::CanRun(id, m_lines) || m_search.CanRun(id, m_main.grid);
+        return CCellCommands::CanRun(id, m_lines) || LinesView::CanRun(id, m_lines) || m_search.CanRun(id, m_main.grid);
     }
 }
 
@@ -278,8 +278,8 @@ bool CTablesView::OnCommand(int id)
         InsertLine();
     else if (id == Command::DeleteLine)
         m_lines->DeleteSelectedLines();
-    else if (GridCommands::Knows(id))
-        GridCommands::Run(id, *m_lines);
+    else if (CCellCommands::Knows(id))
+        CCellCommands::Run(id, *m_lines);
     else if (LinesView::Knows(id))
         LinesView::Run(id, *m_lines);
     else

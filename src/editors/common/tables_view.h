@@ -3,7 +3,7 @@
 // view's commands, undo shows what it does, and other editors are answered.
 #pragma once
 
-#include "grid/grid_commands.h"
+#include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_host.h"
 #include "grid/grid_search.h"

@@ -13,9 +13,7 @@ std::vector<CKsMenuCommand> CCrossSectionView::LinesMenu() const
         {Command::InsertLine, tr("&Insert Line"), {}, tr("Adds a cross section or a point below the current one")},
         {Command::DeleteLine, tr("&Delete Lines"), {}, tr("Deletes the selected cross sections or points")},
         {}};
-    std::ranges::move(GridCommands::MenuCommands(GridCommands::OnLines()), std::back_inserter(menu));
-    menu.emplace_back();
-    std::ranges::move(GridCommands::MenuCommands(GridCommands::OnCells()), std::back_inserter(menu));
+    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();

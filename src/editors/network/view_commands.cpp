@@ -42,9 +42,7 @@ std::vector<CKsMenuCommand> CNetworkView::LinesMenu() const
     menu.push_back({Command::InsertLine, tr("&Insert Line"), {}, tr("Adds a line to the channel of the branch")});
     menu.push_back({Command::DeleteLine, tr("&Delete Lines"), {}, tr("Deletes the selected lines of the table")});
     menu.emplace_back();
-    std::ranges::move(GridCommands::MenuCommands(GridCommands::OnLines()), std::back_inserter(menu));
-    menu.emplace_back();
-    std::ranges::move(GridCommands::MenuCommands(GridCommands::OnCells()), std::back_inserter(menu));
+    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
