@@ -31,6 +31,8 @@ public:
     virtual void RemoveAll();
     /// A new record of the list's family with its defaults, not in the list. Null for the bare base list.
     virtual std::unique_ptr<HD_RiverPos> NewRecord() const { return nullptr; }
+    /// A record that holds what this one of the list's family does, not in the list. Null likewise.
+    virtual std::unique_ptr<HD_RiverPos> CopyOf(const HD_RiverPos& /*record*/) const { return nullptr; }
     /// The fields of the list's family after name and chainage.
     virtual FieldList Fields() const { return {}; }
 
@@ -133,6 +135,10 @@ public:
     using CGenParamListBase::CGenParamListBase;
 
     std::unique_ptr<HD_RiverPos> NewRecord() const override { return std::make_unique<T>(); }
+    std::unique_ptr<HD_RiverPos> CopyOf(const HD_RiverPos& record) const override
+    {
+        return std::make_unique<T>(static_cast<const T&>(record));
+    }
     FieldList Fields() const override { return T::DeclaredFields(); }
     T& GetAt(std::size_t index) { return static_cast<T&>(CGenList::GetAt(index)); }
     const T& GetAt(std::size_t index) const { return static_cast<const T&>(CGenList::GetAt(index)); }

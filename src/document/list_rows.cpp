@@ -51,6 +51,13 @@ public:
         std::generate(records.begin(), records.end(), [this] { return m_list.NewRecord(); });
         return std::make_unique<CRecordBlock>(std::move(records));
     }
+    std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) override
+    {
+        Records records(rows.size());
+        std::ranges::transform(rows, records.begin(),
+                               [this](std::size_t row) { return m_list.CopyOf(m_list.GetAt(row)); });
+        return std::make_unique<CRecordBlock>(std::move(records));
+    }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {
         row = std::min(row, Count());
@@ -101,6 +108,13 @@ public:
     }
 
     std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override { return m_lines->NewRows(count); }
+    std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) override
+    {
+        std::vector<std::size_t> lines = rows;
+        for (std::size_t& line : lines)
+            --line;
+        return m_lines->Copies(lines);
+    }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {
         return 1 + m_lines->Put(row > 0 ? row - 1 : 0, std::move(block));

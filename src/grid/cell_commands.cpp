@@ -3,6 +3,7 @@
 #include "grid/cell_dialogs.h"
 #include "grid/cell_operations.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_clipboard.h"
 #include "grid/grid_host.h"
 #include "grid/grid_texts.h"
 #include "ks/fc/doc.h"
@@ -13,8 +14,6 @@
 
 namespace {
 
-constexpr int FirstCommand = 42640; // of the menu; the actions follow
-
 CellBlock BlockOf(const CGenGrid& grid)
 {
     const auto selected = grid.SelectedBlock();
@@ -22,7 +21,13 @@ CellBlock BlockOf(const CGenGrid& grid)
     return {block.top(), block.left(), block.bottom(), block.right()};
 }
 
-void Make(CGenGrid& grid, CCellResults results, const QString& step)
+/// What is said of a number of cells.
+struct Words
+{
+    QString one, many;
+};
+
+void Make(CGenGrid& grid, CCellResults results, const QString& step, const Words& words)
 {
     CGridModel& model = *grid.Model();
     if (const QString fault = results.RuleFault(); !fault.isEmpty()) {
@@ -31,7 +36,7 @@ void Make(CGenGrid& grid, CCellResults results, const QString& step)
     }
     const std::size_t changed = results.ChangedCount(), kept = results.KeptCount();
     model.ChangeCells(step, results.FirstRow(), results.TakeChanges());
-    QString said = GridTexts::Counted(changed, GridTexts::tr("1 cell changed"), GridTexts::tr("%1 cells changed"));
+    QString said = GridTexts::Counted(changed, words.one, words.many);
     if (kept > 0)
         said += QStringLiteral("; ") +
                 GridTexts::Counted(kept, GridTexts::tr("1 stays as it was"), GridTexts::tr("%1 stay as they were"));
@@ -39,6 +44,17 @@ void Make(CGenGrid& grid, CCellResults results, const QString& step)
     if (grid.Host())
         grid.Host()->LineEdited(grid); // the project is told of what locations hold now
     grid.Reload();
+}
+
+void Cut(CGenGrid& grid, const CellBlock& block)
+{
+    const bool areLines = grid.Selection().AreLines();
+    CopyCells(grid);
+    if (areLines && grid.HasLinesToDelete())
+        grid.Host()->Run(grid, GridAction::DeleteLine);
+    else
+        Make(grid, Clear(*grid.Model(), block), NameOf(GridAction::Cut),
+             {GridTexts::tr("1 cell cut"), GridTexts::tr("%1 cells cut")});
 }
 
 } // namespace
@@ -56,6 +72,9 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
     };
     const auto hasNumbers = [&] { return has(&ColumnSpec::IsNumeric); };
     switch (action) {
+    case GridAction::Cut:
+    case GridAction::Clear:
+        return has([](const ColumnSpec& column) { return column.Kind() != CellKind::Button; });
     case GridAction::FillDown:
         return block.top < block.bottom || block.top > model.FixedRows(); // no line stands above the first one
     case GridAction::FillSeries:
@@ -73,31 +92,14 @@ void RunOnCells(CGenGrid& grid, GridAction action)
     grid.StoreEditedLine();
     const CGridModel& model = *grid.Model();
     const CellBlock block = BlockOf(grid);
+    const Words changed{GridTexts::tr("1 cell changed"), GridTexts::tr("%1 cells changed")};
+    if (action == GridAction::Cut)
+        return Cut(grid, block);
+    if (action == GridAction::Clear)
+        return Make(grid, Clear(model, block), NameOf(action),
+                    {GridTexts::tr("1 cell cleared"), GridTexts::tr("%1 cells cleared")});
     if (action == GridAction::FillDown)
-        return Make(grid, FillDown(model, block), NameOf(action));
+        return Make(grid, FillDown(model, block), NameOf(action), changed);
     if (auto results = AskForCells(action, model, block, grid))
-        Make(grid, std::move(*results), NameOf(action));
-}
-
-std::vector<CKsMenuCommand> CCellCommands::MenuCommands()
-{
-    std::vector<CKsMenuCommand> commands;
-    for (const GridAction action : CellActions)
-        commands.push_back({FirstCommand + int(commands.size()), MenuText(action), KeyOf(action), TextOf(action)});
-    return commands;
-}
-
-bool CCellCommands::Knows(int command)
-{
-    return command >= FirstCommand && command < FirstCommand + int(std::size(CellActions));
-}
-
-bool CCellCommands::CanRun(int command, const CGenGrid* grid)
-{
-    return Knows(command) && grid && CanRunOnCells(*grid, CellActions[command - FirstCommand]);
-}
-
-void CCellCommands::Run(int command, CGenGrid& grid)
-{
-    RunOnCells(grid, CellActions[command - FirstCommand]);
+        Make(grid, std::move(*results), NameOf(action), changed);
 }

@@ -56,6 +56,21 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block)
     return results;
 }
 
+CCellResults Clear(const CTableRows& rows, const CellBlock& block)
+{
+    CCellResults results(rows, block);
+    ForCells(rows, block, [&](int row, int column) {
+        const ColumnSpec& spec = rows.Column(column);
+        if (spec.Kind() == CellKind::Button)
+            return;
+        if (spec.isRequired)
+            results.Keep(row, column, ReadCell(spec, {}).refusal);
+        else
+            results.Add(row, column, rows.Value(row, column), spec.fill ? spec.FillValue() : spec.EmptyValue());
+    });
+    return results;
+}
+
 double StepOf(const CTableRows& rows, const CellBlock& block)
 {
     const auto isNumber = [&](int column) { return rows.Column(column).IsNumeric(); };

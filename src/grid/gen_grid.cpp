@@ -6,6 +6,7 @@
 #include "grid/grid_host.h"
 #include "grid/grid_input.h"
 #include "grid/grid_keys.h"
+#include "grid/grid_menus.h"
 #include "grid/grid_texts.h"
 #include "grid/grid_widths.h"
 #include "grid/selection_summary.h"
@@ -15,7 +16,9 @@
 
 #include <QAbstractButton>
 #include <QApplication>
+#include <QContextMenuEvent>
 #include <QHeaderView>
+#include <QMenu>
 #include <QPainter>
 #include <algorithm>
 
@@ -444,13 +447,37 @@ void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
 
 void CGenGrid::contextMenuEvent(QContextMenuEvent* event)
 {
-    if (CommitEditor())
-        m_input->ShowMenu(event->globalPos());
+    if (!CommitEditor())
+        return;
+    const bool isByKey = event->reason() == QContextMenuEvent::Keyboard;
+    QMenu menu(this);
+    GridMenus::AddForCells(menu, *this);
+    menu.exec(isByKey ? viewport()->mapToGlobal(visualRect(currentIndex()).bottomLeft()) : event->globalPos());
+}
+
+/// On the number of a line. It is about the lines that are selected, if this is one of them.
+void CGenGrid::ShowLineMenu(const QContextMenuEvent& event)
+{
+    const int row = verticalHeader()->logicalIndexAt(event.pos());
+    if (row < 0 || !CommitEditor())
+        return;
+    const auto block = SelectedBlock();
+    if (!block || !m_selection->AreLines() || row < block->top() || row > block->bottom()) {
+        SetCurrentCell(row + 1, std::max(CurrentColumn(), 1));
+        SelectLines(row + 1, row + 1);
+    }
+    QMenu menu(this);
+    GridMenus::AddForLines(menu, *this);
+    menu.exec(event.globalPos());
 }
 
 /// Of the headers. Whoever makes a column wider goes on typing in the open cell.
 bool CGenGrid::eventFilter(QObject* object, QEvent* event)
 {
+    if (event->type() == QEvent::ContextMenu && object == verticalHeader()->viewport()) {
+        ShowLineMenu(*static_cast<QContextMenuEvent*>(event));
+        return true;
+    }
     const bool isClick = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick;
     const bool isBorder =
         isClick && object == horizontalHeader()->viewport() &&

@@ -27,6 +27,7 @@ public:
     CGridModel* Model() const { return m_model; }
     CGridInput& Input() const { return *m_input; }
     CGridWidths& Widths() const { return *m_widths; }
+    CGridSelection& Selection() const { return *m_selection; }
     CGridHeader& Header() const { return *m_header; }
 
     int RowCount() const { return m_model->rowCount(); }
@@ -113,6 +114,7 @@ protected:
 private:
     bool LeaveField();
     bool Scatters(const QMouseEvent& click) const;
+    void ShowLineMenu(const QContextMenuEvent& event);
     void FollowLine(int row, int column);
     void NoteLine(int row);
     int RowLikeCurrent(int row) const;

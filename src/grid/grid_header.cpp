@@ -2,6 +2,7 @@
 
 #include "grid/filter_fields.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_menus.h"
 #include "grid/lines_view.h"
 
 #include <QContextMenuEvent>
@@ -73,7 +74,7 @@ void CGridHeader::contextMenuEvent(QContextMenuEvent* event)
     if (column < 0 || !m_grid.CommitEditor())
         return;
     QMenu menu(&m_grid);
-    LinesView::AddTo(menu, m_grid, column);
+    GridMenus::AddForColumn(menu, m_grid, column);
     menu.exec(event->globalPos());
 }
 

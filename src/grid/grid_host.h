@@ -2,6 +2,8 @@
 #pragma once
 
 #include <QStringList>
+#include <utility>
+#include <vector>
 
 class CGenGrid;
 enum class GridAction;
@@ -25,6 +27,8 @@ public:
     virtual bool CanSearch(const CGenGrid&) const { return false; }
     /// What the cells of branch names offer.
     virtual QStringList BranchNames() { return {}; }
+    /// The project's cross sections: branches, and chainages in metres.
+    virtual std::vector<std::pair<QString, double>> CrossSections() { return {}; }
     /// A push button of the grid; row and column count from 1.
     virtual void ButtonClicked(CGenGrid&, int /*row*/, int /*column*/) {}
 };

@@ -1,18 +1,17 @@
 #include "grid/grid_input.h"
 
-#include "grid/cell_commands.h"
 #include "grid/filter_fields.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_clipboard.h"
+#include "grid/grid_commands.h"
 #include "grid/grid_header.h"
 #include "grid/grid_host.h"
 #include "grid/grid_keys.h"
+#include "grid/grid_texts.h"
 #include "grid/lines_view.h"
 #include "ks/fc/doc.h"
 
 #include <QKeyEvent>
-#include <QMenu>
-#include <algorithm>
 
 CGridInput::CGridInput(CGenGrid& grid) : QObject(&grid), m_grid(grid)
 {
@@ -52,16 +51,11 @@ void CGridInput::Run(GridAction action)
     case GridAction::Paste:
         PasteCells(m_grid);
         return;
-    case GridAction::FillDown:
-    case GridAction::FillSeries:
-    case GridAction::Interpolate:
-    case GridAction::Calculate:
-        if (CanRunOnCells(m_grid, action))
-            RunOnCells(m_grid, action);
-        return;
     case GridAction::SelectLine:
         return m_grid.SelectLines(m_grid.CurrentRow(), m_grid.CurrentRow());
     default:
+        if (CGridCommands::Knows(action))
+            return CGridCommands::Run(action, m_grid);
         if (const int command = LinesView::CommandOf(action))
             return LinesView::Run(command, m_grid);
         return Ask(action);
@@ -72,6 +66,10 @@ void CGridInput::Ask(GridAction action)
 {
     if ((action == GridAction::AppendLine || action == GridAction::DeleteLine) && !m_grid.MayChange())
         return;
+    if (action == GridAction::DeleteLine && !m_grid.HasLinesToDelete() && m_grid.Model()->Document())
+        m_grid.Model()->Document()->Say(
+            GridTexts::tr("Delete takes away lines that are selected by their numbers. %1 clears cells.")
+                .arg(KeyOf(GridAction::Clear).toString(QKeySequence::NativeText)));
     if (action != GridAction::Undo && action != GridAction::Redo)
         m_grid.StoreEditedLine();
     if (m_grid.Host())
@@ -102,33 +100,4 @@ void CGridInput::PreviousCell()
         m_grid.SetCurrentCell(m_grid.CurrentRow() - 1, m_grid.ColumnCount());
     else
         m_grid.LeaveBackwards();
-}
-
-void CGridInput::ShowMenu(const QPoint& at)
-{
-    QMenu menu(&m_grid);
-    const auto add = [&](GridAction action, bool enabled) {
-        menu.addAction(MenuText(action), KeyOf(action), this, [this, action] { Run(action); })->setEnabled(enabled);
-    };
-    const CGridModel& model = *m_grid.Model();
-    const bool changes = model.Document() && !model.Document()->IsReadOnly();
-    const bool grows = changes && model.Rows() && m_grid.MayGrow(), copies = CanCopyCells(m_grid);
-    add(GridAction::AppendLine, changes && model.Rows());
-    add(GridAction::CopyAndAppend, grows && copies);
-    add(GridAction::PasteAndAppend, grows && CanPasteCells(m_grid));
-    add(GridAction::DeleteLine, changes && m_grid.HasLinesToDelete());
-    add(GridAction::SelectLine, m_grid.CurrentRow() > 0);
-    menu.addSeparator();
-    add(GridAction::Copy, copies);
-    add(GridAction::Paste, changes && CanPasteCells(m_grid));
-    menu.addSeparator();
-    for (const GridAction action : CellActions)
-        add(action, CanRunOnCells(m_grid, action));
-    if (m_grid.Host() && m_grid.Host()->CanSearch(m_grid)) {
-        menu.addSeparator();
-        add(GridAction::Search, true);
-    }
-    menu.addSeparator();
-    LinesView::AddTo(menu, m_grid, std::max(0, m_grid.CurrentColumn() - 1));
-    menu.exec(at);
 }

@@ -1,11 +1,10 @@
-// The keys of a grid and its menu: both do nothing that the grid does not offer.
+// The keys of a grid: they do nothing that the grid does not offer.
 #pragma once
 
 #include <QObject>
 
 class CGenGrid;
 class QKeyEvent;
-class QPoint;
 enum class GridAction;
 
 class CGridInput : public QObject
@@ -15,7 +14,6 @@ public:
     explicit CGridInput(CGenGrid& grid);
 
     void Run(GridAction action);
-    void ShowMenu(const QPoint& at);
 
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;

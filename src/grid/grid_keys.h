@@ -14,10 +14,18 @@ enum class GridAction
     AppendLine,
     CopyAndAppend,
     PasteAndAppend,
+    InsertAbove,
+    InsertBelow,
+    Duplicate,
+    MoveUp,
+    MoveDown,
+    InsertAlong,
     DeleteLine,
     SelectLine,
     Copy,
     Paste,
+    Cut,
+    Clear,
     SearchAgain,
     Search,
     FillDown,
@@ -34,6 +42,7 @@ enum class GridAction
     Filter,
     ShowAllLines,
     ShowAfresh,
+    FitColumn,
     None
 };
 

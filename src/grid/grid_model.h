@@ -62,6 +62,17 @@ public:
     /// A new line before `row`, with the columns' fill values: an undo step. The offered row becomes a line before it.
     /// Returns the row where it went.
     int InsertRow(int row);
+    /// Lines go in before a row of the source: an undo step with the text `step`. Returns where the first one stands
+    /// there. What was typed is stored.
+    std::size_t PutLines(const QString& step, std::size_t at, std::unique_ptr<IRowBlock> lines);
+    /// A new line below `row`: the next one in the source.
+    int InsertRowBelow(int row);
+    /// Lines that hold what these do, below the last of them: an undo step. Where no two lines may hold the same, they
+    /// hold what fits there. Returns the row where the first one went, or why none did.
+    std::pair<int, QString> DuplicateRows(int row, int count);
+    /// The rows change places with the one above them, or below: an undo step. Not while they are sorted. Returns why
+    /// they did not.
+    QString MoveRows(int row, int count, bool up);
     /// A new line behind the last one, with these texts from its first cell on: an undo step.
     void AppendRow(const QStringList& texts);
     /// An undo step; the offered row stays. No fixed row is among the rows.
@@ -77,6 +88,7 @@ private:
     QString HeaderToolTip(int column) const;
     std::size_t Change(const QString& step, std::size_t row, const std::function<void()>& make);
     std::size_t Arrange(std::size_t row);
+    std::size_t PutBelow(const QString& step, std::size_t row, std::unique_ptr<IRowBlock> lines);
     void RemoveScattered(const std::vector<std::size_t>& lines);
     bool StoreOffered(const Overlay& typed, BlankRule rule);
     bool StoreRows(const Overlay& typed, BlankRule rule);

@@ -1,7 +1,7 @@
 #include "grid/grid_selection.h"
 
-#include <QEvent>
 #include <QHeaderView>
+#include <QMouseEvent>
 #include <QScopedValueRollback>
 #include <QTableView>
 #include <algorithm>
@@ -15,7 +15,8 @@ CGridSelection::CGridSelection(QTableView& grid) : QObject(&grid), m_grid(grid)
 
 bool CGridSelection::eventFilter(QObject* object, QEvent* event)
 {
-    if (event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick)
+    const bool isPress = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick;
+    if (isPress && static_cast<const QMouseEvent*>(event)->button() == Qt::LeftButton) // another one selects nothing
         m_choosingLines = m_linesChosen = true;
     else if (event->type() == QEvent::MouseButtonRelease)
         m_choosingLines = false;
@@ -46,6 +47,33 @@ void CGridSelection::GrowTo(const QModelIndex& cell)
     };
     m_grid.selectionModel()->setCurrentIndex(cell, QItemSelectionModel::NoUpdate);
     Select(corner([](int a, int b) { return std::min(a, b); }), corner([](int a, int b) { return std::max(a, b); }));
+}
+
+bool CGridSelection::AreLines() const
+{
+    const auto lines = Block();
+    return m_linesChosen && lines && lines->width() == m_grid.model()->columnCount();
+}
+
+CGridSelection::Shape CGridSelection::ShapeNow() const
+{
+    const QModelIndex current = m_grid.currentIndex();
+    const QItemSelectionRange selected = Block().value_or(QItemSelectionRange(current));
+    return {selected.left(), selected.right(), current.row() - selected.top(), current.column(), m_linesChosen};
+}
+
+void CGridSelection::SelectAgain(const Shape& shape, int top, int bottom)
+{
+    const QScopedValueRollback choosing(m_choosingLines, shape.isOfLines);
+    const QAbstractItemModel& model = *m_grid.model();
+    m_grid.selectionModel()->setCurrentIndex(
+        model.index(std::clamp(top + shape.row, top, bottom), std::max(shape.column, 0)),
+        QItemSelectionModel::NoUpdate);
+    Select(model.index(top, shape.left), model.index(bottom, shape.right));
+    m_grid.scrollTo(model.index(bottom, shape.column));
+    m_grid.scrollTo(model.index(top, shape.column));
+    m_grid.scrollTo(m_grid.currentIndex());
+    m_linesChosen = shape.isOfLines;
 }
 
 std::optional<QItemSelectionRange> CGridSelection::Block() const

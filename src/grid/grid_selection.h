@@ -27,6 +27,16 @@ public:
     std::optional<QItemSelectionRange> Block() const;
     /// The lines that Delete means, whole; `fixedRows` at the top are none.
     std::optional<QItemSelectionRange> Lines(int fixedRows) const;
+    /// Whole lines, selected by their numbers.
+    bool AreLines() const;
+    /// What is selected as it would be in other rows: to go on with lines that have moved.
+    struct Shape
+    {
+        int left = 0, right = 0, row = 0, column = 0; // of the current cell; its row among those selected
+        bool isOfLines = false;
+    };
+    Shape ShapeNow() const;
+    void SelectAgain(const Shape& shape, int top, int bottom);
     /// Where a new line goes.
     int PlaceOfNewLine(int fixedRows) const;
     /// Selects whole lines, as clicks on their numbers do.

@@ -140,6 +140,12 @@ void CGridWidths::MakeRoom()
         m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, m_grid.columnWidth(column)));
 }
 
+void CGridWidths::Fit(int column)
+{
+    m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, 2 * Margin));
+    MakeRoomForMarks();
+}
+
 void CGridWidths::MakeRoomFor(const QModelIndex& cell)
 {
     const QString text = m_grid.TextAt(cell.row() + 1, cell.column() + 1);

@@ -19,6 +19,8 @@ public:
     void Reset();
     /// Makes columns wider that their texts do not fit into; what the user has made wider stays.
     void MakeRoom();
+    /// A column becomes as wide as its header and its texts need, be it wider or narrower.
+    void Fit(int column);
     void MakeRoomForMarks();
     /// Likewise for the text of one cell.
     void MakeRoomFor(const QModelIndex& cell);

@@ -66,6 +66,23 @@ struct Deletion : Lines
     ChangePlace Revert() { return Put(); }
 };
 
+struct Movement
+{
+    std::shared_ptr<IRowSource> rows;
+    std::size_t from, to, row, rowAfter;
+
+    ChangePlace Apply()
+    {
+        rows->Move(from, to);
+        return PlaceOf(*rows, rowAfter);
+    }
+    ChangePlace Revert()
+    {
+        rows->Move(to, from);
+        return PlaceOf(*rows, row);
+    }
+};
+
 struct Arrangement
 {
     std::shared_ptr<IRowSource> rows;
@@ -120,6 +137,12 @@ void InsertLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t
 void DeleteLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count)
 {
     Push(document, GridTexts::tr("Deletion of lines"), Deletion{{std::move(rows), row, count}});
+}
+
+void MoveLine(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t from, std::size_t to, std::size_t row,
+              std::size_t rowAfter)
+{
+    Push(document, {}, Movement{std::move(rows), from, to, row, rowAfter});
 }
 
 void ArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<std::size_t> order, std::size_t row)

@@ -15,6 +15,9 @@ void InsertLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t
                  const QString& text = {});
 /// Removes lines from a list.
 void DeleteLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t row, std::size_t count);
+/// A line goes to another place. The lines to look at begin at `row`, and then at `rowAfter`.
+void MoveLine(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::size_t from, std::size_t to, std::size_t row,
+              std::size_t rowAfter);
 /// Puts the lines of a list into an order: for each place the row to stand there. The line to look at is the one at
 /// `row`.
 void ArrangeLines(CKsDoc& document, std::shared_ptr<IRowSource> rows, std::vector<std::size_t> order, std::size_t row);

@@ -38,6 +38,8 @@ public:
 
     /// Rows with their defaults, not in the source.
     virtual std::unique_ptr<IRowBlock> NewRows(std::size_t count) const = 0;
+    /// Rows that hold what these do, shown by columns or not; not in the source.
+    virtual std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) = 0;
     /// Puts the rows in at `row` (at the end when there are fewer) and returns the row where they went.
     virtual std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) = 0;
     virtual std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) = 0;
@@ -46,6 +48,9 @@ public:
     /// Takes rows out that Put has put in: all is as it was before.
     virtual std::unique_ptr<IRowBlock> TakeBack(std::size_t row, std::size_t count) { return Take(row, count); }
 
+    /// A row goes to another place; those between make room. Asks for no memory.
+    virtual void Move(std::size_t from, std::size_t to) { Put(to, Take(from, 1)); }
+
     /// The first rows that belong to the source itself: none of them comes, goes or moves.
     virtual std::size_t FixedRows() const { return 0; }
     bool IsEmpty() const { return Count() == FixedRows(); }
@@ -53,6 +58,8 @@ public:
     virtual bool MayBeEmpty() const { return false; }
     /// Whether a grid may add lines.
     virtual bool MayGrow() const { return true; }
+    /// Whether the user says where a row stands.
+    virtual bool MayMove() const { return true; }
 
     // Rows that depend on each other.
     /// Makes new rows fit between those at `at` - 1 and `at`, where they will be put.

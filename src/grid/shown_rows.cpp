@@ -77,6 +77,18 @@ void CShownRows::Show(std::size_t sourceRow)
     Derive();
 }
 
+void CShownRows::PlaceBehind(std::size_t sourceRow, std::size_t first, std::size_t count)
+{
+    if (m_order.empty())
+        return;
+    std::erase_if(m_order, [=](std::uint32_t row) { return row >= first && row < first + count; });
+    const auto place = std::ranges::find(m_order, std::uint32_t(sourceRow));
+    SourceRows added(count);
+    std::iota(added.begin(), added.end(), std::uint32_t(first));
+    m_order.insert(place == m_order.end() ? place : place + 1, added.begin(), added.end());
+    Derive();
+}
+
 bool CShownRows::Follow(IRowSource& rows, std::optional<std::size_t> changedAt)
 {
     if (IsPlain())

@@ -36,6 +36,8 @@ public:
     void HideNothing();
     /// A hidden row comes into sight, until others are hidden.
     void Show(std::size_t sourceRow);
+    /// New rows of the source are shown below one of it, until it is sorted afresh. Only while it is sorted.
+    void PlaceBehind(std::size_t sourceRow, std::size_t first, std::size_t count);
     void Clear() { *this = CShownRows(); }
 
     /// Rows have come, gone or moved: those that stayed are shown where they were, new ones before the row that follows

@@ -38,6 +38,13 @@ std::size_t CTableRows::SourceRow(int row) const
     return shown < m_shown.Count() ? m_shown.SourceRow(shown) : m_rows->Count() + shown - m_shown.Count();
 }
 
+std::vector<std::size_t> CTableRows::SourceRows(int row, int count) const
+{
+    std::vector<std::size_t> lines(std::size_t(std::max(count, 0)));
+    std::ranges::generate(lines, [this, row]() mutable { return SourceRow(row++); });
+    return lines;
+}
+
 int CTableRows::ShownRow(std::size_t sourceRow) const
 {
     if (m_shown.IsPlain())
@@ -211,4 +218,49 @@ std::optional<IRowSource::Fault> CTableRows::Fault(int row, int column, const st
         fault->row = place == places.end() ? 0 : std::size_t(place - places.begin());
     }
     return fault;
+}
+
+namespace {
+
+/// Rows of a source and others, in an order that they would have.
+struct RowsInOrder : IRowBlock
+{
+    std::size_t Count() const override { return rows.size(); }
+    void* At(std::size_t index) override { return rows[index]; }
+    std::vector<void*> rows = {};
+};
+
+QString TextOf(const std::optional<IRowSource::Fault>& fault, std::size_t first)
+{
+    return fault ? GridTexts::tr("Line %1: %2").arg(QString::number(first + fault->row + 1), fault->text) : QString();
+}
+
+} // namespace
+
+QString CTableRows::WhyNotBetween(std::size_t at, IRowBlock& lines) const
+{
+    if (!m_rows->HasRules())
+        return {};
+    RowsInOrder rows;
+    for (std::size_t i = 0; i < lines.Count(); ++i)
+        rows.rows.push_back(lines.At(i));
+    for (std::size_t row = at; row < m_rows->Count(); ++row)
+        rows.rows.push_back(m_rows->At(row));
+    return TextOf(m_rows->FindFault(at, rows), at);
+}
+
+QString CTableRows::WhyNotMoved(std::size_t from, std::size_t to) const
+{
+    if (!m_rows->HasRules())
+        return {};
+    RowsInOrder rows;
+    const auto [first, last] = std::minmax(from, to);
+    for (std::size_t row = first; row <= last; ++row)
+        rows.rows.push_back(m_rows->At(row));
+    const auto at = [&](std::size_t row) { return rows.rows.begin() + std::ptrdiff_t(row - first); };
+    if (from < to)
+        std::rotate(at(from), at(from + 1), at(to + 1));
+    else
+        std::rotate(at(to), at(from), at(from + 1));
+    return TextOf(m_rows->FindFault(first, rows), first);
 }

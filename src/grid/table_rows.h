@@ -33,6 +33,7 @@ public:
     const CShownRows& Shown() const { return m_shown; }
     /// The row of the source; those behind the last row shown go on behind the last one of the source.
     std::size_t SourceRow(int row) const;
+    std::vector<std::size_t> SourceRows(int row, int count) const;
     /// Where a row of the source is shown; -1 for a hidden one.
     int ShownRow(std::size_t sourceRow) const;
     /// How many lines the source has, shown or not, without fixed rows.
@@ -62,6 +63,11 @@ public:
     QString Refusal(int row, int column, const QString& text, bool isAlone = true) const;
     /// Why the rows from `row` on could not take these texts from `column` on; see IRowSource::FindFault.
     std::optional<IRowSource::Fault> Fault(int row, int column, const std::vector<QStringList>& texts) const;
+
+    /// Why the source could not take the lines between its rows `at` - 1 and `at`; empty when it could.
+    QString WhyNotBetween(std::size_t at, IRowBlock& lines) const;
+    /// Why a line of the source could not go to another place; likewise.
+    QString WhyNotMoved(std::size_t from, std::size_t to) const;
 
     /// Names the line of a row for as long as the source has it.
     RowKey NameOf(int row) const;

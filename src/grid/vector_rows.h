@@ -50,6 +50,13 @@ public:
     {
         return std::make_unique<Block>(std::vector<T>(count));
     }
+    std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) override
+    {
+        std::vector<T> copies;
+        copies.reserve(rows.size());
+        std::ranges::transform(rows, std::back_inserter(copies), [this](std::size_t row) { return m_rows()[row]; });
+        return std::make_unique<Block>(std::move(copies));
+    }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {
         row = std::min(row, Count());
@@ -72,6 +79,15 @@ public:
         m_rows().erase(first, first + std::ptrdiff_t(count));
     }
 
+    void Move(std::size_t from, std::size_t to) override
+    {
+        const auto at = [this](std::size_t row) { return m_rows().begin() + std::ptrdiff_t(row); };
+        if (from < to)
+            std::rotate(at(from), at(from + 1), at(to + 1));
+        else
+            std::rotate(at(to), at(from), at(from + 1));
+        ++m_rearranged;
+    }
     void Rearrange(const std::vector<std::size_t>& order) override
     {
         std::vector<T> arranged;

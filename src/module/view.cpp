@@ -1,7 +1,7 @@
 #include "module/view.h"
 
-#include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_commands.h"
 #include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
@@ -201,9 +201,13 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
     if (GetDocument()->ProjectHandle())
         menu.push_back(
             {Command::FetchLocation, LoadString(Str::MenuFetchLocation), QKeySequence(Qt::CTRL | Qt::Key_L)});
-    menu.push_back({Command::DeleteLine, LoadString(Str::MenuDeleteLine)});
+    std::ranges::move(CGridCommands::LineMenu(), std::back_inserter(menu));
+    const auto* page = ActivePage();
+    const auto* grid = page ? page->LinesGrid() : nullptr;
+    menu.push_back({Command::DeleteLine, CGridCommands::DeleteText(grid, LoadString(Str::MenuDeleteLine))});
+    menu.push_back(CGridCommands::ClearEntry(grid));
     menu.emplace_back();
-    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
+    std::ranges::move(CGridCommands::CellMenu(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();
@@ -218,7 +222,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     if (id == KsCommand::FindField)
         return m_sheet && m_sheet->isEnabled();
     const auto* page = ActivePage();
-    const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || CCellCommands::Knows(id);
+    const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || CGridCommands::Knows(id);
     const CGenGrid* grid = !page ? nullptr : isForLines || LinesView::Knows(id) ? page->LinesGrid() : page->GetGrid();
     if (!m_linesEnabled || !grid || !grid->isEnabled())
         return false;
@@ -227,7 +231,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     return id == Command::InsertLine      ? true
            : id == Command::DeleteLine    ? grid->HasLinesToDelete()
            : id == Command::FetchLocation ? GetDocument()->ProjectHandle() != 0
-           : CCellCommands::Knows(id)     ? CCellCommands::CanRun(id, grid)
+           : CGridCommands::Knows(id)     ? CGridCommands::CanRun(id, grid)
            : LinesView::Knows(id)         ? LinesView::CanRun(id, grid)
                                           : m_search.CanRun(id, grid);
 }
@@ -247,8 +251,8 @@ bool CKavo0_hdView::OnCommand(int id)
         page->OnHelp();
     else if (id == KsCommand::FindField)
         FindField();
-    else if (CCellCommands::Knows(id))
-        CCellCommands::Run(id, *page->LinesGrid());
+    else if (CGridCommands::Knows(id))
+        CGridCommands::Run(id, *page->LinesGrid());
     else if (LinesView::Knows(id))
         LinesView::Run(id, *page->LinesGrid());
     else

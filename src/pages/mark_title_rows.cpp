@@ -69,6 +69,7 @@ public:
     RowKey KeyAt(std::size_t row) override { return row; }
     void* Object(RowKey key) override { return At(key); }
     bool IsSequence() const override { return true; } // of the levels
+    bool MayMove() const override { return false; }   // records need not have a level for each of them
     std::size_t RowOf(RowKey key, std::size_t) override { return std::min(std::size_t(key), Count()); }
 
     std::unique_ptr<IRowBlock> NewRows(std::size_t count) const override
@@ -76,6 +77,18 @@ public:
         auto block = std::make_unique<CTitleBlock>();
         block->entries.resize(count);
         return block;
+    }
+    /// Without levels: those of a mark are its own.
+    std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) override
+    {
+        auto copies = NewRows(rows.size());
+        for (std::size_t i = 0; i < rows.size(); ++i) {
+            const auto& title = *static_cast<const MarkTitle*>(At(rows[i]));
+            auto& copy = *static_cast<MarkTitle*>(copies->At(i));
+            copy.SetTitle(title.Title());
+            copy.SetInterpolate(title.Interpolate());
+        }
+        return copies;
     }
     std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) override
     {

@@ -55,6 +55,6 @@ bool CEditRouter::Can(int command) const
             return !line->isReadOnly();
         return line->hasSelectedText() && (command == KsCommand::Copy || !line->isReadOnly());
     }
-    // A grid copies and pastes; nothing else in a document window does.
-    return focus && command != KsCommand::Cut && focus->inherits("QAbstractItemView");
+    // A grid cuts, copies and pastes; nothing else in a document window does.
+    return focus && focus->inherits(command == KsCommand::Cut ? "QTableView" : "QAbstractItemView");
 }

@@ -3,6 +3,7 @@
 #include "ks/fc/frames.h"
 
 #include <QMenu>
+#include <algorithm>
 
 CLinesMenu::CLinesMenu(CKsMDIFrameWnd& frame, QMenu& menu, QObject* parent)
     : QObject(parent), m_frame(frame), m_menu(menu)
@@ -29,12 +30,17 @@ void CLinesMenu::Fill()
     }
 }
 
-/// Commands are greyed only while the menu is open: a shortcut must not depend on when it was last looked at.
+/// A command may be called as what it would do now. Commands are greyed only while the menu is open: a shortcut must
+/// not depend on when it was last looked at.
 void CLinesMenu::Update(bool open)
 {
     const auto* target = dynamic_cast<CCommandTarget*>(m_frame.GetActiveView());
+    const auto commands = open && target ? target->LinesMenu() : std::vector<CKsMenuCommand>();
     const auto actions = m_menu.actions();
     for (QAction* action : actions) {
+        const auto command = std::ranges::find(commands, action->data().toInt(), &CKsMenuCommand::id);
+        if (!action->isSeparator() && command != commands.end())
+            action->setText(command->text);
         if (!action->isSeparator())
             action->setEnabled(!open || (target && target->IsCommandEnabled(action->data().toInt())));
     }

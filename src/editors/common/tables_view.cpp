@@ -264,7 +264,7 @@ bool CTablesView::IsCommandEnabled(int id) const
     case Command::DeleteLine:
         return m_lines->HasLinesToDelete();
     default:
-        return CCellCommands::CanRun(id, m_lines) || LinesView::CanRun(id, m_lines) || m_search.CanRun(id, m_main.grid);
+        return CGridCommands::CanRun(id, m_lines) || LinesView::CanRun(id, m_lines) || m_search.CanRun(id, m_main.grid);
     }
 }
 
@@ -278,8 +278,8 @@ bool CTablesView::OnCommand(int id)
         InsertLine();
     else if (id == Command::DeleteLine)
         m_lines->DeleteSelectedLines();
-    else if (CCellCommands::Knows(id))
-        CCellCommands::Run(id, *m_lines);
+    else if (CGridCommands::Knows(id))
+        CGridCommands::Run(id, *m_lines);
     else if (LinesView::Knows(id))
         LinesView::Run(id, *m_lines);
     else

@@ -3,8 +3,8 @@
 // view's commands, undo shows what it does, and other editors are answered.
 #pragma once
 
-#include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_commands.h"
 #include "grid/grid_host.h"
 #include "grid/grid_search.h"
 #include "ks/fc/exchange.h"
@@ -54,6 +54,7 @@ protected:
     int CurrentLine() const;
     /// The table that had the focus last: commands are about its lines.
     CGenGrid& Lines() const { return *m_lines; }
+    const CGenGrid* LinesOrNull() const { return m_lines; } // before the first update
     bool IsEditing() const;
     bool HasFocus(const CGenGrid& table) const;
     /// By the view's command or by the keys of a table.

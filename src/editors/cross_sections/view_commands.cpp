@@ -10,10 +10,15 @@ std::vector<CKsMenuCommand> CCrossSectionView::LinesMenu() const
 {
     // Their keys belong to the tables: in a cell's editor they mean something else.
     std::vector<CKsMenuCommand> menu{
-        {Command::InsertLine, tr("&Insert Line"), {}, tr("Adds a cross section or a point below the current one")},
-        {Command::DeleteLine, tr("&Delete Lines"), {}, tr("Deletes the selected cross sections or points")},
-        {}};
-    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
+        {Command::InsertLine, tr("&Insert Line"), {}, tr("Adds a cross section or a point below the current one")}};
+    std::ranges::move(CGridCommands::LineMenu(), std::back_inserter(menu));
+    menu.push_back({Command::DeleteLine,
+                    CGridCommands::DeleteText(LinesOrNull(), tr("&Delete Lines")),
+                    {},
+                    tr("Deletes the selected cross sections or points")});
+    menu.push_back(CGridCommands::ClearEntry(LinesOrNull()));
+    menu.emplace_back();
+    std::ranges::move(CGridCommands::CellMenu(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();

@@ -103,6 +103,7 @@ public:
         return std::nullopt;
     }
     bool IsSequence() const override { return true; }
+    bool MayMove() const override { return false; } // the chainage says where
     std::vector<std::size_t> Order() const override
     {
         const auto& channel = Rows();

@@ -40,9 +40,14 @@ std::vector<CKsMenuCommand> CNetworkView::LinesMenu() const
         menu.emplace_back();
     }
     menu.push_back({Command::InsertLine, tr("&Insert Line"), {}, tr("Adds a line to the channel of the branch")});
-    menu.push_back({Command::DeleteLine, tr("&Delete Lines"), {}, tr("Deletes the selected lines of the table")});
+    std::ranges::move(CGridCommands::LineMenu(), std::back_inserter(menu));
+    menu.push_back({Command::DeleteLine,
+                    CGridCommands::DeleteText(LinesOrNull(), tr("&Delete Lines")),
+                    {},
+                    tr("Deletes the selected lines of the table")});
+    menu.push_back(CGridCommands::ClearEntry(LinesOrNull()));
     menu.emplace_back();
-    std::ranges::move(CCellCommands::MenuCommands(), std::back_inserter(menu));
+    std::ranges::move(CGridCommands::CellMenu(), std::back_inserter(menu));
     menu.emplace_back();
     std::ranges::move(CGridSearch::MenuCommands(), std::back_inserter(menu));
     menu.emplace_back();

@@ -547,5 +547,241 @@
         <source>In the file: %1</source>
         <translation>ファイル内の名前: %1</translation>
     </message>
+    <message>
+        <source>Branch</source>
+        <translation>河川名</translation>
+    </message>
+    <message>
+        <source>&amp;Branch:</source>
+        <translation>河川名(&amp;B):</translation>
+    </message>
+    <message>
+        <source>&amp;From chainage:</source>
+        <translation>始点の追加距離(&amp;F):</translation>
+    </message>
+    <message>
+        <source>From chainage</source>
+        <translation>始点の追加距離</translation>
+    </message>
+    <message>
+        <source>&amp;To chainage:</source>
+        <translation>終点の追加距離(&amp;T):</translation>
+    </message>
+    <message>
+        <source>To chainage</source>
+        <translation>終点の追加距離</translation>
+    </message>
+    <message>
+        <source>At &amp;even distances</source>
+        <translation>一定の間隔で(&amp;E)</translation>
+    </message>
+    <message>
+        <source>&amp;Distance:</source>
+        <translation>間隔(&amp;D):</translation>
+    </message>
+    <message>
+        <source>Distance</source>
+        <translation>間隔</translation>
+    </message>
+    <message>
+        <source>At each &amp;cross section between them</source>
+        <translation>区間内の各横断面に(&amp;C)</translation>
+    </message>
+    <message>
+        <source>No cross sections are known: none are open in the project.</source>
+        <translation>横断面がありません。プロジェクトで開かれていません。</translation>
+    </message>
+    <message>
+        <source>No cross sections of this branch are known.</source>
+        <translation>この河川の横断面がありません。</translation>
+    </message>
+    <message>
+        <source>Which branch?</source>
+        <translation>河川名を指定してください。</translation>
+    </message>
+    <message>
+        <source>%1 takes a number.</source>
+        <translation>%1には数値を入力してください。</translation>
+    </message>
+    <message>
+        <source>The reach ends before it begins.</source>
+        <translation>終点が始点より前にあります。</translation>
+    </message>
+    <message>
+        <source>No cross section is between them.</source>
+        <translation>区間内に横断面がありません。</translation>
+    </message>
+    <message>
+        <source>%1 takes a number greater than 0.</source>
+        <translation>%1には 0 より大きい数値を入力してください。</translation>
+    </message>
+    <message>
+        <source>These would be more than %1 lines.</source>
+        <translation>%1 行を超えます。</translation>
+    </message>
+    <message>
+        <source>1 line:</source>
+        <translation>1 行:</translation>
+    </message>
+    <message>
+        <source>%1 lines:</source>
+        <translation>%1 行:</translation>
+    </message>
+    <message>
+        <source>1 is there already and stays as it is.</source>
+        <translation>1 行は既にあり、そのまま残ります。</translation>
+    </message>
+    <message>
+        <source>%1 are there already and stay as they are.</source>
+        <translation>%1 行は既にあり、そのまま残ります。</translation>
+    </message>
+    <message>
+        <source>Nothing was inserted. %1</source>
+        <translation>挿入されませんでした。%1</translation>
+    </message>
+    <message>
+        <source>%1 lines inserted</source>
+        <translation>%1 行を挿入しました</translation>
+    </message>
+    <message>
+        <source>1 was there</source>
+        <translation>1 行は既にありました</translation>
+    </message>
+    <message>
+        <source>%1 were there</source>
+        <translation>%1 行は既にありました</translation>
+    </message>
+    <message>
+        <source>1 cell cut</source>
+        <translation>1 個のセルを切り取りました</translation>
+    </message>
+    <message>
+        <source>%1 cells cut</source>
+        <translation>%1 個のセルを切り取りました</translation>
+    </message>
+    <message>
+        <source>1 cell cleared</source>
+        <translation>1 個のセルをクリアしました</translation>
+    </message>
+    <message>
+        <source>%1 cells cleared</source>
+        <translation>%1 個のセルをクリアしました</translation>
+    </message>
+    <message>
+        <source>Clear the Cell</source>
+        <translation>セルのクリア</translation>
+    </message>
+    <message>
+        <source>Clear %1 Cells</source>
+        <translation>%1 個のセルのクリア</translation>
+    </message>
+    <message>
+        <source>&amp;Delete the Line</source>
+        <translation>行の削除(&amp;D)</translation>
+    </message>
+    <message>
+        <source>&amp;Delete %1 Lines</source>
+        <translation>%1 行の削除(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Delete takes away lines that are selected by their numbers. %1 clears cells.</source>
+        <translation>Delete は行番号で選択した行を削除します。セルのクリアは %1 です。</translation>
+    </message>
+    <message>
+        <source>Insert Line Above</source>
+        <translation>上に行を挿入</translation>
+    </message>
+    <message>
+        <source>Insert Line Below</source>
+        <translation>下に行を挿入</translation>
+    </message>
+    <message>
+        <source>Duplicate Lines</source>
+        <translation>行の複製</translation>
+    </message>
+    <message>
+        <source>Duplicate the selected lines, or the current one</source>
+        <translation>選択した行または現在の行を複製</translation>
+    </message>
+    <message>
+        <source>Move Lines Up</source>
+        <translation>行を上へ移動</translation>
+    </message>
+    <message>
+        <source>Move the selected lines, or the current one, up in the file</source>
+        <translation>選択した行または現在の行をファイル内で上へ移動</translation>
+    </message>
+    <message>
+        <source>Move Lines Down</source>
+        <translation>行を下へ移動</translation>
+    </message>
+    <message>
+        <source>Move the selected lines, or the current one, down in the file</source>
+        <translation>選択した行または現在の行をファイル内で下へ移動</translation>
+    </message>
+    <message>
+        <source>Insert Lines Along a Branch...</source>
+        <translation>河川に沿って行を挿入...</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <translation>切り取り</translation>
+    </message>
+    <message>
+        <source>Copy, then delete the lines that are selected by their numbers, or clear the cells</source>
+        <translation>コピーして、行番号で選択した行を削除、またはセルをクリア</translation>
+    </message>
+    <message>
+        <source>Clear Cells</source>
+        <translation>セルのクリア</translation>
+    </message>
+    <message>
+        <source>Clear the selected cells</source>
+        <translation>選択したセルをクリア</translation>
+    </message>
+    <message>
+        <source>Fit the Width</source>
+        <translation>列の幅を合わせる</translation>
+    </message>
+    <message>
+        <source>Duplication of lines</source>
+        <translation>行の複製</translation>
+    </message>
+    <message>
+        <source>Line duplicated</source>
+        <translation>行を複製しました</translation>
+    </message>
+    <message>
+        <source>%1 lines duplicated</source>
+        <translation>%1 行を複製しました</translation>
+    </message>
+    <message>
+        <source>Move of a line</source>
+        <translation>行の移動</translation>
+    </message>
+    <message>
+        <source>Move of lines</source>
+        <translation>行の移動</translation>
+    </message>
+    <message>
+        <source>Line moved</source>
+        <translation>行を移動しました</translation>
+    </message>
+    <message>
+        <source>%1 lines moved</source>
+        <translation>%1 行を移動しました</translation>
+    </message>
+    <message>
+        <source>Nothing was duplicated. %1</source>
+        <translation>複製されませんでした。%1</translation>
+    </message>
+    <message>
+        <source>Lines are moved in the order of the file. These are sorted: Lines &gt; %1 shows them as they stand in the file.</source>
+        <translation>行はファイルの順序で移動します。現在は並べ替えられています。「行」&gt;「%1」でファイルの順序に戻せます。</translation>
+    </message>
+    <message>
+        <source>Nothing was moved. %1</source>
+        <translation>移動されませんでした。%1</translation>
+    </message>
 </context>
 </TS>

@@ -3,6 +3,7 @@
 #include "document/document.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_keys.h"
+#include "ks/fc/exchange.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page_help.h"
 
@@ -15,6 +16,7 @@
 #include <QUndoStack>
 #include <QWhatsThis>
 #include <algorithm>
+#include <cmath>
 
 CGenPropertyPage::CGenPropertyPage(CKavo0_hdDoc* document, QWidget* parent)
     : QWidget(parent), m_document(document), m_bindings(document), m_shownUnits(KsUnits::Instance().System())
@@ -186,6 +188,19 @@ void CGenPropertyPage::Run(CGenGrid&, GridAction action)
 QStringList CGenPropertyPage::BranchNames()
 {
     return m_host ? m_host->BranchNames() : QStringList();
+}
+
+/// Whoever answers with locations has cross sections: a network has branches.
+std::vector<std::pair<QString, double>> CGenPropertyPage::CrossSections()
+{
+    CObList objects;
+    m_document->AskProject(KsRequest::LoadLocations, m_host ? m_host->HostView() : nullptr, &objects);
+    std::vector<std::pair<QString, double>> sections;
+    for (const auto& object : objects)
+        if (const auto* place = dynamic_cast<const CKvrCBELocation*>(object.get());
+            place && !place->branch.isEmpty() && std::isfinite(place->chainage))
+            sections.emplace_back(place->branch, place->chainage);
+    return sections;
 }
 
 void CGenPropertyPage::OnHelp()

@@ -59,6 +59,7 @@ public:
     void CellCurrent(CGenGrid& grid) override;
     void LineCurrent(CGenGrid& grid) override;
     void Run(CGenGrid& grid, GridAction action) override;
+    std::vector<std::pair<QString, double>> CrossSections() override;
     bool CanSearch(const CGenGrid& grid) const override { return &grid == m_grid; }
     QStringList BranchNames() override;
 

@@ -1,0 +1,106 @@
+#include "grid/branch_lines.h"
+
+#include "base/not_given.h"
+#include "ks/fc/branch_name.h"
+
+#include <QSet>
+#include <algorithm>
+#include <cmath>
+
+namespace {
+
+constexpr int BranchColumn = 0, ChainageColumn = 1;
+constexpr double SamePlace = 1e-6; // metres: what conversions of units leave
+
+/// Calls `visit` with the row of the source, the branch and the chainage, if it is given, of each line.
+template <typename Visit>
+void ForLines(const CTableRows& rows, const Visit& visit)
+{
+    IRowSource& source = *rows.Rows();
+    const CellAccess &names = *rows.Column(BranchColumn).access, &chainages = *rows.Column(ChainageColumn).access;
+    std::string last; // lines of one branch mostly follow each other
+    QString branch;
+    for (std::size_t row = source.FixedRows(), end = source.Count(); row < end; ++row) {
+        const void* const object = source.At(row);
+        const CellValue name = names.get(object), chainage = chainages.get(object);
+        if (const auto& text = std::get<std::string>(name); text != last || branch.isNull()) {
+            last = text;
+            branch = KsBranchKey(QString::fromStdString(text));
+        }
+        const auto* number = std::get_if<double>(&chainage);
+        visit(row, branch, number && *number != NotGiven && std::isfinite(*number) ? number : nullptr);
+    }
+}
+
+} // namespace
+
+std::optional<std::vector<double>> ChainagesEvery(const ColumnSpec& column, double from, double to, double step)
+{
+    const auto shown = [&](double base) { return KsFifteenDigits(column.style.UnitConvertFromBase(base, 1)); };
+    const double first = shown(from), every = shown(step);
+    const double count = std::floor((shown(to) - first) / every * (1 + 1e-12)) + 1;
+    if (!(count <= double(MostLinesAtOnce)))
+        return std::nullopt;
+    std::vector<double> chainages;
+    for (double i = 0; i < count; ++i)
+        chainages.push_back(KsFifteenDigits(column.style.UnitConvertFromBase(first + i * every, 0)));
+    return chainages;
+}
+
+PlacesOfBranch WithoutKnownPlaces(const CTableRows& rows, PlacesOfBranch places)
+{
+    std::vector<double> known;
+    ForLines(rows, [&](std::size_t, const QString& branch, const double* chainage) {
+        if (chainage && branch == places.branch)
+            known.push_back(*chainage);
+    });
+    std::ranges::sort(known);
+    std::ranges::sort(places.chainages);
+    const auto isSame = [](double a, double b) { return std::abs(a - b) < SamePlace; };
+    const auto twins = std::ranges::unique(places.chainages, isSame);
+    places.chainages.erase(twins.begin(), twins.end());
+    std::erase_if(places.chainages, [&](double chainage) {
+        const auto next = std::ranges::lower_bound(known, chainage - SamePlace);
+        return next != known.end() && isSame(*next, chainage);
+    });
+    return places;
+}
+
+BranchInTable FindBranch(const CTableRows& rows, const QString& branch)
+{
+    BranchInTable found{.behind = rows.Rows()->Count()};
+    ForLines(rows, [&](std::size_t row, const QString& name, const double* chainage) {
+        if (name != branch)
+            return;
+        found.behind = row + 1;
+        if (!chainage)
+            return;
+        found.from = std::min(found.from.value_or(*chainage), *chainage);
+        found.to = std::max(found.to.value_or(*chainage), *chainage);
+    });
+    return found;
+}
+
+QStringList BranchesIn(const CTableRows& rows)
+{
+    QStringList branches;
+    QSet<QString> met;
+    ForLines(rows, [&](std::size_t, const QString& branch, const double*) {
+        if (branch.isEmpty() || met.contains(branch))
+            return;
+        met.insert(branch);
+        branches << branch;
+    });
+    return branches;
+}
+
+std::unique_ptr<IRowBlock> LinesAt(const CTableRows& rows, const PlacesOfBranch& places)
+{
+    auto lines = rows.NewLines(int(places.chainages.size()));
+    const std::string branch = places.branch.toStdString();
+    for (std::size_t i = 0; i < lines->Count(); ++i) {
+        rows.Column(BranchColumn).access->set(lines->At(i), branch);
+        rows.Column(ChainageColumn).access->set(lines->At(i), places.chainages[i]);
+    }
+    return lines;
+}

@@ -1,0 +1,37 @@
+// Lines at many places of one branch at once.
+#pragma once
+
+#include "grid/table_rows.h"
+
+#include <QString>
+
+/// Chainages in metres.
+struct PlacesOfBranch
+{
+    QString branch; // as its cells store it
+    std::vector<double> chainages{};
+};
+
+/// More lines than this are not put in at once.
+inline constexpr std::size_t MostLinesAtOnce = 1'000'000;
+
+/// From one chainage to another, in metres as `step` is: even numbers in the unit that the column shows. Nothing when
+/// there would be more than MostLinesAtOnce.
+std::optional<std::vector<double>> ChainagesEvery(const ColumnSpec& column, double from, double to, double step);
+
+/// The places of the branch that no line of the table has, hidden lines included. The first two columns are branch name
+/// and chainage.
+PlacesOfBranch WithoutKnownPlaces(const CTableRows& rows, PlacesOfBranch places);
+
+/// What is known of the branch's lines in the table.
+struct BranchInTable
+{
+    std::optional<double> from{}, to{};
+    std::size_t behind = 0; // the row of the source behind its last line; that behind all lines without one
+};
+BranchInTable FindBranch(const CTableRows& rows, const QString& branch);
+/// Every branch that a line names, in capitals, in the order of the file.
+QStringList BranchesIn(const CTableRows& rows);
+
+/// New lines at these places, with what new lines hold besides; not in the source.
+std::unique_ptr<IRowBlock> LinesAt(const CTableRows& rows, const PlacesOfBranch& places);

@@ -1,0 +1,109 @@
+#include "grid/grid_commands.h"
+
+#include "grid/cell_commands.h"
+#include "grid/gen_grid.h"
+#include "grid/grid_texts.h"
+#include "grid/line_commands.h"
+
+#include <algorithm>
+
+namespace {
+
+constexpr int FirstCommand = 42640; // of the first action; that of the others follows
+
+bool IsOfLines(GridAction action)
+{
+    return std::ranges::find(LineActions, action) != std::end(LineActions);
+}
+
+bool IsOfCells(GridAction action)
+{
+    return std::ranges::find(CellActions, action) != std::end(CellActions) ||
+           std::ranges::find(EmptyingActions, action) != std::end(EmptyingActions);
+}
+
+std::vector<CKsMenuCommand> MenuOf(const auto& actions)
+{
+    std::vector<CKsMenuCommand> commands;
+    for (const GridAction action : actions)
+        commands.push_back({FirstCommand + int(action), MenuText(action), KeyOf(action), TextOf(action)});
+    return commands;
+}
+
+GridAction ActionOf(int command)
+{
+    const int action = command - FirstCommand;
+    return action >= 0 && action < int(GridAction::None) ? GridAction(action) : GridAction::None;
+}
+
+} // namespace
+
+std::vector<CKsMenuCommand> CGridCommands::LineMenu()
+{
+    return MenuOf(LineActions);
+}
+
+std::vector<CKsMenuCommand> CGridCommands::CellMenu()
+{
+    return MenuOf(CellActions);
+}
+
+CKsMenuCommand CGridCommands::ClearEntry(const CGenGrid* grid)
+{
+    constexpr GridAction action = GridAction::Clear;
+    return {FirstCommand + int(action), TextFor(action, grid), KeyOf(action), TextOf(action)};
+}
+
+QString CGridCommands::TextFor(GridAction action, const CGenGrid* grid)
+{
+    if (action == GridAction::DeleteLine)
+        return DeleteText(grid, MenuText(action));
+    if (action != GridAction::Clear || !grid || !CanRun(action, *grid))
+        return MenuText(action);
+    const auto block = grid->SelectedBlock();
+    const auto cells = block ? std::size_t(block->height()) * std::size_t(block->width()) : 1;
+    return GridTexts::Counted(cells, GridTexts::tr("Clear the Cell"), GridTexts::tr("Clear %1 Cells"));
+}
+
+QString CGridCommands::DeleteText(const CGenGrid* grid, const QString& otherwise)
+{
+    if (!grid || !grid->HasLinesToDelete())
+        return otherwise;
+    const CGridModel& model = *grid->Model();
+    const auto lines = grid->Selection().Lines(model.FixedRows());
+    const int count = std::min(lines->bottom() + 1, model.StoredRows()) - lines->top();
+    return count <= 0 ? otherwise
+                      : GridTexts::Counted(std::size_t(count), GridTexts::tr("&Delete the Line"),
+                                           GridTexts::tr("&Delete %1 Lines"));
+}
+
+bool CGridCommands::Knows(int command)
+{
+    return Knows(ActionOf(command));
+}
+
+bool CGridCommands::Knows(GridAction action)
+{
+    return IsOfLines(action) || IsOfCells(action);
+}
+
+bool CGridCommands::CanRun(int command, const CGenGrid* grid)
+{
+    return grid && CanRun(ActionOf(command), *grid);
+}
+
+bool CGridCommands::CanRun(GridAction action, const CGenGrid& grid)
+{
+    return IsOfLines(action) ? CanRunOnLines(grid, action) : IsOfCells(action) && CanRunOnCells(grid, action);
+}
+
+void CGridCommands::Run(int command, CGenGrid& grid)
+{
+    Run(ActionOf(command), grid);
+}
+
+void CGridCommands::Run(GridAction action, CGenGrid& grid)
+{
+    if (CanRun(action, grid))
+        IsOfLines(action) ? RunOnLines(grid, action) : RunOnCells(grid, action);
+}
