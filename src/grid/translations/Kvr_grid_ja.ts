@@ -547,5 +547,9 @@
         <source>In the file: %1</source>
         <translation>ファイル内の名前: %1</translation>
     </message>
+    <message>
+        <source>Default: %1</source>
+        <translation>既定値: %1</translation>
+    </message>
 </context>
 </TS>
