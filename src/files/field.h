@@ -156,6 +156,7 @@ struct Field
     bool mayBeUnknown = false; // a number: not a number stands for one that is not known
     bool padWhenEmpty = false; // an empty group is followed by one element with default values
     TextLine title{};
+    TextLine meaning{};           // what the value is to the flow computation, in a sentence or two
     TextLine choices{};           // the texts of an integer's indices, one a line; for a text what it may be
     std::int32_t firstChoice = 0; // the index of the first of them
     int digits = 0;               // significant ones, where a number is shown; 0 for the usual
@@ -171,6 +172,8 @@ struct Field
     }
     constexpr Field Title(TextLine text) const { return With(&Field::title, text); }
     constexpr Field Title(Str text, int line) const { return Title({text, line}); }
+    constexpr Field Means(TextLine text) const { return With(&Field::meaning, text); }
+    constexpr Field Means(Str text, int line) const { return Means({text, line}); }
     constexpr Field Choices(TextLine texts, std::int32_t first = 0) const
     {
         if (kind != FieldKind::Integer && kind != FieldKind::Boolean && kind != FieldKind::Text)

@@ -110,7 +110,7 @@ struct ColumnSpec
     std::function<bool(const void* row)> locked = {}; // the cell of this row cannot be edited
     Choices choices = {};                             // of a drop-down column
     std::function<QString()> unitText = {}; // symbol instead of the style's, where the unit depends on a setting
-    std::function<QString()> hint = {};     // what the column is, for the tool tip of its header
+    std::function<QString()> hint = {};     // what the column means, for the tool tip of its header
     bool upperCase = false;                 // of a text
     LocationValue locationValue = LocationValue::None;
     double* globalNumber = nullptr; // what a first row for global values shows; without, its cell is locked

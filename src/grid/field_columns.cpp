@@ -60,6 +60,8 @@ FieldColumns& FieldColumns::Add(const Field& field, CellAccess access, ColumnSpe
             return named == UnitGroup::None ? text(title) : WithUnit(text(title), named);
         };
     }
+    if (!column.hint && field.meaning)
+        column.hint = [text = m_style.text, meaning = field.meaning] { return text(meaning); };
     column.name = field.name;
     column.style = CKsEditStyle(field.unit);
     if (field.digits)

@@ -1,9 +1,9 @@
 #include "grid/grid_model.h"
 
-#include "grid/bounds.h"
 #include "grid/cell_text.h"
 #include "grid/grid_texts.h"
 #include "grid/row_commands.h"
+#include "grid/tool_tip.h"
 
 #include <QGuiApplication>
 #include <QPalette>
@@ -135,21 +135,17 @@ QVariant CGridModel::headerData(int section, Qt::Orientation orientation, int ro
     return role == Qt::ToolTipRole ? HeaderToolTip(section) : QVariant();
 }
 
-/// What the column is, the unit and the range of its cells, what new lines hold, and how the file calls it.
+/// What the column means, the unit and the range of its cells, what new lines hold, and how the file calls it.
 QString CGridModel::HeaderToolTip(int column) const
 {
     const ColumnSpec& spec = Column(column);
-    QStringList lines{spec.hint ? spec.hint() : QString(), spec.ToolTip()};
-    if (const QString range = BoundsText(spec.bounds, spec.style); !range.isEmpty())
-        lines << GridTexts::tr("Range: %1").arg(NumberText(range, spec.UnitSymbol()));
+    QStringList lines{spec.hint ? spec.hint() : QString(), spec.ToolTip(),
+                      RangeLine(spec.bounds, spec.style, spec.UnitSymbol())};
     const bool isFixed = spec.Kind() != CellKind::DateTime && spec.Kind() != CellKind::Button; // a date is that of now
     if (const CellValue value = Rows() && isFixed ? DefaultOf(spec) : CellValue(); !IsEmptyCell(spec, value))
         lines << (spec.fill ? GridTexts::tr("New lines: %1, the global value") : GridTexts::tr("New lines: %1"))
                      .arg(FullText(spec, value));
-    if (!spec.name.empty())
-        lines << GridTexts::tr("In the file: %1").arg(QString::fromUtf8(spec.name));
-    lines.removeAll(QString());
-    return lines.join(u'\n');
+    return ToolTipText(lines << NameInFileLine(spec.name));
 }
 
 Qt::ItemFlags CGridModel::flags(const QModelIndex& index) const

@@ -45,10 +45,6 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document)
     const auto coefficient = [&](const double& global) {
         return ColumnSpec{.width = 60, .fill = &global, .locked = lockUnless(Coefficients)};
     };
-    const auto explained = [&](ColumnSpec options) {
-        options.hint = [] { return LoadString(Str::CoefFormula); };
-        return options;
-    };
     const auto bound = [&](const double& global) {
         ColumnSpec options = coefficient(global);
         options.unitText = unit;
@@ -58,8 +54,8 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document)
     Grid(m_ui.grid_1319)
         .BranchName({.width = 110})
         .Chainage({})
-        .Value(&R::CoefA, explained(coefficient(tools.CoefA)))
-        .Value(&R::CoefB, explained(coefficient(tools.CoefB)))
+        .Value(&R::CoefA, coefficient(tools.CoefA))
+        .Value(&R::CoefB, coefficient(tools.CoefB))
         .Value(&R::MinRes, bound(tools.MinRes))
         .Value(&R::MaxRes, bound(tools.MaxRes));
     for (GridColumns pairs : {PairsGrid(m_ui.pairs_1318, tools.VeloRes), PairsGrid(m_ui.linePairs_1320, &R::VeloRes)})

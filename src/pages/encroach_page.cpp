@@ -142,15 +142,10 @@ void CEncroachPage::DeclareColumns()
     GridColumns columns = Grid(m_ui.grid_1348);
     columns.BranchName({.width = 110}).Chainage({});
     for (const Field& field : HDEncroach::DeclaredFields()) {
-        ColumnSpec options{.locked =
-                               [&field](const void* row) {
-                                   const auto* record = static_cast<const HD_RiverPos*>(row);
-                                   return !IsUsed(field.constAddress(row), *static_cast<const HDEncroach*>(record));
-                               },
-                           .hint =
-                               [name = field.name] {
-                                   return LoadString(Str::StoredAs).arg(QString::fromLatin1(name.data(), name.size()));
-                               }};
+        ColumnSpec options{.locked = [&field](const void* row) {
+            const auto* record = static_cast<const HD_RiverPos*>(row);
+            return !IsUsed(field.constAddress(row), *static_cast<const HDEncroach*>(record));
+        }};
         if (field.choices) {
             options.width = 130;
             options.choices = {.whenEmptied = field.firstChoice};

@@ -124,11 +124,11 @@ QString ResistanceUnit(std::int32_t formula)
 {
     switch (formula) {
     case ManningM:
-        return QStringLiteral("m^(1/3)/s");
+        return QStringLiteral("m¹⁄³/s");
     case ManningN:
-        return QStringLiteral("s/m^(1/3)");
+        return QStringLiteral("s/m¹⁄³");
     case Chezy:
-        return QStringLiteral("m^(1/2)/s");
+        return QStringLiteral("m¹⁄²/s");
     default:
         return {};
     }

@@ -34,13 +34,19 @@ std::string Values(const Field& field)
     return known.empty() ? "" : " (" + known + ')';
 }
 
+std::string EnglishLine(const TextLine& text)
+{
+    std::istringstream lines(EnglishText(text.text));
+    std::string found;
+    for (int line = std::max(text.line, 0); line >= 0; --line)
+        std::getline(lines, found);
+    return found;
+}
+
 /// " "Delta"": what the value is called on its page.
 std::string Title(const Field& field)
 {
-    std::istringstream lines(EnglishText(field.title.text));
-    std::string title;
-    for (int line = std::max(field.title.line, 0); line >= 0; --line)
-        std::getline(lines, title);
+    const std::string title = EnglishLine(field.title);
     return title.empty() ? "" : " \"" + PlainText(title) + '"';
 }
 
@@ -116,6 +122,35 @@ std::string ListTable()
     return table;
 }
 
+/// The fields on the pages, those of repeated groups included.
+void AddMeanings(FieldList fields, const std::string& place, std::string& table)
+{
+    for (const Field& field : fields) {
+        if (field.group)
+            AddMeanings(field.group->elements(), place, table);
+        const std::string meaning = EnglishLine(field.meaning);
+        EXPECT_TRUE(!meaning.empty() || !(field.title || field.choices)) << place << ' ' << field.name;
+        if (!meaning.empty())
+            table += "| `" + place + "` | `" + std::string(field.name) + "` | " + meaning + " |\n";
+    }
+}
+
+std::string MeaningTable()
+{
+    std::string table = "| Section | Value | Meaning |\n|---|---|---|\n";
+    for (const DeclaredSection& section : HDGlobals().Sections()) {
+        for (const DeclaredKeyword& row : section.keywords)
+            AddMeanings(row.Fields(), std::string(section.name), table);
+        for (const DeclaredSection& items : section.Sections())
+            AddMeanings(items.keywords.front().Fields(), std::string(items.name), table);
+    }
+    HD_Parameters parameters;
+    parameters.EncroachList.Add();
+    for (const ListEntry& entry : HDLists())
+        AddMeanings(entry.list(parameters).ListAt(0).Fields(), entry.section, table);
+    return table;
+}
+
 /// The document with the text between two of its marks replaced.
 std::string WithTable(std::string document, const std::string& name, const std::string& table)
 {
@@ -134,5 +169,7 @@ TEST(DocumentTables, AreWhatTheDeclarationsSay)
 {
     const char* const path = KVR_SOURCE_DIR "/docs/hdkv.md";
     const std::string is = ReadText(path);
-    ExpectRecorded(WithTable(WithTable(is, "global values", GlobalTable()), "location records", ListTable()), path);
+    const std::string tables =
+        WithTable(WithTable(is, "global values", GlobalTable()), "location records", ListTable());
+    ExpectRecorded(WithTable(tables, "meanings", MeaningTable()), path);
 }

@@ -13,6 +13,7 @@
 #include <QLabel>
 #include <QLocale>
 #include <QRadioButton>
+#include <QRegularExpression>
 #include <QTemporaryDir>
 #include <numeric>
 #include <set>
@@ -25,9 +26,9 @@ void Change(const Field& field, void* object, int& seed)
     ++seed;
     Visit(field, object,
           Overloads{[&](double& value) { value += 0.25 + seed; },
-                    [&](std::int32_t& value) {
-                        value = !field.choices ? value + seed : value == 1 ? 2 : 1;
-                    },
+                    [&](std::int32_t& value) { value = !field.choices ? value + seed
+                                                       : value == 1   ? 2
+                                                                      : 1; },
                     [](bool& value) { value = !value; },
                     [&](std::string& value) { value = "TEXT " + std::to_string(seed); },
                     [&](HDDateTime& value) { value = {2000 + seed, 2, 28, 23, 59, 1}; },
@@ -222,8 +223,7 @@ protected:
                     TryControl(*field, [&] { TypeInto(*field, text); });
         for (auto* list : page.findChildren<QComboBox*>())
             if (list->isEnabled() && list->isVisible())
-                TryControl(*list,
-                           [&] { QTest::keyClick(list, list->currentIndex() > 0 ? Qt::Key_Up : Qt::Key_Down); });
+                TryControl(*list, [&] { QTest::keyClick(list, list->currentIndex() > 0 ? Qt::Key_Up : Qt::Key_Down); });
         auto buttons = page.findChildren<QAbstractButton*>();
         if (backwards)
             std::reverse(buttons.begin(), buttons.end());
@@ -301,6 +301,31 @@ TEST_F(CompleteSheetTest, ThePagesShowWhatIsRecorded)
     }
     QLocale::setDefault(QLocale::system());
     ExpectRecorded(shown.join('\n').toStdString() + '\n', KVR_SOURCE_DIR "/tests/corpus/pages.txt");
+}
+
+TEST_F(CompleteSheetTest, EveryFieldAndColumnSaysWhatItMeans)
+{
+    const auto means = [](const QString& tip) { // in front of the facts
+        static const QRegularExpression facts("^(Full value|Unit|Range|Default|New lines|In the file): ");
+        return !tip.isEmpty() && !tip.contains(facts) && tip.contains("\nIn the file: ");
+    };
+    const QStringList noValues = {"nodeCompatibility_1025", "setup_1341"};
+    for (const PageEntry& entry : PageTable()) {
+        Show(entry);
+        for (const QWidget* control : Controls(*view->page)) {
+            SCOPED_TRACE(
+                QString("%1 %2").arg(view->page->metaObject()->className(), control->objectName()).toStdString());
+            const auto* table = qobject_cast<const CGenGrid*>(control);
+            const bool holdsNone = control->inherits("QPushButton") || control->inherits("QToolButton") ||
+                                   noValues.contains(control->objectName());
+            EXPECT_TRUE(table || holdsNone || means(control->toolTip())) << control->toolTip().toStdString();
+            for (int column = 0; table && column < table->model()->columnCount(); ++column) {
+                const QString tip = table->model()->headerData(column, Qt::Horizontal, Qt::ToolTipRole).toString();
+                EXPECT_TRUE(table->Model()->Columns()[std::size_t(column)].Kind() == CellKind::Button || means(tip))
+                    << tip.toStdString();
+            }
+        }
+    }
 }
 
 TEST_F(CompleteSheetTest, EveryValueCanBeChangedOnSomePage)

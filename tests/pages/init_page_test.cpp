@@ -95,18 +95,18 @@ TEST_F(InitPageTest, UnitsAreLive)
     const QString before = Stored();
     auto* level = Find<CCtrlEdit>("levelOrDepth_1001");
     const auto tip = [&](int column) {
-        return grid->model()->headerData(column - 1, Qt::Horizontal, Qt::ToolTipRole).toString().section('\n', 0, 0);
+        return grid->model()->headerData(column - 1, Qt::Horizontal, Qt::ToolTipRole).toString();
     };
     EXPECT_EQ(Texts(1), "A|305|3.048|28.317");
-    EXPECT_EQ(tip(3), "Unit: m");
-    EXPECT_EQ(grid->model()->headerData(2, Qt::Horizontal, Qt::ToolTipRole).toString(),
-              "Unit: m\nNew lines: 3.048 m, the global value\nIn the file: InitialH");
+    EXPECT_EQ(tip(3), "Water level, or water depth, from which the computation starts at this\nlocation.\n"
+                      "Unit: m\nNew lines: 3.048 m, the global value\nIn the file: InitialH");
     EXPECT_EQ(Find<QLabel>("unit_1001")->text(), "m");
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     EXPECT_EQ(level->text(), "10");
-    EXPECT_EQ(level->toolTip(), "Unit: ft");
+    EXPECT_TRUE(level->toolTip().endsWith("\nUnit: ft\nDefault: 0 ft\nIn the file: G_waterlevel"))
+        << level->toolTip().toStdString();
     EXPECT_EQ(Find<QLabel>("unit_1001")->text(), "ft");
-    EXPECT_EQ(tip(3), "Unit: ft");
+    EXPECT_TRUE(tip(3).contains("\nUnit: ft\n")) << tip(3).toStdString();
     EXPECT_EQ(Texts(1), "A|1000|10.000|1000.000");
     KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
     EXPECT_EQ(Texts(1), "A|305|3.048|28.317");

@@ -120,5 +120,5 @@ TEST_F(ResistanceFormulaTest, TheToolboxLocksWhatItsMethodDoesNotUse)
     EXPECT_EQ(open(), "******");
     const QString tip = grid->model()->headerData(2, Qt::Horizontal, Qt::ToolTipRole).toString();
     EXPECT_TRUE(tip.contains("a·(V·R)^b")) << tip.toStdString();
-    EXPECT_EQ(view->page->findChild<QLabel*>("formulaLabel")->text(), tip.section('\n', 0, 0));
+    EXPECT_TRUE(view->page->findChild<QLabel*>("formulaLabel")->text().contains("a·(V·R)^b"));
 }

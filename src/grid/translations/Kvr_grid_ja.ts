@@ -783,5 +783,9 @@
         <source>Nothing was moved. %1</source>
         <translation>移動されませんでした。%1</translation>
     </message>
+    <message>
+        <source>Default: %1</source>
+        <translation>既定値: %1</translation>
+    </message>
 </context>
 </TS>

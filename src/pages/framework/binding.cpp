@@ -6,6 +6,7 @@
 #include "ks/units/edit_fields.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"
+#include "pages/framework/field_tip.h"
 #include "pages/framework/output_matrix.h"
 #include "res/strings.h"
 
@@ -51,11 +52,23 @@ void SetAccessibleName(QWidget& widget, const QString& name)
 const Field& CBindings::Declaration(const void* value) const
 {
     static constexpr Field none;
+    const DeclaredKeyword* keyword = KeywordOf(value);
+    return keyword ? *FindField(keyword->Fields(), &m_document->Parameters().Global, value) : none;
+}
+
+const DeclaredKeyword* CBindings::KeywordOf(const void* value) const
+{
     for (const DeclaredSection& section : HDGlobals().Sections())
         for (const DeclaredKeyword& keyword : section.keywords)
-            if (const Field* field = FindField(keyword.Fields(), &m_document->Parameters().Global, value))
-                return *field;
-    return none;
+            if (FindField(keyword.Fields(), &m_document->Parameters().Global, value))
+                return &keyword;
+    return nullptr;
+}
+
+QString CBindings::ToolTip(const void* value, const QString& number, const QString& unit) const
+{
+    const DeclaredKeyword* keyword = KeywordOf(value);
+    return keyword ? FieldToolTip(*keyword, Declaration(value), number, unit) : number;
 }
 
 template <typename T>
@@ -85,8 +98,10 @@ void CBindings::AddLabel(QWidget* control, const void* value, std::function<Str(
         return;
     label->setBuddy(control);
     m_beside.emplace(control, label);
-    Always([control, label, declared, title] {
+    Always([this, control, value, label, declared, title] {
         label->setText(LoadLine(title ? title() : declared.text, declared.line));
+        const auto* number = qobject_cast<CCtrlEdit*>(control);
+        label->setToolTip(ToolTip(value, {}, number ? number->UnitSymbol() : QString()));
         SetAccessibleName(*control, QString::fromStdString(PlainText(label->text().toStdString())));
     });
 }
@@ -94,6 +109,8 @@ void CBindings::AddLabel(QWidget* control, const void* value, std::function<Str(
 void CBindings::Add(QWidget* control, const void* value, std::function<void()> show)
 {
     m_controls.push_back({control, value, std::move(show)});
+    if (value && !qobject_cast<CCtrlEdit*>(control)) // which says its number and unit, too
+        Always([this, control, value] { control->setToolTip(ToolTip(value, {}, {})); });
 }
 
 void CBindings::AddTyped(QLineEdit* field, const void* value, TypedField what)
@@ -123,6 +140,8 @@ void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options
 {
     field->Setup(value, Declaration(&value), [this, &value](double number) { Store(value, number); });
     field->SetUnitText(options.unitText);
+    field->SetToolTipText(
+        [this, field, &value](const QString& number) { return ToolTip(&value, number, field->UnitSymbol()); });
     m_typed.push_back(&field->Typing());
     AddLabel(field, &value, options.title);
     const bool hasUnit = options.unitText || !field->UnitSymbol().isEmpty();
@@ -182,10 +201,10 @@ void CBindings::Add(QCheckBox* box, bool& value, std::function<void(bool checked
     Add(box, &value, [box, &value] { box->setChecked(value); });
     m_trials[box] = [&value] { value = !value; };
     if (const TextLine title = Declaration(&value).title) {
-        Always([box, title] {
+        Always([this, box, &value, title] {
             const QString text = LoadLine(title.text, title.line);
             if (auto* matrix = qobject_cast<COutputMatrix*>(box->parentWidget()))
-                matrix->SetTitle(*box, text);
+                matrix->SetTitle(*box, text, ToolTip(&value, {}, {}));
             else
                 box->setText(text);
         });

@@ -3,7 +3,7 @@
 //
 // A control says what its value is called as the value's declaration does, in the user's language: a check box by its
 // own text, any other by a label in the cell to its left. The unit of a number stands in the cell to its right. Lists
-// and radio buttons have the declared choices.
+// and radio buttons have the declared choices. Tool tips tell what the value means, its range and default.
 #pragma once
 
 #include "files/field.h"
@@ -22,6 +22,7 @@ class CCtrlEdit;
 class CDateTimeEdit;
 class CKavo0_hdDoc;
 class CKsEditLong;
+struct DeclaredKeyword;
 class QCheckBox;
 class QComboBox;
 class QLineEdit;
@@ -93,6 +94,8 @@ private:
         const void* value; // null for none
         std::function<void()> show;
     };
+    const DeclaredKeyword* KeywordOf(const void* value) const;
+    QString ToolTip(const void* value, const QString& number, const QString& unit) const;
     void Add(QWidget* control, const void* value, std::function<void()> show);
     void AddTyped(QLineEdit* field, const void* value, TypedField what);
     template <typename T>

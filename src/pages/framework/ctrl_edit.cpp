@@ -92,7 +92,8 @@ QString CCtrlEdit::FullText() const
 
 void CCtrlEdit::UpdateToolTip()
 {
-    setToolTip(NumberToolTip(m_style, *m_value, HidesDigits(), UnitSymbol()));
+    const QString number = NumberToolTip(m_style, *m_value, HidesDigits(), UnitSymbol());
+    setToolTip(m_toolTipText ? m_toolTipText(number) : number);
 }
 
 void CCtrlEdit::resizeEvent(QResizeEvent* event)

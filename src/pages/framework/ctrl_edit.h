@@ -19,6 +19,8 @@ public:
     /// The page goes; the field lets the value be.
     void Unbind() { m_value = nullptr; }
 
+    /// What the tool tip says, given the line or two about the number and its unit.
+    void SetToolTipText(std::function<QString(const QString& number)> text) { m_toolTipText = std::move(text); }
     /// Symbol of a unit that depends on a setting, instead of the unit group's.
     void SetUnitText(std::function<QString()> text) { m_unitText = std::move(text); }
     QString UnitSymbol() const { return m_unitText ? m_unitText() : m_style.UnitSymbol(); }
@@ -51,6 +53,7 @@ private:
     Bounds m_bounds;
     std::function<void(double)> m_store;
     std::function<QString()> m_unitText;
+    std::function<QString(const QString& number)> m_toolTipText;
     QString m_shown;   // the value as text
     CTyping* m_typing; // child
 };

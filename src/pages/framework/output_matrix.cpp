@@ -9,7 +9,7 @@
 
 COutputMatrix::COutputMatrix(QWidget* parent) : QWidget(parent) {}
 
-void COutputMatrix::SetTitle(QCheckBox& box, const QString& title)
+void COutputMatrix::SetTitle(QCheckBox& box, const QString& title, const QString& toolTip)
 {
     auto& cells = *static_cast<QGridLayout*>(layout());
     const auto labelAt = [&cells](int row, int column) {
@@ -26,6 +26,7 @@ void COutputMatrix::SetTitle(QCheckBox& box, const QString& title)
         cells.addWidget(label, row, 0);
     }
     label->setText(title);
+    label->setToolTip(toolTip);
     SetAccessibleName(box, title + ", " + labelAt(0, column)->text());
 }
 

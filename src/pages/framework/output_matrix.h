@@ -12,7 +12,7 @@ public:
     explicit COutputMatrix(QWidget* parent = nullptr);
 
     /// A box has no text of its own: its row is called so, and it by its row and column.
-    void SetTitle(QCheckBox& box, const QString& title);
+    void SetTitle(QCheckBox& box, const QString& title, const QString& toolTip);
 
 protected:
     void paintEvent(QPaintEvent* event) override;

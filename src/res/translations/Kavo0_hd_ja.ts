@@ -918,10 +918,6 @@ Target energy</source>
 3 岸ごと</translation>
     </message>
     <message>
-        <source>Stored as %1.</source>
-        <translation>%1 として保存されます。</translation>
-    </message>
-    <message>
         <source>Set-up %1</source>
         <translation>設定 %1</translation>
     </message>
@@ -1908,6 +1904,722 @@ Time Step</source>
     <message>
         <source>No field and no page has a name or keyword like this.</source>
         <translation>この名前またはキーワードの項目やページはありません。</translation>
+    </message>
+    <message>
+        <source>Water level, or water depth, from which the computation starts wherever no line gives another one.</source>
+        <translation>行で指定のない地点の、計算開始時の水位または水深。</translation>
+    </message>
+    <message>
+        <source>Whether the initial values are water levels above the datum or water depths above the lowest point of the cross section.</source>
+        <translation>初期値を、基準面からの水位とするか、横断面の最深点からの水深とするか。</translation>
+    </message>
+    <message>
+        <source>Discharge from which the computation starts wherever no line gives another one; positive towards increasing chainage.</source>
+        <translation>行で指定のない地点の、計算開始時の流量。追加距離が増える向きを正とする。</translation>
+    </message>
+    <message>
+        <source>Multiplies the shear stress of the wind on the water surface: 1 in open terrain, less where banks, trees or buildings shelter the river.</source>
+        <translation>水面に働く風のせん断応力に掛ける係数。開けた地形では1、堤防・樹木・建物に遮られる所では1より小さくする。</translation>
+    </message>
+    <message>
+        <source>Resistance of the bed in the chosen formula. A larger Manning&apos;s n slows the flow and raises the water level; a larger M or Chezy coefficient does the opposite.</source>
+        <translation>選択した抵抗則による河床の抵抗値。マニングのnが大きいほど流れは遅く、水位は高くなる。マニングのMとシェジー係数ではその逆になる。</translation>
+    </message>
+    <message>
+        <source>Resistance of the flood plain, which holds there instead of that of the river bed. The default -99 stands for none of its own.</source>
+        <translation>高水敷の抵抗値。高水敷では河床の抵抗値に代えて用いる。既定値の-99は、固有の値がないことを表す。</translation>
+    </message>
+    <message>
+        <source>How much of the momentum equation is solved. Fully dynamic: all terms. Diffusive: without the acceleration terms, so not for tides or fast waves. Kinematic: bed slope and friction only, so without backwater.</source>
+        <translation>運動方程式のどの項まで解くか。ダイナミックウェーブは全項を解く。拡散波近似は加速度項を省くため、潮汐や速い波には使えない。キネマティックウェーブ近似は河床勾配と摩擦だけを考え、背水を表せない。</translation>
+    </message>
+    <message>
+        <source>Whether one resistance holds in the whole cross section, or main channel, transition and flood plain have one each.</source>
+        <translation>断面全体に一つの抵抗値を用いるか、低水路・遷移部・高水敷の3区分に別々の値を用いるか。</translation>
+    </message>
+    <message>
+        <source>Resistance of the main channel, where cross sections have three zones.</source>
+        <translation>断面を3区分とする場合の、低水路の抵抗値。</translation>
+    </message>
+    <message>
+        <source>Resistance of the transition from the main channel to the flood plain, where cross sections have three zones.</source>
+        <translation>断面を3区分とする場合の、低水路から高水敷への遷移部の抵抗値。</translation>
+    </message>
+    <message>
+        <source>Resistance of the flood plain, where cross sections have three zones.</source>
+        <translation>断面を3区分とする場合の、高水敷の抵抗値。</translation>
+    </message>
+    <message>
+        <source>Time weight of the water surface slope in the momentum equation: 0.5 takes old and new time level alike, 1 the new one only. Larger values damp oscillations, and flatten fast waves.</source>
+        <translation>運動方程式の水面勾配項の時間重み。0.5では新旧の時間レベルを等しく、1では新しい時間レベルだけを用いる。大きいほど振動は抑えられるが、速い波が平滑化される。</translation>
+    </message>
+    <message>
+        <source>Difference of water level across a structure below which its discharge is taken as proportional to that difference. Larger values steady structures that are nearly drowned, and make their discharge less exact.</source>
+        <translation>構造物の上下流の水位差がこの値より小さいとき、流量を水位差に比例するものとして扱う。大きいほど、もぐり状態に近い構造物の計算は安定するが、流量の精度は下がる。</translation>
+    </message>
+    <message>
+        <source>Height of the narrow slot below the lowest point of a cross section that keeps some water when the river falls dry. Larger values are more stable and add more water that is not there.</source>
+        <translation>河道が干上がっても少量の水を残すため、横断面の最深点の下に設ける細いスリットの高さ。大きいほど安定するが、実在しない水量が増える。</translation>
+    </message>
+    <message>
+        <source>Velocity distribution coefficient: multiplies the convective acceleration in the momentum equation. 1 where the velocity is the same all over the section, more where it varies.</source>
+        <translation>流速分布係数。運動方程式の移流加速度項に掛ける。断面内の流速が一様なら1、ばらつきが大きいほど大きくする。</translation>
+    </message>
+    <message>
+        <source>Weight of the new time level in the convective acceleration of the implicit scheme: 0.5 halfway between both levels, 1 fully forward. Larger values are more stable and less accurate in time.</source>
+        <translation>陰解法の移流加速度項における、新しい時間レベルの重み。0.5は新旧の中間、1は完全な前進型。大きいほど安定するが、時間方向の精度は下がる。</translation>
+    </message>
+    <message>
+        <source>Slope of the water surface below which the diffusive wave approximation is solved fully forward in time. Larger values calm oscillations where the surface is nearly level.</source>
+        <translation>拡散波近似を時間方向に完全な前進型で解くことにする、水面勾配の限界値。大きいほど、水面がほぼ水平な所の振動が抑えられる。</translation>
+    </message>
+    <message>
+        <source>Step of water level with which the equations of a node, where branches meet, are differentiated numerically. The default hardly ever needs a change.</source>
+        <translation>河川が合流する節点の方程式を数値微分する際の、水位の刻み幅。通常は既定値のままでよい。</translation>
+    </message>
+    <message>
+        <source>Least head loss coefficient of a structure: inflow and outflow losses that sum up to less are raised to it. Larger values steady wide structures, and cost some head.</source>
+        <translation>構造物の損失係数の下限。流入と流出の損失の合計がこれより小さいときは、この値に引き上げる。大きいほど幅の広い構造物の計算は安定するが、損失水頭が増える。</translation>
+    </message>
+    <message>
+        <source>Damps the change of a structure&apos;s discharge from one iteration to the next; 0 does not damp. Larger values calm structures that oscillate, and converge more slowly.</source>
+        <translation>構造物の流量が反復ごとに変わる量を抑える係数。0では抑えない。大きいほど構造物での振動は収まるが、収束は遅くなる。</translation>
+    </message>
+    <message>
+        <source>Froude number from which on the convective acceleration is left out, which keeps the computation stable near and above critical flow. A negative value stands for the usual suppression.</source>
+        <translation>移流加速度項を完全に省くフルード数。限界流付近や射流での計算を安定させる。負の値では通常の抑制を用いる。</translation>
+    </message>
+    <message>
+        <source>How the suppression of the convective acceleration grows with the Froude number: a larger exponent leaves more of it in subcritical flow. A negative value stands for the usual suppression.</source>
+        <translation>フルード数に応じて移流加速度項の抑制が強まる度合いを表す指数。大きいほど、常流では移流加速度項が多く残る。負の値では通常の抑制を用いる。</translation>
+    </message>
+    <message>
+        <source>Iterations of the implicit solution in each time step. 1 does for most rivers; 2 or more are more exact where water levels change fast, and take longer.</source>
+        <translation>各時間ステップでの陰解法の反復回数。多くの河川では1で足りる。水位の変化が速い場合は2以上にすると精度が上がるが、計算時間も増える。</translation>
+    </message>
+    <message>
+        <source>Most iterations when the steady water surface from which the computation starts is determined.</source>
+        <translation>計算開始時の定常水面形を求める際の、最大反復回数。</translation>
+    </message>
+    <message>
+        <source>Most iterations at a structure to find the discharge that goes with the water levels on both sides.</source>
+        <translation>構造物の両側の水位に見合う流量を求める際の、最大反復回数。</translation>
+    </message>
+    <message>
+        <source>Whether the shear stress of the wind on the water surface is part of the momentum equation.</source>
+        <translation>水面に働く風のせん断応力を、運動方程式に含めるかどうか。</translation>
+    </message>
+    <message>
+        <source>Formula in which the bed resistances of all pages are given. Manning&apos;s M, which is 1/n, and the Chezy coefficient are larger for smoother beds, Manning&apos;s n for rougher ones.</source>
+        <translation>すべてのページの河床抵抗値に用いる抵抗則。マニングのM(nの逆数)とシェジー係数は河床が滑らかなほど大きく、マニングのnは粗いほど大きい。</translation>
+    </message>
+    <message>
+        <source>Share of each computed change that the quasi-steady solver applies, from 0 to 1. Smaller values converge more slowly and more surely.</source>
+        <translation>準定常計算で、求めた修正量のうち実際に適用する割合(0から1)。小さいほど収束は遅いが、確実になる。</translation>
+    </message>
+    <message>
+        <source>Smallest number that the quasi-steady solver divides by: smaller ones are raised to it, so that the convergence tests neither overflow nor underflow.</source>
+        <translation>準定常計算で除数とする値の下限。これより小さい値はこの値に引き上げ、収束判定でのオーバーフローやアンダーフローを防ぐ。</translation>
+    </message>
+    <message>
+        <source>Multiplies the stop criteria of both discharge and water level. Larger values end the iterations sooner, with a less accurate result.</source>
+        <translation>流量と水位の両方の収束判定値に掛ける係数。大きいほど反復は早く終わるが、結果の精度は下がる。</translation>
+    </message>
+    <message>
+        <source>Relative change of discharge from one iteration to the next at which discharges count as converged. Smaller values are more accurate and take longer.</source>
+        <translation>反復ごとの流量の相対変化がこの値以下になれば、流量は収束したとみなす。小さいほど精度は上がるが、計算時間も増える。</translation>
+    </message>
+    <message>
+        <source>Relative change of water level from one iteration to the next at which water levels count as converged. Smaller values are more accurate and take longer.</source>
+        <translation>反復ごとの水位の相対変化がこの値以下になれば、水位は収束したとみなす。小さいほど精度は上がるが、計算時間も増える。</translation>
+    </message>
+    <message>
+        <source>Least stop criterion for the water levels of a branch: where the relative one asks for less, this change counts as converged.</source>
+        <translation>河川内の水位の収束判定値の下限。相対的な判定値がこれより小さくなる場合は、この変化量で収束とみなす。</translation>
+    </message>
+    <message>
+        <source>Relative step of discharge with which the slope of a structure&apos;s relation between discharge and water level is determined.</source>
+        <translation>構造物の流量と水位の関係の勾配を求める際の、流量の相対的な刻み幅。</translation>
+    </message>
+    <message>
+        <source>Change of water level between two iterations of the whole network at which the backwater computation stops. Smaller values are more accurate and take longer.</source>
+        <translation>河道網全体の反復で、水位の変化がこの値以下になれば背水計算を終える。小さいほど精度は上がるが、計算時間も増える。</translation>
+    </message>
+    <message>
+        <source>Adds a loss of head where the flow contracts or expands from one cross section to the next.</source>
+        <translation>隣り合う横断面の間で流れが急縮・急拡する所に、損失水頭を加える。</translation>
+    </message>
+    <message>
+        <source>Allows a steady water surface that falls in the upstream direction. Otherwise the surface is kept from doing so.</source>
+        <translation>定常計算の水面が上流に向かって下がることを許す。許さない場合は、そうならないように抑える。</translation>
+    </message>
+    <message>
+        <source>Determines the velocity distribution coefficient of each section from the conveyance of its parts, instead of the same Alpha everywhere.</source>
+        <translation>各断面の流速分布係数を、どこでも同じAlphaではなく、断面各部の通水能から求める。</translation>
+    </message>
+    <message>
+        <source>Keeps the convective terms in full near and above critical flow, where they are reduced otherwise: more exact there, and less stable.</source>
+        <translation>限界流付近や射流で通常は弱める移流項を、そのまま残す。精度は上がるが、計算は不安定になりやすい。</translation>
+    </message>
+    <message>
+        <source>Computes the steady water surface by the energy equation, with friction over the reach lengths and losses of contraction and expansion, instead of the momentum equation.</source>
+        <translation>定常水面形を、運動方程式ではなくエネルギー式(区間長に沿う摩擦と急縮・急拡の損失を含む)で計算する。</translation>
+    </message>
+    <message>
+        <source>How the friction slope between two cross sections follows from the slopes or conveyances at both, in the energy equation.</source>
+        <translation>エネルギー式で、二つの横断面の摩擦勾配または通水能から、その間の摩擦勾配をどのように求めるか。</translation>
+    </message>
+    <message>
+        <source>Multiplies the difference of the velocity heads where the velocity increases downstream, for the loss of head. From 0.1 for gradual to 0.6 for abrupt transitions.</source>
+        <translation>下流に向かって流速が増す所で、速度水頭の差に掛けて損失水頭とする係数。緩やかな断面変化で0.1、急な変化で0.6程度。</translation>
+    </message>
+    <message>
+        <source>Multiplies the difference of the velocity heads where the velocity decreases downstream, for the loss of head. From 0.3 for gradual to 0.8 for abrupt transitions.</source>
+        <translation>下流に向かって流速が減る所で、速度水頭の差に掛けて損失水頭とする係数。緩やかな断面変化で0.3、急な変化で0.8程度。</translation>
+    </message>
+    <message>
+        <source>Strength of the momentum exchange between parts of the cross section that flow at different velocities, such as main channel, flood plain and vegetation. A larger coefficient slows the faster part more and raises the water level.</source>
+        <translation>断面内で流速の異なる部分(低水路、高水敷、樹木群など)の間の運動量交換の強さ。大きいほど速い部分の流れが抑えられ、水位が上がる。</translation>
+    </message>
+    <message>
+        <source>Name of a mark, such as a warning level. The locations have a column of levels for each.</source>
+        <translation>警戒水位などのマークの名称。地点の表には、名称ごとに水位の列がある。</translation>
+    </message>
+    <message>
+        <source>Whether levels of the mark between its locations are interpolated along the chainage.</source>
+        <translation>マークの水位を、地点の間で追加距離に沿って補間するかどうか。</translation>
+    </message>
+    <message>
+        <source>How the resistance follows the flow: not at all, by the formula a·(V·R)^b, or by a table over the velocity.</source>
+        <translation>流れに応じて抵抗値をどのように変えるか。変えない、式 a·(V·R)^b による、流速に対する表による、のいずれか。</translation>
+    </message>
+    <message>
+        <source>Whether the resistance of this zone follows the flow as set here; otherwise it stays as the page of the bed resistance gives it.</source>
+        <translation>この区分の抵抗値を、ここでの設定により流れに応じて変えるかどうか。変えない場合は、河床抵抗のページの値のままとする。</translation>
+    </message>
+    <message>
+        <source>Factor a in a·(V·R)^b, where V is the velocity in m/s and R the hydraulic radius in m.</source>
+        <translation>式 a·(V·R)^b の係数a。Vは流速(m/s)、Rは径深(m)。</translation>
+    </message>
+    <message>
+        <source>Exponent b in a·(V·R)^b: 0 makes the resistance independent of the flow.</source>
+        <translation>式 a·(V·R)^b の指数b。0では抵抗値は流れによらない。</translation>
+    </message>
+    <message>
+        <source>Least resistance that comes of a·(V·R)^b: smaller results are raised to it.</source>
+        <translation>式 a·(V·R)^b による抵抗値の下限。これより小さい値はこの値に引き上げる。</translation>
+    </message>
+    <message>
+        <source>Largest resistance that comes of a·(V·R)^b: larger results are reduced to it.</source>
+        <translation>式 a·(V·R)^b による抵抗値の上限。これより大きい値はこの値に引き下げる。</translation>
+    </message>
+    <message>
+        <source>Whether the rise of the water level at the outer bank of a bend is determined. It is in proportion to width and square of the velocity, and inverse to the radius.</source>
+        <translation>湾曲部の外岸での水位上昇を求めるかどうか。水位上昇は水面幅と流速の2乗に比例し、曲率半径に反比例する。</translation>
+    </message>
+    <message>
+        <source>Whether the simulation determines this itself. Its column is locked then.</source>
+        <translation>この値を計算の中で求めるかどうか。求める場合、その列は変更できない。</translation>
+    </message>
+    <message>
+        <source>Length of the river over which width, radius and velocity are averaged: none, a single one, or multiples of it.</source>
+        <translation>水面幅・曲率半径・流速を平均する河川の範囲。なし、単一、またはその倍数。</translation>
+    </message>
+    <message>
+        <source>Width of the water surface in the bend. The wider, the larger the rise of the water level.</source>
+        <translation>湾曲部の水面幅。広いほど水位上昇は大きい。</translation>
+    </message>
+    <message>
+        <source>Radius of curvature of the river&apos;s axis. The smaller, the larger the rise of the water level.</source>
+        <translation>河道中心線の曲率半径。小さいほど水位上昇は大きい。</translation>
+    </message>
+    <message>
+        <source>Mean velocity in the bend. The rise of the water level grows with its square.</source>
+        <translation>湾曲部の平均流速。水位上昇はその2乗に比例する。</translation>
+    </message>
+    <message>
+        <source>Whether the rise of the water level that sand bars cause is determined.</source>
+        <translation>砂州による水位上昇を求めるかどうか。</translation>
+    </message>
+    <message>
+        <source>Whether the rise is determined from slope, width and flow area, or given as it was observed. The columns of the other method are locked.</source>
+        <translation>水位上昇を河床勾配・低水路幅・流積から求めるか、実測値で与えるか。もう一方の方法の列は変更できない。</translation>
+    </message>
+    <message>
+        <source>Slope of the river bed, from which the height of the sand bars is determined.</source>
+        <translation>砂州の高さを求めるための河床勾配。</translation>
+    </message>
+    <message>
+        <source>Width of the low water channel in which the sand bars lie.</source>
+        <translation>砂州のある低水路の幅。</translation>
+    </message>
+    <message>
+        <source>Flow area of the low water channel at the largest discharge of a year.</source>
+        <translation>年最大流量時の低水路の流積。</translation>
+    </message>
+    <message>
+        <source>Rise of the water level due to sand bars, as it was observed.</source>
+        <translation>砂州による水位上昇の実測値。</translation>
+    </message>
+    <message>
+        <source>Most iterations to find the positions of the encroachment that meet the target.</source>
+        <translation>目標を満たす河積阻害の位置を求める際の、最大反復回数。</translation>
+    </message>
+    <message>
+        <source>Whether the exchange of heat with the atmosphere, by radiation and evaporation, is part of the computation of the water temperature.</source>
+        <translation>水温の計算に、放射や蒸発による大気との熱交換を含めるかどうか。</translation>
+    </message>
+    <message>
+        <source>Latitude of the river, positive in the north. With date and time it gives the height of the sun.</source>
+        <translation>河川の緯度(北緯を正)。日時とあわせて太陽高度を決める。</translation>
+    </message>
+    <message>
+        <source>Longitude of the river, positive in the west. Its distance from the meridian of the time zone shifts the noon of the sun.</source>
+        <translation>河川の経度(西経を正)。標準時子午線との差だけ太陽の南中時刻がずれる。</translation>
+    </message>
+    <message>
+        <source>Meridian of the time zone in which the times of the simulation are given, positive in the west.</source>
+        <translation>計算の時刻が従う時間帯の標準時子午線(西経を正)。</translation>
+    </message>
+    <message>
+        <source>Difference of the clock from the standard time of the time zone, as in summer time.</source>
+        <translation>夏時間など、時計の標準時からのずれ。</translation>
+    </message>
+    <message>
+        <source>How fast the light of the sun fades with the depth. The larger, as in turbid water, the nearer to the surface its heat stays.</source>
+        <translation>日射が深さとともに減衰する速さ。濁った水のように大きいほど、熱は水面近くにとどまる。</translation>
+    </message>
+    <message>
+        <source>Share of the radiation of the sun that the surface absorbs at once, from 0 to 1. The rest goes down by Beer&apos;s law.</source>
+        <translation>日射のうち水面で直ちに吸収される割合(0から1)。残りはベールの法則に従って水中に達する。</translation>
+    </message>
+    <message>
+        <source>Share a of the sun&apos;s radiation that comes through an overcast sky, in a + b·n/N, where n of N possible hours are sunny.</source>
+        <translation>曇天でも地上に達する日射の割合a。式 a + b·n/N(Nは可照時間、nは日照時間)で用いる。</translation>
+    </message>
+    <message>
+        <source>Share b of the sun&apos;s radiation that a clear sky adds, in a + b·n/N, where n of N possible hours are sunny.</source>
+        <translation>晴天で加わる日射の割合b。式 a + b·n/N(Nは可照時間、nは日照時間)で用いる。</translation>
+    </message>
+    <message>
+        <source>Part a of the evaporation that does not depend on the wind, in Dalton&apos;s law a + b·W with the wind speed W.</source>
+        <translation>蒸発のうち風によらない部分の係数a。ダルトンの法則 a + b·W(Wは風速)で用いる。</translation>
+    </message>
+    <message>
+        <source>Growth b of the evaporation with the wind, in Dalton&apos;s law a + b·W with the wind speed W.</source>
+        <translation>風速とともに増す蒸発の係数b。ダルトンの法則 a + b·W(Wは風速)で用いる。</translation>
+    </message>
+    <message>
+        <source>Layers into which the depth of stratified branches is divided. More of them show the profile in more detail and take longer.</source>
+        <translation>成層を考える河川の水深方向の層の数。多いほど鉛直分布を細かく表せるが、計算時間も増える。</translation>
+    </message>
+    <message>
+        <source>Whether the density follows temperature and salinity, so that its differences drive the flow and damp turbulence.</source>
+        <translation>密度を水温と塩分から求め、密度差による流れと乱れの抑制を考慮するかどうか。</translation>
+    </message>
+    <message>
+        <source>Eddy viscosity in the vertical: the one of the constant turbulence model, the first guess of the others.</source>
+        <translation>鉛直方向の渦動粘性係数。乱流モデルが「一定」のときの値であり、他のモデルでは初期値となる。</translation>
+    </message>
+    <message>
+        <source>How the exchange by turbulence within the water is determined, from a constant viscosity to two transport equations. The later in the list, the more detailed and the slower.</source>
+        <translation>水中の乱れによる交換をどのように求めるか。一定の粘性係数から二つの輸送方程式まで、後のものほど詳しく、計算時間も増える。</translation>
+    </message>
+    <message>
+        <source>How the friction between water and bed is determined.</source>
+        <translation>水と河床の間の摩擦をどのように求めるか。</translation>
+    </message>
+    <message>
+        <source>Whether a stable stratification reduces the exchange between layers, by the Richardson number.</source>
+        <translation>安定な成層による層間の交換の低減を、リチャードソン数により考慮するかどうか。</translation>
+    </message>
+    <message>
+        <source>Multiplies the pressure that comes of differences in density: 1 in full, 0 without it.</source>
+        <translation>密度差による圧力に掛ける係数。1ではそのまま、0では考慮しない。</translation>
+    </message>
+    <message>
+        <source>Multiplies the part of that pressure that comes of the local slope of the bed: 1 in full, 0 without it.</source>
+        <translation>密度差による圧力のうち、局所河床勾配による部分に掛ける係数。1ではそのまま、0では考慮しない。</translation>
+    </message>
+    <message>
+        <source>Multiplies the horizontal transport of momentum: 1 in full, 0 without it.</source>
+        <translation>運動量の水平輸送に掛ける係数。1ではそのまま、0では考慮しない。</translation>
+    </message>
+    <message>
+        <source>Multiplies the vertical transport of momentum between the layers: 1 in full, 0 without it.</source>
+        <translation>層間の運動量の鉛直輸送に掛ける係数。1ではそのまま、0では考慮しない。</translation>
+    </message>
+    <message>
+        <source>Multiplies the advection of temperature and salinity between the layers: 1 in full, 0 without it.</source>
+        <translation>層間の水温と塩分の移流に掛ける係数。1ではそのまま、0では考慮しない。</translation>
+    </message>
+    <message>
+        <source>Multiplies the horizontal eddy viscosity: 1 in full, less for sharper fronts.</source>
+        <translation>水平方向の渦動粘性に掛ける係数。1ではそのまま、小さいほど前線が鋭くなる。</translation>
+    </message>
+    <message>
+        <source>Multiplies the vertical eddy viscosity: 1 in full, less for a sharper stratification.</source>
+        <translation>鉛直方向の渦動粘性に掛ける係数。1ではそのまま、小さいほど成層が鋭くなる。</translation>
+    </message>
+    <message>
+        <source>Friction between the two layers at their interface. The larger, the more one layer drags the other along.</source>
+        <translation>二層の界面での摩擦の係数。大きいほど、一方の層が他方の層を引きずる。</translation>
+    </message>
+    <message>
+        <source>Largest volume that one layer takes from the other at a point in a time step. Smaller values are more stable.</source>
+        <translation>一つの地点で1時間ステップの間に、一方の層が他方の層から取り込む水量の上限。小さいほど安定する。</translation>
+    </message>
+    <message>
+        <source>Largest velocity of entrainment, at which water passes through the interface.</source>
+        <translation>水が界面を通過する連行速度の上限。</translation>
+    </message>
+    <message>
+        <source>Thickness of a layer below which nothing is entrained from it any more, so that it does not vanish.</source>
+        <translation>層がこの厚さより薄くなると、消失しないように、その層からの連行を打ち切る。</translation>
+    </message>
+    <message>
+        <source>Least difference of density between the layers, relative to the density, that the computation takes into account: smaller ones are raised to it.</source>
+        <translation>計算で考える層間の相対密度差の下限。これより小さい密度差はこの値に引き上げる。</translation>
+    </message>
+    <message>
+        <source>What is done where a layer is used up and the interface reaches the surface or the bed.</source>
+        <translation>一方の層がなくなり、界面が水面または河床に達したときの処理。</translation>
+    </message>
+    <message>
+        <source>Richardson bulk flux number of the entrainment from the lower layer into the upper one. The larger, the more the layers mix.</source>
+        <translation>下層から上層への連行のバルクフラックス・リチャードソン数。大きいほど二層は混合する。</translation>
+    </message>
+    <message>
+        <source>Richardson bulk flux number of the entrainment from the upper layer into the lower one. The larger, the more the layers mix.</source>
+        <translation>上層から下層への連行のバルクフラックス・リチャードソン数。大きいほど二層は混合する。</translation>
+    </message>
+    <message>
+        <source>Richardson bulk flux number of the upward entrainment at hydraulic controls, such as sills and narrows, where mixing is stronger.</source>
+        <translation>混合が強まる潜堤や狭窄部などの支配断面での、上向きの連行のバルクフラックス・リチャードソン数。</translation>
+    </message>
+    <message>
+        <source>Water level, the surface of the upper layer, from which the computation starts.</source>
+        <translation>計算開始時の水位(上層の水面)。</translation>
+    </message>
+    <message>
+        <source>Level of the interface between the layers from which the computation starts. It lies between bed and water level.</source>
+        <translation>計算開始時の二層の界面の標高。河床と水位の間にある。</translation>
+    </message>
+    <message>
+        <source>Discharge of the upper layer from which the computation starts; positive towards increasing chainage.</source>
+        <translation>計算開始時の上層の流量。追加距離が増える向きを正とする。</translation>
+    </message>
+    <message>
+        <source>Discharge of the lower layer from which the computation starts; positive towards increasing chainage.</source>
+        <translation>計算開始時の下層の流量。追加距離が増える向きを正とする。</translation>
+    </message>
+    <message>
+        <source>Friction between wind and water. The shear stress on the surface grows with it and with the square of the wind speed.</source>
+        <translation>風と水面の間の摩擦係数。水面のせん断応力は、この係数と風速の2乗に比例する。</translation>
+    </message>
+    <message>
+        <source>Whether the simulation also writes the items below, at the grid points below, into the files below.</source>
+        <translation>計算の際に、下の項目を、下の格子点について、下のファイルにも書き出すかどうか。</translation>
+    </message>
+    <message>
+        <source>Text between two columns of a text file, such as a semicolon.</source>
+        <translation>テキストファイルの列の間に置く文字(セミコロンなど)。</translation>
+    </message>
+    <message>
+        <source>Characters that a column of a text file takes.</source>
+        <translation>テキストファイルの1列の文字数。</translation>
+    </message>
+    <message>
+        <source>Of which grid points series are written: of all, of those in the list, or of the others.</source>
+        <translation>時系列を書き出す格子点。すべて、一覧にあるもののみ、または一覧にないもの。</translation>
+    </message>
+    <message>
+        <source>Whether series are written of a part of the simulated time only.</source>
+        <translation>計算期間の一部だけの時系列を書き出すかどうか。</translation>
+    </message>
+    <message>
+        <source>First time that is written.</source>
+        <translation>書き出す最初の時刻。</translation>
+    </message>
+    <message>
+        <source>Last time that is written.</source>
+        <translation>書き出す最後の時刻。</translation>
+    </message>
+    <message>
+        <source>Adds the smallest value of each series to the text files.</source>
+        <translation>各時系列の最小値をテキストファイルに加える。</translation>
+    </message>
+    <message>
+        <source>Adds the largest value of each series to the text files.</source>
+        <translation>各時系列の最大値をテキストファイルに加える。</translation>
+    </message>
+    <message>
+        <source>Adds the time of the smallest value of each series to the text files.</source>
+        <translation>各時系列の最小値の時刻をテキストファイルに加える。</translation>
+    </message>
+    <message>
+        <source>Adds the time of the largest value of each series to the text files.</source>
+        <translation>各時系列の最大値の時刻をテキストファイルに加える。</translation>
+    </message>
+    <message>
+        <source>Result that is written.</source>
+        <translation>書き出す計算結果。</translation>
+    </message>
+    <message>
+        <source>Name of the result in the files, instead of the default one.</source>
+        <translation>既定の名称に代えてファイルに書く、計算結果の名称。</translation>
+    </message>
+    <message>
+        <source>Decimals with which the numbers are written.</source>
+        <translation>数値を書き出す小数桁数。</translation>
+    </message>
+    <message>
+        <source>Format of the file.</source>
+        <translation>ファイルの形式。</translation>
+    </message>
+    <message>
+        <source>Whether the simulation names the file after its result file; the file name beside it then counts for nothing.</source>
+        <translation>ファイル名を計算結果のファイルに合わせて自動的に付けるかどうか。付ける場合、隣のファイル名は使われない。</translation>
+    </message>
+    <message>
+        <source>File that the simulation writes.</source>
+        <translation>計算時に書き出すファイル。</translation>
+    </message>
+    <message>
+        <source>Whether the simulation also writes maps of its results.</source>
+        <translation>計算の際に、結果のマップも書き出すかどうか。</translation>
+    </message>
+    <message>
+        <source>Whether the ground between the cross sections of the river is taken from the elevation data too, instead of interpolating it between them.</source>
+        <translation>河川の横断面の間の地盤高も、断面からの補間ではなく標高データから取るかどうか。</translation>
+    </message>
+    <message>
+        <source>Whether ground elevations come from the elevation data below; water depths are water levels above them.</source>
+        <translation>地盤高を下の標高データから取るかどうか。水深は水位と地盤高の差となる。</translation>
+    </message>
+    <message>
+        <source>Whether areas beside the cross sections that the help grid assigns to the river are mapped too.</source>
+        <translation>補助グリッドで河川に割り当てられた、横断面の外側の区域も表示するかどうか。</translation>
+    </message>
+    <message>
+        <source>File of the help grid, which assigns areas beside the cross sections to places of the river.</source>
+        <translation>横断面の外側の区域を河川の地点に割り当てる、補助グリッドのファイル。</translation>
+    </message>
+    <message>
+        <source>x coordinate of the map&apos;s origin, its lower left corner.</source>
+        <translation>マップの原点(左下隅)のx座標。</translation>
+    </message>
+    <message>
+        <source>y coordinate of the map&apos;s origin, its lower left corner.</source>
+        <translation>マップの原点(左下隅)のy座標。</translation>
+    </message>
+    <message>
+        <source>Angle by which the map&apos;s grid is turned against north.</source>
+        <translation>マップの格子が北に対して回転している角度。</translation>
+    </message>
+    <message>
+        <source>Length of the sides of a cell. Smaller cells show more detail and make larger files.</source>
+        <translation>格子の一辺の長さ。小さいほど詳しくなるが、ファイルも大きくなる。</translation>
+    </message>
+    <message>
+        <source>Number of cells in the direction of the x axis.</source>
+        <translation>x軸方向の格子の数。</translation>
+    </message>
+    <message>
+        <source>Number of cells in the direction of the y axis.</source>
+        <translation>y軸方向の格子の数。</translation>
+    </message>
+    <message>
+        <source>File that the simulation writes the map to.</source>
+        <translation>計算時にマップを書き出すファイル。</translation>
+    </message>
+    <message>
+        <source>Whether the map shows the largest or the smallest value of the period, or each stored time (dynamic).</source>
+        <translation>期間中の最大値、最小値、または保存した各時刻(時系列)のどれを表すか。</translation>
+    </message>
+    <message>
+        <source>Every how many time steps a dynamic map is stored.</source>
+        <translation>時系列のマップを何時間ステップごとに保存するか。</translation>
+    </message>
+    <message>
+        <source>Result that the map shows.</source>
+        <translation>マップに表す計算結果。</translation>
+    </message>
+    <message>
+        <source>Number of the component, where the map shows one of advection and dispersion.</source>
+        <translation>移流拡散成分を表すマップの、成分の番号。</translation>
+    </message>
+    <message>
+        <source>Whether the map is of the whole simulated time; start and end then count for nothing.</source>
+        <translation>計算期間の全体を対象とするかどうか。その場合、開始時刻と終了時刻は使われない。</translation>
+    </message>
+    <message>
+        <source>First time that the map takes into account.</source>
+        <translation>マップの対象とする最初の時刻。</translation>
+    </message>
+    <message>
+        <source>Last time that the map takes into account.</source>
+        <translation>マップの対象とする最後の時刻。</translation>
+    </message>
+    <message>
+        <source>File of ground elevations.</source>
+        <translation>地盤高のファイル。</translation>
+    </message>
+    <message>
+        <source>Number of the item in the file that holds the elevations.</source>
+        <translation>ファイル内で標高を持つ項目の番号。</translation>
+    </message>
+    <message>
+        <source>Priority where the files overlap.</source>
+        <translation>ファイルが重なる所での優先順位。</translation>
+    </message>
+    <message>
+        <source>Whether water passes between river and groundwater through the bed.</source>
+        <translation>河床を通した河川と地下水の間の水の出入りを考慮するかどうか。</translation>
+    </message>
+    <message>
+        <source>Leakage through the wetted bed for each unit of its area and of the difference between river level and groundwater head. The larger, the more water passes; 0 for a tight bed.</source>
+        <translation>河床の潤面積と、河川水位と地下水頭の差の、それぞれ単位あたりの漏水量。大きいほど多くの水が出入りし、0は水を通さない河床を表す。</translation>
+    </message>
+    <message>
+        <source>Branch of the river network on which the location lies.</source>
+        <translation>地点のある河川(河道網の河川名)。</translation>
+    </message>
+    <message>
+        <source>Distance of the location along its branch.</source>
+        <translation>河川に沿った地点までの距離。</translation>
+    </message>
+    <message>
+        <source>Water level, or water depth, from which the computation starts at this location.</source>
+        <translation>この地点の、計算開始時の水位または水深。</translation>
+    </message>
+    <message>
+        <source>Discharge from which the computation starts at this location; positive towards increasing chainage.</source>
+        <translation>この地点の、計算開始時の流量。追加距離が増える向きを正とする。</translation>
+    </message>
+    <message>
+        <source>Chainage at which the reach of this line ends.</source>
+        <translation>この行の区間が終わる追加距離。</translation>
+    </message>
+    <message>
+        <source>One of the four coefficients of the water that the river loses at this location; 0 for no loss.</source>
+        <translation>この地点で河川から失われる水量の、四つの係数の一つ。0は損失がないことを表す。</translation>
+    </message>
+    <message>
+        <source>Width of a part of the cross section relative to its depth, to which the coefficient belongs.</source>
+        <translation>係数が対応する、断面の一部分の幅と水深の比。</translation>
+    </message>
+    <message>
+        <source>Level of this mark at the location; empty where there is none.</source>
+        <translation>この地点のマークの水位。ない場合は空欄。</translation>
+    </message>
+    <message>
+        <source>Mean velocity of the flow to which the resistance belongs.</source>
+        <translation>抵抗値が対応する平均流速。</translation>
+    </message>
+    <message>
+        <source>Resistance at that velocity, in the chosen formula.</source>
+        <translation>その流速での、選択した抵抗則による抵抗値。</translation>
+    </message>
+    <message>
+        <source>What is given for the encroachment: positions, a width, a reduction of conveyance, or a target that the computation meets.</source>
+        <translation>河積阻害を何で与えるか。位置、幅、通水能の低減、または計算で満たすべき目標。</translation>
+    </message>
+    <message>
+        <source>Banks from which the flow area is narrowed.</source>
+        <translation>流積を狭める岸。</translation>
+    </message>
+    <message>
+        <source>Least distance that stays free between the left bank of the main channel and the encroachment.</source>
+        <translation>低水路の左岸と河積阻害の間に必ず残す距離。</translation>
+    </message>
+    <message>
+        <source>Least distance that stays free between the right bank of the main channel and the encroachment.</source>
+        <translation>低水路の右岸と河積阻害の間に必ず残す距離。</translation>
+    </message>
+    <message>
+        <source>Place in the cross section up to which the left side is blocked, with fixed positions.</source>
+        <translation>位置を固定する方法で、左側を塞ぐ範囲の端の、横断面内の位置。</translation>
+    </message>
+    <message>
+        <source>Place in the cross section from which on the right side is blocked, with fixed positions.</source>
+        <translation>位置を固定する方法で、右側を塞ぐ範囲の端の、横断面内の位置。</translation>
+    </message>
+    <message>
+        <source>Width that stays free between both encroachments, with a fixed width.</source>
+        <translation>幅を固定する方法で、両側の河積阻害の間に残す幅。</translation>
+    </message>
+    <message>
+        <source>How the reduction of conveyance is shared by the banks.</source>
+        <translation>通水能の低減を両岸にどのように分けるか。</translation>
+    </message>
+    <message>
+        <source>Share of the conveyance of the section that the encroachment takes away.</source>
+        <translation>河積阻害により失われる、断面の通水能の割合。</translation>
+    </message>
+    <message>
+        <source>Share of the conveyance that is taken away at the left bank.</source>
+        <translation>左岸側で失われる通水能の割合。</translation>
+    </message>
+    <message>
+        <source>Share of the conveyance that is taken away at the right bank.</source>
+        <translation>右岸側で失われる通水能の割合。</translation>
+    </message>
+    <message>
+        <source>Water level to which the encroachment is fitted, with the methods that have a target.</source>
+        <translation>目標を定める方法で、河積阻害を合わせる水位。</translation>
+    </message>
+    <message>
+        <source>Energy level to which the encroachment is fitted, with the method that has one as its target.</source>
+        <translation>目標を定める方法で、河積阻害を合わせるエネルギー高。</translation>
+    </message>
+    <message>
+        <source>Length of the flow&apos;s way over the left flood plain, to the next cross section.</source>
+        <translation>次の横断面までの、左岸側高水敷上の流れの長さ。</translation>
+    </message>
+    <message>
+        <source>Length of the flow&apos;s way over the right flood plain, to the next cross section.</source>
+        <translation>次の横断面までの、右岸側高水敷上の流れの長さ。</translation>
+    </message>
+    <message>
+        <source>Writes the mean velocity of the flow.
+Writes the discharge also where the computation determines water levels.
+Writes the area of the cross section that water fills.
+Writes the width of the water surface.
+Writes the hydraulic radius, or the resistance radius where sections use it.
+Writes the resistance with which the computation went on, as it changes with the flow.
+Writes the conveyance: the discharge divided by the root of the friction slope.
+Writes the Froude number: below 1 in subcritical flow, above in supercritical flow.
+Writes the volume of the water, around each point or in all of the network.
+Writes the area of the water surface, around each point or in all of the network.
+Writes the volume of water that a time step creates or loses by numerical errors.
+Writes the sum of all mass errors since the start.
+Writes the inflow from the sides.
+Writes the slope of the water surface.
+Writes the slope of the energy level, that is of friction and other losses.
+Writes the energy level: water level and velocity head together.
+Writes the shear stress of the flow on the bed.
+Writes the groundwater head beside the river, where leakage is included.
+Writes the length of the time steps, where the computation chooses it.</source>
+        <translation>平均流速を出力する。
+水位を計算する点でも流量を出力する。
+流水断面積を出力する。
+水面幅を出力する。
+径深(断面によっては抵抗半径)を出力する。
+計算に用いた、流れに応じて変わる抵抗値を出力する。
+通水能(流量を摩擦勾配の平方根で割った値)を出力する。
+フルード数を出力する。1より小さければ常流、大きければ射流。
+各点の受け持つ範囲、または河道網全体の貯水量を出力する。
+各点の受け持つ範囲、または河道網全体の氾濫面積を出力する。
+数値誤差により1時間ステップで増減する水量を出力する。
+計算開始からの質量誤差の合計を出力する。
+横からの流入量を出力する。
+水面の勾配を出力する。
+エネルギー水位の勾配、すなわち摩擦などの損失の勾配を出力する。
+エネルギー水位(水位と速度水頭の和)を出力する。
+流れが河床に及ぼすせん断応力を出力する。
+漏水を考慮する場合に、河川沿いの地下水頭を出力する。
+計算が自動的に決める場合の、計算時間間隔を出力する。</translation>
     </message>
 </context>
 </TS>
