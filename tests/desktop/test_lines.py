@@ -63,14 +63,6 @@ class InsertedAndMoved(Case):
     def wait_for_places(self, *places):
         wait_for(lambda: self.places() == list(places), f'{places} are shown, not {self.places()}', 5)
 
-    def choose(self, entry):
-        """In the context menu that is up."""
-        popup = wait_for(lambda: next((w for w in self.editor.root.all('popup menu') if w.shown), None), 'a menu is up')
-        item = next(w for w in popup.children() if w.name.split('\t')[0].startswith(entry))
-        self.assertTrue(item.shown)
-        self.editor.hands.click(*item.middle)
-        self.editor.settle()
-
     def test_lines_are_moved_and_duplicated_by_keys(self):
         editor = self.open(samples.hd_text({'InitList': LINES}))
         editor.click_cell(3, 1)
@@ -87,26 +79,40 @@ class InsertedAndMoved(Case):
         editor.save()
         self.assertEqual(self.saved().records('InitList'), LINES)
 
-    def test_menus_of_line_numbers_and_cells_say_what_they_do(self):
+    def test_the_menu_of_line_numbers_is_about_the_lines_selected_or_the_one_below_it(self):
         editor = self.open(samples.hd_text({'InitList': LINES}))
         editor.click_line(2)
         editor.click_line(3, held='shift')
         editor.click_line(3, button=3)
-        self.choose('Delete 2 Lines')
+        editor.press('d')  # Delete 2 Lines
         self.wait_for_places('RHINE 300', 'ELBE 50')
         editor.press('ctrl+z')
+        self.wait_for_places('RHINE 300', 'ELBE 100', 'RHINE 100', 'ELBE 50')
+        editor.click_line(2)
         editor.click_line(4, button=3)  # one that is not selected
-        self.choose('Cut')
+        editor.press('d')
         self.wait_for_places('RHINE 300', 'ELBE 100', 'RHINE 100')
-        editor.press('ctrl+z')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), LINES[:3])
+
+    def test_cells_are_cut_and_cleared_and_delete_says_that_it_takes_lines(self):
+        editor = self.open(samples.hd_text({'InitList': LINES}))
         editor.click_cell(1, 3)
         editor.press('shift+Down', 'Delete')
         wait_for(lambda: 'Ctrl+Backspace' in editor.status(), 'Delete says that it takes lines', 3)
-        editor.press('shift+F10')
-        self.choose('Clear 2 Cells')
+        editor.press('ctrl+BackSpace')
         wait_for(lambda: '2 cells cleared' in editor.status(), 'what was done is said', 3)
+        editor.click_cell(3, 4)
+        editor.menu('Edit', 'Cut')
+        editor.click_cell(4, 4)
+        editor.press('ctrl+v')
+        editor.click_cell(1, 1)
+        for lines, key in enumerate(('shift+F10', 'Menu'), 5):
+            editor.press(key, 'Down', 'Return')  # the first entry: Insert line
+            wait_for(lambda: editor.table().lines == lines, f'{key} opens the menu of the cell', 3)
         editor.save()
-        self.assertEqual(self.saved().records('InitList')[:2], ['"RHINE", 300, 3.5, 10', '"ELBE", 100, 3.5, 11'])
+        self.assertEqual(self.saved().records('InitList')[:4],
+                         ['"RHINE", 300, 3.5, 10', '"ELBE", 100, 3.5, 11', '"RHINE", 100, 2, 12', '"ELBE", 50, 5, 12'])
 
     def test_lines_at_the_cross_sections_of_a_branch(self):
         editor = self.open_project()

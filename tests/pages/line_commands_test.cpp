@@ -37,7 +37,8 @@ protected:
         QStringList names;
         for (int row = 1; row <= grid->RowCount(); ++row) {
             const QString name = grid->TextAt(row, 1).isEmpty() ? QString("-") : grid->TextAt(row, 1);
-            const bool isSelected = grid->selectionModel()->isSelected(grid->model()->index(row - 1, grid->CurrentColumn() - 1));
+            const bool isSelected =
+                grid->selectionModel()->isSelected(grid->model()->index(row - 1, grid->CurrentColumn() - 1));
             names << (isSelected ? '(' + name + ')' : name);
         }
         return names.join(' ');
