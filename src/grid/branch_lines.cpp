@@ -47,38 +47,32 @@ std::optional<std::vector<double>> ChainagesEvery(const ColumnSpec& column, doub
     return chainages;
 }
 
-PlacesOfBranch WithoutKnownPlaces(const CTableRows& rows, PlacesOfBranch places)
-{
-    std::vector<double> known;
-    ForLines(rows, [&](std::size_t, const QString& branch, const double* chainage) {
-        if (chainage && branch == places.branch)
-            known.push_back(*chainage);
-    });
-    std::ranges::sort(known);
-    std::ranges::sort(places.chainages);
-    const auto isSame = [](double a, double b) { return std::abs(a - b) < SamePlace; };
-    const auto twins = std::ranges::unique(places.chainages, isSame);
-    places.chainages.erase(twins.begin(), twins.end());
-    std::erase_if(places.chainages, [&](double chainage) {
-        const auto next = std::ranges::lower_bound(known, chainage - SamePlace);
-        return next != known.end() && isSame(*next, chainage);
-    });
-    return places;
-}
-
 BranchInTable FindBranch(const CTableRows& rows, const QString& branch)
 {
+    const QString key = KsBranchKey(branch);
     BranchInTable found{.behind = rows.Rows()->Count()};
     ForLines(rows, [&](std::size_t row, const QString& name, const double* chainage) {
-        if (name != branch)
+        if (name != key)
             return;
         found.behind = row + 1;
-        if (!chainage)
-            return;
-        found.from = std::min(found.from.value_or(*chainage), *chainage);
-        found.to = std::max(found.to.value_or(*chainage), *chainage);
+        if (chainage)
+            found.chainages.push_back(*chainage);
     });
+    std::ranges::sort(found.chainages);
     return found;
+}
+
+std::vector<double> WithoutKnown(std::vector<double> chainages, const BranchInTable& known)
+{
+    const auto isSame = [](double a, double b) { return std::abs(a - b) < SamePlace; };
+    std::ranges::sort(chainages);
+    const auto twins = std::ranges::unique(chainages, isSame);
+    chainages.erase(twins.begin(), twins.end());
+    std::erase_if(chainages, [&](double chainage) {
+        const auto next = std::ranges::lower_bound(known.chainages, chainage - SamePlace);
+        return next != known.chainages.end() && isSame(*next, chainage);
+    });
+    return chainages;
 }
 
 QStringList BranchesIn(const CTableRows& rows)

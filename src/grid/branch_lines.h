@@ -19,17 +19,16 @@ inline constexpr std::size_t MostLinesAtOnce = 1'000'000;
 /// there would be more than MostLinesAtOnce.
 std::optional<std::vector<double>> ChainagesEvery(const ColumnSpec& column, double from, double to, double step);
 
-/// The places of the branch that no line of the table has, hidden lines included. The first two columns are branch name
-/// and chainage.
-PlacesOfBranch WithoutKnownPlaces(const CTableRows& rows, PlacesOfBranch places);
-
-/// What is known of the branch's lines in the table.
+/// What is known of the branch's lines in the table, hidden ones included. The first two columns are branch name and
+/// chainage.
 struct BranchInTable
 {
-    std::optional<double> from{}, to{};
-    std::size_t behind = 0; // the row of the source behind its last line; that behind all lines without one
+    std::vector<double> chainages{}; // in their order
+    std::size_t behind = 0;          // the row of the source behind its last line; that behind all lines without one
 };
 BranchInTable FindBranch(const CTableRows& rows, const QString& branch);
+/// In their order, each once, without those where a line is known.
+std::vector<double> WithoutKnown(std::vector<double> chainages, const BranchInTable& known);
 /// Every branch that a line names, in capitals, in the order of the file.
 QStringList BranchesIn(const CTableRows& rows);
 

@@ -38,8 +38,7 @@ CBranchLinesDlg::CBranchLinesDlg(CGenGrid& grid)
     branches.removeDuplicates();
     m_branch->addItems(branches);
     const int row = grid.CurrentRow() - 1;
-    const QString current =
-        row >= m_rows.FixedRows() ? EditText(m_rows.Column(0), m_rows.Value(row, 0)) : QString();
+    const QString current = row >= m_rows.FixedRows() ? EditText(m_rows.Column(0), m_rows.Value(row, 0)) : QString();
     m_branch->setEditText(current.isEmpty() ? branches.value(0) : current);
     const double step = m_rows.Column(ChainageColumn).style.UnitConvertFromBase(UsualStep, 0);
     m_step->setText(TextOf(step));
@@ -101,16 +100,15 @@ void CBranchLinesDlg::BranchChanged()
         if (KsSameBranch(name, branch))
             m_ofBranch.push_back(chainage);
     std::ranges::sort(m_ofBranch);
-    const BranchInTable known = branch.isEmpty() ? BranchInTable() : FindBranch(m_rows, branch);
-    const auto show = [this](QLineEdit& field, const std::optional<double>& chainage) {
-        field.setText(chainage ? TextOf(*chainage) : QString());
-    };
-    show(*m_from, m_ofBranch.empty() ? known.from : m_ofBranch.front());
-    show(*m_to, m_ofBranch.empty() ? known.to : m_ofBranch.back());
+    m_inTable = branch.isEmpty() ? BranchInTable() : FindBranch(m_rows, branch);
+    const auto& reach = m_ofBranch.empty() ? m_inTable.chainages : m_ofBranch;
+    m_from->setText(reach.empty() ? QString() : TextOf(reach.front()));
+    m_to->setText(reach.empty() ? QString() : TextOf(reach.back()));
     m_atSections->setEnabled(!m_ofBranch.empty());
     m_noSections->setVisible(m_ofBranch.empty());
-    m_noSections->setText(m_sections.empty() ? GridTexts::tr("No cross sections are known: none are open in the project.")
-                                             : GridTexts::tr("No cross sections of this branch are known."));
+    m_noSections->setText(m_sections.empty()
+                              ? GridTexts::tr("No cross sections are known: none are open in the project.")
+                              : GridTexts::tr("No cross sections of this branch are known."));
     if (m_ofBranch.empty())
         m_every->setChecked(true);
     Show();
@@ -130,7 +128,10 @@ std::optional<double> CBranchLinesDlg::Number(const QLineEdit& field) const
 
 QString CBranchLinesDlg::Read(PlacesOfBranch& asked) const
 {
-    asked.branch = KsBranchKey(m_branch->currentText());
+    const CellReading branch = ReadCell(m_rows.Column(0), m_branch->currentText());
+    if (!branch.refusal.isEmpty())
+        return branch.refusal;
+    asked.branch = QString::fromStdString(std::get<std::string>(branch.value));
     if (asked.branch.isEmpty())
         return GridTexts::tr("Which branch?");
     const auto from = Number(*m_from), to = Number(*m_to);
@@ -159,7 +160,8 @@ void CBranchLinesDlg::Show()
     PlacesOfBranch asked;
     QString text = Read(asked);
     const std::size_t count = asked.chainages.size();
-    m_places = text.isEmpty() ? WithoutKnownPlaces(m_rows, std::move(asked)) : PlacesOfBranch();
+    m_places = {asked.branch,
+                text.isEmpty() ? WithoutKnown(std::move(asked.chainages), m_inTable) : std::vector<double>()};
     const auto& chainages = m_places.chainages;
     m_known = text.isEmpty() ? count - chainages.size() : 0;
     if (!chainages.empty()) {

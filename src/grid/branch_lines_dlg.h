@@ -36,6 +36,7 @@ private:
     const CTableRows& m_rows;
     std::vector<std::pair<QString, double>> m_sections; // of the project
     std::vector<double> m_ofBranch;                     // those of the branch that is named
+    BranchInTable m_inTable;                            // likewise
     PlacesOfBranch m_places;
     std::size_t m_known = 0;
     QComboBox* m_branch;

@@ -50,7 +50,7 @@ void Cut(CGenGrid& grid, const CellBlock& block)
 {
     const bool areLines = grid.Selection().AreLines();
     CopyCells(grid);
-    if (areLines && grid.HasLinesToDelete())
+    if (areLines && grid.HasLinesToDelete() && grid.Host())
         grid.Host()->Run(grid, GridAction::DeleteLine);
     else
         Make(grid, Clear(*grid.Model(), block), NameOf(GridAction::Cut),

@@ -11,6 +11,8 @@
 #include "grid/lines_view.h"
 #include "ks/fc/doc.h"
 
+#include <QApplication>
+#include <QContextMenuEvent>
 #include <QKeyEvent>
 
 CGridInput::CGridInput(CGenGrid& grid) : QObject(&grid), m_grid(grid)
@@ -51,6 +53,11 @@ void CGridInput::Run(GridAction action)
     case GridAction::Paste:
         PasteCells(m_grid);
         return;
+    case GridAction::OpenMenu: {
+        QContextMenuEvent event(QContextMenuEvent::Keyboard, QPoint(), QPoint());
+        QApplication::sendEvent(m_grid.viewport(), &event);
+        return;
+    }
     case GridAction::SelectLine:
         return m_grid.SelectLines(m_grid.CurrentRow(), m_grid.CurrentRow());
     default:

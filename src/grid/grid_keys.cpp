@@ -39,6 +39,7 @@ constexpr GridKey Keys[] = {
     {Qt::Key_X, Ctrl, All, GridAction::Cut, false},
     {Qt::Key_Backspace, Ctrl, All, GridAction::Clear, false},
     {Qt::Key_Space, Shift, All, GridAction::SelectLine, false},
+    {Qt::Key_F10, Shift, All, GridAction::OpenMenu, false}, // the menu key asks by itself
     {Qt::Key_F3, None, None, GridAction::SearchAgain, true},
     {Qt::Key_F7, None, None, GridAction::Search, true},
     {Qt::Key_D, Ctrl, All, GridAction::FillDown, false},
@@ -106,6 +107,7 @@ constexpr ActionTexts Texts[] = {
     {QT_TRANSLATE_NOOP("GridTexts", "Show Ever&y Line")},
     {QT_TRANSLATE_NOOP("GridTexts", "Sort and Filter Afres&h")},
     {QT_TRANSLATE_NOOP("GridTexts", "Fit the Width")},
+    {QT_TRANSLATE_NOOP("GridTexts", "Menu of the cell")},
 };
 static_assert(std::size(Texts) == std::size_t(GridAction::None));
 

@@ -43,6 +43,7 @@ enum class GridAction
     ShowAllLines,
     ShowAfresh,
     FitColumn,
+    OpenMenu,
     None
 };
 

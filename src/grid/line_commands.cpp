@@ -55,9 +55,10 @@ void Move(CGenGrid& grid, bool up)
 {
     CGridModel& model = *grid.Model();
     if (model.Shown().IsSorted())
-        return model.Document()->Say(GridTexts::tr("Lines are moved in the order of the file. These are sorted: Lines > "
-                                                   "%1 shows them as they stand in the file.")
-                                         .arg(NameOf(GridAction::FileOrder)));
+        return model.Document()->Say(
+            GridTexts::tr("Lines are moved in the order of the file. These are sorted: Lines > "
+                          "%1 shows them as they stand in the file.")
+                .arg(NameOf(GridAction::FileOrder)));
     const LineRange lines = LinesOf(grid);
     const CGridSelection::Shape shape = grid.Selection().ShapeNow();
     if (const QString fault = model.MoveRows(lines.first, lines.Count(), up); !fault.isEmpty())

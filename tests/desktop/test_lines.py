@@ -52,3 +52,79 @@ class SortedAndFiltered(Case):
         self.wait_for_lines(editor, 'RHINE 300', 'ELBE 100', 'RHINE 100', 'ELBE 50')
         editor.save()
         self.assertEqual(self.saved().records('InitList'), LINES)
+
+
+class InsertedAndMoved(Case):
+    """The lines themselves, by keys and by the menus that a right click opens."""
+
+    def places(self):
+        return [' '.join(self.editor.table().line(line)[:2]) for line in range(1, self.editor.table().lines + 1)]
+
+    def wait_for_places(self, *places):
+        wait_for(lambda: self.places() == list(places), f'{places} are shown, not {self.places()}', 5)
+
+    def test_lines_are_moved_and_duplicated_by_keys(self):
+        editor = self.open(samples.hd_text({'InitList': LINES}))
+        editor.click_cell(3, 1)
+        editor.press('ctrl+shift+Up', 'ctrl+shift+Up')
+        self.wait_for_places('RHINE 100', 'RHINE 300', 'ELBE 100', 'ELBE 50')
+        editor.press('ctrl+u')
+        self.wait_for_places('RHINE 100', 'RHINE 100', 'RHINE 300', 'ELBE 100', 'ELBE 50')
+        editor.press('ctrl+Return')
+        editor.type('weser\t7\t')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'),
+                         [LINES[2], LINES[2], '"WESER", 7, 3.5, 12', LINES[0], LINES[1], LINES[3]])
+        editor.press(*['ctrl+z'] * 6)
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), LINES)
+
+    def test_the_menu_of_line_numbers_is_about_the_lines_selected_or_the_one_below_it(self):
+        editor = self.open(samples.hd_text({'InitList': LINES}))
+        editor.click_line(2)
+        editor.click_line(3, held='shift')
+        editor.click_line(3, button=3)
+        editor.press('d')  # Delete 2 Lines
+        self.wait_for_places('RHINE 300', 'ELBE 50')
+        editor.press('ctrl+z')
+        self.wait_for_places('RHINE 300', 'ELBE 100', 'RHINE 100', 'ELBE 50')
+        editor.click_line(2)
+        editor.click_line(4, button=3)  # one that is not selected
+        editor.press('d')
+        self.wait_for_places('RHINE 300', 'ELBE 100', 'RHINE 100')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), LINES[:3])
+
+    def test_cells_are_cut_and_cleared_and_delete_says_that_it_takes_lines(self):
+        editor = self.open(samples.hd_text({'InitList': LINES}))
+        editor.click_cell(1, 3)
+        editor.press('shift+Down', 'Delete')
+        wait_for(lambda: 'Ctrl+Backspace' in editor.status(), 'Delete says that it takes lines', 3)
+        editor.press('ctrl+BackSpace')
+        wait_for(lambda: '2 cells cleared' in editor.status(), 'what was done is said', 3)
+        editor.click_cell(3, 4)
+        editor.menu('Edit', 'Cut')
+        editor.click_cell(4, 4)
+        editor.press('ctrl+v')
+        editor.click_cell(1, 1)
+        for lines, key in enumerate(('shift+F10', 'Menu'), 5):
+            editor.press(key, 'Down', 'Return')  # the first entry: Insert line
+            wait_for(lambda: editor.table().lines == lines, f'{key} opens the menu of the cell', 3)
+        editor.save()
+        self.assertEqual(self.saved().records('InitList')[:4],
+                         ['"RHINE", 300, 3.5, 10', '"ELBE", 100, 3.5, 11', '"RHINE", 100, 2, 12', '"ELBE", 50, 5, 12'])
+
+    def test_lines_at_the_cross_sections_of_a_branch(self):
+        editor = self.open_project()
+        editor.click_cell(1, 1)
+        editor.press('ctrl+shift+l')
+        box = editor.box()
+        editor.press('alt+t')
+        editor.type('1500')
+        editor.press('alt+c')
+        wait_for(lambda: any('2 lines: 0, 1000' in text for text in editor.box_texts()), 'two are between', 3)
+        self.assertTrue(box.shown)
+        editor.press('Return')
+        wait_for(lambda: '2 lines inserted' in editor.status(), 'what was done is said', 3)
+        editor.save()
+        self.assertEqual(self.saved().records('InitList')[2:4], ['"MOORBECK", 0, 3.5, 12', '"MOORBECK", 1000, 3.5, 12'])

@@ -744,6 +744,10 @@
         <translation>列の幅を合わせる</translation>
     </message>
     <message>
+        <source>Menu of the cell</source>
+        <translation>セルのメニュー</translation>
+    </message>
+    <message>
         <source>Duplication of lines</source>
         <translation>行の複製</translation>
     </message>

@@ -1,5 +1,6 @@
 // The tables beside the plot: models, editing with units and undo, lines by keys, and what is refused.
 #include "cross_sections_fixture.h"
+#include "grid/grid_commands.h"
 #include "grid/lines_view.h"
 #include "ks/language/language.h"
 
@@ -46,6 +47,39 @@ TEST_F(CrossSectionTest, TablesShowTheSectionsInTheUsersUnits)
     EXPECT_EQ(view->Plot()->Title(), "");
     UndoAll(view);
     EXPECT_EQ(view->Sections()->model()->rowCount(), SmallRows);
+}
+
+TEST_F(CrossSectionTest, SectionsAndPointsAreDuplicatedAndMoved)
+{
+    CCrossSectionView* view = Open();
+    const auto& stored = view->Document()->Sections().sections;
+    view->Sections()->SetCurrentCell(Main2500 + 1, 1);
+    CGridCommands::Run(GridAction::Duplicate, *view->Sections());
+    ASSERT_EQ(stored.size(), SmallRows + 1u);
+    const CCrossSection& copy = stored[Main2500 + 1];
+    EXPECT_EQ(copy.points.size(), 4u) << "with its points";
+    EXPECT_EQ(copy.width, 20);
+    EXPECT_NE(copy.chainage, 2500.5) << "no two stand at one place";
+    EXPECT_EQ(view->CurrentSection(), Main2500 + 1);
+    UndoAll(view);
+    view->Sections()->SetCurrentCell(Side300 + 1, 1);
+    CGridCommands::Run(GridAction::MoveUp, *view->Sections());
+    EXPECT_EQ(stored[Side300 - 1].branch, "SIDE");
+    EXPECT_EQ(view->CurrentSection(), Side300 - 1);
+    EXPECT_EQ(view->Points()->RowCount(), 0) << "those of the line that moved";
+    UndoAll(view);
+    EXPECT_EQ(stored[Side300].branch, "SIDE");
+    view->Sections()->ChangeView([](CGridModel& model) { model.Filter({"MAIN"}); });
+    view->Sections()->SetCurrentCell(3, 1);
+    CGridCommands::Run(GridAction::MoveUp, *view->Sections());
+    EXPECT_EQ(view->Sections()->RowCount(), 3) << "the filter hides what it hid";
+    EXPECT_EQ(stored[Main2500].topoId, "2021");
+    UndoAll(view);
+    Select(view->Sections(), Main2500);
+    view->Points()->SetCurrentCell(1, 1);
+    CGridCommands::Run(GridAction::MoveDown, *view->Points());
+    EXPECT_EQ(stored[Main2500].points[0].offset, 0) << "offsets do not decrease";
+    EXPECT_EQ(boxes.size(), 1);
 }
 
 /// The rows of a vector have no names of their own.

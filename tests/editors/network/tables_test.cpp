@@ -1,5 +1,5 @@
 // The tables beside the map: models, editing with units and undo, and what is refused.
-#include "grid/grid_keys.h"
+#include "grid/grid_commands.h"
 #include "ks/language/language.h"
 #include "network_fixture.h"
 
@@ -33,6 +33,27 @@ TEST_F(NetworkTest, TablesShowTheNetworkInTheUsersUnits)
     EXPECT_FALSE(view->OnCommand(Command::InsertLine)) << "no branch";
     view->Document()->UndoStack().undo();
     EXPECT_EQ(view->Channel()->model()->rowCount(), 3) << "undo shows the lines that are back";
+}
+
+TEST_F(NetworkTest, WhereLinesHaveAPlaceOfTheirOwnTheyDoNotMove)
+{
+    CNetworkView* view = Open();
+    Select(view->Branches(), 0);
+    view->Channel()->SetCurrentCell(2, 1);
+    EXPECT_FALSE(CGridCommands::CanRun(GridAction::MoveUp, *view->Channel())) << "they stand by chainage";
+    EXPECT_FALSE(CGridCommands::CanRun(GridAction::Duplicate, *view->Branches())) << "a branch has a line on the map";
+    CGridCommands::Run(GridAction::Duplicate, *view->Channel());
+    const auto& channel = view->Document()->Network().branches[0].channel;
+    ASSERT_EQ(channel.size(), 4u);
+    EXPECT_EQ(channel[2].chainage, 5000) << "between the one that it is of and the next";
+    EXPECT_EQ(channel[2].width, 50);
+    view->Branches()->SetCurrentCell(2, 1);
+    CGridCommands::Run(GridAction::MoveUp, *view->Branches());
+    EXPECT_EQ(view->Document()->Network().branches[0].name, "SIDE");
+    EXPECT_EQ(view->Channel()->RowCount(), 0) << "that of the branch that moved";
+    while (view->Document()->UndoStack().canUndo())
+        view->Document()->UndoStack().undo();
+    EXPECT_EQ(view->Document()->Network().branches[0].channel.size(), 3u);
 }
 
 TEST_F(NetworkTest, EditsGoToTheDocumentAndCanBeUndone)
