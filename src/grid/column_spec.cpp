@@ -106,6 +106,22 @@ CellValue ColumnSpec::NewLineValue() const
     return emptyIsNotGiven ? CellValue(NotGiven) : CellValue();
 }
 
+QStringList ColumnSpec::HeaderLines() const
+{
+    constexpr qsizetype mostLetters = 18;
+    const QString text = header();
+    QStringList lines{text};
+    if (text.size() > mostLetters) { // broken where both halves are about as long
+        const qsizetype before = text.lastIndexOf(u' ', text.size() / 2), behind = text.indexOf(u' ', text.size() / 2);
+        const bool isBefore = before > 0 && (behind < 0 || text.size() / 2 - before <= behind - text.size() / 2);
+        if (const qsizetype space = isBefore ? before : behind; space > 0)
+            lines = {text.first(space), text.sliced(space + 1)};
+    }
+    if (const QString unit = UnitLine(); !unit.isEmpty())
+        lines << unit;
+    return lines;
+}
+
 QString ColumnSpec::UnitLine() const
 {
     const QString unit = unitBelow ? UnitSymbol() : QString();

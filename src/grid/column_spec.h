@@ -137,6 +137,8 @@ struct ColumnSpec
     /// What a new line holds; nothing where the record's own default stands.
     CellValue NewLineValue() const;
     QString UnitSymbol() const { return unitText ? unitText() : style.UnitSymbol(); }
+    /// What stands in the header, line by line: a long text in two, and the unit below.
+    QStringList HeaderLines() const;
     /// What stands below the header: "[m³/s]"; empty for nothing.
     QString UnitLine() const;
     /// Unit of the cells.

@@ -46,20 +46,18 @@ QSize CGridHeader::sizeHint() const
 void CGridHeader::initStyleOptionForIndex(QStyleOptionHeader* option, int column) const
 {
     QHeaderView::initStyleOptionForIndex(option, column);
-    if (const QString unit = m_grid.Model()->Column(column).UnitLine(); !unit.isEmpty())
-        option->text += u'\n' + unit;
+    option->text = m_grid.Model()->Column(column).HeaderLines().join(u'\n');
     const auto& keys = m_grid.Model()->SortedBy();
     const auto key = std::ranges::find(keys, column, &SortKey::column);
     if (key != keys.end())
         option->sortIndicator = key->descending ? QStyleOptionHeader::SortUp : QStyleOptionHeader::SortDown;
 }
 
-/// Room for the unit's line.
+/// Room for all lines.
 QSize CGridHeader::sectionSizeFromContents(int column) const
 {
     QSize size = QHeaderView::sectionSizeFromContents(column);
-    if (!m_grid.Model()->Column(column).UnitLine().isEmpty())
-        size.rheight() += fontMetrics().lineSpacing();
+    size.rheight() += int(m_grid.Model()->Column(column).HeaderLines().size() - 1) * fontMetrics().lineSpacing();
     return size;
 }
 

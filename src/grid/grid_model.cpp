@@ -10,7 +10,25 @@
 #include <QScopedValueRollback>
 #include <QUndoStack>
 #include <algorithm>
+#include <cstdlib>
 #include <utility>
+
+namespace {
+
+/// That of a button, or the text's color laid thinly over a cell where a palette has next to the same for both.
+QBrush LockedBackground()
+{
+    constexpr int least = 14; // difference of lightness that one still sees
+    const QPalette palette = QGuiApplication::palette();
+    const QColor cell = palette.color(QPalette::Base), button = palette.color(QPalette::Button);
+    if (std::abs(button.lightness() - cell.lightness()) >= least)
+        return palette.brush(QPalette::Button);
+    const QColor text = palette.color(QPalette::Text);
+    const auto mixed = [](int of, int with) { return (7 * of + with) / 8; };
+    return QColor(mixed(cell.red(), text.red()), mixed(cell.green(), text.green()), mixed(cell.blue(), text.blue()));
+}
+
+} // namespace
 
 // ---- what views see ----------------------------------------------------------------------------
 
@@ -117,8 +135,7 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
     case Qt::ToolTipRole:
         return CellToolTip(column, value());
     case Qt::BackgroundRole:
-        return IsLocked(index.row(), index.column()) ? QVariant(QGuiApplication::palette().brush(QPalette::Button))
-                                                     : QVariant();
+        return IsLocked(index.row(), index.column()) ? QVariant(LockedBackground()) : QVariant();
     default:
         return {};
     }

@@ -118,8 +118,9 @@ void CGridWidths::MakeRoomForMarks()
     const int mark = m_grid.style()->pixelMetric(QStyle::PM_HeaderMarkSize) + Margin;
     for (const SortKey& key : m_grid.Model()->SortedBy()) {
         const ColumnSpec& column = m_grid.Model()->Column(key.column);
-        const int text = std::max(m_grid.fontMetrics().horizontalAdvance(column.header()),
-                                  m_grid.fontMetrics().horizontalAdvance(column.UnitLine()));
+        int text = 0;
+        for (const QString& line : column.HeaderLines())
+            text = std::max(text, m_grid.fontMetrics().horizontalAdvance(line));
         if (m_grid.columnWidth(key.column) < text + 2 * mark)
             m_grid.setColumnWidth(key.column, text + 2 * mark);
     }
@@ -166,8 +167,8 @@ int CGridWidths::WidthOfTexts(int column, int most, int least)
         if (m_letters.Bound(text) > width)
             width = std::max(width, font.horizontalAdvance(text));
     };
-    make(m_grid.Model()->Column(column).header());
-    make(m_grid.Model()->Column(column).UnitLine());
+    for (const QString& line : m_grid.Model()->Column(column).HeaderLines())
+        make(line);
     qsizetype longest = 0;
     const auto measure = [&](int row) {
         const QString text = m_grid.TextAt(row, column + 1);

@@ -16,6 +16,8 @@
 
 namespace {
 
+constexpr int TabHeight = 24; // with which all tabs have room in a low window; where the font needs more, less air
+
 /// A tab column whose captions read from left to right. It chooses nothing itself: whoever is being edited is asked
 /// before another tab comes to the front.
 class SideTabBar : public QTabBar
@@ -29,7 +31,8 @@ public:
         QSize& text = m_sizes[tabText(index)];
         if (text.isEmpty())
             text = fontMetrics().size(Qt::TextShowMnemonic, tabText(index));
-        return {text.width() + 3 * fontMetrics().height(), text.height() + fontMetrics().height() * 2 / 3};
+        const int air = std::clamp(TabHeight - text.height(), 4, fontMetrics().height() * 2 / 3);
+        return {text.width() + 3 * fontMetrics().height(), text.height() + air};
     }
     QSize minimumTabSizeHint(int index) const override { return tabSizeHint(index); }
 
@@ -74,8 +77,12 @@ protected:
             initStyleOption(&option, i);
             painter.drawControl(QStyle::CE_TabBarTabShape, option);
             // Some styles and colors set the current tab off by a shade that nobody sees.
-            if (i == currentIndex())
-                painter.fillRect(QRect(option.rect.topLeft(), QSize(3, option.rect.height())), palette().highlight());
+            if (i == currentIndex()) {
+                QColor tint = palette().color(QPalette::Highlight);
+                painter.fillRect(QRect(option.rect.topLeft(), QSize(3, option.rect.height())), tint);
+                tint.setAlphaF(0.25F);
+                painter.fillRect(option.rect.adjusted(3, 1, 0, -1), tint);
+            }
             const QRect text = option.rect.adjusted(fontMetrics().height() * 2 / 3, 0, -4, 0);
             const auto role = option.state & QStyle::State_Enabled ? QPalette::Normal : QPalette::Disabled;
             style()->drawItemText(&painter, text, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextShowMnemonic, palette(),

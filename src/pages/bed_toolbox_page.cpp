@@ -52,7 +52,7 @@ CBedToolboxPage::CBedToolboxPage(CKavo0_hdDoc* document)
     };
     using R = HDBedResTool;
     Grid(m_ui.grid_1319)
-        .BranchName({.width = 110})
+        .BranchName({.width = 71})
         .Chainage({})
         .Value(&R::CoefA, coefficient(tools.CoefA))
         .Value(&R::CoefB, coefficient(tools.CoefB))

@@ -19,7 +19,7 @@ public:
 
         using R = HDMixingCoef;
         Grid(m_ui.grid_1335)
-            .BranchName({.width = 110})
+            .BranchName({.width = 71})
             .Chainage({})
             .Value(&R::MixCoef1, {.width = 60, .fill = &mixing.MixCoef1})
             .Value(&R::MixCoef2, {.width = 60, .fill = &mixing.MixCoef2})

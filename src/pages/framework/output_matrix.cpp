@@ -21,7 +21,7 @@ void COutputMatrix::SetTitle(QCheckBox& box, const QString& title, const QString
     QLabel* label = labelAt(row, 0);
     if (!label) {
         label = new QLabel;
-        label->setMargin(4);
+        label->setMargin(2); // all rows have room in a low window
         label->setIndent(8);
         cells.addWidget(label, row, 0);
     }

@@ -408,7 +408,7 @@
         <translation>マークの名称</translation>
     </message>
     <message>
-        <source>Local values</source>
+        <source>Local Values</source>
         <translation>地点別の値</translation>
     </message>
 </context>
