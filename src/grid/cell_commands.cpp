@@ -82,6 +82,8 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
     case GridAction::Interpolate:
         return grid.Host() && grid.Host()->CanSearch(grid) && block.right > 1 && block.bottom > block.top &&
                has([](const ColumnSpec& column) { return column.Kind() == CellKind::Number; });
+    case GridAction::ResetToGlobal:
+        return has([](const ColumnSpec& column) { return bool(column.fill); });
     default:
         return hasNumbers();
     }
@@ -100,6 +102,8 @@ void RunOnCells(CGenGrid& grid, GridAction action)
                     {GridTexts::tr("1 cell cleared"), GridTexts::tr("%1 cells cleared")});
     if (action == GridAction::FillDown)
         return Make(grid, FillDown(model, block), NameOf(action), changed);
+    if (action == GridAction::ResetToGlobal)
+        return Make(grid, ResetToGlobal(model, block), NameOf(action), changed);
     if (auto results = AskForCells(action, model, block, grid))
         Make(grid, std::move(*results), NameOf(action), changed);
 }

@@ -30,7 +30,8 @@ QTableWidget* MakeTable(const QString& name, const QString& lastColumn)
 {
     auto* table = new QTableWidget(0, 4);
     table->setAccessibleName(name);
-    table->setHorizontalHeaderLabels({GridTexts::tr("Line"), GridTexts::tr("Column"), GridTexts::tr("Now"), lastColumn});
+    table->setHorizontalHeaderLabels(
+        {GridTexts::tr("Line"), GridTexts::tr("Column"), GridTexts::tr("Now"), lastColumn});
     table->verticalHeader()->hide();
     table->horizontalHeader()->setStretchLastSection(true);
     table->setEditTriggers(QAbstractItemView::NoEditTriggers);
@@ -101,7 +102,8 @@ private:
         auto [results, fault] = Compute();
         m_results = std::move(results);
         m_takesLong = time.elapsed() > 50;
-        const std::size_t changed = m_results ? m_results->ChangedCount() : 0, kept = m_results ? m_results->KeptCount() : 0;
+        const std::size_t changed = m_results ? m_results->ChangedCount() : 0,
+                          kept = m_results ? m_results->KeptCount() : 0;
         m_summary->setText(!fault.isEmpty() ? fault
                            : changed == 0   ? GridTexts::tr("No cell would change.")
                                             : GridTexts::Counted(changed, GridTexts::tr("1 cell changes:"),
@@ -155,10 +157,11 @@ public:
             if (m_names.names[name] == QString::fromUtf8(model.Column(column).name))
                 keywords << m_names.names[name];
         }
-        auto* hint = new QLabel(GridTexts::tr("\"value\" is the number of the cell itself. Numbers are in the units shown. "
-                                              "Other columns of the line: %1; in every language: %2. Functions: min, "
-                                              "max, abs, sqrt, rint, ln, log10, exp, sin, ...")
-                                    .arg(names.join(QStringLiteral(", ")), keywords.join(QStringLiteral(", "))));
+        auto* hint =
+            new QLabel(GridTexts::tr("\"value\" is the number of the cell itself. Numbers are in the units shown. "
+                                     "Other columns of the line: %1; in every language: %2. Functions: min, "
+                                     "max, abs, sqrt, rint, ln, log10, exp, sin, ...")
+                           .arg(names.join(QStringLiteral(", ")), keywords.join(QStringLiteral(", "))));
         hint->setWordWrap(true);
         Form().addRow(hint);
         connect(m_formula, &QLineEdit::textChanged, this, [this] { Later(); });
@@ -203,7 +206,8 @@ protected:
     {
         const auto step = KsReadTyped(m_step->text(), CKsEditStyle());
         if (!step.value)
-            return {std::nullopt, step.complaint.isEmpty() ? GridTexts::tr("Floating point number required") : step.complaint};
+            return {std::nullopt,
+                    step.complaint.isEmpty() ? GridTexts::tr("Floating point number required") : step.complaint};
         return {FillSeries(Model(), m_block, *step.value), {}};
     }
 

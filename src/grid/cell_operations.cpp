@@ -71,6 +71,16 @@ CCellResults Clear(const CTableRows& rows, const CellBlock& block)
     return results;
 }
 
+CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block)
+{
+    CCellResults results(rows, block);
+    ForCells(rows, block, [&](int row, int column) {
+        if (const ColumnSpec& spec = rows.Column(column); spec.fill && row >= rows.FixedRows())
+            results.Add(row, column, rows.Value(row, column), spec.FillValue());
+    });
+    return results;
+}
+
 double StepOf(const CTableRows& rows, const CellBlock& block)
 {
     const auto isNumber = [&](int column) { return rows.Column(column).IsNumeric(); };
@@ -188,7 +198,8 @@ std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, int column, 
 }
 
 /// Of two values at one place the first one counts, or at the end of the block the last.
-std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column, KnownValues which)
+std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column,
+                           KnownValues which)
 {
     std::vector<Known> known;
     const auto add = [&known](const std::optional<Known>& value) {

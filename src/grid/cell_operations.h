@@ -14,6 +14,9 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block);
 /// The cells become what blank ones are stored as: what the column fills new lines with, or nothing.
 CCellResults Clear(const CTableRows& rows, const CellBlock& block);
 
+/// Cells of columns with a global value become that.
+CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block);
+
 /// Numbers that grow by `step` from row to row, in the units shown, from what stands in the first row of each column.
 CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double step);
 /// How much the second row of the block is more than the first one, in the unit shown; 0 where that is no number.

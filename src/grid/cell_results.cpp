@@ -72,5 +72,7 @@ QString CCellResults::RuleFault() const
     for (const auto& [cell, text] : m_texts)
         texts[std::size_t(cell.first - top)][cell.second] = text;
     const auto fault = m_rows->Fault(top, 0, texts);
-    return fault ? GridTexts::tr("Line %1: %2").arg(QString::number(m_rows->LineNumber(top + int(fault->row))), fault->text) : QString();
+    return fault ? GridTexts::tr("Line %1: %2")
+                       .arg(QString::number(m_rows->LineNumber(top + int(fault->row))), fault->text)
+                 : QString();
 }

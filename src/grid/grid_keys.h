@@ -32,6 +32,7 @@ enum class GridAction
     FillSeries,
     Interpolate,
     Calculate,
+    ResetToGlobal,
     Undo,
     Redo,
     SortAscending,
