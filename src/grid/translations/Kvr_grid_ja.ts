@@ -791,5 +791,13 @@
         <source>Default: %1</source>
         <translation>既定値: %1</translation>
     </message>
+    <message>
+        <source>Reset to Global Value</source>
+        <translation>全体値に戻す</translation>
+    </message>
+    <message>
+        <source>Give the selected cells the global value of their column</source>
+        <translation>選択したセルをその列の全体値にします</translation>
+    </message>
 </context>
 </TS>
