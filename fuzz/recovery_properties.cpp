@@ -25,7 +25,7 @@ std::string CheckWritten(const std::string& title, const std::string& content)
     if (const auto again = ReadFrom(text, &read)) {
         if (again->path != header.path || again->title != header.title || again->time != header.time || read != content)
             return "a recovery file comes back otherwise than it was written";
-    } else if (QDir::cleanPath(header.path) == header.path) {
+    } else if (QDir::cleanPath(header.path) == header.path && !header.path.contains(QChar::Null)) {
         return "a recovery file is not taken as it was written";
     }
     if (content.empty())
