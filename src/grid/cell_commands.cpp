@@ -5,6 +5,7 @@
 #include "grid/gen_grid.h"
 #include "grid/grid_host.h"
 #include "grid/grid_texts.h"
+#include "grid/replace_dialog.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/message_box.h"
 
@@ -63,6 +64,8 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
     case GridAction::Interpolate:
         return grid.Host() && grid.Host()->CanSearch(grid) && block.right > 1 && block.bottom > block.top &&
                has([](const ColumnSpec& column) { return column.Kind() == CellKind::Number; });
+    case GridAction::Replace:
+        return true;
     default:
         return hasNumbers();
     }
@@ -71,6 +74,8 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
 void RunOnCells(CGenGrid& grid, GridAction action)
 {
     grid.StoreEditedLine();
+    if (action == GridAction::Replace)
+        return FindAndReplace(grid);
     const CGridModel& model = *grid.Model();
     const CellBlock block = BlockOf(grid);
     if (action == GridAction::FillDown)

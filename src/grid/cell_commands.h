@@ -9,7 +9,7 @@
 class CGenGrid;
 
 inline constexpr GridAction CellActions[] = {GridAction::FillDown, GridAction::FillSeries, GridAction::Interpolate,
-                                             GridAction::Calculate};
+                                             GridAction::Calculate, GridAction::Replace};
 
 bool CanRunOnCells(const CGenGrid& grid, GridAction action);
 /// Asks for what it has to know, and makes one step to undo.

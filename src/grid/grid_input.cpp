@@ -56,6 +56,7 @@ void CGridInput::Run(GridAction action)
     case GridAction::FillSeries:
     case GridAction::Interpolate:
     case GridAction::Calculate:
+    case GridAction::Replace:
         if (CanRunOnCells(m_grid, action))
             RunOnCells(m_grid, action);
         return;

@@ -24,6 +24,7 @@ enum class GridAction
     FillSeries,
     Interpolate,
     Calculate,
+    Replace,
     Undo,
     Redo,
     SortAscending,

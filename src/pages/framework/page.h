@@ -60,6 +60,8 @@ public:
     void LineCurrent(CGenGrid& grid) override;
     void Run(CGenGrid& grid, GridAction action) override;
     bool CanSearch(const CGenGrid& grid) const override { return &grid == m_grid; }
+    std::vector<HostTable> TablesOfPage(CGenGrid& grid) override;
+    std::vector<HostTable> TablesOfDocument() override;
     QStringList BranchNames() override;
 
     /// The help command: what the keys do on this page.
