@@ -175,14 +175,16 @@ std::vector<HostTable> CKavo0_hdView::TablesOfDocument()
 {
     std::vector<HostTable> tables;
     const auto isKnown = [&tables](const CGenGrid& grid) {
-        const void* const data = grid.Model()->Rows()->Data();
-        return std::ranges::any_of(tables, [&](const HostTable& each) { return each.grid->Model()->Rows()->Data() == data; });
+        const void* const list = grid.Model()->Rows()->Data();
+        return std::ranges::any_of(tables,
+                                   [&](const HostTable& each) { return each.grid->Model()->Rows()->Data() == list; });
     };
     const auto add = [&](int tab, CGenGrid& grid) {
         if (!grid.Model()->Rows() || isKnown(grid))
             return;
         grid.Model()->Sync();
-        tables.push_back({LoadString(m_sheet->CaptionOf(tab)), &grid, [this, tab] { return m_sheet->SetActivePage(tab); }});
+        tables.push_back(
+            {LoadString(m_sheet->CaptionOf(tab)), &grid, [this, tab] { return m_sheet->SetActivePage(tab); }});
     };
     for (int tab = 0; tab < m_sheet->PageCount(); ++tab) {
         CGenPropertyPage* const page = m_sheet->PageAt(tab);
