@@ -58,6 +58,15 @@ void CCellValues::Add(CellValue value, std::size_t expected)
     m_values = std::move(mixed);
 }
 
+void CCellValues::Add(double number, std::size_t expected)
+{
+    auto* const numbers = m_hasType ? std::get_if<std::vector<double>>(&m_values) : nullptr;
+    if (numbers)
+        numbers->push_back(number);
+    else
+        Add(CellValue(number), expected);
+}
+
 CellValue CCellValues::operator[](std::size_t index) const
 {
     return std::visit([index](const auto& values) { return CellValue(values[index]); }, m_values);
@@ -68,17 +77,32 @@ void CCellValues::ShrinkToFit()
     std::visit([](auto& values) { Shrink(values); }, m_values);
 }
 
-void CCellChanges::Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, CellValue before,
-                       CellValue after)
+CCellChanges::Column& CCellChanges::ColumnFor(int column, const std::shared_ptr<const CellAccess>& access)
 {
     auto place = std::ranges::find(m_columns, column, &Column::column);
     if (place == m_columns.end()) {
         place = m_columns.insert(place, Column{column, access, {}, {}, {}});
         place->rows.reserve(m_expected);
     }
-    place->rows.push_back(row);
-    place->before.Add(std::move(before), m_expected);
-    place->after.Add(std::move(after), m_expected);
+    return *place;
+}
+
+void CCellChanges::Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, CellValue before,
+                       CellValue after)
+{
+    Column& place = ColumnFor(column, access);
+    place.rows.push_back(row);
+    place.before.Add(std::move(before), m_expected);
+    place.after.Add(std::move(after), m_expected);
+}
+
+void CCellChanges::Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, double before,
+                       double after)
+{
+    Column& place = ColumnFor(column, access);
+    place.rows.push_back(row);
+    place.before.Add(before, m_expected);
+    place.after.Add(after, m_expected);
 }
 
 std::size_t CCellChanges::Count() const

@@ -17,6 +17,8 @@ class CCellValues
 public:
     /// The first one says of which type they are; then there is room for `expected` of them.
     void Add(CellValue value, std::size_t expected = 0);
+    /// The same for a number, without the way over a value of any type.
+    void Add(double number, std::size_t expected = 0);
     CellValue operator[](std::size_t index) const;
     void ShrinkToFit();
 
@@ -35,6 +37,7 @@ public:
     /// changed in the order in which they came first.
     void Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, CellValue before,
              CellValue after);
+    void Add(RowKey row, int column, const std::shared_ptr<const CellAccess>& access, double before, double after);
     /// So many cells of each column may come: makes room for them at once.
     void Expect(std::size_t cells) { m_expected = cells; }
     bool IsEmpty() const { return m_columns.empty(); }
@@ -57,6 +60,8 @@ private:
         CCellValues before, after;
         std::vector<std::function<void(void* row)>> restore = {}; // instead of setting `before`; see CellAccess
     };
+
+    Column& ColumnFor(int column, const std::shared_ptr<const CellAccess>& access);
 
     std::vector<Column> m_columns;
     std::size_t m_expected = 0;

@@ -6,6 +6,7 @@
 #include "grid/grid_clipboard.h"
 #include "grid/grid_host.h"
 #include "grid/grid_texts.h"
+#include "grid/replace_dialog.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/message_box.h"
 
@@ -84,6 +85,8 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
                has([](const ColumnSpec& column) { return column.Kind() == CellKind::Number; });
     case GridAction::ResetToGlobal:
         return has([](const ColumnSpec& column) { return bool(column.fill); });
+    case GridAction::Replace:
+        return true;
     default:
         return hasNumbers();
     }
@@ -92,6 +95,8 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
 void RunOnCells(CGenGrid& grid, GridAction action)
 {
     grid.StoreEditedLine();
+    if (action == GridAction::Replace)
+        return FindAndReplace(grid);
     const CGridModel& model = *grid.Model();
     const CellBlock block = BlockOf(grid);
     const Words changed{GridTexts::tr("1 cell changed"), GridTexts::tr("%1 cells changed")};

@@ -122,9 +122,10 @@ constexpr int BranchColumn = 0, ChainageColumn = 1;
 struct LineOfBranch
 {
     double chainage;
-    std::size_t line; // of the source: what is known of a line that is hidden is known
-    int row;          // where it is shown
-    bool isInBlock;
+    std::uint32_t line; // of the source: what is known of a line that is hidden is known
+    int row;            // where it is shown
+
+    bool IsIn(const CellBlock& block) const { return row >= block.top && row <= block.bottom; }
 };
 using Branches = std::vector<std::vector<LineOfBranch>>;
 
@@ -154,7 +155,7 @@ Branches LinesByBranch(const CTableRows& rows, const CellBlock& block, CCellResu
             branches.resize(std::max(branches.size(), place + 1));
             last = branch;
         }
-        branches[place].push_back({*number, line, row, isInBlock});
+        branches[place].push_back({*number, std::uint32_t(line), row});
     }
     for (auto& lines : branches)
         if (!std::ranges::is_sorted(lines, {}, &LineOfBranch::chainage))
@@ -185,11 +186,11 @@ std::optional<double> OnLine(const std::vector<Known>& known, double chainage, b
 }
 
 /// The first of the lines that is in the block, or is not, and has a value.
-std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, int column, bool isInBlock)
+std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, const CellBlock& block, int column, bool isInBlock)
 {
     const ColumnSpec& spec = rows.Column(column);
     for (const LineOfBranch& line : lines) {
-        if (line.isInBlock != isInBlock)
+        if (line.IsIn(block) != isInBlock)
             continue;
         if (const auto value = ShownNumber(spec, spec.access->get(rows.Rows()->At(line.line))))
             return Known{line.chainage, *value};
@@ -198,8 +199,8 @@ std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, int column, 
 }
 
 /// Of two values at one place the first one counts, or at the end of the block the last.
-std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, int column,
-                           KnownValues which)
+std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, const CellBlock& block,
+                           int column, KnownValues which)
 {
     std::vector<Known> known;
     const auto add = [&known](const std::optional<Known>& value) {
@@ -207,12 +208,12 @@ std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranc
             known.push_back(*value);
     };
     if (which == KnownValues::Ends) {
-        add(FirstKnown(rows, std::views::all(lines), column, true));
-        add(FirstKnown(rows, std::views::reverse(lines), column, true));
+        add(FirstKnown(rows, std::views::all(lines), block, column, true));
+        add(FirstKnown(rows, std::views::reverse(lines), block, column, true));
         return known;
     }
     for (std::size_t line = 0; line < lines.size(); ++line)
-        add(FirstKnown(rows, std::span(lines).subspan(line, 1), column, false));
+        add(FirstKnown(rows, std::span(lines).subspan(line, 1), block, column, false));
     return known;
 }
 
@@ -226,11 +227,11 @@ CCellResults Interpolate(const CTableRows& rows, const CellBlock& block, KnownVa
         if (rows.Column(column).Kind() != CellKind::Number)
             continue;
         for (const auto& lines : branches) {
-            if (std::ranges::none_of(lines, &LineOfBranch::isInBlock))
+            if (std::ranges::none_of(lines, [&block](const LineOfBranch& line) { return line.IsIn(block); }))
                 continue;
-            const std::vector<Known> known = KnownOf(rows, lines, column, which);
+            const std::vector<Known> known = KnownOf(rows, lines, block, column, which);
             for (const LineOfBranch& line : lines) {
-                if (!line.isInBlock)
+                if (!line.IsIn(block))
                     continue;
                 if (const auto value = OnLine(known, line.chainage, extrapolates))
                     results.AddShown(line.row, column, rows.Value(line.row, column), *value);
@@ -268,27 +269,33 @@ FormulaNames NamesForFormula(const CTableRows& rows)
     return result;
 }
 
+CCellFormula::CCellFormula(const CTableRows& rows, const CKsFormula& formula, const FormulaNames& names)
+    : m_rows(&rows), m_formula(&formula), m_numbers(names.columns.size())
+{
+    for (std::size_t name = 0; name < names.columns.size(); ++name)
+        if (formula.Uses(name))
+            m_used.emplace_back(name, names.columns[name]);
+}
+
+void CCellFormula::Add(CCellResults& results, int row, int column, const CellValue& before)
+{
+    for (const auto& [name, from] : m_used) {
+        const auto number = from < 0 ? ShownNumber(m_rows->Column(column), before) : ShownNumber(*m_rows, row, from);
+        if (!number)
+            return results.Keep(row, column, GridTexts::tr("A cell that the formula names is empty."));
+        m_numbers[name] = *number;
+    }
+    results.AddShown(row, column, before, m_formula->Value(m_numbers));
+}
+
 CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKsFormula& formula,
                        const FormulaNames& names)
 {
-    std::vector<std::size_t> used;
-    for (std::size_t name = 0; name < names.columns.size(); ++name)
-        if (formula.Uses(name))
-            used.push_back(name);
+    CCellFormula cells(rows, formula, names);
     CCellResults results(rows, block);
-    std::vector<double> numbers(names.columns.size());
     ForCells(rows, block, [&](int row, int column) {
-        if (!rows.Column(column).IsNumeric())
-            return;
-        const CellValue before = rows.Value(row, column);
-        for (const std::size_t name : used) {
-            const int from = names.columns[name];
-            const auto number = from < 0 ? ShownNumber(rows.Column(column), before) : ShownNumber(rows, row, from);
-            if (!number)
-                return results.Keep(row, column, GridTexts::tr("A cell that the formula names is empty."));
-            numbers[name] = *number;
-        }
-        results.AddShown(row, column, before, formula.Value(numbers));
+        if (rows.Column(column).IsNumeric())
+            cells.Add(results, row, column, rows.Value(row, column));
     });
     return results;
 }

@@ -39,6 +39,20 @@ struct FormulaNames
     std::vector<int> columns; // the column of each; -1 for the cell itself
 };
 FormulaNames NamesForFormula(const CTableRows& rows);
+/// A formula, which outlives it, about the cells of a table.
+class CCellFormula
+{
+public:
+    CCellFormula(const CTableRows& rows, const CKsFormula& formula, const FormulaNames& names);
+    /// What it makes of the number in the cell, which holds `before`.
+    void Add(CCellResults& results, int row, int column, const CellValue& before);
+
+private:
+    const CTableRows* m_rows;
+    const CKsFormula* m_formula;
+    std::vector<std::pair<std::size_t, int>> m_used; // names, and the column of each
+    std::vector<double> m_numbers;
+};
 /// Each number of the block becomes what the formula makes of it; numbers are in the units shown.
 CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKsFormula& formula,
                        const FormulaNames& names);

@@ -29,7 +29,12 @@ void CCellResults::Add(int row, int column, const CellValue& before, const CellV
         m_changed.push_back({row, column, EditText(spec, before), EditText(spec, after)});
     if (m_hasRules)
         m_texts.push_back({{row, column}, EditText(spec, after)});
-    m_changes.Add(m_rows->NameOf(row), column + 1, spec.access, before, after);
+    const RowKey name = m_rows->NameOf(row);
+    const auto *numberBefore = std::get_if<double>(&before), *numberAfter = std::get_if<double>(&after);
+    if (numberBefore && numberAfter)
+        m_changes.Add(name, column + 1, spec.access, *numberBefore, *numberAfter);
+    else
+        m_changes.Add(name, column + 1, spec.access, before, after);
 }
 
 void CCellResults::AddShown(int row, int column, const CellValue& before, double after)

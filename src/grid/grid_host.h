@@ -2,11 +2,20 @@
 #pragma once
 
 #include <QStringList>
+#include <functional>
 #include <utility>
 #include <vector>
 
 class CGenGrid;
 enum class GridAction;
+
+/// A table among those that a user works on.
+struct HostTable
+{
+    QString page; // as the user calls it; empty for the page in front
+    CGenGrid* grid;
+    std::function<bool()> show = {}; // brings the page to the front; false when another one may not be left
+};
 
 class IGridHost
 {
@@ -25,6 +34,10 @@ public:
     virtual void Run(CGenGrid& grid, GridAction action) = 0;
     /// Whether search looks through this grid.
     virtual bool CanSearch(const CGenGrid&) const { return false; }
+    /// The tables that a command for all of the page is about, the grid among them.
+    virtual std::vector<HostTable> TablesOfPage(CGenGrid& grid) { return {{{}, &grid}}; }
+    /// Likewise for all of the document; empty where there are no other pages.
+    virtual std::vector<HostTable> TablesOfDocument() { return {}; }
     /// What the cells of branch names offer.
     virtual QStringList BranchNames() { return {}; }
     /// The project's cross sections: branches, and chainages in metres.

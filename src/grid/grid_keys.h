@@ -33,6 +33,7 @@ enum class GridAction
     Interpolate,
     Calculate,
     ResetToGlobal,
+    Replace,
     Undo,
     Redo,
     SortAscending,

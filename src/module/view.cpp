@@ -170,6 +170,34 @@ void CKavo0_hdView::EnableLinesMenu(bool enable)
         frame->EnableMenuItem(LinesMenuPosition, enable);
 }
 
+/// A table of a line is on show for the line that is current, so of the pages behind only their lists are meant.
+std::vector<HostTable> CKavo0_hdView::TablesOfDocument()
+{
+    std::vector<HostTable> tables;
+    const auto isKnown = [&tables](const CGenGrid& grid) {
+        const void* const list = grid.Model()->Rows()->Data();
+        return std::ranges::any_of(tables,
+                                   [&](const HostTable& each) { return each.grid->Model()->Rows()->Data() == list; });
+    };
+    const auto add = [&](int tab, CGenGrid& grid) {
+        if (!grid.Model()->Rows() || isKnown(grid))
+            return;
+        grid.Model()->Sync();
+        tables.push_back(
+            {LoadString(m_sheet->CaptionOf(tab)), &grid, [this, tab] { return m_sheet->SetActivePage(tab); }});
+    };
+    for (int tab = 0; tab < m_sheet->PageCount(); ++tab) {
+        CGenPropertyPage* const page = m_sheet->PageAt(tab);
+        CGenGrid* const list = page->GetGrid();
+        if (page == ActivePage() && page->LinesGrid())
+            for (const HostTable& table : page->TablesOfPage(*page->LinesGrid()))
+                add(tab, *table.grid);
+        else if (list && list->isEnabled() && page->GetList())
+            add(tab, *list);
+    }
+    return tables;
+}
+
 void CKavo0_hdView::FindField()
 {
     const std::vector<FoundField> fields = FieldsOf(*m_sheet, *GetDocument());

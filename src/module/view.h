@@ -44,6 +44,7 @@ public:
     void CurrentLocationChanged() override;
     void CurrentCellChanged() override { ShowStatus(); }
     void Execute(int command) override { OnCommand(command); }
+    std::vector<HostTable> TablesOfDocument() override;
     QStringList BranchNames() override;
     void EnableLinesMenu(bool enable) override;
 

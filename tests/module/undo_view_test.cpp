@@ -3,11 +3,16 @@
 #include "exchange_fixture.h"
 
 #include "data/hd_file.h"
+#include "grid/cell_commands.h"
 
 #include <QClipboard>
+#include <QDialog>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPushButton>
+#include <QRadioButton>
 #include <QStatusBar>
+#include <QTimer>
 
 namespace {
 
@@ -224,6 +229,36 @@ TEST_F(UndoViewTest, LevelsStandBelowTheTitleTheyWereGivenBeforeItsName)
     PressRedo();
     EXPECT_EQ(list.GetAt(0).MarkLevels, std::vector<double>{5.5});
     EXPECT_EQ(Parameters(*view).Global.MarkTitles, std::vector<std::string>{"BANK"});
+}
+
+TEST_F(UndoViewTest, ReplacingInTheWholeDocumentIsOneStepOverAllPages)
+{
+    Opened(WriteFile("river.hdkv"));
+    auto& parameters = view->GetDocument()->Parameters();
+    HDLeakage place;
+    place.RiverName = "MAIN";
+    parameters.LeakageList.Add(place); // of a page that nobody has seen
+    CGenGrid& grid = *view->ActivePage()->GetGrid();
+    grid.SetCurrentCell(grid.RowCount(), 1);
+    QTimer::singleShot(0, &grid, [this] {
+        auto* dialog = QApplication::activeModalWidget();
+        ASSERT_TRUE(dialog);
+        dialog->findChild<QLineEdit*>("find")->setText("MAIN");
+        dialog->findChild<QLineEdit*>("with")->setText("TRUNK");
+        dialog->findChild<QRadioButton*>("inDocument")->setChecked(true);
+        QTest::qWait(100);
+        dialog->findChild<QPushButton*>("findNext")->click();
+        EXPECT_EQ(Front(), "Groundwater Leakage");
+        dialog->findChild<QPushButton*>("replaceAll")->click();
+        static_cast<QDialog*>(dialog)->reject();
+    });
+    RunOnCells(grid, GridAction::Replace);
+    EXPECT_EQ(parameters.InitList.GetAt(0).RiverName, "TRUNK");
+    EXPECT_EQ(parameters.LeakageList.GetAt(0).RiverName, "TRUNK");
+    EXPECT_EQ(view->GetDocument()->UndoStack().count(), 1);
+    view->GetDocument()->UndoStack().undo();
+    EXPECT_EQ(parameters.InitList.GetAt(0).RiverName, "MAIN");
+    EXPECT_EQ(parameters.LeakageList.GetAt(0).RiverName, "MAIN");
 }
 
 } // namespace

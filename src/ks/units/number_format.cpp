@@ -87,10 +87,9 @@ double KsFifteenDigits(double value, double of)
     // 2^exponent is not more than the number, and 1233/4096 the decimal logarithm of 2 as far as there are powers.
     const int exponent = int(std::bit_cast<std::uint64_t>(of) >> 52 & 0x7ff) - 1023;
     int power = 14 - (exponent * 1233 >> 12);
-    if (power >= 1 && power <= LargestPower && std::fabs(of) * powers[std::size_t(power)] >= MostDigits)
-        --power;
     if (power < 0 || power > LargestPower)
         return value;
+    power -= int(power >= 1) & int(std::fabs(of) * powers[std::size_t(power)] >= MostDigits); // nobody foresees which
     const double scale = powers[std::size_t(power)];
     return double(std::int64_t(value * scale + std::copysign(0.5, value))) / scale;
 }

@@ -185,6 +185,20 @@ void CGenPropertyPage::Run(CGenGrid&, GridAction action)
     }
 }
 
+std::vector<HostTable> CGenPropertyPage::TablesOfPage(CGenGrid&)
+{
+    std::vector<HostTable> tables;
+    for (CGenGrid* grid : m_grids)
+        if (grid->isVisibleTo(this) && grid->isEnabled() && grid->Model()->Rows())
+            tables.push_back({{}, grid});
+    return tables;
+}
+
+std::vector<HostTable> CGenPropertyPage::TablesOfDocument()
+{
+    return m_host ? m_host->TablesOfDocument() : std::vector<HostTable>();
+}
+
 QStringList CGenPropertyPage::BranchNames()
 {
     return m_host ? m_host->BranchNames() : QStringList();

@@ -61,6 +61,8 @@ public:
     void Run(CGenGrid& grid, GridAction action) override;
     std::vector<std::pair<QString, double>> CrossSections() override;
     bool CanSearch(const CGenGrid& grid) const override { return &grid == m_grid; }
+    std::vector<HostTable> TablesOfPage(CGenGrid& grid) override;
+    std::vector<HostTable> TablesOfDocument() override;
     QStringList BranchNames() override;
 
     /// The help command: what the keys do on this page.

@@ -1,6 +1,7 @@
 // What a page and its grid ask of the view that hosts them.
 #pragma once
 
+#include "grid/grid_host.h"
 #include "grid/grid_search.h"
 
 #include <QStringList>
@@ -24,6 +25,8 @@ public:
     virtual void CurrentLocationChanged() = 0;
     /// Carries out one of the view's commands.
     virtual void Execute(int command) = 0;
+    /// The tables of all pages, each list once.
+    virtual std::vector<HostTable> TablesOfDocument() { return {}; }
     /// Branch names of the project's network; empty outside a project.
     virtual QStringList BranchNames() = 0;
     /// Enables or greys the "Lines" menu (third menu of the main frame).
