@@ -799,5 +799,105 @@
         <source>Give the selected cells the global value of their column</source>
         <translation>選択したセルをその列の全体値にします</translation>
     </message>
+    <message>
+        <source>Find and Replace...</source>
+        <translation>検索と置換...</translation>
+    </message>
+    <message>
+        <source>Find texts, numbers or ranges of numbers, and replace them</source>
+        <translation>文字列、数値、数値の範囲を検索して置換します</translation>
+    </message>
+    <message>
+        <source>Fi&amp;nd:</source>
+        <translation>検索(&amp;N):</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>検索</translation>
+    </message>
+    <message>
+        <source>Re&amp;place with:</source>
+        <translation>置換後(&amp;P):</translation>
+    </message>
+    <message>
+        <source>Replace with</source>
+        <translation>置換後</translation>
+    </message>
+    <message>
+        <source>Texts; of numbers 5, &gt;3, &lt;=3 or 2..5; &quot;&quot; for empty cells. Numbers are in the units shown, and may become a formula: =value*1.1</source>
+        <translation>文字列。数値は 5、&gt;3、&lt;=3、2..5。空のセルは &quot;&quot;。数値は表示中の単位で、=value*1.1 のような数式に置換できます</translation>
+    </message>
+    <message>
+        <source>&amp;Whole cells only</source>
+        <translation>セル全体が一致するものだけ(&amp;W)</translation>
+    </message>
+    <message>
+        <source>&amp;Capitals and small letters differ</source>
+        <translation>大文字と小文字を区別する(&amp;C)</translation>
+    </message>
+    <message>
+        <source>In the c&amp;olumn &quot;%1&quot;</source>
+        <translation>列「%1」内(&amp;O)</translation>
+    </message>
+    <message>
+        <source>On this pa&amp;ge</source>
+        <translation>このページ内(&amp;G)</translation>
+    </message>
+    <message>
+        <source>In this &amp;table</source>
+        <translation>この表内(&amp;T)</translation>
+    </message>
+    <message>
+        <source>In the whole &amp;document</source>
+        <translation>文書全体(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Cells found</source>
+        <translation>見つかったセル</translation>
+    </message>
+    <message>
+        <source>Page</source>
+        <translation>ページ</translation>
+    </message>
+    <message>
+        <source>&amp;Find Next</source>
+        <translation>次を検索(&amp;F)</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>置換(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Replace &amp;All</source>
+        <translation>すべて置換(&amp;A)</translation>
+    </message>
+    <message>
+        <source>stays: %1</source>
+        <translation>変更なし: %1</translation>
+    </message>
+    <message>
+        <source>Nothing found.</source>
+        <translation>見つかりません。</translation>
+    </message>
+    <message>
+        <source>1 cell found</source>
+        <translation>1 個のセルが見つかりました</translation>
+    </message>
+    <message>
+        <source>%1 cells found</source>
+        <translation>%1 個のセルが見つかりました</translation>
+    </message>
+    <message>
+        <source>1 would change.</source>
+        <translation>1 個が変わります。</translation>
+    </message>
+    <message>
+        <source>%1 would change.</source>
+        <translation>%1 個が変わります。</translation>
+    </message>
+    <message>
+        <source>Lines that a filter hides are left alone.</source>
+        <translation>絞り込みで隠れている行は対象外です。</translation>
+    </message>
 </context>
 </TS>
