@@ -3,9 +3,11 @@
 #include "grid/filter_fields.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_menus.h"
+#include "grid/grid_widths.h"
 #include "grid/lines_view.h"
 
 #include <QContextMenuEvent>
+#include <QGuiApplication>
 #include <QLabel>
 #include <QMenu>
 #include <QScrollBar>
@@ -25,6 +27,10 @@ CGridHeader::CGridHeader(CGenGrid& grid)
     connect(this, &QHeaderView::sectionDoubleClicked, this,
             [this](int column) { LinesView::SortByClick(m_grid, column); });
     connect(this, &QHeaderView::sectionResized, m_fields, &CFilterFields::Place);
+    connect(this, &QHeaderView::sectionResized, this, [this] {
+        if (QGuiApplication::mouseButtons().testFlag(Qt::LeftButton)) // by the user, not to make room
+            m_grid.Widths().SetChosen();
+    });
     connect(grid.horizontalScrollBar(), &QScrollBar::valueChanged, m_fields, &CFilterFields::Place);
     connect(grid.horizontalScrollBar(), &QScrollBar::rangeChanged, this, &CGridHeader::ShowCount);
     connect(grid.Model(), &CGridModel::ViewChanged, this, [this] {

@@ -141,6 +141,15 @@ void CGridWidths::MakeRoom()
         m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, m_grid.columnWidth(column)));
 }
 
+void CGridWidths::Choose(const QVariantList& widths)
+{
+    constexpr int least = 16, most = 2000; // pixels, whatever stands in settings
+    Update();
+    for (int column = 0; column < std::min(int(widths.size()), m_grid.ColumnCount()); ++column)
+        m_grid.setColumnWidth(column, std::clamp(widths[column].toInt(), least, most));
+    m_areChosen = true;
+}
+
 void CGridWidths::Fit(int column)
 {
     m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, 2 * Margin));

@@ -3,6 +3,7 @@
 
 #include <QFontMetricsF>
 #include <QObject>
+#include <QVariantList>
 #include <array>
 
 class CGenGrid;
@@ -19,6 +20,11 @@ public:
     void Reset();
     /// Makes columns wider that their texts do not fit into; what the user has made wider stays.
     void MakeRoom();
+    /// Whether the user has made a column wider or narrower.
+    bool AreChosen() const { return m_areChosen; }
+    void SetChosen() { m_areChosen = true; }
+    /// The widths that he has chosen, one a column.
+    void Choose(const QVariantList& widths);
     /// A column becomes as wide as its header and its texts need, be it wider or narrower.
     void Fit(int column);
     void MakeRoomForMarks();
@@ -42,5 +48,6 @@ private:
 
     CGenGrid& m_grid;
     Letters m_letters;
+    bool m_areChosen = false;
     int m_columnsSet = 0; // from then on their widths are the user's
 };

@@ -2,6 +2,7 @@
 
 #include "grid/gen_grid.h"
 #include "grid/grid_commands.h"
+#include "grid/grid_state.h"
 #include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
@@ -20,7 +21,8 @@
 
 namespace {
 
-constexpr int LinesMenuPosition = 2; // the third menu of the main frame
+const QString FrontState = QStringLiteral("front"); // of the tabs
+constexpr int LinesMenuPosition = 2;                // the third menu of the main frame
 
 } // namespace
 
@@ -36,6 +38,7 @@ CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CKsProjectView(parent)
 
 CKavo0_hdView::~CKavo0_hdView()
 {
+    KeepArrangement();
     disconnect(qApp, nullptr, this, nullptr); // the focus leaves the pages as they go
     delete m_sheet;                           // while this is still a host
 }
@@ -63,12 +66,45 @@ void CKavo0_hdView::OnInitialUpdate()
     CKsProjectView::OnInitialUpdate();
     AddTabs();
     connect(m_sheet, &CDlgPropertySheet::PageChanged, this, [this] {
+        RestorePage(m_sheet->currentIndex());
         MovedOn();
         TellLocationIfOther();
     });
+    m_arranged = KeptArrangement();
     if (auto* page = ActivePage())
         page->OnSetActive();
+    RestorePage(m_sheet->currentIndex());
+    m_sheet->SetActivePage(m_arranged[FrontState].toInt());
     KsAfterPaint(this, this, [this] { MakeOtherPages(); });
+}
+
+/// The list of a page, once, when the page is first in front: whoever looks at one page waits for no other.
+void CKavo0_hdView::RestorePage(int tab)
+{
+    const QString key = QString::number(tab);
+    const auto* page = m_restored.contains(tab) ? nullptr : ActivePage();
+    if (!page)
+        return;
+    m_restored.insert(tab);
+    if (page->GetGrid() && page->GetList())
+        GridState::Restore(*page->GetGrid(), m_arranged[key].toMap());
+}
+
+/// By the tabs of the pages. Of those that were not looked at stays what was known.
+QVariantMap CKavo0_hdView::Arrangement() const
+{
+    QVariantMap state = m_arranged;
+    if (!m_sheet)
+        return state;
+    for (const int tab : m_restored) {
+        const auto* page = m_sheet->PageAt(tab);
+        const QVariantMap list = page->GetGrid() && page->GetList() ? GridState::Of(*page->GetGrid()) : QVariantMap();
+        list.isEmpty() ? void(state.remove(QString::number(tab))) : void(state[QString::number(tab)] = list);
+    }
+    state.remove(FrontState);
+    if (const int front = m_sheet->currentIndex(); front > 0)
+        state[FrontState] = front;
+    return state;
 }
 
 void CKavo0_hdView::AddTabs()

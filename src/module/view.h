@@ -5,6 +5,7 @@
 #include "ks/fc/project_view.h"
 #include "pages/framework/page_host.h"
 
+#include <QSet>
 #include <QString>
 
 class CDlgPropertySheet;
@@ -62,6 +63,8 @@ private:
     void TellLocation();
     std::pair<CString, double> CurrentLocation() const;
 
+    QVariantMap Arrangement() const override;
+    void RestorePage(int tab);
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
     void MakeOtherPages();
@@ -70,6 +73,8 @@ private:
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_tellLocation = false;                               // once the present event is over
     std::pair<CString, double> m_toldLocation;
+    QVariantMap m_arranged; // what was kept for the file
+    QSet<int> m_restored;   // the tabs whose pages have been given theirs
     CGridSearch m_search;
     bool m_linesEnabled = true;
 };

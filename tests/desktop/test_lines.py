@@ -128,3 +128,32 @@ class InsertedAndMoved(Case):
         wait_for(lambda: '2 lines inserted' in editor.status(), 'what was done is said', 3)
         editor.save()
         self.assertEqual(self.saved().records('InitList')[2:4], ['"MOORBECK", 0, 3.5, 12', '"MOORBECK", 1000, 3.5, 12'])
+
+
+class ComingBack(Case):
+    """What the user has arranged is there again when the file is opened again; the file holds nothing of it."""
+
+    def test_page_order_filter_and_cell(self):
+        text = samples.hd_text({'InitList': LINES, 'WindList': ['"ELBE", 10, 0.5', '"RHINE", 20, 0.6', '"ELBE", 30, 0.7']})
+        editor = self.open(text)
+        editor.click_cell(1, 2)
+        editor.press('ctrl+shift+d')
+        editor.go_to('Wind')
+        editor.click_cell(2, 1)
+        editor.press('ctrl+shift+f')
+        editor.type('elb')
+        wait_for(lambda: editor.table().lines == 2, 'two lines pass the filter', 3)
+        editor.press('Down', 'Down', 'Right')
+        place = editor.status()
+        self.assertIn('Line 3 of 3', place)
+        editor.press('ctrl+F4')
+        editor.menu('File', 'Open Recent', '/moor.HDKV')
+        wait_for(lambda: editor.current_page() == 'Wind', 'the page is in front again', 5)
+        wait_for(lambda: editor.status() == place, f'{place} again, not {editor.status()}', 5)
+        self.assertEqual(editor.table().lines, 2)
+        editor.go_to('Initial')
+        table = editor.table()
+        self.assertEqual([table.cell(line, 2).name for line in range(1, 5)], ['300', '100', '100', '50'])
+        self.assertFalse(editor.modified)
+        editor.press('ctrl+shift+o')
+        self.assertEqual([table.cell(line, 2).name for line in range(1, 5)], ['300', '100', '100', '50'])

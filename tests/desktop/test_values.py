@@ -52,9 +52,9 @@ class Levels(Case):
                                            {'WaterLevelMarkTitles': ['MarkTitles = 1, "FLOOD"',
                                                                      'MarkInterpolate = 1, true']}))
         editor.go_to('User Def. Marks')
-        self.assertEqual(editor.table('Local values').line(1)[2], '10')
+        self.assertEqual(editor.table('Local Values').line(1)[2], '10')
         editor.menu('View', 'Units', 'US Customary')
-        wait_for(lambda: editor.table('Local values').line(1)[2].startswith('32.8'), 'the level is shown in feet', 3)
+        wait_for(lambda: editor.table('Local Values').line(1)[2].startswith('32.8'), 'the level is shown in feet', 3)
 
     def test_first_line_follows_the_global_value(self):
         """The line that an empty list is shown with takes the values of the moment it is named."""

@@ -53,9 +53,20 @@ class Desk:
         table, line, column = self._cell
         self._value += 1
         value = f'1.{self._value:04}1'
-        self._editor.put(line, column, value, leave='Return', table=self._editor.table(table))
+        self._click(line, column, table)
+        self._editor.type(value)
+        self._editor.press('Return')
         # The value is the only thing that may be new, once the file has been written as the program writes it.
         return re.sub(re.escape(self._before) + r'[^,\n]*', self._before + value, self._guarded.content(), count=1)
+
+    def _click(self, line, column, table):
+        """A bar above the table that goes just now takes the cell away from below the mouse."""
+        for _ in range(5):
+            self._editor.click_cell(line, column, self._editor.table(table))
+            if self._editor.status().startswith(f'Line {line} of'):
+                return
+            time.sleep(0.5)
+        raise RuntimeError(f'line {line} is not reached: {self._editor.status()}')
 
     def save(self, point=None):
         """Changes something and saves, with a fault. Gives back the calls that the save took and what did not hold

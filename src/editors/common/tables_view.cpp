@@ -2,6 +2,7 @@
 
 #include "editors/common/branch_names.h"
 #include "grid/grid_keys.h"
+#include "grid/grid_state.h"
 #include "grid/grid_widths.h"
 #include "grid/lines_view.h"
 
@@ -14,8 +15,11 @@
 #include <algorithm>
 #include <utility>
 
+static const QString MainState = QStringLiteral("main");
+
 CTablesView::~CTablesView()
 {
+    KeepArrangement();
     for (CGenGrid* table : m_tables) { // it goes later, and must not report to what is left of this
         table->SetHost(nullptr);
         table->selectionModel()->disconnect(this);
@@ -67,6 +71,7 @@ void CTablesView::OnInitialUpdate()
     CKsProjectView::OnInitialUpdate();
     Retranslate();
     ShowDocument();
+    GridState::Restore(*m_main.grid, KeptArrangement()[MainState].toMap());
     connect(
         &KsUnits::Instance(), &KsUnits::Changed, this,
         [this] {
@@ -111,6 +116,12 @@ void CTablesView::LineCurrent(CGenGrid& grid)
 {
     if (&grid == m_main.grid)
         ShowParts();
+}
+
+QVariantMap CTablesView::Arrangement() const
+{
+    const QVariantMap main = m_main.grid ? GridState::Of(*m_main.grid) : QVariantMap();
+    return main.isEmpty() ? QVariantMap() : QVariantMap{{MainState, main}};
 }
 
 void CTablesView::ShowDocument()

@@ -77,6 +77,7 @@ protected:
     void OnProjectsChanged() override;
     void RevealChange(const ChangePlace& place) override;
 
+    QVariantMap Arrangement() const override;
     CString PlaceText() const override { return m_lines ? m_lines->LineText() : CString(); }
     CString SelectionText() const override { return m_lines ? m_lines->SelectionText() : CString(); }
     void changeEvent(QEvent* event) override;

@@ -3,6 +3,7 @@
 #include "ks/fc/after_paint.h"
 #include "ks/fc/file_bar.h"
 #include "ks/fc/outside_change.h"
+#include "ks/fc/view_states.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 
@@ -52,7 +53,20 @@ void CKsProjectView::OnActivateView(bool activate, CView* activated, CView* deac
     } else if (activated && (activated == deactivated || activated->metaObject() != metaObject())) {
         SendToolbarMessage(KsMessage::HideToolbar()); // another editor's turn
     }
+    if (!activate)
+        KeepArrangement(); // the program may not come to its end
     CView::OnActivateView(activate, activated, deactivated);
+}
+
+void CKsProjectView::KeepArrangement() const
+{
+    if (ProjectDoc())
+        KsViewStates::Keep(ProjectDoc()->GetPathName(), Arrangement());
+}
+
+QVariantMap CKsProjectView::KeptArrangement() const
+{
+    return KsViewStates::Of(ProjectDoc()->GetPathName());
 }
 
 CKsMDIFrameWnd* CKsProjectView::MainFrame() const

@@ -6,6 +6,8 @@
 #include "ks/fc/frames.h"
 #include "ks/fc/project_doc.h"
 
+#include <QVariantMap>
+
 class KS_API CKsProjectView : public CView, public CCommandTarget
 {
     Q_OBJECT
@@ -27,6 +29,12 @@ protected:
     virtual void OnProjectsChanged() {}
     /// Brings a change that was undone or redone into view.
     virtual void RevealChange(const ChangePlace&) {}
+    /// How the user has arranged the view, for the next time that its file is opened; empty for a view as it comes.
+    virtual QVariantMap Arrangement() const { return {}; }
+    /// The derived view does so when it goes, before its content does.
+    void KeepArrangement() const;
+    /// What was kept for the file.
+    QVariantMap KeptArrangement() const;
     /// Where the user is, for the status bar.
     virtual CString PlaceText() const { return {}; }
     /// What is selected there. It may come later, and ends nothing that is told.
