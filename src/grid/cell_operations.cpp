@@ -76,7 +76,7 @@ CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block)
     CCellResults results(rows, block);
     ForCells(rows, block, [&](int row, int column) {
         if (const ColumnSpec& spec = rows.Column(column); spec.fill && row >= rows.FixedRows())
-            results.Add(row, column, rows.Value(row, column), spec.FillValue());
+            results.Add(row, column, rows.Value(row, column), spec.GlobalValue());
     });
     return results;
 }

@@ -130,6 +130,8 @@ struct ColumnSpec
     /// The cells have no editor: a click or the space bar acts at once.
     bool ActsAtOnce() const { return Kind() == CellKind::Flag || Kind() == CellKind::Button; }
     bool IsLocked(const void* row) const { return locked && locked(row); }
+    /// The global value that a cell of a line stands in for.
+    CellValue GlobalValue() const { return *fill; }
     /// `fill` as the stored value that a cell with that text has.
     CellValue FillValue() const { return style.UnitConvertFromBase(*fill, 0); }
     /// What an emptied cell is stored as when nothing fills it.

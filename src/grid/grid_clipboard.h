@@ -6,6 +6,8 @@ class CGenGrid;
 bool CanCopyCells(const CGenGrid& grid);
 /// Puts the selected cells of a grid, or the current one, on the clipboard.
 void CopyCells(const CGenGrid& grid);
+/// Likewise below a line with the columns' headers and units.
+void CopyCellsWithHeaders(const CGenGrid& grid);
 bool CanPasteCells(const CGenGrid& grid);
 /// Pastes at the selection. False, after a message, when a cell refuses its text; then nothing changed.
 bool PasteCells(CGenGrid& grid);

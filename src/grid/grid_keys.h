@@ -23,6 +23,7 @@ enum class GridAction
     DeleteLine,
     SelectLine,
     Copy,
+    CopyWithHeaders,
     Paste,
     Cut,
     Clear,

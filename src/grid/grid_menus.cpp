@@ -41,6 +41,7 @@ public:
         m_menu.addSeparator();
         Add(GridAction::Cut);
         Add(GridAction::Copy, m_copies);
+        Add(GridAction::CopyWithHeaders, m_copies);
         Add(GridAction::Paste, m_pastes);
     }
     void AddLines()

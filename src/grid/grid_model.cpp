@@ -132,8 +132,14 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
         if (column.Kind() != CellKind::Flag)
             return {};
         return value() == CellValue(std::int32_t(0)) ? Qt::Unchecked : Qt::Checked;
-    case Qt::ToolTipRole:
-        return CellToolTip(column, value());
+    case Qt::ToolTipRole: {
+        const QString text = CellToolTip(column, value());
+        return IsGlobalValue(index.row(), index.column()) ? text + u'\n' + GridTexts::tr("The global value") : text;
+    }
+    case Qt::ForegroundRole: // what is no line's own stands back
+        return IsGlobalValue(index.row(), index.column())
+                   ? QVariant(QGuiApplication::palette().brush(QPalette::PlaceholderText))
+                   : QVariant();
     case Qt::BackgroundRole:
         return IsLocked(index.row(), index.column()) ? QVariant(LockedBackground()) : QVariant();
     default:

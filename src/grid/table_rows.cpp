@@ -1,5 +1,6 @@
 #include "grid/table_rows.h"
 
+#include "grid/cell_changes.h"
 #include "grid/cell_text.h"
 #include "grid/grid_texts.h"
 #include "grid/row_filter.h"
@@ -151,6 +152,22 @@ bool CTableRows::HidesDigits(int row, int column) const
         return false;
     const CellValue value = Value(row, column);
     return ::HidesDigits(spec, value, ShownText(spec, value));
+}
+
+bool CTableRows::IsGlobalValue(int row, int column) const
+{
+    const ColumnSpec& spec = Column(column);
+    return spec.fill && row >= FixedRows() && IsRow(row) && SameCell(Value(row, column), spec.GlobalValue());
+}
+
+std::size_t CTableRows::OverrideCount(int column) const
+{
+    const ColumnSpec& spec = Column(column);
+    const CellValue global = spec.GlobalValue();
+    std::size_t count = 0;
+    for (std::size_t row = m_rows->FixedRows(); row < m_rows->Count(); ++row)
+        count += !SameCell(spec.access->get(m_rows->At(row)), global);
+    return count;
 }
 
 CellValue CTableRows::Resolved(int column, const CellValue& value, BlankRule rule) const

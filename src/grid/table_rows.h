@@ -55,6 +55,10 @@ public:
     bool IsLocked(int row, int column) const;
     /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
     bool HidesDigits(int row, int column) const;
+    /// The cell of a line holds what is the global value of its column.
+    bool IsGlobalValue(int row, int column) const;
+    /// How many lines of the source have another value in this column, which has a global value.
+    std::size_t OverrideCount(int column) const;
     /// Writes what the row's cells hold into an object of the source's kind.
     void CopyRow(int row, void* target) const;
 

@@ -181,11 +181,22 @@ void CKavo0_hdView::CurrentLocationChanged()
         TellLocationLater();
 }
 
+/// Its whole number where it leaves digits out, and how many lines go their own way. That is counted once a step.
+CString CKavo0_hdView::FieldText(const CCtrlEdit& field) const
+{
+    const std::pair<const void*, int> now{&field, GetDocument()->UndoStack().index()};
+    if (std::exchange(m_countedAt, now) != now)
+        m_overrides = ActivePage() ? ActivePage()->OverridesText(field) : CString();
+    QStringList texts{field.FullText(), m_overrides};
+    texts.removeAll(CString());
+    return texts.join(QStringLiteral("   "));
+}
+
 /// The line of the table that is worked in, or the field; and its number where it leaves digits out.
 CString CKavo0_hdView::PlaceText() const
 {
     if (const auto* field = qobject_cast<const CCtrlEdit*>(QApplication::focusWidget()); field && isAncestorOf(field))
-        if (const QString text = field->FullText(); !text.isEmpty())
+        if (const QString text = FieldText(*field); !text.isEmpty())
             return text;
     const auto* page = ActivePage();
     const auto* grid = page ? page->LinesGrid() : nullptr;

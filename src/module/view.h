@@ -8,6 +8,7 @@
 #include <QSet>
 #include <QString>
 
+class CCtrlEdit;
 class CDlgPropertySheet;
 class CGenPropertyPage;
 struct PageEntry;
@@ -64,6 +65,7 @@ private:
     std::pair<CString, double> CurrentLocation() const;
 
     QVariantMap Arrangement() const override;
+    CString FieldText(const CCtrlEdit& field) const;
     void RestorePage(int tab);
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);
@@ -73,6 +75,8 @@ private:
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_tellLocation = false;                               // once the present event is over
     std::pair<CString, double> m_toldLocation;
+    mutable std::pair<const void*, int> m_countedAt; // the field and the step for which lines were counted
+    mutable CString m_overrides;
     QVariantMap m_arranged; // what was kept for the file
     QSet<int> m_restored;   // the tabs whose pages have been given theirs
     CGridSearch m_search;

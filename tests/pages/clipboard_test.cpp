@@ -49,6 +49,26 @@ TEST_F(ClipboardTest, CopiesWholeNumbersInDisplayUnits)
     EXPECT_NEAR(Copied().toDouble(), 21 * 35.3147, 0.01);
 }
 
+TEST_F(ClipboardTest, HeadersGoWithWhatIsCopiedAndAreNoLineWhenPasted)
+{
+    const auto copied = [this] {
+        QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier | Qt::ShiftModifier);
+        return QGuiApplication::clipboard()->text();
+    };
+    Select(1, 2, 2, 3);
+    EXPECT_EQ(copied(), "Chainage [m]\tInitial h [m]\n1.25\t0.1\n\t11");
+    grid->SetCurrentCell(1, 2);
+    QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier);
+    EXPECT_EQ(Stored(), "A 1.25 0.1 20, B 10000000000 11 21");
+    EXPECT_EQ(document.UndoStack().count(), 0) << "what was copied is pasted where it was";
+    Paste(2, 2, "chainage\tInitial h\n7\t8\n9\t10\n");
+    EXPECT_EQ(Stored(), "A 1.25 0.1 20, B 7 8 21,  9 10 0");
+    const auto block = grid->SelectedBlock();
+    ASSERT_TRUE(block);
+    EXPECT_EQ(std::pair(block->top(), block->bottom()), std::pair(1, 2)) << "what was pasted is selected";
+    EXPECT_EQ(Current(), std::pair(2, 2));
+}
+
 TEST_F(ClipboardTest, PastesRectangles)
 {
     Paste(2, 2, "7\t8\n"); // a part of one line

@@ -43,6 +43,32 @@ TEST_F(InitPageTest, EmptyListShowsTheGlobalValues)
     EXPECT_EQ(init.GetCount(), 0u);
 }
 
+TEST_F(InitPageTest, WhatIsTheGlobalValueStandsBackAndTheOthersAreCounted)
+{
+    globals.G_waterlevel = 10;
+    globals.G_discharge = 3;
+    for (const double level : {10.0, 11.0, 10.0})
+        Add("A", level, level, 20);
+    Open(MakeInitPage);
+    const auto standsBack = [this](int row, int column) {
+        return grid->model()->index(row - 1, column - 1).data(Qt::ForegroundRole).isValid();
+    };
+    EXPECT_TRUE(standsBack(1, 3) && standsBack(3, 3));
+    EXPECT_FALSE(standsBack(2, 3) || standsBack(1, 4) || standsBack(1, 2));
+    EXPECT_TRUE(grid->model()->index(0, 2).data(Qt::ToolTipRole).toString().endsWith("\nThe global value"));
+    const auto overrides = [this](const char* field) {
+        return view->page->OverridesText(*Find<CCtrlEdit>(field)).toStdString();
+    };
+    EXPECT_EQ(overrides("levelOrDepth_1001"), "1 of 3 lines have another value");
+    EXPECT_EQ(overrides("discharge_1002"), "3 of 3 lines have another value");
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    EXPECT_TRUE(standsBack(1, 3)) << "it is the same level in feet";
+    grid->SetCurrentCell(2, 3);
+    QTest::keyClick(grid, Qt::Key_G, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(init.GetAt(1).InitialH, 10);
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+}
+
 TEST_F(InitPageTest, TheLineOfAnEmptyListFollowsTheGlobalValuesUntilItIsTouched)
 {
     globals.G_waterlevel = 3.5;

@@ -899,5 +899,21 @@
         <source>Lines that a filter hides are left alone.</source>
         <translation>絞り込みで隠れている行は対象外です。</translation>
     </message>
+    <message>
+        <source>; the line with the headers was left out</source>
+        <translation>（見出しの行は除きました）</translation>
+    </message>
+    <message>
+        <source>Copy with Headers</source>
+        <translation>見出し付きでコピー</translation>
+    </message>
+    <message>
+        <source>Copy the selected cells below the headers and units of their columns</source>
+        <translation>選択したセルを、列の見出しと単位の行を付けてコピーします</translation>
+    </message>
+    <message>
+        <source>The global value</source>
+        <translation>全体値</translation>
+    </message>
 </context>
 </TS>

@@ -217,6 +217,22 @@ std::vector<std::pair<QString, double>> CGenPropertyPage::CrossSections()
     return sections;
 }
 
+QString CGenPropertyPage::OverridesText(const QWidget& field) const
+{
+    for (const CGenGrid* grid : m_grids) {
+        const CGridModel& model = *grid->Model();
+        for (int column = 0; model.Rows() && column < model.columnCount(); ++column) {
+            const double* const global = model.Column(column).fill;
+            if (!global || m_bindings.ControlFor(global) != &field || model.LineCount() == 0)
+                continue;
+            return tr("%1 of %2 lines have another value")
+                .arg(model.OverrideCount(column))
+                .arg(model.LineCount());
+        }
+    }
+    return {};
+}
+
 void CGenPropertyPage::OnHelp()
 {
     const QPoint middle(width() / 3, height() / 4);

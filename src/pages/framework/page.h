@@ -65,6 +65,8 @@ public:
     std::vector<HostTable> TablesOfDocument() override;
     QStringList BranchNames() override;
 
+    /// How many lines have another value than the global one in a field; empty for another field.
+    QString OverridesText(const QWidget& field) const;
     /// The help command: what the keys do on this page.
     virtual void OnHelp();
     /// Whether what changed is edited on this page.

@@ -152,6 +152,13 @@
     </message>
 </context>
 <context>
+    <name>CGenPropertyPage</name>
+    <message>
+        <source>%1 of %2 lines have another value</source>
+        <translation>%2 行中 %1 行が別の値です</translation>
+    </message>
+</context>
+<context>
     <name>CHeatBalancePage</name>
     <message>
         <source>Heat Balance Calculation</source>
