@@ -6,6 +6,7 @@
 #include "grid/grid_commands.h"
 #include "grid/grid_host.h"
 #include "grid/grid_input.h"
+#include "grid/grid_texts.h"
 #include "grid/grid_widths.h"
 #include "grid/line_commands.h"
 #include "grid/lines_view.h"
@@ -82,7 +83,7 @@ void GridMenus::AddForCells(QMenu& menu, CGenGrid& grid)
         entries.Add(GridAction::Search, true);
     }
     menu.addSeparator();
-    LinesView::AddTo(menu, grid, std::max(0, grid.CurrentColumn() - 1));
+    LinesView::AddTo(*menu.addMenu(GridTexts::tr("Sort and Filter")), grid, std::max(0, grid.CurrentColumn() - 1));
 }
 
 void GridMenus::AddForLines(QMenu& menu, CGenGrid& grid)

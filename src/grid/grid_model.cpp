@@ -30,6 +30,18 @@ QBrush LockedBackground()
 
 } // namespace
 
+namespace {
+
+/// A theme may have a color for such texts that nobody sees.
+QBrush PaleText()
+{
+    QColor color = QGuiApplication::palette().color(QPalette::Text);
+    color.setAlphaF(0.6F);
+    return color;
+}
+
+} // namespace
+
 // ---- what views see ----------------------------------------------------------------------------
 
 void CGridModel::AddColumn(ColumnSpec column)
@@ -137,9 +149,7 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
         return IsGlobalValue(index.row(), index.column()) ? text + u'\n' + GridTexts::tr("The global value") : text;
     }
     case Qt::ForegroundRole: // what is no line's own stands back
-        return IsGlobalValue(index.row(), index.column())
-                   ? QVariant(QGuiApplication::palette().brush(QPalette::PlaceholderText))
-                   : QVariant();
+        return IsGlobalValue(index.row(), index.column()) ? QVariant(PaleText()) : QVariant();
     case Qt::BackgroundRole:
         return IsLocked(index.row(), index.column()) ? QVariant(LockedBackground()) : QVariant();
     default:

@@ -168,6 +168,7 @@ private:
             List(place, replaced.results.Changed(), QString());
             List(place, replaced.results.Kept(), GridTexts::tr("stays: %1"));
         }
+        m_list->setColumnHidden(0, !m_inDocument->isChecked());
         m_list->resizeColumnsToContents();
         m_takesLong = time.elapsed() > 50;
         ShowSummary(found, changed, isFiltered);

@@ -1,5 +1,7 @@
 #include "random_user.h"
 
+#include "grid/grid_keys.h"
+
 #include "module/data_tables.h"
 #include "module/sheet.h"
 #include "open_editor.h"
@@ -79,10 +81,10 @@ void RandomUser::DoSomething()
     m_typed.clear();
     m_done.clear();
     static constexpr void (RandomUser::*Things[])() = {
-        &RandomUser::TypeIntoCell,  &RandomUser::TypeIntoCell,  &RandomUser::TypeIntoCell, &RandomUser::TypeIntoCell,
-        &RandomUser::TypeIntoField, &RandomUser::TypeIntoField, &RandomUser::ActOnControl, &RandomUser::ActOnControl,
-        &RandomUser::Paste,         &RandomUser::InsertLine,    &RandomUser::DeleteLines,  &RandomUser::Request,
-        &RandomUser::ChangePage,    &RandomUser::ChangePage};
+        &RandomUser::TypeIntoCell,  &RandomUser::TypeIntoCell,  &RandomUser::TypeIntoCell,  &RandomUser::TypeIntoCell,
+        &RandomUser::TypeIntoField, &RandomUser::TypeIntoField, &RandomUser::ActOnControl,  &RandomUser::ActOnControl,
+        &RandomUser::Paste,         &RandomUser::InsertLine,    &RandomUser::DeleteLines,   &RandomUser::Request,
+        &RandomUser::ChangePage,    &RandomUser::ChangePage,    &RandomUser::CommandInGrid, &RandomUser::CommandInGrid};
     (this->*Things[Pick(std::size(Things))])();
     QCoreApplication::processEvents();
 }
@@ -272,6 +274,25 @@ void RandomUser::DeleteLines()
     SelectLines(*grid);
     m_done += " delete";
     Press(Qt::Key_Delete);
+}
+
+/// Commands on lines and cells that ask nothing, and those that only change what is seen.
+void RandomUser::CommandInGrid()
+{
+    static constexpr GridAction actions[] = {
+        GridAction::InsertAbove, GridAction::InsertBelow,   GridAction::Duplicate, GridAction::Duplicate,
+        GridAction::MoveUp,      GridAction::MoveDown,      GridAction::MoveDown,  GridAction::Cut,
+        GridAction::Clear,       GridAction::ResetToGlobal, GridAction::FillDown,  GridAction::SortAscending,
+        GridAction::SortByPlace, GridAction::FileOrder,     GridAction::FileOrder};
+    CGenGrid* grid = SomeGrid();
+    if (!grid || !GoToSomeCell(*grid))
+        return;
+    if (Pick(2))
+        SelectLines(*grid);
+    const GridAction action = actions[Pick(std::size(actions))];
+    m_done += QString(" %1 in %2").arg(NameOf(action), NameOf(Page(), *grid));
+    const QKeyCombination key = KeyOf(action)[0];
+    Press(key.key(), key.keyboardModifiers());
 }
 
 void RandomUser::Request()

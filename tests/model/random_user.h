@@ -41,6 +41,7 @@ private:
     void Paste();
     void InsertLine();
     void DeleteLines();
+    void CommandInGrid();
     void Request();
     void ChangePage();
     void Leave(bool isCell);
