@@ -94,7 +94,7 @@ MUTANTS = [
     ('pages', 'grid/find_replace.cpp', 'cell.compare(text, letters) == 0', 'cell.contains(text, letters)'),
     ('pages', 'grid/grid_state.cpp', 'state[Columns].toInt() != grid.ColumnCount()', 'false'),
     ('pages', 'grid/grid_clipboard.cpp', 'cells.size() > 1 && IsHeaderLine', 'false && IsHeaderLine'),
-    ('pages', 'grid/cell_operations.cpp', 'spec.fill && row >= rows.FixedRows()', 'spec.fill && row > rows.FixedRows()'),
+    ('pages', 'grid/table_rows.cpp', 'spec.fill && row >= FixedRows()', 'spec.fill && row > FixedRows()'),
     # Document and pages.
     ('document', 'document/purged_lines.cpp', 'while (all.size() < lines.rows[i])',
      'while (all.size() + 1 < lines.rows[i])'),
