@@ -141,8 +141,8 @@ std::string HolderText(const LockHolder& holder)
     if (!holder.program.empty() || holder.process)
         text += " (" + holder.program + (holder.program.empty() ? "" : ", ") + "process " +
                 std::to_string(holder.process) + ')';
-    if (holder.since)
-        text += " since " + TimeText(holder.since);
+    if (const std::string since = holder.since ? TimeText(holder.since) : std::string(); !since.empty())
+        text += " since " + since;
     return text;
 }
 

@@ -7,6 +7,7 @@
 
 #include <atomic>
 #include <ctime>
+#include <limits>
 #include <thread>
 
 namespace fs = std::filesystem;
@@ -101,6 +102,9 @@ TEST_F(Locks, WhatADeadProgramOrAnybodyElseLeavesIsNoLock)
     const std::string text = HolderText(*second.HeldBy());
     EXPECT_TRUE(text.starts_with("a[2Juuu") && text.size() < 200) << text;
     EXPECT_EQ(HolderText({}), "another program");
+    LockHolder atNoTime;
+    atNoTime.since = std::numeric_limits<std::int64_t>::max();
+    EXPECT_EQ(HolderText(atNoTime), "another program");
 }
 
 TEST_F(Locks, AFolderThatTakesNoneSaysWhy)
