@@ -915,5 +915,9 @@
         <source>The global value</source>
         <translation>全体値</translation>
     </message>
+    <message>
+        <source>Sort and Filter</source>
+        <translation>並べ替えと絞り込み</translation>
+    </message>
 </context>
 </TS>
