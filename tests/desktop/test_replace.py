@@ -17,17 +17,17 @@ class FindAndReplace(Case):
         editor.type(replace)
         if where:
             editor.click(box.find('radio button', where))
-        editor.settle(0.6)
         return box
 
-    def shown(self, box):
-        return '\n'.join(label.text for label in box.all('label'))
+    def wait_for_summary(self, box, text):
+        shown = lambda: '\n'.join(label.text for label in box.all('label'))
+        wait_for(lambda: text in shown(), f'{text} is shown', 5)
 
     def test_a_range_of_numbers_by_a_formula_in_a_column(self):
         editor = self.open(samples.hd_text(LINES))
         editor.click_cell(2, 3)
         box = self.ask('2..5', '=value*10')
-        self.assertIn('2 cells found; 2 would change.', self.shown(box))
+        self.wait_for_summary(box, '2 cells found; 2 would change.')
         editor.click(box.find('push button', 'Replace All'))
         editor.press('Escape')
         editor.save()
@@ -40,7 +40,7 @@ class FindAndReplace(Case):
         editor = self.open(samples.hd_text(LINES))
         editor.click_cell(1, 1)
         box = self.ask('rhine', 'weser', 'In the whole document')
-        self.assertIn('3 cells found; 3 would change.', self.shown(box))
+        self.wait_for_summary(box, '3 cells found; 3 would change.')
         editor.click(box.find('push button', 'Replace All'))
         editor.press('Escape')
         editor.save()
@@ -56,7 +56,7 @@ class FindAndReplace(Case):
         editor = self.open(samples.hd_text(LINES))
         editor.click_cell(1, 3)
         box = self.ask('>0', 'abc')
-        self.assertIn('3 cells found; 0 would change.', self.shown(box))
+        self.wait_for_summary(box, '3 cells found; 0 would change.')
         self.assertFalse(box.find('push button', 'Replace All').enabled)
         editor.press('Escape')
         self.assertFalse(editor.modified)
