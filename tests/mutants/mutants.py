@@ -71,7 +71,7 @@ MUTANTS = [
      'column = m_columns.begin(); column != m_columns.end()'),
     ('grid', 'grid/row_commands.cpp', 'Hold(rows->TakeBack(row, count))', 'Hold(rows->Take(row, count))'),
     ('grid', 'grid/row_commands.cpp', 'row = rows->RowOf(changes.FirstRow(), row);\n', ''),
-    ('grid', 'grid/grid_model.cpp', 'NewLines(1 + OffersRow(), at)', 'NewLines(1, at)'),
+    ('grid', 'grid/grid_model_lines.cpp', 'NewLines(1 + OffersRow(), at)', 'NewLines(1, at)'),
     ('grid', 'grid/grid_model.cpp', 'if (std::exchange(m_headers, headers) != headers)',
      'if (false && std::exchange(m_headers, headers) != headers)'),
     ('common', 'grid/grid_clipboard.cpp', 'top + int(cells.size()) > model.StoredRows()',
