@@ -6,6 +6,7 @@
 
 #include <QString>
 #include <algorithm>
+#include <map>
 
 /// Cells of a table, each bound included; rows and columns count from 0.
 struct CellBlock
@@ -49,7 +50,7 @@ private:
     bool m_hasRules;
     CCellChanges m_changes;
     std::vector<Cell> m_changed, m_kept;
-    std::vector<std::pair<std::pair<int, int>, QString>> m_texts; // of rows that have rules
+    std::map<int, std::map<int, CellValue>> m_ruled; // what changes, by column and row, of rows that have rules
     std::size_t m_keptCount = 0;
     int m_firstRow = 0;
 };

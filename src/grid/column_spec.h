@@ -117,7 +117,8 @@ struct ColumnSpec
     std::int32_t* globalIndex = nullptr;
 
     // What follows from the field.
-    std::string_view name = {}; // of the field in the file
+    std::string_view name = {};              // of the field in the file
+    std::function<QStringList()> names = {}; // that, and what the header says in any language, without its unit
     GridControl control = Control::Number;
     CKsEditStyle style = {}; // unit group and format
     Bounds bounds = {};      // of a number

@@ -92,8 +92,9 @@ CGenGrid::~CGenGrid()
 
 QString CGenGrid::LineText() const
 {
-    const int fixed = m_model->FixedRows(), line = CurrentLine() - fixed, column = CurrentColumn() - 1;
-    const int lines = std::max(m_model->LineCount(), RowCount() - fixed); // with the one that is offered
+    // As the numbers beside the lines have it: that of the global values is the first one, where there is one.
+    const int fixed = m_model->FixedRows(), line = CurrentLine(), column = CurrentColumn() - 1;
+    const int lines = std::max(m_model->LineCount(), RowCount() - fixed) + fixed; // with the one that is offered
     QStringList texts;
     if (line > 0 && column >= 0) {
         QString text = GridTexts::tr("Line %1 of %2").arg(line).arg(lines);

@@ -13,6 +13,7 @@
 
 #include <QApplication>
 #include <QComboBox>
+#include <QElapsedTimer>
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QMdiSubWindow>
@@ -78,10 +79,33 @@ QWidget* MakeBranchList(const QStringList& names, QWidget* parent, QWidget* view
     return list;
 }
 
+/// A list whose entries are found by their letters, blanks among them: only a first blank opens it.
+class CChoiceList : public QComboBox
+{
+public:
+    using QComboBox::QComboBox;
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override
+    {
+        const bool isTyping = m_typed.isValid() && m_typed.elapsed() < QApplication::keyboardInputInterval();
+        const bool isLetter = !event->text().isEmpty() && event->text().at(0).isPrint();
+        if (isLetter && (isTyping || event->key() != Qt::Key_Space))
+            m_typed.start();
+        if (!isTyping || event->key() != Qt::Key_Space)
+            return QComboBox::keyPressEvent(event);
+        QKeyEvent letter(QEvent::KeyPress, Qt::Key_nobreakspace, event->modifiers(), event->text());
+        QComboBox::keyPressEvent(&letter);
+    }
+
+private:
+    QElapsedTimer m_typed;
+};
+
 /// One of a column's entries, by pop-up, arrow keys or first letters; Backspace empties the cell.
 QWidget* MakeChoice(const QStringList& entries, QWidget* parent)
 {
-    auto* list = new QComboBox(parent);
+    auto* list = new CChoiceList(parent);
     list->addItems(entries);
     // Opened by the mouse the entries are what the user wants to see next.
     if (QApplication::mouseButtons() != Qt::NoButton)
@@ -194,7 +218,10 @@ void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cel
     const int x = isRight ? inside.right() + 1 - width : inside.left();
     const int y = inside.top() + (inside.height() - cell.fontMetrics.height() + 1) / 2 + cell.fontMetrics.ascent();
     const bool enabled = cell.state.testFlag(QStyle::State_Enabled);
-    painter->setPen(cell.palette.color(enabled ? QPalette::Normal : QPalette::Disabled, QPalette::Text));
+    const QVariant own = enabled ? index.data(Qt::ForegroundRole) : QVariant();
+    painter->setPen(own.isValid()
+                        ? qvariant_cast<QBrush>(own).color()
+                        : cell.palette.color(enabled ? QPalette::Normal : QPalette::Disabled, QPalette::Text));
     painter->drawText(x, y, text);
 }
 

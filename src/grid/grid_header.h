@@ -16,6 +16,7 @@ public:
 
     CFilterFields& Fields() const { return *m_fields; }
     QSize sizeHint() const override;
+    void setSelectionModel(QItemSelectionModel* selection) override;
 
 protected:
     void initStyleOptionForIndex(QStyleOptionHeader* option, int column) const override;

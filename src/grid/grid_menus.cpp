@@ -44,6 +44,7 @@ public:
         Add(GridAction::Copy, m_copies);
         Add(GridAction::CopyWithHeaders, m_copies);
         Add(GridAction::Paste, m_pastes);
+        Add(GridAction::PasteWithPreview, m_pastes);
     }
     void AddLines()
     {

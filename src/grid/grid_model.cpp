@@ -360,32 +360,33 @@ bool CGridModel::StoreRows(const Overlay& typed, BlankRule rule)
     return true;
 }
 
-void CGridModel::Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step)
+void CGridModel::Paste(const PastedCells& cells, const QString& step)
 {
-    if (!m_document->MayChange())
+    if (!m_document->MayChange() || cells.rows.empty())
         return;
     Store();
-    const int last = StoredRows();
-    row = std::min(row, last);
+    const std::size_t end = m_rows->Count(), bottom = std::ranges::max(cells.rows);
+    auto added = bottom >= end ? NewLines(int(bottom - end + 1)) : nullptr;
     CCellChanges changes;
-    auto added = row + int(texts.size()) > last ? NewLines(row + int(texts.size()) - last) : nullptr;
-    for (int r = 0; r < int(texts.size()); ++r) {
-        for (int c = 0; c < texts[std::size_t(r)].size(); ++c) {
-            const ColumnSpec& spec = Column(column + c);
-            const QString& text = texts[std::size_t(r)][c];
-            const auto after = [&] { return Resolved(column + c, ReadCell(spec, text).value); };
-            if (row + r >= last) {
-                spec.access->set(added->At(std::size_t(row + r - last)), after());
+    for (const auto& [column, values, left] : cells.columns) {
+        const auto& access = Column(column).access;
+        for (std::size_t i = 0; i < cells.rows.size(); ++i) {
+            if (!left.empty() && left[i])
+                continue;
+            const std::size_t row = cells.rows[i];
+            CellValue after = values[i];
+            if (row >= end) {
+                access->set(added->At(row - end), after);
                 continue;
             }
-            CellValue before = Value(row + r, column + c);
-            if (text != EditText(spec, before))
-                changes.Add(NameOf(row + r), column + c + 1, spec.access, before, after());
+            CellValue before = access->get(m_rows->At(row));
+            if (!SameCell(before, after))
+                changes.Add(m_rows->KeyAt(row), column + 1, access, std::move(before), std::move(after));
         }
     }
     if (changes.IsEmpty() && !added)
         return;
-    const std::size_t end = m_rows->Count(), first = SourceRow(row);
+    const std::size_t first = std::min(cells.rows.front(), end);
     const QScopedValueRollback changed(m_changedAt, std::optional(end));
     Change(step, first, [&] {
         if (!changes.IsEmpty())

@@ -54,9 +54,9 @@ public:
     /// Moves what was typed into the rows, as one undo step; no other cell is touched. False when nothing changed.
     /// An offered row into which something was typed enters the source.
     bool Store(BlankRule rule = BlankRule::Zero);
-    /// Puts `texts` into the cells from (row, column) on, rows past the last one being added: one undo step with the
-    /// text `step`. Every text must have passed Refusal.
-    void Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step);
+    /// Puts these values, none of which the cells refuse, into the cells: one undo step with the text `step`. What was
+    /// typed is stored before.
+    void Paste(const PastedCells& cells, const QString& step);
     /// Changes cells, the first of which stands in `row`: one undo step with the text `step`. What was typed is stored.
     void ChangeCells(const QString& step, int row, CCellChanges changes);
     /// A new line before `row`, with the columns' fill values: an undo step. The offered row becomes a line before it.
@@ -73,7 +73,7 @@ public:
     /// The rows change places with the one above them, or below: an undo step. Not while they are sorted. Returns why
     /// they did not.
     QString MoveRows(int row, int count, bool up);
-    /// A new line behind the last one, with these texts from its first cell on: an undo step.
+    /// A new line behind the last one, with these texts in its first cells, which take them: an undo step.
     void AppendRow(const QStringList& texts);
     /// An undo step; the offered row stays. No fixed row is among the rows.
     void RemoveRows(int row, int count);

@@ -1,6 +1,7 @@
 // Lines that come, go and change places.
 #include "grid/grid_model.h"
 
+#include "grid/cell_text.h"
 #include "grid/grid_texts.h"
 #include "grid/row_commands.h"
 
@@ -92,7 +93,11 @@ void CGridModel::AppendRow(const QStringList& texts)
 {
     if (!m_document->MayChange())
         return;
-    Paste(StoredRows(), 0, {texts}, GridTexts::tr("Insertion of lines"));
+    Store();
+    PastedCells cells{{m_rows->Count()}, {}};
+    for (int column = 0; column < texts.size(); ++column)
+        cells.columns.emplace_back(column).values.Add(Resolved(column, ReadCell(Column(column), texts[column]).value));
+    Paste(cells, GridTexts::tr("Insertion of lines"));
     m_document->Say(GridTexts::tr("Line inserted"));
 }
 

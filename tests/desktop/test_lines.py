@@ -157,3 +157,46 @@ class ComingBack(Case):
         self.assertFalse(editor.modified)
         editor.press('ctrl+shift+o')
         self.assertEqual([table.cell(line, 2).name for line in range(1, 5)], ['300', '100', '100', '50'])
+
+
+class CommandsOverAnOpenCell(Case):
+    """What was typed is taken before a key is about the table, and what cannot be taken is told."""
+    TEXT = samples.hd_text({'InitList': LINES})
+
+    def test_a_value_stays_in_its_line(self):
+        editor = self.open(self.TEXT)
+        editor.click_cell(2, 3)
+        editor.type('7.5')
+        editor.press('ctrl+shift+Return')
+        editor.settle()
+        self.assertEqual(editor.table().line(3)[:3], ['ELBE', '100', '7.5'])
+        self.assertEqual(editor.table().line(2)[0], '')
+        editor.press('ctrl+z')
+        editor.click_cell(2, 3)
+        editor.type('8')
+        editor.press('ctrl+shift+g')
+        editor.settle()
+        editor.click_cell(2, 3)
+        editor.type('abc')
+        for key in ('ctrl+shift+Return', 'ctrl+Return', 'ctrl+u', 'ctrl+shift+g', 'ctrl+h', 'ctrl+shift+l'):
+            editor.press(key)
+            self.assertIn('Floating point number required', editor.box_texts())
+            editor.answer()
+            self.assertEqual(editor.table().lines, 4)
+        editor.press('Escape')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), [LINES[0], '"ELBE", 100, 3.5, 11'] + LINES[2:])
+
+    def test_what_is_typed_is_found(self):
+        editor = self.open(self.TEXT)
+        editor.click_cell(4, 3)
+        editor.type('7.5')
+        editor.press('ctrl+h')
+        editor.box()
+        editor.type('7.5')
+        editor.settle(0.6)
+        self.assertIn('1 cell found', ' '.join(editor.box_texts()))
+        editor.press('Return')  # finds, and does not close
+        editor.settle()
+        self.assertIn('1 cell found', ' '.join(editor.box_texts()))
+        editor.press('Escape')

@@ -3,6 +3,7 @@
 #include "document/list_rows.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/wnd_resizer.h"
+#include "ks/language/language.h"
 
 #include <QLabel>
 #include <QUndoStack>
@@ -12,8 +13,17 @@ std::function<QString()> LineOf(Str text, int line)
     return [text, line] { return LoadLine(text, line); };
 }
 
+QStringList InAllLanguages(const TextLine& line)
+{
+    const char* const source = SourceText(line.text);
+    QStringList texts;
+    for (const QString& text : source ? KsLangInAll(TextsOfModule, TextsOfModule, source) : QStringList())
+        texts << (line.line < 0 ? text : text.section(u'\n', line.line, line.line));
+    return texts;
+}
+
 static constexpr TableStyle OnPages{[](const TextLine& line) { return LoadLine(line.text, line.line); },
-                                    Str::GlobalRow};
+                                    [](const TextLine& line) { return InAllLanguages(line); }, Str::GlobalRow};
 
 GridColumns::GridColumns(CGenGrid& grid, const void* globals) : FieldColumns(*grid.Model(), OnPages, globals) {}
 
