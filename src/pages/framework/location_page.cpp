@@ -19,6 +19,7 @@ GridColumns::GridColumns(CGenGrid& grid, const void* globals) : FieldColumns(*gr
 
 GridColumns& GridColumns::BranchName(ColumnSpec column)
 {
+    column.namesLine = true;
     column.upperCase = true;
     Value(LocationFields()[0], std::move(column));
     return *this;
@@ -26,6 +27,7 @@ GridColumns& GridColumns::BranchName(ColumnSpec column)
 
 GridColumns& GridColumns::Chainage(ColumnSpec column)
 {
+    column.namesLine = true;
     column.emptyIsNotGiven = true;
     Value(LocationFields()[1], std::move(column));
     return *this;
