@@ -60,12 +60,9 @@ int CFrozenColumns::ScrolledFor(int column) const
 void CFrozenColumns::PaintCells(QPainter& painter, QStyleOptionViewItem option, const QRect& dirty) const
 {
     const QWidget& view = *m_grid.viewport();
-    const int top = m_grid.rowAt(dirty.top()), end = m_grid.rowAt(dirty.bottom());
+    const QStyle& style = *m_grid.style();
     const QStyle::State common = option.state;
-    const QPoint mouse = view.mapFromGlobal(QCursor::pos());
-    const QModelIndex hovered = view.underMouse() ? m_grid.indexAt(mouse) : QModelIndex();
-    painter.fillRect(dirty, view.palette().brush(view.backgroundRole()));
-    const QColor lines = QRgb(m_grid.style()->styleHint(QStyle::SH_Table_GridLineColor, &option, &m_grid));
+    const QModelIndex hovered = view.underMouse() ? m_grid.indexAt(view.mapFromGlobal(QCursor::pos())) : QModelIndex();
     const auto paint = [&](const QModelIndex& cell) {
         option.rect = m_grid.visualRect(cell);
         option.state = common;
@@ -74,16 +71,24 @@ void CFrozenColumns::PaintCells(QPainter& painter, QStyleOptionViewItem option, 
         option.state.setFlag(QStyle::State_HasFocus, cell == m_grid.currentIndex() && m_grid.hasFocus());
         option.palette.setCurrentColorGroup(common.testFlag(QStyle::State_Enabled) ? QPalette::Normal
                                                                                    : QPalette::Disabled);
-        m_grid.style()->drawPrimitive(QStyle::PE_PanelItemViewRow, &option, &painter, &m_grid);
+        style.drawPrimitive(QStyle::PE_PanelItemViewRow, &option, &painter, &m_grid);
         m_grid.itemDelegate()->paint(&painter, option, cell);
-        painter.setPen(lines);
-        const QRect box = option.rect.adjusted(0, 0, 1, 1);
-        painter.drawLine(box.bottomLeft(), box.bottomRight());
-        painter.drawLine(box.topRight(), box.bottomRight());
     };
-    for (int row = top; row >= 0 && row <= (end < 0 ? m_grid.RowCount() - 1 : end); ++row)
-        for (int column = 0; column < Count(); ++column)
-            paint(m_grid.Model()->index(row, column));
+    const QColor color = QRgb(style.styleHint(QStyle::SH_Table_GridLineColor, &option, &m_grid));
+    const auto paintLines = [&](const QRect& cell) {
+        painter.fillRect(QRect(cell.bottomLeft() + QPoint(0, 1), QSize(cell.width() + 1, 1)), color);
+        painter.fillRect(QRect(cell.topRight() + QPoint(1, 0), QSize(1, cell.height())), color);
+    };
+    const auto forCells = [&](const auto& visit) {
+        const int top = m_grid.rowAt(dirty.top()), bottom = m_grid.rowAt(dirty.bottom());
+        const int end = top < 0 ? 0 : bottom < 0 ? m_grid.RowCount() : bottom + 1;
+        for (int row = top; row < end; ++row)
+            for (int column = 0; column < Count(); ++column)
+                visit(m_grid.Model()->index(row, column));
+    };
+    painter.fillRect(dirty, view.palette().brush(view.backgroundRole()));
+    forCells(paint);
+    forCells([&](const QModelIndex& cell) { paintLines(m_grid.visualRect(cell)); });
 }
 
 void CFrozenColumns::PaintEdge(QPainter& painter, int height) const

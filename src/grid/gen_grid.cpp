@@ -420,8 +420,13 @@ void CGenGrid::mousePressEvent(QMouseEvent* event)
 
 void CGenGrid::mouseMoveEvent(QMouseEvent* event)
 {
-    if (!m_isPressRefused || event->buttons() == Qt::NoButton)
-        QTableView::mouseMoveEvent(event);
+    if (m_isPressRefused && event->buttons() != Qt::NoButton)
+        return;
+    // What is frozen is no edge at which a drag scrolls sideways.
+    setAutoScroll(
+        !FrozenPart().adjusted(0, autoScrollMargin(), 0, -autoScrollMargin()).contains(event->position().toPoint()));
+    QTableView::mouseMoveEvent(event);
+    setAutoScroll(true);
 }
 
 void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)

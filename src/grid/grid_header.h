@@ -31,6 +31,7 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
+    QPoint LaidOut(const QPoint& place) const;
     bool ResizeFrozen(const QEvent& event, int x);
     void ShowCount();
 

@@ -102,19 +102,26 @@ bool CGridHeader::ResizeFrozen(const QEvent& event, int x)
     }
 }
 
-/// The base is told of the mouse where it has what is seen.
+/// Where the base has what the mouse is at. Beside the edge that is still the frozen column, whose border it is.
+QPoint CGridHeader::LaidOut(const QPoint& place) const
+{
+    const CFrozenColumns& frozen = m_grid.Frozen();
+    const bool isEdge = place.x() >= frozen.Width() && BorderAt(place.x()) < frozen.Count() && BorderAt(place.x()) >= 0;
+    return frozen.LaidOut(isEdge ? QPoint(frozen.Width() - 1, place.y()) : place);
+}
+
 bool CGridHeader::viewportEvent(QEvent* event)
 {
     const auto place = PlaceOf(*event);
-    const CFrozenColumns& frozen = m_grid.Frozen();
-    if (place && (frozen.Width() > 0 || m_resized >= 0) && ResizeFrozen(*event, place->x()))
+    const int frozen = m_grid.Frozen().Width();
+    if (place && (frozen > 0 || m_resized >= 0) && ResizeFrozen(*event, place->x()))
         return true;
-    if (!place || frozen.LaidOut(*place) == *place)
+    if (!place || LaidOut(*place) == *place)
         return QHeaderView::viewportEvent(event);
-    const auto laidOut = At(frozen.LaidOut(*place), *event);
+    const auto laidOut = At(LaidOut(*place), *event);
     const bool isDone = QHeaderView::viewportEvent(laidOut.get());
     event->setAccepted(laidOut->isAccepted());
-    viewport()->update(0, 0, frozen.Width(), height()); // another one may be pressed, or below the mouse
+    viewport()->update(0, 0, frozen, height()); // another one may be pressed, or below the mouse
     return isDone;
 }
 

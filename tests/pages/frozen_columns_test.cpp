@@ -104,10 +104,15 @@ protected:
 
 TEST_F(FrozenColumnsTest, LooksAsUnscrolledAndTheOthersGoBelow)
 {
+    const auto partOf = [](const QImage& shot, const QRect& part) {
+        const double scale = shot.devicePixelRatio();
+        return shot.copy(QRect(part.topLeft() * scale, part.size() * scale));
+    };
     grid->setFocus();
-    for (const bool isCurrentFrozen : {true, false}) {
-        grid->SetCurrentCell(4, isCurrentFrozen ? Name : LeftOffset);
+    for (const int current : {int(Name), int(LeftOffset), 0}) {
+        grid->SetCurrentCell(4, current);
         grid->selectionModel()->select({Cell(4, Name), Cell(6, LeftOffset)}, QItemSelectionModel::ClearAndSelect);
+        grid->setEnabled(current != 0);
         QApplication::processEvents();
         for (QWidget* part : {grid->viewport(), grid->Header().viewport()}) {
             Widen(2000);
@@ -118,10 +123,10 @@ TEST_F(FrozenColumnsTest, LooksAsUnscrolledAndTheOthersGoBelow)
                 ScrollBy(scrolled);
                 ASSERT_GT(Frozen(), 100);
                 const QImage shot = part->grab().toImage();
-                const QRect frozen(0, 0, Frozen() - 1, part->height()),
-                    others = part->rect().adjusted(Frozen(), 0, 0, 0);
-                EXPECT_EQ(shot.copy(frozen), wide.copy(frozen)) << scrolled;
-                EXPECT_EQ(shot.copy(others), wide.copy(others.translated(scrolled, 0))) << scrolled;
+                const QRect frozen(0, 0, Frozen() - 1, part->height());
+                const QRect others = part->rect().adjusted(Frozen(), 0, 0, 0);
+                EXPECT_EQ(partOf(shot, frozen), partOf(wide, frozen)) << scrolled;
+                EXPECT_EQ(partOf(shot, others), partOf(wide, others.translated(scrolled, 0))) << scrolled;
             }
             ScrollBy(0);
         }
@@ -214,6 +219,21 @@ TEST_F(FrozenColumnsTest, TheMouseSelectsAcrossTheEdge)
     EXPECT_EQ(Selected(), "2-3, 2-3");
 }
 
+TEST_F(FrozenColumnsTest, ADragDownTheFirstColumnScrollsNothingSideways)
+{
+    ScrollBy(250);
+    Mouse(grid->viewport(), QEvent::MouseButtonPress, {5, Place(2, Name).center().y()});
+    for (const int row : {3, 4, 4, 4}) {
+        const QPoint at(5, Place(row, Name).center().y());
+        QCursor::setPos(grid->viewport()->mapToGlobal(at));
+        Mouse(grid->viewport(), QEvent::MouseMove, at);
+        QTest::qWait(150); // in which it would begin to
+    }
+    Mouse(grid->viewport(), QEvent::MouseButtonRelease, {5, Place(4, Name).center().y()});
+    EXPECT_EQ(Bar().value(), 250);
+    EXPECT_EQ(Selected(), "2-4, 1-1");
+}
+
 TEST_F(FrozenColumnsTest, EditorsStandInTheirCellsAndGoBelow)
 {
     ScrollBy(200);
@@ -261,6 +281,12 @@ TEST_F(FrozenColumnsTest, HeadersAreSeenPressedAndResized)
     }
     EXPECT_EQ(grid->columnWidth(Chainage - 1), before + 20);
     EXPECT_EQ(Frozen(), edge + 20);
+    const auto keys = grid->Model()->SortedBy();
+    grid->setColumnWidth(Chainage - 1, before + 20);
+    QTest::mouseDClick(headers, Qt::LeftButton, {}, {Frozen() + 1, 8});
+    EXPECT_LT(grid->columnWidth(Chainage - 1), before) << "as wide as its texts";
+    EXPECT_EQ(grid->Model()->SortedBy(), keys) << "not by the column that is covered there";
+    grid->setColumnWidth(Chainage - 1, before + 20);
     Drag(headers, {grid->columnWidth(0) - 1, 8}, {grid->columnWidth(0) - 13, 8});
     EXPECT_EQ(Frozen(), edge + 8);
     for (const auto& [x, shape] : {std::pair(5, Qt::ArrowCursor), std::pair(grid->columnWidth(0), Qt::SplitHCursor),
