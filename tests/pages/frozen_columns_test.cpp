@@ -133,18 +133,35 @@ TEST_F(FrozenColumnsTest, LooksAsUnscrolledAndTheOthersGoBelow)
     }
 }
 
-TEST_F(FrozenColumnsTest, ScrolledPixelsAreThoseThatArePaintedAfresh)
+TEST_F(FrozenColumnsTest, WhatIsOnTheScreenIsWhatIsPaintedAfresh)
 {
-    ScrollBy(200);
-    for (const int scrolled : {260, 30, 0, 500, 40}) {
-        ScrollBy(scrolled);
-        const QImage onScreen = view->screen()->grabWindow(view->winId()).toImage();
-        view->update();
-        grid->viewport()->update();
-        grid->Header().viewport()->update();
+    const auto shot = [this] {
         QApplication::processEvents();
-        EXPECT_EQ(view->screen()->grabWindow(view->winId()).toImage(), onScreen) << scrolled;
+        return view->screen()->grabWindow(view->winId()).toImage();
+    };
+    const auto expectSame = [&](const std::string& after) {
+        const QImage before = shot();
+        for (QWidget* part : {static_cast<QWidget*>(view.get()), grid->viewport(), grid->Header().viewport()})
+            part->update();
+        EXPECT_EQ(shot(), before) << after;
+    };
+    grid->setFocus();
+    for (const int scrolled : {200, 260, 30, 0, 500, 40}) {
+        ScrollBy(scrolled);
+        expectSame("scrolled to " + std::to_string(scrolled));
     }
+    for (const int last : {4, 2}) {
+        grid->selectionModel()->select({Cell(2, Name), Cell(last, Chainage)}, QItemSelectionModel::ClearAndSelect);
+        expectSame("selected to line " + std::to_string(last));
+    }
+    for (int line = 0; line < 3; ++line)
+        lines.GetAt(std::size_t(line)).RiverName = "OTHER";
+    emit grid->model()->dataChanged(Cell(1, Name), Cell(3, Name));
+    expectSame("changed");
+    const int border = grid->columnWidth(0);
+    Drag(grid->Header().viewport(), {border, 8}, {border + 15, 8});
+    QTest::qWait(20); // the base follows later
+    expectSame("wider");
 }
 
 TEST_F(FrozenColumnsTest, EveryCellIsFoundWhereItIsSeenAndOnlyThere)
