@@ -100,7 +100,6 @@ public:
     QRect visualRect(const QModelIndex& cell) const override;
     QModelIndex indexAt(const QPoint& point) const override;
     void scrollTo(const QModelIndex& cell, ScrollHint hint = EnsureVisible) override;
-    void dataChanged(const QModelIndex& first, const QModelIndex& last, const QList<int>& roles) override;
 
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;

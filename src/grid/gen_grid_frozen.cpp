@@ -37,13 +37,6 @@ QRegion CGenGrid::visualRegionForSelection(const QItemSelection& selection) cons
     return isFrozen ? laidOut + FrozenPart() : laidOut;
 }
 
-void CGenGrid::dataChanged(const QModelIndex& first, const QModelIndex& last, const QList<int>& roles)
-{
-    QTableView::dataChanged(first, last, roles);
-    if (first.column() < m_frozen->Count())
-        viewport()->update(FrozenPart());
-}
-
 /// From cell to cell, not from place to place: where a drag began may be out of sight, or below the frozen columns.
 void CGenGrid::setSelection(const QRect& dragged, QItemSelectionModel::SelectionFlags command)
 {
