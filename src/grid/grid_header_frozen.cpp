@@ -3,11 +3,13 @@
 #include "grid/gen_grid.h"
 #include "grid/grid_header.h"
 
-#include <QHelpEvent>
+#include <QMouseEvent>
 #include <QPainter>
 #include <QStyle>
 #include <algorithm>
+#include <memory>
 #include <optional>
+#include <utility>
 
 namespace {
 
