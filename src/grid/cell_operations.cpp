@@ -49,8 +49,13 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block)
         block.top = std::max(block.top - 1, 0);
     CCellResults results(rows, block);
     ForCells(rows, {block.top + 1, block.left, block.bottom, block.right}, [&](int row, int column) {
-        const CellKind kind = rows.Column(column).Kind();
-        if (kind != CellKind::Button)
+        if (rows.Column(column).Kind() == CellKind::Button)
+            return;
+        // Of the row for global values, cells of columns that have none say nothing, or what the row is called.
+        const bool isNone = block.top < rows.FixedRows() && rows.IsLocked(block.top, column);
+        if (isNone)
+            results.Keep(row, column, GridTexts::tr("There is no value above to fill it with."));
+        else
             results.Add(row, column, rows.Value(row, column), rows.Value(block.top, column));
     });
     return results;

@@ -111,6 +111,7 @@ struct ColumnSpec
     Choices choices = {};                             // of a drop-down column
     std::function<QString()> unitText = {}; // symbol instead of the style's, where the unit depends on a setting
     std::function<QString()> hint = {};     // what the column means, for the tool tip of its header
+    bool namesLine = false;                 // says which line it is: stays in sight when the table scrolls sideways
     bool upperCase = false;                 // of a text
     LocationValue locationValue = LocationValue::None;
     double* globalNumber = nullptr; // what a first row for global values shows; without, its cell is locked

@@ -257,7 +257,11 @@ private:
     void ReplaceOne()
     {
         const int row = m_grid->CurrentRow() - 1, column = m_grid->CurrentColumn() - 1;
-        if (row >= 0 && row < m_grid->Model()->StoredRows() && !Make({{{{}, m_grid}, {row, column, row, column}}}))
+        const auto isAmong = [&](const Place& place) { // the scope may have changed since it was found
+            return place.table.grid == m_grid && column >= place.block.left && column <= place.block.right;
+        };
+        if (row >= 0 && row < m_grid->Model()->StoredRows() && std::ranges::any_of(Places(), isAmong) &&
+            !Make({{{{}, m_grid}, {row, column, row, column}}}))
             return;
         Next();
         Show();

@@ -153,8 +153,8 @@ void AddSectionColumns(CGridModel& model)
 {
     using C = CCrossSection;
     FieldColumns(model, Tables)
-        .Value(&C::branch)
-        .Value(&C::chainage)
+        .Value(&C::branch, {.namesLine = true})
+        .Value(&C::chainage, {.namesLine = true})
         .Value(&C::radius)
         .Value(&C::width)
         .Value(&C::topoId);
@@ -163,5 +163,5 @@ void AddSectionColumns(CGridModel& model)
 void AddPointColumns(CGridModel& model)
 {
     using P = CSectionPoint;
-    FieldColumns(model, Tables).Value(&P::offset).Value(&P::level);
+    FieldColumns(model, Tables).Value(&P::offset, {.namesLine = true}).Value(&P::level);
 }

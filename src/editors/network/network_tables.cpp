@@ -151,7 +151,7 @@ void AddBranchColumns(CGridModel& model)
         return NetworkTables::tr("Whether water flows towards increasing or decreasing chainages");
     };
     FieldColumns(model, Tables)
-        .Value(&N::name)
+        .Value(&N::name, {.namesLine = true})
         .Value(&N::start)
         .Value(&N::end)
         .Value(vertices, counted, {.locked = [](const void*) { return true; }})
@@ -161,5 +161,5 @@ void AddBranchColumns(CGridModel& model)
 void AddChannelColumns(CGridModel& model)
 {
     using R = CChannelRow;
-    FieldColumns(model, Tables).Value(&R::chainage).Value(&R::radius).Value(&R::width);
+    FieldColumns(model, Tables).Value(&R::chainage, {.namesLine = true}).Value(&R::radius).Value(&R::width);
 }

@@ -29,6 +29,7 @@ GridColumns::GridColumns(CGenGrid& grid, const void* globals) : FieldColumns(*gr
 
 GridColumns& GridColumns::BranchName(ColumnSpec column)
 {
+    column.namesLine = true;
     column.upperCase = true;
     Value(LocationFields()[0], std::move(column));
     return *this;
@@ -36,6 +37,7 @@ GridColumns& GridColumns::BranchName(ColumnSpec column)
 
 GridColumns& GridColumns::Chainage(ColumnSpec column)
 {
+    column.namesLine = true;
     column.emptyIsNotGiven = true;
     Value(LocationFields()[1], std::move(column));
     return *this;
