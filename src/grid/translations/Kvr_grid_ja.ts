@@ -1089,5 +1089,9 @@
         <source>Nothing was replaced. %1</source>
         <translation>置換しませんでした。%1</translation>
     </message>
+    <message>
+        <source>There is no value above to fill it with.</source>
+        <translation>上の行に入れる値がありません。</translation>
+    </message>
 </context>
 </TS>
