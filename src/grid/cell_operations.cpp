@@ -260,16 +260,17 @@ FormulaNames NamesForFormula(const CTableRows& rows)
         result.names << name;
         result.columns.push_back(column);
     };
+    const auto asName = [](const QString& text) {
+        const QString name = text.split(separator, Qt::SkipEmptyParts).join(u'_');
+        return name.isEmpty() || !name.front().isDigit() ? name : u'_' + name;
+    };
     for (int column = 0; column < int(rows.Columns().size()); ++column) {
         if (!rows.Column(column).IsNumeric())
             continue;
-        const QString title = rows.Column(column).header().section(u'[', 0, 0);
-        QString name = title.split(separator, Qt::SkipEmptyParts).join(u'_');
-        if (!name.isEmpty() && name.front().isDigit())
-            name.prepend(u'_');
+        const QString name = asName(rows.Column(column).header().section(u'[', 0, 0));
         add(name, column);
         add(name.toLower(), column);
-        add(QString::fromUtf8(rows.Column(column).name), column); // in every language
+        add(asName(QString::fromUtf8(rows.Column(column).name)), column); // in every language
     }
     return result;
 }

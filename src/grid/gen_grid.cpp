@@ -52,13 +52,8 @@ CGenGrid::CGenGrid(QWidget* parent)
         part->installEventFilter(this);
     connect(m_model, &CGridModel::CellModified, this, [this] { m_modified = true; });
     // The numbers of a filter are in the unit shown.
-    connect(
-        &KsUnits::Instance(), &KsUnits::Changed, this,
-        [this] {
-            if (m_model->Shown().IsFiltered())
-                ChangeView([](CGridModel& model) { model.Filter(QStringList(model.Filters())); });
-        },
-        Qt::QueuedConnection);                               // what was typed in the other unit has been stored
+    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CGenGrid::FilterAfresh,
+            Qt::QueuedConnection);                           // what was typed in the other unit has been stored
     connect(m_model, &CGridModel::modelReset, this, [this] { // other rows, none of which is current
         m_modified = false;
         m_goneFrom = 0;
@@ -224,6 +219,15 @@ void CGenGrid::changeEvent(QEvent* event)
     QTableView::changeEvent(event);
     if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange)
         m_widths->Reset();
+    // Texts of entries are others now.
+    if (event->type() == QEvent::LanguageChange && m_model->Shown().IsFiltered())
+        QMetaObject::invokeMethod(this, &CGenGrid::FilterAfresh, Qt::QueuedConnection);
+}
+
+void CGenGrid::FilterAfresh()
+{
+    if (m_model->Shown().IsFiltered())
+        ChangeView([](CGridModel& model) { model.Filter(QStringList(model.Filters())); });
 }
 
 // ---- editing -----------------------------------------------------------------------------------

@@ -126,6 +126,7 @@ private:
     bool LeaveField();
     bool Scatters(const QMouseEvent& click) const;
     void ShowLineMenu(const QContextMenuEvent& event);
+    void FilterAfresh();
     void FollowLine(int row, int column);
     void NoteLine(int row);
     int RowLikeCurrent(int row) const;

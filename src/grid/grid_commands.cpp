@@ -108,6 +108,6 @@ void CGridCommands::Run(GridAction action, CGenGrid& grid)
     const bool moves = action == GridAction::MoveUp || action == GridAction::MoveDown;
     if (CanRun(action, grid))
         IsOfLines(action) ? RunOnLines(grid, action) : RunOnCells(grid, action);
-    else if (IsOfLines(action) && !moves && grid.Model()->Rows() && !grid.MayGrow() && grid.MayChange())
+    else if (grid.MayChange() && IsOfLines(action) && !moves && grid.Model()->Rows() && !grid.MayGrow())
         grid.Model()->Document()->Say(GridTexts::tr("Lines cannot be added to this table."));
 }

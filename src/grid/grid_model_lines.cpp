@@ -17,6 +17,10 @@ int CGridModel::InsertRow(int row)
     const int shownAt = std::min(std::max(row, FixedRows()), StoredRows());
     const std::size_t at = SourceRow(shownAt);
     auto lines = CTableRows::NewLines(1 + OffersRow(), at);
+    if (const QString fault = WhyNotBetween(at, *lines); !fault.isEmpty()) {
+        m_document->Say(GridTexts::tr("No line was inserted. %1").arg(fault));
+        return row;
+    }
     const std::size_t place = PutLines(GridTexts::tr("Insertion of lines"), at, std::move(lines));
     m_document->Say(GridTexts::tr("Line inserted"));
     return ShownRow(place) + row - shownAt; // behind an offered row, if there was one

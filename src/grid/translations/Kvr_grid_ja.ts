@@ -1093,5 +1093,9 @@
         <source>There is no value above to fill it with.</source>
         <translation>上の行に入れる値がありません。</translation>
     </message>
+    <message>
+        <source>No line was inserted. %1</source>
+        <translation>行を挿入しませんでした。%1</translation>
+    </message>
 </context>
 </TS>

@@ -140,6 +140,13 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     EXPECT_EQ(channel->CurrentRow(), 2) << "undo shows the line";
     view->Document()->UndoStack().redo();
     EXPECT_EQ(channel->CurrentRow(), 4);
+    const QString start = Text(view->Branches(), 0, 1);
+    EXPECT_TRUE(Edit(channel, 0, ChannelChainage, start.toUtf8().constData()));
+    channel->SetCurrentCell(1, 1);
+    QTest::keyClick(channel, Qt::Key_Return, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(chainages(), start.toStdString() + " 4000 6000 7000") << "none stands before the branch begins";
+    view->Document()->UndoStack().undo();
+    channel->SetCurrentCell(4, 1);
     QTest::keyClick(channel, Qt::Key_Insert); // towards the branch's end
     EXPECT_EQ(chainages(), "2000 4000 6000 7000 7500");
     EXPECT_TRUE(Edit(channel, 4, ChannelChainage, "8000"));
