@@ -48,6 +48,7 @@ protected:
         }
         Open<WidePage>(lines);
     }
+    ~FrozenColumnsTest() override { view.reset(); } // it shows lines that go with the test
     QModelIndex Cell(int row, int column) const { return grid->model()->index(row - 1, column - 1); }
     QRect Place(int row, int column) const { return grid->visualRect(Cell(row, column)); }
     QScrollBar& Bar() const { return *grid->horizontalScrollBar(); }
