@@ -34,6 +34,7 @@ enum class GridAction
     Interpolate,
     Calculate,
     ResetToGlobal,
+    RevertToSaved,
     Replace,
     Undo,
     Redo,

@@ -53,6 +53,10 @@ public:
     /// What the cell holds, typed or stored.
     CellValue Value(int row, int column) const;
     bool IsLocked(int row, int column) const;
+    /// Something was typed that is not stored yet.
+    bool HasTyped() const { return !m_pending.empty(); }
+    /// What a cell is stored as that holds `value`.
+    CellValue Resolved(int column, const CellValue& value, BlankRule rule = BlankRule::Zero) const;
     /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
     bool HidesDigits(int row, int column) const;
     /// The cell of a line holds what is the global value of its column.
@@ -98,7 +102,6 @@ protected:
     int ShownRows() const { return StoredRows() + OffersRow(); }
     bool IsRow(int row) const { return row >= 0 && row < ShownRows(); }
     void* RowObject(int row) const;
-    CellValue Resolved(int column, const CellValue& value, BlankRule rule = BlankRule::Zero) const;
     std::unique_ptr<IRowBlock> NewLines(int count, std::size_t at) const;
     /// Order and filter, as they are now, on what the source holds now.
     void ApplySort();
