@@ -316,6 +316,22 @@ TEST_F(SavedLinesTest, OutliveTheWayBackToTheSavedState)
     EXPECT_EQ(Marks(), "*.");
 }
 
+TEST_F(SavedLinesTest, WhatASaveLeavesOutMayBeLeftOutAgain)
+{
+    for (const char* name : {"A", "B", "C"})
+        Add(name, 1);
+    Open(MakeInitPage);
+    grid->Model()->InsertRow(0);
+    grid->Model()->DuplicateRows(3, 1);
+    Save(); // without the line that has no place
+    Undo(3);
+    Save();
+    EXPECT_EQ(Marks(), "...");
+    while (document.UndoStack().canRedo())
+        document.UndoStack().redo();
+    EXPECT_EQ(Marks(), "...+");
+}
+
 TEST_F(SavedLinesTest, OfOtherContentNobodyKnowsWhichIsWhich)
 {
     Add("A", 1, 10);
