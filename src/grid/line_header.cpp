@@ -4,6 +4,7 @@
 #include "grid/saved_mark.h"
 
 #include <QMouseEvent>
+#include <QPainter>
 
 CLineHeader::CLineHeader(const CGridModel& model, QWidget* grid) : QHeaderView(Qt::Vertical, grid), m_model(model)
 {
@@ -29,7 +30,9 @@ void CLineHeader::mouseDoubleClickEvent(QMouseEvent* event)
 
 void CLineHeader::paintSection(QPainter* painter, const QRect& rect, int row) const
 {
+    painter->save(); // a style may leave it clipped
     QHeaderView::paintSection(painter, rect, row);
+    painter->restore();
     PaintLineMark(*painter, rect, palette(), m_model.Saved().MarkOf(row));
 }
 

@@ -22,7 +22,7 @@ void PaintLineMark(QPainter& painter, const QRect& number, const QPalette& palet
         return painter.fillRect(number.left() + 1, number.top() + 1, LineWidth, number.height() - 3, color);
     if (mark != SavedMark::New)
         return;
-    constexpr int size = 9, width = 2;
+    constexpr int size = 8, width = 2; // beside the longest number, too
     const int left = number.left() + 1, middle = number.top() + (number.height() - width) / 2;
     painter.fillRect(left, middle, size, width, color);
     painter.fillRect(left + (size - width) / 2, middle - (size - width) / 2, width, size, color);

@@ -289,6 +289,29 @@ TEST_F(SavedLinesTest, AreToldAndReverted)
     EXPECT_EQ(Marks(), ".*+") << "saved with its new name";
 }
 
+TEST_F(SavedLinesTest, ArePaintedBesideTheNumber)
+{
+    Add("A", 1, 10);
+    Add("B", 1, 10);
+    Open(MakeInitPage);
+    QHeaderView& numbers = *grid->verticalHeader();
+    const auto dots = [&numbers](int row) {
+        const QImage image = numbers.viewport()->grab().toImage();
+        const QRgb color = numbers.palette().color(QPalette::Highlight).rgb();
+        int found = 0;
+        for (int y = 0; y < numbers.sectionSize(row); ++y)
+            for (int x = 0; x < numbers.width(); ++x)
+                found += image.pixel(x, numbers.sectionViewportPosition(row) + y) == color;
+        return found;
+    };
+    Enter(1, 3, "11");
+    QTest::keyClick(grid, Qt::Key_Insert);
+    EXPECT_GT(dots(0), 20);
+    EXPECT_EQ(dots(1), 0);
+    EXPECT_GT(dots(2), 20);
+    EXPECT_NE(dots(0), dots(2)) << "another mark";
+}
+
 /// What was saved is nowhere on the stack of steps any more.
 TEST_F(SavedLinesTest, OutliveTheWayBackToTheSavedState)
 {
