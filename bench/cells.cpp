@@ -114,6 +114,33 @@ bool MeasureMemory(Page& page)
 #endif
 }
 
+/// Nobody waits for the marks of what differs from the last save.
+bool MeasureMarks(Page& page)
+{
+    constexpr int linesOnScreen = 60, typed = 1000;
+    CGridModel& model = page.Model();
+    for (const double step : {0.5, 0.25})
+        page.Make([&] { return FillSeries(model, Column, step); });
+    const auto type = [&](int row) {
+        model.setData(model.index(row, Level), QString::number(row), Qt::EditRole);
+        model.Store();
+    };
+    for (int row = 0; row < typed; ++row)
+        type(row * (Lines / typed));
+    const auto look = [&] {
+        int found = 0;
+        for (int row = Lines / 2; row < Lines / 2 + linesOnScreen; ++row)
+            found += model.Saved().MarkOf(row) == SavedMark::Changed;
+        return found;
+    };
+    std::vector<double> times;
+    for (int round = 0; round < Rounds; ++round) {
+        type(round);
+        times.push_back(Milliseconds(look));
+    }
+    return Report("marks of a screen after each step, against 60 Hz", Median(times), 1000.0 / 60, 0.2);
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -133,5 +160,6 @@ int main(int argc, char** argv)
     const bool isOfColumns = Measure(page, "max(value, 2) + chainage/1000 in 1M cells",
                                      [&] { return Calculate(rows, Column, ofColumns, names); });
     const bool isSmall = MeasureMemory(page);
-    return isFilled && isSeries && isInterpolated && isCalculated && isOfColumns && isSmall ? 0 : 1;
+    const bool isMarked = MeasureMarks(page);
+    return isMarked && isFilled && isSeries && isInterpolated && isCalculated && isOfColumns && isSmall ? 0 : 1;
 }

@@ -146,18 +146,10 @@ void CCellChanges::Column::Set(std::size_t cell, void* object, bool forward) con
 template <typename Do>
 void CCellChanges::Column::ForCellsOf(RowKey row, bool forward, const Do& action) const
 {
-    constexpr std::size_t few = 16; // are found sooner without an index
-    const auto visit = [&](const auto& cells, const auto& numberOf) {
-        for (std::size_t i = 0; i < cells.size(); ++i)
-            if (const std::size_t cell = numberOf(forward ? i : cells.size() - 1 - i); rows[cell] == row)
-                action(cell);
-    };
-    if (rows.size() <= few)
-        return visit(rows, [](std::size_t i) { return i; });
     if (!index.IsMade())
-        index.Make(rows.size(), [this](std::size_t cell) { return rows[cell]; });
-    const auto found = index.Candidates(row);
-    visit(found, [found](std::size_t i) { return std::size_t(found[i]); });
+        index.Make(rows.size(), [this](std::uint32_t cell) { return rows[cell]; });
+    index.ForRowsOf(
+        row, forward, [this](std::uint32_t cell) { return rows[cell]; }, action);
 }
 
 void CCellChanges::RunOn(RowKey row, const std::function<void*()>& object, bool forward) const

@@ -50,12 +50,12 @@ public:
     {
         if (changes.empty())
             return;
+        const auto ownerOf = [this](std::uint32_t number) { return RowKey(changes[number].owner); };
         if (!m_owners.IsMade())
-            m_owners.Make(changes.size(), [this](std::size_t i) { return RowKey(changes[i].owner); });
-        const void* const owner = line.key ? reinterpret_cast<const void*>(*line.key) : line.data;
-        for (const std::uint32_t number : m_owners.Candidates(RowKey(owner)))
-            if (const Change& change = changes[number]; change.owner == owner)
-                TakeBack(line, change, forward ? change.before : change.after);
+            m_owners.Make(changes.size(), ownerOf);
+        m_owners.ForRowsOf(line.key.value_or(RowKey(line.data)), forward, ownerOf, [&](std::uint32_t number) {
+            TakeBack(line, changes[number], forward ? changes[number].before : changes[number].after);
+        });
     }
 
     std::vector<Change> changes;
