@@ -3,6 +3,7 @@
 #include "base/not_given.h"
 #include "grid/cell_text.h"
 #include "grid/grid_texts.h"
+#include "grid/saved_lines.h"
 #include "ks/fc/branch_name.h"
 #include "ks/units/formula.h"
 
@@ -83,6 +84,24 @@ CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block)
         if (const ColumnSpec& spec = rows.Column(column); spec.fill && row >= rows.FixedRows())
             results.Add(row, column, rows.Value(row, column), spec.GlobalValue());
     });
+    return results;
+}
+
+CCellResults RevertToSaved(const CTableRows& rows, const CSavedLines& saved, const CellBlock& block)
+{
+    CCellResults results(rows, block);
+    const int last = std::min(block.bottom, rows.StoredRows() - 1);
+    for (int row = std::max(block.top, rows.FixedRows()); row <= last; ++row) {
+        const CSavedLines::Line line = saved.Find(row);
+        for (int column = block.left; column <= block.right; ++column) {
+            if (const auto before = saved.Before(line, row, column))
+                results.PutBack(row, column, rows.Value(row, column), *before);
+            else if (line.origin == KsLineOrigin::New)
+                results.Keep(row, column, GridTexts::tr("The line is new since the last save."));
+            else if (line.origin == KsLineOrigin::Unknown)
+                results.Keep(row, column, GridTexts::tr("What the line was at the last save is not known."));
+        }
+    }
     return results;
 }
 

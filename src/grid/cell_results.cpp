@@ -23,6 +23,12 @@ void CCellResults::Add(int row, int column, const CellValue& before, const CellV
         return Keep(row, column, GridTexts::tr("The cell is locked."));
     if (const auto* number = std::get_if<double>(&after); number && !spec.bounds.Allow(*number))
         return Keep(row, column, OutOfRange());
+    PutBack(row, column, before, after);
+}
+
+void CCellResults::PutBack(int row, int column, const CellValue& before, const CellValue& after)
+{
+    const ColumnSpec& spec = m_rows->Column(column);
     if (m_changes.IsEmpty())
         m_firstRow = row;
     if (m_changed.size() < Listed)

@@ -26,6 +26,8 @@ public:
     void Add(int row, int column, const CellValue& before, const CellValue& after);
     /// The number in the unit that the user sees, to fifteen digits; an integer for a column of them.
     void AddShown(int row, int column, const CellValue& before, double after);
+    /// The cell, which holds `before`, becomes what it was once, whatever cells may become now.
+    void PutBack(int row, int column, const CellValue& before, const CellValue& after);
     /// The cell stays as it is.
     void Keep(int row, int column, const QString& why);
 

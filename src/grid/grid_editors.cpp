@@ -9,6 +9,7 @@
 #include "grid/grid_model.h"
 #include "grid/grid_texts.h"
 #include "grid/name_offers.h"
+#include "grid/saved_mark.h"
 #include "grid/typing.h"
 
 #include <QApplication>
@@ -197,6 +198,12 @@ void CGridDelegate::PaintControl(QPainter* painter, const QStyleOptionViewItem& 
     }
 }
 
+void CGridDelegate::PaintChange(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
+{
+    if (m_grid->Model()->Saved().Before(index.row(), index.column()))
+        PaintCellMark(*painter, cell.rect, cell.palette, cell.state.testFlag(QStyle::State_Selected));
+}
+
 /// A text on its background. The style would lay it out as it does rich contents, which takes several times as long,
 /// and a table repaints hundreds of cells at each step of scrolling.
 void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
@@ -236,6 +243,7 @@ void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
             QStyledItemDelegate::paint(painter, option, index);
         if (m_grid->Model()->HidesDigits(index.row(), index.column()))
             PaintDigitsMark(*painter, option.rect, option.palette, option.state.testFlag(QStyle::State_Selected));
+        PaintChange(painter, option, index);
         return;
     }
     QStyleOptionViewItem cell = option;
@@ -243,6 +251,7 @@ void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
     cell.features &= ~QStyleOptionViewItem::HasCheckIndicator; // drawn centred below
     m_grid->style()->drawControl(QStyle::CE_ItemViewItem, &cell, painter, m_grid);
     PaintControl(painter, cell, index);
+    PaintChange(painter, option, index);
 }
 
 bool CGridDelegate::editorEvent(QEvent* event, QAbstractItemModel*, const QStyleOptionViewItem& option,

@@ -35,6 +35,7 @@ enum class GridAction
     Interpolate,
     Calculate,
     ResetToGlobal,
+    RevertToSaved,
     Replace,
     Undo,
     Redo,

@@ -92,6 +92,8 @@ void GridMenus::AddForLines(QMenu& menu, CGenGrid& grid)
     CMenu entries(menu, grid);
     entries.AddLines();
     entries.AddClipboard();
+    menu.addSeparator();
+    entries.Add(GridAction::RevertToSaved);
 }
 
 void GridMenus::AddForColumn(QMenu& menu, CGenGrid& grid, int column)

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "grid/cell_changes.h"
+#include "grid/saved_lines.h"
 #include "grid/table_rows.h"
 
 #include <QAbstractTableModel>
@@ -22,6 +23,8 @@ public:
     /// was typed and not stored is dropped.
     void SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows);
     CKsDoc* Document() const { return m_document; }
+    /// What differs from the last save.
+    const CSavedLines& Saved() const { return m_saved; }
 
     /// Shows the source as it is now. Costs the same for any number of rows, unless they are sorted or filtered.
     void Sync();
@@ -86,6 +89,8 @@ signals:
 
 private:
     QString HeaderToolTip(int column) const;
+    QString CellDetails(int row, int column) const;
+    QVariant LineNumberData(int row, int role) const;
     std::size_t Change(const QString& step, std::size_t row, const std::function<void()>& make);
     std::size_t Arrange(std::size_t row);
     std::size_t PutBelow(const QString& step, std::size_t row, std::unique_ptr<IRowBlock> lines);
@@ -94,6 +99,7 @@ private:
     bool StoreRows(const Overlay& typed, BlankRule rule);
 
     CKsDoc* m_document = nullptr;
+    CSavedLines m_saved{*this};
     int m_rowCount = 0; // as the views know it
     bool m_syncing = false;
     QStringList m_headers; // as the views know them

@@ -54,6 +54,8 @@ public:
     /// What the cell holds, typed or stored.
     CellValue Value(int row, int column) const;
     bool IsLocked(int row, int column) const;
+    /// Something was typed that is not stored yet.
+    bool HasTyped() const { return !m_pending.empty(); }
     /// What is stored for a value that was read; an emptied cell stores a value, too.
     CellValue Resolved(int column, const CellValue& value, BlankRule rule = BlankRule::Zero) const;
     /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.

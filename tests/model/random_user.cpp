@@ -305,7 +305,7 @@ void RandomUser::CommandInGrid()
         GridAction::InsertAbove, GridAction::InsertBelow,   GridAction::Duplicate, GridAction::Duplicate,
         GridAction::MoveUp,      GridAction::MoveDown,      GridAction::MoveDown,  GridAction::Cut,
         GridAction::Clear,       GridAction::ResetToGlobal, GridAction::FillDown,  GridAction::SortAscending,
-        GridAction::SortByPlace, GridAction::FileOrder,     GridAction::FileOrder};
+        GridAction::SortByPlace, GridAction::FileOrder,     GridAction::FileOrder, GridAction::RevertToSaved};
     CGenGrid* grid = SomeGrid();
     if (!grid || !GoToSomeCell(*grid))
         return;

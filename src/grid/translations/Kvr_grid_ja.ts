@@ -1097,5 +1097,57 @@
         <source>No line was inserted. %1</source>
         <translation>行を挿入しませんでした。%1</translation>
     </message>
+    <message>
+        <source>1 cell reverted</source>
+        <translation>1 個のセルを戻しました</translation>
+    </message>
+    <message>
+        <source>%1 cells reverted</source>
+        <translation>%1 個のセルを戻しました</translation>
+    </message>
+    <message>
+        <source>The line is new since the last save.</source>
+        <translation>この行は前回の保存より後に追加されました。</translation>
+    </message>
+    <message>
+        <source>What the line was at the last save is not known.</source>
+        <translation>前回の保存時にこの行が何であったかは不明です。</translation>
+    </message>
+    <message>
+        <source>Revert to Saved Values</source>
+        <translation>保存時の値に戻す</translation>
+    </message>
+    <message>
+        <source>Give the selected cells the values that they had at the last save</source>
+        <translation>選択したセルを前回の保存時の値に戻します</translation>
+    </message>
+    <message>
+        <source>Changed since the last save</source>
+        <translation>前回の保存より後に変更</translation>
+    </message>
+    <message>
+        <source>New since the last save</source>
+        <translation>前回の保存より後に追加</translation>
+    </message>
+    <message>
+        <source>%1: %2</source>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>was off at the last save</source>
+        <translation>前回の保存時はオフ</translation>
+    </message>
+    <message>
+        <source>was on at the last save</source>
+        <translation>前回の保存時はオン</translation>
+    </message>
+    <message>
+        <source>was empty at the last save</source>
+        <translation>前回の保存時は空</translation>
+    </message>
+    <message>
+        <source>was %1 at the last save</source>
+        <translation>前回の保存時は %1</translation>
+    </message>
 </context>
 </TS>

@@ -83,6 +83,41 @@ TEST_F(CrossSectionTest, SectionsAndPointsAreDuplicatedAndMoved)
     EXPECT_EQ(boxes.size(), 1);
 }
 
+/// Sections move in memory with every line above them, and their points with them.
+TEST_F(CrossSectionTest, WhatDiffersFromTheLastSaveGoesWithItsSection)
+{
+    CCrossSectionView* view = Open();
+    const auto marks = [](const CGenGrid& grid) {
+        std::string text;
+        for (int row = 0; row < grid.Model()->StoredRows(); ++row)
+            text += ".*+"[int(grid.Model()->Saved().MarkOf(row))];
+        return text;
+    };
+    Select(view->Sections(), Main2500);
+    EXPECT_TRUE(Edit(view->Points(), 1, PointLevel, "99"));
+    EXPECT_EQ(marks(*view->Points()), ".*..");
+    const std::string none(std::size_t(SmallRows), '.');
+    EXPECT_EQ(marks(*view->Sections()), none);
+    CGridCommands::Run(GridAction::MoveUp, *view->Sections());
+    EXPECT_EQ(view->CurrentSection(), Main2500 - 1);
+    EXPECT_EQ(marks(*view->Points()), ".*..");
+    Select(view->Sections(), Main2500);
+    EXPECT_EQ(marks(*view->Points()).find('*'), std::string::npos) << "those of another section";
+    Select(view->Sections(), Main2500 - 1);
+    CGridCommands::Run(GridAction::Duplicate, *view->Sections());
+    EXPECT_EQ(marks(*view->Points()), "++++") << "of the copy";
+    std::string copied = none;
+    copied.insert(std::size_t(Main2500), "+");
+    EXPECT_EQ(marks(*view->Sections()), copied);
+    Select(view->Sections(), Main2500 - 1);
+    view->Points()->SetCurrentCell(2, PointLevel + 1);
+    CGridCommands::Run(GridAction::RevertToSaved, *view->Points());
+    EXPECT_EQ(view->Document()->Sections().sections[Main2500 - 1].points[1].level, 100);
+    EXPECT_EQ(marks(*view->Points()), "....");
+    UndoAll(view);
+    EXPECT_FALSE(view->Points()->Model()->Saved().MayDiffer());
+}
+
 /// The rows of a vector have no names of their own.
 TEST_F(CrossSectionTest, SortedAndFilteredSections)
 {
