@@ -190,7 +190,7 @@ MUTANTS = [
      '++number, false'),
     ('shell', 'shell/project_file.cpp', ".replace(u'\\\\', u'/')", ''),
     # What a user would see, found by somebody who looked for what no test notices.
-    ('pages', 'grid/cell_results.cpp', 'if (m_rows->IsLocked(row, column))', 'if (false)'),
+    ('pages', 'grid/cell_results.cpp', 'spec.locked && m_rows->IsLocked(row, column)', 'false'),
     ('pages', 'grid/typing.cpp', 'm_cut = m_cut && text.size() >= m_field->maxLength();', 'm_cut = false;'),
     ('pages', 'grid/typing.cpp', 'm_after = std::clamp<qsizetype>(end, 0, m_after);', 'm_after = end;'),
     ('pages', 'grid/cell_operations.cpp', 'try_emplace(KsBranchKey(QString::fromStdString(branch))',
