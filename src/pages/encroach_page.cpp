@@ -110,6 +110,7 @@ private:
 
 CEncroachPage::CEncroachPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
 {
+    Bindings().TellMeanings();
     Bindings().Add(m_ui.maxIter_1340, Globals().Max_no_iter);
     Bindings().EnableWhen([this] { return HasSetup(); },
                           {m_ui.setupLabel, m_ui.setup_1341, m_ui.duplicate_1345, m_ui.delete_1346});
