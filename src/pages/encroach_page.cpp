@@ -190,6 +190,7 @@ void CEncroachPage::ShowSetups()
     else if (!CGenMetaList<HDEncroach>::IsWorthKeeping(Setups().GetAt(m_current)))
         status = LoadString(Str::SetupNotSaved);
     m_ui.status_1347->setText(status);
+    m_ui.status_1347->setVisible(!status.isEmpty());
 }
 
 void CEncroachPage::GoTo(std::size_t setup)

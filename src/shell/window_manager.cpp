@@ -9,7 +9,7 @@
 #include <QTabBar>
 #include <algorithm>
 
-static constexpr int WantedLetters = 140; // beside each other: the tabs of the pages, a table, and a table beside it
+static constexpr int WantedLetters = 155; // beside each other: the tabs of the pages, a table, and a table beside it
 
 CWindowManager::CWindowManager(CKsMDIFrameWnd& frame) : m_frame(frame)
 {
