@@ -2,13 +2,17 @@
 // numbers as one command; undoing them; and what a step to undo holds, against the numbers that it changes.
 #include "bench/page_view.h"
 #include "bench/report.h"
+#include "data/hd_file.h"
 #include "grid/cell_operations.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_clipboard.h"
 #include "ks/units/formula.h"
 #include "pages/page_table.h"
 
+#include <QClipboard>
 #include <QUndoStack>
 #include <cmath>
+#include <filesystem>
 #ifdef __GLIBC__
 #include <malloc.h>
 #endif
@@ -68,7 +72,8 @@ struct Page
             CCellChanges changes;
             const auto& access = Model().Column(Level).access;
             for (int row = 0; row < Lines; ++row)
-                changes.Add(Model().NameOf(row), Level + 1, access, Model().Value(row, Level), numbers[std::size_t(row)]);
+                changes.Add(Model().NameOf(row), Level + 1, access, Model().Value(row, Level),
+                            numbers[std::size_t(row)]);
             Model().ChangeCells("step", 0, std::move(changes));
             QApplication::processEvents();
         });
@@ -114,6 +119,77 @@ bool MeasureMemory(Page& page)
 #endif
 }
 
+/// A million lines of text into an empty table, against reading the same lines from a file.
+bool MeasurePaste()
+{
+    CKavo0_hdDoc document;
+    const auto page = MakeInitPage(&document);
+    PageView view(document, *page);
+    page->OnSetActive();
+    Show(*page);
+    QString text;
+    HD_Parameters parameters;
+    for (int i = 0; i < Lines; ++i) {
+        HD_Initial record;
+        record.RiverName = "RIVER" + std::to_string(i / 1000);
+        record.Chainage = i % 1000 * 12.5;
+        record.InitialH = (125 + i % 1000) / 100.0;
+        record.InitialQ = (105 + i % 777) / 10.0;
+        text += QStringLiteral("%1\t%2\t%3\t%4\n")
+                    .arg(QString::fromStdString(record.RiverName))
+                    .arg(record.Chainage)
+                    .arg(record.InitialH)
+                    .arg(record.InitialQ);
+        parameters.InitList.Add(std::move(record));
+    }
+    QApplication::clipboard()->setText(text);
+    const std::string file = (std::filesystem::temp_directory_path() / "kvr_bench_paste.hdkv").string();
+    static_cast<void>(SaveHDFile(parameters, file));
+    std::vector<double> pasted, read, undone;
+    for (int round = 0; round < Rounds; ++round) {
+        pasted.push_back(Milliseconds([&] {
+            PasteCells(*page->GetGrid());
+            QApplication::processEvents();
+        }));
+        undone.push_back(Milliseconds([&] {
+            document.UndoStack().undo();
+            QApplication::processEvents();
+        }));
+        read.push_back(Milliseconds([&] { static_cast<void>(LoadHDFile(file)); }));
+    }
+    std::filesystem::remove(file);
+    const bool isFast =
+        Report("paste 1M lines of 4 cells, against reading them from a file", Median(pasted), Median(read), 2.5);
+    return Report("  undo of it, against 200 ms", Median(undone), 200, 1) && isFast;
+}
+
+/// Nobody waits for the marks of what differs from the last save.
+bool MeasureMarks(Page& page)
+{
+    constexpr int linesOnScreen = 60, typed = 1000;
+    CGridModel& model = page.Model();
+    for (const double step : {0.5, 0.25})
+        page.Make([&] { return FillSeries(model, Column, step); });
+    const auto type = [&](int row) {
+        model.setData(model.index(row, Level), QString::number(row), Qt::EditRole);
+        model.Store();
+    };
+    for (int row = 0; row < typed; ++row)
+        type(row * (Lines / typed));
+    const auto look = [&] {
+        int found = 0;
+        for (int row = Lines / 2; row < Lines / 2 + linesOnScreen; ++row)
+            found += model.Saved().MarkOf(row) == SavedMark::Changed;
+        return found;
+    };
+    std::vector<double> times;
+    for (int round = 0; round < Rounds; ++round) {
+        type(round);
+        times.push_back(Milliseconds(look));
+    }
+    return Report("marks of a screen after each step, against 60 Hz", Median(times), 1000.0 / 60, 0.2);
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -121,17 +197,24 @@ int main(int argc, char** argv)
     if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
         qputenv("QT_QPA_PLATFORM", "offscreen");
     QApplication app(argc, argv);
+    if (argc > 1 && std::string_view(argv[1]) == "--paste")
+        return MeasurePaste() ? 0 : 1;
     Page page;
     const CTableRows& rows = page.Model();
     const FormulaNames names = NamesForFormula(rows);
     const CKsFormula formula("value*1.1 + 2", names.names), ofColumns("max(value, 2) + chainage/1000", names.names);
-    const bool isFilled = Measure(page, "fill down 1M cells, against storing the numbers", [&] { return FillDown(rows, Column); });
+    const bool isFilled =
+        Measure(page, "fill down 1M cells, against storing the numbers", [&] { return FillDown(rows, Column); });
     const bool isSeries = Measure(page, "a series in 1M cells", [&] { return FillSeries(rows, Column, 0.5); });
     const bool isInterpolated = Measure(page, "interpolate 1M cells of 1,000 branches",
                                         [&] { return Interpolate(rows, Column, KnownValues::Ends, false); });
-    const bool isCalculated = Measure(page, "value*1.1 + 2 in 1M cells", [&] { return Calculate(rows, Column, formula, names); });
+    const bool isCalculated =
+        Measure(page, "value*1.1 + 2 in 1M cells", [&] { return Calculate(rows, Column, formula, names); });
     const bool isOfColumns = Measure(page, "max(value, 2) + chainage/1000 in 1M cells",
                                      [&] { return Calculate(rows, Column, ofColumns, names); });
     const bool isSmall = MeasureMemory(page);
-    return isFilled && isSeries && isInterpolated && isCalculated && isOfColumns && isSmall ? 0 : 1;
+    const bool isPasted = MeasurePaste();
+    const bool isMarked = MeasureMarks(page);
+    const bool isFast = isFilled && isSeries && isInterpolated && isCalculated && isOfColumns;
+    return isFast && isSmall && isPasted && isMarked ? 0 : 1;
 }

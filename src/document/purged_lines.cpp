@@ -1,9 +1,66 @@
 #include "document/purged_lines.h"
 
+#include "grid/line_origin.h"
 #include "grid/row_commands.h"
 #include "res/strings.h"
 
 #include <QStringList>
+#include <algorithm>
+
+namespace {
+
+using Places = std::vector<std::size_t>; // ascending, with the lines that are taken out
+
+/// Which lines are taken out, for as long as somebody has to know.
+class CPurge : public KsLineChange
+{
+public:
+    struct List
+    {
+        const CGenList* list;
+        Places rows;
+    };
+    struct Table
+    {
+        std::shared_ptr<IRowSource> source;
+        Places rows;
+    };
+
+    void TakeBack(KsTracedLine& line, bool forward) const override
+    {
+        for (const List& list : lists) {
+            const auto before = [&](std::size_t row) { return Before(list.rows, row, forward); };
+            if (line.data == list.list)
+                CarryBack(line, line.place, 0, before);
+            else if (line.list == list.list)
+                CarryBack(line, line.placeInList, 0, before);
+        }
+        for (const Table& table : tables)
+            CarryBack(line, *table.source, [&](std::size_t row) { return Before(table.rows, row, forward); });
+    }
+
+    std::vector<List> lists;
+    std::vector<Table> tables;
+
+private:
+    static std::optional<std::size_t> Before(const Places& purged, std::size_t row, bool out)
+    {
+        if (!out) {
+            const auto place = std::ranges::lower_bound(purged, row);
+            return place != purged.end() && *place == row ? std::nullopt
+                                                          : std::optional(row - std::size_t(place - purged.begin()));
+        }
+        // Behind as many as stood above it: of these each has no more lines that stayed above it than the line has.
+        std::size_t low = 0, high = purged.size();
+        while (low < high) {
+            const std::size_t middle = (low + high) / 2;
+            purged[middle] - middle <= row ? low = middle + 1 : high = middle;
+        }
+        return row + low;
+    }
+};
+
+} // namespace
 
 CPurgedLines::CPurgedLines(CKavo0_hdDoc& document) : CDocumentCommand(document, LoadString(Str::UndoPurge))
 {
@@ -28,6 +85,12 @@ CPurgedLines::CPurgedLines(CKavo0_hdDoc& document) : CDocumentCommand(document, 
         if (!table.rows.empty())
             m_tables.push_back(std::move(table));
     }
+    auto change = std::make_shared<CPurge>();
+    for (const Lines& lines : m_lists)
+        change->lists.push_back({lines.list, lines.rows});
+    for (const Rows& table : m_tables)
+        change->tables.push_back({table.source, table.rows});
+    m_change = std::move(change);
 }
 
 QString CPurgedLines::Summary() const

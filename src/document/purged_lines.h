@@ -27,6 +27,7 @@ public:
 protected:
     ChangePlace Apply() override;
     ChangePlace Revert() override;
+    std::shared_ptr<const KsLineChange> LineChange() const override { return m_change; }
 
 private:
     struct Lines
@@ -49,5 +50,6 @@ private:
 
     std::vector<Lines> m_lists;
     std::vector<Rows> m_tables;
+    std::shared_ptr<const KsLineChange> m_change;
     bool m_isOut = false;
 };

@@ -4,6 +4,11 @@
 
 namespace {
 
+bool IsDigit(char c)
+{
+    return c >= '0' && c <= '9';
+}
+
 /// The library knows no plus.
 std::string_view WithoutPlus(std::string_view text)
 {
@@ -21,10 +26,12 @@ std::errc ParseWhole(std::string_view text, Value& value)
 std::errc Parse(std::string_view text, double& value)
 {
     text = WithoutPlus(text);
-    const auto point = text.find('.');
-    if (text.find_first_not_of("0123456789.eE+-") != std::string_view::npos ||
-        (point != std::string_view::npos && text.find_first_of("0123456789", point) != point + 1))
-        return std::errc::invalid_argument;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        const char c = text[i];
+        const bool isSign = c == 'e' || c == 'E' || c == '+' || c == '-';
+        if (!IsDigit(c) && !isSign && (c != '.' || i + 1 == text.size() || !IsDigit(text[i + 1])))
+            return std::errc::invalid_argument;
+    }
     return ParseWhole(text, value);
 }
 

@@ -75,6 +75,27 @@ std::vector<double> WithoutKnown(std::vector<double> chainages, const BranchInTa
     return chainages;
 }
 
+CPlacesInTable::CPlacesInTable(const CTableRows& rows)
+{
+    ForLines(rows, [this](std::size_t row, const QString& branch, const double* chainage) {
+        if (chainage)
+            m_rows[branch].emplace(*chainage, row); // behind those that are there already
+    });
+}
+
+std::optional<std::size_t> CPlacesInTable::Take(const QString& branch, double chainage)
+{
+    const auto lines = m_rows.find(KsBranchKey(branch));
+    if (lines == m_rows.end())
+        return std::nullopt;
+    const auto next = lines->second.lower_bound(chainage - SamePlace);
+    if (next == lines->second.end() || !(next->first - chainage < SamePlace))
+        return std::nullopt;
+    const std::size_t row = next->second;
+    lines->second.erase(next);
+    return row;
+}
+
 QStringList BranchesIn(const CTableRows& rows)
 {
     QStringList branches;

@@ -4,6 +4,8 @@
 #include "grid/table_rows.h"
 
 #include <QString>
+#include <map>
+#include <unordered_map>
 
 /// Chainages in metres.
 struct PlacesOfBranch
@@ -31,6 +33,18 @@ BranchInTable FindBranch(const CTableRows& rows, const QString& branch);
 std::vector<double> WithoutKnown(std::vector<double> chainages, const BranchInTable& known);
 /// Every branch that a line names, in capitals, in the order of the file.
 QStringList BranchesIn(const CTableRows& rows);
+
+/// The lines of a table by their places, hidden ones included; the first two columns are branch name and chainage.
+class CPlacesInTable
+{
+public:
+    explicit CPlacesInTable(const CTableRows& rows);
+    /// The row of the source that is at this place, in metres; of several each once, in their order.
+    std::optional<std::size_t> Take(const QString& branch, double chainage);
+
+private:
+    std::unordered_map<QString, std::multimap<double, std::size_t>> m_rows; // by branch key
+};
 
 /// New lines at these places, with what new lines hold besides; not in the source.
 std::unique_ptr<IRowBlock> LinesAt(const CTableRows& rows, const PlacesOfBranch& places);

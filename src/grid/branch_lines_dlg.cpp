@@ -40,6 +40,7 @@ CBranchLinesDlg::CBranchLinesDlg(CGenGrid& grid)
     const int row = grid.CurrentRow() - 1;
     const QString current = row >= m_rows.FixedRows() ? EditText(m_rows.Column(0), m_rows.Value(row, 0)) : QString();
     m_branch->setEditText(current.isEmpty() ? branches.value(0) : current);
+    m_branch->lineEdit()->selectAll(); // another name that is typed takes its place
     const double step = m_rows.Column(ChainageColumn).style.UnitConvertFromBase(UsualStep, 0);
     m_step->setText(TextOf(step));
     BranchChanged();

@@ -129,12 +129,38 @@ void CCellChanges::Revert(IRowSource& rows)
     for (auto column = m_columns.rbegin(); column != m_columns.rend(); ++column) {
         for (std::size_t i = column->rows.size(); i-- > 0;) {
             void* object = rows.Object(column->rows[i]);
-            if (column->access->restore)
-                column->restore[i](object);
-            else
-                column->access->set(object, column->before[i]);
+            column->Set(i, object, false);
         }
     }
+}
+
+void CCellChanges::Column::Set(std::size_t cell, void* object, bool forward) const
+{
+    if (!forward && access->restore)
+        restore[cell](object);
+    else
+        access->set(object, forward ? after[cell] : before[cell]);
+}
+
+/// The cells of a row in this column, mostly one, from the first to the last, or else back.
+template <typename Do>
+void CCellChanges::Column::ForCellsOf(RowKey row, bool forward, const Do& action) const
+{
+    if (!index.IsMade())
+        index.Make(rows.size(), [this](std::uint32_t cell) { return rows[cell]; });
+    index.ForRowsOf(
+        row, forward, [this](std::uint32_t cell) { return rows[cell]; }, action);
+}
+
+void CCellChanges::RunOn(RowKey row, const std::function<void*()>& object, bool forward) const
+{
+    const auto run = [&](const Column& column) {
+        column.ForCellsOf(row, forward, [&](std::size_t cell) { column.Set(cell, object(), forward); });
+    };
+    if (forward)
+        std::for_each(m_columns.begin(), m_columns.end(), run);
+    else
+        std::for_each(m_columns.rbegin(), m_columns.rend(), run);
 }
 
 void CCellChanges::ShrinkToFit()

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "grid/column_spec.h"
+#include "grid/row_index.h"
 #include "grid/row_source.h"
 
 #include <variant>
@@ -48,6 +49,9 @@ public:
 
     void Apply(IRowSource& rows);
     void Revert(IRowSource& rows);
+    /// Does one of both, Apply if `forward`, to the cells of one row only, in an object that holds what the row does.
+    /// It is asked for when there are such cells.
+    void RunOn(RowKey row, const std::function<void*()>& object, bool forward) const;
     /// Nothing is added any more.
     void ShrinkToFit();
 
@@ -59,6 +63,11 @@ private:
         std::vector<RowKey> rows;
         CCellValues before, after;
         std::vector<std::function<void(void* row)>> restore = {}; // instead of setting `before`; see CellAccess
+        mutable CRowIndex index = {};                             // of many rows, from the first search on
+
+        void Set(std::size_t cell, void* object, bool forward) const;
+        template <typename Do>
+        void ForCellsOf(RowKey row, bool forward, const Do& action) const;
     };
 
     Column& ColumnFor(int column, const std::shared_ptr<const CellAccess>& access);

@@ -85,6 +85,8 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
                has([](const ColumnSpec& column) { return column.Kind() == CellKind::Number; });
     case GridAction::ResetToGlobal:
         return has([](const ColumnSpec& column) { return bool(column.fill); });
+    case GridAction::RevertToSaved:
+        return model.Saved().MayDiffer();
     case GridAction::Replace:
         return true;
     default:
@@ -109,6 +111,9 @@ void RunOnCells(CGenGrid& grid, GridAction action)
         return Make(grid, FillDown(model, block), NameOf(action), changed);
     if (action == GridAction::ResetToGlobal)
         return Make(grid, ResetToGlobal(model, block), NameOf(action), changed);
+    if (action == GridAction::RevertToSaved)
+        return Make(grid, RevertToSaved(model, model.Saved(), block), NameOf(action),
+                    {GridTexts::tr("1 cell reverted"), GridTexts::tr("%1 cells reverted")});
     if (auto results = AskForCells(action, model, block, grid))
         Make(grid, std::move(*results), NameOf(action), changed);
 }

@@ -5,8 +5,9 @@
 
 class CGenGrid;
 
-inline constexpr GridAction CellActions[] = {GridAction::FillDown, GridAction::FillSeries, GridAction::Interpolate,
-                                             GridAction::Calculate, GridAction::Replace, GridAction::ResetToGlobal};
+inline constexpr GridAction CellActions[] = {
+    GridAction::FillDown, GridAction::FillSeries,    GridAction::Interpolate,  GridAction::Calculate,
+    GridAction::Replace,  GridAction::ResetToGlobal, GridAction::RevertToSaved};
 
 /// Those that empty cells.
 inline constexpr GridAction EmptyingActions[] = {GridAction::Cut, GridAction::Clear};

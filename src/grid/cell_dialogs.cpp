@@ -72,7 +72,12 @@ protected:
     const CGridModel& Model() const { return m_model; }
     virtual Computed Compute() const = 0;
     /// While somebody types nothing of a million cells is computed.
-    void Later() { m_timer.start(m_takesLong ? 400 : 50); }
+    void Later()
+    {
+        if (m_buttons) // what it would do is looked at when it is pressed
+            m_buttons->button(QDialogButtonBox::Ok)->setEnabled(true);
+        m_timer.start(m_takesLong ? 400 : 50);
+    }
 
 private:
     /// Below what is asked for, which has the focus first.
@@ -173,7 +178,7 @@ protected:
     Computed Compute() const override
     {
         QString text = m_formula->text().trimmed();
-        if (text.startsWith(u'='))
+        while (text.startsWith(u'=')) // the one that stood there, and one that was typed as in cells
             text.remove(0, 1);
         const CKsFormula formula(text, m_names.names);
         if (!formula.Fault().isEmpty())

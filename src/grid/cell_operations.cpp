@@ -3,6 +3,7 @@
 #include "base/not_given.h"
 #include "grid/cell_text.h"
 #include "grid/grid_texts.h"
+#include "grid/saved_lines.h"
 #include "ks/fc/branch_name.h"
 #include "ks/units/formula.h"
 
@@ -49,8 +50,13 @@ CCellResults FillDown(const CTableRows& rows, CellBlock block)
         block.top = std::max(block.top - 1, 0);
     CCellResults results(rows, block);
     ForCells(rows, {block.top + 1, block.left, block.bottom, block.right}, [&](int row, int column) {
-        const CellKind kind = rows.Column(column).Kind();
-        if (kind != CellKind::Button)
+        if (rows.Column(column).Kind() == CellKind::Button)
+            return;
+        // Of the row for global values, cells of columns that have none say nothing, or what the row is called.
+        const bool isNone = block.top < rows.FixedRows() && rows.IsLocked(block.top, column);
+        if (isNone)
+            results.Keep(row, column, GridTexts::tr("There is no value above to fill it with."));
+        else
             results.Add(row, column, rows.Value(row, column), rows.Value(block.top, column));
     });
     return results;
@@ -78,6 +84,24 @@ CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block)
         if (const ColumnSpec& spec = rows.Column(column); spec.fill && row >= rows.FixedRows())
             results.Add(row, column, rows.Value(row, column), spec.GlobalValue());
     });
+    return results;
+}
+
+CCellResults RevertToSaved(const CTableRows& rows, const CSavedLines& saved, const CellBlock& block)
+{
+    CCellResults results(rows, block);
+    const int last = std::min(block.bottom, rows.StoredRows() - 1);
+    for (int row = std::max(block.top, rows.FixedRows()); row <= last; ++row) {
+        const CSavedLines::Line line = saved.Find(row);
+        for (int column = block.left; column <= block.right; ++column) {
+            if (const auto before = saved.Before(line, row, column))
+                results.PutBack(row, column, rows.Value(row, column), *before);
+            else if (line.origin == KsLineOrigin::New)
+                results.Keep(row, column, GridTexts::tr("The line is new since the last save."));
+            else if (line.origin == KsLineOrigin::Unknown)
+                results.Keep(row, column, GridTexts::tr("What the line was at the last save is not known."));
+        }
+    }
     return results;
 }
 
@@ -255,16 +279,17 @@ FormulaNames NamesForFormula(const CTableRows& rows)
         result.names << name;
         result.columns.push_back(column);
     };
+    const auto asName = [](const QString& text) {
+        const QString name = text.split(separator, Qt::SkipEmptyParts).join(u'_');
+        return name.isEmpty() || !name.front().isDigit() ? name : u'_' + name;
+    };
     for (int column = 0; column < int(rows.Columns().size()); ++column) {
         if (!rows.Column(column).IsNumeric())
             continue;
-        const QString title = rows.Column(column).header().section(u'[', 0, 0);
-        QString name = title.split(separator, Qt::SkipEmptyParts).join(u'_');
-        if (!name.isEmpty() && name.front().isDigit())
-            name.prepend(u'_');
+        const QString name = asName(rows.Column(column).header().section(u'[', 0, 0));
         add(name, column);
         add(name.toLower(), column);
-        add(QString::fromUtf8(rows.Column(column).name), column); // in every language
+        add(asName(QString::fromUtf8(rows.Column(column).name)), column); // in every language
     }
     return result;
 }

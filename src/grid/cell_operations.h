@@ -7,6 +7,7 @@
 #include <QStringList>
 
 class CKsFormula;
+class CSavedLines;
 
 /// The first row of the block over the others; the row above over a block of one.
 CCellResults FillDown(const CTableRows& rows, CellBlock block);
@@ -16,6 +17,9 @@ CCellResults Clear(const CTableRows& rows, const CellBlock& block);
 
 /// Cells of columns with a global value become that.
 CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block);
+
+/// Cells become what they held when the document was saved.
+CCellResults RevertToSaved(const CTableRows& rows, const CSavedLines& saved, const CellBlock& block);
 
 /// Numbers that grow by `step` from row to row, in the units shown, from what stands in the first row of each column.
 CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double step);

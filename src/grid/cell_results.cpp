@@ -23,12 +23,18 @@ void CCellResults::Add(int row, int column, const CellValue& before, const CellV
         return Keep(row, column, GridTexts::tr("The cell is locked."));
     if (const auto* number = std::get_if<double>(&after); number && !spec.bounds.Allow(*number))
         return Keep(row, column, OutOfRange());
+    PutBack(row, column, before, after);
+}
+
+void CCellResults::PutBack(int row, int column, const CellValue& before, const CellValue& after)
+{
+    const ColumnSpec& spec = m_rows->Column(column);
     if (m_changes.IsEmpty())
         m_firstRow = row;
     if (m_changed.size() < Listed)
         m_changed.push_back({row, column, EditText(spec, before), EditText(spec, after)});
     if (m_hasRules)
-        m_texts.push_back({{row, column}, EditText(spec, after)});
+        m_ruled[column][row] = after;
     const RowKey name = m_rows->NameOf(row);
     const auto *numberBefore = std::get_if<double>(&before), *numberAfter = std::get_if<double>(&after);
     if (numberBefore && numberAfter)
@@ -63,20 +69,23 @@ void CCellResults::Keep(int row, int column, const QString& why)
 
 QString CCellResults::RuleFault() const
 {
-    if (m_texts.empty())
+    if (m_ruled.empty())
         return {};
-    const auto byRow = [](const auto& cell) { return cell.first.first; };
-    const int top = std::ranges::min(m_texts, {}, byRow).first.first;
-    const int bottom = std::ranges::max(m_texts, {}, byRow).first.first;
-    std::vector<QStringList> texts;
-    for (int row = top; row <= bottom; ++row) {
-        QStringList& line = texts.emplace_back();
-        for (int column = 0; column < int(m_rows->Columns().size()); ++column)
-            line << EditText(m_rows->Column(column), m_rows->Value(row, column));
+    int top = std::numeric_limits<int>::max(), bottom = 0;
+    for (const auto& [column, cells] : m_ruled) {
+        top = std::min(top, cells.begin()->first);
+        bottom = std::max(bottom, cells.rbegin()->first);
     }
-    for (const auto& [cell, text] : m_texts)
-        texts[std::size_t(cell.first - top)][cell.second] = text;
-    const auto fault = m_rows->Fault(top, 0, texts);
+    PastedCells all{m_rows->SourceRows(top, bottom - top + 1), {}};
+    for (const auto& [column, cells] : m_ruled) {
+        auto& place = all.columns.emplace_back(column);
+        for (int row = top; row <= bottom; ++row) {
+            const auto cell = cells.find(row);
+            place.left.push_back(cell == cells.end());
+            place.values.Add(cell == cells.end() ? m_rows->Value(row, column) : cell->second);
+        }
+    }
+    const auto fault = m_rows->Fault(all);
     return fault ? GridTexts::tr("Line %1: %2")
                        .arg(QString::number(m_rows->LineNumber(top + int(fault->row))), fault->text)
                  : QString();

@@ -6,6 +6,7 @@
 
 #include <QString>
 #include <algorithm>
+#include <map>
 
 /// Cells of a table, each bound included; rows and columns count from 0.
 struct CellBlock
@@ -25,6 +26,8 @@ public:
     void Add(int row, int column, const CellValue& before, const CellValue& after);
     /// The number in the unit that the user sees, to fifteen digits; an integer for a column of them.
     void AddShown(int row, int column, const CellValue& before, double after);
+    /// The cell, which holds `before`, becomes what it was once, whatever cells may become now.
+    void PutBack(int row, int column, const CellValue& before, const CellValue& after);
     /// The cell stays as it is.
     void Keep(int row, int column, const QString& why);
 
@@ -49,7 +52,7 @@ private:
     bool m_hasRules;
     CCellChanges m_changes;
     std::vector<Cell> m_changed, m_kept;
-    std::vector<std::pair<std::pair<int, int>, QString>> m_texts; // of rows that have rules
+    std::map<int, std::map<int, CellValue>> m_ruled; // what changes, by column and row, of rows that have rules
     std::size_t m_keptCount = 0;
     int m_firstRow = 0;
 };

@@ -79,9 +79,30 @@ QString EditText(const ColumnSpec& column, const CellValue& value)
     return QString::fromStdString(std::get<std::string>(value));
 }
 
-CellReading ReadCell(const ColumnSpec& column, const QString& given)
+std::optional<double> ReadPlainNumber(const ColumnSpec& column, QStringView text)
 {
-    const QString text = WithoutLineEnds(given);
+    const auto number = KsReadNumber(text, column.style);
+    return number && column.bounds.Allow(*number) ? number : std::nullopt;
+}
+
+static CellReading ReadNumberCell(const ColumnSpec& column, QStringView text)
+{
+    KsTyped<double> number{KsReadNumber(text, column.style), {}};
+    if (!number.value) // an amount or a formula, which are rare
+        number = KsReadTyped(text, column.style, column.UnitSymbol());
+    if (!number.value)
+        return Refused(number.complaint, GridTexts::tr("Floating point number required"));
+    if (!column.bounds.Allow(*number.value))
+        return {{}, OutOfRange()};
+    return {*number.value, {}};
+}
+
+CellReading ReadCell(const ColumnSpec& column, QStringView given)
+{
+    given = WithoutLineEnds(given);
+    if (column.Kind() == CellKind::Number && !given.isEmpty())
+        return ReadNumberCell(column, given);
+    const QString text = given.toString();
     if (column.Kind() == CellKind::Text) {
         const QString taken = column.control.upperCase ? KsBranchKey(text)
                               : column.control.trimmed ? text.trimmed()
@@ -107,15 +128,7 @@ CellReading ReadCell(const ColumnSpec& column, const QString& given)
             return {*index, {}};
         return {{}, GridTexts::tr("One of these is required: %1").arg(column.choices.entries().join(", "))};
     }
-    if (column.Kind() == CellKind::Integer) {
-        const auto integer = KsReadTypedInteger(text);
-        return integer.value ? CellReading{*integer.value, {}}
-                             : Refused(integer.complaint, GridTexts::tr("Please enter an integer."));
-    }
-    const auto number = KsReadTyped(text, column.style, column.UnitSymbol());
-    if (!number.value)
-        return Refused(number.complaint, GridTexts::tr("Floating point number required"));
-    if (!column.bounds.Allow(*number.value))
-        return {{}, OutOfRange()};
-    return {*number.value, {}};
+    const auto integer = KsReadTypedInteger(text);
+    return integer.value ? CellReading{*integer.value, {}}
+                         : Refused(integer.complaint, GridTexts::tr("Please enter an integer."));
 }

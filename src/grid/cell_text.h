@@ -16,6 +16,10 @@ QString CellToolTip(const ColumnSpec& column, const CellValue& value);
 /// The text that editing starts with and that is copied: it reads back to the same number, in display units.
 QString EditText(const ColumnSpec& column, const CellValue& value);
 
+/// The number, in base units, of a text that is nothing but one and which the column takes; nothing for any other text,
+/// taken or not.
+std::optional<double> ReadPlainNumber(const ColumnSpec& column, QStringView text);
+
 struct CellReading
 {
     CellValue value;
@@ -23,4 +27,4 @@ struct CellReading
 };
 /// What a typed or pasted text means. Nothing typed is the empty cell. A text that is refused to the user is a value
 /// all the same: other editors may send it.
-CellReading ReadCell(const ColumnSpec& column, const QString& given);
+CellReading ReadCell(const ColumnSpec& column, QStringView given);

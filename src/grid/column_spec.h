@@ -111,13 +111,15 @@ struct ColumnSpec
     Choices choices = {};                             // of a drop-down column
     std::function<QString()> unitText = {}; // symbol instead of the style's, where the unit depends on a setting
     std::function<QString()> hint = {};     // what the column means, for the tool tip of its header
+    bool namesLine = false;                 // says which line it is: stays in sight when the table scrolls sideways
     bool upperCase = false;                 // of a text
     LocationValue locationValue = LocationValue::None;
     double* globalNumber = nullptr; // what a first row for global values shows; without, its cell is locked
     std::int32_t* globalIndex = nullptr;
 
     // What follows from the field.
-    std::string_view name = {}; // of the field in the file
+    std::string_view name = {};              // of the field in the file
+    std::function<QStringList()> names = {}; // that, and what the header says in any language, without its unit
     GridControl control = Control::Number;
     CKsEditStyle style = {}; // unit group and format
     Bounds bounds = {};      // of a number

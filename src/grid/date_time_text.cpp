@@ -1,8 +1,8 @@
 #include "grid/date_time_text.h"
 
+#include "grid/grid_texts.h"
 #include "ks/language/date_time.h"
 #include "ks/language/language.h"
-#include "grid/grid_texts.h"
 
 #include <QDateTime>
 #include <QLocale>

@@ -60,6 +60,9 @@ FieldColumns& FieldColumns::Add(const Field& field, CellAccess access, ColumnSpe
             return named == UnitGroup::None ? text(title) : WithUnit(text(title), named);
         };
     }
+    column.names = [texts = m_style.inAllLanguages, title = field.title, name = field.name] {
+        return QStringList(title ? texts(title) : QStringList()) << QString::fromUtf8(name);
+    };
     if (!column.hint && field.meaning)
         column.hint = [text = m_style.text, meaning = field.meaning] { return text(meaning); };
     column.name = field.name;

@@ -9,7 +9,8 @@
 struct TableStyle
 {
     QString (*text)(const TextLine& line); // a text of a field, in the user's language
-    Str globalRow{};                       // the name of a first row for global values, where a table has one
+    QStringList (*inAllLanguages)(const TextLine& line);
+    Str globalRow{}; // the name of a first row for global values, where a table has one
     /// Columns are as wide as their texts, headers name units, each row has all its numbers and no blanks around texts.
     bool besideAPicture = false;
 };

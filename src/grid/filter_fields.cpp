@@ -1,5 +1,6 @@
 #include "grid/filter_fields.h"
 
+#include "grid/frozen_columns.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_header.h"
 #include "grid/grid_texts.h"
@@ -108,10 +109,14 @@ void CFilterFields::Place()
 {
     if (!m_shown)
         return;
+    const CFrozenColumns& frozen = m_grid.Frozen();
     const int height = Height();
-    for (int column = 0; column < std::min(m_header.count(), int(m_fields.size())); ++column)
-        m_fields[std::size_t(column)]->setGeometry(m_header.sectionViewportPosition(column), m_header.height() - height,
-                                                   m_header.sectionSize(column), height);
+    for (int column = 0; column < std::min(m_header.count(), int(m_fields.size())); ++column) {
+        QLineEdit& field = *m_fields[std::size_t(column)];
+        const QRect below(m_header.sectionViewportPosition(column), m_header.height() - height,
+                          m_header.sectionSize(column), height);
+        field.setGeometry(frozen.Seen(below, column));
+    }
 }
 
 /// In the fields what the lines are filtered by.

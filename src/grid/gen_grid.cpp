@@ -1,6 +1,7 @@
 #include "grid/gen_grid.h"
 
 #include "grid/cell_text.h"
+#include "grid/frozen_columns.h"
 #include "grid/grid_editors.h"
 #include "grid/grid_header.h"
 #include "grid/grid_host.h"
@@ -22,20 +23,9 @@
 #include <QPainter>
 #include <algorithm>
 
-namespace {
-
-/// Whether a press at `x` of the header drags a border between columns: the header's own rule, which it does not tell.
-bool IsColumnBorder(const QHeaderView& header, int x)
-{
-    const int column = header.logicalIndexAt(x), grip = header.style()->pixelMetric(QStyle::PM_HeaderGripMargin);
-    const int within = x - header.sectionViewportPosition(column);
-    return column >= 0 && ((within < grip && column > 0) || within > header.sectionSize(column) - grip);
-}
-
-} // namespace
-
 CGenGrid::CGenGrid(QWidget* parent)
     : QTableView(parent),
+      m_frozen(std::make_unique<CFrozenColumns>(*this)),
       m_model(new CGridModel(this)),
       m_delegate(new CGridDelegate(this)),
       m_widths(new CGridWidths(*this))
@@ -62,13 +52,8 @@ CGenGrid::CGenGrid(QWidget* parent)
         part->installEventFilter(this);
     connect(m_model, &CGridModel::CellModified, this, [this] { m_modified = true; });
     // The numbers of a filter are in the unit shown.
-    connect(
-        &KsUnits::Instance(), &KsUnits::Changed, this,
-        [this] {
-            if (m_model->Shown().IsFiltered())
-                ChangeView([](CGridModel& model) { model.Filter(QStringList(model.Filters())); });
-        },
-        Qt::QueuedConnection);                               // what was typed in the other unit has been stored
+    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CGenGrid::FilterAfresh,
+            Qt::QueuedConnection);                           // what was typed in the other unit has been stored
     connect(m_model, &CGridModel::modelReset, this, [this] { // other rows, none of which is current
         m_modified = false;
         m_goneFrom = 0;
@@ -92,8 +77,9 @@ CGenGrid::~CGenGrid()
 
 QString CGenGrid::LineText() const
 {
-    const int fixed = m_model->FixedRows(), line = CurrentLine() - fixed, column = CurrentColumn() - 1;
-    const int lines = std::max(m_model->LineCount(), RowCount() - fixed); // with the one that is offered
+    // As the numbers beside the lines have it: that of the global values is the first one, where there is one.
+    const int fixed = m_model->FixedRows(), line = CurrentLine(), column = CurrentColumn() - 1;
+    const int lines = std::max(m_model->LineCount(), RowCount() - fixed) + fixed; // with the one that is offered
     QStringList texts;
     if (line > 0 && column >= 0) {
         QString text = GridTexts::tr("Line %1 of %2").arg(line).arg(lines);
@@ -223,7 +209,7 @@ void CGenGrid::Reload()
 
 void CGenGrid::paintEvent(QPaintEvent* event)
 {
-    QTableView::paintEvent(event);
+    PaintCells(event->region());
     const bool isFiltered = m_model->Shown().IsFiltered();
     if (RowCount() > 0 || !(MayGrow() || isFiltered) || !isEnabled())
         return;
@@ -239,6 +225,15 @@ void CGenGrid::changeEvent(QEvent* event)
     QTableView::changeEvent(event);
     if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange)
         m_widths->Reset();
+    // Texts of entries are others now.
+    if (event->type() == QEvent::LanguageChange && m_model->Shown().IsFiltered())
+        QMetaObject::invokeMethod(this, &CGenGrid::FilterAfresh, Qt::QueuedConnection);
+}
+
+void CGenGrid::FilterAfresh()
+{
+    if (m_model->Shown().IsFiltered())
+        ChangeView([](CGridModel& model) { model.Filter(QStringList(model.Filters())); });
 }
 
 // ---- editing -----------------------------------------------------------------------------------
@@ -427,14 +422,22 @@ bool CGenGrid::Scatters(const QMouseEvent& click) const
 void CGenGrid::mousePressEvent(QMouseEvent* event)
 {
     m_isPressRefused = Scatters(*event) || !LeaveField();
-    if (!m_isPressRefused)
-        QTableView::mousePressEvent(event);
+    if (m_isPressRefused)
+        return;
+    const bool goesOn = event->modifiers().testFlag(Qt::ShiftModifier) && currentIndex().isValid();
+    m_pressed = goesOn ? m_selection->OtherEnd() : indexAt(event->position().toPoint());
+    QTableView::mousePressEvent(event);
 }
 
 void CGenGrid::mouseMoveEvent(QMouseEvent* event)
 {
-    if (!m_isPressRefused || event->buttons() == Qt::NoButton)
-        QTableView::mouseMoveEvent(event);
+    if (m_isPressRefused && event->buttons() != Qt::NoButton)
+        return;
+    // What is frozen is no edge at which a drag scrolls sideways.
+    setAutoScroll(
+        !FrozenPart().adjusted(0, autoScrollMargin(), 0, -autoScrollMargin()).contains(event->position().toPoint()));
+    QTableView::mouseMoveEvent(event);
+    setAutoScroll(true);
 }
 
 void CGenGrid::mouseDoubleClickEvent(QMouseEvent* event)
@@ -485,9 +488,8 @@ bool CGenGrid::eventFilter(QObject* object, QEvent* event)
         return true;
     }
     const bool isClick = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonDblClick;
-    const bool isBorder =
-        isClick && object == horizontalHeader()->viewport() &&
-        IsColumnBorder(*horizontalHeader(), static_cast<QMouseEvent*>(event)->position().toPoint().x());
+    const bool isBorder = isClick && object == horizontalHeader()->viewport() &&
+                          m_header->BorderAt(static_cast<QMouseEvent*>(event)->position().toPoint().x()) >= 0;
     const bool isHeader = object == verticalHeader()->viewport() || object == horizontalHeader()->viewport();
     if (isClick && isHeader && !isBorder && Scatters(*static_cast<QMouseEvent*>(event)))
         return true;

@@ -7,6 +7,7 @@
 
 #include <QTableView>
 
+class CFrozenColumns;
 class CGridDelegate;
 class CGridHeader;
 class CGridInput;
@@ -30,20 +31,22 @@ public:
     QSize sizeHint() const override;
     CGridSelection& Selection() const { return *m_selection; }
     CGridHeader& Header() const { return *m_header; }
+    const CFrozenColumns& Frozen() const { return *m_frozen; }
 
     int RowCount() const { return m_model->rowCount(); }
     int ColumnCount() const { return m_model->columnCount(); }
     /// 0 when there is no current cell.
     int CurrentRow() const { return currentIndex().row() + 1; }
     int CurrentColumn() const { return currentIndex().column() + 1; }
+    int FirstColumnInSight() const;
     /// Makes a cell current and shows it. A row past the end is the last row.
     void SetCurrentCell(int row, int column);
-    void GotoLine(int row) { SetCurrentCell(row, columnAt(0) + 1); }
+    void GotoLine(int row) { SetCurrentCell(row, FirstColumnInSight()); }
     /// The same for a line by its number in the file. One that the filter hides is shown, and the user is told.
     void ShowLine(int number, int column);
     /// Shows where a line was that is gone: no other one comes into sight for it.
     void ShowPlace(int number, int column);
-    void ShowLine(int number) { ShowLine(number, columnAt(0) + 1); }
+    void ShowLine(int number) { ShowLine(number, FirstColumnInSight()); }
     /// The number of the current line in the file; 0 without one.
     int CurrentLine() const { return CurrentRow() > 0 ? m_model->LineNumber(CurrentRow() - 1) : 0; }
     /// Sorts or filters; the current cell goes with its line, and what was selected is no longer.
@@ -95,6 +98,10 @@ public:
     /// The way out of the grid by keyboard.
     void LeaveBackwards() { focusPreviousChild(); }
 
+    QRect visualRect(const QModelIndex& cell) const override;
+    QModelIndex indexAt(const QPoint& point) const override;
+    void scrollTo(const QModelIndex& cell, ScrollHint hint = EnsureVisible) override;
+
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
@@ -109,6 +116,10 @@ protected:
     void changeEvent(QEvent* event) override;
     void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
     void keyboardSearch(const QString& typed) override;
+    QRegion visualRegionForSelection(const QItemSelection& selection) const override;
+    void setSelection(const QRect& dragged, QItemSelectionModel::SelectionFlags command) override;
+    void scrollContentsBy(int dx, int dy) override;
+    void updateGeometries() override;
     bool edit(const QModelIndex& index, EditTrigger trigger, QEvent* event) override;
     using QTableView::edit;
 
@@ -116,11 +127,15 @@ private:
     bool LeaveField();
     bool Scatters(const QMouseEvent& click) const;
     void ShowLineMenu(const QContextMenuEvent& event);
+    void FilterAfresh();
     void FollowLine(int row, int column);
     void NoteLine(int row);
     int RowLikeCurrent(int row) const;
+    QRect FrozenPart() const;
+    void PaintCells(const QRegion& dirty);
 
-    CGridModel* m_model; // these are children
+    std::unique_ptr<CFrozenColumns> m_frozen; // the base asks for it while the others are made
+    CGridModel* m_model;                      // these are children
     CGridDelegate* m_delegate;
     CGridWidths* m_widths;
     CGridSelection* m_selection;
@@ -134,6 +149,7 @@ private:
     int m_contents = 0;                    // of the document, when the rows were last shown
     int m_goneFrom = 0;                    // the row in which the line stood that was current and is gone
     bool m_modified = false;               // since the last cell move
+    QPersistentModelIndex m_pressed;       // where what the mouse selects begins
     bool m_isPressRefused = false;         // what follows the press of a button is none of the table's
     int m_branchNameColumn = 0;
 };

@@ -5,15 +5,13 @@
 #include "grid/grid_host.h"
 #include "grid/grid_texts.h"
 #include "grid/grid_widths.h"
-#include "grid/table_text.h"
+#include "grid/paste_dialog.h"
 #include "ks/fc/doc.h"
-#include "ks/fc/message_box.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QMimeData>
 #include <algorithm>
-#include <numeric>
 
 bool CanCopyCells(const CGenGrid& grid)
 {
@@ -26,26 +24,51 @@ static QString HeaderText(const ColumnSpec& column)
     return (column.header() + u' ' + column.UnitLine()).simplified();
 }
 
+/// Texts say less than numbers do where a unit comes between.
+static bool HidesInUnits(const ColumnSpec& column)
+{
+    return column.IsNumeric() && column.style.UnitConvertFromBase(1, 1) != 1;
+}
+
 static void Copy(const CGenGrid& grid, bool withHeaders)
 {
     if (!CanCopyCells(grid))
         return;
+    const CGridModel& model = *grid.Model();
     const QItemSelection selection = grid.selectionModel()->selection();
     const QItemSelectionRange range =
         selection.isEmpty() ? QItemSelectionRange(grid.currentIndex()) : selection.front();
-    std::vector<QStringList> rows;
-    rows.reserve(std::size_t(range.height()) + withHeaders);
+    std::vector<QStringList> texts, numbers;
+    std::vector<CopiedTable::Column> columns;
+    bool hides = false;
+    for (int column = range.left(); column <= range.right(); ++column) {
+        const ColumnSpec& spec = model.Column(column);
+        const UnitGroup quantity = spec.IsNumeric() ? spec.style.Group() : UnitGroup::None;
+        columns.push_back({quantity, quantity == UnitGroup::None ? QString() : spec.UnitSymbol()});
+        hides = hides || HidesInUnits(spec);
+    }
+    texts.reserve(std::size_t(range.height()) + withHeaders);
     if (withHeaders) {
-        QStringList& headers = rows.emplace_back();
+        QStringList& headers = texts.emplace_back();
         for (int column = range.left(); column <= range.right(); ++column)
-            headers << HeaderText(grid.Model()->Column(column));
+            headers << HeaderText(model.Column(column));
+        if (hides)
+            numbers.emplace_back(headers.size());
     }
     for (int row = range.top(); row <= range.bottom(); ++row) {
-        QStringList& cells = rows.emplace_back();
-        for (int column = range.left(); column <= range.right(); ++column)
-            cells << EditText(grid.Model()->Column(column), grid.Model()->Value(row, column));
+        QStringList& cells = texts.emplace_back();
+        if (hides)
+            numbers.emplace_back();
+        for (int column = range.left(); column <= range.right(); ++column) {
+            const ColumnSpec& spec = model.Column(column);
+            const CellValue value = model.Value(row, column);
+            cells << EditText(spec, value);
+            const auto* const number = std::get_if<double>(&value);
+            if (hides)
+                numbers.back() << (number && !IsEmptyCell(spec, value) ? KsShortestNumber(*number) : QString());
+        }
     }
-    QGuiApplication::clipboard()->setText(WriteTable(rows));
+    QGuiApplication::clipboard()->setMimeData(ToClipboard(texts, columns, numbers).release()); // owns it
 }
 
 void CopyCells(const CGenGrid& grid)
@@ -65,100 +88,127 @@ bool CanPasteCells(const CGenGrid& grid)
            (grid.currentIndex().isValid() || grid.RowCount() == 0);
 }
 
-/// Why the cells cannot go to row `top` and column `left`; empty when they can.
-static QString PasteRefusal(const CGridModel& model, int top, int left, const std::vector<QStringList>& cells)
+namespace {
+
+/// Where a paste begins, and what is pasted there.
+struct PasteStart
 {
-    const auto header = [&](int column) { return model.Column(column).header(); };
-    const auto refused = [&](int row, int column, const QString& text, const QString& reason) {
-        return GridTexts::tr("Nothing was pasted. Line %1, column \"%2\" cannot take \"%3\":\n%4")
-            .arg(QString::number(model.LineNumber(row)), header(column), text, reason);
+    int row, column;
+    ReadCopied read;
+};
+
+/// One cell over as many as a selection has.
+CopiedTable Repeated(CopiedTable cell, int lines, int columns)
+{
+    const auto repeat = [&](CTextTable& texts) {
+        texts = CTextTable(WriteTable({std::size_t(lines), QStringList(columns, texts.At(0, 0).toString())}));
     };
-    if (!model.Rows()->MayGrow() && top + int(cells.size()) > model.StoredRows())
-        return GridTexts::tr("Nothing was pasted. From line %1 on the table has only %2 lines.")
-            .arg(model.LineNumber(top))
-            .arg(model.StoredRows() - top);
-    for (std::size_t r = 0; r < cells.size(); ++r) {
-        const int row = top + int(r), width = int(cells[r].size());
-        if (left + width > model.columnCount())
-            return GridTexts::tr("Nothing was pasted. The copied cells are %1 columns wide; from column \"%2\" on the "
-                                 "table has only %3.")
-                .arg(width)
-                .arg(header(left))
-                .arg(model.columnCount() - left);
-        for (int c = 0; c < width; ++c) {
-            const QString refusal = model.Refusal(row, left + c, cells[r][c], false);
-            if (!refusal.isEmpty())
-                return refused(row, left + c, cells[r][c], refusal);
-        }
-    }
-    if (const auto fault = model.Fault(top, left, cells))
-        return refused(top + int(fault->row), left, cells[fault->row].join(QStringLiteral("  ")), fault->text);
-    return {};
+    repeat(cell.texts);
+    if (cell.numbers)
+        repeat(*cell.numbers);
+    if (!cell.columns.empty())
+        cell.columns.resize(std::size_t(columns), cell.columns.front());
+    return cell;
 }
 
-/// The first line names the columns, with the units that they show or without: it says what follows, and is no line.
-static bool IsHeaderLine(const CGridModel& model, int left, const QStringList& cells)
+PasteStart StartOf(const CGenGrid& grid)
 {
-    if (cells.isEmpty() || left + cells.size() > model.columnCount())
-        return false;
-    const auto names = [&](qsizetype cell) {
-        const ColumnSpec& column = model.Column(left + int(cell));
-        const QString text = cells[cell].simplified();
-        return text.compare(HeaderText(column), Qt::CaseInsensitive) == 0 ||
-               text.compare(column.header().simplified(), Qt::CaseInsensitive) == 0;
-    };
-    for (qsizetype cell = 0; cell < cells.size(); ++cell)
-        if (!names(cell))
-            return false;
-    return true;
-}
-
-/// What was pasted is selected, its beginning in sight.
-static void ShowPasted(CGenGrid& grid, int top, int left, const std::vector<QStringList>& cells)
-{
-    const auto width = [](const QStringList& row) { return int(row.size()); };
-    const int right = left + width(std::ranges::max(cells, {}, width)) - 1, bottom = top + int(cells.size()) - 1;
-    if (bottom >= grid.RowCount() || right >= grid.ColumnCount() || (bottom == top && right == left))
-        return;
-    grid.SetCurrentCell(top + 1, left + 1);
-    grid.selectionModel()->select({grid.Model()->index(top, left), grid.Model()->index(bottom, right)},
-                                  QItemSelectionModel::ClearAndSelect);
-}
-
-bool PasteCells(CGenGrid& grid)
-{
-    if (!CanPasteCells(grid) || !grid.Model()->Document()->MayChange())
-        return false;
     const auto selected = grid.SelectedBlock();
-    const int top = selected ? selected->top() : std::max(0, grid.currentIndex().row());
-    const int left = selected ? selected->left() : std::max(0, grid.currentIndex().column());
-    auto cells = ReadTable(QGuiApplication::clipboard()->text());
-    const bool hasHeaders = cells.size() > 1 && IsHeaderLine(*grid.Model(), left, cells.front());
-    if (hasHeaders)
-        cells.erase(cells.begin());
-    if (selected && cells.size() == 1 && cells.front().size() == 1) // one copied cell fills the selection
-        cells.assign(std::size_t(selected->height()), QStringList(selected->width(), cells.front().front()));
-    if (const QString refusal = PasteRefusal(*grid.Model(), top, left, cells); !refusal.isEmpty()) {
-        KsMessageBox(refusal, QMessageBox::Ok, &grid);
-        return false;
-    }
-    grid.StoreEditedLine();
-    const int current = std::max(1, grid.CurrentRow());
-    grid.Model()->Paste(top, left, cells, GridTexts::tr("Paste"));
-    const auto count = std::accumulate(cells.begin(), cells.end(), std::size_t(0),
-                                       [](std::size_t sum, const auto& row) { return sum + std::size_t(row.size()); });
-    QString done = GridTexts::Counted(count, GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted"));
-    if (std::ranges::any_of(cells, [&](const QStringList& row) { return row.size() != cells.front().size(); }))
+    const QItemSelectionRange block = selected ? *selected : QItemSelectionRange();
+    return {selected ? block.top() : std::max(0, grid.currentIndex().row()),
+            selected ? block.left() : std::max(0, grid.currentIndex().column()),
+            [block, isBlock = selected.has_value()](QChar separator) {
+                CopiedTable copied = FromClipboard(*QGuiApplication::clipboard()->mimeData(), separator);
+                const bool isCell = copied.texts.Lines() == 1 && copied.texts.Width(0) == 1;
+                return isBlock && isCell ? Repeated(std::move(copied), block.height(), block.width()) : copied;
+            }};
+}
+
+/// Nothing when the user has to be asked.
+std::optional<PasteDecision> WithoutAsking(const CTableRows& rows, const PasteStart& start)
+{
+    const CopiedTable copied = start.read(u'\t');
+    PasteChoice choice = AsItStands(rows, copied, start.row, start.column);
+    choice.hasHeaders = HasHeadersInOrder(rows, copied.texts, start.column);
+    if (!choice.hasHeaders && SeemsToHaveHeaders(rows, copied.texts, start.column))
+        return std::nullopt;
+    CPastePlan plan(rows, copied, std::move(choice));
+    const bool isList = copied.texts.Lines() > 1 && plan.Columns() == 1; // one that may be a table all the same
+    if (!plan.IsClean() || (isList && SeparatorOf(start.read) == u';'))
+        return std::nullopt;
+    return PasteDecision{plan.TakeCells(), plan.Choice(), plan.CellCount(), 0};
+}
+
+/// What was pasted is selected where it is one block, its beginning in sight.
+void ShowPasted(CGenGrid& grid, const PastedCells& cells)
+{
+    const CGridModel& model = *grid.Model();
+    const auto [left, right] = std::ranges::minmax(cells.columns, {}, &PastedCells::Column::column);
+    const int top = model.ShownRow(cells.rows.front()), bottom = model.ShownRow(cells.rows.back());
+    if (top < 0)
+        return;
+    const bool isBlock =
+        bottom - top + 1 == int(cells.rows.size()) && right.column - left.column + 1 == int(cells.columns.size());
+    if (isBlock && bottom == top && right.column == left.column)
+        return;
+    grid.SetCurrentCell(top + 1, left.column + 1);
+    if (isBlock)
+        grid.selectionModel()->select({model.index(top, left.column), model.index(bottom, right.column)},
+                                      QItemSelectionModel::ClearAndSelect);
+}
+
+QString Summary(const PasteDecision& decision)
+{
+    QString done =
+        GridTexts::Counted(decision.cellCount, GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted"));
+    if (decision.leftOut > 0)
+        done += QStringLiteral("; ") +
+                GridTexts::Counted(decision.leftOut, GridTexts::tr("1 left out"), GridTexts::tr("%1 left out"));
+    else if (std::ranges::any_of(decision.cells.columns, [](const auto& column) { return !column.left.empty(); }) &&
+             decision.choice.place != PastePlace::ByPlace)
         done += GridTexts::tr("; shorter lines leave their other cells as they were");
-    if (hasHeaders)
+    if (decision.choice.hasHeaders)
         done += GridTexts::tr("; the line with the headers was left out");
-    grid.Model()->Document()->Say(done);
+    return done;
+}
+
+void Make(CGenGrid& grid, const PasteDecision& decision)
+{
+    const int current = std::max(1, grid.CurrentRow());
+    grid.Model()->Paste(decision.cells, GridTexts::tr("Paste"));
+    grid.Model()->Document()->Say(Summary(decision));
     if (grid.Host())
         grid.Host()->LineEdited(grid); // the project is told when locations came in
     grid.Reload();
     grid.Widths().MakeRoom();
     if (grid.CurrentRow() ==
         current) // else the table puts its lines in order, and the current one has gone to its place
-        ShowPasted(grid, top, left, cells);
-    return true;
+        ShowPasted(grid, decision.cells);
+}
+
+bool Paste(CGenGrid& grid, bool asks)
+{
+    if (!CanPasteCells(grid) || !grid.Model()->Document()->MayChange())
+        return false;
+    grid.StoreEditedLine();
+    const PasteStart start = StartOf(grid);
+    auto decision = asks ? std::nullopt : WithoutAsking(*grid.Model(), start);
+    if (!decision)
+        decision = AskForPaste(*grid.Model(), start.read, start.row, start.column,
+                               grid.Host() && grid.Host()->CanSearch(grid), grid);
+    if (decision)
+        Make(grid, *decision);
+    return decision.has_value();
+}
+
+} // namespace
+
+bool PasteCells(CGenGrid& grid)
+{
+    return Paste(grid, false);
+}
+
+bool PasteCellsWithPreview(CGenGrid& grid)
+{
+    return Paste(grid, true);
 }

@@ -9,5 +9,8 @@ void CopyCells(const CGenGrid& grid);
 /// Likewise below a line with the columns' headers and units.
 void CopyCellsWithHeaders(const CGenGrid& grid);
 bool CanPasteCells(const CGenGrid& grid);
-/// Pastes at the selection. False, after a message, when a cell refuses its text; then nothing changed.
+/// Pastes at the selection. What is doubtful - texts that their cells refuse, headers in another order - is shown
+/// first, to be decided by the user. False when he thinks better of it; then nothing changed.
 bool PasteCells(CGenGrid& grid);
+/// Likewise; always shows first what would come of it.
+bool PasteCellsWithPreview(CGenGrid& grid);

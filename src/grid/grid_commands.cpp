@@ -4,6 +4,7 @@
 #include "grid/gen_grid.h"
 #include "grid/grid_texts.h"
 #include "grid/line_commands.h"
+#include "ks/fc/doc.h"
 
 #include <algorithm>
 
@@ -104,6 +105,9 @@ void CGridCommands::Run(int command, CGenGrid& grid)
 
 void CGridCommands::Run(GridAction action, CGenGrid& grid)
 {
+    const bool moves = action == GridAction::MoveUp || action == GridAction::MoveDown;
     if (CanRun(action, grid))
         IsOfLines(action) ? RunOnLines(grid, action) : RunOnCells(grid, action);
+    else if (grid.MayChange() && IsOfLines(action) && !moves && grid.Model()->Rows() && !grid.MayGrow())
+        grid.Model()->Document()->Say(GridTexts::tr("Lines cannot be added to this table."));
 }

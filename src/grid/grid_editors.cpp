@@ -9,10 +9,12 @@
 #include "grid/grid_model.h"
 #include "grid/grid_texts.h"
 #include "grid/name_offers.h"
+#include "grid/saved_mark.h"
 #include "grid/typing.h"
 
 #include <QApplication>
 #include <QComboBox>
+#include <QElapsedTimer>
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QMdiSubWindow>
@@ -78,10 +80,33 @@ QWidget* MakeBranchList(const QStringList& names, QWidget* parent, QWidget* view
     return list;
 }
 
+/// A list whose entries are found by their letters, blanks among them: only a first blank opens it.
+class CChoiceList : public QComboBox
+{
+public:
+    using QComboBox::QComboBox;
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override
+    {
+        const bool isTyping = m_typed.isValid() && m_typed.elapsed() < QApplication::keyboardInputInterval();
+        const bool isLetter = !event->text().isEmpty() && event->text().at(0).isPrint();
+        if (isLetter && (isTyping || event->key() != Qt::Key_Space))
+            m_typed.start();
+        if (!isTyping || event->key() != Qt::Key_Space)
+            return QComboBox::keyPressEvent(event);
+        QKeyEvent letter(QEvent::KeyPress, Qt::Key_nobreakspace, event->modifiers(), event->text());
+        QComboBox::keyPressEvent(&letter);
+    }
+
+private:
+    QElapsedTimer m_typed;
+};
+
 /// One of a column's entries, by pop-up, arrow keys or first letters; Backspace empties the cell.
 QWidget* MakeChoice(const QStringList& entries, QWidget* parent)
 {
-    auto* list = new QComboBox(parent);
+    auto* list = new CChoiceList(parent);
     list->addItems(entries);
     // Opened by the mouse the entries are what the user wants to see next.
     if (QApplication::mouseButtons() != Qt::NoButton)
@@ -173,6 +198,12 @@ void CGridDelegate::PaintControl(QPainter* painter, const QStyleOptionViewItem& 
     }
 }
 
+void CGridDelegate::PaintChange(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
+{
+    if (m_grid->Model()->Saved().Before(index.row(), index.column()))
+        PaintCellMark(*painter, cell.rect, cell.palette, cell.state.testFlag(QStyle::State_Selected));
+}
+
 /// A text on its background. The style would lay it out as it does rich contents, which takes several times as long,
 /// and a table repaints hundreds of cells at each step of scrolling.
 void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const
@@ -194,7 +225,10 @@ void CGridDelegate::PaintText(QPainter* painter, const QStyleOptionViewItem& cel
     const int x = isRight ? inside.right() + 1 - width : inside.left();
     const int y = inside.top() + (inside.height() - cell.fontMetrics.height() + 1) / 2 + cell.fontMetrics.ascent();
     const bool enabled = cell.state.testFlag(QStyle::State_Enabled);
-    painter->setPen(cell.palette.color(enabled ? QPalette::Normal : QPalette::Disabled, QPalette::Text));
+    const QVariant own = enabled ? index.data(Qt::ForegroundRole) : QVariant();
+    painter->setPen(own.isValid()
+                        ? qvariant_cast<QBrush>(own).color()
+                        : cell.palette.color(enabled ? QPalette::Normal : QPalette::Disabled, QPalette::Text));
     painter->drawText(x, y, text);
 }
 
@@ -209,6 +243,7 @@ void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
             QStyledItemDelegate::paint(painter, option, index);
         if (m_grid->Model()->HidesDigits(index.row(), index.column()))
             PaintDigitsMark(*painter, option.rect, option.palette, option.state.testFlag(QStyle::State_Selected));
+        PaintChange(painter, option, index);
         return;
     }
     QStyleOptionViewItem cell = option;
@@ -216,6 +251,7 @@ void CGridDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
     cell.features &= ~QStyleOptionViewItem::HasCheckIndicator; // drawn centred below
     m_grid->style()->drawControl(QStyle::CE_ItemViewItem, &cell, painter, m_grid);
     PaintControl(painter, cell, index);
+    PaintChange(painter, option, index);
 }
 
 bool CGridDelegate::editorEvent(QEvent* event, QAbstractItemModel*, const QStyleOptionViewItem& option,

@@ -35,6 +35,7 @@ private:
     void LostFocus(const QEvent* event);
     QString Refusal() const; // of the open editor's text
     void PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
+    void PaintChange(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
     void PaintControl(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
 
     CGenGrid* m_grid;

@@ -49,6 +49,14 @@ QSize CGridHeader::sizeHint() const
     return {headers.width(), headers.height() + m_fields->Height()};
 }
 
+/// It shows nothing of what is selected, and asks for each column that it paints whether all of its cells are, one by
+/// one: its own selection, in which nothing is, answers at once.
+void CGridHeader::setSelectionModel(QItemSelectionModel* selection)
+{
+    if (!selectionModel() || selectionModel()->model() != selection->model())
+        QHeaderView::setSelectionModel(selection);
+}
+
 void CGridHeader::initStyleOptionForIndex(QStyleOptionHeader* option, int column) const
 {
     QHeaderView::initStyleOptionForIndex(option, column);

@@ -29,7 +29,8 @@ bool CGridInput::eventFilter(QObject* object, QEvent* event)
     if (!key || m_grid.Header().Fields().HaveFocus())
         return QObject::eventFilter(object, event);
     event->accept();
-    if (event->type() == QEvent::KeyPress)
+    // A key that the open editor of a cell left to the table is about the table with what was typed.
+    if (event->type() == QEvent::KeyPress && (key->whileEditing || m_grid.CommitEditor()))
         Run(key->action);
     return true;
 }
@@ -54,6 +55,9 @@ void CGridInput::Run(GridAction action)
         return CopyCellsWithHeaders(m_grid);
     case GridAction::Paste:
         PasteCells(m_grid);
+        return;
+    case GridAction::PasteWithPreview:
+        PasteCellsWithPreview(m_grid);
         return;
     case GridAction::OpenMenu: {
         QContextMenuEvent event(QContextMenuEvent::Keyboard, QPoint(), QPoint());

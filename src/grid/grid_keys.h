@@ -25,6 +25,7 @@ enum class GridAction
     Copy,
     CopyWithHeaders,
     Paste,
+    PasteWithPreview,
     Cut,
     Clear,
     SearchAgain,
@@ -34,6 +35,7 @@ enum class GridAction
     Interpolate,
     Calculate,
     ResetToGlobal,
+    RevertToSaved,
     Replace,
     Undo,
     Redo,
@@ -63,7 +65,7 @@ struct GridKey
     Qt::KeyboardModifiers held; // which of `looked at` must be held
     Qt::KeyboardModifiers lookedAt;
     GridAction action;
-    bool whileEditing; // also when a cell editor has the focus
+    bool whileEditing; // also in the open editor of a cell, which has the others first
 
     QString Text() const { return TextOf(action); }
 };

@@ -44,6 +44,7 @@ public:
         Add(GridAction::Copy, m_copies);
         Add(GridAction::CopyWithHeaders, m_copies);
         Add(GridAction::Paste, m_pastes);
+        Add(GridAction::PasteWithPreview, m_pastes);
     }
     void AddLines()
     {
@@ -91,6 +92,8 @@ void GridMenus::AddForLines(QMenu& menu, CGenGrid& grid)
     CMenu entries(menu, grid);
     entries.AddLines();
     entries.AddClipboard();
+    menu.addSeparator();
+    entries.Add(GridAction::RevertToSaved);
 }
 
 void GridMenus::AddForColumn(QMenu& menu, CGenGrid& grid, int column)

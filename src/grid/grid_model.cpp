@@ -32,6 +32,13 @@ QBrush LockedBackground()
 
 namespace {
 
+QString AsSentence(QString text)
+{
+    if (!text.isEmpty())
+        text.front() = text.front().toUpper();
+    return text;
+}
+
 /// A theme may have a color for such texts that nobody sees.
 QBrush PaleText()
 {
@@ -80,6 +87,7 @@ void CGridModel::SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows)
     m_sortedBy.clear();
     m_filters.clear();
     m_contents = document.Contents();
+    m_saved.SetDocument(document);
     m_rowCount = ShownRows();
     endResetModel();
     emit ViewChanged();
@@ -144,10 +152,10 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
         if (column.Kind() != CellKind::Flag)
             return {};
         return value() == CellValue(std::int32_t(0)) ? Qt::Unchecked : Qt::Checked;
-    case Qt::ToolTipRole: {
-        const QString text = CellToolTip(column, value());
-        return IsGlobalValue(index.row(), index.column()) ? text + u'\n' + GridTexts::tr("The global value") : text;
-    }
+    case Qt::ToolTipRole:
+        return CellDetails(index.row(), index.column());
+    case Qt::AccessibleDescriptionRole:
+        return m_saved.CellText(index.row(), index.column());
     case Qt::ForegroundRole: // what is no line's own stands back
         return IsGlobalValue(index.row(), index.column()) ? QVariant(PaleText()) : QVariant();
     case Qt::BackgroundRole:
@@ -160,12 +168,37 @@ QVariant CGridModel::data(const QModelIndex& index, int role) const
 QVariant CGridModel::headerData(int section, Qt::Orientation orientation, int role) const
 {
     if (orientation == Qt::Vertical)
-        return role == Qt::DisplayRole ? QVariant(LineNumber(section)) : QVariant();
+        return LineNumberData(section, role);
     if (section < 0 || section >= columnCount())
         return {};
     if (role == Qt::DisplayRole)
         return Column(section).header();
     return role == Qt::ToolTipRole ? HeaderToolTip(section) : QVariant();
+}
+
+/// The whole value, and what there is to say of it.
+QString CGridModel::CellDetails(int row, int column) const
+{
+    QStringList lines{CellToolTip(Column(column), Value(row, column))};
+    if (IsGlobalValue(row, column))
+        lines << GridTexts::tr("The global value");
+    lines << AsSentence(m_saved.CellText(row, column));
+    lines.removeAll(QString());
+    return lines.join(u'\n');
+}
+
+QVariant CGridModel::LineNumberData(int row, int role) const
+{
+    switch (role) {
+    case Qt::DisplayRole:
+        return LineNumber(row);
+    case Qt::ToolTipRole:
+        return m_saved.LineDetails(row);
+    case Qt::AccessibleDescriptionRole:
+        return m_saved.LineText(row);
+    default:
+        return {};
+    }
 }
 
 /// What the column means, the unit and the range of its cells, what new lines hold, and how the file calls it.
@@ -360,32 +393,33 @@ bool CGridModel::StoreRows(const Overlay& typed, BlankRule rule)
     return true;
 }
 
-void CGridModel::Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step)
+void CGridModel::Paste(const PastedCells& cells, const QString& step)
 {
-    if (!m_document->MayChange())
+    if (!m_document->MayChange() || cells.rows.empty())
         return;
     Store();
-    const int last = StoredRows();
-    row = std::min(row, last);
+    const std::size_t end = m_rows->Count(), bottom = std::ranges::max(cells.rows);
+    auto added = bottom >= end ? NewLines(int(bottom - end + 1)) : nullptr;
     CCellChanges changes;
-    auto added = row + int(texts.size()) > last ? NewLines(row + int(texts.size()) - last) : nullptr;
-    for (int r = 0; r < int(texts.size()); ++r) {
-        for (int c = 0; c < texts[std::size_t(r)].size(); ++c) {
-            const ColumnSpec& spec = Column(column + c);
-            const QString& text = texts[std::size_t(r)][c];
-            const auto after = [&] { return Resolved(column + c, ReadCell(spec, text).value); };
-            if (row + r >= last) {
-                spec.access->set(added->At(std::size_t(row + r - last)), after());
+    for (const auto& [column, values, left] : cells.columns) {
+        const auto& access = Column(column).access;
+        for (std::size_t i = 0; i < cells.rows.size(); ++i) {
+            if (!left.empty() && left[i])
+                continue;
+            const std::size_t row = cells.rows[i];
+            CellValue after = values[i];
+            if (row >= end) {
+                access->set(added->At(row - end), after);
                 continue;
             }
-            CellValue before = Value(row + r, column + c);
-            if (text != EditText(spec, before))
-                changes.Add(NameOf(row + r), column + c + 1, spec.access, before, after());
+            CellValue before = access->get(m_rows->At(row));
+            if (!SameCell(before, after))
+                changes.Add(m_rows->KeyAt(row), column + 1, access, std::move(before), std::move(after));
         }
     }
     if (changes.IsEmpty() && !added)
         return;
-    const std::size_t end = m_rows->Count(), first = SourceRow(row);
+    const std::size_t first = std::min(cells.rows.front(), end);
     const QScopedValueRollback changed(m_changedAt, std::optional(end));
     Change(step, first, [&] {
         if (!changes.IsEmpty())

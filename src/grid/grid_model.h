@@ -3,6 +3,7 @@
 #pragma once
 
 #include "grid/cell_changes.h"
+#include "grid/saved_lines.h"
 #include "grid/table_rows.h"
 
 #include <QAbstractTableModel>
@@ -22,6 +23,8 @@ public:
     /// was typed and not stored is dropped.
     void SetSource(CKsDoc& document, std::shared_ptr<IRowSource> rows);
     CKsDoc* Document() const { return m_document; }
+    /// What differs from the last save.
+    const CSavedLines& Saved() const { return m_saved; }
 
     /// Shows the source as it is now. Costs the same for any number of rows, unless they are sorted or filtered.
     void Sync();
@@ -54,9 +57,9 @@ public:
     /// Moves what was typed into the rows, as one undo step; no other cell is touched. False when nothing changed.
     /// An offered row into which something was typed enters the source.
     bool Store(BlankRule rule = BlankRule::Zero);
-    /// Puts `texts` into the cells from (row, column) on, rows past the last one being added: one undo step with the
-    /// text `step`. Every text must have passed Refusal.
-    void Paste(int row, int column, const std::vector<QStringList>& texts, const QString& step);
+    /// Puts these values, none of which the cells refuse, into the cells: one undo step with the text `step`. What was
+    /// typed is stored before.
+    void Paste(const PastedCells& cells, const QString& step);
     /// Changes cells, the first of which stands in `row`: one undo step with the text `step`. What was typed is stored.
     void ChangeCells(const QString& step, int row, CCellChanges changes);
     /// A new line before `row`, with the columns' fill values: an undo step. The offered row becomes a line before it.
@@ -73,7 +76,7 @@ public:
     /// The rows change places with the one above them, or below: an undo step. Not while they are sorted. Returns why
     /// they did not.
     QString MoveRows(int row, int count, bool up);
-    /// A new line behind the last one, with these texts from its first cell on: an undo step.
+    /// A new line behind the last one, with these texts in its first cells, which take them: an undo step.
     void AppendRow(const QStringList& texts);
     /// An undo step; the offered row stays. No fixed row is among the rows.
     void RemoveRows(int row, int count);
@@ -86,6 +89,8 @@ signals:
 
 private:
     QString HeaderToolTip(int column) const;
+    QString CellDetails(int row, int column) const;
+    QVariant LineNumberData(int row, int role) const;
     std::size_t Change(const QString& step, std::size_t row, const std::function<void()>& make);
     std::size_t Arrange(std::size_t row);
     std::size_t PutBelow(const QString& step, std::size_t row, std::unique_ptr<IRowBlock> lines);
@@ -94,6 +99,7 @@ private:
     bool StoreRows(const Overlay& typed, BlankRule rule);
 
     CKsDoc* m_document = nullptr;
+    CSavedLines m_saved{*this};
     int m_rowCount = 0; // as the views know it
     bool m_syncing = false;
     QStringList m_headers; // as the views know them

@@ -1,6 +1,7 @@
 // Lines that come, go and change places.
 #include "grid/grid_model.h"
 
+#include "grid/cell_text.h"
 #include "grid/grid_texts.h"
 #include "grid/row_commands.h"
 
@@ -16,6 +17,10 @@ int CGridModel::InsertRow(int row)
     const int shownAt = std::min(std::max(row, FixedRows()), StoredRows());
     const std::size_t at = SourceRow(shownAt);
     auto lines = CTableRows::NewLines(1 + OffersRow(), at);
+    if (const QString fault = WhyNotBetween(at, *lines); !fault.isEmpty()) {
+        m_document->Say(GridTexts::tr("No line was inserted. %1").arg(fault));
+        return row;
+    }
     const std::size_t place = PutLines(GridTexts::tr("Insertion of lines"), at, std::move(lines));
     m_document->Say(GridTexts::tr("Line inserted"));
     return ShownRow(place) + row - shownAt; // behind an offered row, if there was one
@@ -92,7 +97,11 @@ void CGridModel::AppendRow(const QStringList& texts)
 {
     if (!m_document->MayChange())
         return;
-    Paste(StoredRows(), 0, {texts}, GridTexts::tr("Insertion of lines"));
+    Store();
+    PastedCells cells{{m_rows->Count()}, {}};
+    for (int column = 0; column < texts.size(); ++column)
+        cells.columns.emplace_back(column).values.Add(Resolved(column, ReadCell(Column(column), texts[column]).value));
+    Paste(cells, GridTexts::tr("Insertion of lines"));
     m_document->Say(GridTexts::tr("Line inserted"));
 }
 

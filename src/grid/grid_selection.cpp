@@ -35,15 +35,21 @@ void CGridSelection::SelectLines(int first, int last)
     m_linesChosen = true;
 }
 
-void CGridSelection::GrowTo(const QModelIndex& cell)
+QModelIndex CGridSelection::OtherEnd() const
 {
-    const QScopedValueRollback choosing(m_choosingLines, m_linesChosen);
     const QModelIndex current = m_grid.currentIndex();
     const QItemSelectionRange selected = Block().value_or(QItemSelectionRange(current));
     const int row = current.row() == selected.top() ? selected.bottom() : selected.top();
     const int column = current.column() == selected.left() ? selected.right() : selected.left();
+    return m_grid.model()->index(row, column);
+}
+
+void CGridSelection::GrowTo(const QModelIndex& cell)
+{
+    const QScopedValueRollback choosing(m_choosingLines, m_linesChosen);
+    const QModelIndex other = OtherEnd();
     const auto corner = [&](auto end) {
-        return m_grid.model()->index(end(row, cell.row()), end(column, cell.column()));
+        return m_grid.model()->index(end(other.row(), cell.row()), end(other.column(), cell.column()));
     };
     m_grid.selectionModel()->setCurrentIndex(cell, QItemSelectionModel::NoUpdate);
     Select(corner([](int a, int b) { return std::min(a, b); }), corner([](int a, int b) { return std::max(a, b); }));

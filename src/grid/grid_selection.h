@@ -41,6 +41,8 @@ public:
     int PlaceOfNewLine(int fixedRows) const;
     /// Selects whole lines, as clicks on their numbers do.
     void SelectLines(int first, int last);
+    /// The end of what is selected at which the current cell is not, from which it grows or shrinks.
+    QModelIndex OtherEnd() const;
     /// The selection grows from its other end to a cell, whole lines by whole lines. The table itself would select from
     /// where a key or the mouse went last, which the grid's own moves are not.
     void GrowTo(const QModelIndex& cell);

@@ -1,9 +1,9 @@
 #include "grid/grid_widths.h"
 
 #include "grid/gen_grid.h"
+#include "grid/line_header.h"
 
 #include <QHeaderView>
-#include <QMouseEvent>
 #include <QStyle>
 #include <algorithm>
 #include <cmath>
@@ -18,29 +18,6 @@ constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
 constexpr int RowsAtStart = 30, RowsForRoom = 4000; // whose texts are measured, at even distances through the table
 constexpr int Margin = 16;                          // pixels beside a text
 constexpr int MostOfAWindow = 320;                  // pixels that a long name may take
-
-/// The row numbers. They are as wide as the grid says: measuring texts of many rows, as the base does whenever the
-/// table is laid out, would cost more than all the rest of showing it.
-class RowNumbers : public QHeaderView
-{
-public:
-    explicit RowNumbers(QWidget* parent) : QHeaderView(Qt::Vertical, parent) { setSectionsClickable(true); }
-    QSize sizeHint() const override { return {minimumWidth(), QHeaderView::minimumSizeHint().height()}; }
-
-protected:
-    /// A click close to the border of a line is one on the line, which the base would take for the wish to make it
-    /// higher.
-    void mousePressEvent(QMouseEvent* event) override
-    {
-        const int line = logicalIndexAt(event->position().toPoint());
-        const QPointF middle(event->position().x(), sectionViewportPosition(line) + sectionSize(line) / 2.0);
-        QMouseEvent press(QEvent::MouseButtonPress, middle, event->scenePosition(), event->globalPosition(),
-                          event->button(), event->buttons(), event->modifiers(), event->pointingDevice());
-        QHeaderView::mousePressEvent(line < 0 ? event : &press);
-    }
-    /// Two clicks with a key between them, which deletes lines, say, are two clicks.
-    void mouseDoubleClickEvent(QMouseEvent* event) override { mousePressEvent(event); }
-};
 
 double FontScale(const QFontMetrics& font)
 {
@@ -73,7 +50,7 @@ double CGridWidths::Letters::Bound(const QString& text)
 
 CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid), m_letters(grid.font())
 {
-    grid.setVerticalHeader(new RowNumbers(&grid));
+    grid.setVerticalHeader(new CLineHeader(*grid.Model(), &grid));
     grid.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     grid.verticalHeader()->setHighlightSections(false);
     grid.verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);

@@ -6,7 +6,7 @@
 class CGenGrid;
 
 inline constexpr GridAction LineActions[] = {GridAction::InsertAbove, GridAction::InsertBelow, GridAction::Duplicate,
-                                             GridAction::MoveUp, GridAction::MoveDown, GridAction::InsertAlong};
+                                             GridAction::MoveUp,      GridAction::MoveDown,    GridAction::InsertAlong};
 
 /// A grid that is sorted can be asked to move lines: it says why it does not.
 bool CanRunOnLines(const CGenGrid& grid, GridAction action);

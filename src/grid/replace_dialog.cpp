@@ -54,7 +54,10 @@ public:
         layout->addWidget(MakeButtons());
         m_timer.setSingleShot(true);
         connect(&m_timer, &QTimer::timeout, this, [this] { Show(); });
+        m_next->setDefault(true); // of this dialog, to which it belongs by now
         resize(640, 480);
+        // Beside the cells that are found, as far as the window has room.
+        move(grid.window()->frameGeometry().bottomRight() - QPoint(width(), height()));
         Show();
     }
 
@@ -128,7 +131,6 @@ private:
         m_next = add(GridTexts::tr("&Find Next"), "findNext", &CReplaceDlg::Next);
         m_one = add(GridTexts::tr("&Replace"), "replace", &CReplaceDlg::ReplaceOne);
         m_all = add(GridTexts::tr("Replace &All"), "replaceAll", &CReplaceDlg::ReplaceAll);
-        m_next->setDefault(true);
         connect(box, &QDialogButtonBox::rejected, this, &QDialog::reject);
         return box;
     }
@@ -150,7 +152,12 @@ private:
     }
 
     /// While somebody types nothing of a million cells is computed.
-    void Later() { m_timer.start(m_takesLong ? 400 : 50); }
+    void Later()
+    {
+        if (m_next)                   // it is there when the fields are
+            m_next->setEnabled(true); // whoever presses it at once means what he has typed
+        m_timer.start(m_takesLong ? 400 : 50);
+    }
 
     void Show()
     {
@@ -250,36 +257,40 @@ private:
     void ReplaceOne()
     {
         const int row = m_grid->CurrentRow() - 1, column = m_grid->CurrentColumn() - 1;
-        if (row >= 0 && row < m_grid->Model()->StoredRows())
-            Make({{{{}, m_grid}, {row, column, row, column}}});
+        const auto isAmong = [&](const Place& place) { // the scope may have changed since it was found
+            return place.table.grid == m_grid && column >= place.block.left && column <= place.block.right;
+        };
+        if (row >= 0 && row < m_grid->Model()->StoredRows() && std::ranges::any_of(Places(), isAmong) &&
+            !Make({{{{}, m_grid}, {row, column, row, column}}}))
+            return;
         Next();
         Show();
     }
 
     void ReplaceAll()
     {
-        Make(Places());
-        Show();
+        if (Make(Places()))
+            Show();
     }
 
-    /// One step, over however many tables.
-    void Make(const std::vector<Place>& places)
+    /// One step, over however many tables. False when the rows together refuse it; the summary says why then.
+    bool Make(const std::vector<Place>& places)
     {
         CKsDoc& document = *m_grid->Model()->Document();
         if (!document.MayChange())
-            return;
+            return true;
         std::vector<CCellResults> all;
         for (const Place& place : places) {
             all.push_back(ReplaceCells(*place.table.grid->Model(), place.block, Query()).results);
             if (const QString fault = all.back().RuleFault(); !fault.isEmpty()) {
-                m_summary->setText(fault);
-                return;
+                m_summary->setText(GridTexts::tr("Nothing was replaced. %1").arg(fault));
+                return false;
             }
         }
         const auto add = [](std::size_t sum, const CCellResults& each) { return sum + each.ChangedCount(); };
         const std::size_t changed = std::accumulate(all.begin(), all.end(), std::size_t(0), add);
         if (changed == 0)
-            return;
+            return true;
         document.UndoStack().beginMacro(NameOf(GridAction::Replace));
         for (std::size_t i = 0; i < all.size(); ++i)
             if (all[i].ChangedCount() > 0)
@@ -290,6 +301,7 @@ private:
         if (m_grid->Host())
             m_grid->Host()->LineEdited(*m_grid);
         m_grid->Reload();
+        return true;
     }
 
     CGenGrid* m_grid; // in which the last cell was found

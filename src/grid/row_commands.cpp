@@ -1,6 +1,7 @@
 #include "grid/row_commands.h"
 
 #include "grid/grid_texts.h"
+#include "grid/line_origin.h"
 
 #include <QUndoStack>
 #include <algorithm>
@@ -18,16 +19,29 @@ class CRowCommand : public CDocumentCommand
 {
 public:
     CRowCommand(CKsDoc& document, const QString& text, Change change)
-        : CDocumentCommand(document, text), m_change(std::move(change))
+        : CDocumentCommand(document, text), m_step(std::make_shared<Step>(std::move(change)))
     {
+    }
+    ~CRowCommand() override
+    {
+        if constexpr (requires { m_step->change.block; })
+            m_step->change.block.reset(); // nobody puts them back any more
     }
 
 protected:
-    ChangePlace Apply() override { return m_change.Apply(); }
-    ChangePlace Revert() override { return m_change.Revert(); }
+    ChangePlace Apply() override { return m_step->change.Apply(); }
+    ChangePlace Revert() override { return m_step->change.Revert(); }
+    std::shared_ptr<const KsLineChange> LineChange() const override { return m_step; }
 
 private:
-    Change m_change;
+    struct Step : KsLineChange
+    {
+        explicit Step(Change made) : change(std::move(made)) {}
+        void TakeBack(KsTracedLine& line, bool forward) const override { change.TakeBack(line, forward); }
+
+        Change change;
+    };
+    std::shared_ptr<Step> m_step;
 };
 
 template <typename Change>
@@ -54,16 +68,28 @@ struct Lines
         place.isGone = true;
         return place;
     }
+    void CarryBack(KsTracedLine& line, bool put) const
+    {
+        ::CarryBack(line, *rows, [this, put](std::size_t at) -> std::optional<std::size_t> {
+            if (at < row)
+                return at;
+            if (!put)
+                return at + count;
+            return at < row + count ? std::nullopt : std::optional(at - count);
+        });
+    }
 };
 struct Insertion : Lines
 {
     ChangePlace Apply() { return Put(); }
     ChangePlace Revert() { return Hold(rows->TakeBack(row, count)); }
+    void TakeBack(KsTracedLine& line, bool forward) const { CarryBack(line, forward); }
 };
 struct Deletion : Lines
 {
     ChangePlace Apply() { return Hold(rows->Take(row, count)); }
     ChangePlace Revert() { return Put(); }
+    void TakeBack(KsTracedLine& line, bool forward) const { CarryBack(line, !forward); }
 };
 
 struct Movement
@@ -80,6 +106,14 @@ struct Movement
     {
         rows->Move(to, from);
         return PlaceOf(*rows, row);
+    }
+    void TakeBack(KsTracedLine& line, bool forward) const
+    {
+        const std::size_t was = forward ? from : to, is = forward ? to : from;
+        CarryBack(line, *rows, [was, is](std::size_t at) {
+            const bool passed = at != is && at >= std::min(was, is) && at <= std::max(was, is);
+            return std::optional(at == is ? was : !passed ? at : was < is ? at + 1 : at - 1);
+        });
     }
 };
 
@@ -99,6 +133,10 @@ struct Arrangement
         rows->Rearrange(places);
         return PlaceOf(*rows, row);
     }
+    void TakeBack(KsTracedLine& line, bool forward) const
+    {
+        CarryBack(line, *rows, [&from = forward ? order : places](std::size_t at) { return std::optional(from[at]); });
+    }
 };
 
 struct Cells
@@ -116,6 +154,11 @@ struct Cells
     {
         changes.Revert(*rows);
         return Place();
+    }
+    void TakeBack(KsTracedLine& line, bool forward) const
+    {
+        if (IsLineOf(line, *rows))
+            changes.RunOn(line.key.value_or(RowOf(line, *rows)), line.object, !forward);
     }
     ChangePlace Place()
     {

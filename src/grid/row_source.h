@@ -87,4 +87,8 @@ public:
     virtual const void* List() const { return nullptr; }
     /// Where the list shows the row: a row kept inside a record is shown at the record.
     virtual std::size_t ListRow(std::size_t row) const { return row; }
+    /// Whether Data() names the table for as long as it exists. Otherwise the row of List() that it belongs to does.
+    virtual bool StaysInMemory() const { return true; }
+    /// Rows that come or go here move what the lines of that list hold.
+    virtual bool MovesContentOf(const void* /*list*/) const { return false; }
 };

@@ -54,10 +54,10 @@ private:
     void Move(const SourceRows& moved, std::size_t count);
 
     bool m_isSorted = false, m_isFiltered = false;
-    SourceRows m_order;         // empty: as the source
-    std::vector<bool> m_hidden; // by rows of the source; empty: none
-    SourceRows m_rows;          // of the source, as they are shown
-    SourceRows m_places;        // where the source's rows are shown, or Nowhere
-    std::vector<RowKey> m_keys; // of the source's rows, as they were at the last look
+    SourceRows m_order;           // empty: as the source
+    std::vector<bool> m_hidden;   // by rows of the source; empty: none
+    SourceRows m_rows;            // of the source, as they are shown
+    SourceRows m_places;          // where the source's rows are shown, or Nowhere
+    std::vector<RowKey> m_keys;   // of the source's rows, as they were at the last look
     std::size_t m_rearranged = 0; // how often they had been put in order by then
 };

@@ -195,22 +195,21 @@ QString CTableRows::Refusal(int row, int column, const QString& text, bool isAlo
         if (IsLocked(row, column))
             return GridTexts::tr("The cell is locked.");
     }
-    const QString refusal = ReadCell(spec, text).refusal;
-    if (!refusal.isEmpty() || !isAlone)
-        return refusal;
-    const auto fault = Fault(row, column, {{text}});
+    CellReading read = ReadCell(spec, text);
+    if (!read.refusal.isEmpty() || !isAlone || !m_rows || !m_rows->HasRules())
+        return read.refusal;
+    PastedCells cell{{SourceRow(row)}, {{column, {}}}};
+    cell.columns.front().values.Add(Resolved(column, read.value));
+    const auto fault = Fault(cell);
     return fault ? fault->text : QString();
 }
 
-std::optional<IRowSource::Fault> CTableRows::Fault(int row, int column, const std::vector<QStringList>& texts) const
+std::optional<IRowSource::Fault> CTableRows::Fault(const PastedCells& cells) const
 {
-    if (!m_rows || !m_rows->HasRules() || texts.empty())
+    if (!m_rows || !m_rows->HasRules() || cells.rows.empty())
         return std::nullopt;
     // The source is asked about the rows from the first to the last one of these, be others among them or not.
-    std::vector<std::size_t> places;
-    for (int r = 0; r < int(texts.size()); ++r)
-        places.push_back(SourceRow(row + r));
-    const auto [low, high] = std::ranges::minmax(places);
+    const auto [low, high] = std::ranges::minmax(cells.rows);
     const std::size_t first = low, stored = m_rows->Count();
     const auto rows = m_rows->NewRows(high - low + 1);
     // what the new ones among them start from
@@ -219,20 +218,17 @@ std::optional<IRowSource::Fault> CTableRows::Fault(int row, int column, const st
         for (const ColumnSpec& spec : m_columns)
             spec.access->set(rows->At(i), spec.access->get(first + i < stored ? m_rows->At(first + i)
                                                                               : lines->At(first + i - stored)));
-    for (int r = 0; r < int(texts.size()); ++r) {
-        const QStringList& given = texts[std::size_t(r)];
-        for (int c = 0; c < int(m_columns.size()); ++c) {
-            const bool isGiven = c >= column && c - column < given.size();
-            if (!isGiven && row + r >= StoredRows())
-                continue;
-            const CellValue value = isGiven ? ReadCell(Column(c), given[c - column]).value : Value(row + r, c);
-            Column(c).access->set(rows->At(places[std::size_t(r)] - first), Resolved(c, value));
-        }
-    }
+    for (const auto& [cell, typed] : m_pending) // seen, and stored before anything is pasted
+        if (typed.row >= first && typed.row - first < rows->Count() && typed.row < stored)
+            Column(cell.second).access->set(rows->At(typed.row - first), Resolved(cell.second, typed.value));
+    for (const auto& column : cells.columns)
+        for (std::size_t i = 0; i < cells.rows.size(); ++i)
+            if (!column.Leaves(i))
+                Column(column.column).access->set(rows->At(cells.rows[i] - first), column.values[i]);
     auto fault = m_rows->FindFault(first, *rows);
     if (fault) { // told of the text, which stands elsewhere
-        const auto place = std::ranges::find(places, first + fault->row);
-        fault->row = place == places.end() ? 0 : std::size_t(place - places.begin());
+        const auto place = std::ranges::find(cells.rows, first + fault->row);
+        fault->row = place == cells.rows.end() ? 0 : std::size_t(place - cells.rows.begin());
     }
     return fault;
 }

@@ -5,6 +5,7 @@
 // new line would hold now, and enters the source, as a step to undo, when something typed into it is stored.
 #pragma once
 
+#include "grid/pasted_cells.h"
 #include "grid/row_order.h"
 
 #include <map>
@@ -53,6 +54,10 @@ public:
     /// What the cell holds, typed or stored.
     CellValue Value(int row, int column) const;
     bool IsLocked(int row, int column) const;
+    /// Something was typed that is not stored yet.
+    bool HasTyped() const { return !m_pending.empty(); }
+    /// What is stored for a value that was read; an emptied cell stores a value, too.
+    CellValue Resolved(int column, const CellValue& value, BlankRule rule = BlankRule::Zero) const;
     /// The cell shows a number with fewer digits than it has. A row that the source has no more hides nothing.
     bool HidesDigits(int row, int column) const;
     /// The cell of a line holds what is the global value of its column.
@@ -65,8 +70,8 @@ public:
     /// Why the cell would not take the text; empty when it would. What the other rows have to say is asked as well when
     /// the text goes into this cell alone, and with Fault when it is one of several.
     QString Refusal(int row, int column, const QString& text, bool isAlone = true) const;
-    /// Why the rows from `row` on could not take these texts from `column` on; see IRowSource::FindFault.
-    std::optional<IRowSource::Fault> Fault(int row, int column, const std::vector<QStringList>& texts) const;
+    /// Why the rows together could not take these cells, and which of `rows` it is; see IRowSource::FindFault.
+    std::optional<IRowSource::Fault> Fault(const PastedCells& cells) const;
 
     /// Why the source could not take the lines between its rows `at` - 1 and `at`; empty when it could.
     QString WhyNotBetween(std::size_t at, IRowBlock& lines) const;
@@ -98,7 +103,6 @@ protected:
     int ShownRows() const { return StoredRows() + OffersRow(); }
     bool IsRow(int row) const { return row >= 0 && row < ShownRows(); }
     void* RowObject(int row) const;
-    CellValue Resolved(int column, const CellValue& value, BlankRule rule = BlankRule::Zero) const;
     std::unique_ptr<IRowBlock> NewLines(int count, std::size_t at) const;
     /// Order and filter, as they are now, on what the source holds now.
     void ApplySort();

@@ -23,48 +23,79 @@ QString WriteTable(const std::vector<QStringList>& rows)
     return text;
 }
 
-namespace {
-
 /// Reads one cell from `at` on and leaves `at` on what ended it.
-QString ReadTableCell(const QString& text, qsizetype& at)
+QStringView CTextTable::ReadCell(qsizetype& at, QChar separator)
 {
-    QString cell;
+    const QStringView text = m_text;
+    const qsizetype start = at;
+    const auto readPlain = [&] {
+        const QChar* const end = std::find_if(
+            text.begin() + at, text.end(), [separator](QChar c) { return c == separator || c == u'\n' || c == u'\r'; });
+        at = end - text.begin();
+    };
     // Quotes that are not closed are part of the text.
-    bool quoted = at < text.size() && text[at] == u'"' && text.indexOf(u'"', at + 1) >= 0;
-    at += quoted;
-    for (; at < text.size(); ++at) {
-        const QChar c = text[at];
-        if (quoted && c == u'"') {
-            if (at + 1 < text.size() && text[at + 1] == u'"')
-                cell += text[++at];
-            else
-                quoted = false;
-        } else if (!quoted && (c == u'\t' || c == u'\n' || c == u'\r')) {
-            break;
-        } else {
-            cell += c;
-        }
+    if (at == text.size() || text[at] != u'"' || text.indexOf(u'"', at + 1) < 0) {
+        readPlain();
+        return text.sliced(start, at - start);
     }
-    return cell;
+    QString cell;
+    for (bool quoted = (++at, true); quoted;) {
+        const qsizetype quote = text.indexOf(u'"', at);
+        cell += text.sliced(at, (quote < 0 ? text.size() : quote) - at);
+        quoted = quote >= 0 && quote + 1 < text.size() && text[quote + 1] == u'"';
+        if (quoted)
+            cell += u'"';
+        at = quote < 0 ? text.size() : quote + 1 + quoted;
+    }
+    const qsizetype behind = at;
+    readPlain();
+    return m_others.emplace_back(cell.append(text.sliced(behind, at - behind)));
 }
 
-} // namespace
-
-std::vector<QStringList> ReadTable(const QString& text)
+CTextTable::CTextTable(QString text, QChar separator) : m_text(std::move(text))
 {
-    std::vector<QStringList> rows;
+    const qsizetype size = m_text.size();
     qsizetype at = 0;
-    while (at < text.size() || rows.empty()) {
-        QStringList& row = rows.emplace_back();
-        row << ReadTableCell(text, at);
-        while (at < text.size() && text[at] == u'\t')
-            row << ReadTableCell(text, ++at);
-        if (at < text.size())
-            at += text[at] == u'\r' && at + 1 < text.size() && text[at + 1] == u'\n' ? 2 : 1;
+    bool isOneColumn = true;
+    while (at < size || m_starts.empty()) {
+        m_starts.push_back(m_cells.size());
+        m_cells.push_back(ReadCell(at, separator));
+        while (at < size && m_text.at(at) == separator) {
+            m_cells.push_back(ReadCell(++at, separator));
+            isOneColumn = false;
+        }
+        if (Lines() == 1) { // the others are likely to be like the first one
+            const auto lines = std::size_t(size / std::max<qsizetype>(at, 1));
+            m_starts.reserve(lines);
+            m_cells.reserve(lines * m_cells.size());
+        }
+        if (at < size)
+            at += m_text.at(at) == u'\r' && at + 1 < size && m_text.at(at + 1) == u'\n' ? 2 : 1;
     }
     // In a single column an empty line is an empty cell.
-    if (std::ranges::any_of(rows, [](const QStringList& row) { return row.size() > 1; }))
-        while (rows.back() == QStringList(QString()))
-            rows.pop_back();
-    return rows;
+    while (!isOneColumn && Width(Lines() - 1) == 1 && m_cells.back().isEmpty()) {
+        m_cells.pop_back();
+        m_starts.pop_back();
+    }
+}
+
+int CTextTable::Columns() const
+{
+    int columns = 0;
+    for (std::size_t line = 0; line < Lines(); ++line)
+        columns = std::max(columns, Width(line));
+    return columns;
+}
+
+QStringList CTextTable::Line(std::size_t line) const
+{
+    QStringList cells;
+    for (int column = 0; column < Width(line); ++column)
+        cells << At(line, column).toString();
+    return cells;
+}
+
+void CTextTable::Set(std::size_t line, int column, QString text)
+{
+    m_cells[m_starts[line] + std::size_t(column)] = m_others.emplace_back(std::move(text));
 }

@@ -63,7 +63,7 @@ QString RefusalDetails(const QString& place, const QString& typed, const QString
     return lines.join(u'\n');
 }
 
-QString WithoutLineEnds(QString text)
+QStringView WithoutLineEnds(QStringView text)
 {
     while (text.endsWith(u'\n') || text.endsWith(u'\r'))
         text.chop(1);
@@ -72,6 +72,8 @@ QString WithoutLineEnds(QString text)
 
 QString UnseenRefusal(const QString& text, Tabs tabs)
 {
+    if (std::ranges::all_of(text, [](QChar c) { return c >= u' ' && c <= u'~'; }))
+        return {};
     const QString seen = KsVisibleText(text);
     for (qsizetype i = 0; i < text.size(); ++i) {
         if (text[i] != seen[i] && (text[i] != u'\t' || tabs == Tabs::Refused))

@@ -14,7 +14,7 @@ void TellRefusal(QWidget& widget, const QString& message, const QString& details
 /// The details of such a message, a line each; `allowed` and `unit` may be empty.
 QString RefusalDetails(const QString& place, const QString& typed, const QString& allowed, const QString& unit);
 /// What was typed or pasted without the line ends behind it, which nobody sees.
-QString WithoutLineEnds(QString text);
+QStringView WithoutLineEnds(QStringView text);
 /// Why such a text is refused: it has characters that nobody sees, or that turn the direction of what follows. Empty
 /// when it has none.
 enum class Tabs

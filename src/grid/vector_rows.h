@@ -36,7 +36,7 @@ public:
     /// A vector that moves in memory: `rows` knows where it is.
     explicit VectorRows(std::function<std::vector<T>&()> rows, VectorOwner owner = {},
                         WhenEmpty whenEmpty = WhenEmpty::Nothing)
-        : m_rows(std::move(rows)), m_owner(std::move(owner)), m_whenEmpty(whenEmpty)
+        : m_rows(std::move(rows)), m_owner(std::move(owner)), m_whenEmpty(whenEmpty), m_moves(m_owner.list)
     {
     }
 
@@ -103,6 +103,7 @@ public:
     bool MayBeEmpty() const override { return m_whenEmpty == WhenEmpty::Nothing; }
     const void* List() const override { return m_owner.list; }
     std::size_t ListRow(std::size_t row) const override { return m_owner.list ? m_owner.row() : row; }
+    bool StaysInMemory() const override { return !m_moves; }
 
 protected:
     std::vector<T>& Rows() const { return m_rows(); }
@@ -119,5 +120,6 @@ private:
     std::function<std::vector<T>&()> m_rows;
     VectorOwner m_owner;
     WhenEmpty m_whenEmpty;
+    bool m_moves = false; // in memory, with the line that owns it
     std::size_t m_rearranged = 0;
 };

@@ -2,9 +2,8 @@
 
 #include "document/document.h"
 #include "grid/gen_grid.h"
-#include "ks/language/language.h"
 #include "module/sheet.h"
-#include "pages/framework/page.h"
+#include "pages/framework/location_page.h"
 #include "pages/page_table.h"
 #include "res/strings.h"
 
@@ -33,16 +32,13 @@ QString Plain(const QString& title)
 class CFieldIndex
 {
 public:
-    CFieldIndex(CDlgPropertySheet& sheet, CKavo0_hdDoc& document) : m_sheet(sheet), m_document(document)
-    {
-        for (const QString& language : KsLanguage::Available())
-            m_languages.push_back(KsLangTranslator(QStringLiteral("Kavo0_hd"), language));
-    }
+    CFieldIndex(CDlgPropertySheet& sheet, CKavo0_hdDoc& document) : m_sheet(sheet), m_document(document) {}
 
     std::vector<FoundField> Make()
     {
         for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
-            Add({tab, {}, Plain(m_sheet.tabText(tab)), {}, {}, {}}, {m_sheet.CaptionOf(tab)}, TextsOn(*m_sheet.PageAt(tab)));
+            Add({tab, {}, Plain(m_sheet.tabText(tab)), {}, {}, {}}, {m_sheet.CaptionOf(tab)},
+                TextsOn(*m_sheet.PageAt(tab)));
         for (const DeclaredSection& section : HDGlobals().Sections())
             for (const DeclaredKeyword& keyword : section.keywords)
                 for (const Field& field : keyword.Fields())
@@ -81,13 +77,9 @@ private:
     {
         field.page = Plain(m_sheet.tabText(field.tab));
         QStringList words{field.title, names, field.keyword, field.page};
-        for (const auto& language : m_languages) {
-            if (title)
-                words << Plain(LoadLineIn(*language, title.text, title.line));
-            if (choices)
-                words << LoadLineIn(*language, choices.text, choices.line);
-            words << Plain(LoadLineIn(*language, m_sheet.CaptionOf(field.tab), TextLine::Whole));
-        }
+        for (const TextLine& line : {title, choices, TextLine(m_sheet.CaptionOf(field.tab))})
+            for (const QString& text : line ? InAllLanguages(line) : QStringList())
+                words << Plain(text);
         words.removeDuplicates();
         field.words = words.join(u'\n').toCaseFolded();
         m_fields.push_back(std::move(field));
@@ -100,9 +92,10 @@ private:
         if (tab == m_sheet.PageCount())
             return; // no page edits it
         const QString name = QString::fromUtf8(field.name);
-        const QString title = field.title   ? Plain(LoadLine(field.title.text, field.title.line))
-                              : field.choices ? LoadLine(field.choices.text, field.choices.line).replace(u'\n', QStringLiteral(" / "))
-                                              : name;
+        const QString title =
+            field.title     ? Plain(LoadLine(field.title.text, field.title.line))
+            : field.choices ? LoadLine(field.choices.text, field.choices.line).replace(u'\n', QStringLiteral(" / "))
+                            : name;
         Add({tab, place, title, {}, QString::fromUtf8(keyword.name), {}}, field.title, name, field.choices);
     }
 
@@ -123,14 +116,13 @@ private:
                 continue;
             const QString title = column->header();
             const ChangePlace cell{&list, 1, int(column - columns.begin()) + 1, &list, 1};
-            Add({tab, cell, Plain(title), {}, QString::fromUtf8(section), {}}, field.title, QString::fromUtf8(field.name),
-                field.choices);
+            Add({tab, cell, Plain(title), {}, QString::fromUtf8(section), {}}, field.title,
+                QString::fromUtf8(field.name), field.choices);
         }
     }
 
     CDlgPropertySheet& m_sheet;
     CKavo0_hdDoc& m_document;
-    std::vector<std::unique_ptr<QTranslator>> m_languages;
     std::vector<FoundField> m_fields;
 };
 

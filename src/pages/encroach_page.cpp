@@ -47,6 +47,22 @@ bool IsUsed(const void* value, const HDEncroach& line)
     return method == TargetLevelAndEnergy || (method == TargetLevel && isOneOf(line.EncValues2[3]));
 }
 
+/// A set-up comes, or goes.
+class CSetupComes : public KsLineChange
+{
+public:
+    CSetupComes(const CGenList* lines, bool comes) : m_lines(lines), m_comes(comes) {}
+    void TakeBack(KsTracedLine& line, bool forward) const override
+    {
+        if (line.data == m_lines && forward == m_comes)
+            line.origin = KsLineOrigin::New;
+    }
+
+private:
+    const CGenList* m_lines;
+    bool m_comes; // when the step is made
+};
+
 /// A set-up more, or one less.
 class CSetupCommand : public CDocumentCommand
 {
@@ -56,13 +72,15 @@ public:
         : CDocumentCommand(document, LoadString(setup ? Str::UndoAddSetup : Str::UndoDeleteSetup)),
           m_setups(document.Parameters().EncroachList),
           m_index(index),
-          m_setup(std::move(setup))
+          m_setup(std::move(setup)),
+          m_change(std::make_shared<CSetupComes>(m_setup ? m_setup.get() : &m_setups.GetAt(index), bool(m_setup)))
     {
     }
 
 protected:
     ChangePlace Apply() override { return Exchange(); }
     ChangePlace Revert() override { return Exchange(); }
+    std::shared_ptr<const KsLineChange> LineChange() const override { return m_change; }
 
 private:
     ChangePlace Exchange()
@@ -80,6 +98,7 @@ private:
     CGenMetaList<HDEncroach>& m_setups;
     std::size_t m_index;
     std::unique_ptr<CGenParamList<HDEncroach>> m_setup; // while it is out of the document
+    std::shared_ptr<const KsLineChange> m_change;
 };
 
 class CEncroachPage : public CDialogPage<Ui::CEncroachPage, CLocationPage>

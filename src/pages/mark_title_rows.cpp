@@ -109,7 +109,8 @@ public:
 
     const void* Data() const override { return &Titles(); }
     const void* List() const override { return static_cast<CGenList*>(&m_document.Parameters().WaterLevelMarkList); }
-    std::size_t ListRow(std::size_t) const override { return std::size_t(-1); } // no line of the list
+    std::size_t ListRow(std::size_t) const override { return std::size_t(-1); }     // no line of the list
+    bool MovesContentOf(const void* list) const override { return list == List(); } // the levels
 
 private:
     HD_Global_Var& Globals() const { return m_document.Parameters().Global; }

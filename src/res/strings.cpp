@@ -1,7 +1,6 @@
 #include "res/strings.h"
 
 #include <QCoreApplication>
-#include <QTranslator>
 #include <algorithm>
 #include <iterator>
 
@@ -20,7 +19,7 @@ constexpr Row Rows[] = {
 #undef KVR_STRING
 };
 
-constexpr const char* Context = "Kavo0_hd";
+constexpr const char* Context = TextsOfModule;
 
 /// Null for a number that is not in the table.
 const char* SourceOf(int number)
@@ -52,11 +51,9 @@ QString LoadLine(Str id, int line)
     return LineOfText(LoadString(id), line);
 }
 
-QString LoadLineIn(const QTranslator& language, Str id, int line)
+const char* SourceText(Str id)
 {
-    const char* source = SourceOf(int(id));
-    const QString translated = source ? language.translate(Context, source) : QString();
-    return LineOfText(translated.isEmpty() ? QString::fromUtf8(source) : translated, line);
+    return SourceOf(int(id));
 }
 
 QString LoadCounted(std::size_t count, Str one, Str many)

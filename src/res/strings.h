@@ -6,14 +6,14 @@
 #include <QString>
 #include <cstddef>
 
-class QTranslator;
-
 /// The text in the user's language.
 QString LoadString(Str id);
 /// One line of a text that holds several, counted from 0; the whole text for a number below.
 QString LoadLine(Str id, int line);
-/// Likewise in a language that need not be the user's.
-QString LoadLineIn(const QTranslator& language, Str id, int line);
+/// As it stands in the source, in English, with line ends; null for a number that is not in the table.
+const char* SourceText(Str id);
+/// The name of their translations, as a module and as a context.
+inline constexpr const char* TextsOfModule = "Kavo0_hd";
 /// The text for one, or the one for many with their number.
 QString LoadCounted(std::size_t count, Str one, Str many);
 /// By number, as resources are addressed; empty for a number that is not in the table.

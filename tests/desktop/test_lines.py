@@ -130,6 +130,49 @@ class InsertedAndMoved(Case):
         self.assertEqual(self.saved().records('InitList')[2:4], ['"MOORBECK", 0, 3.5, 12', '"MOORBECK", 1000, 3.5, 12'])
 
 
+class ChangedSinceTheSave(Case):
+    """Lines that differ from the last save say so, beside their numbers and to whoever cannot see that."""
+
+    def marks(self):
+        table = self.editor.table()
+        return [table.line_number(line).description for line in range(1, table.lines + 1)]
+
+    def wait_for_marks(self, *marks):
+        wait_for(lambda: self.marks() == list(marks), f'{marks} are told, not {self.marks()}', 5)
+
+    def test_changes_are_told_and_reverted(self):
+        changed, new = 'Changed since the last save', 'New since the last save'
+        editor = self.open(samples.hd_text({'InitList': LINES}))
+        self.wait_for_marks('', '', '', '')
+        editor.put(2, 3, '1.5')
+        editor.click_cell(3, 1)
+        editor.press('ctrl+u', 'ctrl+shift+Up')
+        self.wait_for_marks('', changed, new, '', '')
+        self.assertEqual(editor.table().cell(2, 3).description, 'was 1 m at the last save')
+        editor.press('ctrl+z', 'ctrl+z')
+        self.wait_for_marks('', changed, '', '')
+        editor.put(4, 3, '6')
+        editor.press('ctrl+shift+d')
+        self.wait_for_marks(changed, '', changed, '')  # sorted by the last column, largest first
+        editor.click_line(1)
+        editor.click_line(1, button=3)
+        editor.press('Up', 'Return')  # the last entry: Revert to Saved Values
+        wait_for(lambda: '1 cell reverted' in editor.status(), 'what was done is said', 3)
+        self.wait_for_marks('', '', changed, '')
+        editor.press('ctrl+z')
+        self.wait_for_marks(changed, '', changed, '')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'),
+                         [LINES[0], '"ELBE", 100, 1.5, 11', LINES[2], '"ELBE", 50, 6, 13'])
+        self.wait_for_marks('', '', '', '')
+        editor.press('ctrl+z', 'ctrl+z')
+        self.wait_for_marks(changed, '', changed, '')
+        editor.press('ctrl+a', 'ctrl+shift+BackSpace')
+        self.wait_for_marks('', '', '', '')
+        editor.menu('Edit', 'Undo')
+        self.wait_for_marks(changed, '', changed, '')
+
+
 class ComingBack(Case):
     """What the user has arranged is there again when the file is opened again; the file holds nothing of it."""
 
@@ -157,3 +200,46 @@ class ComingBack(Case):
         self.assertFalse(editor.modified)
         editor.press('ctrl+shift+o')
         self.assertEqual([table.cell(line, 2).name for line in range(1, 5)], ['300', '100', '100', '50'])
+
+
+class CommandsOverAnOpenCell(Case):
+    """What was typed is taken before a key is about the table, and what cannot be taken is told."""
+    TEXT = samples.hd_text({'InitList': LINES})
+
+    def test_a_value_stays_in_its_line(self):
+        editor = self.open(self.TEXT)
+        editor.click_cell(2, 3)
+        editor.type('7.5')
+        editor.press('ctrl+shift+Return')
+        editor.settle()
+        self.assertEqual(editor.table().line(3)[:3], ['ELBE', '100', '7.5'])
+        self.assertEqual(editor.table().line(2)[0], '')
+        editor.press('ctrl+z')
+        editor.click_cell(2, 3)
+        editor.type('8')
+        editor.press('ctrl+shift+g')
+        editor.settle()
+        editor.click_cell(2, 3)
+        editor.type('abc')
+        for key in ('ctrl+shift+Return', 'ctrl+Return', 'ctrl+u', 'ctrl+shift+g', 'ctrl+h', 'ctrl+shift+l'):
+            editor.press(key)
+            self.assertIn('Floating point number required', editor.box_texts())
+            editor.answer()
+            self.assertEqual(editor.table().lines, 4)
+        editor.press('Escape')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), [LINES[0], '"ELBE", 100, 3.5, 11'] + LINES[2:])
+
+    def test_what_is_typed_is_found(self):
+        editor = self.open(self.TEXT)
+        editor.click_cell(4, 3)
+        editor.type('7.5')
+        editor.press('ctrl+h')
+        editor.box()
+        editor.type('7.5')
+        editor.settle(0.6)
+        self.assertIn('1 cell found', ' '.join(editor.box_texts()))
+        editor.press('Return')  # finds, and does not close
+        editor.settle()
+        self.assertIn('1 cell found', ' '.join(editor.box_texts()))
+        editor.press('Escape')

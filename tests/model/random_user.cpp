@@ -12,11 +12,14 @@
 #include <QCheckBox>
 #include <QClipboard>
 #include <QComboBox>
+#include <QDialog>
+#include <QDialogButtonBox>
 #include <QHeaderView>
 #include <QLineEdit>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QTest>
+#include <QTimer>
 
 namespace {
 
@@ -235,7 +238,26 @@ void RandomUser::Paste()
     QApplication::clipboard()->setText(cells);
     m_done =
         QString("paste into %1 %2,%3").arg(NameOf(Page(), *grid)).arg(grid->CurrentRow()).arg(grid->CurrentColumn());
+    const bool leavesOut = Pick(2);
+    QTimer::singleShot(0, grid, [leavesOut] { // what is doubtful is asked about
+        auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+        if (!dialog)
+            return;
+        auto* box = dialog->findChild<QCheckBox*>("leaveOut");
+        if (leavesOut && box && box->isVisible())
+            box->click();
+        if (auto* paste = dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok); paste->isEnabled())
+            paste->click();
+        else
+            dialog->reject();
+    });
     Press(Qt::Key_V, Qt::ControlModifier);
+    QCoreApplication::processEvents();
+    if (!QApplication::focusWidget()) { // no window manager gives it back
+        grid->activateWindow();
+        grid->setFocus();
+        QCoreApplication::processEvents();
+    }
 }
 
 /// By the line numbers.
@@ -283,7 +305,7 @@ void RandomUser::CommandInGrid()
         GridAction::InsertAbove, GridAction::InsertBelow,   GridAction::Duplicate, GridAction::Duplicate,
         GridAction::MoveUp,      GridAction::MoveDown,      GridAction::MoveDown,  GridAction::Cut,
         GridAction::Clear,       GridAction::ResetToGlobal, GridAction::FillDown,  GridAction::SortAscending,
-        GridAction::SortByPlace, GridAction::FileOrder,     GridAction::FileOrder};
+        GridAction::SortByPlace, GridAction::FileOrder,     GridAction::FileOrder, GridAction::RevertToSaved};
     CGenGrid* grid = SomeGrid();
     if (!grid || !GoToSomeCell(*grid))
         return;

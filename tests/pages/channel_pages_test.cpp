@@ -1,4 +1,5 @@
 // The pages of bed resistance, wave approximation, the quasi-steady solver and mixing.
+#include "canceled_paste.h"
 #include "flow_page_fixture.h"
 #include "grid/grid_clipboard.h"
 #include "pages/page_table.h"
@@ -25,7 +26,10 @@ protected:
     {
         QGuiApplication::clipboard()->setText(text);
         grid->SetCurrentCell(row, column);
-        return PasteCells(*grid);
+        CancelPaste(*grid, boxes);
+        const bool isPasted = PasteCells(*grid);
+        QCoreApplication::processEvents();
+        return isPasted;
     }
 };
 

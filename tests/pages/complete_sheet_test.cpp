@@ -3,8 +3,10 @@
 
 #include "data/hd_file.h"
 #include "data/hd_support.h"
+#include "grid/cell_operations.h"
 #include "ks/fc/file_dialog.h"
 #include "ks/units/edit_fields.h"
+#include "ks/units/formula.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"
 #include "pages/page_table.h"
@@ -324,6 +326,19 @@ TEST_F(CompleteSheetTest, EveryFieldAndColumnSaysWhatItMeans)
                 EXPECT_TRUE(table->Model()->Columns()[std::size_t(column)].Kind() == CellKind::Button || means(tip))
                     << tip.toStdString();
             }
+        }
+    }
+}
+
+TEST_F(CompleteSheetTest, EveryTableHasNamesForFormulas)
+{
+    ChangeEverything(document.Parameters());
+    for (const PageEntry& entry : PageTable()) {
+        Open(entry.make);
+        for (const auto* table : view->page->findChildren<CGenGrid*>()) {
+            const FormulaNames names = NamesForFormula(*table->Model());
+            for (const QString& name : names.names)
+                EXPECT_EQ(CKsFormula(name + "*2", names.names).Fault().toStdString(), "") << name.toStdString();
         }
     }
 }

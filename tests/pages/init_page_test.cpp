@@ -56,6 +56,16 @@ TEST_F(InitPageTest, WhatIsTheGlobalValueStandsBackAndTheOthersAreCounted)
     EXPECT_TRUE(standsBack(1, 3) && standsBack(3, 3));
     EXPECT_FALSE(standsBack(2, 3) || standsBack(1, 4) || standsBack(1, 2));
     EXPECT_TRUE(grid->model()->index(0, 2).data(Qt::ToolTipRole).toString().endsWith("\nThe global value"));
+    const auto darkest = [this](int row, int column) { // as it is painted
+        const QImage cell =
+            grid->viewport()->grab(grid->visualRect(grid->model()->index(row - 1, column - 1))).toImage();
+        int lightness = 255;
+        for (int y = 2; y < cell.height() - 2; ++y)
+            for (int x = 2; x < cell.width() - 2; ++x)
+                lightness = std::min(lightness, cell.pixelColor(x, y).lightness());
+        return lightness;
+    };
+    EXPECT_GT(darkest(1, 3), darkest(2, 3) + 30);
     const auto overrides = [this](const char* field) {
         return view->page->OverridesText(*Find<CCtrlEdit>(field)).toStdString();
     };

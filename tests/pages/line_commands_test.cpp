@@ -252,3 +252,26 @@ TEST_F(LineCommandTest, LinesAreInsertedAlongABranchAndNoneIsDoubled)
     Undo();
     EXPECT_EQ(File(), "A B C D");
 }
+
+TEST_F(LineCommandTest, KeysTakeWhatIsTypedBefore)
+{
+    const auto press = [this](const char* typed, Qt::Key key, Qt::KeyboardModifiers held) {
+        Type(2, 3, typed);
+        QTest::keyClick(Editor(), key, held);
+        QCoreApplication::processEvents();
+    };
+    const int lines = grid->RowCount();
+    press("7.5", Qt::Key_Return, Ctrl | Qt::ShiftModifier);
+    EXPECT_EQ(grid->RowCount(), lines + 1);
+    EXPECT_EQ(init.GetAt(2).InitialH, 7.5) << "and not in the new line";
+    EXPECT_FALSE(Editor());
+    press("8", Qt::Key_G, Ctrl | Qt::ShiftModifier);
+    EXPECT_FALSE(Editor());
+    QTimer::singleShot(0, grid, [] { qobject_cast<QDialog*>(QApplication::activeModalWidget())->reject(); });
+    press("9", Qt::Key_H, Ctrl);
+    EXPECT_FALSE(Editor());
+    press("abc", Qt::Key_Return, Ctrl | Qt::ShiftModifier);
+    EXPECT_EQ(boxes.size(), 1);
+    EXPECT_EQ(grid->RowCount(), lines + 1);
+    EXPECT_TRUE(Editor());
+}

@@ -204,6 +204,13 @@ TEST_F(MarkPagesTest, TheGlobalRowIsNoLineOfTheList)
         QTest::keyClick(grid, Qt::Key_X);
         EXPECT_FALSE(Editor()) << "caption of the row";
     }
+    // What it is called and what it has no value for fills no line.
+    grid->SetCurrentCell(1, 1);
+    grid->selectionModel()->select(QItemSelection(grid->model()->index(0, 0), grid->model()->index(1, 3)),
+                                   QItemSelectionModel::ClearAndSelect);
+    QTest::keyClick(grid, Qt::Key_D, Qt::ControlModifier);
+    EXPECT_TRUE(Texts(2).startsWith("A|10|Single|55.500|")) << Texts(2).toStdString();
+    QTest::keyClick(grid, Qt::Key_Z, Qt::ControlModifier);
     // It can neither be deleted nor moved down by an insertion.
     SelectRows(1, 1);
     QTest::keyClick(grid, Qt::Key_Delete);

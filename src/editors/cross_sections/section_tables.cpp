@@ -4,6 +4,7 @@
 #include "grid/field_columns.h"
 #include "grid/vector_rows.h"
 #include "ks/fc/branch_name.h"
+#include "ks/language/language.h"
 
 #include <numeric>
 #include <set>
@@ -138,8 +139,10 @@ std::shared_ptr<IRowSource> MakePointRows(CCrossSectionDoc& document, int sectio
     return document.Section(section) ? std::make_shared<CPointRows>(document, std::size_t(section)) : nullptr;
 }
 
-static constexpr TableStyle Tables{.text = [](const TextLine& line) { return SectionTables::tr(line.source); },
-                                   .besideAPicture = true};
+static constexpr TableStyle Tables{
+    .text = [](const TextLine& line) { return SectionTables::tr(line.source); },
+    .inAllLanguages = [](const TextLine& line) { return KsLangInAll("Kavo0_xs", "SectionTables", line.source); },
+    .besideAPicture = true};
 
 QString TitleOf(double CSectionPoint::*value)
 {
@@ -150,8 +153,8 @@ void AddSectionColumns(CGridModel& model)
 {
     using C = CCrossSection;
     FieldColumns(model, Tables)
-        .Value(&C::branch)
-        .Value(&C::chainage)
+        .Value(&C::branch, {.namesLine = true})
+        .Value(&C::chainage, {.namesLine = true})
         .Value(&C::radius)
         .Value(&C::width)
         .Value(&C::topoId);
@@ -160,5 +163,5 @@ void AddSectionColumns(CGridModel& model)
 void AddPointColumns(CGridModel& model)
 {
     using P = CSectionPoint;
-    FieldColumns(model, Tables).Value(&P::offset).Value(&P::level);
+    FieldColumns(model, Tables).Value(&P::offset, {.namesLine = true}).Value(&P::level);
 }

@@ -32,6 +32,13 @@ void CCrossSectionView::CellCurrent(CGenGrid& grid)
     CTablesView::CellCurrent(grid);
 }
 
+void CCrossSectionView::LineEdited(CGenGrid& grid)
+{
+    CTablesView::LineEdited(grid);
+    if (&grid == Sections())
+        TellLocation(); // it may be at another place now
+}
+
 void CCrossSectionView::LineCurrent(CGenGrid& grid)
 {
     CTablesView::LineCurrent(grid);

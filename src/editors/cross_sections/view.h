@@ -29,6 +29,7 @@ public:
     bool IsCommandEnabled(int id) const override;
     std::vector<CKsMenuCommand> LinesMenu() const override;
     void CellCurrent(CGenGrid& grid) override;
+    void LineEdited(CGenGrid& grid) override;
     void LineCurrent(CGenGrid& grid) override;
 
 protected:

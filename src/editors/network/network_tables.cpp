@@ -5,6 +5,7 @@
 #include "grid/field_columns.h"
 #include "grid/vector_rows.h"
 #include "ks/fc/branch_name.h"
+#include "ks/language/language.h"
 
 #include <QSet>
 #include <algorithm>
@@ -133,8 +134,10 @@ std::shared_ptr<IRowSource> MakeChannelRows(CNetworkDoc& document, int branch)
     return std::make_shared<CChannelRows>(document, std::size_t(branch));
 }
 
-static constexpr TableStyle Tables{.text = [](const TextLine& line) { return NetworkTables::tr(line.source); },
-                                   .besideAPicture = true};
+static constexpr TableStyle Tables{
+    .text = [](const TextLine& line) { return NetworkTables::tr(line.source); },
+    .inAllLanguages = [](const TextLine& line) { return KsLangInAll("Kavo0_nw", "NetworkTables", line.source); },
+    .besideAPicture = true};
 
 void AddBranchColumns(CGridModel& model)
 {
@@ -148,7 +151,7 @@ void AddBranchColumns(CGridModel& model)
         return NetworkTables::tr("Whether water flows towards increasing or decreasing chainages");
     };
     FieldColumns(model, Tables)
-        .Value(&N::name)
+        .Value(&N::name, {.namesLine = true})
         .Value(&N::start)
         .Value(&N::end)
         .Value(vertices, counted, {.locked = [](const void*) { return true; }})
@@ -158,5 +161,5 @@ void AddBranchColumns(CGridModel& model)
 void AddChannelColumns(CGridModel& model)
 {
     using R = CChannelRow;
-    FieldColumns(model, Tables).Value(&R::chainage).Value(&R::radius).Value(&R::width);
+    FieldColumns(model, Tables).Value(&R::chainage, {.namesLine = true}).Value(&R::radius).Value(&R::width);
 }

@@ -130,20 +130,6 @@
         <translation>行番号は1以上にしてください</translation>
     </message>
     <message>
-        <source>Nothing was pasted. Line %1, column &quot;%2&quot; cannot take &quot;%3&quot;:
-%4</source>
-        <translation>貼り付けませんでした。%1 行目の「%2」列には「%3」を入れられません:
-%4</translation>
-    </message>
-    <message>
-        <source>Nothing was pasted. From line %1 on the table has only %2 lines.</source>
-        <translation>貼り付けませんでした。%1 行目から先、表には %2 行しかありません。</translation>
-    </message>
-    <message>
-        <source>Nothing was pasted. The copied cells are %1 columns wide; from column &quot;%2&quot; on the table has only %3.</source>
-        <translation>貼り付けませんでした。コピーしたセルは %1 列ありますが、表には「%2」列から %3 列しかありません。</translation>
-    </message>
-    <message>
         <source>Paste</source>
         <translation>貼り付け</translation>
     </message>
@@ -918,6 +904,250 @@
     <message>
         <source>Sort and Filter</source>
         <translation>並べ替えと絞り込み</translation>
+    </message>
+    <message>
+        <source>1 left out</source>
+        <translation>1 個は除外</translation>
+    </message>
+    <message>
+        <source>%1 left out</source>
+        <translation>%1 個は除外</translation>
+    </message>
+    <message>
+        <source>Paste with Preview...</source>
+        <translation>確認して貼り付け...</translation>
+    </message>
+    <message>
+        <source>Show how the copied texts are understood, and where they would go, before they do</source>
+        <translation>コピーした文字列の解釈と貼り付け先を、貼り付ける前に表示します</translation>
+    </message>
+    <message>
+        <source>Tab</source>
+        <translation>タブ</translation>
+    </message>
+    <message>
+        <source>Semicolon</source>
+        <translation>セミコロン</translation>
+    </message>
+    <message>
+        <source>Comma</source>
+        <translation>コンマ</translation>
+    </message>
+    <message>
+        <source>Vertical bar</source>
+        <translation>縦棒</translation>
+    </message>
+    <message>
+        <source>Column %1</source>
+        <translation>列 %1</translation>
+    </message>
+    <message>
+        <source>Cells are separated &amp;by:</source>
+        <translation>セルの区切り(&amp;B):</translation>
+    </message>
+    <message>
+        <source>&amp;Numbers:</source>
+        <translation>数値(&amp;N):</translation>
+    </message>
+    <message>
+        <source>With a decimal point: 1,234.5</source>
+        <translation>小数点はピリオド: 1,234.5</translation>
+    </message>
+    <message>
+        <source>With a decimal comma: 1.234,5</source>
+        <translation>小数点はコンマ: 1.234,5</translation>
+    </message>
+    <message>
+        <source>Lines &amp;go:</source>
+        <translation>行の貼り付け先(&amp;G):</translation>
+    </message>
+    <message>
+        <source>Into the table from line %1 on</source>
+        <translation>表の %1 行目から</translation>
+    </message>
+    <message>
+        <source>Behind the last line</source>
+        <translation>最後の行の後</translation>
+    </message>
+    <message>
+        <source>To the lines of the same branch and chainage, others behind the last line</source>
+        <translation>河川名と距離が同じ行、なければ最後の行の後</translation>
+    </message>
+    <message>
+        <source>The first line na&amp;mes the columns</source>
+        <translation>1 行目は列名(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Columns</source>
+        <translation>列</translation>
+    </message>
+    <message>
+        <source>Copied</source>
+        <translation>コピー元</translation>
+    </message>
+    <message>
+        <source>Goes to</source>
+        <translation>貼り付け先</translation>
+    </message>
+    <message>
+        <source>Unit</source>
+        <translation>単位</translation>
+    </message>
+    <message>
+        <source>First text</source>
+        <translation>最初の文字列</translation>
+    </message>
+    <message>
+        <source>As it is understood</source>
+        <translation>解釈の結果</translation>
+    </message>
+    <message>
+        <source>What does not fit can be mended here:</source>
+        <translation>受け入れられないもの (ここで直せます):</translation>
+    </message>
+    <message>
+        <source>What does not fit</source>
+        <translation>受け入れられないもの</translation>
+    </message>
+    <message>
+        <source>(left out)</source>
+        <translation>(除外)</translation>
+    </message>
+    <message>
+        <source>Unit of column %1</source>
+        <translation>列 %1 の単位</translation>
+    </message>
+    <message>
+        <source>1 line was copied.</source>
+        <translation>1 行をコピーしました。</translation>
+    </message>
+    <message>
+        <source>%1 lines were copied.</source>
+        <translation>%1 行をコピーしました。</translation>
+    </message>
+    <message>
+        <source>1 line is new.</source>
+        <translation>新しい行は 1 行です。</translation>
+    </message>
+    <message>
+        <source>%1 lines are new.</source>
+        <translation>新しい行は %1 行です。</translation>
+    </message>
+    <message>
+        <source>&amp;Leave out the one that does not fit</source>
+        <translation>受け入れられない 1 個を除外(&amp;L)</translation>
+    </message>
+    <message>
+        <source>&amp;Leave out the %1 that do not fit</source>
+        <translation>受け入れられない %1 個を除外(&amp;L)</translation>
+    </message>
+    <message>
+        <source>Copied: %1</source>
+        <translation>コピー元: %1</translation>
+    </message>
+    <message>
+        <source>new</source>
+        <translation>新規</translation>
+    </message>
+    <message>
+        <source>Copied line</source>
+        <translation>コピー元の行</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>文字列</translation>
+    </message>
+    <message>
+        <source>Two columns go to &quot;%1&quot;.</source>
+        <translation>2 つの列の貼り付け先が &quot;%1&quot; です。</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no unit of &quot;%2&quot;. Possible are %3.</source>
+        <translation>&quot;%1&quot; は &quot;%2&quot; の単位ではありません。使えるのは %3 です。</translation>
+    </message>
+    <message>
+        <source>No column goes anywhere.</source>
+        <translation>貼り付け先のある列がありません。</translation>
+    </message>
+    <message>
+        <source>Which line is which is told by &quot;%1&quot; and &quot;%2&quot;: columns have to go there.</source>
+        <translation>行は &quot;%1&quot; と &quot;%2&quot; で対応させます。両方に貼り付ける列が必要です。</translation>
+    </message>
+    <message>
+        <source>From line %1 on the table has only %2 lines.</source>
+        <translation>%1 行目以降、表には %2 行しかありません。</translation>
+    </message>
+    <message>
+        <source>The table takes no new lines.</source>
+        <translation>この表に新しい行は追加できません。</translation>
+    </message>
+    <message>
+        <source>Lines cannot be added to this table.</source>
+        <translation>この表に行は追加できません。</translation>
+    </message>
+    <message>
+        <source>Nothing was replaced. %1</source>
+        <translation>置換しませんでした。%1</translation>
+    </message>
+    <message>
+        <source>There is no value above to fill it with.</source>
+        <translation>上の行に入れる値がありません。</translation>
+    </message>
+    <message>
+        <source>No line was inserted. %1</source>
+        <translation>行を挿入しませんでした。%1</translation>
+    </message>
+    <message>
+        <source>1 cell reverted</source>
+        <translation>1 個のセルを戻しました</translation>
+    </message>
+    <message>
+        <source>%1 cells reverted</source>
+        <translation>%1 個のセルを戻しました</translation>
+    </message>
+    <message>
+        <source>The line is new since the last save.</source>
+        <translation>この行は前回の保存より後に追加されました。</translation>
+    </message>
+    <message>
+        <source>What the line was at the last save is not known.</source>
+        <translation>前回の保存時にこの行が何であったかは不明です。</translation>
+    </message>
+    <message>
+        <source>Revert to Saved Values</source>
+        <translation>保存時の値に戻す</translation>
+    </message>
+    <message>
+        <source>Give the selected cells the values that they had at the last save</source>
+        <translation>選択したセルを前回の保存時の値に戻します</translation>
+    </message>
+    <message>
+        <source>Changed since the last save</source>
+        <translation>前回の保存より後に変更</translation>
+    </message>
+    <message>
+        <source>New since the last save</source>
+        <translation>前回の保存より後に追加</translation>
+    </message>
+    <message>
+        <source>%1: %2</source>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>was off at the last save</source>
+        <translation>前回の保存時はオフ</translation>
+    </message>
+    <message>
+        <source>was on at the last save</source>
+        <translation>前回の保存時はオン</translation>
+    </message>
+    <message>
+        <source>was empty at the last save</source>
+        <translation>前回の保存時は空</translation>
+    </message>
+    <message>
+        <source>was %1 at the last save</source>
+        <translation>前回の保存時は %1</translation>
     </message>
 </context>
 </TS>

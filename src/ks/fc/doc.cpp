@@ -4,6 +4,7 @@
 #include "ks/fc/message_box.h"
 #include "ks/fc/shown_text.h"
 #include "ks/fc/system_reason.h"
+#include "ks/fc/unsaved_changes.h"
 
 #include <QApplication>
 #include <QDir>
@@ -26,10 +27,17 @@ CKsDatesOfFiles::~CKsDatesOfFiles()
     dateOfFiles = m_before;
 }
 
-CKsDoc::CKsDoc() : m_dateOfFile(dateOfFiles.value_or(HDDateTime::Now())), m_undo(new QUndoStack(this))
+CKsDoc::CKsDoc()
+    : m_dateOfFile(dateOfFiles.value_or(HDDateTime::Now())),
+      m_undo(new QUndoStack(this)),
+      m_unsaved(std::make_unique<CKsUnsavedChanges>())
 {
     // Undoing back to what was saved leaves nothing to save.
-    connect(m_undo, &QUndoStack::cleanChanged, this, [this](bool clean) { SetModifiedFlag(!clean); });
+    connect(m_undo, &QUndoStack::cleanChanged, this, [this](bool clean) {
+        if (clean)
+            m_unsaved->Clear();
+        SetModifiedFlag(!clean);
+    });
     connect(m_undo, &QUndoStack::indexChanged, this, &CKsDoc::StepMade);
 }
 

@@ -10,10 +10,12 @@
 
 #include <QObject>
 #include <QWidget>
+#include <memory>
 #include <optional>
 #include <vector>
 
 class CKsDoc;
+class CKsUnsavedChanges;
 class CMultiDocTemplate;
 class QUndoStack;
 
@@ -171,6 +173,8 @@ public:
     void RemoveView(CView* view);
 
     QUndoStack& UndoStack() const { return *m_undo; }
+    /// What steps have done to lines since the last save.
+    CKsUnsavedChanges& UnsavedChanges() const { return *m_unsaved; }
     CMultiDocTemplate* GetDocTemplate() const { return m_template; }
 
 signals:
@@ -198,6 +202,7 @@ private:
     int m_contents = 0;
     std::vector<CView*> m_views;
     QUndoStack* m_undo = nullptr; // child object
+    std::unique_ptr<CKsUnsavedChanges> m_unsaved;
     CMultiDocTemplate* m_template = nullptr;
     bool m_modified = false, m_executing = false;
     bool m_named = false; // SetPathName was called during a save

@@ -17,7 +17,9 @@ void CDocumentCommand::Run(bool forward)
         });
         return;
     }
+    m_document.UnsavedChanges().MakeRoom();
     const ChangePlace place = forward ? Apply() : Revert();
+    m_document.UnsavedChanges().Add(LineChange(), forward);
     m_document.UpdateAll();
     // The first time the change comes from what the user is looking at.
     if (m_repeated)

@@ -3,6 +3,7 @@
 
 #include "ks/fc/change_place.h"
 #include "ks/fc/doc.h"
+#include "ks/fc/unsaved_changes.h"
 
 #include <QUndoCommand>
 
@@ -18,6 +19,8 @@ public:
 protected:
     virtual ChangePlace Apply() = 0;
     virtual ChangePlace Revert() = 0;
+    /// What the step does to lines, always the same object; null for nothing.
+    virtual std::shared_ptr<const KsLineChange> LineChange() const { return nullptr; }
     /// Asked before the step is made; false when the user has been told why not.
     virtual bool IsAllowed() { return m_document.MayChange(); }
     void ContentReplaced() { m_document.ContentReplaced(); }
@@ -47,11 +50,13 @@ protected:
         return {};
     }
     ChangePlace Revert() override { return Apply(); }
+    std::shared_ptr<const KsLineChange> LineChange() const override { return m_change; }
     bool IsAllowed() override { return true; } // it is what somebody has kept or written already
 
 private:
     T& m_target;
     T m_other; // what is not in the document
+    std::shared_ptr<const KsLineChange> m_change = std::make_shared<KsEveryLineReplaced>();
 };
 
 /// Changes one value of the document that no list holds.

@@ -69,11 +69,21 @@ void KsLangFreeResDll(KsResourceHandle handle)
     Modules().erase(QString(handle->name));
 }
 
-std::unique_ptr<QTranslator> KsLangTranslator(const CString& module, const CString& language)
+QStringList KsLangInAll(const char* module, const char* context, const char* source)
 {
-    auto translator = std::make_unique<QTranslator>();
-    static_cast<void>(translator->load(module + u'_' + language, KsLanguage::Instance().TranslationFolder()));
-    return translator;
+    static std::map<CString, std::unique_ptr<QTranslator>> translators; // by file
+    QStringList texts{CString::fromUtf8(source)};
+    for (const CString& language : KsLanguage::Available()) {
+        const CString name = CString::fromUtf8(module);
+        auto& translator = translators[KsLanguage::Instance().TranslationFolder() + u'/' + name + u'_' + language];
+        if (!translator) {
+            translator = std::make_unique<QTranslator>();
+            static_cast<void>(translator->load(name + u'_' + language, KsLanguage::Instance().TranslationFolder()));
+        }
+        if (const CString text = translator->translate(context, source); !text.isEmpty() && !texts.contains(text))
+            texts << text;
+    }
+    return texts;
 }
 
 QFont KsLangGetUserFont()

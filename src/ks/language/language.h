@@ -19,9 +19,8 @@ using KsResourceHandle = KsResourceModule*;
 KS_API KsResourceHandle KsLangLoadResDll(const char* name, KsResourceHandle* handle, int flags);
 /// Removes a resource module. Null is allowed.
 KS_API void KsLangFreeResDll(KsResourceHandle handle);
-/// The translations of a module into one of KsLanguage::Available(), whatever the program's own is: for looking up only.
-/// Empty where the texts in the sources are in that language.
-KS_API std::unique_ptr<QTranslator> KsLangTranslator(const CString& module, const CString& language);
+/// A text of a module, as its source has it, in every language of the program, each spelling once.
+KS_API QStringList KsLangInAll(const char* module, const char* context, const char* source);
 /// The user's interface font.
 KS_API QFont KsLangGetUserFont();
 

@@ -6,6 +6,7 @@
 
 #include <QCoreApplication>
 #include <QStringList>
+#include <algorithm>
 #include <cmath>
 #include <limits>
 
@@ -38,8 +39,28 @@ KsTyped<double> ReadFormula(const CString& text)
     return {value};
 }
 
-/// What may be typed instead, for the message.
-CString PossibleUnits(const CKsEditStyle& style, const CString& symbol)
+KsTyped<double> ReadAmount(double number, const CString& unit, const CKsEditStyle& style, const CString& symbol)
+{
+    if (!symbol.isEmpty() && unit == symbol)
+        return {style.UnitConvertFromBase(number, 0)}; // as without it, to the last bit
+    if (const auto factor = KsTypedUnitFactor(style.Group(), unit)) {
+        const double value = double(number * *factor);
+        return std::isfinite(value) ? KsTyped<double>{value} : KsTyped<double>{};
+    }
+    if (!KsIsUnit(unit))
+        return {};
+    const CString possible = KsTypedUnits(style, symbol).join(QStringLiteral(", "));
+    return {
+        {},
+        possible.isEmpty()
+            ? Text(QT_TRANSLATE_NOOP("CKsEditStyle", "This number has no unit; \"%1\" cannot stand here.")).arg(unit)
+            : Text(QT_TRANSLATE_NOOP("CKsEditStyle", "\"%1\" is no unit of this quantity. Possible are %2."))
+                  .arg(unit, possible)};
+}
+
+} // namespace
+
+QStringList KsTypedUnits(const CKsEditStyle& style, const CString& symbol)
 {
     QStringList units;
     const auto add = [&units](const CString& unit) {
@@ -53,37 +74,31 @@ CString PossibleUnits(const CKsEditStyle& style, const CString& symbol)
         for (const CString& unit : CString::fromUtf8(row->alsoTyped).split(QStringLiteral(", "), Qt::SkipEmptyParts))
             add(unit);
     }
-    return units.join(QStringLiteral(", "));
+    return units;
 }
 
-KsTyped<double> ReadAmount(double number, const CString& unit, const CKsEditStyle& style, const CString& symbol)
+std::optional<double> KsReadNumber(QStringView text, const CKsEditStyle& style)
 {
-    if (!symbol.isEmpty() && unit == symbol)
-        return {style.UnitConvertFromBase(number, 0)}; // as without it, to the last bit
-    if (const auto factor = KsTypedUnitFactor(style.Group(), unit)) {
-        const double value = double(number * *factor);
-        return std::isfinite(value) ? KsTyped<double>{value} : KsTyped<double>{};
-    }
-    if (!KsIsUnit(unit))
-        return {};
-    const CString possible = PossibleUnits(style, symbol);
-    return {{}, possible.isEmpty()
-                    ? Text(QT_TRANSLATE_NOOP("CKsEditStyle", "This number has no unit; \"%1\" cannot stand here.")).arg(unit)
-                    : Text(QT_TRANSLATE_NOOP("CKsEditStyle", "\"%1\" is no unit of this quantity. Possible are %2."))
-                          .arg(unit, possible)};
+    char plain[400]; // any number that a double can be told by
+    if (text.size() > qsizetype(sizeof plain))
+        return std::nullopt;
+    const auto end = std::transform(text.begin(), text.end(), plain, [](QChar c) { return c.toLatin1(); });
+    const auto number = ReadNumber({plain, std::size_t(end - plain)});
+    return number ? std::optional(style.UnitConvertFromBase(*number, 0)) : std::nullopt;
 }
 
-} // namespace
-
-KsTyped<double> KsReadTyped(const CString& text, const CKsEditStyle& style)
+KsTyped<double> KsReadTyped(QStringView text, const CKsEditStyle& style)
 {
     return KsReadTyped(text, style, style.UnitSymbol());
 }
 
-KsTyped<double> KsReadTyped(const CString& text, const CKsEditStyle& style, const CString& symbol)
+KsTyped<double> KsReadTyped(QStringView given, const CKsEditStyle& style, const CString& symbol)
 {
+    if (const auto number = KsReadNumber(given, style))
+        return {*number};
+    const CString text = given.toString();
     const std::string plain = text.toStdString();
-    if (const auto number = ReadNumber(plain))
+    if (const auto number = ReadNumber(plain)) // a very long one
         return {style.UnitConvertFromBase(*number, 0)};
     if (IsValidNumber(plain)) // too large for a number
         return {};
@@ -107,7 +122,6 @@ KsTyped<std::int32_t> KsReadTypedInteger(const CString& text)
     if (!result.value)
         return {{}, result.complaint};
     if (*result.value != std::floor(*result.value) || *result.value < Limits::min() || *result.value > Limits::max())
-        return {{}, Text(QT_TRANSLATE_NOOP("CKsEditStyle", "The result of \"%1\" is no integer."))
-                        .arg(text.sliced(1))};
+        return {{}, Text(QT_TRANSLATE_NOOP("CKsEditStyle", "The result of \"%1\" is no integer.")).arg(text.sliced(1))};
     return {std::int32_t(*result.value)};
 }

@@ -4,6 +4,7 @@
 #include "grid/grid_widths.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/wnd_resizer.h"
+#include "ks/language/language.h"
 
 #include <QLabel>
 #include <QUndoStack>
@@ -13,13 +14,23 @@ std::function<QString()> LineOf(Str text, int line)
     return [text, line] { return LoadLine(text, line); };
 }
 
+QStringList InAllLanguages(const TextLine& line)
+{
+    const char* const source = SourceText(line.text);
+    QStringList texts;
+    for (const QString& text : source ? KsLangInAll(TextsOfModule, TextsOfModule, source) : QStringList())
+        texts << (line.line < 0 ? text : text.section(u'\n', line.line, line.line));
+    return texts;
+}
+
 static constexpr TableStyle OnPages{[](const TextLine& line) { return LoadLine(line.text, line.line); },
-                                    Str::GlobalRow};
+                                    [](const TextLine& line) { return InAllLanguages(line); }, Str::GlobalRow};
 
 GridColumns::GridColumns(CGenGrid& grid, const void* globals) : FieldColumns(*grid.Model(), OnPages, globals) {}
 
 GridColumns& GridColumns::BranchName(ColumnSpec column)
 {
+    column.namesLine = true;
     column.upperCase = true;
     Value(LocationFields()[0], std::move(column));
     return *this;
@@ -27,6 +38,7 @@ GridColumns& GridColumns::BranchName(ColumnSpec column)
 
 GridColumns& GridColumns::Chainage(ColumnSpec column)
 {
+    column.namesLine = true;
     column.emptyIsNotGiven = true;
     Value(LocationFields()[1], std::move(column));
     return *this;

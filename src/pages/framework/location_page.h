@@ -10,6 +10,8 @@
 
 /// A text that a column has, or one line of it, in the user's language of the moment.
 std::function<QString()> LineOf(Str text, int line = TextLine::Whole);
+/// A text of the module in every language of the program, each spelling once.
+QStringList InAllLanguages(const TextLine& line);
 
 /// Declares the columns of a page's grid, from left to right.
 class GridColumns : public FieldColumns

@@ -1,0 +1,308 @@
+#include "grid/paste_dialog.h"
+
+#include "grid/grid_keys.h"
+#include "grid/grid_texts.h"
+#include "grid/paste_models.h"
+#include "ks/fc/plain_cell.h"
+#include "ks/units/typed_number.h"
+
+#include <QApplication>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QDialog>
+#include <QDialogButtonBox>
+#include <QFormLayout>
+#include <QHeaderView>
+#include <QLabel>
+#include <QPushButton>
+#include <QTableView>
+#include <QTableWidget>
+#include <QVBoxLayout>
+
+namespace {
+
+constexpr int TextWidth = 160; // for texts to be mended
+
+constexpr const char* SeparatorNames[] = {
+    QT_TRANSLATE_NOOP("GridTexts", "Tab"), QT_TRANSLATE_NOOP("GridTexts", "Semicolon"),
+    QT_TRANSLATE_NOOP("GridTexts", "Comma"), QT_TRANSLATE_NOOP("GridTexts", "Vertical bar")};
+static_assert(std::size(SeparatorNames) == std::size(Separators));
+
+QString ColumnName(const CopiedTable& copied, bool hasHeaders, int column)
+{
+    const QString header =
+        hasHeaders && column < copied.texts.Width(0) ? copied.texts.At(0, column).toString().simplified() : QString();
+    return header.isEmpty() ? GridTexts::tr("Column %1").arg(column + 1) : header;
+}
+
+class CPasteDlg : public QDialog
+{
+public:
+    CPasteDlg(const CTableRows& rows, const ReadCopied& read, int row, int column, bool hasPlaces, QWidget& parent)
+        : QDialog(&parent),
+          m_rows(rows),
+          m_read(read),
+          m_row(row),
+          m_column(column),
+          m_copied(read(u'\t')),
+          m_understood(rows, m_plan),
+          m_faults(rows, m_plan, [this](const CPastePlan::Fault& fault, const QString& text) { Mend(fault, text); })
+    {
+        setWindowTitle(NameOf(GridAction::Paste));
+        const QChar separator = SeparatorOf(read);
+        AddChoices(separator, hasPlaces);
+        AddTables();
+        if (separator != u'\t')
+            m_copied = read(separator);
+        Guess();
+        resize(760, 620);
+    }
+
+    std::optional<PasteDecision> Ask()
+    {
+        if (exec() != Accepted)
+            return std::nullopt;
+        return PasteDecision{m_plan->TakeCells(), m_plan->Choice(), m_plan->CellCount(), m_plan->Faults().size()};
+    }
+
+private:
+    QComboBox* AddCombo(QFormLayout& form, const QString& label, const char* name, const QStringList& entries)
+    {
+        auto* combo = new QComboBox;
+        combo->setObjectName(QString::fromLatin1(name));
+        combo->addItems(entries);
+        form.addRow(label, combo);
+        return combo;
+    }
+
+    void AddChoices(QChar separator, bool hasPlaces)
+    {
+        auto* layout = new QVBoxLayout(this);
+        m_summary = new QLabel;
+        m_summary->setObjectName(QStringLiteral("summary"));
+        m_summary->setWordWrap(true);
+        layout->addWidget(m_summary);
+        auto* form = new QFormLayout;
+        layout->addLayout(form);
+        QStringList separators;
+        for (const char* const name : SeparatorNames)
+            separators << GridTexts::tr(name);
+        m_separator = AddCombo(*form, GridTexts::tr("Cells are separated &by:"), "separator", separators);
+        m_separator->setCurrentIndex(int(std::ranges::find(Separators, separator.unicode()) - Separators));
+        form->setRowVisible(m_separator, separator != u'\t' || m_copied.texts.Columns() == 1);
+        m_decimal =
+            AddCombo(*form, GridTexts::tr("&Numbers:"), "decimal",
+                     {GridTexts::tr("With a decimal point: 1,234.5"), GridTexts::tr("With a decimal comma: 1.234,5")});
+        m_place = AddCombo(*form, GridTexts::tr("Lines &go:"), "place",
+                           {GridTexts::tr("Into the table from line %1 on").arg(m_rows.LineNumber(m_row)),
+                            GridTexts::tr("Behind the last line")});
+        if (hasPlaces)
+            m_place->addItem(
+                GridTexts::tr("To the lines of the same branch and chainage, others behind the last line"));
+        m_headers = new QCheckBox(GridTexts::tr("The first line na&mes the columns"));
+        m_headers->setObjectName(QStringLiteral("headers"));
+        form->addRow(m_headers);
+        connect(m_separator, &QComboBox::activated, this, [this](int index) {
+            m_copied = m_read(Separators[index]);
+            Guess();
+        });
+        connect(m_decimal, &QComboBox::activated, this, [this] { Show(); });
+        connect(m_place, &QComboBox::activated, this, [this] { Show(); });
+        connect(m_headers, &QCheckBox::clicked, this, [this](bool checked) {
+            PasteChoice choice = AsItStands(m_rows, m_copied, m_row, m_column);
+            if (checked) {
+                choice.columns = ColumnsByHeaders(m_rows, m_copied.texts, m_column);
+                TakeUnits(m_rows, m_copied, choice);
+            }
+            ShowColumns(choice.columns);
+            Show();
+        });
+    }
+
+    void AddTables()
+    {
+        auto* all = static_cast<QVBoxLayout*>(layout());
+        m_columns = new QTableWidget(0, 4);
+        m_columns->setAccessibleName(GridTexts::tr("Columns"));
+        m_columns->setHorizontalHeaderLabels(
+            {GridTexts::tr("Copied"), GridTexts::tr("Goes to"), GridTexts::tr("Unit"), GridTexts::tr("First text")});
+        m_columns->verticalHeader()->hide();
+        m_columns->horizontalHeader()->setStretchLastSection(true);
+        m_columns->setSelectionMode(QAbstractItemView::NoSelection);
+        m_columns->setTabKeyNavigation(false);
+        all->addWidget(m_columns, 2);
+        all->addWidget(MakeView(m_understood, GridTexts::tr("As it is understood")), 3);
+        m_faultTitle = new QLabel(GridTexts::tr("What does not fit can be mended here:"));
+        all->addWidget(m_faultTitle);
+        m_faultView = MakeView(m_faults, GridTexts::tr("What does not fit"));
+        m_faultView->verticalHeader()->hide();
+        m_faultView->horizontalHeader()->setStretchLastSection(true);
+        m_faultView->setEditTriggers(QAbstractItemView::DoubleClicked | QAbstractItemView::SelectedClicked |
+                                     QAbstractItemView::EditKeyPressed | QAbstractItemView::AnyKeyPressed);
+        all->addWidget(m_faultView, 2);
+        m_leaveOut = new QCheckBox;
+        m_leaveOut->setObjectName(QStringLiteral("leaveOut"));
+        connect(m_leaveOut, &QCheckBox::clicked, this, [this] { ShowSummary(); });
+        all->addWidget(m_leaveOut);
+        m_buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
+        m_buttons->button(QDialogButtonBox::Ok)->setText(NameOf(GridAction::Paste));
+        connect(m_buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
+        connect(m_buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+        all->addWidget(m_buttons);
+    }
+
+    static QTableView* MakeView(QAbstractItemModel& model, const QString& name)
+    {
+        auto* view = new QTableView;
+        view->setModel(&model);
+        view->setAccessibleName(name);
+        view->setWordWrap(false);
+        view->setTabKeyNavigation(false);
+        view->verticalHeader()->setMinimumWidth(view->fontMetrics().horizontalAdvance(QStringLiteral("0000000")));
+        return view;
+    }
+
+    void Guess()
+    {
+        const PasteChoice choice = AsItSeems(m_rows, m_copied, m_row, m_column);
+        m_headers->setChecked(choice.hasHeaders);
+        m_decimal->setCurrentIndex(choice.decimal == DecimalSign::Comma);
+        ShowColumns(choice.columns);
+        Show();
+    }
+
+    void ShowColumns(const std::vector<PasteChoice::Column>& columns)
+    {
+        m_columns->setRowCount(int(columns.size()));
+        QStringList targets{GridTexts::tr("(left out)")};
+        for (const ColumnSpec& column : m_rows.Columns())
+            targets << column.header();
+        for (int row = 0; row < int(columns.size()); ++row) {
+            const auto& [target, unit] = columns[std::size_t(row)];
+            m_columns->setItem(row, 0, PlainCell(ColumnName(m_copied, m_headers->isChecked(), row)));
+            const std::size_t line = m_headers->isChecked() ? 1 : 0;
+            const bool isThere = line < m_copied.texts.Lines() && row < m_copied.texts.Width(line);
+            m_columns->setItem(row, 3, PlainCell(isThere ? m_copied.texts.At(line, row).toString() : QString()));
+            auto* goesTo = new QComboBox;
+            goesTo->addItems(targets);
+            goesTo->setCurrentIndex(target + 1);
+            goesTo->setAccessibleName(GridTexts::tr("Column %1").arg(row + 1));
+            auto* units = new QComboBox;
+            units->setAccessibleName(GridTexts::tr("Unit of column %1").arg(row + 1));
+            m_columns->setCellWidget(row, 1, goesTo);
+            m_columns->setCellWidget(row, 2, units);
+            ShowUnits(row, unit);
+            connect(goesTo, &QComboBox::activated, this, [this, row] {
+                ShowUnits(row, {});
+                Show();
+            });
+            connect(units, &QComboBox::activated, this, [this] { Show(); });
+        }
+        m_columns->resizeColumnsToContents();
+        const int shown = std::min(int(columns.size()), 6), line = m_columns->rowCount() ? m_columns->rowHeight(0) : 0;
+        m_columns->setMinimumHeight(m_columns->horizontalHeader()->sizeHint().height() + shown * line + 4);
+    }
+
+    QComboBox& ComboAt(int row, int column) const
+    {
+        return *static_cast<QComboBox*>(m_columns->cellWidget(row, column));
+    }
+
+    void ShowUnits(int row, const QString& unit)
+    {
+        QComboBox& units = ComboAt(row, 2);
+        const int target = ComboAt(row, 1).currentIndex() - 1;
+        units.clear();
+        if (target >= 0 && m_rows.Column(target).IsNumeric())
+            units.addItems(KsTypedUnits(m_rows.Column(target).style, m_rows.Column(target).UnitSymbol()));
+        if (!unit.isEmpty() && units.findText(unit) < 0)
+            units.addItem(unit);
+        units.setCurrentIndex(unit.isEmpty() ? 0 : units.findText(unit));
+        units.setEnabled(units.count() > 1);
+    }
+
+    PasteChoice Chosen() const
+    {
+        PasteChoice choice{.hasHeaders = m_headers->isChecked() && m_copied.texts.Lines() > 1,
+                           .decimal = m_decimal->currentIndex() == 1 ? DecimalSign::Comma : DecimalSign::Point,
+                           .place = PastePlace(m_place->currentIndex()),
+                           .row = m_row};
+        for (int row = 0; row < m_columns->rowCount(); ++row) {
+            const int target = ComboAt(row, 1).currentIndex() - 1;
+            const QString unit = ComboAt(row, 2).currentText();
+            choice.columns.push_back(
+                {target, target >= 0 && unit != m_rows.Column(target).UnitSymbol() ? unit : QString()});
+        }
+        return choice;
+    }
+
+    void Show()
+    {
+        QApplication::setOverrideCursor(Qt::WaitCursor);
+        m_plan = std::make_unique<CPastePlan>(m_rows, m_copied, Chosen());
+        m_understood.Renew();
+        m_faults.Renew();
+        m_faultView->resizeColumnsToContents();
+        m_faultView->setColumnWidth(CFaultModel::Text,
+                                    std::max(m_faultView->columnWidth(CFaultModel::Text), TextWidth));
+        QApplication::restoreOverrideCursor();
+        m_leaveOut->setChecked(false);
+        ShowSummary();
+    }
+
+    void Mend(const CPastePlan::Fault& fault, const QString& text)
+    {
+        m_copied.texts.Set(fault.line + m_plan->Choice().hasHeaders, fault.column, text);
+        m_copied.numbers.reset();
+        QMetaObject::invokeMethod(
+            this,
+            [this] { // the cell is still being edited before
+                Show();
+                if (m_plan->Faults().empty())
+                    m_buttons->button(QDialogButtonBox::Ok)->setFocus();
+            },
+            Qt::QueuedConnection);
+    }
+
+    void ShowSummary()
+    {
+        const std::size_t faults = m_plan->Faults().size(), fresh = m_plan->NewLines();
+        QStringList texts{
+            GridTexts::Counted(m_plan->Lines(), GridTexts::tr("1 line was copied."),
+                               GridTexts::tr("%1 lines were copied.")),
+            GridTexts::Counted(fresh, GridTexts::tr("1 line is new."), GridTexts::tr("%1 lines are new."))};
+        if (!m_plan->Complaint().isEmpty())
+            texts << m_plan->Complaint();
+        m_summary->setText(texts.join(u' '));
+        m_leaveOut->setText(GridTexts::Counted(faults, GridTexts::tr("&Leave out the one that does not fit"),
+                                               GridTexts::tr("&Leave out the %1 that do not fit")));
+        for (QWidget* part : {static_cast<QWidget*>(m_faultTitle), static_cast<QWidget*>(m_faultView),
+                              static_cast<QWidget*>(m_leaveOut)})
+            part->setVisible(faults > 0);
+        m_buttons->button(QDialogButtonBox::Ok)
+            ->setEnabled(m_plan->Complaint().isEmpty() && m_plan->CellCount() > 0 &&
+                         (faults == 0 || m_leaveOut->isChecked()));
+    }
+
+    const CTableRows& m_rows;
+    ReadCopied m_read;
+    int m_row, m_column;
+    CopiedTable m_copied;
+    std::unique_ptr<CPastePlan> m_plan;
+    CUnderstoodModel m_understood;
+    CFaultModel m_faults;
+    QLabel *m_summary = nullptr, *m_faultTitle = nullptr;
+    QComboBox *m_separator = nullptr, *m_decimal = nullptr, *m_place = nullptr;
+    QCheckBox *m_headers = nullptr, *m_leaveOut = nullptr;
+    QTableWidget* m_columns = nullptr;
+    QTableView* m_faultView = nullptr;
+    QDialogButtonBox* m_buttons = nullptr;
+};
+
+} // namespace
+
+std::optional<PasteDecision> AskForPaste(const CTableRows& rows, const ReadCopied& read, int row, int column,
+                                         bool hasPlaces, QWidget& parent)
+{
+    return CPasteDlg(rows, read, row, column, hasPlaces, parent).Ask();
+}

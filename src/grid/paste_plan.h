@@ -1,0 +1,119 @@
+// What pasting a table would do, before anything changes: which cell each text goes to, how it is understood, and which
+// of them do not fit.
+#pragma once
+
+#include "grid/cell_text.h"
+#include "grid/copied_table.h"
+#include "grid/foreign_number.h"
+#include "grid/table_rows.h"
+
+#include <functional>
+
+/// Where the lines of a copied table go.
+enum class PastePlace
+{
+    AtCell, // into the rows shown from one on; behind the last one into new lines
+    AtEnd,  // into new lines
+    ByPlace // into the lines of the same branch and chainage, hidden ones included; others become new lines
+};
+
+/// How a copied table is to be understood. What the user may choose.
+struct PasteChoice
+{
+    struct Column
+    {
+        int target = -1; // column of the table; -1 for one that is left out
+        QString unit{};  // of numbers without one; empty for the unit that the target shows
+    };
+    bool hasHeaders = false;
+    std::optional<DecimalSign> decimal{}; // nothing: texts are no others than a cell takes that is typed into
+    std::vector<Column> columns{};        // of the copied table
+    PastePlace place = PastePlace::AtCell;
+    int row = 0; // for AtCell
+};
+
+/// The copied columns one after another from a column of the table on.
+PasteChoice AsItStands(const CTableRows& rows, const CopiedTable& copied, int row, int column);
+/// Numbers have the units that they were copied with, as far as the clipboard knows them.
+void TakeUnits(const CTableRows& rows, const CopiedTable& copied, PasteChoice& choice);
+/// Whether the first line names the columns of the table from `column` on, in their order and with their units.
+bool HasHeadersInOrder(const CTableRows& rows, const CTextTable& texts, int column);
+/// Whether the first line seems to say what stands below it, in whatever order and words.
+bool SeemsToHaveHeaders(const CTableRows& rows, const CTextTable& texts, int column);
+/// The same, with what the texts themselves say: columns go where their headers say, numbers have the decimal sign that
+/// more of them can be read with.
+PasteChoice AsItSeems(const CTableRows& rows, const CopiedTable& copied, int row, int column);
+/// Where the columns go whose headers say so, and in which units they are; without any such one after another from
+/// `column` on.
+std::vector<PasteChoice::Column> ColumnsByHeaders(const CTableRows& rows, const CTextTable& texts, int column);
+
+/// What may stand between the cells of a copied table.
+inline constexpr char16_t Separators[] = {u'\t', u';', u',', u'|'};
+/// Reads what was copied, with a separator between its cells.
+using ReadCopied = std::function<CopiedTable(QChar separator)>;
+/// That with which every line has as many cells, more than one; a tab when there is none. A comma within numbers is
+/// none.
+QChar SeparatorOf(const ReadCopied& read);
+
+class CPastePlan
+{
+public:
+    /// Both outlive it.
+    CPastePlan(const CTableRows& rows, const CopiedTable& copied, PasteChoice choice);
+
+    const PasteChoice& Choice() const { return m_choice; }
+    /// Without the headers.
+    std::size_t Lines() const { return m_copied->texts.Lines() - m_first; }
+    int Columns() const { return int(m_choice.columns.size()); }
+    /// What was copied.
+    QString Text(std::size_t line, int column) const;
+    /// The text of the cell that it becomes; as copied where it does not fit.
+    QString Understood(std::size_t line, int column) const;
+    /// The row of the source that a line goes to, unless it becomes a new one or goes nowhere.
+    std::optional<std::size_t> RowOf(std::size_t line) const;
+    bool IsNew(std::size_t line) const;
+    std::size_t NewLines() const;
+
+    struct Fault
+    {
+        std::size_t line;
+        int column; // of the copied table; of a line that goes nowhere -1
+        QString reason;
+    };
+    /// Line by line.
+    const std::vector<Fault>& Faults() const { return m_faults; }
+    /// What nothing can be done about cell by cell; empty for nothing.
+    const QString& Complaint() const { return m_complaint; }
+    /// Every text has a cell that takes it.
+    bool IsClean() const;
+    /// Texts that have one.
+    std::size_t CellCount() const { return m_cellCount; }
+    /// The cells without those that do not fit; the plan has none afterwards.
+    PastedCells TakeCells();
+
+private:
+    void FindComplaint();
+    void FindRows();
+    void FindRowsByPlace();
+    QStringView WholeNumber(std::size_t line, int column) const;
+    QString NumberText(std::size_t line, int column) const;
+    bool IsAsTyped(int column) const;
+    CellReading Read(std::size_t line, int column) const;
+    void ReadColumn(int column);
+    void Leave(std::size_t line, int column);
+    void AddFault(std::size_t line, int column, const QString& reason);
+    void FindRuleFaults();
+    PastedCells Cells(std::vector<CCellValues> values, std::vector<std::vector<bool>> left) const;
+    PastedCells::Column WithoutLinesThatGoNowhere(PastedCells::Column column) const;
+
+    const CTableRows* m_rows;
+    const CopiedTable* m_copied;
+    PasteChoice m_choice;
+    std::size_t m_first; // line of the texts
+    std::vector<std::size_t> m_rowOf{};
+    std::vector<CCellValues> m_values{};     // by column of the texts
+    std::vector<std::vector<bool>> m_left{}; // those that stay as they are; empty where none does
+    std::vector<Fault> m_faults{};
+    QString m_complaint{};
+    std::size_t m_cellCount = 0;
+};

@@ -1,0 +1,52 @@
+"""Pasting tables of other programs."""
+import samples
+from case import Case
+from test_telling import copy
+
+
+LINES = ['"A", 0, 10, 1', '"A", 100, 20, 2', '"B", 50, 7, 3']
+
+
+class Pasting(Case):
+    TEXT = samples.hd_text({'InitList': LINES})
+
+    def test_what_does_not_fit_is_shown_mended_and_undone(self):
+        editor = self.open(self.TEXT)
+        copy('Initial Q [l/s]\tRiver Name\tChainage\tInitial h\n'
+             '500\ta\t0\t1.234,5\n2.500\tA\t100\t21,5\n1\tc\tten\t8,5\n')
+        editor.click_cell(1, 1)
+        editor.press('ctrl+v')
+        self.assertIn('3 lines were copied. 0 lines are new.', editor.box_texts())
+        editor.press('Escape')
+        editor.press('ctrl+v')
+        editor.box()
+        editor.press('alt+g', 'End')  # by place
+        editor.settle(0.5)
+        self.assertIn('3 lines were copied. 1 line is new.', editor.box_texts())
+        editor.press('Tab', 'Tab', 'Tab', 'Tab')  # the headers, the columns, what is understood, what does not fit
+        editor.press('ctrl+Home', 'Right', 'Right', 'F2')
+        editor.press('ctrl+a')
+        editor.type('7,25')
+        editor.press('Return')
+        editor.settle(0.5)
+        editor.press('Return')
+        editor.settle()
+        self.assertIn('12 cells pasted', editor.status())
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'),
+                         ['"A", 0, 1234.5, 0.5', '"A", 100, 21.5, 2.5', '"B", 50, 7, 3', '"C", 7.25, 8.5, 0.001'])
+        editor.press('ctrl+z')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), LINES)
+
+    def test_values_travel_through_a_change_of_units(self):
+        editor = self.open(self.TEXT)
+        editor.click_cell(1, 3)
+        editor.press('shift+Down', 'shift+Right', 'ctrl+c')
+        editor.menu('View', 'Units', 'US Customary')
+        editor.click_cell(2, 3)
+        editor.press('ctrl+v')
+        editor.settle()
+        self.assertIn('4 cells pasted', editor.status())
+        editor.save()
+        self.assertEqual(self.saved().records('InitList'), ['"A", 0, 10, 1', '"A", 100, 10, 1', '"B", 50, 20, 2'])
