@@ -100,6 +100,12 @@ QString CGenGrid::SelectionText() const
     return m_summary->Text();
 }
 
+QSize CGenGrid::sizeHint() const
+{
+    const QSize usual = QTableView::sizeHint();
+    return {m_widths->WidthOfGrid() > 0 ? m_widths->WidthOfGrid() : usual.width(), usual.height()};
+}
+
 void CGenGrid::Refresh()
 {
     const int row = CurrentRow(), column = CurrentColumn();

@@ -28,6 +28,7 @@ public:
     CGridModel* Model() const { return m_model; }
     CGridInput& Input() const { return *m_input; }
     CGridWidths& Widths() const { return *m_widths; }
+    QSize sizeHint() const override;
     CGridSelection& Selection() const { return *m_selection; }
     CGridHeader& Header() const { return *m_header; }
     const CFrozenColumns& Frozen() const { return *m_frozen; }

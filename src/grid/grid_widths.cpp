@@ -6,7 +6,9 @@
 #include <QHeaderView>
 #include <QStyle>
 #include <algorithm>
+#include <cmath>
 #include <limits>
+#include <utility>
 
 namespace {
 
@@ -53,6 +55,7 @@ CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid), m_lette
     grid.verticalHeader()->setHighlightSections(false);
     grid.verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
     UpdateRowNumbers();
+    grid.viewport()->installEventFilter(this);
     connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGridWidths::MakeRoom);
     connect(grid.Model(), &CGridModel::CellModified, this, &CGridWidths::MakeRoomFor);
     connect(
@@ -81,12 +84,76 @@ void CGridWidths::UpdateRowNumbers()
 void CGridWidths::Update()
 {
     UpdateRowNumbers();
-    for (int column = std::min(m_columnsSet, m_grid.ColumnCount()); column < m_grid.ColumnCount(); ++column) {
+    const auto count = std::size_t(m_grid.ColumnCount());
+    if (m_columns.size() != count)
+        m_room = -1;
+    if (m_columns.size() > count)
+        m_columns.resize(count, {});
+    while (m_columns.size() < count) {
+        const auto column = int(m_columns.size());
         const int width = int(m_grid.Model()->Column(column).width * m_letters.scale);
-        m_grid.setColumnWidth(column, WidthOfTexts(column, RowsAtStart, width));
+        m_columns.push_back({.usual = WidthOfTexts(column, RowsAtStart, width)});
+        m_grid.setColumnWidth(column, m_columns.back().usual);
     }
-    m_columnsSet = m_grid.ColumnCount();
     MakeRoomForMarks();
+    Arrange();
+}
+
+/// Where the columns do not fit beside each other they give up what neither their headers nor their texts need, each in
+/// proportion, until they do or have nothing left to give.
+void CGridWidths::Arrange()
+{
+    const int room = m_grid.viewport()->width();
+    if (m_areChosen || m_columns.empty() || m_room == room || !m_grid.isVisible())
+        return;
+    m_room = room;
+    int missing = -room, spare = 0;
+    for (const Column& column : m_columns)
+        missing += column.usual;
+    for (std::size_t i = 0; missing > 0 && i < m_columns.size(); ++i) {
+        Column& column = m_columns[i];
+        if (column.least == 0)
+            column.least = std::min(column.usual, WidthOfTexts(int(i), RowsForRoom, 2 * Margin));
+        spare += column.usual - column.least;
+    }
+    const double share = spare > 0 ? std::clamp(missing / double(spare), 0.0, 1.0) : 0.0;
+    m_isArranging = true;
+    for (std::size_t i = 0; i < m_columns.size(); ++i) {
+        const Column& column = m_columns[i];
+        const int given = missing > 0 ? int(std::ceil((column.usual - column.least) * share)) : 0;
+        m_grid.setColumnWidth(int(i), column.usual - given);
+    }
+    MakeRoomForMarks();
+    m_isArranging = false;
+}
+
+bool CGridWidths::eventFilter(QObject* object, QEvent* event)
+{
+    if (event->type() == QEvent::Resize || event->type() == QEvent::Show)
+        Arrange();
+    return QObject::eventFilter(object, event);
+}
+
+void CGridWidths::KeepGridAsWide()
+{
+    connect(m_grid.horizontalHeader(), &QHeaderView::sectionResized, this, &CGridWidths::FitGrid);
+    connect(m_grid.horizontalHeader(), &QHeaderView::sectionCountChanged, this, &CGridWidths::FitGrid);
+    FitGrid();
+}
+
+void CGridWidths::FitGrid()
+{
+    int columns = m_areChosen ? m_grid.horizontalHeader()->length() : 0;
+    for (std::size_t i = 0; !m_areChosen && i < m_columns.size(); ++i)
+        columns += m_columns[i].usual;
+    const int beside = m_grid.verticalHeader()->width() + m_grid.style()->pixelMetric(QStyle::PM_ScrollBarExtent) +
+                       2 * m_grid.frameWidth();
+    const int width = std::min(columns, MostOfAWindow) + beside;
+    if (std::exchange(m_widthOfGrid, width) == width)
+        return;
+    m_grid.setMaximumWidth(width);
+    m_grid.setMinimumWidth(width * 3 / 4); // the columns have some room to give
+    m_grid.updateGeometry();
 }
 
 /// The mark of a sorted column stands beside the header's text.
@@ -106,16 +173,24 @@ void CGridWidths::MakeRoomForMarks()
 void CGridWidths::Reset()
 {
     m_letters = Letters(m_grid.font());
-    if (std::exchange(m_columnsSet, 0) > 0) // not before the rows are there
-        Update();
-    else
-        UpdateRowNumbers();
+    if (m_columns.empty())
+        return UpdateRowNumbers(); // the rows are not there yet
+    m_columns.clear();
+    Update();
 }
 
 void CGridWidths::MakeRoom()
 {
-    for (int column = 0; column < std::min(m_columnsSet, m_grid.ColumnCount()); ++column)
-        m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, m_grid.columnWidth(column)));
+    for (int column = 0; column < std::min(int(m_columns.size()), m_grid.ColumnCount()); ++column)
+        Widen(column, WidthOfTexts(column, RowsForRoom, m_grid.columnWidth(column)));
+}
+
+void CGridWidths::Widen(int column, int width)
+{
+    Column& its = m_columns[std::size_t(column)];
+    its.usual = std::max(its.usual, width);
+    its.least = 0;
+    m_grid.setColumnWidth(column, width);
 }
 
 void CGridWidths::Choose(const QVariantList& widths)
@@ -129,6 +204,7 @@ void CGridWidths::Choose(const QVariantList& widths)
 
 void CGridWidths::Fit(int column)
 {
+    m_areChosen = true;
     m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, 2 * Margin));
     MakeRoomForMarks();
 }
@@ -137,10 +213,9 @@ void CGridWidths::MakeRoomFor(const QModelIndex& cell)
 {
     const QString text = m_grid.TextAt(cell.row() + 1, cell.column() + 1);
     const int width = m_grid.columnWidth(cell.column());
-    if (cell.column() < m_columnsSet && m_letters.Bound(text) > width - Margin)
-        m_grid.setColumnWidth(
-            cell.column(),
-            std::max(width, std::min(m_grid.fontMetrics().horizontalAdvance(text) + Margin, MostOfAWindow)));
+    if (cell.column() < int(m_columns.size()) && m_letters.Bound(text) > width - Margin)
+        Widen(cell.column(),
+              std::max(width, std::min(m_grid.fontMetrics().horizontalAdvance(text) + Margin, MostOfAWindow)));
 }
 
 /// At least `least`, and what the header and the texts need: of `most` rows of the whole table, and of those in sight.

@@ -5,6 +5,7 @@
 #include <QObject>
 #include <QVariantList>
 #include <array>
+#include <vector>
 
 class CGenGrid;
 
@@ -22,7 +23,7 @@ public:
     void MakeRoom();
     /// Whether the user has made a column wider or narrower.
     bool AreChosen() const { return m_areChosen; }
-    void SetChosen() { m_areChosen = true; }
+    void SetChosen() { m_areChosen = m_areChosen || !m_isArranging; }
     /// The widths that he has chosen, one a column.
     void Choose(const QVariantList& widths);
     /// A column becomes as wide as its header and its texts need, be it wider or narrower.
@@ -30,6 +31,14 @@ public:
     void MakeRoomForMarks();
     /// Likewise for the text of one cell.
     void MakeRoomFor(const QModelIndex& cell);
+    /// From now on the grid wants to be as wide as its columns, and no wider: it stands beside others, and what it left
+    /// empty would be missing there.
+    void KeepGridAsWide();
+    /// The width that it then wants; 0 for a grid that takes what there is.
+    int WidthOfGrid() const { return m_widthOfGrid; }
+
+protected:
+    bool eventFilter(QObject* object, QEvent* event) override;
 
 private:
     /// Of the grid's font.
@@ -45,9 +54,19 @@ private:
 
     void UpdateRowNumbers();
     int WidthOfTexts(int column, int most, int least);
+    void Widen(int column, int width);
+    void Arrange();
+    void FitGrid();
 
     CGenGrid& m_grid;
     Letters m_letters;
-    bool m_areChosen = false;
-    int m_columnsSet = 0; // from then on their widths are the user's
+    bool m_areChosen = false, m_isArranging = false;
+    struct Column
+    {
+        int usual;     // where there is room
+        int least = 0; // what its header and its texts need; 0 until somebody has asked
+    };
+    std::vector<Column> m_columns; // those that have got their first width
+    int m_room = -1;               // for which they were arranged
+    int m_widthOfGrid = 0;
 };

@@ -11,6 +11,7 @@ public:
     explicit CDefaultPage(CKavo0_hdDoc* document) : CDialogPage(document)
     {
         HD_Global_Var& globals = Globals();
+        Bindings().TellMeanings();
         Bindings().Add(m_ui.delta_1012, globals.delta);
         Bindings().Add(m_ui.delhs_1013, globals.delhs);
         Bindings().Add(m_ui.delh_1014, globals.delh);

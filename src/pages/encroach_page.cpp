@@ -129,6 +129,7 @@ private:
 
 CEncroachPage::CEncroachPage(CKavo0_hdDoc* document) : CDialogPage(document, nullptr)
 {
+    Bindings().TellMeanings();
     Bindings().Add(m_ui.maxIter_1340, Globals().Max_no_iter);
     Bindings().EnableWhen([this] { return HasSetup(); },
                           {m_ui.setupLabel, m_ui.setup_1341, m_ui.duplicate_1345, m_ui.delete_1346});
@@ -208,6 +209,7 @@ void CEncroachPage::ShowSetups()
     else if (!CGenMetaList<HDEncroach>::IsWorthKeeping(Setups().GetAt(m_current)))
         status = LoadString(Str::SetupNotSaved);
     m_ui.status_1347->setText(status);
+    m_ui.status_1347->setVisible(!status.isEmpty());
 }
 
 void CEncroachPage::GoTo(std::size_t setup)

@@ -11,6 +11,7 @@ class CFloodPage : public CDialogPage<Ui::CFloodPage, CLocationPage>
 public:
     explicit CFloodPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::FloodList)
     {
+        Bindings().TellMeanings();
         Bindings().Add(m_ui.resistance_1040, Globals().G_flood_plan_res);
 
         Grid(m_ui.grid_1043)

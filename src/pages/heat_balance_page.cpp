@@ -12,6 +12,7 @@ public:
     {
         HDHeatBalance& heat = Globals().HeatBalance;
         Bindings().Add(m_ui.included_1148, heat.Calc);
+        Bindings().TellMeanings();
         Bindings().Add(m_ui.latitude_1149, heat.Latitude);
         Bindings().Add(m_ui.longitude_1150, heat.Longitude);
         Bindings().Add(m_ui.timeMeridian_1151, heat.TimeZone);

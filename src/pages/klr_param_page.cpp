@@ -12,11 +12,13 @@ public:
     explicit CKlrParamPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::KlrParamList)
     {
         HDKlrConstants& klr = Globals().Klr;
+        Bindings().TellMeanings();
         Bindings().Add(m_ui.frictionFactor_1006, klr.fricfac);
         Bindings().Add(m_ui.maxVolume_1153, klr.maxvol);
         Bindings().Add(m_ui.maxVelocity_1154, klr.maxvelo);
         Bindings().Add(m_ui.minThickness_1155, klr.minthick);
         Bindings().Add(m_ui.densityDifference_1156, klr.densdiff);
+        Bindings().TellMeanings(false);
         Bindings().Add(m_ui.action_1182, klr.action);
         Bindings().Add(m_ui.upward_1157, klr.R1);
         Bindings().Add(m_ui.downward_1158, klr.R2); // whatever its label says

@@ -14,6 +14,7 @@ public:
         HDLeakageGlobal& leakage = Globals().Leakage;
         const auto included = [&leakage] { return leakage.IncludeLeakage; };
         Bindings().Add(m_ui.includeLeakage_1228, leakage.IncludeLeakage);
+        Bindings().TellMeanings();
         Bindings().Add(m_ui.coefficient_1238, leakage.LeakageCoefficient);
         Bindings().EnableWhen(included, {m_ui.globalCoefficient, m_ui.localCoefficients_1262});
         Bindings().ShowWhen(included, {m_ui.grid_1186});

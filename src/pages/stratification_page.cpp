@@ -11,11 +11,13 @@ public:
     explicit CStratificationPage(CKavo0_hdDoc* document) : CDialogPage(document)
     {
         HDStratification& flow = Globals().Stratification;
+        Bindings().TellMeanings();
         Bindings().Add(m_ui.layers_1175, flow.npv);
         Bindings().Add(m_ui.densities_1148, flow.dens);
         Bindings().Add(m_ui.viscosity_1176, flow.visc);
         Bindings().Add(m_ui.fluidModel_1177, flow.vmf);
         Bindings().Add(m_ui.bedModel_1178, flow.vmb);
+        Bindings().TellMeanings(false); // two groups stand beside each other
         Bindings().Add(m_ui.richardson_1179, flow.Rich);
         Bindings().Add(m_ui.baroclinic_1180, flow.bpr1);
         Bindings().Add(m_ui.bedSlope_1181, flow.bpr2);

@@ -12,6 +12,7 @@ public:
     explicit CWindPage(CKavo0_hdDoc* document) : CDialogPage(document, &HD_Parameters::WindList)
     {
         Bindings().Add(m_ui.includeWind_1159, Globals().wind_shear_stress);
+        Bindings().TellMeanings();
         Bindings().Add(m_ui.topographical_1004, Globals().G_wind_factor);
         Bindings().Add(m_ui.friction_1006, Globals().G_friction_factor);
 

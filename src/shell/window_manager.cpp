@@ -3,14 +3,20 @@
 #include "ks/fc/frames.h"
 #include "shell/settings_keys.h"
 
+#include <QEvent>
+#include <QMdiSubWindow>
 #include <QSettings>
 #include <QTabBar>
+#include <algorithm>
+
+static constexpr int WantedLetters = 155; // beside each other: the tabs of the pages, a table, and a table beside it
 
 CWindowManager::CWindowManager(CKsMDIFrameWnd& frame) : m_frame(frame)
 {
     Area().setTabsClosable(true);
     Area().setTabsMovable(true);
     Area().setDocumentMode(true);
+    Area().viewport()->installEventFilter(this);
 }
 
 QMdiArea& CWindowManager::Area() const
@@ -59,10 +65,12 @@ bool CWindowManager::ChoseTabs()
     return QSettings().value(Settings::Tabs, false).toBool();
 }
 
+/// Three fifths of the width, or as much more as pages with two tables beside each other need.
 QRect CWindowManager::FirstPlace() const
 {
     const QSize area = Area().viewport()->size();
-    return {0, 0, area.width() * 3 / 5, area.height()};
+    const int wanted = std::min(WantedLetters * m_frame.fontMetrics().averageCharWidth(), area.width() * 2 / 3);
+    return {0, 0, std::max(area.width() * 3 / 5, wanted), area.height()};
 }
 
 void CWindowManager::PlaceNewWindowsFirst(bool first)
@@ -77,20 +85,43 @@ void CWindowManager::PlaceSideBySide()
         return;
     QList<QMdiSubWindow*> windows = Area().subWindowList(QMdiArea::CreationOrder);
     windows.removeOne(first);
+    windows.prepend(first);
     ShowTabs(false);
-    first->showNormal();
     for (QMdiSubWindow* window : windows)
         window->showNormal();
-    const QRect area(QPoint(), Area().viewport()->size());
-    QRect place = windows.isEmpty() ? area : FirstPlace();
-    first->setGeometry(place);
-    place.setLeft(place.right() + 1);
-    place.setRight(area.right());
-    const auto count = int(windows.size());
-    for (int i = 0; i < count; ++i) {
-        place.setTop(area.height() * i / count);
-        place.setBottom(area.height() * (i + 1) / count - 1);
-        windows[i]->setGeometry(place);
-    }
+    Place(windows);
     Area().setActiveSubWindow(first);
+}
+
+void CWindowManager::Place(const QList<QMdiSubWindow*>& windows)
+{
+    const QRect area(QPoint(), Area().viewport()->size());
+    const auto others = int(windows.size()) - 1;
+    QRect place = others == 0 ? area : FirstPlace();
+    m_placed = {{windows.front(), place}};
+    for (int i = 0; i < others; ++i) {
+        QRect beside(QPoint(place.right() + 1, area.height() * i / others), area.bottomRight());
+        beside.setBottom(area.height() * (i + 1) / others - 1);
+        m_placed.append({windows[i + 1], beside});
+    }
+    for (const Placed& each : m_placed)
+        each.window->setGeometry(each.place);
+}
+
+/// Windows that stand side by side as they were put follow the size of the area; once the user has moved, closed or
+/// added one they stay where they are.
+bool CWindowManager::eventFilter(QObject* object, QEvent* event)
+{
+    if (event->type() != QEvent::Resize || m_placed.isEmpty())
+        return QObject::eventFilter(object, event);
+    QList<QMdiSubWindow*> windows;
+    for (const Placed& each : m_placed)
+        if (each.window && !each.window->isMaximized() && !each.window->isMinimized() &&
+            each.window->geometry() == each.place)
+            windows << each.window;
+    if (HasTabs() || windows.size() != m_placed.size() || windows.size() != Area().subWindowList().size())
+        m_placed.clear();
+    else
+        Place(windows);
+    return QObject::eventFilter(object, event);
 }

@@ -2,15 +2,18 @@
 #pragma once
 
 #include <QList>
+#include <QObject>
+#include <QPointer>
 #include <QRect>
 
 class CKsMDIChildWnd;
 class CKsMDIFrameWnd;
 class CView;
 class QMdiArea;
+class QMdiSubWindow;
 
 /// Arranges the document windows: as tabs, or as windows that may stand side by side.
-class CWindowManager
+class CWindowManager : public QObject
 {
 public:
     explicit CWindowManager(CKsMDIFrameWnd& frame);
@@ -31,9 +34,19 @@ public:
     /// New windows go where the first of several stands side by side - or, without this, where there is room.
     void PlaceNewWindowsFirst(bool first);
 
+protected:
+    bool eventFilter(QObject* object, QEvent* event) override;
+
 private:
     QMdiArea& Area() const;
     QRect FirstPlace() const;
+    void Place(const QList<QMdiSubWindow*>& windows);
 
     CKsMDIFrameWnd& m_frame;
+    struct Placed
+    {
+        QPointer<QMdiSubWindow> window;
+        QRect place;
+    };
+    QList<Placed> m_placed; // side by side, the first one first
 };

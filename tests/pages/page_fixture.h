@@ -93,7 +93,8 @@ inline QList<QWidget*> Controls(const QWidget& page)
     for (QWidget* widget : page.findChildren<QWidget*>()) {
         const bool control = qobject_cast<QLineEdit*>(widget) || qobject_cast<QComboBox*>(widget) ||
                              qobject_cast<QAbstractButton*>(widget) || qobject_cast<QAbstractItemView*>(widget);
-        if (control && !controls.contains(widget->parentWidget()) && !widget->objectName().startsWith("qt_"))
+        const bool isPart = controls.contains(widget->parentWidget()) || widget->window() != page.window();
+        if (control && !isPart && !widget->objectName().startsWith("qt_"))
             controls << widget;
     }
     return controls;

@@ -7,7 +7,6 @@
 #include "grid/lines_view.h"
 
 #include <QApplication>
-#include <QHeaderView>
 #include <QLabel>
 #include <QSplitter>
 #include <QUndoStack>
@@ -29,18 +28,35 @@ CTablesView::~CTablesView()
 void CTablesView::MakeContent(QWidget& picture, int pictureWidth, int tablesWidth, const char* mainName,
                               const char* partsName)
 {
-    auto* splitter = new QSplitter(Qt::Horizontal, this);
-    auto* side = new QSplitter(Qt::Vertical);
-    m_main = AddTable(*side, mainName);
-    m_parts = AddTable(*side, partsName);
+    m_splitter = new QSplitter(Qt::Horizontal, this);
+    m_side = new QSplitter(Qt::Vertical);
+    m_sizes = {pictureWidth, tablesWidth};
+    m_main = AddTable(*m_side, mainName);
+    m_parts = AddTable(*m_side, partsName);
     m_lines = m_main.grid;
-    splitter->addWidget(&picture);
-    splitter->addWidget(side);
-    splitter->setStretchFactor(0, pictureWidth); // whatever the window's size
-    splitter->setStretchFactor(1, tablesWidth);
-    splitter->setCollapsible(0, false);
-    splitter->setSizes({pictureWidth, tablesWidth});
-    SetContent(splitter);
+    m_splitter->addWidget(&picture);
+    m_splitter->addWidget(m_side);
+    m_splitter->setStretchFactor(0, pictureWidth); // whatever the window's size
+    m_splitter->setStretchFactor(1, tablesWidth);
+    m_splitter->setCollapsible(0, false);
+    m_splitter->setSizes(m_sizes);
+    SetContent(m_splitter);
+}
+
+/// In a narrow window the tables stand below the picture, beside each other: it would have no width left.
+void CTablesView::resizeEvent(QResizeEvent* event)
+{
+    CKsProjectView::resizeEvent(event);
+    if (!m_splitter)
+        return;
+    constexpr int letters = 100; // a picture and two columns of a table
+    const bool isNarrow = width() < letters * fontMetrics().averageCharWidth();
+    if (isNarrow == (m_splitter->orientation() == Qt::Vertical))
+        return;
+    m_splitter->setOrientation(isNarrow ? Qt::Vertical : Qt::Horizontal);
+    m_side->setOrientation(isNarrow ? Qt::Horizontal : Qt::Vertical);
+    m_splitter->setSizes(m_sizes);
+    m_side->setSizes({1, 1});
 }
 
 CTablesView::Table CTablesView::AddTable(QSplitter& side, const char* name)
@@ -48,8 +64,7 @@ CTablesView::Table CTablesView::AddTable(QSplitter& side, const char* name)
     auto* table = new CGenGrid;
     table->setObjectName(QString::fromLatin1(name));
     table->SetHost(this);
-    table->horizontalHeader()->setStretchLastSection(true);
-    constexpr int least = 36; // letters, row numbers included: two columns are in sight beside the smallest picture
+    constexpr int least = 31; // letters, row numbers included: two columns are in sight beside the smallest picture
     table->setMinimumWidth(least * table->fontMetrics().averageCharWidth());
     table->SetLineChoice(LineChoice::LinesOfCells);
     auto* title = new QLabel;

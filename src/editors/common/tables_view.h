@@ -81,6 +81,7 @@ protected:
     CString PlaceText() const override { return m_lines ? m_lines->LineText() : CString(); }
     CString SelectionText() const override { return m_lines ? m_lines->SelectionText() : CString(); }
     void changeEvent(QEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
     virtual void Retranslate() = 0;
 
 private:
@@ -91,6 +92,9 @@ private:
     Answer CommonAnswerTo(WPARAM request);
 
     std::vector<CGenGrid*> m_tables;
+    QSplitter* m_splitter = nullptr; // of picture and tables
+    QSplitter* m_side = nullptr;     // of the tables
+    QList<int> m_sizes;              // of picture and tables, as shares
     Table m_main, m_parts;
     int m_partsOf = -1; // the line whose parts are shown
     CGenGrid* m_lines = nullptr;

@@ -15,8 +15,17 @@ void Refuse(QLineEdit& edit, const CString& message)
 
 } // namespace
 
+QSize KsNumberFieldSize(const QLineEdit& field)
+{
+    constexpr int beside = 16; // frame and margins
+    const int number = field.fontMetrics().horizontalAdvance(QStringLiteral("-1.23456e-05"));
+    return {number + beside, field.minimumSizeHint().height()};
+}
+
 CKsEditLong::CKsEditLong(QWidget* parent) : QLineEdit(parent)
 {
+    setAlignment(Qt::AlignRight);
+    setSizePolicy(QSizePolicy::Maximum, QSizePolicy::Fixed);
     setMaxLength(20); // room for a number that is too large, so that the message can say so
 }
 
@@ -35,9 +44,8 @@ CString CKsEditLong::Complaint() const
     const auto typed = KsReadTypedInteger(text());
     if (!typed.value)
         return typed.complaint.isEmpty() ? tr("Enter an integer.") : typed.complaint;
-    return m_range.Contains(*typed.value)
-               ? CString()
-               : tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high);
+    return m_range.Contains(*typed.value) ? CString()
+                                          : tr("Enter an integer from %1 to %2.").arg(m_range.low).arg(m_range.high);
 }
 
 std::optional<std::int32_t> CKsEditLong::CheckedValue()

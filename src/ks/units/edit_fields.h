@@ -18,6 +18,10 @@ struct CKSinterval
     bool Contains(T value) const { return value >= low && value <= high; }
 };
 
+/// The size of a field for a number, which is the same all over a page: as many digits as are usual fit, and no wide
+/// window makes it longer.
+KS_API QSize KsNumberFieldSize(const QLineEdit& field);
+
 /// A field for a 32-bit integer.
 class KS_API CKsEditLong : public QLineEdit
 {
@@ -32,6 +36,7 @@ public:
     std::optional<std::int32_t> CheckedValue();
     /// Why the text is no integer of the range; empty when it is one.
     CString Complaint() const;
+    QSize sizeHint() const override { return KsNumberFieldSize(*this); }
 
 private:
     CKSinterval<std::int32_t> m_range;

@@ -6,6 +6,7 @@
 #include "ks/units/edit_fields.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/date_time_edit.h"
+#include "pages/framework/field_meaning.h"
 #include "pages/framework/field_tip.h"
 #include "pages/framework/output_matrix.h"
 #include "res/strings.h"
@@ -22,23 +23,47 @@
 
 namespace {
 
-/// A new label in the cell left (-1) or right (1) of the control; null for a control that stands in no cells.
-QLabel* LabelBeside(QWidget& control, int side, const char* name)
+/// Where a control of a grid layout stands; without cells for a control that stands in none.
+struct Cell
+{
+    QGridLayout* cells = nullptr;
+    int row = 0, column = 0, rows = 0, columns = 0;
+};
+
+Cell CellOf(QWidget& control)
 {
     if (!control.parentWidget())
-        return nullptr;
+        return {};
     for (auto* cells : control.parentWidget()->findChildren<QGridLayout*>()) {
         const int index = cells->indexOf(&control);
         if (index < 0)
             continue;
-        int row = 0, column = 0, rows = 0, columns = 0;
-        cells->getItemPosition(index, &row, &column, &rows, &columns);
-        auto* label = new QLabel(control.parentWidget());
-        label->setObjectName(name + control.objectName().section(u'_', -1)); // with the control's number
-        cells->addWidget(label, row, side < 0 ? column - 1 : column + columns);
-        return label;
+        Cell cell{.cells = cells};
+        cells->getItemPosition(index, &cell.row, &cell.column, &cell.rows, &cell.columns);
+        return cell;
     }
-    return nullptr;
+    return {};
+}
+
+/// A new widget in a cell beside the control: that many to the left (negative) or to the right of it. Null for a
+/// control that stands in no cells.
+template <typename W>
+W* AddBeside(QWidget& control, int side, const char* name)
+{
+    const Cell its = CellOf(control);
+    if (!its.cells)
+        return nullptr;
+    auto* beside = new W(control.parentWidget());
+    beside->setObjectName(name + control.objectName().section(u'_', -1)); // with the control's number
+    its.cells->addWidget(beside, its.row, its.column + side + (side < 0 ? 0 : its.columns - 1));
+    return beside;
+}
+
+/// A control takes no more room than it needs, and starts where the others of its column do.
+void PackIntoCell(QWidget& control)
+{
+    if (const Cell its = CellOf(control); its.cells)
+        its.cells->setAlignment(&control, Qt::AlignLeft);
 }
 
 } // namespace
@@ -93,7 +118,7 @@ void CBindings::Always(std::function<void()> rule)
 void CBindings::AddLabel(QWidget* control, const void* value, std::function<Str()> title)
 {
     const TextLine declared = Declaration(value).title;
-    QLabel* label = declared ? LabelBeside(*control, -1, "label_") : nullptr;
+    QLabel* label = declared ? AddBeside<QLabel>(*control, -1, "label_") : nullptr;
     if (!label)
         return;
     label->setBuddy(control);
@@ -103,6 +128,22 @@ void CBindings::AddLabel(QWidget* control, const void* value, std::function<Str(
         const auto* number = qobject_cast<CCtrlEdit*>(control);
         label->setToolTip(ToolTip(value, {}, number ? number->UnitSymbol() : QString()));
         SetAccessibleName(*control, QString::fromStdString(PlainText(label->text().toStdString())));
+    });
+    AddMeaning(control, value);
+}
+
+void CBindings::AddMeaning(QWidget* control, const void* value)
+{
+    constexpr int behindUnit = 2;
+    const TextLine declared = Declaration(value).meaning;
+    auto* meaning = declared && m_tellsMeanings ? AddBeside<CFieldMeaning>(*control, behindUnit, "meaning_") : nullptr;
+    if (!meaning)
+        return;
+    m_beside.emplace(control, meaning);
+    Always([this, control, value, meaning, declared] {
+        meaning->SetText(LoadLine(declared.text, declared.line));
+        const auto* number = qobject_cast<CCtrlEdit*>(control);
+        meaning->setToolTip(ToolTip(value, {}, number ? number->UnitSymbol() : QString()));
     });
 }
 
@@ -143,9 +184,10 @@ void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options
     field->SetToolTipText(
         [this, field, &value](const QString& number) { return ToolTip(&value, number, field->UnitSymbol()); });
     m_typed.push_back(&field->Typing());
+    PackIntoCell(*field);
     AddLabel(field, &value, options.title);
     const bool hasUnit = options.unitText || !field->UnitSymbol().isEmpty();
-    QLabel* unit = hasUnit ? LabelBeside(*field, 1, "unit_") : nullptr;
+    QLabel* unit = hasUnit ? AddBeside<QLabel>(*field, 1, "unit_") : nullptr;
     if (unit)
         m_beside.emplace(field, unit);
     Add(field, &value, [field, unit] {
@@ -157,7 +199,7 @@ void CBindings::Add(CCtrlEdit* field, double& value, const FieldOptions& options
 
 void CBindings::Add(CKsEditLong* field, std::int32_t& value)
 {
-    field->setAlignment(Qt::AlignRight); // as the other numbers
+    PackIntoCell(*field);
     AddTyped(field, &value,
              {.complaint = [field] { return field->Complaint(); },
               .store = [this, field, &value] { Store(value, *field->Value()); },
@@ -227,6 +269,8 @@ void CBindings::Add(QComboBox* box, std::int32_t& index)
 
 void CBindings::Add(QComboBox* box, std::int32_t& index, std::function<void(std::int32_t chosen)> choose)
 {
+    PackIntoCell(*box);
+    box->setSizeAdjustPolicy(QComboBox::AdjustToContents); // of the language, too
     AddLabel(box, &index);
     if (const Str choices = Declaration(&index).choices.text; choices != Str::None) {
         Always([box, choices] {
@@ -284,6 +328,8 @@ void CBindings::Add(std::initializer_list<QRadioButton*> buttons, std::int32_t& 
 
 void CBindings::AddUnbound(QComboBox* box)
 {
+    PackIntoCell(*box);
+    box->setSizeAdjustPolicy(QComboBox::AdjustToContents);
     Add(box, nullptr, [box] { box->setCurrentIndex(0); });
 }
 

@@ -2,8 +2,9 @@
 // user has changed a control, each change being an undo step; nothing is written that nobody changed.
 //
 // A control says what its value is called as the value's declaration does, in the user's language: a check box by its
-// own text, any other by a label in the cell to its left. The unit of a number stands in the cell to its right. Lists
-// and radio buttons have the declared choices. Tool tips tell what the value means, its range and default.
+// own text, any other by a label in the cell to its left. The unit of a number stands in the cell to its right. Fields
+// and lists are as wide as what they hold, whatever the window's width. Lists and radio buttons have the declared
+// choices. Tool tips tell what the value means, its range and default.
 #pragma once
 
 #include "files/field.h"
@@ -43,6 +44,10 @@ class CBindings : public QObject
 {
 public:
     explicit CBindings(CKavo0_hdDoc* document) : m_document(document) {}
+
+    /// Of the values that are added from now on the meaning stands beside the field, behind the unit: there is room for
+    /// it.
+    void TellMeanings(bool tell = true) { m_tellsMeanings = tell; }
 
     // Each value lives in the document, which outlives the page.
     void Add(CCtrlEdit* field, double& value, const FieldOptions& options = {});
@@ -100,6 +105,7 @@ private:
     void AddTyped(QLineEdit* field, const void* value, TypedField what);
     template <typename T>
     void Store(T& target, T value);
+    void AddMeaning(QWidget* control, const void* value);
     void AddLabel(QWidget* control, const void* value, std::function<Str()> title = {});
     void AddRule(std::function<bool()> rule, std::initializer_list<QWidget*> widgets, void (QWidget::*apply)(bool));
 
@@ -115,5 +121,6 @@ private:
     std::vector<Condition> m_conditions;
     // Gives a button's value what a click would give it; called again, what it was.
     std::map<const QObject*, std::function<void()>> m_trials;
-    std::multimap<const QWidget*, QWidget*> m_beside; // label and unit of a control
+    std::multimap<const QWidget*, QWidget*> m_beside; // label, unit and meaning of a control
+    bool m_tellsMeanings = false;
 };

@@ -4,6 +4,7 @@
 #include "grid/bounds.h"
 #include "grid/column_spec.h"
 #include "grid/digits_mark.h"
+#include "ks/units/edit_fields.h"
 #include "res/strings.h"
 
 #include <QPainter>
@@ -26,7 +27,7 @@ CCtrlEdit::CCtrlEdit(QWidget* parent)
                                   .unit = [this] { return UnitSymbol(); }}))
 {
     setAlignment(Qt::AlignRight);
-    setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed); // a number needs no more room in a wide window
+    setSizePolicy(QSizePolicy::Maximum, QSizePolicy::Fixed);
 }
 
 void CCtrlEdit::Setup(const double& value, const Field& declared, std::function<void(double value)> store)
@@ -81,6 +82,11 @@ QSize CCtrlEdit::minimumSizeHint() const
 {
     const int number = fontMetrics().horizontalAdvance(QStringLiteral("0.031125"));
     return {number + WidthBeside(), QLineEdit::minimumSizeHint().height()};
+}
+
+QSize CCtrlEdit::sizeHint() const
+{
+    return KsNumberFieldSize(*this);
 }
 
 QString CCtrlEdit::FullText() const

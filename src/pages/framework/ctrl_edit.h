@@ -34,6 +34,7 @@ public:
     QString FullText() const;
     /// Room for a small number: "0.031125".
     QSize minimumSizeHint() const override;
+    QSize sizeHint() const override;
 
 protected:
     void paintEvent(QPaintEvent* event) override;

@@ -1,6 +1,7 @@
 #include "pages/framework/location_page.h"
 
 #include "document/list_rows.h"
+#include "grid/grid_widths.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/wnd_resizer.h"
 #include "ks/language/language.h"
@@ -83,6 +84,14 @@ GridColumns CLocationPage::AddPart(CGenGrid* grid, std::shared_ptr<IRowSource> r
     grid->Model()->SetSource(*GetDocument(), std::move(rows));
     m_parts.push_back({grid, std::move(rowsOfLine)});
     return GridColumns(*grid);
+}
+
+/// Pairs stand beside what they belong to.
+GridColumns CLocationPage::AddPairs(CGenGrid* grid, std::shared_ptr<IRowSource> rows, RowsOfLine rowsOfLine)
+{
+    GridColumns columns = AddPart(grid, std::move(rows), std::move(rowsOfLine));
+    grid->Widths().KeepGridAsWide();
+    return columns;
 }
 
 std::size_t CLocationPage::RowOf(const CGenList& list, const HD_RiverPos& record)

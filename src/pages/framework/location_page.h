@@ -56,7 +56,7 @@ protected:
     template <typename T>
     GridColumns PairsGrid(CGenGrid* grid, std::vector<T>& pairs)
     {
-        return AddPart(grid, std::make_shared<VectorRows<T>>(pairs), {});
+        return AddPairs(grid, std::make_shared<VectorRows<T>>(pairs), {});
     }
     /// Likewise, for a list that always shows a row: one with the defaults when it is empty.
     template <typename T>
@@ -72,7 +72,7 @@ protected:
     template <typename Record, typename T>
     GridColumns PairsGrid(CGenGrid* grid, std::vector<T> Record::*pairs)
     {
-        return AddPart(grid, nullptr, [this, pairs](HD_RiverPos& record) {
+        return AddPairs(grid, nullptr, [this, pairs](HD_RiverPos& record) {
             const VectorOwner owner{m_list, [list = m_list, &record] { return RowOf(*list, record); }};
             return std::make_shared<VectorRows<T>>(static_cast<Record&>(record).*pairs, owner);
         });
@@ -103,6 +103,7 @@ private:
 
     static std::size_t RowOf(const CGenList& list, const HD_RiverPos& record);
     GridColumns AddPart(CGenGrid* grid, std::shared_ptr<IRowSource> rows, RowsOfLine rowsOfLine);
+    GridColumns AddPairs(CGenGrid* grid, std::shared_ptr<IRowSource> rows, RowsOfLine rowsOfLine);
     HD_RiverPos* CurrentRecord() const;
     void ShowParts();
     void Store(BlankRule rule);

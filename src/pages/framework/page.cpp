@@ -12,6 +12,7 @@
 #include <QComboBox>
 #include <QGroupBox>
 #include <QKeyEvent>
+#include <QLayout>
 #include <QScrollArea>
 #include <QUndoStack>
 #include <QWhatsThis>
@@ -225,9 +226,7 @@ QString CGenPropertyPage::OverridesText(const QWidget& field) const
             const double* const global = model.Column(column).fill;
             if (!global || m_bindings.ControlFor(global) != &field || model.LineCount() == 0)
                 continue;
-            return tr("%1 of %2 lines have another value")
-                .arg(model.OverrideCount(column))
-                .arg(model.LineCount());
+            return tr("%1 of %2 lines have another value").arg(model.OverrideCount(column)).arg(model.LineCount());
         }
     }
     return {};
@@ -286,6 +285,12 @@ bool CGenPropertyPage::event(QEvent* event)
             button->installEventFilter(this);
         for (auto* list : findChildren<QComboBox*>())
             list->installEventFilter(this);
+        constexpr int air = 5; // above and below what a group holds: groups stand within groups
+        for (const auto* group : findChildren<QGroupBox*>())
+            if (QLayout* inside = group->layout()) {
+                const QMargins margins = inside->contentsMargins();
+                inside->setContentsMargins(margins.left(), air, margins.right(), air);
+            }
     }
     return QWidget::event(event);
 }

@@ -1,0 +1,24 @@
+// What a value means, in words beside its field: on pages that have the room for it.
+#pragma once
+
+#include <QWidget>
+
+/// Shows as much of the text as its width and the height of its row have room for. The tool tip of the field has all
+/// of it.
+class CFieldMeaning : public QWidget
+{
+    Q_OBJECT
+public:
+    using QWidget::QWidget;
+    void SetText(const QString& text);
+    const QString& Text() const { return m_text; }
+    QSize sizeHint() const override;
+    QSize minimumSizeHint() const override;
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void changeEvent(QEvent* event) override;
+
+private:
+    QString m_text;
+};
