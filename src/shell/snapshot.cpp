@@ -37,6 +37,7 @@ CSnapshot::CSnapshot(CKsDoc& document, CRecoveryFolder& folder, std::chrono::mil
     connect(&m_timer, &QTimer::timeout, this, &CSnapshot::Write);
     connect(&document.UndoStack(), &QUndoStack::indexChanged, this, &CSnapshot::StepMade);
     connect(&document, &CKsDoc::TitleChanged, this, &CSnapshot::StateChanged);
+    connect(&document, &CKsDoc::FileGoneChanged, this, &CSnapshot::StateChanged);
 }
 
 CSnapshot::~CSnapshot()
@@ -61,7 +62,7 @@ void CSnapshot::Continue(const QString& file)
 
 void CSnapshot::StepMade()
 {
-    if (m_document.UndoStack().isClean())
+    if (m_document.UndoStack().isClean() && !m_document.IsFileGone())
         return;
     if (++m_steps >= Steps && !m_failure)
         Write();
@@ -71,8 +72,14 @@ void CSnapshot::StepMade()
 
 void CSnapshot::StateChanged()
 {
-    if (!m_document.IsModified())
-        Drop();
+    if (!m_document.IsUnsaved())
+        return Drop();
+    // A file that is gone makes what is shown one more state that has to be kept, though nobody has made a step.
+    const bool isKept = !m_file.isEmpty() && !m_isDropped;
+    if (m_document.IsFileGone() && !isKept && !m_timer.isActive()) {
+        ++m_steps;
+        m_timer.start(m_delay);
+    }
 }
 
 void CSnapshot::Write()

@@ -14,7 +14,7 @@ class CKsDoc;
 class CRecoveryFolder;
 class QSocketNotifier;
 
-/// Keeps one document's content in a recovery file while it is modified. A copy of the process writes the file, so that
+/// Keeps one document's content in a recovery file while it is unsaved. A copy of the process writes the file, so that
 /// the user does not wait. The file goes when nothing is left to save, and with this.
 class CSnapshot : public QObject
 {

@@ -176,6 +176,48 @@ TEST_F(RecoveryTest, WhatIsKeptGoesWithASaveAnUndoAndAClose)
     EXPECT_TRUE(QDir(Folder()).isEmpty());
 }
 
+TEST_F(RecoveryTest, WhatIsShownOfAFileThatIsGoneIsKeptAndAskedFor)
+{
+    const QString river = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.");
+    const auto comes = [](const auto& what) { return QTest::qWaitFor(what); };
+    for (const QString& path :
+         {Write("a.HDKV", HDText), Write("a.kvnw", Content(river + "kvnw")), Write("a.kvxs", Content(river + "kvxs"))}) {
+        SCOPED_TRACE(path.toStdString());
+        CKsDoc* document = Open(path);
+        const std::string shown = TextOf(document);
+        const QByteArray content = Content(path);
+        const auto lose = [&] {
+            QFile::remove(path);
+            EXPECT_TRUE(comes([&] { return document->IsFileGone(); })) << "the watch sees it";
+            EXPECT_TRUE(IsKept(document)) << "nobody has changed it, and it is nowhere else";
+            EXPECT_FALSE(document->IsModified());
+        };
+        lose();
+        EXPECT_TRUE(Content(frame->Snapshots().Of(document)->File()).endsWith(QByteArray::fromStdString(shown)));
+        EXPECT_EQ(Write(QFileInfo(path).fileName(), content), path);
+        EXPECT_TRUE(comes([&] { return !document->IsFileGone() && Kept().isEmpty(); })) << "it is there again";
+        lose();
+        answers = {QMessageBox::Cancel};
+        EXPECT_EQ(document->AskToClose(), KsClosing::Keep);
+        EXPECT_TRUE(asked.takeFirst().contains("was removed or renamed"));
+        // A step, and back to what the file held: the state before the step is what has to be kept.
+        document->TakeContent(shown, "A change");
+        document->UndoStack().undo();
+        EXPECT_TRUE(IsKept(document));
+        answers = {QMessageBox::Save};
+        EXPECT_TRUE(document->SaveModified());
+        EXPECT_NE(Content(path), "(no file)");
+        EXPECT_TRUE(comes([] { return Kept().isEmpty(); }));
+        lose();
+        answers = {QMessageBox::Discard};
+        asked.clear();
+        Action("actionClose")->trigger();
+        Settle();
+        EXPECT_EQ(asked.size(), 1);
+        EXPECT_TRUE(comes([] { return Kept().isEmpty(); })) << "discarded";
+    }
+}
+
 TEST_F(RecoveryTest, EveryKindOfDocumentComesBackModifiedAndUndoable)
 {
     const QString river = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.");

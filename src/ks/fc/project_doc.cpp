@@ -56,6 +56,12 @@ void CKsProjectDoc::FileIsKnown()
     emit FileStateChanged();
 }
 
+/// Who reads only has nothing to lose: what is shown is somebody else's, or nobody's.
+bool CKsProjectDoc::IsFileGone() const
+{
+    return m_outside->Sight().kind == KsFileSight::Gone && !IsReadOnly();
+}
+
 bool CKsProjectDoc::SaveOverOthers()
 {
     m_file.MayReplaceOthers(true);
@@ -104,6 +110,7 @@ void CKsProjectDoc::EditUnreadable()
 void CKsProjectDoc::ReadOnlyChanged()
 {
     emit FileStateChanged();
+    emit FileGoneChanged(); // of a file that is read only that is no matter
     if (!IsExecuting())
         UpdateAllViews(nullptr, ReloadHint);
 }

@@ -94,6 +94,12 @@ Parameter</source>
         <source>Redone: %1</source>
         <translation>やり直しました: %1</translation>
     </message>
+    <message>
+        <source>%1 was removed or renamed by another program. What is shown is nowhere else, and is lost unless it is saved.
+Save it again?</source>
+        <translation>%1 はほかのプログラムによって削除または名前変更されました。表示されている内容はほかのどこにもなく、保存しないと失われます。
+もう一度保存しますか?</translation>
+    </message>
 </context>
 <context>
     <name>CKsDocumentFile</name>
