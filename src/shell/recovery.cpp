@@ -1,6 +1,8 @@
 #include "shell/recovery.h"
 
+#include "ks/fc/dialog_turn.h"
 #include "ks/fc/doc_template.h"
+#include "ks/fc/findings_dialog.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
 #include "shell/plugin_loader.h"
@@ -48,8 +50,18 @@ QString CRecoverable::Name() const
 void CRecovery::Offer()
 {
     std::vector<CRecoverable> found = Find();
-    if (!found.empty())
-        (new CRecoveryDialog(*this, std::move(found), &m_frame))->open();
+    if (found.empty())
+        return;
+    // It comes first: what it opens has lists of its own to show.
+    QList<CKsFindingsDialog*> lists = m_frame.findChildren<CKsFindingsDialog*>();
+    lists.removeIf([](const CKsFindingsDialog* list) { return !list->isVisible(); });
+    for (CKsFindingsDialog* list : lists)
+        list->hide();
+    auto* dialog = new CRecoveryDialog(*this, std::move(found), &m_frame);
+    dialog->setWindowModality(Qt::WindowModal);
+    KsShowInTurn(dialog);
+    for (CKsFindingsDialog* list : lists)
+        KsShowInTurn(list);
 }
 
 std::vector<CRecoverable> CRecovery::Find()

@@ -1,6 +1,7 @@
 """The program is killed and started again: what was typed comes back."""
 import glob
 import os
+import time
 
 import samples
 from case import Case
@@ -150,6 +151,23 @@ class Recovery(Case):
         self.wait_until_kept('moor.HDKV', '2.75')
         wait_for(lambda: not editor.frame.all('label', notice), 'the notice goes')
         self.assert_no_message()
+
+    def test_a_list_of_what_was_not_taken_comes_after_it(self):
+        text = samples.hd_text({'InitList': ['"MOORBECK", 100, 1.25, 10.5', '"MOORBECK", 200, "high", 10.5']})
+        editor = self.open(text)
+        editor.box()
+        editor.press('Escape')  # the list
+        editor.put(1, 3, '2.625')
+        self.wait_until_kept('moor.HDKV', '2.625')
+        for answer in ('Escape', 'alt+o'):  # Later; Open
+            editor = self.restart('moor.HDKV')
+            time.sleep(1)
+            self.assertEqual(editor.box().name, 'Recover Changes', 'alone')
+            editor.press(answer)
+            wait_for(lambda: editor.box().name == 'Values Not Taken as They Stand', 'the list comes, with the keyboard')
+            editor.press('Escape')
+            self.assert_no_message()
+        wait_for(lambda: editor.table().cell(1, 3).name == '2.625', 'it was opened')
 
     def test_a_clean_end_leaves_nothing(self):
         editor = self.open()

@@ -87,6 +87,11 @@ protected:
     /// The program ends as in a crash, and starts anew: what was kept stands in a folder that nobody holds.
     std::vector<CRecoverable> Crash()
     {
+        CrashUnseen();
+        return Find();
+    }
+    void CrashUnseen()
+    {
         const QString left = Folder() + "/" + QString::number(++m_crashes);
         QDir().mkpath(left);
         for (const QString& file : Kept())
@@ -96,7 +101,6 @@ protected:
                 document->SetModifiedFlag(false);
         Restart();
         frame->Snapshots().SetDelay(10ms);
-        return Find();
     }
     /// What can be recovered, looked at.
     std::vector<CRecoverable> Find()
@@ -265,6 +269,42 @@ TEST_F(RecoveryTest, EveryKindOfDocumentComesBackModifiedAndUndoable)
         EXPECT_EQ(TextOf(document), texts[which].second);
     }
     EXPECT_TRUE(asked.isEmpty());
+}
+
+TEST_F(RecoveryTest, ListsOfWhatWasNotTakenWaitUntilTheDialogIsDone)
+{
+    const QString path = Write("a.HDKV", QByteArray(HDText).replace("100, 2.5, 30", "100, \"high\", 30"));
+    Change(Open(path), "1.5", "2.5");
+    ASSERT_TRUE(IsKept(frame->ActiveDocument()));
+    for (const bool isListFirst : {true, false}) {
+        CrashUnseen();
+        ASSERT_TRUE(frame->OpenFile(path));
+        const auto dialogs = [&] {
+            QStringList shown;
+            for (const auto* each : frame->findChildren<QDialog*>())
+                if (each->isVisible())
+                    shown << each->metaObject()->className();
+            return shown;
+        };
+        const QStringList list("CKsFindingsDialog"), recovery("CRecoveryDialog");
+        const auto isShown = [&](const QStringList& what) {
+            return QTest::qWaitFor([&] {
+                const auto* active = QApplication::activeWindow();
+                return dialogs() == what && active && what.front() == active->metaObject()->className();
+            });
+        };
+        if (isListFirst) {
+            EXPECT_TRUE(isShown(list));
+        }
+        frame->OfferRecovery();
+        EXPECT_TRUE(isShown(recovery));
+        QTest::qWait(600); // the list would have come by now
+        EXPECT_TRUE(isShown(recovery));
+        QTest::keyClick(QApplication::activeWindow(), Qt::Key_Escape);
+        EXPECT_TRUE(isShown(list));
+        QTest::keyClick(QApplication::activeWindow(), Qt::Key_Escape);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return dialogs().isEmpty(); }));
+    }
 }
 
 TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
