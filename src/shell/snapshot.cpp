@@ -176,7 +176,8 @@ void CSnapshot::SetFailure(std::error_code why)
         emit FailureChanged();
 }
 
-/// Nothing is left to save, or nobody wants it. The end of a writer is not waited for: the system takes its time for it.
+/// Nothing is left to save, or nobody wants it. The end of a writer is not waited for: the system takes its time for
+/// it.
 void CSnapshot::Drop()
 {
     m_timer.stop();

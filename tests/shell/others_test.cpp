@@ -65,6 +65,56 @@ TEST_F(OthersTest, AFileIsTakenOverWhenNobodyHasIt)
     EXPECT_TRUE(Shows(document, "2.5"));
 }
 
+TEST_F(OthersTest, NoLockOfTheProgramsOwnKeepsItFromAFile)
+{
+    CKsProjectDoc& moved = *Open(Write("p/a.HDKV", TextWith("1.5")));
+    CKsProjectDoc& left = *Open(Write("p/b.HDKV", TextWith("1.5")));
+    const auto rename = [this](const char* from, const char* to) { EXPECT_TRUE(QDir().rename(Path(from), Path(to))); };
+    rename("p", "q");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return moved.IsFileGone() && left.IsFileGone(); }));
+    names = {Path("q/a.HDKV")};
+    answers = {QMessageBox::Yes}; // it exists
+    EXPECT_TRUE(moved.DoSave({})) << asked.join('\n').toStdString();
+    EXPECT_EQ(moved.GetPathName(), Path("q/a.HDKV"));
+    EXPECT_TRUE(FileLock::Try(Path("q/a.HDKV").toStdString(), "other").HeldBy());
+    CKsProjectDoc& opened = *Open(Path("q/b.HDKV"));
+    EXPECT_NE(&opened, &left);
+    EXPECT_FALSE(opened.IsInUse()) << "by a window whose file is not there any more";
+    EXPECT_FALSE(left.IsInUse());
+    EXPECT_TRUE(FileLock::Try(Path("q/b.HDKV").toStdString(), "other").HeldBy());
+    rename("q", "p");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !left.IsFileGone() && opened.IsFileGone(); }));
+    // At the next look the lock is that of the window whose file it is again.
+    QTest::qWait(2500);
+    answers = {QMessageBox::Discard};
+    Action("actionClose")->trigger();
+    Settle();
+    EXPECT_NE(frame->ActiveDocument(), &opened);
+    EXPECT_TRUE(FileLock::Try(Path("p/b.HDKV").toStdString(), "other").HeldBy());
+}
+
+TEST_F(OthersTest, ALockThatSomebodyRemovedIsTakenAgain)
+{
+    const QString path = Write("a.HDKV", TextWith("1.5"));
+    CKsProjectDoc& document = *Open(path);
+    const auto remove = [&] { EXPECT_TRUE(QFile::remove(Path(".a.hdkv.lock"))); };
+    remove();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return QFile::exists(Path(".a.hdkv.lock")); }));
+    EXPECT_TRUE(FileLock::Try(path.toStdString(), "other").HeldBy());
+    EXPECT_TRUE(document.Notices().empty());
+    remove();
+    FileLock theirs = FileLock::Try(path.toStdString(), "kvrshell");
+    ASSERT_TRUE(theirs.IsHeld());
+    EXPECT_TRUE(QTest::qWaitFor([&] { return IsTold(document, "the lock that kept others out was removed"); }));
+    EXPECT_FALSE(document.IsReadOnly()) << "what is typed here is typed";
+    answers = {QMessageBox::No};
+    EXPECT_FALSE(document.DoSave(path));
+    EXPECT_THAT(asked.join(""), testing::Truly([](const QString& text) { return text.contains("is in use by"); }));
+    theirs.Release();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return document.Notices().empty(); }));
+    EXPECT_TRUE(FileLock::Try(path.toStdString(), "other").HeldBy());
+}
+
 TEST_F(OthersTest, ANoticeThatWasClosedComesBackWithTheNextChange)
 {
     CKsProjectDoc& document = *Open(Write("a.HDKV", TextWith("1.5")));

@@ -184,8 +184,8 @@ TEST_F(RecoveryTest, WhatIsShownOfAFileThatIsGoneIsKeptAndAskedFor)
 {
     const QString river = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.");
     const auto comes = [](const auto& what) { return QTest::qWaitFor(what); };
-    for (const QString& path :
-         {Write("a.HDKV", HDText), Write("a.kvnw", Content(river + "kvnw")), Write("a.kvxs", Content(river + "kvxs"))}) {
+    for (const QString& path : {Write("a.HDKV", HDText), Write("a.kvnw", Content(river + "kvnw")),
+                                Write("a.kvxs", Content(river + "kvxs"))}) {
         SCOPED_TRACE(path.toStdString());
         CKsDoc* document = Open(path);
         const std::string shown = TextOf(document);

@@ -48,6 +48,11 @@ void CKsProjectDoc::UseNotice(std::vector<KsFileNotice>& notices)
         notices.push_back({CKsFileBar::tr("%1 is in use by %2. Here it can be looked at and copied, not changed.")
                                .arg(name, m_use.Holder()),
                            {copy}});
+    } else if (const CString rival = m_use.Rival(); !rival.isEmpty()) {
+        notices.push_back({CKsFileBar::tr("%1 is in use by %2, too: the lock that kept others out was removed. Here it "
+                                          "can be saved when he has let go of it, or under another name.")
+                               .arg(name, rival),
+                           {copy}});
     } else if (m_use.WhyNone() && !m_isUseClosed) {
         notices.push_back(
             {CKsFileBar::tr("Other programs cannot be told that %1 is in use here: %2. Nobody else should "

@@ -14,6 +14,7 @@ CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind), m_outside(new CKsOutsideC
 {
     connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
     connect(&m_use, &CKsFileUse::Changed, this, &CKsProjectDoc::ReadOnlyChanged);
+    connect(&m_use, &CKsFileUse::LockLost, this, &CKsProjectDoc::FileStateChanged);
 }
 
 void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load)

@@ -300,6 +300,10 @@ Save?</source>
         <source>Other programs cannot be told that %1 is in use here: %2. Nobody else should change it now.</source>
         <translation>%1 をここで使用中であることを他のプログラムに知らせることができません: %2。今は他の人が変更しないようにしてください。</translation>
     </message>
+    <message>
+        <source>%1 is in use by %2, too: the lock that kept others out was removed. Here it can be saved when he has let go of it, or under another name.</source>
+        <translation>%1 は %2 によっても使用中です: ほかの人を締め出していたロックが削除されました。ここでは、相手が手放したあと、または別の名前で保存できます。</translation>
+    </message>
 </context>
 <context>
     <name>CKsFileUse</name>
