@@ -27,6 +27,14 @@ CRecoverable::State StateOf(const CRecoveryHeader& header)
     return isSame ? CRecoverable::Same : CRecoverable::Changed;
 }
 
+/// The program ended in the middle of the save: what was kept is what the file holds, byte for byte.
+bool IsSaved(const CRecoveryHeader& header)
+{
+    const QFileInfo file(header.path);
+    return !header.path.isEmpty() && header.typed.isEmpty() && file.isFile() && file.size() == header.contentSize &&
+           FileHash(header.path) == header.contentHash;
+}
+
 /// Of a document that stands beside its file; files of one name in two folders are told apart by a number.
 QString FreeTitle(const QString& name)
 {
@@ -68,8 +76,13 @@ std::vector<CRecoverable> CRecovery::Find()
 {
     std::vector<CRecoverable> found;
     for (const QString& file : m_folder.TakeOver()) {
+        const auto header = ReadRecoveryHeader(file);
+        if (header && IsSaved(*header)) {
+            QFile::remove(file);
+            continue;
+        }
         CRecoverable& item = found.emplace_back(CRecoverable{.file = file});
-        if (const auto header = ReadRecoveryHeader(file)) {
+        if (header) {
             item.header = *header;
             item.editor = m_plugins.TemplateFor(QStringLiteral("x") + header->extension);
         } else {
@@ -113,6 +126,7 @@ bool CRecovery::Open(const CRecoverable& item)
                          .arg(item.Name()));
         return false;
     }
+    document->TakeDateOfFile(item.header.dateOfFile); // one that was open had its own
     if (isBeside && !item.header.path.isEmpty()) {
         document->StandBeside(item.header.path);
         document->SetTitle(FreeTitle(QFileInfo(item.header.path).completeBaseName()));

@@ -9,6 +9,7 @@
 #include <QLabel>
 #include <QPushButton>
 #include <QRegularExpression>
+#include <QTableView>
 #include <QTableWidget>
 #include <sys/resource.h>
 #include <sys/stat.h>
@@ -220,6 +221,57 @@ TEST_F(RecoveryTest, WhatIsShownOfAFileThatIsGoneIsKeptAndAskedFor)
         EXPECT_EQ(asked.size(), 1);
         EXPECT_TRUE(comes([] { return Kept().isEmpty(); })) << "discarded";
     }
+}
+
+TEST_F(RecoveryTest, WhatStandsInAnOpenCellOrFieldIsKept)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    QTest::qWait(50);
+    QLineEdit* field = nullptr;
+    for (auto* each : frame->findChildren<QLineEdit*>())
+        if (each->isVisible() && each->text() == "1.5")
+            field = each;
+    ASSERT_TRUE(field);
+    field->setFocus();
+    const auto isKept = [](const char* text) {
+        return QTest::qWaitFor([&] {
+            const QStringList kept = Kept();
+            return kept.size() == 1 && Content(kept.front()).contains(text);
+        });
+    };
+    const auto type = [](const char* text) {
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_A, Qt::ControlModifier);
+        QTest::keyClicks(QApplication::focusWidget(), text);
+    };
+    type("7.25");
+    EXPECT_TRUE(isKept("G_waterlevel = 7.25"));
+    EXPECT_TRUE(field->hasFocus() && field->text() == "7.25" && !document->IsModified()) << "and nobody is disturbed";
+    EXPECT_EQ(document->UndoStack().count(), 0);
+    type("7.25.1");
+    EXPECT_TRUE(isKept(": 7.25.1\"]"));
+    EXPECT_TRUE(isKept("G_waterlevel = 1.5")) << "what is no value is kept as a text";
+    QTest::keyClick(field, Qt::Key_Escape);
+    EXPECT_TRUE(QTest::qWaitFor([] { return Kept().isEmpty(); })) << "it was taken back";
+
+    QTableView* table = nullptr;
+    for (auto* each : frame->findChildren<QTableView*>())
+        if (each->isVisible())
+            table = each;
+    ASSERT_TRUE(table);
+    table->setCurrentIndex(table->model()->index(0, 2));
+    table->setFocus();
+    QTest::keyClick(table, Qt::Key_F2);
+    ASSERT_NE(QApplication::focusWidget(), table);
+    type("8.75");
+    EXPECT_TRUE(isKept("\"MAIN\", 100, 8.75, 30"));
+    EXPECT_NE(QApplication::focusWidget(), table) << "the cell is open";
+    const auto found = Crash();
+    ASSERT_EQ(found.size(), 1u);
+    EXPECT_TRUE(frame->Recovery().Open(found.front()));
+    document = frame->ActiveDocument();
+    EXPECT_NE(TextOf(document).find("\"MAIN\", 100, 8.75, 30"), std::string::npos);
+    document->UndoStack().undo();
+    EXPECT_NE(TextOf(document).find("\"MAIN\", 100, 2.5, 30"), std::string::npos);
 }
 
 TEST_F(RecoveryTest, EveryKindOfDocumentComesBackModifiedAndUndoable)
@@ -552,6 +604,68 @@ TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
     EXPECT_TRUE(QDir(folder.path()).isEmpty());
     QFile::remove(Folder());
     QDir().rename(Folder() + "-aside", Folder());
+}
+
+TEST_F(RecoveryTest, ASaveThatWasDoneLeavesNothingToRecover)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    Change(document, "1.5", "2.5");
+    ASSERT_TRUE(IsKept(document));
+    // Killed behind the swap, before what was kept could go.
+    Write("a.HDKV", QByteArray::fromStdString(TextOf(document)));
+    EXPECT_TRUE(Crash().empty());
+    document = Open(Path("a.HDKV"));
+    Change(document, "2.5", "3.5");
+    ASSERT_TRUE(IsKept(document));
+    Write("a.HDKV", QByteArray::fromStdString(TextOf(document)).replace("3.5", "4.5"));
+    EXPECT_EQ(Crash().size(), 1u) << "as long, and another";
+}
+
+TEST_F(RecoveryTest, DatesThatAFileLacksAreNoChangeHoweverOftenItIsRecovered)
+{
+    const QString path = Write("a.HDKV", QByteArray(HDText).replace("LimitedPeriod", "OtherPeriod"));
+    Change(Open(path), "1.5", "2.5");
+    for (int crash = 0; crash < 2; ++crash) {
+        ASSERT_TRUE(IsKept(frame->ActiveDocument()));
+        QTest::qSleep(1000); // dates count seconds
+        CrashUnseen();
+        Open(path); // which the start was asked for, and takes the time of now
+        const auto found = Find();
+        ASSERT_EQ(found.size(), 1u);
+        const auto differences = frame->Recovery().Compare(found.front());
+        ASSERT_TRUE(differences && !differences->list.empty());
+        EXPECT_EQ(differences->list.size(), 1u) << differences->list.back().keyword;
+        EXPECT_TRUE(frame->Recovery().Open(found.front()));
+        const std::string level = crash == 0 ? "2.5" : "9.5";
+        Change(frame->ActiveDocument(), "G_waterlevel = " + level, "G_waterlevel = 9.5");
+        QTest::qWait(50);
+    }
+}
+
+TEST_F(RecoveryTest, FilesOfOneNameAreToldWithTheirFolders)
+{
+    for (const char* name : {"a/river.HDKV", "b/river.HDKV", "b/other.HDKV"}) {
+        CKsDoc* document = Open(Write(name, HDText));
+        Change(document, "1.5", "2.5");
+        ASSERT_TRUE(IsKept(document));
+    }
+    CrashUnseen();
+    frame->OfferRecovery();
+    auto* dialog = frame->findChild<CRecoveryDialog*>();
+    ASSERT_TRUE(dialog);
+    auto* table = dialog->findChild<QTableWidget*>();
+    ASSERT_EQ(table->rowCount(), 3);
+    const auto name = [&](int row) { return table->item(row, 0)->text(); };
+    EXPECT_EQ(name(0), "other.HDKV");
+    EXPECT_EQ(name(1), "river.HDKV in " + Path("b"));
+    EXPECT_EQ(name(2), "river.HDKV in " + Path("a"));
+    table->setCurrentCell(2, 0);
+    answers = {QMessageBox::Cancel};
+    for (auto* button : dialog->findChildren<QPushButton*>())
+        if (button->text() == "&Discard")
+            button->click();
+    EXPECT_THAT(asked, testing::ElementsAre("Discard the changes to river.HDKV in " + Path("a") +
+                                            "? They cannot be brought back."));
 }
 
 TEST_F(RecoveryTest, TheDialogSaysWhatDiffersAndDoesWhatIsChosen)

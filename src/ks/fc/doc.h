@@ -132,6 +132,12 @@ public:
     /// What stands in the document for dates that its file lacked: the time when it was made, unless CKsDatesOfFiles
     /// say another.
     const HDDateTime& DateOfFile() const { return m_dateOfFile; }
+    /// The content has come from a document of this date; one that is not set is none.
+    void TakeDateOfFile(const HDDateTime& date)
+    {
+        if (date.IsValid())
+            m_dateOfFile = date;
+    }
 
     /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
     /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the

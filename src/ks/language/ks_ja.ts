@@ -205,6 +205,10 @@ Save?</source>
         <source>%1 is now %2</source>
         <translation>%1 は %2 になりました</translation>
     </message>
+    <message>
+        <source>A save of %1 was cut off. What another program may have written to it just before is kept in %2.</source>
+        <translation>%1 の保存が途中で打ち切られました。その直前にほかのプログラムが書き込んだ可能性のある内容は %2 に残されています。</translation>
+    </message>
 </context>
 <context>
     <name>CKsEditLong</name>
