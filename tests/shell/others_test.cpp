@@ -1,5 +1,6 @@
 // What other programs do to an open file, as the bar tells it: who has it, and that it is another.
 #include "files/file_lock.h"
+#include "files/temporary_file.h"
 #include "ks/fc/file_bar.h"
 #include "ks/fc/project_doc.h"
 #include "shell_fixture.h"
@@ -113,6 +114,28 @@ TEST_F(OthersTest, ALockThatSomebodyRemovedIsTakenAgain)
     theirs.Release();
     EXPECT_TRUE(QTest::qWaitFor([&] { return document.Notices().empty(); }));
     EXPECT_TRUE(FileLock::Try(path.toStdString(), "other").HeldBy());
+}
+
+TEST_F(OthersTest, WhatASaveThatWasCutOffDisplacedIsToldWhenTheFileIsOpened)
+{
+    const QString path = Write("a.HDKV", TextWith("1.5"));
+    const QByteArray theirs = TextWith("2.5");
+    {
+        TemporaryFile left(PlatformFile::Native());
+        ASSERT_FALSE(left.Create(folder.path().toStdString()));
+        ASSERT_FALSE(left.Write(theirs.toStdString()) || left.Finish(false));
+        ASSERT_FALSE(left.Protect({path.toStdString(), VersionOfText("a"), VersionOfText("b")}));
+        left.Release();
+    }
+    FileLock busy = FileLock::Try(path.toStdString(), "kvrshell");
+    EXPECT_FALSE(IsTold(*Open(path), "was cut off")) << "whoever has the file may be saving it";
+    Action("actionClose")->trigger();
+    Settle();
+    busy.Release();
+    EXPECT_TRUE(IsTold(*Open(path), "is kept in a.HDKV.displaced-1."));
+    QFile kept(path + ".displaced-1");
+    ASSERT_TRUE(kept.open(QIODevice::ReadOnly));
+    EXPECT_EQ(kept.readAll(), theirs);
 }
 
 TEST_F(OthersTest, ANoticeThatWasClosedComesBackWithTheNextChange)

@@ -25,6 +25,7 @@ public:
     /// The document's file from now on.
     void Take(const CString& path);
 
+    bool IsHeld() const { return m_lock.IsHeld(); }
     /// Somebody else has the file, or had it when it was taken.
     bool IsElsewhere() const { return m_lock.HeldBy().has_value(); }
     /// He has let go of it; it is not taken yet.
@@ -38,6 +39,8 @@ public:
 
     /// A save is about to write a file, which may be another one: false when somebody else has that.
     bool TakeTarget(const CString& target);
+    /// Whether others are kept from it meanwhile.
+    bool IsTargetHeld() const { return m_target.IsHeld() || (m_lock.IsHeld() && !m_target.WhyNone()); }
     /// Who has it then.
     CString TargetHolder() const;
     /// Whether it was written: then it is the document's file, at this path.

@@ -21,6 +21,8 @@ void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHa
 {
     m_file.Read(path, SavePathFor(path), load);
     m_showsDefaults = m_file.IsUnreadable();
+    if (m_use.IsHeld())
+        m_file.LookForLeftBehind();
     FileIsKnown();
 }
 
@@ -78,7 +80,11 @@ bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
             tr("%1 was left as it is: it is in use by %2.").arg(KsShownFileName(target), m_use.TargetHolder()));
         return false;
     }
-    const bool written = m_file.Write(target, write);
+    const KsFileWriter locked = [&](const std::string& path, SafeFileOptions options) {
+        options.isLocked = m_use.IsTargetHeld();
+        return write(path, options);
+    };
+    const bool written = m_file.Write(target, locked);
     if (!written && !m_file.WhyNotWritten().isEmpty())
         TellNotSaved(m_file.WhyNotWritten());
     try {
@@ -93,12 +99,12 @@ bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
 void CKsProjectDoc::FileWritten()
 {
     UndoStack().setClean();
-    SetPathName(m_file.Path());
     SetModifiedFlag(false);
     try {
         FileIsKnown();
     } catch (const std::bad_alloc&) { // it is saved all the same; what others do to it shows at the next save
     }
+    SetPathName(m_file.Path()); // at last: whoever follows the name may ask something
 }
 
 void CKsProjectDoc::EditUnreadable()
