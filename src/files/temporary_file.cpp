@@ -132,11 +132,11 @@ std::error_code TemporaryFile::Close()
     return m_platform.Close(m_file);
 }
 
-std::error_code TemporaryFile::MoveTo(const fs::path& path)
+std::error_code TemporaryFile::MoveTo(fs::path path)
 {
     const std::error_code error = path == m_path ? std::error_code() : m_platform.RenameNew(m_path, path);
     if (!error)
-        m_path = path;
+        m_path = std::move(path); // which asks for no memory
     return error;
 }
 

@@ -47,7 +47,7 @@ public:
 
 private:
     std::error_code Close();
-    std::error_code MoveTo(const std::filesystem::path& path);
+    std::error_code MoveTo(std::filesystem::path path);
 
     PlatformFile& m_platform;
     std::filesystem::path m_path, m_created; // where it stands, and where it was made

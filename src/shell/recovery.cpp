@@ -5,6 +5,7 @@
 #include "ks/fc/findings_dialog.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/project_doc.h"
 #include "shell/plugin_loader.h"
 #include "shell/recovery_dialog.h"
 #include "shell/recovery_folder.h"
@@ -12,6 +13,7 @@
 
 #include <QFile>
 #include <QFileInfo>
+#include <QUndoStack>
 #include <algorithm>
 
 namespace {
@@ -46,6 +48,17 @@ QString FreeTitle(const QString& name)
     for (int number = 2; std::ranges::any_of(CMultiDocTemplate::All(), isTaken); ++number)
         title = CRecovery::tr("%1 (recovered %2)").arg(name, QString::number(number));
     return title;
+}
+
+/// A document that was open before has read the dates that its file lacks at another time: they would be changes.
+void TakeDates(CKsDoc& document, const HDDateTime& date)
+{
+    auto* const reader = qobject_cast<CKsProjectDoc*>(&document);
+    const bool isAsRead = reader && document.UndoStack().count() == 0;
+    document.TakeDateOfFile(date);
+    CString why;
+    if (isAsRead && reader->Reload(why)) // undo leads to them, too
+        document.UndoStack().clear();
 }
 
 } // namespace
@@ -119,6 +132,8 @@ bool CRecovery::Open(const CRecoverable& item)
     }
     if (!document)
         return false;
+    if (document == open)
+        TakeDates(*document, item.header.dateOfFile);
     if (!document->TakeContent(std::move(content), tr("Recovered changes"))) {
         if (document != open)
             Close(document);
@@ -126,7 +141,6 @@ bool CRecovery::Open(const CRecoverable& item)
                          .arg(item.Name()));
         return false;
     }
-    document->TakeDateOfFile(item.header.dateOfFile); // one that was open had its own
     if (isBeside && !item.header.path.isEmpty()) {
         document->StandBeside(item.header.path);
         document->SetTitle(FreeTitle(QFileInfo(item.header.path).completeBaseName()));
