@@ -12,7 +12,8 @@ struct WriteQuestion
 {
     enum Kind
     {
-        ChangedOutside, // somebody wrote another content than `expected`; it will be kept in a copy. Yes: go on
+        ChangedOutside, // somebody wrote another content than `expected`; it will be kept in a copy. Yes: go on, No:
+                        // the error is ChangedOutside
         HardLinks,      // the file has other names. Yes: all get the new content, No: this one alone
         LosesMetadata   // what `lost` names cannot be given to the new file. Yes: go on
     };
