@@ -18,6 +18,7 @@ constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
 constexpr int RowsAtStart = 30, RowsForRoom = 4000; // whose texts are measured, at even distances through the table
 constexpr int Margin = 16;                          // pixels beside a text
 constexpr int MostOfAWindow = 320;                  // pixels that a long name may take
+constexpr int MostBesideOthers = 480;               // pixels of columns that a table may claim from others
 constexpr int LeastOfAWindow = 120;                 // pixels that stay for the columns, which can be scrolled to
 
 double FontScale(const QFontMetrics& font)
@@ -150,6 +151,12 @@ void CGridWidths::KeepGridAsWide()
     FitGrid();
 }
 
+void CGridWidths::KeepColumns(bool keep)
+{
+    if (std::exchange(m_keepsColumns, keep) != keep)
+        m_grid.updateGeometry();
+}
+
 int CGridWidths::BesideColumns() const
 {
     return m_grid.verticalHeader()->width() + m_grid.style()->pixelMetric(QStyle::PM_ScrollBarExtent) +
@@ -166,7 +173,7 @@ int CGridWidths::WidthOfGrid() const
 
 int CGridWidths::LeastWidthOfGrid()
 {
-    const int most = m_isAsWide ? MostOfAWindow : LeastOfAWindow;
+    const int most = m_keepsColumns ? MostBesideOthers : m_isAsWide ? MostOfAWindow : LeastOfAWindow;
     int columns = 0;
     for (std::size_t i = 0; columns < most && i < m_columns.size(); ++i)
         columns += Least(i);

@@ -34,6 +34,8 @@ public:
     /// From now on the grid wants to be as wide as its columns, and no wider: it stands beside others, and what it left
     /// empty would be missing there.
     void KeepGridAsWide();
+    /// Whether the grid wants its columns in sight rather than having something beside it.
+    void KeepColumns(bool keep);
     /// What the grid needs to show all of its columns, and the bar that scrolls its lines.
     int WidthOfGrid() const;
     /// What it needs when its columns have given all that they can. The last of many have to be scrolled to.
@@ -64,7 +66,7 @@ private:
 
     CGenGrid& m_grid;
     Letters m_letters;
-    bool m_areChosen = false, m_isArranging = false, m_isAsWide = false;
+    bool m_areChosen = false, m_isArranging = false, m_isAsWide = false, m_keepsColumns = false;
     struct Column
     {
         int usual;     // where there is room

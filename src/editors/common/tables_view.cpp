@@ -15,6 +15,7 @@
 #include <utility>
 
 static const QString MainState = QStringLiteral("main");
+static const QList<int> TablesSizes = {600, 400}; // as shares: the first table has more columns
 
 CTablesView::~CTablesView()
 {
@@ -33,8 +34,7 @@ void CTablesView::MakeContent(QWidget& picture, int pictureWidth, int tablesWidt
     m_sizes = {pictureWidth, tablesWidth};
     m_main = AddTable(*m_side, mainName);
     m_parts = AddTable(*m_side, partsName);
-    m_side->setStretchFactor(0, 3); // the first has more columns
-    m_side->setStretchFactor(1, 2);
+    m_side->setSizes(TablesSizes);
     m_lines = m_main.grid;
     m_splitter->addWidget(&picture);
     m_splitter->addWidget(m_side);
@@ -60,8 +60,8 @@ void CTablesView::resizeEvent(QResizeEvent* event)
         return;
     m_splitter->setOrientation(whole);
     m_side->setOrientation(side);
-    m_splitter->setSizes(whole == side ? QList<int>{1, 1} : m_sizes);
-    m_side->setSizes({3, 2});
+    m_splitter->setSizes(whole == side ? QList<int>{500, 500} : m_sizes);
+    m_side->setSizes(TablesSizes);
 }
 
 CTablesView::Table CTablesView::AddTable(QSplitter& side, const char* name)

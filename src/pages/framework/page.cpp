@@ -3,6 +3,7 @@
 #include "document/document.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_keys.h"
+#include "grid/grid_widths.h"
 #include "ks/fc/exchange.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page_help.h"
@@ -131,8 +132,9 @@ void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
 void CGenPropertyPage::FitInto(int width)
 {
     const auto turn = [this](QBoxLayout& row, QBoxLayout::Direction direction) {
-        if (row.direction() == direction)
-            return;
+        for (int i = 0; i < row.count(); ++i)
+            if (auto* grid = qobject_cast<CGenGrid*>(row.itemAt(i)->widget()))
+                grid->Widths().KeepColumns(direction == QBoxLayout::LeftToRight);
         row.setDirection(direction);
         for (QWidget* widget = row.parentWidget(); widget != parentWidget(); widget = widget->parentWidget())
             if (widget->layout())
