@@ -52,7 +52,7 @@ void CTablesView::resizeEvent(QResizeEvent* event)
     CKsProjectView::resizeEvent(event);
     if (!m_splitter)
         return;
-    constexpr int leastBeside = 140, leastForTwo = 90; // digits: a picture and two columns of a table; two tables
+    constexpr int leastBeside = 150, leastForTwo = 90; // digits: a picture and two columns of a table; two tables
     const int digits = width() / fontMetrics().horizontalAdvance(u'0');
     const auto whole = digits < leastBeside ? Qt::Vertical : Qt::Horizontal;
     const auto side = digits < leastBeside && digits >= leastForTwo ? Qt::Horizontal : Qt::Vertical;

@@ -3,6 +3,8 @@
 #include "grid/grid_keys.h"
 #include "res/strings.h"
 
+#include <QFontMetrics>
+#include <QGuiApplication>
 #include <QKeySequence>
 #include <QStringList>
 #include <algorithm>
@@ -41,10 +43,14 @@ QString PageHelpText(bool hasTables)
             rows.back().second << KeyName(key.key, key.held);
     }
     // In two columns: a screen is wider than it is high.
-    text += QStringLiteral("<p><b>%1</b></p><table><tr>").arg(LoadString(Str::HelpTables).toHtmlEscaped());
+    constexpr int digits = 130;
+    const int width = digits * QFontMetrics(QGuiApplication::font()).horizontalAdvance(u'0');
+    text += QStringLiteral("<p><b>%1</b></p><table width=%2><tr>")
+                .arg(LoadString(Str::HelpTables).toHtmlEscaped())
+                .arg(width);
     const std::size_t half = (rows.size() + 1) / 2;
     for (const std::size_t start : {std::size_t(0), half}) {
-        text += QStringLiteral("<td><table>");
+        text += QStringLiteral("<td width=50%><table>");
         for (std::size_t i = start; i < std::min(start + half, rows.size()); ++i)
             text += Row(rows[i].second.join(QStringLiteral(", ")), rows[i].first);
         text += QStringLiteral("</table></td>");
