@@ -82,7 +82,8 @@ int LockFile(const std::string& path, FileLock& lock)
 int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
             const std::optional<FileVersion>& expected)
 {
-    const auto saved = SaveHDFile(parameters, path, {.everySet = true, .file = {.expected = expected}});
+    const auto saved =
+        SaveHDFile(parameters, path, {.everySet = true, .file = {.expected = expected, .isLocked = lock.IsHeld()}});
     if (!saved)
         return Complain(saved.error().message, Exit::NotWritten);
     const std::string name = "\"" + path + "\" ";
@@ -96,6 +97,10 @@ int Rewrite(const HD_Parameters& parameters, const std::string& path, const File
                  Exit::Fine);
     if (report.lost.Any())
         Complain(name + "is saved; not kept of it as it was before: " + LostText(report.lost) + ".", Exit::Fine);
+    for (const std::string& left : report.leftBehind)
+        Complain("A save of \"" + path + "\" was cut off; what another program may have written to it just before is " +
+                     "kept in \"" + left + "\".",
+                 Exit::Fine);
     if (!report.displaced.empty() && report.unknown)
         Complain(name + "is saved; what it held just before is kept in \"" + report.displaced +
                      "\", for whether another program had written that could not be seen: " + report.unknown.message() +

@@ -1,5 +1,6 @@
 #include "files/difference.h"
 
+#include "base/not_given.h"
 #include "files/structure.h"
 
 #include <algorithm>
@@ -14,11 +15,10 @@ struct Item
 {
     tqlHandle node = nullptr;
     std::string_view name{};
-    std::string_view params{}; // of a keyword
-    std::size_t content = 0;   // hash of everything in it
-    std::size_t lines = 1;     // keywords in it
-    std::size_t number = 0;    // among those of its name, from 1
-    bool isAlone = true;       // nobody else has its name
+    std::size_t content = 0; // hash of everything in it
+    std::size_t lines = 1;   // keywords in it
+    std::size_t number = 0;  // among those of its name, from 1
+    bool isAlone = true;     // nobody else has its name
 };
 using Items = std::vector<Item>;
 
@@ -52,8 +52,8 @@ Items Keywords(tqlHandle section)
     Items items(std::size_t(tqlGetNoKeywords(section)));
     for (std::size_t i = 0; i < items.size(); ++i) {
         const tqlHandle keyword = tqlKeywordByNum(section, int(i) + 1);
-        const std::string_view name = tqlName(keyword), params = tqlGetRawParams(keyword);
-        items[i] = {.node = keyword, .name = name, .params = params, .content = Mixed(HashOf(name), HashOf(params))};
+        const std::string_view name = tqlName(keyword);
+        items[i] = {.node = keyword, .name = name, .content = Mixed(HashOf(name), HashOf(tqlGetRawParams(keyword)))};
     }
     Number(items);
     return items;
@@ -76,6 +76,22 @@ Items Sections(tqlHandle parent)
     }
     Number(items);
     return items;
+}
+
+/// As tables show it: what is not given is nothing.
+std::string_view ShownText(tqlHandle param)
+{
+    double number = 0;
+    return tqlGetDouble(param, &number) && number == NotGiven ? std::string_view() : tqlGetRawParam(param);
+}
+
+std::string ShownLine(const Item* item)
+{
+    std::string text;
+    const tqlHandle first = item ? tqlParamByNum(item->node, 1) : nullptr;
+    for (tqlHandle param = first; param; param = tqlNextParam(param))
+        text.append(param == first ? "" : ", ").append(ShownText(param));
+    return text;
 }
 
 bool IsSameValue(tqlHandle a, tqlHandle b)
@@ -253,8 +269,8 @@ private:
             Values(found, before->node, after->node);
             return;
         }
-        found.before = before ? before->params : std::string_view();
-        found.after = after ? after->params : std::string_view();
+        found.before = ShownLine(before);
+        found.after = ShownLine(after);
         Add(std::move(found), after ? m_after : m_before, item.node, 1);
     }
 
@@ -262,13 +278,12 @@ private:
     {
         tqlHandle old = tqlParamByNum(before, 1), now = tqlParamByNum(after, 1);
         for (int number = 1; old && now; ++number, old = tqlNextParam(old), now = tqlNextParam(now)) {
-            const std::string_view texts[] = {tqlGetRawParam(old), tqlGetRawParam(now)};
-            if (texts[0] == texts[1] || IsSameValue(old, now))
+            if (tqlGetRawParam(old) == tqlGetRawParam(now) || IsSameValue(old, now))
                 continue;
             Difference found = place;
             found.parameter = number;
-            found.before = texts[0];
-            found.after = texts[1];
+            found.before = ShownText(old);
+            found.after = ShownText(now);
             Add(std::move(found), m_after, now, 1);
         }
     }

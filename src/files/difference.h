@@ -24,7 +24,8 @@ struct Difference
     std::size_t number = 0;        // which of the section's keywords of that name, from 1
     std::size_t line = 0;          // of the file where it stands: of the first for what was removed, else of the second
     int parameter = 0;             // from 1; 0 for a whole line, or a section
-    std::string before{}, after{}; // in file notation; of a section how many lines it has
+    std::string before{}, after{}; // in file notation, but nothing for a number that is not given
+                                   // (base/not_given.h); of a section how many lines it has
 };
 
 struct Differences

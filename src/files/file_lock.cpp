@@ -264,10 +264,12 @@ bool FileLock::TryItself(const fs::path& path)
 
 void FileLock::Follow(const std::string& path)
 {
-    fs::path file = PathFromUtf8(path);
+    fs::path file = PathFromUtf8(path), beside = file;
     FileStatus there, locked;
     if (!m_platform || FollowLinks(*m_platform, file, there))
         return;
+    if (!LockPath(*m_platform, beside, locked) && IsAt(beside))
+        m_path = std::move(beside);
     if (m_itself && !m_platform->StatusOf(*m_itself, locked) && locked.IsSameFile(there))
         return;
     if (const auto before = std::exchange(m_itself, std::nullopt))
@@ -315,9 +317,29 @@ bool FileLock::IsFor(const std::string& path) const
 {
     fs::path beside = PathFromUtf8(path);
     FileStatus status;
-    bool isSame = false;
-    return m_platform && !LockPath(*m_platform, beside, status) && !IsSameFile(*m_platform, beside, m_path, isSame) &&
-           isSame;
+    return m_platform && !LockPath(*m_platform, beside, status) && IsAt(beside);
+}
+
+/// Whether the lock file that is held is the one that others find there.
+bool FileLock::IsAt(const fs::path& path) const
+{
+    FileStatus held, named;
+    return !m_platform->StatusOf(m_file, held) && !m_platform->Status(path, named) &&
+           named.kind != FileStatus::Kind::None && named.IsSameFile(held);
+}
+
+std::function<bool()> FileLock::WasRemoved() const
+{
+    FileStatus held;
+    if (!m_platform || m_platform->StatusOf(m_file, held))
+        return [] { return false; };
+    return [platform = m_platform, path = m_path, held] {
+        FileStatus named, folder;
+        if (platform->Status(path, named) || (named.kind != FileStatus::Kind::None && named.IsSameFile(held)))
+            return false;
+        return named.kind != FileStatus::Kind::None ||
+               (!platform->Status(FolderOf(path), folder) && folder.kind == FileStatus::Kind::Folder);
+    };
 }
 
 void FileLock::ShareWithCopies()

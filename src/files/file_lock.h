@@ -4,6 +4,7 @@
 #include "files/file_content.h"
 
 #include <chrono>
+#include <functional>
 #include <optional>
 
 /// Who has a file; what is not known is empty or 0.
@@ -33,15 +34,19 @@ public:
                             PlatformFile* platform = nullptr);
 
     bool IsHeld() const { return m_platform != nullptr; }
-    /// Whether it is held, and is the one of this file.
+    /// Whether it is held, and is the one of this file; its folder may have got another name since.
     bool IsFor(const std::string& path) const;
+    /// A question for any thread: whether somebody has taken the lock file away, so that others find none, or another.
+    /// Not when its folder is no longer there either: the lock goes on wherever that is.
+    std::function<bool()> WasRemoved() const;
     /// Who else has it.
     const std::optional<LockHolder>& HeldBy() const { return m_heldBy; }
     /// Why the folder takes no lock.
     std::error_code WhyNone() const { return m_whyNone; }
     /// The file that is the lock, or would be, in UTF-8.
     std::string Path() const;
-    /// What stands there may be another file by now, or have got further names (hard links): these are kept out, too.
+    /// What stands there may be another file by now, stand in a folder of another name, or have got further names (hard
+    /// links): these are kept out, too.
     void Follow(const std::string& path);
     void Release();
     /// Copies of the process (process_copy.h) hold it, too, for as long as they work.
@@ -51,6 +56,7 @@ public:
 
 private:
     bool TryItself(const std::filesystem::path& file);
+    bool IsAt(const std::filesystem::path& path) const;
     bool TryOnce(const std::filesystem::path& path, std::string_view program, PlatformFile& platform);
 
     std::optional<LockHolder> m_heldBy;

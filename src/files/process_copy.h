@@ -29,6 +29,8 @@ public:
         Awaited
     };
     static Result<ProcessCopy> Start(const std::function<Answer()>& work, Pace pace = Pace::Aside);
+    /// Whether this process is such a copy.
+    static bool IsThis();
     ProcessCopy(ProcessCopy&& other) noexcept { *this = std::move(other); }
     ProcessCopy& operator=(ProcessCopy&& other) noexcept
     {

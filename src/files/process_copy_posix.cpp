@@ -38,9 +38,12 @@ void CloseConnections()
     }
 }
 
+bool isCopy = false;
+
 /// What the copy does.
 ProcessCopy::Answer Run(const std::function<ProcessCopy::Answer()>& work, ProcessCopy::Pace pace)
 {
+    isCopy = true;
     for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGALRM, SIGPIPE})
         std::signal(signal, SIG_DFL);
     ::alarm(LongestWork);
@@ -122,6 +125,11 @@ Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work, Pace
     const int end = EndOf(process);
     copy.m_ended = end == -1 ? copy.m_letter : end;
     return copy;
+}
+
+bool ProcessCopy::IsThis()
+{
+    return isCopy;
 }
 
 ProcessCopy::~ProcessCopy()

@@ -7,6 +7,11 @@ Result<ProcessCopy> ProcessCopy::Start(const std::function<Answer()>& work, Pace
     return copy;
 }
 
+bool ProcessCopy::IsThis()
+{
+    return false;
+}
+
 ProcessCopy::~ProcessCopy() = default;
 
 void ProcessCopy::Stop() {}

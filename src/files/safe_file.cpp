@@ -11,6 +11,14 @@ namespace {
 
 using Kind = FileStatus::Kind;
 
+std::vector<std::string> Utf8(const std::vector<fs::path>& paths)
+{
+    std::vector<std::string> texts;
+    for (const fs::path& path : paths)
+        texts.push_back(Utf8FromPath(path));
+    return texts;
+}
+
 /// One save, step by step.
 class SafeWriter
 {
@@ -34,6 +42,7 @@ private:
     std::error_code Overwrite(std::string_view text, bool& begun);
     Result<void> KeepTarget();
     bool Rename(const fs::path& from, const fs::path& to);
+    void TellLeftBehind(const std::vector<fs::path>& names);
     Error Failed(std::error_code reason) const { return NotWritten(m_path, reason); }
     Error FailedKeeping(std::error_code reason, const fs::path& kept) const;
 
@@ -138,7 +147,8 @@ Result<void> SafeWriter::PutInPlace(TemporaryFile& temporary)
     bool exists = m_seen.kind == Kind::File;
     std::error_code error;
     for (int attempt = 0; attempt < 2; ++attempt) {
-        if (exists && (error = temporary.Protect()))
+        if (exists &&
+            (error = temporary.Protect({m_target, m_report.version, m_options.expected.value_or(FileVersion())})))
             break;
         std::string name = exists ? Utf8FromPath(temporary.Path()) : std::string();
         m_report.displaced.swap(name); // should it have to stay there; behind the swap there may be no memory
@@ -172,7 +182,7 @@ void SafeWriter::KeepDisplaced(TemporaryFile& temporary)
     }
     try {
         fs::path kept;
-        if (!temporary.KeepAs(m_target, "displaced", kept))
+        if (!temporary.KeepAs(m_target, DisplacedSuffix, kept))
             m_report.displaced = Utf8FromPath(kept);
     } catch (const std::bad_alloc&) { // the file is written, and what came out stays, be it under that name
     }
@@ -181,7 +191,7 @@ void SafeWriter::KeepDisplaced(TemporaryFile& temporary)
 
 Result<void> SafeWriter::KeepTarget()
 {
-    const Result<KeptCopy> kept = KeepOriginal(Utf8FromPath(m_target), "displaced", &m_platform);
+    const Result<KeptCopy> kept = KeepOriginal(Utf8FromPath(m_target), DisplacedSuffix, &m_platform);
     if (!kept)
         return kept.error();
     m_report.displaced = kept.value().path;
@@ -276,7 +286,9 @@ Result<WriteReport> SafeWriter::Write(std::string_view text)
         return Failed(error);
     if (const Result<void> agreed = AskBefore(); !agreed)
         return agreed.error();
-    RemoveLeftOvers(m_platform, m_folder);
+    std::vector<fs::path> before; // in the folder
+    if (!m_platform.List(m_folder, before))
+        RemoveLeftOvers(m_platform, m_folder, before);
     TemporaryFile temporary(m_platform);
     if (const std::error_code error = Fill(temporary, text))
         return Failed(error);
@@ -284,12 +296,12 @@ Result<WriteReport> SafeWriter::Write(std::string_view text)
         return Failed(std::make_error_code(std::errc::operation_canceled));
     if (const std::error_code error = temporary.Finish(m_options.sync))
         return Failed(error);
+    m_report.version = VersionOfText(text);
     // What is done behind this asks for no memory: the file is written, and that has to be said.
     const fs::path entry = PathFromUtf8(m_path), spelling = PathFromUtf8(m_options.renameTo),
                    entryFolder = FolderOf(entry);
     if (const Result<void> put = m_report.inPlace ? WriteInPlace(temporary, text) : PutInPlace(temporary); !put)
         return put.error();
-    m_report.version = VersionOfText(text);
     // The new content is in place and whole. Should a folder not reach the medium before the power fails, the old
     // content is found whole instead: no failure, but not what a user takes "saved" for either.
     const bool renamed = Rename(entry, spelling);
@@ -297,7 +309,18 @@ Result<WriteReport> SafeWriter::Write(std::string_view text)
         m_report.unconfirmed = m_platform.SyncFolder(m_folder);
     if (m_options.sync && renamed && !m_report.unconfirmed && (m_report.inPlace || entryFolder != m_folder))
         m_report.unconfirmed = m_platform.SyncFolder(entryFolder);
+    TellLeftBehind(before);
     return std::move(m_report);
+}
+
+/// When it is certain that the user hears of it.
+void SafeWriter::TellLeftBehind(const std::vector<fs::path>& names)
+{
+    try {
+        if (m_options.isLocked)
+            m_report.leftBehind = Utf8(TakeProtected(m_platform, m_target, names));
+    } catch (const std::bad_alloc&) { // it is written, and what is left is found the next time
+    }
 }
 
 } // namespace
@@ -305,6 +328,17 @@ Result<WriteReport> SafeWriter::Write(std::string_view text)
 Result<WriteReport> WriteFileSafely(const std::string& path, std::string_view text, const SafeFileOptions& options)
 {
     return SafeWriter(path, options).Write(text);
+}
+
+std::vector<std::string> NameLeftBehind(const std::string& path, PlatformFile* platformOrNull)
+{
+    PlatformFile& platform = OrNative(platformOrNull);
+    fs::path target = PathFromUtf8(path);
+    FileStatus status;
+    std::vector<fs::path> names;
+    if (FollowLinks(platform, target, status) || platform.List(FolderOf(target), names))
+        return {};
+    return Utf8(TakeProtected(platform, target, names));
 }
 
 std::string FreeCopyName(const std::string& path, std::string_view why)

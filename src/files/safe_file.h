@@ -5,6 +5,7 @@
 
 #include <functional>
 #include <optional>
+#include <vector>
 
 /// What is not the writer's to decide, asked before anything has been replaced.
 struct WriteQuestion
@@ -33,6 +34,8 @@ struct SafeFileOptions
     PlatformFile* platform = nullptr;      // null for the system's own
     std::optional<FileVersion> expected{}; // the content that may be replaced; none: whatever is found at first
     std::string renameTo{};                // another spelling of the name in the same folder, which it has from then on
+    /// The caller holds the file's lock (file_lock.h): what a save that was cut off has left is nobody else's.
+    bool isLocked = false;
     /// Without it a file that somebody changed is not replaced (error ChangedOutside), all names of a file get the new
     /// content, and what of the metadata is lost is reported.
     std::function<WriteAnswer(const WriteQuestion&)> ask{};
@@ -47,8 +50,10 @@ struct WriteReport
 {
     std::error_code unconfirmed{}; // why it is not known whether the disk has it: the folder could not be synced
     LostMetadata lost{};
-    std::string displaced{};      // where what somebody else wrote at the last moment is kept
-    std::error_code unknown{};    // why it is not known whether somebody did, should it not be; it is kept all the same
+    std::string displaced{};   // where what somebody else wrote at the last moment is kept
+    std::error_code unknown{}; // why it is not known whether somebody did, should it not be; it is kept all the same
+    std::vector<std::string>
+        leftBehind{};             // where what saves had displaced stands that were cut off before they said so
     std::error_code notRenamed{}; // it is written, and keeps its spelling
     FileVersion version{};        // what was written
     bool inPlace = false;         // the file itself was written over, as it has several names
@@ -61,6 +66,10 @@ struct WriteReport
 /// or a file of several names was written half, the whole new content stays beside it and the error names it.
 Result<WriteReport> WriteFileSafely(const std::string& path, std::string_view text,
                                     const SafeFileOptions& options = {});
+
+/// What somebody else had written to a file and a save displaced that was cut off before it said so: it gets the name
+/// that such a version has, which is given back. Whoever calls holds the file's lock.
+std::vector<std::string> NameLeftBehind(const std::string& path, PlatformFile* platform = nullptr);
 
 /// The first of PATH.WHY-1, -2, ... that is free.
 std::string FreeCopyName(const std::string& path, std::string_view why);

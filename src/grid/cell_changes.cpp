@@ -9,7 +9,12 @@ bool SameCell(const CellValue& a, const CellValue& b)
 {
     const auto* x = std::get_if<double>(&a);
     const auto* y = std::get_if<double>(&b);
-    return x && y ? std::bit_cast<std::uint64_t>(*x) == std::bit_cast<std::uint64_t>(*y) : a == b;
+    return x && y ? SameCell(*x, *y) : a == b;
+}
+
+bool SameCell(double a, double b)
+{
+    return std::bit_cast<std::uint64_t>(a) == std::bit_cast<std::uint64_t>(b);
 }
 
 /// Gives back what is worth a copy.
@@ -79,6 +84,8 @@ void CCellValues::ShrinkToFit()
 
 CCellChanges::Column& CCellChanges::ColumnFor(int column, const std::shared_ptr<const CellAccess>& access)
 {
+    if (!m_columns.empty() && m_columns.back().column == column)
+        return m_columns.back(); // mostly they come column by column
     auto place = std::ranges::find(m_columns, column, &Column::column);
     if (place == m_columns.end()) {
         place = m_columns.insert(place, Column{column, access, {}, {}, {}});

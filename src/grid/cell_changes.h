@@ -11,6 +11,7 @@
 
 /// Equal to the last bit; numbers that are none are equal to themselves.
 bool SameCell(const CellValue& a, const CellValue& b);
+bool SameCell(double a, double b);
 
 /// What many cells of one column hold.
 class CCellValues

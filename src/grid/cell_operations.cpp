@@ -16,21 +16,6 @@
 
 namespace {
 
-/// In the unit shown; nothing for an empty cell and for what is no number.
-std::optional<double> ShownNumber(const ColumnSpec& column, const CellValue& value)
-{
-    if (const auto* integer = std::get_if<std::int32_t>(&value))
-        return *integer;
-    const auto* number = std::get_if<double>(&value);
-    if (!number || IsEmptyCell(column, value) || std::isnan(*number))
-        return std::nullopt;
-    return column.style.UnitConvertFromBase(*number, 1);
-}
-std::optional<double> ShownNumber(const CTableRows& rows, int row, int column)
-{
-    return ShownNumber(rows.Column(column), rows.Value(row, column));
-}
-
 template <typename Do>
 void ForCells(const CTableRows& rows, const CellBlock& block, const Do& action)
 {
@@ -107,11 +92,11 @@ CCellResults RevertToSaved(const CTableRows& rows, const CSavedLines& saved, con
 
 double StepOf(const CTableRows& rows, const CellBlock& block)
 {
-    const auto isNumber = [&](int column) { return rows.Column(column).IsNumeric(); };
     for (int column = block.left; column <= block.right && block.bottom > block.top; ++column) {
-        if (!isNumber(column))
+        if (!rows.Column(column).IsNumeric())
             continue;
-        const auto first = ShownNumber(rows, block.top, column), second = ShownNumber(rows, block.top + 1, column);
+        const CShownNumbers numbers(rows, column);
+        const auto first = numbers.At(block.top), second = numbers.At(block.top + 1);
         if (!first || !second)
             return 0;
         return KsFifteenDigits(*second - *first, std::max(std::fabs(*first), std::fabs(*second)));
@@ -122,18 +107,16 @@ double StepOf(const CTableRows& rows, const CellBlock& block)
 CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double step)
 {
     CCellResults results(rows, block);
-    std::optional<double> first;
-    ForCells(rows, block, [&](int row, int column) {
+    const int last = std::min(block.bottom, rows.StoredRows() - 1);
+    for (int column = block.left; column <= block.right && block.top <= last; ++column) {
         if (!rows.Column(column).IsNumeric())
-            return;
-        if (row == block.top) {
-            first = ShownNumber(rows, row, column);
-            if (!first)
-                results.Keep(row, column, GridTexts::tr("The cell is empty."));
-        } else if (first) {
-            results.AddShown(row, column, rows.Value(row, column), *first + step * (row - block.top));
-        }
-    });
+            continue;
+        const auto first = CShownNumbers(rows, column).At(block.top);
+        if (!first)
+            results.Keep(block.top, column, GridTexts::tr("The cell is empty."));
+        for (int row = block.top + 1; first && row <= last; ++row)
+            results.AddShown(row, column, *first + step * (row - block.top));
+    }
     return results;
 }
 
@@ -146,45 +129,70 @@ constexpr int BranchColumn = 0, ChainageColumn = 1;
 struct LineOfBranch
 {
     double chainage;
-    std::uint32_t line; // of the source: what is known of a line that is hidden is known
+    const void* object; // of the source: what is known of a line that is hidden is known
     int row;            // where it is shown
 
     bool IsIn(const CellBlock& block) const { return row >= block.top && row <= block.bottom; }
 };
-using Branches = std::vector<std::vector<LineOfBranch>>;
+/// Lines of the source that follow each other.
+struct Run
+{
+    std::size_t first, end;
+};
+/// All lines of a branch; mostly it is one run.
+using Branch = std::vector<Run>;
 
-/// The lines of each branch by chainage. Lines of one branch mostly follow each other.
-Branches LinesByBranch(const CTableRows& rows, const CellBlock& block, CCellResults& results)
+void KeepUnplaced(CCellResults& results, int row, const CellBlock& block)
+{
+    if (row >= block.top && row <= block.bottom)
+        results.Keep(row, ChainageColumn, GridTexts::tr("The line has no branch or no chainage."));
+}
+
+std::vector<Branch> BranchesOf(const CTableRows& rows, const CellBlock& block, CCellResults& results)
 {
     std::map<QString, std::size_t> places;
-    Branches branches;
-    std::string last;
-    std::size_t place = 0;
+    std::vector<Branch> branches;
     IRowSource& source = *rows.Rows();
-    const CellAccess &names = *rows.Column(BranchColumn).access, &chainages = *rows.Column(ChainageColumn).access;
-    for (std::size_t line = source.FixedRows(), end = source.Count(); line < end; ++line) {
-        const int row = rows.ShownRow(line);
-        const void* const object = source.At(line);
-        const CellValue name = names.get(object), chainage = chainages.get(object);
-        const auto& branch = std::get<std::string>(name);
-        const auto* number = std::get_if<double>(&chainage);
-        const bool isInBlock = row >= block.top && row <= block.bottom;
-        if (branch.empty() || !number || *number == NotGiven) {
-            if (isInBlock)
-                results.Keep(row, ChainageColumn, GridTexts::tr("The line has no branch or no chainage."));
+    const CellAccess& names = *rows.Column(BranchColumn).access;
+    CellValue copy;
+    const std::size_t end = source.Count();
+    for (std::size_t line = source.FixedRows(); line < end;) {
+        const std::size_t first = line;
+        const std::string branch = *names.TextIn(source.At(first), copy);
+        for (++line; line < end && *names.TextIn(source.At(line), copy) == branch;)
+            ++line;
+        if (branch.empty()) {
+            for (std::size_t unplaced = first; unplaced < line; ++unplaced)
+                KeepUnplaced(results, rows.ShownRow(unplaced), block);
             continue;
         }
-        if (branches.empty() || branch != last) {
-            place = places.try_emplace(KsBranchKey(QString::fromStdString(branch)), branches.size()).first->second;
-            branches.resize(std::max(branches.size(), place + 1));
-            last = branch;
-        }
-        branches[place].push_back({*number, std::uint32_t(line), row});
+        const auto place = places.try_emplace(KsBranchKey(QString::fromStdString(branch)), branches.size()).first;
+        branches.resize(std::max(branches.size(), place->second + 1));
+        branches[place->second].push_back({first, line});
     }
-    for (auto& lines : branches)
-        if (!std::ranges::is_sorted(lines, {}, &LineOfBranch::chainage))
-            std::ranges::stable_sort(lines, {}, &LineOfBranch::chainage);
     return branches;
+}
+
+/// Those with a chainage, in the order of that.
+void GetLines(std::vector<LineOfBranch>& lines, const Branch& branch, const CTableRows& rows, const CellBlock& block,
+              CCellResults& results)
+{
+    const CellAccess& chainages = *rows.Column(ChainageColumn).access;
+    CellValue copy;
+    lines.clear();
+    for (const Run& run : branch) {
+        for (std::size_t line = run.first; line < run.end; ++line) {
+            const int row = rows.ShownRow(line);
+            const void* const object = rows.Rows()->At(line);
+            const double* const chainage = chainages.NumberIn(object, copy);
+            if (chainage && *chainage != NotGiven)
+                lines.push_back({*chainage, object, row});
+            else
+                KeepUnplaced(results, row, block);
+        }
+    }
+    if (!std::ranges::is_sorted(lines, {}, &LineOfBranch::chainage))
+        std::ranges::stable_sort(lines, {}, &LineOfBranch::chainage);
 }
 
 struct Known
@@ -210,21 +218,20 @@ std::optional<double> OnLine(const std::vector<Known>& known, double chainage, b
 }
 
 /// The first of the lines that is in the block, or is not, and has a value.
-std::optional<Known> FirstKnown(const CTableRows& rows, auto lines, const CellBlock& block, int column, bool isInBlock)
+std::optional<Known> FirstKnown(const CShownNumbers& numbers, auto lines, const CellBlock& block, bool isInBlock)
 {
-    const ColumnSpec& spec = rows.Column(column);
     for (const LineOfBranch& line : lines) {
         if (line.IsIn(block) != isInBlock)
             continue;
-        if (const auto value = ShownNumber(spec, spec.access->get(rows.Rows()->At(line.line))))
+        if (const auto value = numbers.In(line.object))
             return Known{line.chainage, *value};
     }
     return std::nullopt;
 }
 
 /// Of two values at one place the first one counts, or at the end of the block the last.
-std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranch>& lines, const CellBlock& block,
-                           int column, KnownValues which)
+std::vector<Known> KnownOf(const std::vector<LineOfBranch>& lines, const CellBlock& block, const CShownNumbers& numbers,
+                           KnownValues which)
 {
     std::vector<Known> known;
     const auto add = [&known](const std::optional<Known>& value) {
@@ -232,12 +239,12 @@ std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranc
             known.push_back(*value);
     };
     if (which == KnownValues::Ends) {
-        add(FirstKnown(rows, std::views::all(lines), block, column, true));
-        add(FirstKnown(rows, std::views::reverse(lines), block, column, true));
+        add(FirstKnown(numbers, std::views::all(lines), block, true));
+        add(FirstKnown(numbers, std::views::reverse(lines), block, true));
         return known;
     }
     for (std::size_t line = 0; line < lines.size(); ++line)
-        add(FirstKnown(rows, std::span(lines).subspan(line, 1), block, column, false));
+        add(FirstKnown(numbers, std::span(lines).subspan(line, 1), block, false));
     return known;
 }
 
@@ -246,19 +253,22 @@ std::vector<Known> KnownOf(const CTableRows& rows, const std::vector<LineOfBranc
 CCellResults Interpolate(const CTableRows& rows, const CellBlock& block, KnownValues which, bool extrapolates)
 {
     CCellResults results(rows, block);
-    const Branches branches = LinesByBranch(rows, block, results);
-    for (int column = std::max(block.left, ChainageColumn + 1); column <= block.right; ++column) {
-        if (rows.Column(column).Kind() != CellKind::Number)
+    std::vector<std::pair<int, CShownNumbers>> columns;
+    for (int column = std::max(block.left, ChainageColumn + 1); column <= block.right; ++column)
+        if (rows.Column(column).Kind() == CellKind::Number)
+            columns.emplace_back(column, CShownNumbers(rows, column));
+    std::vector<LineOfBranch> lines;
+    for (const Branch& branch : BranchesOf(rows, block, results)) {
+        GetLines(lines, branch, rows, block, results);
+        if (std::ranges::none_of(lines, [&block](const LineOfBranch& line) { return line.IsIn(block); }))
             continue;
-        for (const auto& lines : branches) {
-            if (std::ranges::none_of(lines, [&block](const LineOfBranch& line) { return line.IsIn(block); }))
-                continue;
-            const std::vector<Known> known = KnownOf(rows, lines, block, column, which);
+        for (const auto& [column, numbers] : columns) {
+            const std::vector<Known> known = KnownOf(lines, block, numbers, which);
             for (const LineOfBranch& line : lines) {
                 if (!line.IsIn(block))
                     continue;
                 if (const auto value = OnLine(known, line.chainage, extrapolates))
-                    results.AddShown(line.row, column, rows.Value(line.row, column), *value);
+                    results.AddShown(line.row, column, rows.HasTyped() ? nullptr : line.object, *value);
                 else
                     results.Keep(line.row, column, GridTexts::tr("There is no known value on both sides of it."));
             }
@@ -294,33 +304,37 @@ FormulaNames NamesForFormula(const CTableRows& rows)
     return result;
 }
 
-CCellFormula::CCellFormula(const CTableRows& rows, const CKsFormula& formula, const FormulaNames& names)
-    : m_rows(&rows), m_formula(&formula), m_numbers(names.columns.size())
+CCellFormula::CCellFormula(const CTableRows& rows, const CKsFormula& formula, const FormulaNames& names, int column)
+    : m_rows(&rows), m_column(column), m_formula(&formula)
 {
     for (std::size_t name = 0; name < names.columns.size(); ++name)
-        if (formula.Uses(name))
-            m_used.emplace_back(name, names.columns[name]);
+        if (const int from = names.columns[name]; formula.Uses(name))
+            m_used.push_back({&formula.Number(name), CShownNumbers(rows, from < 0 ? column : from)});
 }
 
-void CCellFormula::Add(CCellResults& results, int row, int column, const CellValue& before)
+void CCellFormula::Add(CCellResults& results, int row)
 {
-    for (const auto& [name, from] : m_used) {
-        const auto number = from < 0 ? ShownNumber(m_rows->Column(column), before) : ShownNumber(*m_rows, row, from);
+    const void* const object = m_rows->UntouchedObject(row);
+    for (const auto& [name, numbers] : m_used) {
+        const auto number = numbers.At(row, object);
         if (!number)
-            return results.Keep(row, column, GridTexts::tr("A cell that the formula names is empty."));
-        m_numbers[name] = *number;
+            return results.Keep(row, m_column, GridTexts::tr("A cell that the formula names is empty."));
+        *name = *number;
     }
-    results.AddShown(row, column, before, m_formula->Value(m_numbers));
+    results.AddShown(row, m_column, object, m_formula->Value());
 }
 
 CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKsFormula& formula,
                        const FormulaNames& names)
 {
-    CCellFormula cells(rows, formula, names);
     CCellResults results(rows, block);
-    ForCells(rows, block, [&](int row, int column) {
-        if (rows.Column(column).IsNumeric())
-            cells.Add(results, row, column, rows.Value(row, column));
-    });
+    const int last = std::min(block.bottom, rows.StoredRows() - 1);
+    for (int column = block.left; column <= block.right; ++column) {
+        if (!rows.Column(column).IsNumeric())
+            continue;
+        CCellFormula cells(rows, formula, names, column);
+        for (int row = block.top; row <= last; ++row)
+            cells.Add(results, row);
+    }
     return results;
 }

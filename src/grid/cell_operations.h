@@ -3,6 +3,7 @@
 #pragma once
 
 #include "grid/cell_results.h"
+#include "grid/shown_numbers.h"
 
 #include <QStringList>
 
@@ -43,19 +44,24 @@ struct FormulaNames
     std::vector<int> columns; // the column of each; -1 for the cell itself
 };
 FormulaNames NamesForFormula(const CTableRows& rows);
-/// A formula, which outlives it, about the cells of a table.
+/// A formula, which outlives it, about the cells of a column.
 class CCellFormula
 {
 public:
-    CCellFormula(const CTableRows& rows, const CKsFormula& formula, const FormulaNames& names);
-    /// What it makes of the number in the cell, which holds `before`.
-    void Add(CCellResults& results, int row, int column, const CellValue& before);
+    CCellFormula(const CTableRows& rows, const CKsFormula& formula, const FormulaNames& names, int column);
+    /// What it makes of the number in the cell.
+    void Add(CCellResults& results, int row);
 
 private:
+    struct Used
+    {
+        double* name; // what it stands for
+        CShownNumbers numbers;
+    };
     const CTableRows* m_rows;
+    int m_column;
     const CKsFormula* m_formula;
-    std::vector<std::pair<std::size_t, int>> m_used; // names, and the column of each
-    std::vector<double> m_numbers;
+    std::vector<Used> m_used;
 };
 /// Each number of the block becomes what the formula makes of it; numbers are in the units shown.
 CCellResults Calculate(const CTableRows& rows, const CellBlock& block, const CKsFormula& formula,

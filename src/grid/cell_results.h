@@ -2,7 +2,7 @@
 #pragma once
 
 #include "grid/cell_changes.h"
-#include "grid/table_rows.h"
+#include "grid/shown_numbers.h"
 
 #include <QString>
 #include <algorithm>
@@ -24,8 +24,9 @@ public:
 
     /// The cell, which holds `before`, becomes `after` unless that is the same, or cannot be.
     void Add(int row, int column, const CellValue& before, const CellValue& after);
-    /// The number in the unit that the user sees, to fifteen digits; an integer for a column of them.
-    void AddShown(int row, int column, const CellValue& before, double after);
+    /// The cell becomes the number in the unit that the user sees, to fifteen digits; an integer in a column of them.
+    void AddShown(int row, int column, double after) { AddShown(row, column, m_rows->UntouchedObject(row), after); }
+    void AddShown(int row, int column, const void* untouchedObject, double after);
     /// The cell, which holds `before`, becomes what it was once, whatever cells may become now.
     void PutBack(int row, int column, const CellValue& before, const CellValue& after);
     /// The cell stays as it is.
@@ -48,7 +49,20 @@ public:
     CCellChanges TakeChanges() { return std::move(m_changes); }
 
 private:
+    struct Numbers
+    {
+        int column;
+        CShownNumbers shown;
+    };
+    const CShownNumbers& NumbersOf(int column);
+    void AddNumber(int row, int column, const CShownNumbers& numbers, double before, double after);
+    bool IsTaken(int row, int column, const ColumnSpec& spec, const double* number);
+    template <typename T>
+    void Change(int row, int column, const ColumnSpec& spec, const T& before, const T& after);
+    void List(int row, int column, const CellValue& before, const CellValue& after);
+
     const CTableRows* m_rows;
+    std::optional<Numbers> m_numbers; // of the column whose cells come at present
     bool m_hasRules;
     CCellChanges m_changes;
     std::vector<Cell> m_changed, m_kept;

@@ -27,10 +27,39 @@ CellAccess FieldAccess(const Field& field)
                         const double given = std::get<double>(value);
                         field.In<double>(row) = given == NotGiven ? KsUnset : given;
                     }};
-        else
-            return {[field](const void* row) -> CellValue { return field.In<T>(row); },
-                    [field](void* row, const CellValue& value) { field.In<T>(row) = std::get<T>(value); }};
+        else {
+            CellAccess access{[field](const void* row) -> CellValue { return field.In<T>(row); },
+                              [field](void* row, const CellValue& value) { field.In<T>(row) = std::get<T>(value); }};
+            const auto in = [address = field.constAddress](const void* row) {
+                return static_cast<const T*>(address(row));
+            };
+            if constexpr (std::is_same_v<T, double>)
+                access.number = in;
+            else if constexpr (std::is_same_v<T, std::string>)
+                access.text = in;
+            return access;
+        }
     });
+}
+
+template <typename T>
+static const T* ValueIn(const CellAccess& cell, const std::function<const T*(const void*)>& inRow, const void* row,
+                        CellValue& copy)
+{
+    if (const T* const value = inRow ? inRow(row) : nullptr)
+        return value;
+    copy = cell.get(row);
+    return std::get_if<T>(&copy);
+}
+
+const double* CellAccess::NumberIn(const void* row, CellValue& copy) const
+{
+    return ValueIn(*this, number, row, copy);
+}
+
+const std::string* CellAccess::TextIn(const void* row, CellValue& copy) const
+{
+    return ValueIn(*this, text, row, copy);
 }
 
 QString Choices::TextOf(std::int32_t index) const

@@ -21,6 +21,14 @@ struct CellAccess
     std::function<void(void* row, const CellValue& value)> set;
     /// Where setting a cell changes more of the row than the cell: what puts the row back as it is now.
     std::function<std::function<void(void* row)>(const void* row)> restore = {};
+    /// Where a row keeps the number or text that `get` would copy, for whoever goes through many rows; null where the
+    /// cell is something else. Columns whose cells are no such thing have none of these.
+    std::function<const double*(const void* row)> number = {};
+    std::function<const std::string*(const void* row)> text = {};
+
+    /// The number, or the text, of a cell; null where it holds none. `copy` has it where the row does not.
+    const double* NumberIn(const void* row, CellValue& copy) const;
+    const std::string* TextIn(const void* row, CellValue& copy) const;
 };
 
 /// Access to a declared field. A number that is not known is the mark for "not given" in its cell.

@@ -46,6 +46,12 @@ void FieldColumns::AddGlobalRow(ColumnSpec& column, CellAccess& access) const
         else if (index)
             *index = std::get<std::int32_t>(value);
     };
+    if (access.number)
+        access.number = [isGlobal, in = access.number, number = column.globalNumber](const void* row) {
+            return isGlobal(row) ? number : in(row);
+        };
+    if (access.text)
+        access.text = [isGlobal, in = access.text](const void* row) { return isGlobal(row) ? nullptr : in(row); };
     const bool hasGlobal = column.globalNumber || column.globalIndex;
     column.locked = [isGlobal, hasGlobal, locked = column.locked](const void* row) {
         return isGlobal(row) ? !hasGlobal || (locked && locked(nullptr)) : locked && locked(row);

@@ -51,16 +51,15 @@ Replacer TextReplacer(CCellResults& results, const ColumnSpec& spec, const Repla
     };
 }
 
-Replacer FormulaReplacer(CCellResults& results, const CTableRows& rows, const ReplaceQuery& query)
+Replacer FormulaReplacer(CCellResults& results, const CTableRows& rows, int column, const ReplaceQuery& query)
 {
     const FormulaNames names = NamesForFormula(rows);
     const auto formula = std::make_shared<CKsFormula>(query.with.trimmed().sliced(1), names.names);
     if (!formula->Fault().isEmpty()) // a column that another table has, say
-        return [&results, fault = formula->Fault()](int row, int column, const CellValue&) {
-            results.Keep(row, column, fault);
-        };
-    return [&results, formula, cells = CCellFormula(rows, *formula, names)](
-               int row, int column, const CellValue& before) mutable { cells.Add(results, row, column, before); };
+        return
+            [&results, fault = formula->Fault()](int row, int at, const CellValue&) { results.Keep(row, at, fault); };
+    return [&results, formula, cells = CCellFormula(rows, *formula, names, column)](
+               int row, int, const CellValue&) mutable { cells.Add(results, row); };
 }
 
 } // namespace
@@ -84,14 +83,14 @@ std::function<bool(const CellValue& value)> CellFinder(const ColumnSpec& column,
 CReplaced ReplaceCells(const CTableRows& rows, const CellBlock& block, const ReplaceQuery& query)
 {
     CReplaced replaced{CCellResults(rows, CellBlock())}; // how many there are nobody knows yet
-    const Replacer calculate = query.IsFormula() ? FormulaReplacer(replaced.results, rows, query) : Replacer();
     const int last = std::min(block.bottom, rows.StoredRows() - 1);
     for (int column = block.left; column <= block.right; ++column) {
         const ColumnSpec& spec = rows.Column(column);
         const auto finds = CellFinder(spec, query);
-        if (!finds || (calculate && !spec.IsNumeric()))
+        if (!finds || (query.IsFormula() && !spec.IsNumeric()))
             continue;
-        const Replacer replace = calculate ? calculate : TextReplacer(replaced.results, spec, query);
+        const Replacer replace = query.IsFormula() ? FormulaReplacer(replaced.results, rows, column, query)
+                                                   : TextReplacer(replaced.results, spec, query);
         for (int row = block.top; row <= last; ++row) {
             const CellValue before = rows.Value(row, column);
             if (!finds(before))

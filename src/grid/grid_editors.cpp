@@ -282,6 +282,32 @@ QString CGridDelegate::Refusal() const
     return m_grid->Model()->Refusal(m_index.row(), m_index.column(), TextOf(m_editor));
 }
 
+const QWidget* CGridDelegate::TypedInto() const
+{
+    const bool isTyped = m_editor && m_index.isValid() && TextOf(m_editor) != m_index.data(Qt::EditRole).toString();
+    return isTyped ? m_editor.data() : nullptr;
+}
+
+CString CGridDelegate::TypedPlace() const
+{
+    return m_grid->PlaceText(m_index);
+}
+
+CString CGridDelegate::Typed() const
+{
+    return TextOf(m_editor);
+}
+
+bool CGridDelegate::Enter()
+{
+    CGridModel& model = *m_grid->Model();
+    const QSignalBlocker nobodyLooks(model);
+    if (!model.setData(m_index, TextOf(m_editor), Qt::EditRole))
+        return false;
+    model.Store(BlankRule::Fill);
+    return true;
+}
+
 bool CGridDelegate::Commit()
 {
     if (!m_editor || !m_index.isValid())

@@ -1,13 +1,15 @@
 // The cell editors and the delegate that opens them.
 #pragma once
 
+#include "ks/fc/typed_text.h"
+
 #include <QPointer>
 #include <QStyledItemDelegate>
 
 class CGenGrid;
 
 /// Opens the editor that a column asks for, and keeps it open while its text is no value of the column.
-class CGridDelegate : public QStyledItemDelegate
+class CGridDelegate : public QStyledItemDelegate, private CKsTypedText
 {
     Q_OBJECT
 public:
@@ -33,6 +35,10 @@ protected:
 
 private:
     void LostFocus(const QEvent* event);
+    const QWidget* TypedInto() const override;
+    CString TypedPlace() const override;
+    CString Typed() const override;
+    bool Enter() override;
     QString Refusal() const; // of the open editor's text
     void PaintText(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;
     void PaintChange(QPainter* painter, const QStyleOptionViewItem& cell, const QModelIndex& index) const;

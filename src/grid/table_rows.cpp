@@ -31,10 +31,9 @@ std::unique_ptr<IRowBlock> CTableRows::NewLines(int count, std::size_t at) const
 
 // ---- which rows, and where ---------------------------------------------------------------------
 
-std::size_t CTableRows::SourceRow(int row) const
+/// SourceRow of what is sorted or filtered.
+std::size_t CTableRows::ArrangedRow(int row) const
 {
-    if (m_shown.IsPlain())
-        return std::size_t(row);
     const auto shown = std::size_t(row);
     return shown < m_shown.Count() ? m_shown.SourceRow(shown) : m_rows->Count() + shown - m_shown.Count();
 }

@@ -33,7 +33,7 @@ public:
     /// Which of the source's rows are shown, and where.
     const CShownRows& Shown() const { return m_shown; }
     /// The row of the source; those behind the last row shown go on behind the last one of the source.
-    std::size_t SourceRow(int row) const;
+    std::size_t SourceRow(int row) const { return m_shown.IsPlain() ? std::size_t(row) : ArrangedRow(row); }
     std::vector<std::size_t> SourceRows(int row, int count) const;
     /// Where a row of the source is shown; -1 for a hidden one.
     int ShownRow(std::size_t sourceRow) const;
@@ -45,6 +45,12 @@ public:
     int LineNumber(int row) const { return int(SourceRow(row)) + 1; }
     /// The object of a row of the source; null for the offered one.
     void* StoredObject(int row) const;
+    /// Likewise, but null as well while anything is typed: what says all of a row, for whoever goes through many.
+    const void* UntouchedObject(int row) const
+    {
+        const std::size_t place = m_pending.empty() ? SourceRow(row) : m_rows->Count();
+        return place < m_rows->Count() ? m_rows->At(place) : nullptr;
+    }
     const std::vector<SortKey>& SortedBy() const { return m_sortedBy; }
     /// What the user typed to filter the first columns.
     const QStringList& Filters() const { return m_filters; }
@@ -100,6 +106,7 @@ protected:
     static constexpr RowKey OfferedKey = RowKey(-1); // no place and no address
 
     bool OffersRow() const { return m_rows && m_rows->IsEmpty() && !m_rows->MayBeEmpty(); }
+    std::size_t ArrangedRow(int row) const;
     int ShownRows() const { return StoredRows() + OffersRow(); }
     bool IsRow(int row) const { return row >= 0 && row < ShownRows(); }
     void* RowObject(int row) const;

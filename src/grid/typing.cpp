@@ -148,6 +148,29 @@ bool CTyping::IsTyped() const
     return m_field->isModified() && (m_field->text().size() != m_length || m_before + m_after < m_length);
 }
 
+const QWidget* CTyping::TypedInto() const
+{
+    return IsTyped() && m_field->isEnabled() ? m_field : nullptr;
+}
+
+CString CTyping::TypedPlace() const
+{
+    return m_field->accessibleName();
+}
+
+CString CTyping::Typed() const
+{
+    return m_field->text();
+}
+
+bool CTyping::Enter()
+{
+    if (!Complaint().isEmpty())
+        return false;
+    m_what.store();
+    return true;
+}
+
 bool CTyping::MayWait() const
 {
     return m_what.waitsForPage && !Complaint().isEmpty();

@@ -2,6 +2,8 @@
 // taken. Every field whose text becomes a value of the document has one.
 #pragma once
 
+#include "ks/fc/typed_text.h"
+
 #include <QObject>
 #include <QString>
 #include <functional>
@@ -43,7 +45,7 @@ struct TypedField
     bool waitsForPage = false;
 };
 
-class CTyping : public QObject
+class CTyping : public QObject, private CKsTypedText
 {
 public:
     /// A child of the field.
@@ -65,6 +67,10 @@ protected:
     bool eventFilter(QObject* object, QEvent* event) override;
 
 private:
+    const QWidget* TypedInto() const override;
+    CString TypedPlace() const override;
+    CString Typed() const override;
+    bool Enter() override;
     bool MayWait() const;
     QString Complaint() const;
     void FocusLost();

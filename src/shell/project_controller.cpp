@@ -1,6 +1,7 @@
 #include "shell/project_controller.h"
 
 #include "ks/fc/after_paint.h"
+#include "ks/fc/dialog_turn.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/findings_dialog.h"
 #include "ks/fc/frames.h"
@@ -43,7 +44,7 @@ bool CProjectController::Open(const QString& path, bool othersLater)
     m_tree->show();
     KsAfterPaint(m_tree, this, [this, handle = project.handle] { Watch(handle); });
     if (!project.findings.empty())
-        (new CKsFindingsDialog(project.path, project.findings, &m_frame))->show();
+        KsShowInTurn(new CKsFindingsDialog(project.path, project.findings, &m_frame));
     m_frame.resizeDocks({m_tree}, {ProjectTreeWidth}, Qt::Horizontal);
     m_frame.layout()->activate(); // the tree takes its room first
     const bool waits = othersLater && project.members.size() > 1;

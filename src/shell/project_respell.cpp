@@ -62,19 +62,31 @@ QList<qsizetype> ExtensionsOf(const QString& projectPath, const QByteArray& text
     return offsets;
 }
 
-Result<WriteReport> Respell(const QString& projectPath, const QString& path, const QByteArray& extension)
+/// Asks as for any file what is the user's to decide. Why it was not written: operation_canceled when he does not want
+/// it.
+std::error_code Respell(CKsDocumentFile& file, const QString& projectPath, const QString& path,
+                        const QByteArray& extension)
 {
     const FileLock lock = CKsFileUse::Lock(projectPath);
     if (lock.HeldBy())
-        return NotWritten(projectPath.toStdString(), std::make_error_code(std::errc::device_or_resource_busy));
+        return std::make_error_code(std::errc::device_or_resource_busy);
     const Result<std::string> content = ReadWholeFile(projectPath.toStdString());
     if (!content)
-        return content.error();
+        return content.error().code;
     QByteArray text = QByteArray::fromStdString(content.value());
     for (const qsizetype offset : ExtensionsOf(projectPath, text, path))
         if (text.mid(offset, extension.size()).compare(extension, Qt::CaseInsensitive) == 0)
             text.replace(offset, extension.size(), extension);
-    return WriteFileSafely(projectPath.toStdString(), text.toStdString(), {.expected = VersionOfText(content.value())});
+    std::error_code why = std::make_error_code(std::errc::io_error); // unless the writer says another
+    file.Know(projectPath, VersionOfText(content.value()));
+    const bool written = file.Write(projectPath, [&](const std::string& target, SafeFileOptions options) {
+        options.isLocked = lock.IsHeld();
+        Result<WriteReport> report = WriteFileSafely(target, text.toStdString(), options);
+        if (!report)
+            why = report.error().code;
+        return report;
+    });
+    return written ? std::error_code() : why;
 }
 
 } // namespace
@@ -92,17 +104,18 @@ void RespellMember(const CProjects& projects, const QString& oldPath, const QStr
         };
         if (std::ranges::none_of(project->members, isIt))
             continue;
-        const Result<WriteReport> respelt = Respell(project->path, newPath, after.suffix().toUtf8());
-        if (respelt) {
-            project->version = respelt.value().version;
+        CKsDocumentFile file;
+        const std::error_code why = Respell(file, project->path, newPath, after.suffix().toUtf8());
+        if (!why) {
+            project->version = file.Version().value();
             std::ranges::replace_if(project->members, isIt, QDir::cleanPath(newPath));
         }
         const QString text =
-            respelt
-                ? CKsDocumentFile::NotesOn(project->path, respelt.value())
-                : ProjectRespell::tr(
-                      "The project %1 still names %2 and could not be changed: %3.\nThe file is found all the same.")
-                      .arg(project->name, before.fileName(), KsSystemReason(respelt.error().code));
+            why == std::errc::operation_canceled ? QString()
+            : why                                ? ProjectRespell::tr(
+                                                       "The project %1 still names %2 and could not be changed: %3.\nThe file is found all the same.")
+                        .arg(project->name, before.fileName(), KsSystemReason(why))
+                  : file.SaveNotes();
         if (text.isEmpty())
             continue;
         QTimer::singleShot(0, qApp, [text] { KsMessageBox(text); }); // when the save is over

@@ -1,8 +1,11 @@
 #include "shell/recovery.h"
 
+#include "ks/fc/dialog_turn.h"
 #include "ks/fc/doc_template.h"
+#include "ks/fc/findings_dialog.h"
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
+#include "ks/fc/project_doc.h"
 #include "shell/plugin_loader.h"
 #include "shell/recovery_dialog.h"
 #include "shell/recovery_folder.h"
@@ -10,6 +13,7 @@
 
 #include <QFile>
 #include <QFileInfo>
+#include <QUndoStack>
 #include <algorithm>
 
 namespace {
@@ -25,6 +29,14 @@ CRecoverable::State StateOf(const CRecoveryHeader& header)
     return isSame ? CRecoverable::Same : CRecoverable::Changed;
 }
 
+/// The program ended in the middle of the save: what was kept is what the file holds, byte for byte.
+bool IsSaved(const CRecoveryHeader& header)
+{
+    const QFileInfo file(header.path);
+    return !header.path.isEmpty() && header.typed.isEmpty() && file.isFile() && file.size() == header.contentSize &&
+           FileHash(header.path) == header.contentHash;
+}
+
 /// Of a document that stands beside its file; files of one name in two folders are told apart by a number.
 QString FreeTitle(const QString& name)
 {
@@ -38,6 +50,17 @@ QString FreeTitle(const QString& name)
     return title;
 }
 
+/// A document that was open before has read the dates that its file lacks at another time: they would be changes.
+void TakeDates(CKsDoc& document, const HDDateTime& date)
+{
+    auto* const reader = qobject_cast<CKsProjectDoc*>(&document);
+    const bool isAsRead = reader && document.UndoStack().count() == 0;
+    document.TakeDateOfFile(date);
+    CString why;
+    if (isAsRead && reader->Reload(why)) // undo leads to them, too
+        document.UndoStack().clear();
+}
+
 } // namespace
 
 QString CRecoverable::Name() const
@@ -48,16 +71,31 @@ QString CRecoverable::Name() const
 void CRecovery::Offer()
 {
     std::vector<CRecoverable> found = Find();
-    if (!found.empty())
-        (new CRecoveryDialog(*this, std::move(found), &m_frame))->open();
+    if (found.empty())
+        return;
+    // It comes first: what it opens has lists of its own to show.
+    QList<CKsFindingsDialog*> lists = m_frame.findChildren<CKsFindingsDialog*>();
+    lists.removeIf([](const CKsFindingsDialog* list) { return !list->isVisible(); });
+    for (CKsFindingsDialog* list : lists)
+        list->hide();
+    auto* dialog = new CRecoveryDialog(*this, std::move(found), &m_frame);
+    dialog->setWindowModality(Qt::WindowModal);
+    KsShowInTurn(dialog);
+    for (CKsFindingsDialog* list : lists)
+        KsShowInTurn(list);
 }
 
 std::vector<CRecoverable> CRecovery::Find()
 {
     std::vector<CRecoverable> found;
     for (const QString& file : m_folder.TakeOver()) {
+        const auto header = ReadRecoveryHeader(file);
+        if (header && IsSaved(*header)) {
+            QFile::remove(file);
+            continue;
+        }
         CRecoverable& item = found.emplace_back(CRecoverable{.file = file});
-        if (const auto header = ReadRecoveryHeader(file)) {
+        if (header) {
             item.header = *header;
             item.editor = m_plugins.TemplateFor(QStringLiteral("x") + header->extension);
         } else {
@@ -94,6 +132,8 @@ bool CRecovery::Open(const CRecoverable& item)
     }
     if (!document)
         return false;
+    if (document == open)
+        TakeDates(*document, item.header.dateOfFile);
     if (!document->TakeContent(std::move(content), tr("Recovered changes"))) {
         if (document != open)
             Close(document);

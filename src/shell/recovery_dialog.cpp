@@ -10,6 +10,7 @@
 #include <QApplication>
 #include <QDialogButtonBox>
 #include <QDir>
+#include <QFileInfo>
 #include <QHeaderView>
 #include <QLabel>
 #include <QPushButton>
@@ -29,6 +30,18 @@ enum Column
     Columns
 };
 
+/// Files of one name in several folders are told with their folders.
+QString NameAmong(const std::vector<CRecoverable>& items, const CRecoverable& item)
+{
+    const bool isAlone = std::ranges::none_of(items, [&item](const CRecoverable& each) {
+        return each.Name() == item.Name() && each.header.path != item.header.path;
+    });
+    if (isAlone || item.header.path.isEmpty())
+        return item.Name();
+    return CRecoveryDialog::tr("%1 in %2")
+        .arg(item.Name(), QDir::toNativeSeparators(QFileInfo(item.header.path).path()));
+}
+
 } // namespace
 
 CRecoveryDialog::CRecoveryDialog(CRecovery& recovery, std::vector<CRecoverable> items, QWidget* parent)
@@ -47,6 +60,7 @@ CRecoveryDialog::CRecoveryDialog(CRecovery& recovery, std::vector<CRecoverable> 
     m_table->setSelectionBehavior(QAbstractItemView::SelectRows);
     m_table->setSelectionMode(QAbstractItemView::SingleSelection);
     m_table->setTabKeyNavigation(false);
+    m_table->setTextElideMode(Qt::ElideMiddle); // a folder differs at its end, most of the time
     m_table->verticalHeader()->hide();
     m_table->horizontalHeader()->setStretchLastSection(true);
     auto* buttons = new QDialogButtonBox(this);
@@ -77,7 +91,8 @@ void CRecoveryDialog::Fill()
         const CRecoverable& item = m_items[std::size_t(row)];
         const bool isDamaged = item.state == CRecoverable::Damaged;
         const QString path = QDir::toNativeSeparators(isDamaged ? item.file : item.header.path);
-        m_table->setItem(row, Document, PlainCell(isDamaged ? tr("A damaged recovery file") : item.Name(), path));
+        m_table->setItem(row, Document,
+                         PlainCell(isDamaged ? tr("A damaged recovery file") : NameAmong(m_items, item), path));
         m_table->setItem(row, Time, PlainCell(isDamaged ? QString() : KsDateTimeText(item.header.time.toLocalTime())));
         m_table->setItem(row, What, PlainCell(tr("Comparing...")));
     }
@@ -135,8 +150,10 @@ ProcessCopy::Answer CRecoveryDialog::Look(CRecoverable item) const
 QString CRecoveryDialog::Description(const CRecoverable& item) const
 {
     const auto differences = m_recovery.Compare(item);
-    const QString what = differences ? CKsDifferenceDialog::Summary(*differences)
-                                     : tr("What differs is not known: the file cannot be read.");
+    QString what = differences ? CKsDifferenceDialog::Summary(*differences)
+                               : tr("What differs is not known: the file cannot be read.");
+    for (const QString& typed : item.header.typed)
+        what += u'\n' + tr("Typed but not entered, as it is no value: %1").arg(typed);
     switch (item.state) {
     case CRecoverable::Damaged:
         return tr("It cannot be read, and can only be discarded.");
@@ -186,7 +203,7 @@ void CRecoveryDialog::Compare()
     QApplication::setOverrideCursor(Qt::WaitCursor);
     const auto differences = m_recovery.Compare(m_items[std::size_t(row)]);
     QApplication::restoreOverrideCursor();
-    const QString title = tr("Recovered Changes of %1").arg(m_items[std::size_t(row)].Name());
+    const QString title = tr("Recovered Changes of %1").arg(NameAmong(m_items, m_items[std::size_t(row)]));
     if (differences)
         (new CKsDifferenceDialog({title, tr("Now"), tr("Recovered")}, *differences, this))->open();
     else
@@ -200,7 +217,7 @@ void CRecoveryDialog::Discard()
         return;
     const CRecoverable& item = m_items[std::size_t(row)];
     if (item.state != CRecoverable::Damaged &&
-        KsMessageBox(tr("Discard the changes to %1? They cannot be brought back.").arg(item.Name()),
+        KsMessageBox(tr("Discard the changes to %1? They cannot be brought back.").arg(NameAmong(m_items, item)),
                      QMessageBox::Discard | QMessageBox::Cancel, this) != QMessageBox::Discard)
         return;
     m_recovery.Discard(item);

@@ -19,7 +19,7 @@ constexpr std::uintmax_t LongestHeader = 64 * 1024, LongestContent = 0x7fff'ffff
 
 namespace Key {
 constexpr QLatin1String Format("format"), Path("file"), Size("fileSize"), Hash("fileHash"), Extension("extension"),
-    Title("title"), Time("time"), DateOfFile("dateOfFile"), ContentSize("size"), ContentHash("hash");
+    Title("title"), Time("time"), DateOfFile("dateOfFile"), Typed("typed"), ContentSize("size"), ContentHash("hash");
 }
 
 QByteArray HashOf(const std::string& text)
@@ -72,14 +72,17 @@ std::optional<CRecoveryHeader> FromJson(const QJsonObject& json)
                            .extension = json.value(Key::Extension).toString(),
                            .title = json.value(Key::Title).toString(),
                            .time = QDateTime::fromString(json.value(Key::Time).toString(), Qt::ISODateWithMs),
-                           .dateOfFile = DateFrom(json.value(Key::DateOfFile).toArray())};
+                           .dateOfFile = DateFrom(json.value(Key::DateOfFile).toArray()),
+                           .typed = json.value(Key::Typed).toVariant().toStringList(),
+                           .contentSize = json.value(Key::ContentSize).toInteger(),
+                           .contentHash = json.value(Key::ContentHash).toString().toLatin1()};
     // The system takes a name up to its first zero: another file than the one that is looked at here.
-    const bool isPath = !header.path.contains(QChar::Null) && QDir::isAbsolutePath(header.path) && QDir::cleanPath(header.path) == header.path &&
-                        KsHasExtension(header.path, header.extension);
+    const bool isPath = !header.path.contains(QChar::Null) && QDir::isAbsolutePath(header.path) &&
+                        QDir::cleanPath(header.path) == header.path && KsHasExtension(header.path, header.extension);
     const bool isWhole = json.value(Key::Format).toInteger() == Format && header.time.isValid() &&
                          header.extension.startsWith(u'.') && (header.path.isEmpty() || isPath) &&
                          (header.hash.isEmpty() || IsHash(QString::fromLatin1(header.hash))) &&
-                         IsHash(json.value(Key::ContentHash).toString());
+                         IsHash(QString::fromLatin1(header.contentHash));
     return isWhole ? std::optional(header) : std::nullopt;
 }
 
@@ -107,6 +110,7 @@ std::string RecoveryText(const CRecoveryHeader& header, const std::string& conte
                            {Key::Title, header.title},
                            {Key::Time, header.time.toUTC().toString(Qt::ISODateWithMs)},
                            {Key::DateOfFile, PartsOf(header.dateOfFile)},
+                           {Key::Typed, QJsonArray::fromStringList(header.typed)},
                            {Key::ContentSize, qint64(content.size())},
                            {Key::ContentHash, QString::fromLatin1(HashOf(content))}};
     std::string text = QJsonDocument(json).toJson(QJsonDocument::Compact).toStdString() + '\n';
@@ -145,12 +149,11 @@ std::optional<CRecoveryHeader> ReadRecovery(std::FILE* stream, std::uintmax_t fi
     if (!header || start < 0)
         return {};
     // Its size is known before anything is read: a file may say whatever it likes.
-    const auto size = std::uintmax_t(json->value(Key::ContentSize).toInteger());
+    const auto size = std::uintmax_t(header->contentSize);
     if (size > LongestContent || fileSize != std::uintmax_t(start) + size)
         return {};
     std::string text(std::size_t(size), '\0');
-    if (std::fread(text.data(), 1, text.size(), stream) != text.size() ||
-        HashOf(text) != json->value(Key::ContentHash).toString().toLatin1())
+    if (std::fread(text.data(), 1, text.size(), stream) != text.size() || HashOf(text) != header->contentHash)
         return {};
     if (content)
         *content = std::move(text);

@@ -5,7 +5,7 @@
 
 #include <QByteArray>
 #include <QDateTime>
-#include <QString>
+#include <QStringList>
 #include <cstdint>
 #include <cstdio>
 #include <optional>
@@ -23,6 +23,9 @@ struct CRecoveryHeader
     QString title{};
     QDateTime time{};        // of the content
     HDDateTime dateOfFile{}; // what stands in the content for dates that the file lacked (CKsDoc); may be unset
+    QStringList typed{};     // texts that were typed and are no values, with their places: they are not in the content
+    qint64 contentSize = 0;  // and hash: of what is kept, as the file that was read says
+    QByteArray contentHash{};
 };
 
 /// The text of such a file.

@@ -3,6 +3,7 @@
 #include "files/file_content.h"
 #include "ks/fc/doc.h"
 #include "ks/fc/doc_template.h"
+#include "ks/fc/typed_text.h"
 #include "shell/recovery_file.h"
 #include "shell/recovery_folder.h"
 
@@ -15,8 +16,10 @@
 namespace {
 
 /// In the copy of the process: whose changes these are, and what they come to.
-std::error_code WriteContent(const CKsDoc& document, CRecoveryHeader header, const QString& file)
+std::error_code WriteContent(CKsDoc& document, CRecoveryHeader header, const QString& file)
 {
+    if (ProcessCopy::IsThis())
+        header.typed = CKsTypedText::EnterIn(document);
     const Result<std::string> content = document.ContentText();
     if (!content)
         return content.error().code ? content.error().code : std::make_error_code(std::errc::invalid_argument);
@@ -34,9 +37,12 @@ CSnapshot::CSnapshot(CKsDoc& document, CRecoveryFolder& folder, std::chrono::mil
     : m_document(document), m_folder(folder), m_delay(delay)
 {
     m_timer.setSingleShot(true);
+    m_look.start(delay);
+    connect(&m_look, &QTimer::timeout, this, &CSnapshot::LookAtTyping);
     connect(&m_timer, &QTimer::timeout, this, &CSnapshot::Write);
     connect(&document.UndoStack(), &QUndoStack::indexChanged, this, &CSnapshot::StepMade);
     connect(&document, &CKsDoc::TitleChanged, this, &CSnapshot::StateChanged);
+    connect(&document, &CKsDoc::FileGoneChanged, this, &CSnapshot::StateChanged);
 }
 
 CSnapshot::~CSnapshot()
@@ -61,7 +67,7 @@ void CSnapshot::Continue(const QString& file)
 
 void CSnapshot::StepMade()
 {
-    if (m_document.UndoStack().isClean())
+    if (m_document.UndoStack().isClean() && !m_document.IsFileGone())
         return;
     if (++m_steps >= Steps && !m_failure)
         Write();
@@ -71,8 +77,26 @@ void CSnapshot::StepMade()
 
 void CSnapshot::StateChanged()
 {
-    if (!m_document.IsModified())
-        Drop();
+    if (!m_document.IsUnsaved())
+        return Drop();
+    // A file that is gone makes what is shown one more state that has to be kept, though nobody has made a step.
+    const bool isKept = !m_file.isEmpty() && !m_isDropped;
+    if (m_document.IsFileGone() && !isKept && !m_timer.isActive()) {
+        ++m_steps;
+        m_timer.start(m_delay);
+    }
+}
+
+/// Nobody says that somebody types, and nothing is changed by it.
+void CSnapshot::LookAtTyping()
+{
+    const QStringList typed = CKsTypedText::Of(m_document);
+    if (typed == m_typed)
+        return;
+    if (typed.isEmpty() && !m_document.IsUnsaved())
+        Drop(); // it was taken back
+    else
+        Write();
 }
 
 void CSnapshot::Write()
@@ -112,10 +136,12 @@ std::error_code CSnapshot::StartWriter()
                                  .title = m_document.GetTitle(),
                                  .time = QDateTime::currentDateTimeUtc(),
                                  .dateOfFile = m_document.DateOfFile()};
+    QStringList typed = CKsTypedText::Of(m_document);
     Result<ProcessCopy> writer = ProcessCopy::Start([&] { return WriteContent(m_document, header, m_file); });
     if (!writer)
         return writer.error().code;
     m_steps = 0;
+    m_typed = std::move(typed);
     m_writer = std::move(writer.value());
     m_folder.WriterStarts();
     if (m_writer->Ended() == -1) {
@@ -156,6 +182,7 @@ void CSnapshot::Fail(std::error_code why)
     if (why == std::errc::operation_not_supported) {
         m_document.disconnect(this);
         m_document.UndoStack().disconnect(this);
+        m_look.stop();
         Drop();
         return;
     }
@@ -169,11 +196,13 @@ void CSnapshot::SetFailure(std::error_code why)
         emit FailureChanged();
 }
 
-/// Nothing is left to save, or nobody wants it. The end of a writer is not waited for: the system takes its time for it.
+/// Nothing is left to save, or nobody wants it. The end of a writer is not waited for: the system takes its time for
+/// it.
 void CSnapshot::Drop()
 {
     m_timer.stop();
     m_steps = 0;
+    m_typed.clear();
     if (!m_file.isEmpty())
         QFile::remove(m_file);
     if (m_writer) {

@@ -4,7 +4,7 @@
 #include "files/process_copy.h"
 
 #include <QObject>
-#include <QString>
+#include <QStringList>
 #include <QTimer>
 #include <chrono>
 #include <memory>
@@ -14,7 +14,7 @@ class CKsDoc;
 class CRecoveryFolder;
 class QSocketNotifier;
 
-/// Keeps one document's content in a recovery file while it is modified. A copy of the process writes the file, so that
+/// Keeps one document's content in a recovery file while it is unsaved. A copy of the process writes the file, so that
 /// the user does not wait. The file goes when nothing is left to save, and with this.
 class CSnapshot : public QObject
 {
@@ -42,6 +42,7 @@ signals:
 private:
     void StepMade();
     void StateChanged();
+    void LookAtTyping();
     void Write();
     std::error_code StartWriter();
     void WriterEnded();
@@ -53,7 +54,8 @@ private:
     CKsDoc& m_document;
     CRecoveryFolder& m_folder;
     std::chrono::milliseconds m_delay;
-    QTimer m_timer;
+    QTimer m_timer, m_look;
+    QStringList m_typed; // texts not stored yet that the file, or who writes it, knows of
     int m_steps = 0; // that the file, or who writes it, does not know of
     std::error_code m_failure;
     QString m_file;

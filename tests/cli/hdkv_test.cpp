@@ -2,7 +2,9 @@
 #include "cli/terminal.h"
 #include "data/hd_support.h"
 
+#include "base/utf8_path.h"
 #include "files/file_lock.h"
+#include "files/temporary_file.h"
 
 #include <algorithm>
 #include <cstdlib>
@@ -330,5 +332,23 @@ TEST_F(Hdkv, ProgramsThatChangeOneFileAtOnceLoseNothing)
     EXPECT_EQ(Run("show a.hdkv"), 0) << "reading needs no lock";
     EXPECT_EQ(Run("fmt --check a.hdkv"), 0) << err;
     EXPECT_EQ(Text("a.hdkv"), before);
+}
+
+TEST_F(Hdkv, WhatAKilledSaveDisplacedIsNamed)
+{
+    {
+        TemporaryFile left(PlatformFile::Native());
+        ASSERT_FALSE(left.Create(PathFromUtf8(Path("a.hdkv")).parent_path()));
+        ASSERT_FALSE(left.Write("theirs") || left.Finish(false) || left.Protect({PathFromUtf8(Path("a.hdkv"))}));
+        left.Release();
+    }
+    EXPECT_EQ(Run("get a.hdkv G_f"), 0);
+    EXPECT_TRUE(err.empty()) << "it only reads";
+    EXPECT_EQ(Run("set a.hdkv G_f 1"), 0);
+    EXPECT_NE(err.find("A save of \"a.hdkv\" was cut off; what another program may have written"), std::string::npos)
+        << err;
+    EXPECT_EQ(Text("a.hdkv.displaced-1"), "theirs");
+    EXPECT_EQ(Run("set a.hdkv G_f 2"), 0);
+    EXPECT_TRUE(err.empty()) << err;
 }
 #endif

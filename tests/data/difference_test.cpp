@@ -46,6 +46,8 @@ TEST(Difference, IsToldValueByValue)
         {"K = 0, 0, 0, 0, 0, 0\n", "K = 2024, 5, 0, 0, 0, 0\n", " K 1.1@2: 0 -> 2024\n K 1.2@2: 0 -> 5\n2 0 0 1"},
         {"K = <a>\n", "K = \"a\"\n", " K 1.1@2: <a> -> \"a\"\n1 0 0 1"},
         {"K = true\nM = 1\n", "M = 1\nN = 2\n", " K 1.0@2: true -> \n N 1.0@3:  -> 2\n0 1 1 1"},
+        {"K = 1e10, 2\nM = 1e+10, 2\n", "K = 5, 1e10\n",
+         " K 1.1@2:  -> 5\n K 1.2@2: 2 -> \n M 1.0@3: , 2 -> \n2 0 1 1"},
         {"[S]\n[/S]\n", "[S]\nK = 1\n[/S]\n", "S K 1.0@3:  -> 1\n0 1 0 1"},
         // A line that comes, goes or changes among others is one difference, wherever it stands.
         {Lines(0, 9), Lines(-1, 9), "L D 1.0@3:  -> \"A\", -1\n0 1 0 1"},

@@ -85,6 +85,33 @@ TEST_F(Locks, AFileOfSeveralNamesHasOneLock)
     EXPECT_TRUE(FileLock::Try(Path("a.hdkv"), "second").HeldBy());
 }
 
+TEST_F(Locks, OneGoesOnInAFolderOfAnotherNameAndKnowsThatItWasRemoved)
+{
+    fs::create_directory(m_folder / "p");
+    Write("p/river.hdkv", "x");
+    FileLock lock = FileLock::Try(Path("p/river.hdkv"), "first");
+    ASSERT_TRUE(lock.IsHeld());
+    EXPECT_FALSE(lock.WasRemoved()());
+    fs::rename(m_folder / "p", m_folder / "q");
+    EXPECT_FALSE(lock.WasRemoved()()) << "it went along";
+    EXPECT_TRUE(lock.IsFor(Path("q/river.hdkv")) && !lock.IsFor(Path("p/river.hdkv")));
+    fs::create_directory(m_folder / "p");
+    EXPECT_TRUE(lock.WasRemoved()()) << "who opens the file of that name now finds none";
+    lock.Follow(Path("q/river.hdkv"));
+    EXPECT_FALSE(lock.WasRemoved()());
+    fs::remove(lock.Path());
+    EXPECT_TRUE(lock.WasRemoved()());
+    const FileLock other = FileLock::Try(Path("q/river.hdkv"), "second");
+    EXPECT_TRUE(other.IsHeld() && lock.WasRemoved()() && !lock.IsFor(Path("q/river.hdkv")));
+    lock.Release();
+    EXPECT_TRUE(FileLock::Try(Path("q/river.hdkv"), "third").HeldBy()) << "another's stays";
+    lock = FileLock::Try(Path("q/river.kvnw"), "first");
+    fs::rename(m_folder / "q", m_folder / "r");
+    lock.Follow(Path("r/river.kvnw"));
+    lock.Release();
+    EXPECT_FALSE(fs::exists(m_folder / "r/.river.kvnw.lock")) << "the own one goes wherever it stands";
+}
+
 TEST_F(Locks, WhatADeadProgramOrAnybodyElseLeavesIsNoLock)
 {
     Write(".river.hdkv.lock", "program kvrshell\nprocess 1\nuser a b\nhost h\nsince 17\n");

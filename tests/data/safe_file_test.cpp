@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <tuple>
 #ifdef __linux__
 #include <sys/stat.h>
 #include <sys/xattr.h>
@@ -44,6 +45,59 @@ std::error_code DiskFull()
 }
 
 } // namespace
+
+TEST_F(SafeFile, WhatASaveThatWasCutOffDisplacedIsNamedByTheNextOne)
+{
+    // The program ends at each call from the swap on: nothing that it does then has any effect.
+    for (const char* other : {"", "another program's"})
+        for (std::size_t last = 0;; ++last) {
+            SCOPED_TRACE(other + std::to_string(last));
+            for (const auto& each : fs::directory_iterator(m_folder))
+                fs::remove(each);
+            Write("a.HDKV", "old");
+            Write("b.HDKV", "another file");
+            FaultyPlatform killed;
+            std::size_t calls = 0;
+            bool hasSwapped = false;
+            killed.fault = [&](const std::string& call) {
+                if (call == "Exchange" && *other)
+                    Write("a.HDKV", other);
+                hasSwapped = hasSwapped || call == "Exchange";
+                return hasSwapped && ++calls > last ? std::make_error_code(std::errc::io_error) : std::error_code();
+            };
+            std::ignore =
+                WriteFileSafely(Path("a.HDKV"), "new", {.platform = &killed, .expected = VersionOfText("old")});
+            const bool wasCutOff = FileCount() > 2 && !fs::exists(m_folder / "a.HDKV.displaced-1");
+            const auto left = NameLeftBehind(Path("a.hdkv"));
+            EXPECT_TRUE(NameLeftBehind(Path("b.HDKV")).empty());
+            const bool isAway = *other && Text("a.HDKV") == "new";
+            if (wasCutOff && isAway) {
+                ASSERT_EQ(left.size(), 1u);
+                EXPECT_EQ(left.front(), Path("a.hdkv.displaced-1"));
+                EXPECT_EQ(ReadText(PathFromUtf8(left.front())), other);
+            } else {
+                EXPECT_TRUE(left.empty()) << "nobody misses it";
+            }
+            if (calls <= last)
+                break;
+        }
+    // A save says so itself, when it is certain that nobody else is at it.
+    Write("a.HDKV", "old");
+    FaultyPlatform killed;
+    bool hasSwapped = false;
+    killed.fault = [&](const std::string& call) {
+        if (call == "Exchange")
+            Write("a.HDKV", "another program's");
+        return std::exchange(hasSwapped, hasSwapped || call == "Exchange") ? std::make_error_code(std::errc::io_error)
+                                                                           : std::error_code();
+    };
+    std::ignore = WriteFileSafely(Path("a.HDKV"), "new", {.platform = &killed, .expected = VersionOfText("old")});
+    EXPECT_TRUE(WriteFileSafely(Path("a.HDKV"), "newer").value().leftBehind.empty());
+    const auto told = WriteFileSafely(Path("a.HDKV"), "newest", {.isLocked = true});
+    ASSERT_EQ(told.value().leftBehind.size(), 1u);
+    EXPECT_EQ(ReadText(PathFromUtf8(told.value().leftBehind.front())), "another program's");
+    EXPECT_TRUE(WriteFileSafely(Path("a.HDKV"), "last", {.isLocked = true}).value().leftBehind.empty());
+}
 
 TEST_F(SafeFile, WritesNewAndReplacesOld)
 {
@@ -396,7 +450,7 @@ TEST_F(SafeFile, WhatIsSwappedOutIsNoLeftOver)
         };
         const auto written = WriteFileSafely(Path("a.hdkv"), "new", {.platform = &platform});
         ASSERT_TRUE(written);
-        const auto& [unconfirmed, lost, displaced, unknown, notRenamed, version, inPlace] = written.value();
+        const auto& [unconfirmed, lost, displaced, unknown, leftBehind, notRenamed, version, inPlace] = written.value();
         EXPECT_EQ(unknown.value(), failing == std::string("Status") ? EIO : 0);
         platform.fault = [](const std::string&) { return std::error_code(); };
         platform.aged = std::int64_t(7200) * 1'000'000'000;

@@ -167,6 +167,28 @@ class Outside(Case):
         editor.press('Escape')
         self.assertEqual(self.level(), '2.55')
 
+    def test_a_file_that_is_gone_is_asked_for(self):
+        editor = self.open()
+        editor.settle(0.6)
+        removed = 'was removed or renamed by another program'
+        for key in ('ctrl+F4', 'ctrl+w', 'ctrl+q'):
+            os.remove(self.path())
+            self.wait_told(removed)
+            self.assertFalse(editor.modified)
+            editor.press(key)
+            self.assertIn(removed, '\n'.join(editor.answer('Cancel')))
+            self.assertEqual(self.level(), '1.25', 'it is open still')
+            self.choose('Save Again')
+            self.wait_untold('another program')
+        os.remove(self.path())
+        self.wait_told(removed)
+        editor.press('ctrl+w')
+        editor.box()
+        editor.press('Return')  # Save
+        wait_for(lambda: not editor.windows(), 'the window closes')
+        self.assertEqual(self.saved().records('InitList')[0], FIRST)
+        self.assert_no_message()
+
     def test_each_kind_in_a_project(self):
         editor = self.open_project()
         editor.settle(0.6)

@@ -1,7 +1,9 @@
 """The program is killed and started again: what was typed comes back."""
 import glob
 import os
+import time
 
+import case
 import samples
 from case import Case
 from screen import Table
@@ -14,7 +16,7 @@ class Recovery(Case):
     def kept(self):
         """What is kept of unsaved changes, by the name of the file; of new documents by their title."""
         texts = {}
-        for path in glob.glob(f'{self.folder}/state/KVR/KVR Shell/recovery/*/*.recovery'):
+        for path in self.recovery_files():
             try:
                 with open(path, encoding='utf-8') as file:
                     header, text = file.readline(), file.read()
@@ -22,6 +24,17 @@ class Recovery(Case):
                 continue
             texts[header.split('"file":"')[1].split('"')[0].split('/')[-1] or 'new'] = text
         return texts
+
+    def recovery_files(self):
+        return glob.glob(f'{self.folder}/state/KVR/KVR Shell/recovery/*/*.recovery')
+
+    def header(self):
+        """The first lines of what is kept."""
+        headers = []
+        for path in self.recovery_files():
+            with open(path, encoding='utf-8') as file:
+                headers.append(file.readline())
+        return '\n'.join(headers)
 
     def wait_until_kept(self, name, text):
         wait_for(lambda: text in self.kept().get(name, ''), f'{text} of {name} is kept', WAIT)
@@ -150,6 +163,74 @@ class Recovery(Case):
         self.wait_until_kept('moor.HDKV', '2.75')
         wait_for(lambda: not editor.frame.all('label', notice), 'the notice goes')
         self.assert_no_message()
+
+    def test_what_stands_in_an_open_cell_or_field(self):
+        editor = self.open()
+        editor.put(1, 3, '4242.5', leave=None)
+        self.wait_until_kept('moor.HDKV', '4242.5')
+        self.assertFalse(editor.modified, 'nothing has been entered')
+        editor.type('25')  # nobody closed it
+        self.wait_until_kept('moor.HDKV', '4242.525')
+        editor = self.restart('moor.HDKV')
+        self.assertEqual(self.lines()['moor.HDKV'][1], 'Sections: 1; values changed: 1.')
+        self.choose('moor.HDKV', 'Open')
+        wait_for(lambda: editor.table().cell(1, 3).name == '4242.525', 'what was typed is shown')
+        editor.press('ctrl+z')
+        wait_for(lambda: editor.table().cell(1, 3).name == '1.25' and not editor.modified, 'undo leads to the file')
+        editor.fill('Discharge', '17.5.3', leave=None)
+        wait_for(lambda: '17.5.3' in self.header(), 'what is no value is kept', WAIT)
+        self.restart('moor.HDKV')
+        self.assertEqual(self.lines()['moor.HDKV'][1],
+                         'Nothing differs.\nTyped but not entered, as it is no value: Discharge: 17.5.3')
+        case.session.picture(f'{self.folder}/typed.png')
+        self.choose('moor.HDKV', 'Discard')
+        self.editor.answer('Discard')
+
+    def test_a_folder_of_another_name_and_files_of_one_name(self):
+        for folder in ('a', 'b'):
+            os.makedirs(f'{self.folder}/{folder}')
+            samples.write(f'{self.folder}/{folder}/moor.HDKV', samples.hd_text())
+        editor = self.start('b/moor.HDKV')
+        editor.put(1, 3, '2.625')
+        self.wait_until_kept('moor.HDKV', '2.625')
+        os.rename(f'{self.folder}/b', f'{self.folder}/c')
+        editor.press('ctrl+s')
+        editor.answer('Yes')  # it cannot be written; under another name?
+        editor.box()
+        editor.press('ctrl+a')
+        editor.type(f'{self.folder}/c/moor.HDKV\n')
+        editor.answer('Yes')  # replace it
+        wait_for(lambda: not editor.modified, 'it is saved where it stands now')
+        self.assertIn('2.625', samples.Saved(f'{self.folder}/c/moor.HDKV').records('InitList')[0])
+        self.assert_no_message()
+        editor.put(1, 3, '2.75')
+        self.wait_until_kept('moor.HDKV', '2.75')
+        editor = self.restart('a/moor.HDKV')
+        editor.press('Escape')  # Later
+        editor.put(1, 3, '2.875')
+        wait_for(lambda: len(self.recovery_files()) == 2, 'both are kept', WAIT)
+        for language in ('ja_JP', None):
+            self.editor = self.start(language=language, recovers=True)
+            self.editor.box()
+            case.session.picture(f'{self.folder}/names_{language}.png')
+        self.assertEqual(sorted(self.lines()), [f'moor.HDKV in {self.folder}/{each}' for each in 'ac'])
+
+    def test_a_list_of_what_was_not_taken_comes_after_it(self):
+        text = samples.hd_text({'InitList': ['"MOORBECK", 100, 1.25, 10.5', '"MOORBECK", 200, "high", 10.5']})
+        editor = self.open(text)
+        editor.box()
+        editor.press('Escape')  # the list
+        editor.put(1, 3, '2.625')
+        self.wait_until_kept('moor.HDKV', '2.625')
+        for answer in ('Escape', 'alt+o'):  # Later; Open
+            editor = self.restart('moor.HDKV')
+            time.sleep(1)
+            self.assertEqual(editor.box().name, 'Recover Changes', 'alone')
+            editor.press(answer)
+            wait_for(lambda: 'Values Not Taken' in editor.box().name, 'the list comes, with the keyboard')
+            editor.press('Escape')
+            self.assert_no_message()
+        wait_for(lambda: editor.table().cell(1, 3).name == '2.625', 'it was opened')
 
     def test_a_clean_end_leaves_nothing(self):
         editor = self.open()

@@ -127,8 +127,11 @@ TEST_F(TypedNumber, NamesOfAFormulaStandForTheNumbersGiven)
 {
     const CKsFormula formula("max(value, 2) * factor", {"value", "factor"});
     ASSERT_EQ(formula.Fault(), "");
-    EXPECT_EQ(formula.Value(std::array{1.0, 10.0}), 20);
-    EXPECT_EQ(formula.Value(std::array{3.0, 0.5}), 1.5);
+    formula.Number(0) = 1;
+    formula.Number(1) = 10;
+    EXPECT_EQ(formula.Value(), 20);
+    formula.Number(0) = 3;
+    EXPECT_EQ(formula.Value(), 30);
     EXPECT_NE(CKsFormula("valu*2", {"value"}).Fault(), "");
     EXPECT_EQ(CKsFormula(QString("1").leftJustified(1000)).Fault(), "");
     EXPECT_NE(CKsFormula(QString("1").leftJustified(1001)).Fault(), "");

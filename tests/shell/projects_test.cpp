@@ -3,6 +3,7 @@
 
 #include <QLabel>
 #include <QTreeWidget>
+#include <filesystem>
 
 using testing::ElementsAre;
 
@@ -101,6 +102,35 @@ TEST_F(ShellTest, AMemberThatIsRespeltIsRespeltInTheProjectFile)
         << "a member that is spelt in another case is found, and follows as well";
     QFile file(other);
     EXPECT_TRUE(file.open(QIODevice::ReadOnly) && file.readAll().contains("File = <C.TST>"));
+}
+
+TEST_F(ShellTest, AProjectFileOfSeveralNamesIsAskedAbout)
+{
+    const auto content = [](const QString& path) {
+        QFile file(path);
+        return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+    };
+    for (const auto answer : {QMessageBox::Cancel, QMessageBox::No, QMessageBox::Yes}) {
+        SCOPED_TRACE(answer);
+        Write("a.tst");
+        const QString path = WriteProject("p.kvrp", "File = <a.tst>\n"), other = Path("p.other");
+        std::filesystem::create_hard_link(path.toStdString(), other.toStdString());
+        ASSERT_TRUE(frame->OpenFile(path));
+        asked.clear();
+        answers = {answer};
+        ASSERT_TRUE(QFile::rename(Path("a.tst"), Path("a.TST")));
+        ViewOf("a.tst")->GetDocument()->SetPathName(Path("a.TST"));
+        ASSERT_EQ(asked.size(), 1);
+        EXPECT_TRUE(asked.front().contains("p.kvrp is one of 2 names of the same file"));
+        EXPECT_EQ(content(path).contains("a.TST"), answer != QMessageBox::Cancel);
+        EXPECT_EQ(content(other).contains("a.TST"), answer == QMessageBox::Yes);
+        QCoreApplication::processEvents();
+        EXPECT_EQ(asked.size(), 1) << "what he does not want is no failure";
+        Action("actionCloseProject")->trigger();
+        Settle();
+        for (const QString& each : {path, other, Path("a.TST")})
+            QFile::remove(each);
+    }
 }
 
 TEST_F(ShellTest, AProjectFileThatCannotFollowIsNamed)

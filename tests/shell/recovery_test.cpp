@@ -9,6 +9,7 @@
 #include <QLabel>
 #include <QPushButton>
 #include <QRegularExpression>
+#include <QTableView>
 #include <QTableWidget>
 #include <sys/resource.h>
 #include <sys/stat.h>
@@ -87,6 +88,11 @@ protected:
     /// The program ends as in a crash, and starts anew: what was kept stands in a folder that nobody holds.
     std::vector<CRecoverable> Crash()
     {
+        CrashUnseen();
+        return Find();
+    }
+    void CrashUnseen()
+    {
         const QString left = Folder() + "/" + QString::number(++m_crashes);
         QDir().mkpath(left);
         for (const QString& file : Kept())
@@ -96,7 +102,6 @@ protected:
                 document->SetModifiedFlag(false);
         Restart();
         frame->Snapshots().SetDelay(10ms);
-        return Find();
     }
     /// What can be recovered, looked at.
     std::vector<CRecoverable> Find()
@@ -176,6 +181,99 @@ TEST_F(RecoveryTest, WhatIsKeptGoesWithASaveAnUndoAndAClose)
     EXPECT_TRUE(QDir(Folder()).isEmpty());
 }
 
+TEST_F(RecoveryTest, WhatIsShownOfAFileThatIsGoneIsKeptAndAskedFor)
+{
+    const QString river = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.");
+    const auto comes = [](const auto& what) { return QTest::qWaitFor(what); };
+    for (const QString& path : {Write("a.HDKV", HDText), Write("a.kvnw", Content(river + "kvnw")),
+                                Write("a.kvxs", Content(river + "kvxs"))}) {
+        SCOPED_TRACE(path.toStdString());
+        CKsDoc* document = Open(path);
+        const std::string shown = TextOf(document);
+        const QByteArray content = Content(path);
+        const auto lose = [&] {
+            QFile::remove(path);
+            EXPECT_TRUE(comes([&] { return document->IsFileGone(); })) << "the watch sees it";
+            EXPECT_TRUE(IsKept(document)) << "nobody has changed it, and it is nowhere else";
+            EXPECT_FALSE(document->IsModified());
+        };
+        lose();
+        EXPECT_TRUE(Content(frame->Snapshots().Of(document)->File()).endsWith(QByteArray::fromStdString(shown)));
+        EXPECT_EQ(Write(QFileInfo(path).fileName(), content), path);
+        EXPECT_TRUE(comes([&] { return !document->IsFileGone() && Kept().isEmpty(); })) << "it is there again";
+        lose();
+        answers = {QMessageBox::Cancel};
+        EXPECT_EQ(document->AskToClose(), KsClosing::Keep);
+        EXPECT_TRUE(asked.takeFirst().contains("was removed or renamed"));
+        // A step, and back to what the file held: the state before the step is what has to be kept.
+        document->TakeContent(shown, "A change");
+        document->UndoStack().undo();
+        EXPECT_TRUE(IsKept(document));
+        answers = {QMessageBox::Save};
+        EXPECT_TRUE(document->SaveModified());
+        EXPECT_NE(Content(path), "(no file)");
+        EXPECT_TRUE(comes([] { return Kept().isEmpty(); }));
+        lose();
+        answers = {QMessageBox::Discard};
+        asked.clear();
+        Action("actionClose")->trigger();
+        Settle();
+        EXPECT_EQ(asked.size(), 1);
+        EXPECT_TRUE(comes([] { return Kept().isEmpty(); })) << "discarded";
+    }
+}
+
+TEST_F(RecoveryTest, WhatStandsInAnOpenCellOrFieldIsKept)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    QTest::qWait(50);
+    QLineEdit* field = nullptr;
+    for (auto* each : frame->findChildren<QLineEdit*>())
+        if (each->isVisible() && each->text() == "1.5")
+            field = each;
+    ASSERT_TRUE(field);
+    field->setFocus();
+    const auto isKept = [](const char* text) {
+        return QTest::qWaitFor([&] {
+            const QStringList kept = Kept();
+            return kept.size() == 1 && Content(kept.front()).contains(text);
+        });
+    };
+    const auto type = [](const char* text) {
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_A, Qt::ControlModifier);
+        QTest::keyClicks(QApplication::focusWidget(), text);
+    };
+    type("7.25");
+    EXPECT_TRUE(isKept("G_waterlevel = 7.25"));
+    EXPECT_TRUE(field->hasFocus() && field->text() == "7.25" && !document->IsModified()) << "and nobody is disturbed";
+    EXPECT_EQ(document->UndoStack().count(), 0);
+    type("7.25.1");
+    EXPECT_TRUE(isKept(": 7.25.1\"]"));
+    EXPECT_TRUE(isKept("G_waterlevel = 1.5")) << "what is no value is kept as a text";
+    QTest::keyClick(field, Qt::Key_Escape);
+    EXPECT_TRUE(QTest::qWaitFor([] { return Kept().isEmpty(); })) << "it was taken back";
+
+    QTableView* table = nullptr;
+    for (auto* each : frame->findChildren<QTableView*>())
+        if (each->isVisible())
+            table = each;
+    ASSERT_TRUE(table);
+    table->setCurrentIndex(table->model()->index(0, 2));
+    table->setFocus();
+    QTest::keyClick(table, Qt::Key_F2);
+    ASSERT_NE(QApplication::focusWidget(), table);
+    type("8.75");
+    EXPECT_TRUE(isKept("\"MAIN\", 100, 8.75, 30"));
+    EXPECT_NE(QApplication::focusWidget(), table) << "the cell is open";
+    const auto found = Crash();
+    ASSERT_EQ(found.size(), 1u);
+    EXPECT_TRUE(frame->Recovery().Open(found.front()));
+    document = frame->ActiveDocument();
+    EXPECT_NE(TextOf(document).find("\"MAIN\", 100, 8.75, 30"), std::string::npos);
+    document->UndoStack().undo();
+    EXPECT_NE(TextOf(document).find("\"MAIN\", 100, 2.5, 30"), std::string::npos);
+}
+
 TEST_F(RecoveryTest, EveryKindOfDocumentComesBackModifiedAndUndoable)
 {
     const QString river = QStringLiteral(KVR_SOURCE_DIR "/examples/river/river.");
@@ -223,6 +321,42 @@ TEST_F(RecoveryTest, EveryKindOfDocumentComesBackModifiedAndUndoable)
         EXPECT_EQ(TextOf(document), texts[which].second);
     }
     EXPECT_TRUE(asked.isEmpty());
+}
+
+TEST_F(RecoveryTest, ListsOfWhatWasNotTakenWaitUntilTheDialogIsDone)
+{
+    const QString path = Write("a.HDKV", QByteArray(HDText).replace("100, 2.5, 30", "100, \"high\", 30"));
+    Change(Open(path), "1.5", "2.5");
+    ASSERT_TRUE(IsKept(frame->ActiveDocument()));
+    for (const bool isListFirst : {true, false}) {
+        CrashUnseen();
+        ASSERT_TRUE(frame->OpenFile(path));
+        const auto dialogs = [&] {
+            QStringList shown;
+            for (const auto* each : frame->findChildren<QDialog*>())
+                if (each->isVisible())
+                    shown << each->metaObject()->className();
+            return shown;
+        };
+        const QStringList list("CKsFindingsDialog"), recovery("CRecoveryDialog");
+        const auto isShown = [&](const QStringList& what) {
+            return QTest::qWaitFor([&] {
+                const auto* active = QApplication::activeWindow();
+                return dialogs() == what && active && what.front() == active->metaObject()->className();
+            });
+        };
+        if (isListFirst) {
+            EXPECT_TRUE(isShown(list));
+        }
+        frame->OfferRecovery();
+        EXPECT_TRUE(isShown(recovery));
+        QTest::qWait(600); // the list would have come by now
+        EXPECT_TRUE(isShown(recovery));
+        QTest::keyClick(QApplication::activeWindow(), Qt::Key_Escape);
+        EXPECT_TRUE(isShown(list));
+        QTest::keyClick(QApplication::activeWindow(), Qt::Key_Escape);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return dialogs().isEmpty(); }));
+    }
 }
 
 TEST_F(RecoveryTest, ChangesOfAFileThatIsAnotherNowOpenBesideIt)
@@ -470,6 +604,69 @@ TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
     EXPECT_TRUE(QDir(folder.path()).isEmpty());
     QFile::remove(Folder());
     QDir().rename(Folder() + "-aside", Folder());
+}
+
+TEST_F(RecoveryTest, ASaveThatWasDoneLeavesNothingToRecover)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    Change(document, "1.5", "2.5");
+    ASSERT_TRUE(IsKept(document));
+    // Killed behind the swap, before what was kept could go.
+    Write("a.HDKV", QByteArray::fromStdString(TextOf(document)));
+    EXPECT_TRUE(Crash().empty());
+    document = Open(Path("a.HDKV"));
+    Change(document, "2.5", "3.5");
+    ASSERT_TRUE(IsKept(document));
+    Write("a.HDKV", QByteArray::fromStdString(TextOf(document)).replace("3.5", "4.5"));
+    EXPECT_EQ(Crash().size(), 1u) << "as long, and another";
+}
+
+TEST_F(RecoveryTest, DatesThatAFileLacksAreNoChangeHoweverOftenItIsRecovered)
+{
+    const QString path = Write("a.HDKV", QByteArray(HDText).replace("LimitedPeriod", "OtherPeriod"));
+    Change(Open(path), "1.5", "2.5");
+    for (int crash = 0; crash < 2; ++crash) {
+        ASSERT_TRUE(IsKept(frame->ActiveDocument()));
+        QTest::qSleep(1000); // dates count seconds
+        CrashUnseen();
+        Open(path); // which the start was asked for, and takes the time of now
+        const auto found = Find();
+        ASSERT_EQ(found.size(), 1u);
+        const auto differences = frame->Recovery().Compare(found.front());
+        ASSERT_TRUE(differences && !differences->list.empty());
+        EXPECT_EQ(differences->list.size(), 1u) << differences->list.back().keyword;
+        EXPECT_TRUE(frame->Recovery().Open(found.front()));
+        if (crash == 0) // a change of what undo leads to has no other dates either
+            frame->ActiveDocument()->UndoStack().undo();
+        Change(frame->ActiveDocument(), crash == 0 ? "G_waterlevel = 1.5" : "G_waterlevel = 9.5", "G_waterlevel = 9.5");
+        QTest::qWait(50);
+    }
+}
+
+TEST_F(RecoveryTest, FilesOfOneNameAreToldWithTheirFolders)
+{
+    for (const char* name : {"a/river.HDKV", "b/river.HDKV", "b/other.HDKV"}) {
+        CKsDoc* document = Open(Write(name, HDText));
+        Change(document, "1.5", "2.5");
+        ASSERT_TRUE(IsKept(document));
+    }
+    CrashUnseen();
+    frame->OfferRecovery();
+    auto* dialog = frame->findChild<CRecoveryDialog*>();
+    ASSERT_TRUE(dialog);
+    auto* table = dialog->findChild<QTableWidget*>();
+    ASSERT_EQ(table->rowCount(), 3);
+    const auto name = [&](int row) { return table->item(row, 0)->text(); };
+    EXPECT_EQ(name(0), "other.HDKV");
+    EXPECT_EQ(name(1), "river.HDKV in " + Path("b"));
+    EXPECT_EQ(name(2), "river.HDKV in " + Path("a"));
+    table->setCurrentCell(2, 0);
+    answers = {QMessageBox::Cancel};
+    for (auto* button : dialog->findChildren<QPushButton*>())
+        if (button->text() == "&Discard")
+            button->click();
+    EXPECT_THAT(asked, testing::ElementsAre("Discard the changes to river.HDKV in " + Path("a") +
+                                            "? They cannot be brought back."));
 }
 
 TEST_F(RecoveryTest, TheDialogSaysWhatDiffersAndDoesWhatIsChosen)

@@ -124,18 +124,29 @@ public:
     /// in passing.
     bool MayChange();
 
+    /// The file is there no more, as somebody else has removed or renamed it: what is shown is nowhere else, changed or
+    /// not.
+    virtual bool IsFileGone() const { return false; }
+    /// Something would be lost if the document were closed now.
+    bool IsUnsaved() const { return m_modified || IsFileGone(); }
     /// What the file on the disk was when the document was read from it or written to it.
     virtual FileStatus Seen() const { return {}; }
     /// What stands in the document for dates that its file lacked: the time when it was made, unless CKsDatesOfFiles
     /// say another.
     const HDDateTime& DateOfFile() const { return m_dateOfFile; }
+    /// The content has come from a document of this date; one that is not set is none.
+    void TakeDateOfFile(const HDDateTime& date)
+    {
+        if (date.IsValid())
+            m_dateOfFile = date;
+    }
 
     /// Saves to `path` and takes the name that was written (the one set by SetPathName during OnSaveDocument, otherwise
     /// SavePathFor(path)) when it worked; an empty path asks for one, as Save As. When it could not be written, the
     /// user is asked for another name, too, if he wants. `proposal` is what a question for the name begins with.
     BOOL DoSave(const CString& path, const CString& proposal = {});
-    /// Has the views take over what is being typed, then asks whether to save when the document is modified. Nothing is
-    /// saved yet.
+    /// Has the views take over what is being typed, then asks whether to save when something is unsaved. Nothing is saved
+    /// yet.
     KsClosing AskToClose();
     /// Asks, and saves when that is the answer; false when the user cancelled or the save failed.
     BOOL SaveModified();
@@ -179,6 +190,7 @@ public:
 
 signals:
     void TitleChanged(); // path, title or modified flag
+    void FileGoneChanged();
     void PathNameChanged(const CString& oldPath, const CString& newPath);
     /// A step was undone or redone; the view brings what it changed into view.
     void Reveal(const ChangePlace& place);

@@ -119,10 +119,12 @@ KsClosing CKsDoc::AskToClose()
     if (!MayLeave())
         return KsClosing::Keep;
     UpdateAllViews(nullptr, StoreHint);
-    if (!m_modified)
+    if (!IsUnsaved())
         return KsClosing::Close;
-    switch (KsMessageBox(tr("Save the changes to %1?").arg(GetTitle()),
-                         QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel)) {
+    const CString question = IsFileGone() ? tr("%1 was removed or renamed by another program. What is shown is nowhere "
+                                               "else, and is lost unless it is saved.\nSave it again?")
+                                          : tr("Save the changes to %1?");
+    switch (KsMessageBox(question.arg(GetTitle()), QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel)) {
     case QMessageBox::Save:
         return KsClosing::Save;
     case QMessageBox::Discard:

@@ -2,6 +2,7 @@
 
 #include "base/utf8_path.h"
 #include "files/structure.h"
+#include "files/temporary_file.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/syntax_error.h"
@@ -52,7 +53,7 @@ CString DisplacedName(const CString& path)
     auto target = QFileInfo(path).filesystemFilePath();
     FileStatus status;
     FollowLinks(PlatformFile::Native(), target, status);
-    return NameOf(QString::fromStdString(FreeCopyName(Utf8FromPath(target), "displaced")));
+    return NameOf(QString::fromStdString(FreeCopyName(Utf8FromPath(target), DisplacedSuffix)));
 }
 
 } // namespace
@@ -87,6 +88,18 @@ void CKsDocumentFile::Read(const CString& path, const CString& savedAs,
     LoadReport report(structure.value().Get());
     load(structure.value().Get(), report);
     m_findings = report.Take();
+}
+
+void CKsDocumentFile::Know(const CString& path, const FileVersion& version)
+{
+    *this = {};
+    m_path = m_savedAs = path;
+    m_version = version;
+}
+
+void CKsDocumentFile::LookForLeftBehind()
+{
+    m_report.leftBehind = NameLeftBehind(m_path.toStdString());
 }
 
 /// Whether the file stands, under its present spelling, where a save to `target` writes.
@@ -266,6 +279,9 @@ CString CKsDocumentFile::NotesOn(const CString& path, const WriteReport& report)
     else if (!report.displaced.empty())
         notes << tr("What another program had written to %1 is kept in %2.")
                      .arg(NameOf(path), NameOf(QString::fromStdString(report.displaced)));
+    for (const std::string& left : report.leftBehind)
+        notes << tr("A save of %1 was cut off. What another program may have written to it just before is kept in %2.")
+                     .arg(NameOf(path), NameOf(QString::fromStdString(left)));
     if (report.lost.Any())
         notes << tr("Not kept of %1 as it was before: %2.").arg(NameOf(path), LostWords(report.lost));
     return notes.join(u'\n');

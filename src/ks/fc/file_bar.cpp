@@ -1,6 +1,7 @@
 #include "ks/fc/file_bar.h"
 
 #include "ks/fc/after_paint.h"
+#include "ks/fc/dialog_turn.h"
 #include "ks/fc/findings_dialog.h"
 #include "ks/fc/project_doc.h"
 
@@ -146,8 +147,7 @@ void CKsFileBar::ShowList()
         return;
     if (!m_dialog)
         m_dialog = new CKsFindingsDialog(m_document.File().Path(), m_document.File().Findings(), this);
-    m_dialog->show();
-    m_dialog->raise();
+    KsShowInTurn(m_dialog);
 }
 
 void CKsFileBar::ReturnFocus()

@@ -48,6 +48,11 @@ void CKsProjectDoc::UseNotice(std::vector<KsFileNotice>& notices)
         notices.push_back({CKsFileBar::tr("%1 is in use by %2. Here it can be looked at and copied, not changed.")
                                .arg(name, m_use.Holder()),
                            {copy}});
+    } else if (const CString rival = m_use.Rival(); !rival.isEmpty()) {
+        notices.push_back({CKsFileBar::tr("%1 is in use by %2, too: the lock that kept others out was removed. Here it "
+                                          "can be saved when he has let go of it, or under another name.")
+                               .arg(name, rival),
+                           {copy}});
     } else if (m_use.WhyNone() && !m_isUseClosed) {
         notices.push_back(
             {CKsFileBar::tr("Other programs cannot be told that %1 is in use here: %2. Nobody else should "
@@ -75,19 +80,16 @@ void CKsProjectDoc::OwnNotice(std::vector<KsFileNotice>& notices)
         if (m_showsDefaults)
             notice.actions = {{CKsFileBar::tr("Edit Default Values"), [this](CKsFileBar&) { EditUnreadable(); }}};
         notices.push_back(std::move(notice));
-        return;
     }
     if (m_isNoticeClosed)
         return;
-    if (!m_file.Findings().empty()) {
+    if (!m_file.Findings().empty())
         notices.push_back({CKsFileBar::tr("Values of %1 that were not taken as they stand: %2. A save keeps the file "
                                           "as it is in a copy.")
                                .arg(name)
                                .arg(m_file.Findings().size()),
                            {{CKsFileBar::tr("Show List..."), [](CKsFileBar& bar) { bar.ShowList(); }}},
                            close});
-        return;
-    }
     QStringList notes{m_file.SaveNotes()};
     if (!m_file.KeptCopy().isEmpty())
         notes << CKsFileBar::tr("The file as it was before this save is kept in %1.")

@@ -31,6 +31,7 @@ CKsOutsideChange::CKsOutsideChange(CKsProjectDoc& document)
         m_isClosed = false;
         m_whyNotReloaded.clear();
         Refresh();
+        emit m_document.FileGoneChanged();
     });
     connect(m_watch, &CKsFileWatch::HasMoreNames, &document, &CKsProjectDoc::FileHasMoreNames);
     // What a choice means depends on whether something is unsaved.

@@ -14,12 +14,15 @@ CKsProjectDoc::CKsProjectDoc(int kind) : m_kind(kind), m_outside(new CKsOutsideC
 {
     connect(&UndoStack(), &QUndoStack::indexChanged, this, &CKsProjectDoc::StepMade);
     connect(&m_use, &CKsFileUse::Changed, this, &CKsProjectDoc::ReadOnlyChanged);
+    connect(&m_use, &CKsFileUse::LockLost, this, &CKsProjectDoc::FileStateChanged);
 }
 
 void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHandle, LoadReport&)>& load)
 {
     m_file.Read(path, SavePathFor(path), load);
     m_showsDefaults = m_file.IsUnreadable();
+    if (m_use.IsHeld())
+        m_file.LookForLeftBehind();
     FileIsKnown();
 }
 
@@ -56,6 +59,12 @@ void CKsProjectDoc::FileIsKnown()
     emit FileStateChanged();
 }
 
+/// Who reads only has nothing to lose: what is shown is somebody else's, or nobody's.
+bool CKsProjectDoc::IsFileGone() const
+{
+    return m_outside->Sight().kind == KsFileSight::Gone && !IsReadOnly();
+}
+
 bool CKsProjectDoc::SaveOverOthers()
 {
     m_file.MayReplaceOthers(true);
@@ -71,7 +80,11 @@ bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
             tr("%1 was left as it is: it is in use by %2.").arg(KsShownFileName(target), m_use.TargetHolder()));
         return false;
     }
-    const bool written = m_file.Write(target, write);
+    const KsFileWriter locked = [&](const std::string& path, SafeFileOptions options) {
+        options.isLocked = m_use.IsTargetHeld();
+        return write(path, options);
+    };
+    const bool written = m_file.Write(target, locked);
     if (!written && !m_file.WhyNotWritten().isEmpty())
         TellNotSaved(m_file.WhyNotWritten());
     try {
@@ -86,12 +99,12 @@ bool CKsProjectDoc::WriteFile(const CString& target, const KsFileWriter& write)
 void CKsProjectDoc::FileWritten()
 {
     UndoStack().setClean();
-    SetPathName(m_file.Path());
     SetModifiedFlag(false);
     try {
         FileIsKnown();
     } catch (const std::bad_alloc&) { // it is saved all the same; what others do to it shows at the next save
     }
+    SetPathName(m_file.Path()); // at last: whoever follows the name may ask something
 }
 
 void CKsProjectDoc::EditUnreadable()
@@ -104,6 +117,7 @@ void CKsProjectDoc::EditUnreadable()
 void CKsProjectDoc::ReadOnlyChanged()
 {
     emit FileStateChanged();
+    emit FileGoneChanged(); // of a file that is read only that is no matter
     if (!IsExecuting())
         UpdateAllViews(nullptr, ReloadHint);
 }

@@ -44,6 +44,7 @@ public:
     void AddNoticeSource(KsNoticeSource source);
     bool TakeContent(std::string text, const CString& step) final;
     FileStatus Seen() const final { return m_file.Seen(); }
+    bool IsFileGone() const final;
 
     /// What the file holds now becomes the document's content, as one step to undo; the document is not modified then.
     /// What is being typed is asked for first. False, with the reason in `why` if it is the file's, when nothing has

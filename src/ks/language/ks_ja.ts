@@ -94,6 +94,12 @@ Parameter</source>
         <source>Redone: %1</source>
         <translation>やり直しました: %1</translation>
     </message>
+    <message>
+        <source>%1 was removed or renamed by another program. What is shown is nowhere else, and is lost unless it is saved.
+Save it again?</source>
+        <translation>%1 はほかのプログラムによって削除または名前変更されました。表示されている内容はほかのどこにもなく、保存しないと失われます。
+もう一度保存しますか?</translation>
+    </message>
 </context>
 <context>
     <name>CKsDocumentFile</name>
@@ -199,6 +205,10 @@ Save?</source>
         <source>%1 is now %2</source>
         <translation>%1 は %2 になりました</translation>
     </message>
+    <message>
+        <source>A save of %1 was cut off. What another program may have written to it just before is kept in %2.</source>
+        <translation>%1 の保存が途中で打ち切られました。その直前にほかのプログラムが書き込んだ可能性のある内容は %2 に残されています。</translation>
+    </message>
 </context>
 <context>
     <name>CKsEditLong</name>
@@ -293,6 +303,10 @@ Save?</source>
     <message>
         <source>Other programs cannot be told that %1 is in use here: %2. Nobody else should change it now.</source>
         <translation>%1 をここで使用中であることを他のプログラムに知らせることができません: %2。今は他の人が変更しないようにしてください。</translation>
+    </message>
+    <message>
+        <source>%1 is in use by %2, too: the lock that kept others out was removed. Here it can be saved when he has let go of it, or under another name.</source>
+        <translation>%1 は %2 によっても使用中です: ほかの人を締め出していたロックが削除されました。ここでは、相手が手放したあと、または別の名前で保存できます。</translation>
     </message>
 </context>
 <context>

@@ -36,16 +36,14 @@ void CKsEditStyle::SetEumUnitBaseGroup(UnitGroup group, int unit)
     m_unit = unit;
 }
 
-double CKsEditStyle::Factor() const
+KsUnitConversion CKsEditStyle::Conversion() const
 {
-    return m_unit == 0 ? 1 : KsUnitFactor(m_group, KsUnits::Instance().System());
+    return {m_unit == 0 ? 1 : KsUnitFactor(m_group, KsUnits::Instance().System())};
 }
 
 double CKsEditStyle::UnitConvertFromBase(double value, int flag) const
 {
-    if (value == NotGiven || !std::isfinite(value))
-        return value;
-    return flag ? value / Factor() : value * Factor();
+    return flag ? Conversion().ToShown(value) : Conversion().ToBase(value);
 }
 
 CString CKsEditStyle::UnitConvertFromBase_T(double value, int flag) const

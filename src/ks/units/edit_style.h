@@ -1,11 +1,13 @@
 // How a number of one quantity is shown: unit group, unit of the user's unit system, format.
 #pragma once
 
+#include "base/not_given.h"
 #include "base/unit_group.h"
 #include "ks/fc/types.h"
 #include "ks/ks_export.h"
 
 #include <QObject>
+#include <cmath>
 
 enum class KsUnitSystem
 {
@@ -39,6 +41,18 @@ private:
 /// "Unit: m"; empty for a quantity without unit.
 KS_API CString KsUnitToolTip(const CString& symbol);
 
+/// Between a base unit and the one that the user sees, looked up once for many numbers. Values not given (1e10) and
+/// non-numbers pass unchanged.
+struct KsUnitConversion
+{
+    double factor = 1; // of the unit that the user sees, in base units
+    double ToShown(double base) const { return IsConverted(base) ? base / factor : base; }
+    double ToBase(double shown) const { return IsConverted(shown) ? shown * factor : shown; }
+
+private:
+    bool IsConverted(double value) const { return factor != 1 && value != NotGiven && std::isfinite(value); }
+};
+
 class KS_API CKsEditStyle
 {
 public:
@@ -52,7 +66,8 @@ public:
     void SetFormat(const CString& format) { m_format = format; }
     const CString& GetFormat() const { return m_format; }
 
-    /// flag 1: base to display; flag 0: display to base. Values not given (1e10) and non-numbers pass unchanged.
+    KsUnitConversion Conversion() const;
+    /// The same for one number. flag 1: base to display; flag 0: display to base.
     double UnitConvertFromBase(double value, int flag) const;
     /// The converted value as text in the style's format.
     CString UnitConvertFromBase_T(double value, int flag) const;
@@ -71,8 +86,7 @@ public:
     CString UnitSymbol() const;
 
 private:
-    /// Of the display unit, in base units.
-    double Factor() const;
+    double Factor() const { return Conversion().factor; }
     UnitGroup m_group = UnitGroup::None;
     int m_unit = -1;
     CString m_format = QStringLiteral("%-lf");
@@ -80,8 +94,8 @@ private:
 
 /// Prints one double in a printf floating format, independent of the locale; in the shortest form when it is none.
 KS_API CString KsFormatNumber(const CString& format, double value);
-/// The nearest number of fifteen significant digits, as spreadsheets keep results: 0.3 for 0.1 + 0.2. One of a magnitude
-/// that no quantity has stays as it is.
+/// The nearest number of fifteen significant digits, as spreadsheets keep results: 0.3 for 0.1 + 0.2. One of a
+/// magnitude that no quantity has stays as it is.
 KS_API double KsFifteenDigits(double value);
 /// Likewise to the last of the fifteen digits of a number as large as `of`: a difference of such numbers has no more.
 KS_API double KsFifteenDigits(double value, double of);

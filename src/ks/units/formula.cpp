@@ -32,7 +32,8 @@ CString FaultOf(const mu::ParserError& error, const CString& text)
         return Text(QT_TRANSLATE_NOOP("CKsFormula", "The brackets of \"%1\" do not match.")).arg(text);
     case mu::ecTOO_MANY_PARAMS:
     case mu::ecTOO_FEW_PARAMS:
-        return Text(QT_TRANSLATE_NOOP("CKsFormula", "\"%1\" has too many or too few values in its brackets.")).arg(part);
+        return Text(QT_TRANSLATE_NOOP("CKsFormula", "\"%1\" has too many or too few values in its brackets."))
+            .arg(part);
     case mu::ecUNEXPECTED_EOF:
     case mu::ecEMPTY_EXPRESSION:
         return Text(QT_TRANSLATE_NOOP("CKsFormula", "The formula ends where a number is expected."));
@@ -48,7 +49,8 @@ CKsFormula::CKsFormula(const CString& text, const QStringList& names) : m_parser
 {
     static const QRegularExpression assignment(QStringLiteral("(?<![=<>!])=(?!=)"));
     if (assignment.match(text).hasMatch()) {
-        m_fault = Text(QT_TRANSLATE_NOOP("CKsFormula", "A formula sets nothing: two numbers are compared with \"==\"."));
+        m_fault =
+            Text(QT_TRANSLATE_NOOP("CKsFormula", "A formula sets nothing: two numbers are compared with \"==\"."));
         return;
     }
     if (text.size() > LongestText) {
@@ -80,13 +82,15 @@ CKsFormula::CKsFormula(CKsFormula&&) noexcept = default;
 bool CKsFormula::Uses(std::size_t name) const
 {
     const auto& used = m_parser->parser.GetUsedVar();
-    return std::ranges::any_of(used, [&](const auto& variable) {
-        return variable.second == &m_parser->numbers[name];
-    });
+    return std::ranges::any_of(used, [&](const auto& variable) { return variable.second == &m_parser->numbers[name]; });
 }
 
-double CKsFormula::Value(std::span<const double> numbers) const
+double& CKsFormula::Number(std::size_t name) const
 {
-    std::ranges::copy(numbers, m_parser->numbers.begin());
+    return m_parser->numbers[name];
+}
+
+double CKsFormula::Value() const
+{
     return m_parser->parser.Eval();
 }

@@ -7,12 +7,11 @@
 
 #include <QStringList>
 #include <memory>
-#include <span>
 
 class KS_API CKsFormula
 {
 public:
-    /// `names` stand for the numbers that Value is given: letters, digits and _, no digit first, each once.
+    /// `names` stand for numbers: letters, digits and _, no digit first, each once.
     explicit CKsFormula(const CString& text, const QStringList& names = {});
     ~CKsFormula();
     CKsFormula(CKsFormula&&) noexcept;
@@ -21,8 +20,10 @@ public:
     const CString& Fault() const { return m_fault; }
     /// Whether the number of this name matters.
     bool Uses(std::size_t name) const;
-    /// With a number for each name, in their order. May be infinite or no number. Only without a fault.
-    double Value(std::span<const double> numbers = {}) const;
+    /// What the name stands for, to be set before Value; 0 at first. Only without a fault.
+    double& Number(std::size_t name) const;
+    /// May be infinite or no number. Only without a fault.
+    double Value() const;
 
 private:
     struct Parser;

@@ -105,6 +105,8 @@ void CBindings::Store(T& target, T value)
 
 void CBindings::ApplyRules()
 {
+    if (CKsTypedText::IsEntering()) // nobody looks
+        return;
     for (const auto& rule : m_rules)
         rule();
 }

@@ -132,7 +132,6 @@ void CCtrlEdit::Store()
     const auto value = m_value && !text().isEmpty() ? Typed().value : std::nullopt;
     if (value && *value != *m_value)
         m_store(*value);
-    ShowValue();
 }
 
 void CCtrlEdit::paintEvent(QPaintEvent* event)

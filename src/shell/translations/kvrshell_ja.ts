@@ -585,6 +585,14 @@ To have one of them in %1, close its window and open it from the list of %1.</so
         <source>Recovered</source>
         <translation>復元後</translation>
     </message>
+    <message>
+        <source>%1 in %2</source>
+        <translation>%1 (フォルダ: %2)</translation>
+    </message>
+    <message>
+        <source>Typed but not entered, as it is no value: %1</source>
+        <translation>入力されましたが、値ではないため反映されていません: %1</translation>
+    </message>
 </context>
 <context>
     <name>HelpCommands</name>
