@@ -28,16 +28,7 @@ using Computed = std::pair<std::optional<CCellResults>, QString>;
 
 QTableWidget* MakeTable(const QString& name, const QString& lastColumn)
 {
-    auto* table = new QTableWidget(0, 4);
-    table->setAccessibleName(name);
-    table->setHorizontalHeaderLabels(
-        {GridTexts::tr("Line"), GridTexts::tr("Column"), GridTexts::tr("Now"), lastColumn});
-    table->verticalHeader()->hide();
-    table->horizontalHeader()->setStretchLastSection(true);
-    table->setEditTriggers(QAbstractItemView::NoEditTriggers);
-    table->setSelectionBehavior(QAbstractItemView::SelectRows);
-    table->setTabKeyNavigation(false);
-    return table;
+    return MakeResultList(name, {GridTexts::tr("Line"), GridTexts::tr("Column"), GridTexts::tr("Now"), lastColumn});
 }
 
 class CCellsDlg : public QDialog
@@ -267,4 +258,19 @@ std::optional<CCellResults> AskForCells(GridAction action, const CGridModel& mod
     if (action == GridAction::Interpolate)
         return CInterpolateDlg(model, block, parent).Ask();
     return CCalculateDlg(model, block, parent).Ask();
+}
+
+QTableWidget* MakeResultList(const QString& name, const QStringList& columns)
+{
+    constexpr int least = 8; // letters: an empty list has columns, too
+    auto* list = new QTableWidget(0, int(columns.size()));
+    list->setAccessibleName(name);
+    list->setHorizontalHeaderLabels(columns);
+    list->verticalHeader()->hide();
+    list->horizontalHeader()->setMinimumSectionSize(least * list->fontMetrics().averageCharWidth());
+    list->horizontalHeader()->setStretchLastSection(true);
+    list->setEditTriggers(QAbstractItemView::NoEditTriggers);
+    list->setSelectionBehavior(QAbstractItemView::SelectRows);
+    list->setTabKeyNavigation(false);
+    return list;
 }

@@ -6,6 +6,7 @@
 #include "grid/grid_texts.h"
 #include "grid/row_filter.h"
 #include "ks/fc/doc.h"
+#include "ks/units/edit_fields.h"
 
 #include <QAction>
 #include <QKeyEvent>
@@ -86,11 +87,6 @@ void CFilterFields::Make()
         auto* field = new CFilterField(&m_header);
         field->setObjectName(QStringLiteral("filter%1").arg(column + 1));
         field->installEventFilter(this);
-        QPalette colours = m_header.palette(); // a theme may have one for hints that nobody sees
-        QColor hint = colours.color(QPalette::Text);
-        hint.setAlphaF(0.6F);
-        colours.setColor(QPalette::PlaceholderText, hint);
-        field->setPalette(colours);
         connect(field, &QLineEdit::textChanged, this, &CFilterFields::Typed);
         if (OffersTexts(m_grid.Model()->Column(column))) {
             auto* offer = field->addAction(DownIcon(m_header.palette()), QLineEdit::TrailingPosition);
@@ -133,7 +129,6 @@ void CFilterFields::ShowTexts()
             field.setCursorPosition(0);
         }
         field.setAccessibleName(GridTexts::tr("Filter of %1").arg(column.header()));
-        field.setPlaceholderText(GridTexts::tr("Filter"));
         const QString refusal = CCellFilter(column, text).Refusal();
         field.setToolTip(!refusal.isEmpty()    ? refusal
                          : OffersTexts(column) ? GridTexts::tr("Text that the cells contain; =text for the whole cell, "
@@ -143,6 +138,7 @@ void CFilterFields::ShowTexts()
         colours.setColor(QPalette::Text,
                          refusal.isEmpty() ? m_header.palette().color(QPalette::Text) : QColor(Qt::red));
         field.setPalette(colours);
+        KsShowHint(field, GridTexts::tr("Filter"));
     }
 }
 

@@ -102,8 +102,12 @@ QString CGenGrid::SelectionText() const
 
 QSize CGenGrid::sizeHint() const
 {
-    const QSize usual = QTableView::sizeHint();
-    return {m_widths->WidthOfGrid() > 0 ? m_widths->WidthOfGrid() : usual.width(), usual.height()};
+    return {m_widths->WidthOfGrid(), QTableView::sizeHint().height()};
+}
+
+QSize CGenGrid::minimumSizeHint() const
+{
+    return {m_widths->LeastWidthOfGrid(), QTableView::minimumSizeHint().height()};
 }
 
 void CGenGrid::Refresh()

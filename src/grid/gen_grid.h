@@ -29,6 +29,7 @@ public:
     CGridInput& Input() const { return *m_input; }
     CGridWidths& Widths() const { return *m_widths; }
     QSize sizeHint() const override;
+    QSize minimumSizeHint() const override;
     CGridSelection& Selection() const { return *m_selection; }
     CGridHeader& Header() const { return *m_header; }
     const CFrozenColumns& Frozen() const { return *m_frozen; }

@@ -18,6 +18,8 @@ constexpr double OriginalFontHeight = 13, OriginalLetterWidth = 6;
 constexpr int RowsAtStart = 30, RowsForRoom = 4000; // whose texts are measured, at even distances through the table
 constexpr int Margin = 16;                          // pixels beside a text
 constexpr int MostOfAWindow = 320;                  // pixels that a long name may take
+constexpr int MostBesideOthers = 480;               // pixels of columns that a table may claim from others
+constexpr int LeastOfAWindow = 120;                 // pixels that stay for the columns, which can be scrolled to
 
 double FontScale(const QFontMetrics& font)
 {
@@ -85,7 +87,8 @@ void CGridWidths::Update()
 {
     UpdateRowNumbers();
     const auto count = std::size_t(m_grid.ColumnCount());
-    if (m_columns.size() != count)
+    const bool areNew = m_columns.size() != count;
+    if (areNew)
         m_room = -1;
     if (m_columns.size() > count)
         m_columns.resize(count, {});
@@ -97,6 +100,8 @@ void CGridWidths::Update()
     }
     MakeRoomForMarks();
     Arrange();
+    if (areNew)
+        m_grid.updateGeometry(); // somebody may have asked before
 }
 
 /// Where the columns do not fit beside each other they give up what neither their headers nor their texts need, each in
@@ -110,12 +115,8 @@ void CGridWidths::Arrange()
     int missing = -room, spare = 0;
     for (const Column& column : m_columns)
         missing += column.usual;
-    for (std::size_t i = 0; missing > 0 && i < m_columns.size(); ++i) {
-        Column& column = m_columns[i];
-        if (column.least == 0)
-            column.least = std::min(column.usual, WidthOfTexts(int(i), RowsForRoom, 2 * Margin));
-        spare += column.usual - column.least;
-    }
+    for (std::size_t i = 0; missing > 0 && i < m_columns.size(); ++i)
+        spare += m_columns[i].usual - Least(i);
     const double share = spare > 0 ? std::clamp(missing / double(spare), 0.0, 1.0) : 0.0;
     m_isArranging = true;
     for (std::size_t i = 0; i < m_columns.size(); ++i) {
@@ -127,6 +128,14 @@ void CGridWidths::Arrange()
     m_isArranging = false;
 }
 
+int CGridWidths::Least(std::size_t i)
+{
+    Column& column = m_columns[i];
+    if (column.least == 0)
+        column.least = std::min(column.usual, WidthOfTexts(int(i), RowsForRoom, 2 * Margin));
+    return column.least;
+}
+
 bool CGridWidths::eventFilter(QObject* object, QEvent* event)
 {
     if (event->type() == QEvent::Resize || event->type() == QEvent::Show)
@@ -136,23 +145,44 @@ bool CGridWidths::eventFilter(QObject* object, QEvent* event)
 
 void CGridWidths::KeepGridAsWide()
 {
+    m_isAsWide = true;
     connect(m_grid.horizontalHeader(), &QHeaderView::sectionResized, this, &CGridWidths::FitGrid);
     connect(m_grid.horizontalHeader(), &QHeaderView::sectionCountChanged, this, &CGridWidths::FitGrid);
     FitGrid();
 }
 
-void CGridWidths::FitGrid()
+void CGridWidths::KeepColumns(bool keep)
+{
+    if (std::exchange(m_keepsColumns, keep) != keep)
+        m_grid.updateGeometry();
+}
+
+int CGridWidths::BesideColumns() const
+{
+    return m_grid.verticalHeader()->width() + m_grid.style()->pixelMetric(QStyle::PM_ScrollBarExtent) +
+           2 * m_grid.frameWidth();
+}
+
+int CGridWidths::WidthOfGrid() const
 {
     int columns = m_areChosen ? m_grid.horizontalHeader()->length() : 0;
     for (std::size_t i = 0; !m_areChosen && i < m_columns.size(); ++i)
         columns += m_columns[i].usual;
-    const int beside = m_grid.verticalHeader()->width() + m_grid.style()->pixelMetric(QStyle::PM_ScrollBarExtent) +
-                       2 * m_grid.frameWidth();
-    const int width = std::min(columns, MostOfAWindow) + beside;
-    if (std::exchange(m_widthOfGrid, width) == width)
-        return;
-    m_grid.setMaximumWidth(width);
-    m_grid.setMinimumWidth(width * 3 / 4); // the columns have some room to give
+    return columns + BesideColumns();
+}
+
+int CGridWidths::LeastWidthOfGrid()
+{
+    const int most = m_keepsColumns ? MostBesideOthers : m_isAsWide ? MostOfAWindow : LeastOfAWindow;
+    int columns = 0;
+    for (std::size_t i = 0; columns < most && i < m_columns.size(); ++i)
+        columns += Least(i);
+    return std::min(columns, most) + BesideColumns();
+}
+
+void CGridWidths::FitGrid()
+{
+    m_grid.setMaximumWidth(std::min(WidthOfGrid(), MostOfAWindow + BesideColumns()));
     m_grid.updateGeometry();
 }
 

@@ -34,8 +34,12 @@ public:
     /// From now on the grid wants to be as wide as its columns, and no wider: it stands beside others, and what it left
     /// empty would be missing there.
     void KeepGridAsWide();
-    /// The width that it then wants; 0 for a grid that takes what there is.
-    int WidthOfGrid() const { return m_widthOfGrid; }
+    /// Whether the grid wants its columns in sight rather than having something beside it.
+    void KeepColumns(bool keep);
+    /// What the grid needs to show all of its columns, and the bar that scrolls its lines.
+    int WidthOfGrid() const;
+    /// What it needs when its columns have given all that they can. The last of many have to be scrolled to.
+    int LeastWidthOfGrid();
 
 protected:
     bool eventFilter(QObject* object, QEvent* event) override;
@@ -55,12 +59,14 @@ private:
     void UpdateRowNumbers();
     int WidthOfTexts(int column, int most, int least);
     void Widen(int column, int width);
+    int Least(std::size_t column);
+    int BesideColumns() const;
     void Arrange();
     void FitGrid();
 
     CGenGrid& m_grid;
     Letters m_letters;
-    bool m_areChosen = false, m_isArranging = false;
+    bool m_areChosen = false, m_isArranging = false, m_isAsWide = false, m_keepsColumns = false;
     struct Column
     {
         int usual;     // where there is room
@@ -68,5 +74,4 @@ private:
     };
     std::vector<Column> m_columns; // those that have got their first width
     int m_room = -1;               // for which they were arranged
-    int m_widthOfGrid = 0;
 };

@@ -1,5 +1,6 @@
 #include "grid/replace_dialog.h"
 
+#include "grid/cell_dialogs.h"
 #include "grid/find_replace.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_host.h"
@@ -107,15 +108,9 @@ private:
 
     QTableWidget* MakeList()
     {
-        m_list = new QTableWidget(0, 5);
-        m_list->setAccessibleName(GridTexts::tr("Cells found"));
-        m_list->setHorizontalHeaderLabels({GridTexts::tr("Page"), GridTexts::tr("Line"), GridTexts::tr("Column"),
-                                           GridTexts::tr("Now"), GridTexts::tr("Then")});
-        m_list->verticalHeader()->hide();
-        m_list->horizontalHeader()->setStretchLastSection(true);
-        m_list->setEditTriggers(QAbstractItemView::NoEditTriggers);
-        m_list->setSelectionBehavior(QAbstractItemView::SelectRows);
-        m_list->setTabKeyNavigation(false);
+        m_list = MakeResultList(GridTexts::tr("Cells found"),
+                                {GridTexts::tr("Page"), GridTexts::tr("Line"), GridTexts::tr("Column"),
+                                 GridTexts::tr("Now"), GridTexts::tr("Then")});
         return m_list;
     }
 

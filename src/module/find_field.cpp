@@ -2,6 +2,7 @@
 
 #include "document/document.h"
 #include "grid/gen_grid.h"
+#include "ks/units/edit_fields.h"
 #include "module/sheet.h"
 #include "pages/framework/location_page.h"
 #include "pages/page_table.h"
@@ -135,7 +136,7 @@ public:
         auto* layout = new QVBoxLayout(this);
         m_text = new QLineEdit;
         m_text->setAccessibleName(LoadString(Str::FindFieldPrompt));
-        m_text->setPlaceholderText(LoadString(Str::FindFieldPrompt));
+        KsShowHint(*m_text, LoadString(Str::FindFieldPrompt));
         m_text->installEventFilter(this);
         m_list = new QTreeWidget;
         m_list->setAccessibleName(LoadString(Str::FindFieldResults));

@@ -32,7 +32,7 @@ public:
         if (text.isEmpty())
             text = fontMetrics().size(Qt::TextShowMnemonic, tabText(index));
         const int air = std::clamp(TabHeight - text.height(), 4, fontMetrics().height() * 2 / 3);
-        return {text.width() + 3 * fontMetrics().height(), text.height() + air};
+        return {text.width() + 2 * fontMetrics().height(), text.height() + air};
     }
     QSize minimumTabSizeHint(int index) const override { return tabSizeHint(index); }
 
@@ -102,6 +102,39 @@ private:
     mutable QHash<QString, QSize> m_sizes; // of captions in the present font
 };
 
+/// In a small window a page scrolls rather than being cut off, and stacks what stands beside each other rather than
+/// scrolling sideways.
+class PageArea : public QScrollArea
+{
+public:
+    explicit PageArea(CGenPropertyPage& page) : m_page(page)
+    {
+        setWidgetResizable(true);
+        setFrameShape(QFrame::NoFrame);
+        setFocusPolicy(Qt::NoFocus);
+        viewport()->setAutoFillBackground(false);
+        setWidget(&page);
+        page.setAutoFillBackground(false);
+    }
+
+protected:
+    void resizeEvent(QResizeEvent* event) override
+    {
+        m_page.FitInto(viewport()->width());
+        QScrollArea::resizeEvent(event);
+    }
+    void changeEvent(QEvent* event) override
+    {
+        QScrollArea::changeEvent(event);
+        const auto fit = [this] { m_page.FitInto(viewport()->width()); };
+        if (event->type() == QEvent::LanguageChange || event->type() == QEvent::FontChange)
+            QMetaObject::invokeMethod(this, fit, Qt::QueuedConnection); // when the page has the new texts
+    }
+
+private:
+    CGenPropertyPage& m_page;
+};
+
 } // namespace
 
 CDlgPropertySheet::CDlgPropertySheet(QWidget* parent) : QTabWidget(parent)
@@ -136,16 +169,9 @@ CGenPropertyPage* CDlgPropertySheet::PageAt(int tab)
     Tab& entry = m_tabs[std::size_t(tab)];
     if (!entry.page) {
         entry.page = entry.make().release();
-        auto* area = new QScrollArea; // in a small window a page scrolls rather than being cut off
-        area->setWidgetResizable(true);
-        area->setFrameShape(QFrame::NoFrame);
-        area->setFocusPolicy(Qt::NoFocus);
-        area->viewport()->setAutoFillBackground(false);
-        area->setWidget(entry.page);
-        entry.page->setAutoFillBackground(false);
         auto* layout = new QVBoxLayout(widget(tab));
         layout->setContentsMargins(0, 0, 0, 0);
-        layout->addWidget(area);
+        layout->addWidget(new PageArea(*entry.page));
     }
     return entry.page;
 }

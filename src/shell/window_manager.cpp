@@ -9,6 +9,7 @@
 #include <QTabBar>
 #include <algorithm>
 
+static constexpr int NeededDigits = 105;  // the tabs of the pages, and the widest page
 static constexpr int WantedLetters = 155; // beside each other: the tabs of the pages, a table, and a table beside it
 
 CWindowManager::CWindowManager(CKsMDIFrameWnd& frame) : m_frame(frame)
@@ -65,12 +66,14 @@ bool CWindowManager::ChoseTabs()
     return QSettings().value(Settings::Tabs, false).toBool();
 }
 
-/// Three fifths of the width, or as much more as pages with two tables beside each other need.
+/// Three fifths of the width, or as much more as pages with two tables beside each other need. In a small area the
+/// other windows get what is left when a page need not scroll sideways.
 QRect CWindowManager::FirstPlace() const
 {
     const QSize area = Area().viewport()->size();
     const int wanted = std::min(WantedLetters * m_frame.fontMetrics().averageCharWidth(), area.width() * 2 / 3);
-    return {0, 0, std::max(area.width() * 3 / 5, wanted), area.height()};
+    const int needed = std::min(NeededDigits * m_frame.fontMetrics().horizontalAdvance(u'0'), area.width() * 3 / 4);
+    return {0, 0, std::max({area.width() * 3 / 5, wanted, needed}), area.height()};
 }
 
 void CWindowManager::PlaceNewWindowsFirst(bool first)

@@ -81,6 +81,7 @@ TEST_F(PairsGridTest, KeyboardAlone)
     EXPECT_FALSE(line->isEnabled()) << "there is no line yet";
     Enter(1, 1, "main");
     EXPECT_TRUE(line->isEnabled());
+    QTest::qWait(1); // the table gets room for its columns
     QTest::mouseDClick(line->viewport(), Qt::LeftButton, {}, QPoint(20, 20));
     EXPECT_EQ(Pairs(list.GetAt(0).VeloRes), "0 0") << "a double click makes the first line";
 }

@@ -15,6 +15,7 @@
 #include <utility>
 
 static const QString MainState = QStringLiteral("main");
+static const QList<int> TablesSizes = {600, 400}; // as shares: the first table has more columns
 
 CTablesView::~CTablesView()
 {
@@ -33,6 +34,7 @@ void CTablesView::MakeContent(QWidget& picture, int pictureWidth, int tablesWidt
     m_sizes = {pictureWidth, tablesWidth};
     m_main = AddTable(*m_side, mainName);
     m_parts = AddTable(*m_side, partsName);
+    m_side->setSizes(TablesSizes);
     m_lines = m_main.grid;
     m_splitter->addWidget(&picture);
     m_splitter->addWidget(m_side);
@@ -43,20 +45,23 @@ void CTablesView::MakeContent(QWidget& picture, int pictureWidth, int tablesWidt
     SetContent(m_splitter);
 }
 
-/// In a narrow window the tables stand below the picture, beside each other: it would have no width left.
+/// In a narrow window the tables stand below the picture, which would have no width left: beside each other, or where
+/// that shows half of their columns one below the other.
 void CTablesView::resizeEvent(QResizeEvent* event)
 {
     CKsProjectView::resizeEvent(event);
     if (!m_splitter)
         return;
-    constexpr int letters = 100; // a picture and two columns of a table
-    const bool isNarrow = width() < letters * fontMetrics().averageCharWidth();
-    if (isNarrow == (m_splitter->orientation() == Qt::Vertical))
+    constexpr int leastBeside = 150, leastForTwo = 90; // digits: a picture and two columns of a table; two tables
+    const int digits = width() / fontMetrics().horizontalAdvance(u'0');
+    const auto whole = digits < leastBeside ? Qt::Vertical : Qt::Horizontal;
+    const auto side = digits < leastBeside && digits >= leastForTwo ? Qt::Horizontal : Qt::Vertical;
+    if (whole == m_splitter->orientation() && side == m_side->orientation())
         return;
-    m_splitter->setOrientation(isNarrow ? Qt::Vertical : Qt::Horizontal);
-    m_side->setOrientation(isNarrow ? Qt::Horizontal : Qt::Vertical);
-    m_splitter->setSizes(m_sizes);
-    m_side->setSizes({1, 1});
+    m_splitter->setOrientation(whole);
+    m_side->setOrientation(side);
+    m_splitter->setSizes(whole == side ? QList<int>{500, 500} : m_sizes);
+    m_side->setSizes(TablesSizes);
 }
 
 CTablesView::Table CTablesView::AddTable(QSplitter& side, const char* name)

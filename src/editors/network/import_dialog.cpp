@@ -1,5 +1,7 @@
 #include "editors/network/import_dialog.h"
 
+#include "ks/units/edit_fields.h"
+
 #include <QCheckBox>
 #include <QComboBox>
 #include <QDialogButtonBox>
@@ -122,7 +124,7 @@ void CImportDialog::MakeFields(QFormLayout* form)
     auto* systems = new QHBoxLayout;
     systems->addWidget(m_target, 1);
     systems->addWidget(m_code);
-    m_code->setPlaceholderText(QStringLiteral("EPSG"));
+    KsShowHint(*m_code, QStringLiteral("EPSG"));
     m_code->setAccessibleName(tr("EPSG code of the coordinate system"));
     m_code->setMaximumWidth(9 * fontMetrics().averageCharWidth() + 24);
     auto* target = new QLabel(tr("&Coordinates in the network:"));

@@ -45,6 +45,8 @@ double Round125(double value)
 void PaintLegend(QPainter& painter, const CMapStyle& style, const QRect& window, const CLegend& legend)
 {
     const QRect box = LegendBox(painter.fontMetrics(), window, legend);
+    if (box.isEmpty())
+        return;
     PaintPanel(painter, style, box);
     const double ratio = painter.device()->devicePixelRatioF();
     const int row = LegendRow(painter.fontMetrics());
@@ -162,8 +164,10 @@ QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend&
     }
     const int inner = std::max(LegendSymbol + names + gap + numbers, metrics.horizontalAdvance(Elsewhere(legend)));
     const int rows = HDDataTypeCount + (legend.elsewhere > 0 ? 1 : 0);
-    return {window.right() - Margin - inner - 2 * Padding, window.top() + Margin, inner + 2 * Padding,
-            rows * LegendRow(metrics) + 2 * Padding - 3};
+    const QSize size(inner + 2 * Padding, rows * LegendRow(metrics) + 2 * Padding - 3);
+    if (3 * size.width() > window.width() && 2 * size.height() > window.height())
+        return {};
+    return {{window.right() - Margin - size.width(), window.top() + Margin}, size};
 }
 
 void PaintOverlay(QPainter& painter, const CMapStyle& style, const QRect& window, const CMapOverlay& overlay)

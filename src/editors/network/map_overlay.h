@@ -17,7 +17,7 @@ struct CLegend
     int elsewhere = 0; // locations that are not in the network
 };
 CLegend LegendOf(const CMapSelection& marks);
-/// Where the legend stands: in the upper right corner.
+/// Where the legend stands: in the upper right corner; empty where it would cover most of a small map.
 QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend& legend);
 
 struct CMapOverlay

@@ -40,6 +40,8 @@ void CMapProjection::Fit(const CNetwork& network, const QRectF& window, const QR
     constexpr double small = 0.6; // of the scale that the whole window allows
     origin = network.Extent().center();
     *this = FitInto(*this, network, window, ratio);
+    if (legend.isEmpty())
+        return;
     const double beside = FitMargin * ratio; // where symbols of a branch may stand
     if (!IsUnder(*this, network, legend.adjusted(-beside, 0, 0, beside)))
         return;

@@ -22,6 +22,16 @@ QSize KsNumberFieldSize(const QLineEdit& field)
     return {number + beside, field.minimumSizeHint().height()};
 }
 
+void KsShowHint(QLineEdit& field, const QString& hint)
+{
+    QPalette colors = field.palette();
+    QColor color = colors.color(QPalette::Text);
+    color.setAlphaF(0.6F);
+    colors.setColor(QPalette::PlaceholderText, color);
+    field.setPalette(colors);
+    field.setPlaceholderText(hint);
+}
+
 CKsEditLong::CKsEditLong(QWidget* parent) : QLineEdit(parent)
 {
     setAlignment(Qt::AlignRight);

@@ -22,6 +22,9 @@ struct CKSinterval
 /// window makes it longer.
 KS_API QSize KsNumberFieldSize(const QLineEdit& field);
 
+/// Says in the empty field what it is for. A theme may have a color for such hints that nobody sees; this one is seen.
+KS_API void KsShowHint(QLineEdit& field, const QString& hint);
+
 /// A field for a 32-bit integer.
 class KS_API CKsEditLong : public QLineEdit
 {

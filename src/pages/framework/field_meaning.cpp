@@ -8,14 +8,20 @@
 namespace {
 
 constexpr int UsualLines = 2, LeastLetters = 12, UsualLetters = 40; // letters of a line
-constexpr float Strength = 0.75F; // of the text's color: the names of the fields come first
-
-QSize RoomFor(const QFontMetrics& font, int letters, int lines)
-{
-    return {letters * font.averageCharWidth(), lines * font.lineSpacing()};
-}
+constexpr int Air = 3;                                              // pixels between the texts of two rows
+// The names of the fields come first: of their color and of their font.
+constexpr float Strength = 0.75F;
+constexpr double Size = 0.88;
 
 } // namespace
+
+CFieldMeaning::CFieldMeaning(QWidget* parent) : QWidget(parent)
+{
+    QFont small = font();
+    if (small.pointSizeF() > 0)
+        small.setPointSizeF(Size * small.pointSizeF());
+    setFont(small);
+}
 
 void CFieldMeaning::SetText(const QString& text)
 {
@@ -28,31 +34,37 @@ void CFieldMeaning::SetText(const QString& text)
 
 QSize CFieldMeaning::sizeHint() const
 {
-    return RoomFor(fontMetrics(), UsualLetters, UsualLines);
+    return {UsualLetters * fontMetrics().averageCharWidth(), UsualLines * fontMetrics().lineSpacing() + Air};
 }
 
 QSize CFieldMeaning::minimumSizeHint() const
 {
-    return {0, RoomFor(fontMetrics(), 1, 1).height()};
+    return {0, fontMetrics().lineSpacing()};
 }
 
-void CFieldMeaning::paintEvent(QPaintEvent*)
+/// As many as there is room for; the last one says whether there is more.
+QStringList CFieldMeaning::Lines() const
 {
-    if (width() < RoomFor(fontMetrics(), LeastLetters, 1).width())
-        return; // a word or two say nothing
-    QTextLayout layout(m_text, font());
-    const QFontMetrics metrics = fontMetrics();
-    const int most = std::max(1, height() / metrics.lineSpacing());
+    const int most = std::max(1, height() / fontMetrics().lineSpacing());
     QStringList lines;
+    QTextLayout layout(m_text, font());
     layout.beginLayout();
     for (QTextLine line = layout.createLine(); line.isValid() && lines.size() < most; line = layout.createLine()) {
         line.setLineWidth(width());
         const bool isLast = lines.size() + 1 == most;
         const QString text = m_text.mid(line.textStart(), isLast ? -1 : line.textLength());
-        lines << metrics.elidedText(text, Qt::ElideRight, width());
+        lines << fontMetrics().elidedText(text, Qt::ElideRight, width());
     }
     layout.endLayout();
+    return lines;
+}
 
+void CFieldMeaning::paintEvent(QPaintEvent*)
+{
+    const QFontMetrics metrics = fontMetrics();
+    if (width() < LeastLetters * metrics.averageCharWidth())
+        return; // a word or two say nothing
+    const QStringList lines = Lines();
     QPainter painter(this);
     QColor color = palette().color(QPalette::WindowText);
     if (isEnabled())

@@ -1,6 +1,7 @@
 // What a value means, in words beside its field: on pages that have the room for it.
 #pragma once
 
+#include <QStringList>
 #include <QWidget>
 
 /// Shows as much of the text as its width and the height of its row have room for. The tool tip of the field has all
@@ -9,7 +10,7 @@ class CFieldMeaning : public QWidget
 {
     Q_OBJECT
 public:
-    using QWidget::QWidget;
+    explicit CFieldMeaning(QWidget* parent);
     void SetText(const QString& text);
     const QString& Text() const { return m_text; }
     QSize sizeHint() const override;
@@ -20,5 +21,7 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
+    QStringList Lines() const;
+
     QString m_text;
 };

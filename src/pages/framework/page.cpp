@@ -3,6 +3,7 @@
 #include "document/document.h"
 #include "grid/gen_grid.h"
 #include "grid/grid_keys.h"
+#include "grid/grid_widths.h"
 #include "ks/fc/exchange.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page_help.h"
@@ -11,8 +12,8 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QGroupBox>
+#include <QHBoxLayout>
 #include <QKeyEvent>
-#include <QLayout>
 #include <QScrollArea>
 #include <QUndoStack>
 #include <QWhatsThis>
@@ -126,6 +127,34 @@ void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
             area->ensureWidgetVisible(shown);
     if (focus && shown->isEnabled() && shown->isVisible())
         shown->setFocus(Qt::OtherFocusReason);
+}
+
+void CGenPropertyPage::FitInto(int width)
+{
+    const auto turn = [this](QBoxLayout& row, QBoxLayout::Direction direction) {
+        for (int i = 0; i < row.count(); ++i)
+            if (auto* grid = qobject_cast<CGenGrid*>(row.itemAt(i)->widget()))
+                grid->Widths().KeepColumns(direction == QBoxLayout::LeftToRight);
+        row.setDirection(direction);
+        for (QWidget* widget = row.parentWidget(); widget != parentWidget(); widget = widget->parentWidget())
+            if (widget->layout())
+                widget->layout()->activate();
+    };
+    std::vector<QBoxLayout*> rows;
+    for (auto* row : findChildren<QHBoxLayout*>())
+        for (int i = 0; i < row->count(); ++i)
+            if (qobject_cast<QGroupBox*>(row->itemAt(i)->widget())) {
+                rows.push_back(row);
+                break;
+            }
+    for (QBoxLayout* row : rows)
+        turn(*row, QBoxLayout::LeftToRight);
+    while (!rows.empty() && layout()->totalMinimumSize().width() > width) {
+        const auto widest =
+            std::ranges::max_element(rows, {}, [](const QBoxLayout* row) { return row->totalMinimumSize().width(); });
+        turn(**widest, QBoxLayout::TopToBottom);
+        rows.erase(widest);
+    }
 }
 
 void CGenPropertyPage::LoadFromDocument(CKavo0_hdDoc*)
@@ -285,11 +314,12 @@ bool CGenPropertyPage::event(QEvent* event)
             button->installEventFilter(this);
         for (auto* list : findChildren<QComboBox*>())
             list->installEventFilter(this);
-        constexpr int air = 5; // above and below what a group holds: groups stand within groups
+        constexpr int air = 5, beside = 6; // around what a group holds: groups stand within groups
         for (const auto* group : findChildren<QGroupBox*>())
             if (QLayout* inside = group->layout()) {
                 const QMargins margins = inside->contentsMargins();
-                inside->setContentsMargins(margins.left(), air, margins.right(), air);
+                inside->setContentsMargins(std::min(margins.left(), beside), air, std::min(margins.right(), beside),
+                                           air);
             }
     }
     return QWidget::event(event);

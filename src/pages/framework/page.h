@@ -2,9 +2,9 @@
 #pragma once
 
 #include "data/global_var.h"
-#include "ks/units/edit_style.h"
 #include "grid/grid_host.h"
 #include "ks/fc/change_place.h"
+#include "ks/units/edit_style.h"
 #include "pages/framework/binding.h"
 #include "pages/framework/page_host.h"
 
@@ -73,6 +73,10 @@ public:
     virtual bool Shows(const ChangePlace& place) const;
     /// Brings it into view: the line, the cell, the control. With `focus` it is what is edited next.
     virtual void Reveal(const ChangePlace& place, bool focus);
+
+    /// Groups that stand beside each other stand one below the other where the page has no more width than this, and
+    /// only there.
+    void FitInto(int width);
 
     /// Takes what is being typed, then undoes or redoes one step of the document.
     void UndoRedo(bool undo);
