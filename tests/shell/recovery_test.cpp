@@ -168,7 +168,7 @@ TEST_F(RecoveryTest, WhatIsKeptGoesWithASaveAnUndoAndAClose)
             }
             answers << QMessageBox::Discard;
             if (way != std::string("close")) {
-                EXPECT_TRUE(Kept().isEmpty()) << way;
+                EXPECT_TRUE(QTest::qWaitFor([] { return Kept().isEmpty(); })) << way; // a writer takes its time to end
             }
             Action("actionClose")->trigger();
             Settle();
@@ -205,10 +205,16 @@ TEST_F(RecoveryTest, WhatIsShownOfAFileThatIsGoneIsKeptAndAskedFor)
         answers = {QMessageBox::Cancel};
         EXPECT_EQ(document->AskToClose(), KsClosing::Keep);
         EXPECT_TRUE(asked.takeFirst().contains("was removed or renamed"));
-        // A step, and back to what the file held: the state before the step is what has to be kept.
-        document->TakeContent(shown, "A change");
-        document->UndoStack().undo();
-        EXPECT_TRUE(IsKept(document));
+        // A step, and back to what the file held: that is what has to be kept.
+        if (path.endsWith(".HDKV")) {
+            const auto isKept = [&](const char* level) {
+                return comes([&] { return Content(frame->Snapshots().Of(document)->File()).contains(level); });
+            };
+            Change(document, "G_waterlevel = 1.5", "G_waterlevel = 2.5");
+            EXPECT_TRUE(isKept("G_waterlevel = 2.5"));
+            document->UndoStack().undo();
+            EXPECT_TRUE(isKept("G_waterlevel = 1.5"));
+        }
         answers = {QMessageBox::Save};
         EXPECT_TRUE(document->SaveModified());
         EXPECT_NE(Content(path), "(no file)");
@@ -608,11 +614,18 @@ TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
 
 TEST_F(RecoveryTest, ASaveThatWasDoneLeavesNothingToRecover)
 {
-    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    CKsDoc* document = Open(Write("a.HDKV", QByteArray(HDText).replace("DATA = \"\", 1e10, 1, 1\n", "")));
     Change(document, "1.5", "2.5");
     ASSERT_TRUE(IsKept(document));
+    const QByteArray kept = Content(Kept().front());
+    ASSERT_TRUE(document->DoSave(document->GetPathName()));
+    EXPECT_TRUE(Kept().isEmpty());
     // Killed behind the swap, before what was kept could go.
-    Write("a.HDKV", QByteArray::fromStdString(TextOf(document)));
+    QDir().mkpath(Folder() + "/left");
+    QFile left(Folder() + "/left/a.recovery");
+    ASSERT_TRUE(left.open(QIODevice::WriteOnly));
+    left.write(kept);
+    left.close();
     EXPECT_TRUE(Crash().empty());
     document = Open(Path("a.HDKV"));
     Change(document, "2.5", "3.5");
