@@ -34,6 +34,15 @@ std::unique_ptr<QMimeData> ToClipboard(const std::vector<QStringList>& texts,
     return content;
 }
 
+std::shared_ptr<const QMimeData> HeldContent(const QMimeData& clipboard)
+{
+    auto content = std::make_shared<QMimeData>();
+    content->setText(clipboard.text());
+    if (clipboard.hasFormat(Format))
+        content->setData(Format, clipboard.data(Format));
+    return content;
+}
+
 CopiedTable FromClipboard(const QMimeData& content, QChar separator)
 {
     CopiedTable copied{CTextTable(content.text(), separator)};

@@ -117,8 +117,9 @@ PasteStart StartOf(const CGenGrid& grid)
     const QItemSelectionRange block = selected ? *selected : QItemSelectionRange();
     return {selected ? block.top() : std::max(0, grid.currentIndex().row()),
             selected ? block.left() : std::max(0, grid.currentIndex().column()),
-            [block, isBlock = selected.has_value()](QChar separator) {
-                CopiedTable copied = FromClipboard(*QGuiApplication::clipboard()->mimeData(), separator);
+            [block, isBlock = selected.has_value(),
+             content = HeldContent(*QGuiApplication::clipboard()->mimeData())](QChar separator) {
+                CopiedTable copied = FromClipboard(*content, separator);
                 const bool isCell = copied.texts.Lines() == 1 && copied.texts.Width(0) == 1;
                 return isBlock && isCell ? Repeated(std::move(copied), block.height(), block.width()) : copied;
             }};
@@ -136,7 +137,7 @@ std::optional<PasteDecision> WithoutAsking(const CTableRows& rows, const PasteSt
     const bool isList = copied.texts.Lines() > 1 && plan.Columns() == 1; // one that may be a table all the same
     if (!plan.IsClean() || (isList && SeparatorOf(start.read) == u';'))
         return std::nullopt;
-    return PasteDecision{plan.TakeCells(), plan.Choice(), plan.CellCount(), 0};
+    return DecisionOf(plan);
 }
 
 /// What was pasted is selected where it is one block, its beginning in sight.
@@ -164,9 +165,12 @@ QString Summary(const PasteDecision& decision)
     if (decision.leftOut > 0)
         done += QStringLiteral("; ") +
                 GridTexts::Counted(decision.leftOut, GridTexts::tr("1 left out"), GridTexts::tr("%1 left out"));
-    else if (std::ranges::any_of(decision.cells.columns, [](const auto& column) { return !column.left.empty(); }) &&
-             decision.choice.place != PastePlace::ByPlace)
+    else if (decision.hasShorterLines)
         done += GridTexts::tr("; shorter lines leave their other cells as they were");
+    if (decision.hidden > 0)
+        done +=
+            QStringLiteral("; ") + GridTexts::Counted(decision.hidden, GridTexts::tr("1 line is hidden by the filter"),
+                                                      GridTexts::tr("%1 lines are hidden by the filter"));
     if (decision.choice.hasHeaders)
         done += GridTexts::tr("; the line with the headers was left out");
     return done;
@@ -174,6 +178,8 @@ QString Summary(const PasteDecision& decision)
 
 void Make(CGenGrid& grid, const PasteDecision& decision)
 {
+    if (decision.cells.rows.empty())
+        return; // nothing goes anywhere
     const int current = std::max(1, grid.CurrentRow());
     grid.Model()->Paste(decision.cells, GridTexts::tr("Paste"));
     grid.Model()->Document()->Say(Summary(decision));

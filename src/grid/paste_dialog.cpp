@@ -18,10 +18,12 @@
 #include <QTableView>
 #include <QTableWidget>
 #include <QVBoxLayout>
+#include <utility>
 
 namespace {
 
 constexpr int TextWidth = 160; // for texts to be mended
+constexpr int MostWidth = 280; // of a column, in pixels
 
 constexpr const char* SeparatorNames[] = {
     QT_TRANSLATE_NOOP("GridTexts", "Tab"), QT_TRANSLATE_NOOP("GridTexts", "Semicolon"),
@@ -46,7 +48,7 @@ public:
           m_column(column),
           m_copied(read(u'\t')),
           m_understood(rows, m_plan),
-          m_faults(rows, m_plan, [this](const CPastePlan::Fault& fault, const QString& text) { Mend(fault, text); })
+          m_faults(rows, m_plan, [this](int fault, const QString& text) { Mend(fault, text); })
     {
         setWindowTitle(NameOf(GridAction::Paste));
         const QChar separator = SeparatorOf(read);
@@ -62,7 +64,17 @@ public:
     {
         if (exec() != Accepted)
             return std::nullopt;
-        return PasteDecision{m_plan->TakeCells(), m_plan->Choice(), m_plan->CellCount(), m_plan->Faults().size()};
+        return DecisionOf(*m_plan);
+    }
+
+protected:
+    /// With what is still being typed.
+    void accept() override
+    {
+        m_faultView->setCurrentIndex({});
+        FinishMending();
+        if (m_buttons->button(QDialogButtonBox::Ok)->isEnabled())
+            QDialog::accept();
     }
 
 private:
@@ -198,7 +210,7 @@ private:
             });
             connect(units, &QComboBox::activated, this, [this] { Show(); });
         }
-        m_columns->resizeColumnsToContents();
+        FitColumns(*m_columns);
         const int shown = std::min(int(columns.size()), 6), line = m_columns->rowCount() ? m_columns->rowHeight(0) : 0;
         m_columns->setMinimumHeight(m_columns->horizontalHeader()->sizeHint().height() + shown * line + 4);
     }
@@ -242,7 +254,7 @@ private:
         m_plan = std::make_unique<CPastePlan>(m_rows, m_copied, Chosen());
         m_understood.Renew();
         m_faults.Renew();
-        m_faultView->resizeColumnsToContents();
+        FitColumns(*m_faultView);
         m_faultView->setColumnWidth(CFaultModel::Text,
                                     std::max(m_faultView->columnWidth(CFaultModel::Text), TextWidth));
         QApplication::restoreOverrideCursor();
@@ -250,18 +262,38 @@ private:
         ShowSummary();
     }
 
-    void Mend(const CPastePlan::Fault& fault, const QString& text)
+    void Mend(int number, const QString& text)
     {
+        const CPastePlan::Fault& fault = m_plan->Faults()[std::size_t(number)];
         m_copied.texts.Set(fault.line + m_plan->Choice().hasHeaders, fault.column, text);
         m_copied.numbers.reset();
-        QMetaObject::invokeMethod(
-            this,
-            [this] { // the cell is still being edited before
-                Show();
-                if (m_plan->Faults().empty())
-                    m_buttons->button(QDialogButtonBox::Ok)->setFocus();
-            },
-            Qt::QueuedConnection);
+        m_mended = number;
+        QMetaObject::invokeMethod(this, &CPasteDlg::FinishMending, Qt::QueuedConnection); // it is still being edited
+    }
+
+    /// Goes on with the next one that does not fit. What was to be left out still is.
+    void FinishMending()
+    {
+        if (!m_mended)
+            return;
+        const int mended = *std::exchange(m_mended, std::nullopt);
+        const bool leavesOut = m_leaveOut->isChecked();
+        Show();
+        const int left = m_faults.rowCount({});
+        m_leaveOut->setChecked(leavesOut && left > 0);
+        ShowSummary();
+        if (left == 0)
+            m_buttons->button(QDialogButtonBox::Ok)->setFocus();
+        else
+            m_faultView->setCurrentIndex(m_faults.index(std::min(mended, left - 1), CFaultModel::Text));
+    }
+
+    /// Long texts do not push the other columns out of sight.
+    static void FitColumns(QTableView& view)
+    {
+        view.resizeColumnsToContents();
+        for (int column = 0; column < view.model()->columnCount(); ++column)
+            view.setColumnWidth(column, std::min(view.columnWidth(column), MostWidth));
     }
 
     void ShowSummary()
@@ -271,6 +303,9 @@ private:
             GridTexts::Counted(m_plan->Lines(), GridTexts::tr("1 line was copied."),
                                GridTexts::tr("%1 lines were copied.")),
             GridTexts::Counted(fresh, GridTexts::tr("1 line is new."), GridTexts::tr("%1 lines are new."))};
+        if (const std::size_t hidden = m_plan->HiddenLines(); hidden > 0)
+            texts << GridTexts::Counted(hidden, GridTexts::tr("1 line is hidden by the filter."),
+                                        GridTexts::tr("%1 lines are hidden by the filter."));
         if (!m_plan->Complaint().isEmpty())
             texts << m_plan->Complaint();
         m_summary->setText(texts.join(u' '));
@@ -297,9 +332,22 @@ private:
     QTableWidget* m_columns = nullptr;
     QTableView* m_faultView = nullptr;
     QDialogButtonBox* m_buttons = nullptr;
+    std::optional<int> m_mended; // number of the fault
 };
 
 } // namespace
+
+PasteDecision DecisionOf(CPastePlan& plan)
+{
+    PasteDecision decision{.cells = {},
+                           .choice = plan.Choice(),
+                           .cellCount = plan.CellCount(),
+                           .leftOut = plan.Faults().size(),
+                           .hidden = plan.HiddenLines(),
+                           .hasShorterLines = plan.HasShorterLines()};
+    decision.cells = plan.TakeCells();
+    return decision;
+}
 
 std::optional<PasteDecision> AskForPaste(const CTableRows& rows, const ReadCopied& read, int row, int column,
                                          bool hasPlaces, QWidget& parent)

@@ -11,7 +11,11 @@ struct PasteDecision
     PastedCells cells;
     PasteChoice choice;
     std::size_t cellCount = 0, leftOut = 0;
+    std::size_t hidden = 0; // lines that a filter hides
+    bool hasShorterLines = false;
 };
+/// With the cells of the plan, which has none afterwards.
+PasteDecision DecisionOf(CPastePlan& plan);
 
 /// Nothing when the user thinks better of it. `hasPlaces`: the first two columns are branch and chainage.
 std::optional<PasteDecision> AskForPaste(const CTableRows& rows, const ReadCopied& read, int row, int column,

@@ -122,7 +122,6 @@ bool CFaultModel::setData(const QModelIndex& index, const QVariant& value, int r
 {
     if (role != Qt::EditRole || value.toString() == index.data(Qt::EditRole).toString())
         return false;
-    const CPastePlan::Fault fault = FaultAt(index);
-    m_mend(fault, value.toString());
+    m_mend(index.row(), value.toString());
     return true;
 }

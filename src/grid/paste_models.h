@@ -42,7 +42,7 @@ public:
         Reason,
         Count
     };
-    using Mend = std::function<void(const CPastePlan::Fault& fault, const QString& text)>;
+    using Mend = std::function<void(int fault, const QString& text)>; // which of the plan's
     CFaultModel(const CTableRows& rows, const std::unique_ptr<CPastePlan>& plan, Mend mend)
         : m_rows(rows), m_plan(plan), m_mend(std::move(mend))
     {

@@ -143,6 +143,27 @@ std::size_t CPastePlan::NewLines() const
     return std::size_t(std::ranges::count(m_rowOf, New));
 }
 
+std::size_t CPastePlan::HiddenLines() const
+{
+    return std::size_t(std::ranges::count_if(
+        m_rowOf, [this](std::size_t row) { return row != New && row != Nowhere && m_rows->ShownRow(row) < 0; }));
+}
+
+bool CPastePlan::HasShorterLines() const
+{
+    for (std::size_t line = 0; line < Lines(); ++line)
+        if (m_copied->texts.Width(line + m_first) < Columns())
+            return true;
+    return false;
+}
+
+/// The cells of the column say which line theirs is, and stay as they are.
+bool CPastePlan::NamesLine(int column) const
+{
+    const int target = m_choice.columns[std::size_t(column)].target;
+    return m_choice.place == PastePlace::ByPlace && target >= 0 && target <= 1;
+}
+
 // ---- cells -------------------------------------------------------------------------------------
 
 /// The number in base units that belongs to a text; empty where none does.
@@ -209,9 +230,9 @@ void CPastePlan::ReadColumn(int column)
     if (target < 0)
         return;
     const ColumnSpec& spec = m_rows->Column(target);
-    const bool isKey = m_choice.place == PastePlace::ByPlace && target <= 1; // names the line, and stays as it is
+    const bool isKey = NamesLine(column);
     const bool isPlain = spec.Kind() == CellKind::Number && !spec.locked && IsAsTyped(column);
-    const CellValue nothing = m_rows->Resolved(target, {});
+    const CellValue nothing = m_rows->Resolved(target, {}, BlankRule::Fill); // as a cell that is cleared
     CCellValues& values = m_values[std::size_t(column)];
     CellReading read;
     QStringView last;
@@ -221,7 +242,7 @@ void CPastePlan::ReadColumn(int column)
         if (!isThere || row == Nowhere || (isKey && row != New)) {
             values.Add(nothing, Lines());
             Leave(line, column);
-            m_cellCount += isThere && isKey;
+            m_cellCount += isThere && isKey && row != Nowhere;
             continue;
         }
         const QStringView text = m_copied->texts.At(line + m_first, column);
@@ -249,7 +270,7 @@ void CPastePlan::ReadColumn(int column)
             values.Add(nothing, Lines());
             last = {};
         } else {
-            values.Add(m_rows->Resolved(target, read.value), Lines());
+            values.Add(m_rows->Resolved(target, read.value, BlankRule::Fill), Lines());
         }
     }
 }
@@ -257,6 +278,17 @@ void CPastePlan::ReadColumn(int column)
 void CPastePlan::AddFault(std::size_t line, int column, const QString& reason)
 {
     m_faults.push_back({line, column, reason});
+}
+
+/// How many texts of the line have a cell that takes them.
+std::size_t CPastePlan::CellsOf(std::size_t line) const
+{
+    std::size_t count = 0;
+    for (int column = 0; column < std::min(Columns(), m_copied->texts.Width(line + m_first)); ++column)
+        count += m_choice.columns[std::size_t(column)].target >= 0;
+    return count - std::size_t(std::ranges::count_if(m_faults, [line](const Fault& fault) {
+               return fault.line == line && fault.column >= 0;
+           }));
 }
 
 /// Rows that depend on each other: those that do not fit are left out one by one.
@@ -272,8 +304,10 @@ void CPastePlan::FindRuleFaults()
         const auto fault = m_rows->Fault(Cells(m_values, m_left));
         if (!fault)
             return;
-        AddFault(lines[fault->row], -1, fault->text);
-        m_rowOf[lines[fault->row]] = Nowhere;
+        const std::size_t line = lines[fault->row];
+        m_cellCount -= CellsOf(line);
+        AddFault(line, -1, fault->text);
+        m_rowOf[line] = Nowhere;
     }
     m_complaint = m_faults.back().reason;
 }
@@ -331,6 +365,10 @@ QString CPastePlan::Understood(std::size_t line, int column) const
 {
     const int target = m_choice.columns[std::size_t(column)].target;
     const auto& left = m_left[std::size_t(column)];
+    if (const auto row = RowOf(line); row && NamesLine(column)) {
+        const ColumnSpec& spec = m_rows->Column(target);
+        return EditText(spec, spec.access->get(m_rows->Rows()->At(*row)));
+    }
     if (target < 0 || (!left.empty() && left[line]))
         return Text(line, column);
     return EditText(m_rows->Column(target), m_values[std::size_t(column)][line]);

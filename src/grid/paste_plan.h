@@ -67,12 +67,16 @@ public:
     int Columns() const { return int(m_choice.columns.size()); }
     /// What was copied.
     QString Text(std::size_t line, int column) const;
-    /// The text of the cell that it becomes; as copied where it does not fit.
+    /// The text of the cell that it becomes, or is where that names the line; as copied where it does not fit.
     QString Understood(std::size_t line, int column) const;
     /// The row of the source that a line goes to, unless it becomes a new one or goes nowhere.
     std::optional<std::size_t> RowOf(std::size_t line) const;
     bool IsNew(std::size_t line) const;
     std::size_t NewLines() const;
+    /// Lines that go to rows which a filter hides.
+    std::size_t HiddenLines() const;
+    /// Some lines have fewer cells than others, and leave those of the table as they are.
+    bool HasShorterLines() const;
 
     struct Fault
     {
@@ -95,6 +99,7 @@ private:
     void FindComplaint();
     void FindRows();
     void FindRowsByPlace();
+    bool NamesLine(int column) const;
     QStringView WholeNumber(std::size_t line, int column) const;
     QString NumberText(std::size_t line, int column) const;
     bool IsAsTyped(int column) const;
@@ -102,6 +107,7 @@ private:
     void ReadColumn(int column);
     void Leave(std::size_t line, int column);
     void AddFault(std::size_t line, int column, const QString& reason);
+    std::size_t CellsOf(std::size_t line) const;
     void FindRuleFaults();
     PastedCells Cells(std::vector<CCellValues> values, std::vector<std::vector<bool>> left) const;
     PastedCells::Column WithoutLinesThatGoNowhere(PastedCells::Column column) const;

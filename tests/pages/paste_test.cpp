@@ -174,6 +174,37 @@ TEST_F(PasteTest, EveryBadCellIsListedAndCanBeMendedOrLeftOut)
     EXPECT_EQ(boxes, QStringList());
 }
 
+TEST_F(PasteTest, TheNextBadCellIsAtHandAndWhatIsStillTypedIsPasted)
+{
+    Paste(1, 1, "X\t1\t2\ta\nY\t2\t3\tb\nZ\t3\t5\tc", [&](QDialog& dialog) {
+        QTableView& faults = Faults(dialog);
+        auto* leaveOut = dialog.findChild<QCheckBox*>("leaveOut");
+        leaveOut->click();
+        faults.setCurrentIndex(faults.model()->index(0, 2));
+        Mend(dialog, 0, "7");
+        EXPECT_EQ(faults.currentIndex(), faults.model()->index(0, 2)) << "the second one, which is the first now";
+        EXPECT_TRUE(leaveOut->isChecked());
+        faults.edit(faults.currentIndex());
+        auto* editor = faults.findChild<QLineEdit*>();
+        ASSERT_TRUE(editor);
+        editor->setText("42");
+    });
+    EXPECT_EQ(Stored().toStdString(), "X 1 2 7, Y 2 3 42, Z 3 5 3");
+    EXPECT_EQ(said.toStdString(), "11 cells pasted; 1 left out");
+}
+
+TEST_F(PasteTest, BlankCellsAreAsClearedOnes)
+{
+    document.Parameters().Global.G_waterlevel = 3.5;
+    Paste(1, 3, "\t7\n2\t8");
+    EXPECT_FALSE(asked);
+    EXPECT_EQ(Stored().toStdString(), "A 0 3.5 7, A 100 2 8, B 0 30 3");
+    Paste(1, 1, "A\t0\t5\t7\nA\t100\t6\t8");
+    EXPECT_EQ(said.toStdString(), "8 cells pasted") << "what stays as it was is what was copied";
+    Paste(1, 1, "A\t0\t5\t7\nA\t100");
+    EXPECT_EQ(said.toStdString(), "6 cells pasted; shorter lines leave their other cells as they were");
+}
+
 TEST_F(PasteTest, ColumnsGoWhereTheirHeadersSay)
 {
     for (const char* text : {"initial q [l/s]\tNote\tRIVER NAME\tInitial h [m]\n500\tx\tM\t7\n250\ty\tN\t8",

@@ -54,6 +54,10 @@ protected:
             QTest::qWait(20); // scroll bars come and go
             const auto* area = sheet.currentWidget()->findChild<QScrollArea*>();
             ASSERT_TRUE(area);
+            const auto fits = [area] {
+                return !Hidden(area->horizontalScrollBar()) && !Hidden(area->verticalScrollBar());
+            };
+            static_cast<void>(QTest::qWaitFor(fits, 300)); // on a busy machine later
             SCOPED_TRACE(sheet.tabText(tab).toStdString());
             check(*area);
         }

@@ -1149,5 +1149,21 @@
         <source>was %1 at the last save</source>
         <translation>前回の保存時は %1</translation>
     </message>
+    <message>
+        <source>1 line is hidden by the filter</source>
+        <translation>1 行はフィルターで非表示</translation>
+    </message>
+    <message>
+        <source>%1 lines are hidden by the filter</source>
+        <translation>%1 行はフィルターで非表示</translation>
+    </message>
+    <message>
+        <source>1 line is hidden by the filter.</source>
+        <translation>フィルターで非表示の行が 1 行あります。</translation>
+    </message>
+    <message>
+        <source>%1 lines are hidden by the filter.</source>
+        <translation>フィルターで非表示の行が %1 行あります。</translation>
+    </message>
 </context>
 </TS>
