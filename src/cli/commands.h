@@ -21,25 +21,12 @@ enum class Format
     Json
 };
 
-/// What a command may do to the file that it writes over, which nobody is there to be asked about.
-struct WriteConsent
-{
-    enum HardLinks
-    {
-        Refused,
-        All, // of the file's names get the new content
-        One  // is left for the file, the others keep what they are
-    };
-    HardLinks hardLinks = Refused;
-    bool losesMetadata = false; // owner, group, mode, access list, attributes
-};
-
 int Check(const std::vector<std::string>& files);
 /// An overview of the file, or the records of one list.
 int Show(const std::string& file, const std::string& list, Format format);
 int Get(const std::string& file, const std::string& keyword);
 /// Writes to `out`, or over the file when that is empty.
 int Set(const std::string& file, const std::string& keyword, const std::vector<std::string>& values,
-        const std::string& out, const WriteConsent& consent);
-int Fmt(const std::string& file, const std::string& out, bool checkOnly, const WriteConsent& consent);
+        const std::string& out);
+int Fmt(const std::string& file, const std::string& out, bool checkOnly);
 int New(const std::string& file);

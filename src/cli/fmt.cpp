@@ -1,6 +1,6 @@
 #include "cli/open_file.h"
 
-int Fmt(const std::string& file, const std::string& out, bool checkOnly, const WriteConsent& consent)
+int Fmt(const std::string& file, const std::string& out, bool checkOnly)
 {
     const std::string& target = out.empty() ? file : out;
     FileLock lock;
@@ -18,5 +18,5 @@ int Fmt(const std::string& file, const std::string& out, bool checkOnly, const W
         return same ? Exit::Fine : Complain(file + " is not in canonical form.", Exit::Findings);
     if (same && out.empty())
         return Exit::Fine;
-    return Rewrite(parameters, target, lock, consent, out.empty() ? std::optional(version) : VersionThere(out));
+    return Rewrite(parameters, target, lock, out.empty() ? std::optional(version) : std::nullopt);
 }

@@ -76,21 +76,7 @@ struct Arguments
     std::string file, list, keyword, out;
     Format format = Format::Table;
     bool checkOnly = false;
-    WriteConsent consent;
 };
-
-/// Of a command that writes over files.
-void AddConsent(CLI::App& command, WriteConsent& consent)
-{
-    const std::map<std::string, WriteConsent::HardLinks> names{{"all", WriteConsent::All}, {"one", WriteConsent::One}};
-    command
-        .add_option("--hard-links", consent.hardLinks,
-                    "all or one: a file of several names is written under all of them, or under this one alone; "
-                    "otherwise it is left as it is")
-        ->transform(CLI::CheckedTransformer(names));
-    command.add_flag("--lose-metadata", consent.losesMetadata,
-                     "Write a file whose owner, group, mode, access list or attributes cannot be kept, too");
-}
 
 /// What was said has to arrive.
 int EndOutput()
@@ -139,7 +125,6 @@ int Run(int argc, char** argv)
     set->add_option("FILE", a.file, "HD parameter file")->required();
     set->add_option("KEYWORD", a.keyword, "Keyword, or Section/Keyword")->required();
     set->add_option("-o,--output", a.out, "Write here instead of over FILE");
-    AddConsent(*set, a.consent);
     set->allow_extras();
     set->formatter(std::make_shared<SetFormatter>());
     set->footer("One value a parameter: numbers, true or false, texts; lists begin with their\n"
@@ -148,7 +133,6 @@ int Run(int argc, char** argv)
     CLI::App* const fmt = app.add_subcommand("fmt", "Rewrite a file in canonical form, every record included");
     fmt->add_option("FILE", a.file, "HD parameter file")->required();
     fmt->add_option("-o,--output", a.out, "Write here instead of over FILE");
-    AddConsent(*fmt, a.consent);
     fmt->add_flag("--check", a.checkOnly, "Write nothing; exit with 1 if the file would change");
     fmt->footer("Comments of the file are not kept.");
 
@@ -174,9 +158,9 @@ int Run(int argc, char** argv)
     else if (get->parsed())
         code = Get(a.file, a.keyword);
     else if (set->parsed() && TakeValues(set->remaining(), literals, values))
-        code = Set(a.file, a.keyword, values, a.out, a.consent);
+        code = Set(a.file, a.keyword, values, a.out);
     else if (fmt->parsed())
-        code = Fmt(a.file, a.out, a.checkOnly, a.consent);
+        code = Fmt(a.file, a.out, a.checkOnly);
     else if (create->parsed())
         code = New(a.file);
 

@@ -10,5 +10,5 @@ int New(const std::string& file)
     if (std::filesystem::exists(std::filesystem::symlink_status(PathFromUtf8(file), error)))
         return Complain("\"" + file + "\" exists already; it was left as it is.", Exit::NotWritten);
     const HD_Parameters defaults;
-    return Rewrite(defaults, file, lock, {});
+    return Rewrite(defaults, file, lock);
 }

@@ -79,49 +79,19 @@ int LockFile(const std::string& path, FileLock& lock)
                     Exit::NotWritten);
 }
 
-std::optional<FileVersion> VersionThere(const std::string& path)
-{
-    const Result<std::string> text = ReadWholeFile(path);
-    return text ? std::optional(VersionOfText(text.value())) : std::nullopt;
-}
-
-/// The answer to what the writer asks; a refusal in words where there is no consent.
-static WriteAnswer Answer(const WriteQuestion& question, const WriteConsent& consent, std::string& refusal)
-{
-    const std::string leftAsItIs = "\"" + question.path + "\" was left as it is: ";
-    switch (question.kind) {
-    case WriteQuestion::HardLinks:
-        if (consent.hardLinks != WriteConsent::Refused)
-            return consent.hardLinks == WriteConsent::All ? WriteAnswer::Yes : WriteAnswer::No;
-        refusal = leftAsItIs + "it has " + std::to_string(question.names) +
-                  " names (hard links). Say --hard-links all for the new content under all of them, or --hard-links " +
-                  "one to leave the others what they are.";
-        return WriteAnswer::Cancel;
-    case WriteQuestion::LosesMetadata:
-        if (consent.losesMetadata)
-            return WriteAnswer::Yes;
-        refusal = leftAsItIs + "this could not be kept of it: " + LostText(question.lost) +
-                  ". Say --lose-metadata to write it all the same.";
-        return WriteAnswer::Cancel;
-    default:
-        return WriteAnswer::No;
-    }
-}
-
-int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock, const WriteConsent& consent,
+int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
             const std::optional<FileVersion>& expected)
 {
-    std::string refusal;
-    const auto ask = [&](const WriteQuestion& question) { return Answer(question, consent, refusal); };
-    const auto saved = SaveHDFile(
-        parameters, path, {.everySet = true, .file = {.expected = expected, .isLocked = lock.IsHeld(), .ask = ask}});
+    const auto saved =
+        SaveHDFile(parameters, path, {.everySet = true, .file = {.expected = expected, .isLocked = lock.IsHeld()}});
     if (!saved)
-        return Complain(refusal.empty() ? saved.error().message : refusal, Exit::NotWritten);
+        return Complain(saved.error().message, Exit::NotWritten);
     const std::string name = "\"" + path + "\" ";
     const WriteReport& report = saved.value();
-    const std::string lockFile = lock.Path().empty() ? "" : "\"" + lock.Path() + "\" cannot be one: ";
     if (lock.WhyNone())
-        Complain(name + "was written without a lock: " + lockFile + lock.WhyNone().message() + ".", Exit::Fine);
+        Complain(name + "was written without a lock: \"" + lock.Path() +
+                     "\" cannot be one: " + lock.WhyNone().message() + ".",
+                 Exit::Fine);
     if (report.unconfirmed)
         Complain(name + "is saved, but the disk has not confirmed it: " + report.unconfirmed.message() + ".",
                  Exit::Fine);

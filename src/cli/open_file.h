@@ -31,12 +31,8 @@ int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters
 /// message that says who has it. A folder that takes no locks is no reason to stop; Rewrite tells of it.
 int LockFile(const std::string& path, FileLock& lock);
 
-/// What the file holds, be it of ours or not; nothing where none can be read.
-std::optional<FileVersion> VersionThere(const std::string& path);
-
-/// Saves with everything in it, incomplete lines and encroachment sets included, over the content `expected` only. What
-/// the file would lose by it without consent is said, and nothing written.
-int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock, const WriteConsent& consent,
+/// Saves with everything in it, incomplete lines and encroachment sets included, over the content `expected` only.
+int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
             const std::optional<FileVersion>& expected = {});
 
 /// Prints "file:line:column: text" of each; of a kind the first thousand, and how many more there are.

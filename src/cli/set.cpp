@@ -3,7 +3,7 @@
 #include "cli/open_file.h"
 
 int Set(const std::string& file, const std::string& keyword, const std::vector<std::string>& values,
-        const std::string& out, const WriteConsent& consent)
+        const std::string& out)
 {
     const Result<NamedValue> value = FindKeyword(keyword);
     if (!value)
@@ -18,5 +18,5 @@ int Set(const std::string& file, const std::string& keyword, const std::vector<s
         return failed;
     if (const Result<void> stored = ParseParams(value.value().fields, values, &parameters.Global); !stored)
         return Complain(value.value().name + ": " + stored.error().message + ".", Exit::Usage);
-    return Rewrite(parameters, target, lock, consent, out.empty() ? std::optional(version) : VersionThere(out));
+    return Rewrite(parameters, target, lock, out.empty() ? std::optional(version) : std::nullopt);
 }

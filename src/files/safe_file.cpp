@@ -98,11 +98,10 @@ Result<void> SafeWriter::AskBefore()
         if (const std::error_code error = VersionOfFile(m_platform, m_target, found, m_options.expected))
             return Failed(error);
         m_isExpected = found == *m_options.expected;
-        const WriteAnswer answer = m_isExpected    ? WriteAnswer::Yes
-                                   : m_options.ask ? Ask(WriteQuestion::ChangedOutside)
-                                                   : WriteAnswer::No;
-        if (answer != WriteAnswer::Yes)
-            return answer == WriteAnswer::No ? Failed(std::make_error_code(ChangedOutside)) : cancelled;
+        if (!m_isExpected && !m_options.ask)
+            return Failed(std::make_error_code(ChangedOutside));
+        if (!m_isExpected && Ask(WriteQuestion::ChangedOutside) != WriteAnswer::Yes)
+            return cancelled;
     }
     m_report.inPlace = m_seen.links > 1;
     if (!m_report.inPlace || !m_options.ask)

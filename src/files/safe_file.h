@@ -12,8 +12,7 @@ struct WriteQuestion
 {
     enum Kind
     {
-        ChangedOutside, // somebody wrote another content than `expected`; it will be kept in a copy. Yes: go on, No:
-                        // the error is ChangedOutside
+        ChangedOutside, // somebody wrote another content than `expected`; it will be kept in a copy. Yes: go on
         HardLinks,      // the file has other names. Yes: all get the new content, No: this one alone
         LosesMetadata   // what `lost` names cannot be given to the new file. Yes: go on
     };

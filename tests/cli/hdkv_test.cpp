@@ -334,54 +334,6 @@ TEST_F(Hdkv, ProgramsThatChangeOneFileAtOnceLoseNothing)
     EXPECT_EQ(Text("a.hdkv"), before);
 }
 
-TEST_F(Hdkv, WhatBecomesOfTheOtherNamesOfAFileHasToBeSaid)
-{
-    std::filesystem::create_hard_link(m_folder / "a.hdkv", m_folder / "b.hdkv");
-    const auto inB = [this] { return Run("get b.hdkv G_f"), out; };
-    const std::string before = Text("a.hdkv");
-    for (const char* const command : {"set a.hdkv G_f 1", "fmt a.hdkv", "set a.hdkv G_f 1 -o b.hdkv"}) {
-        if (std::string_view(command) == "fmt a.hdkv")
-            Write("a.hdkv", "// one more\n" + before);
-        EXPECT_EQ(Run(command), 4);
-        EXPECT_NE(err.find(" was left as it is: it has 2 names (hard links). Say --hard-links all"), std::string::npos)
-            << err;
-    }
-    EXPECT_EQ(Text("a.hdkv"), "// one more\n" + before);
-    EXPECT_EQ(Run("set a.hdkv --hard-links all G_f 3"), 0) << err;
-    EXPECT_EQ(inB(), "3\n");
-    EXPECT_EQ(std::filesystem::hard_link_count(m_folder / "a.hdkv"), 2u);
-    EXPECT_EQ(Run("set a.hdkv --hard-links one G_f 4"), 0) << err;
-    EXPECT_EQ(Got("G_f") + inB(), "4\n3\n");
-    EXPECT_EQ(Run("set a.hdkv G_f 5"), 0) << err;
-    EXPECT_EQ(Run("set a.hdkv --hard-links two G_f 5"), 2);
-    EXPECT_EQ(inB(), "3\n");
-}
-
-TEST_F(Hdkv, WhatCannotBeKeptOfAFileHasToBeAllowed)
-{
-    // As nobody in particular, who may write into the folder but not give files away.
-    const std::string asNobody = "setpriv --reuid=65534 --regid=65534 --clear-groups ";
-    if (std::system((asNobody + "true 2>/dev/null").c_str()) != 0)
-        GTEST_SKIP() << "only the system's owner can become somebody else";
-    std::filesystem::permissions(m_folder, std::filesystem::perms::all);
-    std::filesystem::permissions(m_folder / "a.hdkv", std::filesystem::perms(0646));
-    for (const char* const name : {"out.txt", "err.txt"}) {
-        Write(name, "");
-        std::filesystem::permissions(m_folder / name, std::filesystem::perms(0666));
-    }
-    const std::string before = Text("a.hdkv");
-    m_prefix = asNobody;
-    EXPECT_EQ(Run("set a.hdkv G_f 1"), 4);
-    EXPECT_NE(err.find("\"a.hdkv\" was left as it is: this could not be kept of it: owner, group, mode. Say"),
-              std::string::npos)
-        << err;
-    EXPECT_EQ(Text("a.hdkv"), before);
-    EXPECT_EQ(Run("set --lose-metadata a.hdkv G_f 1"), 0) << err;
-    EXPECT_NE(err.find("\"a.hdkv\" is saved; not kept of it as it was before: owner, group, mode."), std::string::npos)
-        << err;
-    EXPECT_EQ(Run("set a.hdkv G_f 2"), 0) << "it is his own now: " << err;
-}
-
 TEST_F(Hdkv, WhatAKilledSaveDisplacedIsNamed)
 {
     {

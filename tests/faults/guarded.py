@@ -3,72 +3,50 @@ import os
 import re
 import shutil
 import stat
-import struct
 
 # What a program may leave that is killed or can no longer remove anything: its temporary file and its lock.
 OURS = re.compile(r'\.kvr-.*|.*\.lock')
 
 
-# A list that lets another user read, too: version, then tag, permissions and user of each entry.
-ANYBODY, NAMED_USER = 0xffffffff, 1234
-
-
-def access_list(mode):
-    owner, group, others = mode >> 6 & 7, mode >> 3 & 7, mode & 7
-    entries = ((1, owner, ANYBODY), (2, 4, NAMED_USER), (4, group, ANYBODY), (16, group, ANYBODY), (32, others, ANYBODY))
-    return struct.pack('<I', 2) + b''.join(struct.pack('<HHI', *entry) for entry in entries)
-
-
 class Guarded:
     def __init__(self, folder, name, text, linked=False, mode=0o640):
-        """`linked`: the name is a symbolic link into another folder. Without a text there is no file yet."""
+        """`linked`: the name is a symbolic link into another folder."""
         shutil.rmtree(folder, ignore_errors=True)
         os.makedirs(f'{folder}/far' if linked else folder)
         self.folder = folder
         self.path = os.path.join(folder, name)
         self._real = os.path.join(folder, 'far', name) if linked else self.path
-        if text is not None:
-            with open(self._real, 'w', encoding='utf-8', newline='\n') as file:
-                file.write(text)
-            os.chmod(self._real, mode)
-            self._give('user.kept', b'by a save')
-            self._give('system.posix_acl_access', access_list(mode))
+        with open(self._real, 'w', encoding='utf-8', newline='\n') as file:
+            file.write(text)
+        os.chmod(self._real, mode)
+        self._attributes = self._set_attribute()
         if linked:
             os.symlink(os.path.join('far', name), self.path)
         self.start_over()
 
     def start_over(self):
         """What is there now is what has to be kept."""
-        self._before = self._metadata()
         self.text = self.content()
+        self._before = self._metadata()
         self._names = self._listing()
 
-    def _give(self, attribute, value):
+    def _set_attribute(self):
         try:
-            os.setxattr(self._real, attribute, value)
+            os.setxattr(self._real, 'user.kept', b'by a save')
+            return True
         except OSError:  # the file system has none
-            pass
-
-    def _attributes(self):
-        try:
-            return {name: os.getxattr(self._real, name) for name in sorted(os.listxattr(self._real))}
-        except OSError:
-            return {}
+            return False
 
     def _metadata(self):
-        if not os.path.exists(self._real):
-            return {}
         status = os.stat(self._real)
         return {'mode': stat.filemode(status.st_mode), 'owner': status.st_uid, 'group': status.st_gid,
-                'link': os.path.islink(self.path), 'attributes': self._attributes()}
+                'link': os.path.islink(self.path), 'attributes': os.listxattr(self._real) if self._attributes else []}
 
     def _listing(self):
         return sorted(os.path.relpath(os.path.join(top, name), self.folder)
                       for top, _, names in os.walk(self.folder) for name in names)
 
     def content(self):
-        if self._before == {} and not os.path.exists(self.path):
-            return None
         with open(self.path, encoding='utf-8', errors='replace', newline='') as file:
             return file.read()
 
@@ -76,8 +54,7 @@ class Guarded:
         """Names that do not belong there. An empty lock that could not be looked at may be somebody else's, and stays."""
         def is_right(name):
             is_lock = name.endswith('.lock') and os.path.getsize(os.path.join(self.folder, name)) == 0
-            is_its_own = name == os.path.relpath(self.path, self.folder)
-            return is_its_own or name in self._names or is_lock or (may_litter and OURS.fullmatch(os.path.basename(name)))
+            return name in self._names or is_lock or (may_litter and OURS.fullmatch(os.path.basename(name)))
 
         return [name for name in self._listing() if not is_right(name)]
 
@@ -91,9 +68,9 @@ class Guarded:
             return [f'the file is gone: {error}']
         wrong = []
         if content not in (self.text, new):
-            there, wanted = content or '', new or ''
-            strange = next((line for line in there.splitlines() if line not in wanted.splitlines()), 'fewer lines')
-            wrong.append(f'neither old nor new content ({len(there)} characters for {len(wanted)}): {strange}')
+            lines = new.splitlines()
+            strange = next((line for line in content.splitlines() if line not in lines), 'fewer lines')
+            wrong.append(f'neither old nor new content ({len(content)} characters for {len(new)}): {strange}')
         elif saved is not None and (content == new) != saved:
             wrong.append(f'said {"saved" if saved else "not saved"}, the content is {"new" if content == new else "old"}')
         now = self._metadata()

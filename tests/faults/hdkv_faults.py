@@ -1,16 +1,11 @@
 """Every fault at every file call of the commands of hdkv that write."""
 import os
-import re
 import subprocess
 
 import faults
 from guarded import Guarded
 
-# What is said to write the file, be there another one to read or not. A new file has the time of day in it, which none
-# of two runs shares; the others have to keep theirs.
-COMMANDS = {'set': ('set', '{file}', 'G_waterlevel', '4.25'), 'fmt': ('fmt', '{file}'),
-            'set -o': ('set', '{source}', 'G_waterlevel', '4.25', '-o', '{file}'), 'new': ('new', '{file}')}
-DATES = re.compile(r'(LimitedPeriod\w+ = ).*')
+COMMANDS = {'set': ('G_waterlevel', '4.25'), 'fmt': ()}  # and what follows the file
 
 
 def old_text(hdkv, folder):
@@ -23,45 +18,30 @@ def old_text(hdkv, folder):
     return f'{first}\n// A comment.\n{rest}'
 
 
-class NewFile(Guarded):
-    """A file that is not there yet."""
-
-    def __init__(self, folder):
-        super().__init__(folder, 'river.HDKV', None)
-
-    def content(self):
-        text = super().content()
-        return text and DATES.sub(r'\1', text)
-
-
 class Runs:
     def __init__(self, hdkv, folder, orders):
         self._hdkv, self._orders = hdkv, orders
         self._folder, self._old = f'{folder}/hdkv', old_text(hdkv, folder)
-        self._source = f'{folder}/source.HDKV'
-        with open(self._source, 'w', encoding='utf-8') as file:
-            file.write(self._old)
 
-    def guarded(self, command, linked):
-        return NewFile(self._folder) if command == 'new' else Guarded(self._folder, 'river.HDKV', self._old, linked)
+    def guarded(self, linked):
+        return Guarded(self._folder, 'river.HDKV', self._old, linked)
 
     def run(self, command, point=None):
         self._orders.arm(self._folder, point)
-        words = [word.format(file=f'{self._folder}/river.HDKV', source=self._source) for word in COMMANDS[command]]
-        result = subprocess.run([self._hdkv, *words], timeout=60, capture_output=True, text=True,
-                                env={**os.environ, **self._orders.environment})
+        result = subprocess.run([self._hdkv, command, f'{self._folder}/river.HDKV', *COMMANDS[command]], timeout=60,
+                                capture_output=True, text=True, env={**os.environ, **self._orders.environment})
         return result, self._orders.disarm()
 
     def reference(self, command, linked):
         """What the file holds when the command has worked, and the calls that it took."""
-        guarded = self.guarded(command, linked)
+        guarded = self.guarded(linked)
         result, calls = self.run(command)
-        if result.returncode != 0 or not calls or guarded.content() == guarded.text:
+        if result.returncode != 0 or not calls or guarded.content() == self._old:
             raise RuntimeError(f'hdkv {command} does not work here: {result.stderr}')
         return guarded.content(), calls
 
     def violations(self, command, linked, point, new):
-        guarded = self.guarded(command, linked)
+        guarded = self.guarded(linked)
         result, _ = self.run(command, point)
         if not point.kills:
             if result.returncode < 0:
@@ -70,8 +50,6 @@ class Runs:
             found = guarded.violations(new, result.returncode == 0, said=result.stderr, may_litter=point.keeps_files)
             return found + silent * ['failed without a word']
         found = guarded.violations(new, None, may_litter=True)
-        if command == 'new' and guarded.content() == new:
-            return found
         result, _ = self.run(command)  # and it can be said again
         return found + (guarded.violations(new, True, may_litter=True) if result.returncode == 0 else [result.stderr])
 
@@ -80,7 +58,7 @@ def run(programs, folder, orders, every):
     """Goes through every nth point. Gives back how many there were and what did not hold."""
     runs, count, wrong = Runs(f'{programs}/hdkv', folder, orders), 0, []
     for command in COMMANDS:
-        for linked in (False, True)[:1 if command == 'new' else 2]:
+        for linked in (False, True):
             new, calls = runs.reference(command, linked)
             for point in list(faults.points(calls))[::every]:
                 count += 1
