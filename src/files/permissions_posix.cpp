@@ -124,7 +124,7 @@ std::error_code TakePermissionsOf(int file, const char* from, LostMetadata& lost
         mode &= 0777;
     if (lost.group)
         mode = (mode & ~mode_t(070)) | (mode & 07) << 3;
-    lost.mode = !lost.group && mode != (wanted.st_mode & 07777);
+    lost.mode = mode != (wanted.st_mode & 07777);
     return SetMode(file, mode, lost.mode);
 }
 

@@ -521,6 +521,7 @@ TEST_F(SafeFile, AnOwnerThatCannotBeKeptIsLostWithTheRightsOfTheGroup)
     ASSERT_EQ(::setegid(0), 0);
     ASSERT_TRUE(a && b);
     EXPECT_EQ(LostText(a.value().lost), "owner, group");
+    EXPECT_EQ(LostText(b.value().lost), "owner, group, mode");
     EXPECT_EQ(fs::status(m_folder / "a.hdkv").permissions(), fs::perms(0666));
     EXPECT_EQ(fs::status(m_folder / "b.hdkv").permissions(), fs::perms(0622)) << "another group may no more than all";
 }
