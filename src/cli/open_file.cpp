@@ -114,6 +114,8 @@ std::string RefusalText(const WriteQuestion& question)
 int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock, const Output& allowed,
             const std::optional<FileVersion>& expected)
 {
+    if (lock.WhyNone() && lock.Path().empty()) // it would be written without knowing what a link leads to
+        return Complain(NotWritten(path, lock.WhyNone()).message, Exit::NotWritten);
     std::optional<WriteQuestion> refused;
     const auto ask = [&](const WriteQuestion& question) {
         const WriteAnswer answer = Answer(question, allowed);

@@ -47,8 +47,9 @@ class Runs:
             if result.returncode < 0:
                 return [f'ended by signal {-result.returncode}']
             silent = result.returncode != 0 and not result.stderr.strip()
+            nameless = '""' in result.stderr
             found = guarded.violations(new, result.returncode == 0, said=result.stderr, may_litter=point.keeps_files)
-            return found + silent * ['failed without a word']
+            return found + silent * ['failed without a word'] + nameless * [f'names nothing: {result.stderr}']
         found = guarded.violations(new, None, may_litter=True)
         result, _ = self.run(command)  # and it can be said again
         return found + (guarded.violations(new, True, may_litter=True) if result.returncode == 0 else [result.stderr])
