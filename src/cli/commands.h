@@ -21,12 +21,33 @@ enum class Format
     Json
 };
 
+/// What is to become of the other names of a file that has several (hard links).
+enum class HardLinks
+{
+    Refuse, // the file is not written
+    Keep,   // all names get the new content
+    Split   // only the one that the command was given
+};
+
+/// Where a command writes to, and what it may do there. A script cannot be asked, so it says so beforehand.
+struct Output
+{
+    std::string path; // empty: over the file that was read
+    HardLinks hardLinks = HardLinks::Refuse;
+    bool loseMetadata = false; // owner, group, mode and the like may be others afterwards
+
+    const std::string& Over(const std::string& file) const { return path.empty() ? file : path; }
+};
+namespace Option { // that allow what is refused without them
+inline constexpr const char* HardLinks = "--hard-links";
+inline constexpr const char* LoseMetadata = "--lose-metadata";
+} // namespace Option
+
 int Check(const std::vector<std::string>& files);
 /// An overview of the file, or the records of one list.
 int Show(const std::string& file, const std::string& list, Format format);
 int Get(const std::string& file, const std::string& keyword);
-/// Writes to `out`, or over the file when that is empty.
 int Set(const std::string& file, const std::string& keyword, const std::vector<std::string>& values,
-        const std::string& out);
-int Fmt(const std::string& file, const std::string& out, bool checkOnly);
+        const Output& output);
+int Fmt(const std::string& file, const Output& output, bool checkOnly);
 int New(const std::string& file);

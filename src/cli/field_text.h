@@ -1,8 +1,8 @@
 // Declared fields as text: for reading by people, by other programs, and back from a command line.
 #pragma once
 
-#include "files/field.h"
 #include "base/result.h"
+#include "files/field.h"
 
 #include <optional>
 #include <string>

@@ -1,8 +1,8 @@
 #include "cli/open_file.h"
 
-int Fmt(const std::string& file, const std::string& out, bool checkOnly)
+int Fmt(const std::string& file, const Output& output, bool checkOnly)
 {
-    const std::string& target = out.empty() ? file : out;
+    const std::string& target = output.Over(file);
     FileLock lock;
     if (const int failed = checkOnly ? Exit::Fine : LockFile(target, lock))
         return failed;
@@ -16,7 +16,7 @@ int Fmt(const std::string& file, const std::string& out, bool checkOnly)
     const bool same = before.value() == HDFileText(parameters, true);
     if (checkOnly)
         return same ? Exit::Fine : Complain(file + " is not in canonical form.", Exit::Findings);
-    if (same && out.empty())
+    if (same && output.path.empty())
         return Exit::Fine;
-    return Rewrite(parameters, target, lock, out.empty() ? std::optional(version) : std::nullopt);
+    return Rewrite(parameters, target, lock, output, output.path.empty() ? version : VersionThere(target));
 }

@@ -73,10 +73,27 @@ bool IsUnknownCommand(const CLI::App& app, int argc, char** argv)
 struct Arguments
 {
     std::vector<std::string> files;
-    std::string file, list, keyword, out;
+    std::string file, list, keyword;
+    Output output;
     Format format = Format::Table;
     bool checkOnly = false;
 };
+
+/// What the commands have in common that write over files.
+void AddOutput(CLI::App& command, Output& output)
+{
+    command.add_option("-o,--output", output.path, "Write here instead of over FILE");
+    const std::map<std::string, HardLinks> ways{{"keep", HardLinks::Keep}, {"split", HardLinks::Split}};
+    command
+        .add_option(Option::HardLinks, output.hardLinks,
+                    "Write a file of several names: \"keep\" gives all of them the new content, \"split\" this one "
+                    "alone; without it such a file is left as it is")
+        ->transform(CLI::CheckedTransformer(ways).description(""))
+        ->type_name("keep|split");
+    command.add_flag(Option::LoseMetadata, output.loseMetadata,
+                     "Write a file although its owner, group, mode, access list or attributes cannot be kept; without "
+                     "it such a file is left as it is");
+}
 
 /// What was said has to arrive.
 int EndOutput()
@@ -124,7 +141,7 @@ int Run(int argc, char** argv)
     CLI::App* const set = app.add_subcommand("set", "Change a global value");
     set->add_option("FILE", a.file, "HD parameter file")->required();
     set->add_option("KEYWORD", a.keyword, "Keyword, or Section/Keyword")->required();
-    set->add_option("-o,--output", a.out, "Write here instead of over FILE");
+    AddOutput(*set, a.output);
     set->allow_extras();
     set->formatter(std::make_shared<SetFormatter>());
     set->footer("One value a parameter: numbers, true or false, texts; lists begin with their\n"
@@ -132,7 +149,7 @@ int Run(int argc, char** argv)
 
     CLI::App* const fmt = app.add_subcommand("fmt", "Rewrite a file in canonical form, every record included");
     fmt->add_option("FILE", a.file, "HD parameter file")->required();
-    fmt->add_option("-o,--output", a.out, "Write here instead of over FILE");
+    AddOutput(*fmt, a.output);
     fmt->add_flag("--check", a.checkOnly, "Write nothing; exit with 1 if the file would change");
     fmt->footer("Comments of the file are not kept.");
 
@@ -158,9 +175,9 @@ int Run(int argc, char** argv)
     else if (get->parsed())
         code = Get(a.file, a.keyword);
     else if (set->parsed() && TakeValues(set->remaining(), literals, values))
-        code = Set(a.file, a.keyword, values, a.out);
+        code = Set(a.file, a.keyword, values, a.output);
     else if (fmt->parsed())
-        code = Fmt(a.file, a.out, a.checkOnly);
+        code = Fmt(a.file, a.output, a.checkOnly);
     else if (create->parsed())
         code = New(a.file);
 

@@ -1,8 +1,8 @@
 // Global values by the name that a user gives.
 #pragma once
 
-#include "data/global_var.h"
 #include "base/result.h"
+#include "data/global_var.h"
 
 struct NamedValue
 {

@@ -6,9 +6,9 @@ int New(const std::string& file)
     FileLock lock;
     if (const int failed = LockFile(file, lock))
         return failed;
-    std::error_code error;
-    if (std::filesystem::exists(std::filesystem::symlink_status(PathFromUtf8(file), error)))
+    std::error_code unknown; // the writer finds out why
+    if (std::filesystem::exists(std::filesystem::symlink_status(PathFromUtf8(file), unknown)))
         return Complain("\"" + file + "\" exists already; it was left as it is.", Exit::NotWritten);
     const HD_Parameters defaults;
-    return Rewrite(defaults, file, lock);
+    return Rewrite(defaults, file, lock, {}, VersionOfText({})); // nothing that came meanwhile is replaced
 }

@@ -79,13 +79,60 @@ int LockFile(const std::string& path, FileLock& lock)
                     Exit::NotWritten);
 }
 
-int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
+std::optional<FileVersion> VersionThere(const std::string& path)
+{
+    const Result<std::string> text = ReadWholeFile(path);
+    return text ? std::optional(VersionOfText(text.value())) : std::nullopt;
+}
+
+namespace {
+
+WriteAnswer Answer(const WriteQuestion& question, const Output& allowed)
+{
+    const bool isAllowed =
+        question.kind == WriteQuestion::LosesMetadata ? allowed.loseMetadata : allowed.hardLinks != HardLinks::Refuse;
+    if (question.kind == WriteQuestion::ChangedOutside || !isAllowed)
+        return WriteAnswer::Cancel;
+    return question.kind == WriteQuestion::HardLinks && allowed.hardLinks == HardLinks::Split ? WriteAnswer::No
+                                                                                              : WriteAnswer::Yes;
+}
+
+/// Why the file was not written, and what lets it be.
+std::string RefusalText(const WriteQuestion& question)
+{
+    const std::string left = "\"" + question.path + "\" was left as it is: ";
+    switch (question.kind) {
+    case WriteQuestion::ChangedOutside:
+        return NotWritten(question.path, std::make_error_code(ChangedOutside)).message;
+    case WriteQuestion::HardLinks:
+        return left + "it is one of " + std::to_string(question.names) + " names of the same file (hard links). " +
+               Option::HardLinks + " keep gives all of them the new content, " + Option::HardLinks +
+               " split this one alone.";
+    case WriteQuestion::LosesMetadata:
+        return left + "this would not be kept of it as it was before: " + LostText(question.lost) + ". " +
+               Option::LoseMetadata + " writes it all the same.";
+    }
+    return {};
+}
+
+} // namespace
+
+int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock, const Output& allowed,
             const std::optional<FileVersion>& expected)
 {
-    const auto saved =
-        SaveHDFile(parameters, path, {.everySet = true, .file = {.expected = expected, .isLocked = lock.IsHeld()}});
+    if (lock.WhyNone() && lock.Path().empty()) // it would be written without knowing what a link leads to
+        return Complain(NotWritten(path, lock.WhyNone()).message, Exit::NotWritten);
+    std::optional<WriteQuestion> refused;
+    const auto ask = [&](const WriteQuestion& question) {
+        const WriteAnswer answer = Answer(question, allowed);
+        if (answer == WriteAnswer::Cancel)
+            refused = question;
+        return answer;
+    };
+    const auto saved = SaveHDFile(
+        parameters, path, {.everySet = true, .file = {.expected = expected, .isLocked = lock.IsHeld(), .ask = ask}});
     if (!saved)
-        return Complain(saved.error().message, Exit::NotWritten);
+        return Complain(refused ? RefusalText(*refused) : saved.error().message, Exit::NotWritten);
     const std::string name = "\"" + path + "\" ";
     const WriteReport& report = saved.value();
     if (lock.WhyNone())

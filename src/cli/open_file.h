@@ -31,9 +31,13 @@ int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters
 /// message that says who has it. A folder that takes no locks is no reason to stop; Rewrite tells of it.
 int LockFile(const std::string& path, FileLock& lock);
 
+/// What the file holds, be it one of ours or not; nothing where none can be read.
+std::optional<FileVersion> VersionThere(const std::string& path);
+
 /// Saves with everything in it, incomplete lines and encroachment sets included, over the content `expected` only.
-int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock,
-            const std::optional<FileVersion>& expected = {});
+/// What `allowed` does not allow is refused with the option that would.
+int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock, const Output& allowed,
+            const std::optional<FileVersion>& expected);
 
 /// Prints "file:line:column: text" of each; of a kind the first thousand, and how many more there are.
 void PrintFindings(std::ostream& stream, const std::string& path, const std::vector<Finding>& findings);

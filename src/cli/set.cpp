@@ -3,12 +3,12 @@
 #include "cli/open_file.h"
 
 int Set(const std::string& file, const std::string& keyword, const std::vector<std::string>& values,
-        const std::string& out)
+        const Output& output)
 {
     const Result<NamedValue> value = FindKeyword(keyword);
     if (!value)
         return Complain(value.error().message, Exit::Usage);
-    const std::string& target = out.empty() ? file : out;
+    const std::string& target = output.Over(file);
     FileLock lock;
     if (const int failed = LockFile(target, lock))
         return failed;
@@ -18,5 +18,5 @@ int Set(const std::string& file, const std::string& keyword, const std::vector<s
         return failed;
     if (const Result<void> stored = ParseParams(value.value().fields, values, &parameters.Global); !stored)
         return Complain(value.value().name + ": " + stored.error().message + ".", Exit::Usage);
-    return Rewrite(parameters, target, lock, out.empty() ? std::optional(version) : std::nullopt);
+    return Rewrite(parameters, target, lock, output, output.path.empty() ? version : VersionThere(target));
 }

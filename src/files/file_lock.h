@@ -43,7 +43,8 @@ public:
     const std::optional<LockHolder>& HeldBy() const { return m_heldBy; }
     /// Why the folder takes no lock.
     std::error_code WhyNone() const { return m_whyNone; }
-    /// The file that is the lock, or would be, in UTF-8.
+    /// The file that is the lock, or would be, in UTF-8; empty where the system does not say to which folder the file's
+    /// links lead.
     std::string Path() const;
     /// What stands there may be another file by now, stand in a folder of another name, or have got further names (hard
     /// links): these are kept out, too.

@@ -61,7 +61,8 @@ std::error_code CopyAttributes(int file, const char* from, LostMetadata& lost)
         return LastError(); // the folder may have given it one
     std::string names;
     if (!Fetch([&](char* buffer, std::size_t size) { return ::listxattr(from, buffer, size); }, names))
-        return errno == ENOTSUP || errno == ENOSYS ? std::error_code() : LastError();
+        return errno == ENOTSUP || errno == ENOSYS ? std::error_code() // the file system has none, so none gets lost
+                                                   : LastError();
     for (std::size_t begin = 0; begin < names.size(); begin += std::strlen(&names[begin]) + 1) {
         const char* const name = &names[begin];
         const bool isList = std::strncmp(name, "system.", 7) == 0;
@@ -124,7 +125,7 @@ std::error_code TakePermissionsOf(int file, const char* from, LostMetadata& lost
         mode &= 0777;
     if (lost.group)
         mode = (mode & ~mode_t(070)) | (mode & 07) << 3;
-    lost.mode = !lost.group && mode != (wanted.st_mode & 07777);
+    lost.mode = mode != (wanted.st_mode & 07777);
     return SetMode(file, mode, lost.mode);
 }
 

@@ -10,6 +10,11 @@
 #include <cstdlib>
 #include <sstream>
 
+#ifndef _WIN32
+#include <sys/stat.h>
+#include <unistd.h>
+#endif
+
 namespace {
 
 #ifdef _WIN32
@@ -137,6 +142,8 @@ TEST_F(Hdkv, ExitCodesAndMessages)
         {"fmt found.hdkv --check", 1, "", "not in canonical form"},
         {"fmt a.hdkv --check", 0, "", ""},
         {"fmt a.hdkv -o missing/b.hdkv", 4, "", "No such file or directory"},
+        {"fmt a.hdkv --hard-links", 2, "", "keep|split"},
+        {"fmt a.hdkv --hard-links both", 2, "", "both"},
         {"new a.hdkv", 4, "", "exists already"},
     };
     const std::string before = Text("a.hdkv") + Text("loses.hdkv") + Text("found.hdkv");
@@ -311,6 +318,51 @@ TEST_F(Hdkv, AFullDiskCostsNothing)
     m_prefix.clear();
     for (const char* command : {"show a.hdkv", "--version", "set --help"})
         EXPECT_EQ(Run(command + std::string(" >/dev/full 2>err.txt; exit $? #")), 4) << command;
+}
+
+TEST_F(Hdkv, TheNamesOfAFileStayOrPartAsTheUserSays)
+{
+    const std::string before = Text("a.hdkv");
+    std::filesystem::create_hard_link(m_folder / "a.hdkv", m_folder / "b.hdkv");
+    for (const char* command :
+         {"set a.hdkv G_f 7", "fmt found.hdkv -o a.hdkv", "fmt found.hdkv -o a.hdkv --lose-metadata"}) {
+        EXPECT_EQ(Run(command), 4) << command;
+        EXPECT_NE(err.find("\"a.hdkv\" was left as it is: it is one of 2 names of the same file"), std::string::npos)
+            << err;
+        EXPECT_NE(err.find("--hard-links keep "), std::string::npos) << err;
+        EXPECT_EQ(Text("a.hdkv"), before);
+    }
+    EXPECT_EQ(Run("set a.hdkv G_f 7 --hard-links keep"), 0) << err;
+    EXPECT_EQ(std::filesystem::hard_link_count(m_folder / "a.hdkv"), 2u);
+    EXPECT_EQ(Got("G_f"), "7\n");
+    const std::string kept = Text("b.hdkv");
+    EXPECT_EQ(kept, Text("a.hdkv"));
+    EXPECT_EQ(Run("set a.hdkv --hard-links=split G_f 8"), 0) << err;
+    EXPECT_EQ(Got("G_f"), "8\n");
+    EXPECT_EQ(Text("b.hdkv"), kept);
+    EXPECT_EQ(err, "");
+}
+
+TEST_F(Hdkv, MetadataGoesOnlyWhenTheUserSaysSo)
+{
+    const std::string file = Path("a.hdkv"), before = Text("a.hdkv");
+    if (::chown(file.c_str(), 1234, 4321) != 0)
+        GTEST_SKIP() << "needs a file of somebody else's";
+    ::chmod(file.c_str(), 0640);
+    m_prefix = "setpriv --bounding-set=-chown "; // even root may give away nothing then
+    const std::size_t files = FileCount();
+    EXPECT_EQ(Run("set a.hdkv G_f 7"), 4);
+    EXPECT_NE(
+        err.find("\"a.hdkv\" was left as it is: this would not be kept of it as it was before: owner, group, mode. "
+                 "--lose-metadata "),
+        std::string::npos)
+        << err;
+    EXPECT_EQ(Text("a.hdkv"), before);
+    EXPECT_EQ(FileCount(), files + 2); // the outputs of the run
+    EXPECT_EQ(Run("set a.hdkv G_f 7 --lose-metadata"), 0);
+    EXPECT_NE(err.find("not kept of it as it was before: owner, group, mode."), std::string::npos) << err;
+    m_prefix.clear();
+    EXPECT_EQ(Got("G_f"), "7\n");
 }
 
 TEST_F(Hdkv, ProgramsThatChangeOneFileAtOnceLoseNothing)

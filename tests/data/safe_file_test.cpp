@@ -558,6 +558,20 @@ TEST_F(SafeFile, ExtendedAttributesAndTheAccessListStay)
     EXPECT_EQ(fs::status(m_folder / "ours").permissions(), fs::status(m_folder / "usual").permissions());
 }
 
+// Where a file system has no attributes, there are none to lose: whoever saves there is not asked about them.
+TEST_F(SafeFile, AFileSystemWithoutAttributesLosesNone)
+{
+    const char* const without = "/sys/kernel/debug";
+    if (::listxattr(without, nullptr, 0) != -1 || errno != ENOTSUP)
+        GTEST_SKIP() << "needs a file system that knows no attributes";
+    PlatformFile::Handle file = 0;
+    ASSERT_FALSE(PlatformFile::Native().Create(m_folder / "a.hdkv", file));
+    LostMetadata lost;
+    EXPECT_FALSE(PlatformFile::Native().TakePermissions(file, without, lost));
+    PlatformFile::Native().Close(file);
+    EXPECT_EQ(LostText(lost), "");
+}
+
 // Somebody else's file in a folder that one may write to.
 TEST_F(SafeFile, AnOwnerThatCannotBeKeptIsLostWithTheRightsOfTheGroup)
 {
@@ -575,6 +589,7 @@ TEST_F(SafeFile, AnOwnerThatCannotBeKeptIsLostWithTheRightsOfTheGroup)
     ASSERT_EQ(::setegid(0), 0);
     ASSERT_TRUE(a && b);
     EXPECT_EQ(LostText(a.value().lost), "owner, group");
+    EXPECT_EQ(LostText(b.value().lost), "owner, group, mode");
     EXPECT_EQ(fs::status(m_folder / "a.hdkv").permissions(), fs::perms(0666));
     EXPECT_EQ(fs::status(m_folder / "b.hdkv").permissions(), fs::perms(0622)) << "another group may no more than all";
 }

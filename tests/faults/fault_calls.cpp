@@ -1,6 +1,6 @@
 // Loaded before the C library (LD_PRELOAD): counts the calls on files of one folder, and lets one of them fail, come
-// back with less than was asked for, or be the last thing the program does. faults.py maps the same record and says
-// which.
+// back with less than was asked for, or be the last thing the program does; before one it may wait until it is let on.
+// faults.py maps the same record and says which.
 #include <atomic>
 #include <cerrno>
 #include <csignal>
@@ -24,6 +24,7 @@ struct Orders
 {
     std::int32_t armed, number, fault, sticky; // which call, counted from 1, and what it meets: an errno, Kill, Short
     std::int32_t seen;                         // calls since it was armed
+    std::int32_t waits;                        // before which call; 0 once it may go on
     char folder[236];
     char names[MostCalls][NameLength];
 };
@@ -70,6 +71,8 @@ int Meets(const char* name, Where where)
     const int number = ++orders->seen;
     if (number <= MostCalls)
         std::strncpy(orders->names[number - 1], name, NameLength - 1);
+    while (number == __atomic_load_n(&orders->waits, __ATOMIC_ACQUIRE))
+        ::usleep(100);
     const bool hit = number == orders->number || (orders->sticky && orders->number > 0 && number > orders->number);
     if (hit && orders->fault == Kill)
         ::kill(::getpid(), SIGKILL);

@@ -8,7 +8,8 @@ KILL, SHORT = 'KILL', 'SHORT'
 # A call that is interrupted for ever is repeated for ever.
 STICKY = tuple(error for error in ERRORS if error != 'EINTR')
 TRANSFERS = ('read', 'write')  # may come back with less than was asked for
-_HEAD, _FOLDER, _NAME, _MOST = struct.Struct('<5i'), 236, 24, 4000
+_HEAD, _FOLDER, _NAME, _MOST = struct.Struct('<6i'), 236, 24, 4000
+_SEEN, _WAITS = 4, 5  # in the head
 
 
 class Point:
@@ -61,16 +62,24 @@ class Orders:
             self._record = mmap.mmap(file.fileno(), self._size)
         self.environment = {'KVR_FAULTS': path, 'LD_PRELOAD': library}
 
-    def arm(self, folder, point=None):
-        """From now on calls on what is in the folder are counted, and one of them meets its fault."""
+    def arm(self, folder, point=None, waits=0):
+        """From now on calls on what is in the folder are counted, and one of them meets its fault; before the one with
+        the number `waits` the program waits."""
         self._record[_HEAD.size:_HEAD.size + _FOLDER] = folder.encode().ljust(_FOLDER, b'\0')
         self._record[_HEAD.size + _FOLDER:] = bytes(_NAME * _MOST)
         order = (1, point.number, point.code(), point.sticky) if point else (1, 0, 0, 0)
-        self._record[:_HEAD.size] = _HEAD.pack(*order, 0)
+        self._record[:_HEAD.size] = _HEAD.pack(*order, 0, waits)
+
+    def is_waiting(self):
+        head = _HEAD.unpack(self._record[:_HEAD.size])
+        return head[_WAITS] != 0 and head[_SEEN] >= head[_WAITS]
+
+    def let_on(self):
+        self._record[4 * _WAITS:4 * _WAITS + 4] = bytes(4)
 
     def disarm(self):
         """The names of the calls since it was armed."""
-        seen = _HEAD.unpack(self._record[:_HEAD.size])[4]
+        seen = _HEAD.unpack(self._record[:_HEAD.size])[_SEEN]
         self._record[:4] = bytes(4)
         names = self._record[_HEAD.size + _FOLDER:]
         return [names[_NAME * i:_NAME * (i + 1)].split(b'\0')[0].decode() for i in range(min(seen, _MOST))]
