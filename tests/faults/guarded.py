@@ -15,7 +15,7 @@ ACCESS_LIST = struct.pack('<I' + 5 * 'HHI', 2, 1, 6, 2**32 - 1, 2, 4, 1, 4, 4, 2
 class Guarded:
     def __init__(self, folder, name, text, linked=False, mode=0o640, passing='$^', other_name=None):
         """`text`: None of a file that is not there yet, and is to be like any new one. `linked`: the name is a symbolic
-        link into another folder. `passing`: a pattern of what every run writes otherwise. `other_name`: another that the
+        link into another folder. `passing`: a pattern of what every run writes otherwise. `other_name`: one that the
         file may get, as long as it has one of both."""
         shutil.rmtree(folder, ignore_errors=True)
         os.makedirs(f'{folder}/far' if linked else folder)

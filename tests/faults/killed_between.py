@@ -1,4 +1,4 @@
-"""hdkv is killed while another program writes to the same file: every moment of the one with every moment of the other."""
+"""hdkv is killed while another program writes to the same file: every moment of both."""
 import os
 import re
 import subprocess

@@ -1,6 +1,6 @@
 #!/usr/bin/python3
-"""run.py [all|SHARE/SHARES] [KIND...]: saves files while calls of the system fail or the program is killed, and sees that nothing is
-lost.
+"""run.py [all|SHARE/SHARES] [KIND...]: saves files while calls of the system fail or the program is killed, and sees
+that nothing is lost.
 
     KVR_BIN=build/dev/bin KVR_FAULT_CALLS=build/dev/tests/faults/libfault_calls.so tests/faults/run.py
 
@@ -19,7 +19,8 @@ import shell_faults
 
 HDKV = {'hdkv': hdkv_faults, 'killed': killed_between}
 # Every which point; primes, so that each fault has its turn. Projects take a start of the program each.
-SAMPLE = {'hdkv': 11, 'killed': 61, 'moor.HDKV': 61, 'moor.kvnw': 61, 'moor.kvxs': 61, 'moor.kvrp': 241, 'member': 241}
+SAMPLE = {'hdkv': 23, 'killed': 61, 'moor.HDKV': 113, 'moor.kvnw': 113, 'moor.kvxs': 113, 'moor.kvrp': 487,
+          'member': 487}
 
 ROOT = os.path.abspath(os.path.join(os.path.dirname(os.path.abspath(__file__)), '../..'))
 

@@ -124,7 +124,7 @@ class Desk:
 class ProjectDesk(Desk):
     """The shell with a project whose member gets a new name by its first save: then the project is written anew."""
 
-    def __init__(self, folder, orders, linked):
+    def __init__(self, folder, orders, _, linked):
         super().__init__(folder, orders, 'moor.HDKV', linked)
         self._name, self._linked, self._member = 'moor.kvrp', linked, f'{folder}/member'
 
@@ -156,8 +156,8 @@ class ProjectDesk(Desk):
 class MemberDesk(ProjectDesk):
     """The same, and what fails are the calls on the member."""
 
-    def __init__(self, folder, orders, linked):
-        super().__init__(folder, orders, linked)
+    def __init__(self, *given):
+        super().__init__(*given)
         self._armed, self._text = self._member, samples.hd_text()
 
     def _change(self):
@@ -190,7 +190,7 @@ def run(folder, orders, which):
     with Session():
         for name, some in which.items():
             for linked in (False, True):
-                desk = PROJECTS[name](folder, orders, linked) if name in PROJECTS else Desk(folder, orders, name, linked)
+                desk = PROJECTS.get(name, Desk)(folder, orders, name, linked)
                 try:
                     desk.save()  # as the program writes it
                     calls, _ = desk.save()
