@@ -13,14 +13,15 @@ ACCESS_LIST = struct.pack('<I' + 5 * 'HHI', 2, 1, 6, 2**32 - 1, 2, 4, 1, 4, 4, 2
 
 
 class Guarded:
-    def __init__(self, folder, name, text, linked=False, mode=0o640, passing='$^'):
+    def __init__(self, folder, name, text, linked=False, mode=0o640, passing='$^', other_name=None):
         """`text`: None of a file that is not there yet, and is to be like any new one. `linked`: the name is a symbolic
-        link into another folder. `passing`: a pattern of what every run writes otherwise."""
+        link into another folder. `passing`: a pattern of what every run writes otherwise. `other_name`: one that the
+        file may get, as long as it has one of both."""
         shutil.rmtree(folder, ignore_errors=True)
         os.makedirs(f'{folder}/far' if linked else folder)
         self.folder = folder
-        self.path = os.path.join(folder, name)
-        self._real = os.path.join(folder, 'far', name) if linked else self.path
+        self._paths = [os.path.join(folder, each) for each in (name, other_name) if each]
+        self._target = os.path.join(folder, 'far', name) if linked else None
         self._passing = re.compile(passing)
         with open(self._real, 'w', encoding='utf-8', newline='\n') as file:
             file.write(text or '')
@@ -33,6 +34,14 @@ class Guarded:
         if text is None:
             os.remove(self._real)
             self.text = None
+
+    @property
+    def path(self):
+        return next(filter(os.path.lexists, self._paths), self._paths[0])
+
+    @property
+    def _real(self):
+        return self._target or self.path
 
     def start_over(self):
         """What is there now is what has to be kept."""
@@ -69,8 +78,9 @@ class Guarded:
         """Names that do not belong there. An empty lock that could not be looked at may be somebody else's, and stays."""
         def is_right(name):
             is_lock = name.endswith('.lock') and os.path.getsize(os.path.join(self.folder, name)) == 0
-            return name in self._names or is_lock or (may_litter and OURS.fullmatch(os.path.basename(name)))
+            return name in names or is_lock or (may_litter and OURS.fullmatch(os.path.basename(name)))
 
+        names = [*self._names, *(os.path.basename(path) for path in self._paths)]
         return [name for name in self._listing() if not is_right(name)]
 
     def violations(self, new, saved, said='', may_litter=False):
@@ -90,6 +100,8 @@ class Guarded:
             wrong.append(f'neither old nor new content ({len(content)} characters for {len(new)}): {strange}')
         elif saved is not None and (content == new) != saved:
             wrong.append(f'said {"saved" if saved else "not saved"}, the content is {"new" if content == new else "old"}')
+        if sum(map(os.path.lexists, self._paths)) > 1:
+            wrong.append('it has both of its names')
         now = self._metadata() if content is not None else self._before
         wrong += [f'{what} was {was}, is {now[what]}, and nobody is told' for what, was in self._before.items()
                   if now[what] != was and not said.strip()]

@@ -1,4 +1,4 @@
-"""hdkv is killed while another program writes to the same file: every moment of the one with every moment of the other."""
+"""hdkv is killed while another program writes to the same file: every moment of both."""
 import os
 import re
 import subprocess
@@ -89,13 +89,13 @@ class Runs:
         return found
 
 
-def run(programs, folder, orders, every):
-    """Goes through every nth pair of calls. Gives back how many there were and what did not hold."""
+def run(programs, folder, orders, which):
+    """Goes through a slice of the pairs of calls. Gives back how many there were and what did not hold."""
     runs, count, wrong = Runs(f'{programs}/hdkv', folder, orders), 0, []
     number = len(runs.calls())
     pairs = [(waits, kill) for waits in range(1, number + 1) for kill in range(waits, number + 1)]
     for way in WAYS:
-        for waits, kill in pairs[::every]:
+        for waits, kill in pairs[which]:
             count += 1
             wrong += [f'hdkv set, another {way.__name__} before call {waits}, killed at call {kill}: {sentence}'
                       for sentence in runs.violations(way, waits, kill)]

@@ -26,6 +26,7 @@ class Desk:
     def __init__(self, folder, orders, name, linked):
         text, *self._cell, self._before = KINDS[name]
         self._orders, self._name, self._folder = orders, name, f'{folder}/files'
+        self._armed = self._folder
         self._home = f'{folder}/home'  # of logs and settings
         os.makedirs(self._home, exist_ok=True)
         self._guarded = Guarded(self._folder, name, text(), linked)
@@ -72,7 +73,7 @@ class Desk:
         """Changes something and saves, with a fault. Gives back the calls that the save took and what did not hold
         afterwards, with the fault as it was met."""
         new = self._change()
-        self._orders.arm(self._folder, point)
+        self._orders.arm(self._armed, point)
         self._editor.press('ctrl+s')
         saved, said = self._outcome()
         calls = self._orders.disarm()
@@ -91,7 +92,7 @@ class Desk:
 
     def _bar(self):
         """What stands above the view, when something is beside the file that was not there."""
-        if not any('.displaced-' in name for _, _, names in os.walk(self._folder) for name in names):
+        if not any('.displaced-' in name for _, _, names in os.walk(self._guarded.folder) for name in names):
             return ''
         self._editor.settle()
         return '\n'.join(label.text for label in self._editor.frame.all('label'))
@@ -123,7 +124,7 @@ class Desk:
 class ProjectDesk(Desk):
     """The shell with a project whose member gets a new name by its first save: then the project is written anew."""
 
-    def __init__(self, folder, orders, linked):
+    def __init__(self, folder, orders, _, linked):
         super().__init__(folder, orders, 'moor.HDKV', linked)
         self._name, self._linked, self._member = 'moor.kvrp', linked, f'{folder}/member'
 
@@ -137,6 +138,10 @@ class ProjectDesk(Desk):
         return self._guarded.text.replace('.hdkv', '.HDKV')
 
     def _look(self):
+        saved, said = self._look_behind_member()
+        return saved and 'still names' not in said, said
+
+    def _look_behind_member(self):
         saved, said = super()._look()
         if saved is None:
             return saved, said
@@ -145,26 +150,51 @@ class ProjectDesk(Desk):
             time.sleep(0.05)
         if texts := self._editor.no_message():  # it comes when the member is saved
             said += '\n'.join(texts)
-        return saved and 'still names' not in said, said
+        return saved, said
 
 
-def run(folder, orders, every, kinds):
-    """Goes through every nth point; of projects, which take a start each, fewer. Gives back how many there were and
-    what did not hold."""
+class MemberDesk(ProjectDesk):
+    """The same, and what fails are the calls on the member."""
+
+    def __init__(self, *given):
+        super().__init__(*given)
+        self._armed, self._text = self._member, samples.hd_text()
+
+    def _change(self):
+        self.end()
+        os.makedirs(self._folder, exist_ok=True)
+        samples.write(f'{self._folder}/moor.kvrp', samples.project_text('../member/moor.hdkv'))
+        self._guarded = Guarded(self._member, 'moor.hdkv', self._text, self._linked, other_name='moor.HDKV')
+        # As long as the shell has the file.
+        self._guarded.belongs_there(('far/' if self._linked else '') + '.moor.hdkv.lock')
+        return Desk._change(self)
+
+    def _look(self):
+        return self._look_behind_member()
+
+    def save(self, point=None):
+        answer = super().save(point)
+        if not point:
+            self._text = self._guarded.text  # as the program writes it
+        return answer
+
+
+PROJECTS = {'moor.kvrp': ProjectDesk, 'member': MemberDesk}
+
+
+def run(folder, orders, which):
+    """Goes through slices of the points, by kind. Gives back how many there were and what did not hold."""
     from session import Session
 
     count, wrong = 0, []
     with Session():
-        for name in (*KINDS, 'moor.kvrp'):
-            if kinds and name not in kinds:
-                continue
+        for name, some in which.items():
             for linked in (False, True):
-                is_project = name not in KINDS
-                desk = ProjectDesk(folder, orders, linked) if is_project else Desk(folder, orders, name, linked)
+                desk = PROJECTS.get(name, Desk)(folder, orders, name, linked)
                 try:
                     desk.save()  # as the program writes it
                     calls, _ = desk.save()
-                    for point in list(faults.points(calls))[::every * 4 if is_project and every > 1 else every]:
+                    for point in list(faults.points(calls))[some]:
                         count += 1
                         wrong += [f'shell, {name}{" through a link" if linked else ""}: {sentence}'
                                   for sentence in desk.save(point)[1]]
