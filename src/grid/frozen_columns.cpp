@@ -82,7 +82,7 @@ void CFrozenColumns::PaintCells(QPainter& painter, QStyleOptionViewItem option, 
     const auto forCells = [&](const auto& visit) {
         const int top = m_grid.rowAt(dirty.top()), bottom = m_grid.rowAt(dirty.bottom());
         const int end = top < 0 ? 0 : bottom < 0 ? m_grid.RowCount() : bottom + 1;
-        for (int row = top; row < end; ++row)
+        for (int row = std::max(top, 0); row < end; ++row)
             for (int column = 0; column < Count(); ++column)
                 visit(m_grid.Model()->index(row, column));
     };

@@ -107,7 +107,7 @@ MUTANTS = [
     ('grid', 'grid/grid_header_frozen.cpp', 'unsetCursor();', 'setCursor(Qt::SplitHCursor);'),
     ('common', 'grid/row_commands.cpp', 'rows->Rearrange(places);', 'rows->Rearrange(order);'),
     ('common', 'grid/grid_model.cpp', 'changePersistentIndexList(before, after);\n', ''),
-    ('common', 'grid/paste_plan.cpp', 'AddFault(lines[fault->row], -1', 'AddFault(lines[0], -1'),
+    ('common', 'grid/paste_plan.cpp', 'AddFault(line, -1, fault->text', 'AddFault(lines[0], -1, fault->text'),
     ('pages', 'grid/find_replace.cpp', 'cell.compare(text, letters) == 0', 'cell.contains(text, letters)'),
     ('pages', 'grid/grid_state.cpp', 'state[Columns].toInt() != grid.ColumnCount()', 'false'),
     ('pages', 'grid/grid_clipboard.cpp', 'HasHeadersInOrder(rows, copied.texts, start.column);', 'false;'),

@@ -48,7 +48,7 @@ protected:
             lines.Add(record);
         }
         Open<WidePage>(lines);
-        grid->Widths().SetChosen(); // pictures of two widths of the window have the same columns
+        grid->Widths().SetChosen();    // pictures of two widths of the window have the same columns
         QApplication::processEvents(); // the scroll bar learns of them
     }
     ~FrozenColumnsTest() override { view.reset(); } // it shows lines that go with the test
@@ -185,6 +185,17 @@ TEST_F(FrozenColumnsTest, EveryCellIsFoundWhereItIsSeenAndOnlyThere)
             seen << place;
         }
     }
+}
+
+TEST_F(FrozenColumnsTest, ThereMayBeNoLineBesideThem)
+{
+    ScrollBy(200);
+    ASSERT_GT(Frozen(), 100);
+    grid->ChangeView([](CGridModel& model) { model.Filter({"nobody"}); });
+    ScrollBy(100);
+    const QImage empty = grid->viewport()->grab().toImage();
+    EXPECT_EQ(grid->RowCount(), 0);
+    EXPECT_EQ(empty.pixelColor(20, 5), empty.pixelColor(20, empty.height() - 5)) << "nothing is painted";
 }
 
 TEST_F(FrozenColumnsTest, TheCurrentCellIsNeverCovered)
