@@ -89,12 +89,17 @@ namespace {
 
 WriteAnswer Answer(const WriteQuestion& question, const Output& allowed)
 {
-    const bool isAllowed =
-        question.kind == WriteQuestion::LosesMetadata ? allowed.loseMetadata : allowed.hardLinks != HardLinks::Refuse;
-    if (question.kind == WriteQuestion::ChangedOutside || !isAllowed)
-        return WriteAnswer::Cancel;
-    return question.kind == WriteQuestion::HardLinks && allowed.hardLinks == HardLinks::Split ? WriteAnswer::No
-                                                                                              : WriteAnswer::Yes;
+    switch (question.kind) {
+    case WriteQuestion::ChangedOutside:
+        break;
+    case WriteQuestion::HardLinks:
+        return allowed.hardLinks == HardLinks::Keep    ? WriteAnswer::Yes
+               : allowed.hardLinks == HardLinks::Split ? WriteAnswer::No
+                                                       : WriteAnswer::Cancel;
+    case WriteQuestion::LosesMetadata:
+        return allowed.loseMetadata ? WriteAnswer::Yes : WriteAnswer::Cancel;
+    }
+    return WriteAnswer::Cancel;
 }
 
 /// Why the file was not written, and what lets it be.

@@ -4,6 +4,7 @@
 #include "grid/grid_model.h"
 #include "grid/grid_texts.h"
 #include "grid/typing.h"
+#include "ks/fc/plain_cell.h"
 #include "ks/units/formula.h"
 #include "ks/units/typed_number.h"
 
@@ -121,7 +122,7 @@ private:
             const QString texts[] = {m_model.headerData(cell.row, Qt::Vertical, Qt::DisplayRole).toString(),
                                      m_model.Column(cell.column).header(), cell.before, cell.after};
             for (int column = 0; column < 4; ++column)
-                table.setItem(row, column, new QTableWidgetItem(texts[column]));
+                table.setItem(row, column, PlainCell(texts[column]));
         }
         table.resizeColumnsToContents();
     }

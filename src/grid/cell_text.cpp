@@ -5,6 +5,7 @@
 #include "grid/grid_texts.h"
 #include "grid/typing.h"
 #include "ks/fc/branch_name.h"
+#include "ks/fc/shown_text.h"
 #include "ks/units/typed_number.h"
 
 #include <cmath>
@@ -58,7 +59,7 @@ QString FullText(const ColumnSpec& column, const CellValue& value)
 QString CellToolTip(const ColumnSpec& column, const CellValue& value)
 {
     if (column.Kind() == CellKind::Text)
-        return ShownText(column, value); // may be longer than its cell, a path in particular
+        return KsVisibleText(ShownText(column, value)); // may be longer than its cell, a path in particular
     const auto* number = std::get_if<double>(&value);
     if (!number || IsEmptyCell(column, value))
         return column.ToolTip();

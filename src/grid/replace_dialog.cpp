@@ -7,6 +7,7 @@
 #include "grid/grid_keys.h"
 #include "grid/grid_texts.h"
 #include "ks/fc/doc.h"
+#include "ks/fc/plain_cell.h"
 
 #include <QCheckBox>
 #include <QDialog>
@@ -205,7 +206,7 @@ private:
                                      model.Column(cell.column).header(), cell.before,
                                      reason.isEmpty() ? cell.after : reason.arg(cell.after)};
             for (int column = 0; column < m_list->columnCount(); ++column)
-                m_list->setItem(row, column, new QTableWidgetItem(texts[column]));
+                m_list->setItem(row, column, PlainCell(texts[column]));
         }
     }
 

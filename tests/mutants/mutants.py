@@ -23,6 +23,7 @@ MUTANTS = [
     ('files', 'files/safe_file.cpp', '!m_platform.Status(m_target, left) &&', 'm_platform.Status(m_target, left) ||'),
     ('files', 'files/safe_file.cpp', 'm_isExpected && m_isSettled && status', 'm_isExpected && status'),
     ('files', 'files/safe_file.cpp', 'm_options.sync && !m_report.displaced.empty()', 'false'),
+    ('files', 'files/permissions_posix.cpp', 'lost.mode = mode !=', 'lost.mode = !lost.group && mode !='),
     ('files', 'files/difference.cpp', '            else\n                Part({}, old, now);\n', ''),
     ('files', 'files/finding.cpp', 'std::pair(f.line, f.column)', 'std::pair(f.column, f.line)'),
     ('files', 'files/finding.cpp',
@@ -36,6 +37,9 @@ MUTANTS = [
     # The tool.
     ('cli', 'cli/record_table.cpp', 'text.find_first_of(",\\"\\r\\n")', 'text.find_first_of(",\\r\\n")'),
     ('cli', 'cli/record_table.cpp', 'if (m_withSet)\n            stream', 'if (!m_withSet)\n            stream'),
+    ('cli', 'cli/open_file.cpp', ': WriteAnswer::Cancel;\n    case', ': WriteAnswer::Yes;\n    case'),
+    ('cli', 'cli/open_file.cpp', 'return allowed.loseMetadata ?', 'return true ?'),
+    ('cli', 'cli/open_file.cpp', 'allowed.hardLinks == HardLinks::Split ?', 'false ?'),
     ('cli', 'cli/field_text.cpp', '"%d-%02d-%02d', '"%d-%d-%02d'),
     # The shell's libraries.
     ('ks', 'ks/units/number_format.cpp', 'magnitude >= 1e-5 && magnitude < 1e15',

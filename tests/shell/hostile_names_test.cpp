@@ -1,11 +1,18 @@
 // Names that look like something else: markup, letters to press, marks of windows, turned writing.
+#include "ks/fc/difference_dialog.h"
+#include "ks/fc/findings_dialog.h"
 #include "shell/project_tree.h"
+#include "shell/recovery_dialog.h"
 #include "shell_fixture.h"
+#include "shown_tips.h"
 
+#include <QClipboard>
 #include <QDialog>
 #include <QLabel>
 #include <QTabBar>
 #include <QTabWidget>
+#include <QTableView>
+#include <QTableWidget>
 #include <QTimer>
 #include <QToolTip>
 #include <QTreeWidget>
@@ -14,7 +21,7 @@ namespace {
 
 const QString Name = "<img src=x> <b>R&amp;D</b> a&b [*]";
 
-/// What of a window a name could make rich: labels that were shown, and the tool tip of every widget that has one.
+/// The labels of a window that a name could make rich.
 QStringList RichTexts(const QWidget& window)
 {
     QStringList rich;
@@ -30,7 +37,9 @@ QStringList RichTexts(const QWidget& window)
 std::string TurnedTexts(const QWidget& window)
 {
     QStringList turned;
-    for (const QWidget* widget : window.findChildren<QWidget*>()) {
+    auto widgets = window.findChildren<const QWidget*>();
+    widgets << &window;
+    for (const QWidget* widget : widgets) {
         const auto* label = qobject_cast<const QLabel*>(widget);
         for (const QString& text : {label ? label->text() : QString(), widget->toolTip(), widget->statusTip(),
                                     widget->accessibleName(), widget->accessibleDescription(), widget->windowTitle()})
@@ -40,14 +49,59 @@ std::string TurnedTexts(const QWidget& window)
     return turned.join(u'\n').toStdString();
 }
 
-/// The label of the tool tip that stands on the screen; null for none.
-const QLabel* ToolTipLabel()
+/// The sample project with branches, surveys and marks of such names.
+void WriteRiver(const QTemporaryDir& folder)
 {
-    for (const QWidget* widget : QApplication::topLevelWidgets())
-        if (widget->inherits("QTipLabel") && widget->isVisible())
-            return qobject_cast<const QLabel*>(widget);
-    return nullptr;
+    const QByteArray name = '"' + Name.toUtf8() + "\u202E\"";
+    for (const QString file : {"river.HDKV", "river.kvnw", "river.kvxs", "river.kvrp"}) {
+        QFile example(QStringLiteral(KVR_SOURCE_DIR "/examples/river/") + file), copy(folder.filePath(file));
+        ASSERT_TRUE(example.open(QIODevice::ReadOnly) && copy.open(QIODevice::WriteOnly));
+        copy.write(example.readAll()
+                       .replace("\"AELDER UPPER\"", name)
+                       .replace("\"FLOOD WARNING\"", name)
+                       .replace("\"SURVEY 2019\"", "\"<i>S&amp;</i>\""));
+    }
 }
+
+/// A window, everything in it that has a tool tip, and what of them shows the name.
+struct Looked
+{
+    ShownTips tips;
+    QStringList titles;
+
+    void At(QWidget& window)
+    {
+        EXPECT_EQ(RichTexts(window), QStringList());
+        EXPECT_EQ(TurnedTexts(window), "");
+        tips.RestOn(window);
+    }
+    void AtDialog(QWidget& dialog)
+    {
+        const qsizetype before = tips.all.size();
+        At(dialog);
+        titles << dialog.windowTitle();
+        EXPECT_FALSE(tips.all.mid(before).filter(Name).isEmpty()) << dialog.windowTitle().toStdString();
+        dialog.close();
+    }
+    void Expect(qsizetype most) const
+    {
+        EXPECT_EQ(tips.rich.join(u'\n').toStdString(), "");
+        EXPECT_EQ(tips.turned.join(u'\n').toStdString(), "");
+        EXPECT_GT(tips.all.size(), most);
+        EXPECT_FALSE(tips.all.filter(Name).isEmpty());
+    }
+    /// The dialog that comes up by and by; it is closed.
+    void AtNextDialog(QObject& context, const std::function<void(QWidget&)>& prepare = {})
+    {
+        QTimer::singleShot(0, &context, [this, prepare] {
+            QWidget* dialog = QApplication::activeModalWidget();
+            ASSERT_TRUE(dialog);
+            if (prepare)
+                prepare(*dialog);
+            AtDialog(*dialog);
+        });
+    }
+};
 
 } // namespace
 
@@ -149,14 +203,7 @@ TEST_F(ShellTest, AFileOutsideTheProjectsFolderIsShownAsSuch)
 TEST(HostileNames, NoEditorTakesThemForMarkup)
 {
     const QTemporaryDir folder;
-    const QStringList files = {"river.HDKV", "river.kvnw", "river.kvxs", "river.kvrp"};
-    for (const QString& file : files) {
-        QFile example(QStringLiteral(KVR_SOURCE_DIR "/examples/river/") + file), copy(folder.filePath(file));
-        ASSERT_TRUE(example.open(QIODevice::ReadOnly) && copy.open(QIODevice::WriteOnly));
-        copy.write(example.readAll()
-                       .replace("\"AELDER UPPER\"", '"' + Name.toUtf8() + "\u202E\"")
-                       .replace("\"SURVEY 2019\"", "\"<i>S&amp;</i>\""));
-    }
+    WriteRiver(folder);
     QSettings().clear();
     QStringList asked;
     KsSetMessageBoxHandler([&](const CString& text, QMessageBox::StandardButtons) {
@@ -171,6 +218,7 @@ TEST(HostileNames, NoEditorTakesThemForMarkup)
         ASSERT_TRUE(frame.OpenFile(folder.filePath("river.kvrp")));
         ASSERT_EQ(frame.MdiArea().subWindowList().size(), 3) << asked.join('\n').toStdString();
         bool seen = false; // in a label, so that the names got there at all
+        Looked looked;
         for (QMdiSubWindow* window : frame.MdiArea().subWindowList()) {
             frame.MdiArea().setActiveSubWindow(window);
             auto* sheet = window->findChild<QTabWidget*>("sheet");
@@ -178,14 +226,76 @@ TEST(HostileNames, NoEditorTakesThemForMarkup)
                 if (sheet)
                     sheet->setCurrentIndex(page);
                 QCoreApplication::processEvents();
-                EXPECT_EQ(RichTexts(frame), QStringList());
-                EXPECT_EQ(TurnedTexts(frame), "");
+                looked.At(frame);
             }
             for (const QLabel* label : window->findChildren<QLabel*>())
                 seen = seen || label->text().contains(QString(Name).replace("&", "&&"));
         }
         EXPECT_TRUE(seen);
         EXPECT_EQ(asked, QStringList());
+        looked.Expect(1000);
     }
     KsSetMessageBoxHandler({});
+}
+
+TEST_F(ShellTest, DialogsTakeNamesForText)
+{
+    const QTemporaryDir river;
+    WriteRiver(river);
+    frame = std::make_unique<CMainFrame>();
+    frame->LoadPlugins(QStringLiteral(KVR_BUILD_DIR "/bin/plugins"));
+    frame->show();
+    ASSERT_TRUE(frame->OpenFile(river.filePath("river.HDKV")));
+    const QString turned = Name + QChar(0x202E);
+    const std::string hostile = turned.toStdString();
+    Looked looked;
+    {
+        Finding finding{.section = hostile, .keyword = hostile, .parameter = 1, .field = hostile};
+        finding.found = finding.used = hostile;
+        finding.rule = [&] { return hostile; };
+        std::vector<Finding> findings;
+        for (const Finding::Kind kind : {Finding::WrongType, Finding::Rule, Finding::Unknown, Finding::NotRead}) {
+            finding.kind = kind;
+            findings.push_back(finding);
+        }
+        auto* dialog = new CKsFindingsDialog(turned, findings, frame.get());
+        dialog->show();
+        looked.AtDialog(*dialog);
+    }
+    {
+        const Difference difference{.section = hostile, .keyword = hostile, .before = hostile, .after = hostile};
+        const Differences differences{.list = {difference}, .changed = 1, .sections = 1};
+        auto* dialog = new CKsDifferenceDialog({turned, turned, turned}, differences, frame.get());
+        dialog->show();
+        looked.AtDialog(*dialog);
+    }
+    {
+        CRecoverable item{.file = turned, .state = CRecoverable::Missing};
+        item.header = {.path = "/" + turned + "/river.HDKV", .extension = turned, .title = turned};
+        CRecoverable damaged{.file = turned, .state = CRecoverable::Damaged};
+        auto* dialog = new CRecoveryDialog(frame->Recovery(), {item, damaged}, frame.get());
+        dialog->show();
+        QTest::qWait(200); // they are described one by one
+        looked.AtDialog(*dialog);
+    }
+    // Over the first table of branches: what is replaced, and what is pasted with doubts.
+    auto* sheet = frame->findChild<QTabWidget*>("sheet");
+    ASSERT_TRUE(sheet);
+    sheet->setCurrentIndex(0);
+    auto* grid = sheet->currentWidget()->findChild<QTableView*>();
+    ASSERT_TRUE(grid);
+    grid->setFocus();
+    grid->setCurrentIndex(grid->model()->index(0, 1));
+    looked.AtNextDialog(*frame, [&](QWidget& dialog) {
+        dialog.findChild<QLineEdit*>("find")->setText("src=x");
+        dialog.findChild<QLineEdit*>("with")->setText(Name + "2");
+        dialog.findChild<QAbstractButton*>("inDocument")->click();
+        EXPECT_TRUE(QTest::qWaitFor([&] { return dialog.findChild<QTableWidget*>()->rowCount() > 0; }));
+    });
+    QTest::keyClick(grid, Qt::Key_H, Qt::ControlModifier);
+    QApplication::clipboard()->setText(turned + "\t" + Name + "\t" + turned);
+    looked.AtNextDialog(*frame);
+    QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(looked.titles.size(), 5) << looked.titles.join(u'\n').toStdString();
+    looked.Expect(40);
 }

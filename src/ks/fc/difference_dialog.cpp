@@ -52,14 +52,14 @@ CKsDifferenceDialog::CKsDifferenceDialog(const Captions& captions, const Differe
 {
     setObjectName("differences");
     setAttribute(Qt::WA_DeleteOnClose);
-    setWindowTitle(captions.title);
+    setWindowTitle(KsVisibleText(captions.title));
     QString summary = Summary(differences);
     if (differences.areMore)
         summary += u' ' + tr("The first %1 places are listed.").arg(differences.list.size());
     auto* text = new QLabel(summary, this);
     text->setWordWrap(true);
     const QStringList columns = tr("Section\nKeyword\nNumber\nParameter").split(u'\n')
-                                << captions.before << captions.after;
+                                << KsVisibleText(captions.before) << KsVisibleText(captions.after);
     auto* table = new QTableWidget(0, int(columns.size()), this);
     table->setHorizontalHeaderLabels(columns);
     table->setAccessibleName(windowTitle());

@@ -1,6 +1,7 @@
 #include "ks/fc/findings_dialog.h"
 
 #include "ks/fc/file_name.h"
+#include "ks/fc/shown_text.h"
 
 #include <QClipboard>
 #include <QDialogButtonBox>
@@ -116,7 +117,7 @@ QVariant CKsFindingsModel::data(const QModelIndex& index, int role) const
 {
     if (!index.isValid() || (role != Qt::DisplayRole && role != Qt::ToolTipRole))
         return {};
-    return CellText(m_findings[std::size_t(index.row())], index.column());
+    return KsVisibleText(CellText(m_findings[std::size_t(index.row())], index.column()));
 }
 
 QVariant CKsFindingsModel::headerData(int section, Qt::Orientation orientation, int role) const
