@@ -228,15 +228,19 @@ class Editor:
         self.settle(0.05)
 
     def in_sight(self, table, part):
-        """The part of a table, after the wheel was turned until its line is shown."""
+        """The part of a table, after the wheel was turned until it is shown."""
         for _ in range(200):
             top, bottom = table.sight
-            middle = part.middle[1]
-            if top < middle < bottom:
+            left, _, width, _ = table.place
+            across, middle = part.middle
+            if not top < middle < bottom:
+                self.hands.wheel(*table.middle, down=middle >= bottom)
+            elif not left < across < left + width:
+                self.hands.wheel_sideways(*table.middle, right=across >= left + width)
+            else:
                 return part
-            self.hands.wheel(*table.middle, down=middle >= bottom)
             self.settle(0.02)
-        raise AssertionError('the wheel does not bring the line into sight')
+        raise AssertionError('the wheel does not bring the cell into sight')
 
     def put(self, line, column, text, speed=25, leave='Tab', table=None):
         """Types into a cell, in place of what stands there."""

@@ -55,6 +55,9 @@ class Hands:
     def wheel(self, x, y, down):
         self._do('mousemove', x, y, 'click', 5 if down else 4)
 
+    def wheel_sideways(self, x, y, right):
+        self._do('mousemove', x, y, 'click', 7 if right else 6)
+
     def drag(self, start, end):
         self.log.append(f'drag {start} to {end}')
         self._do('mousemove', *start, 'mousedown', 1)
