@@ -6,6 +6,7 @@
 #include <QHash>
 #include <QKeyEvent>
 #include <QScrollArea>
+#include <QScrollBar>
 #include <QShortcut>
 #include <QSignalBlocker>
 #include <QStyleOptionTab>
@@ -120,18 +121,21 @@ public:
 protected:
     void resizeEvent(QResizeEvent* event) override
     {
-        m_page.FitInto(viewport()->width());
+        Fit();
         QScrollArea::resizeEvent(event);
     }
     void changeEvent(QEvent* event) override
     {
         QScrollArea::changeEvent(event);
-        const auto fit = [this] { m_page.FitInto(viewport()->width()); };
+        const auto fit = [this] { Fit(); };
         if (event->type() == QEvent::LanguageChange || event->type() == QEvent::FontChange)
             QMetaObject::invokeMethod(this, fit, Qt::QueuedConnection); // when the page has the new texts
     }
 
 private:
+    /// Whether a scroll bar is there now depends on how the page stood before: it must not decide how it stands next.
+    void Fit() { m_page.FitInto(maximumViewportSize(), verticalScrollBar()->sizeHint().width()); }
+
     CGenPropertyPage& m_page;
 };
 

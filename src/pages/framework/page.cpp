@@ -129,7 +129,15 @@ void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
         shown->setFocus(Qt::OtherFocusReason);
 }
 
-void CGenPropertyPage::FitInto(int width)
+void CGenPropertyPage::FitInto(QSize room, int scrollBar)
+{
+    StackGroups(room.width());
+    const int least = layout()->totalMinimumSize().height();
+    if (std::max(least, heightForWidth(room.width())) > room.height())
+        StackGroups(room.width() - scrollBar);
+}
+
+void CGenPropertyPage::StackGroups(int width)
 {
     const auto turn = [this](QBoxLayout& row, QBoxLayout::Direction direction) {
         for (int i = 0; i < row.count(); ++i)

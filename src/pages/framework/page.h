@@ -74,9 +74,9 @@ public:
     /// Brings it into view: the line, the cell, the control. With `focus` it is what is edited next.
     virtual void Reveal(const ChangePlace& place, bool focus);
 
-    /// Groups that stand beside each other stand one below the other where the page has no more width than this, and
-    /// only there.
-    void FitInto(int width);
+    /// Groups that stand beside each other stand one below the other where the page has no more room than this, and
+    /// only there. `scrollBar` is what a scroll bar takes of the width when the page is higher than the room.
+    void FitInto(QSize room, int scrollBar);
 
     /// Takes what is being typed, then undoes or redoes one step of the document.
     void UndoRedo(bool undo);
@@ -100,6 +100,7 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
 
 private:
+    void StackGroups(int width);
     void UnitsChanged();
     CGenGrid* GridOf(const void* table) const;
 
