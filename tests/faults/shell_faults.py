@@ -196,8 +196,8 @@ def run(folder, orders, which):
                     calls, _ = desk.save()
                     for point in list(faults.points(calls))[some]:
                         count += 1
-                        wrong += [f'shell, {name}{" through a link" if linked else ""}: {sentence}'
-                                  for sentence in desk.save(point)[1]]
+                        wrong += faults.told([f'shell, {name}{" through a link" if linked else ""}: {sentence}'
+                                              for sentence in desk.save(point)[1]])
                 finally:
                     desk.end()
             print(f'shell, {name}: {count} points so far, {len(wrong)} violations', flush=True)

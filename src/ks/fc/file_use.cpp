@@ -125,7 +125,8 @@ void CKsFileUse::TargetWritten(bool written, const CString& path)
     FileLock target = std::exchange(m_target, FileLock());
     if (!written)
         return;
-    if (!target.IsHeld() && !target.WhyNone()) // the lock of the file itself stays
+    // The lock of the file itself stays, whatever was known of the target before it was written.
+    if ((!target.IsHeld() && !target.WhyNone()) || m_lock.IsFor(path.toStdString()))
         return Follow(path);
     m_lock = std::move(target);
     Follow(path);
