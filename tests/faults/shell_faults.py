@@ -199,6 +199,8 @@ def run(folder, orders, which):
                         count += 1
                         wrong += faults.told([f'shell, {name}{" through a link" if linked else ""}: {sentence}'
                                               for sentence in desk.save(point)[1]])
+                        if count % 100 == 0:
+                            print(f'shell, {name}: {count} points so far, {len(wrong)} violations', flush=True)
                 finally:
                     desk.end()
             print(f'shell, {name}: {count} points so far, {len(wrong)} violations', flush=True)
