@@ -21,9 +21,11 @@ std::vector<Finding> CheckHDStructure(tqlHandle structure)
 
 namespace {
 
-TqlStructure Build(const HD_Parameters& parameters, bool everySet)
+/// `length`: about how long the text will be.
+TqlStructure Build(const HD_Parameters& parameters, bool everySet, std::uint64_t length = 0)
 {
     TqlStructure structure(tqlCreate());
+    tqlReserve(structure.Get(), std::size_t(length));
     parameters.Save(structure.Get(), everySet);
     return structure;
 }
@@ -37,6 +39,7 @@ std::string HDFileText(const HD_Parameters& parameters, bool everySet)
 
 Result<WriteReport> SaveHDFile(const HD_Parameters& parameters, const std::string& path, const SaveOptions& options)
 {
-    const TqlStructure structure = Build(parameters, options.everySet);
+    const auto& before = options.file.expected; // most changes are small
+    const TqlStructure structure = Build(parameters, options.everySet, before ? before->size + before->size / 16 : 0);
     return SaveStructure(structure.Get(), path, options.file);
 }

@@ -133,6 +133,12 @@ tqlHandle tqlCreate()
     return HandleOf(new Builder);
 }
 
+void tqlReserve(tqlHandle structure, std::size_t length)
+{
+    if (Builder* const builder = AsBuilder(structure))
+        builder->text.reserve(length);
+}
+
 void tqlClose(tqlHandle* structure)
 {
     if (!structure)

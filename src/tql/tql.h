@@ -158,6 +158,8 @@ std::string_view tqlGetRawParam(tqlHandle param);
 // last; parameters to the keyword added last.
 
 tqlHandle tqlCreate();
+/// Makes room for a text of that length: one of many megabytes need not move as it grows.
+void tqlReserve(tqlHandle structure, std::size_t length);
 void tqlAddTarget(tqlHandle structure, std::string_view name);
 void tqlAddSection(tqlHandle structure, std::string_view name);
 /// Closes the section (or target) opened last.

@@ -93,5 +93,6 @@ def run(programs, folder, orders, which):
             runs = Runs(f'{programs}/hdkv', folder, orders, command, there)
             for point in list(faults.points(runs.calls))[which]:
                 count += 1
-                wrong += [f'hdkv {command}, {there}, {point}: {sentence}' for sentence in runs.violations(point)]
+                wrong += faults.told([f'hdkv {command}, {there}, {point}: {sentence}'
+                                      for sentence in runs.violations(point)])
     return count, wrong

@@ -97,6 +97,6 @@ def run(programs, folder, orders, which):
     for way in WAYS:
         for waits, kill in pairs[which]:
             count += 1
-            wrong += [f'hdkv set, another {way.__name__} before call {waits}, killed at call {kill}: {sentence}'
-                      for sentence in runs.violations(way, waits, kill)]
+            wrong += faults.told([f'hdkv set, another {way.__name__} before call {waits}, killed at call {kill}: {each}'
+                                  for each in runs.violations(way, waits, kill)])
     return count, wrong

@@ -46,7 +46,7 @@ def main():
         if which:
             more, found = shell_faults.run(folder, orders, which)
             count, wrong = count + more, wrong + found
-    print(*wrong, f'{count} points, {len(wrong)} violations', sep='\n')
+    print(f'{count} points, {len(wrong)} violations')
     return 1 if wrong else 0
 
 

@@ -30,7 +30,7 @@ class Desk:
         self._home = f'{folder}/home'  # of logs and settings
         os.makedirs(self._home, exist_ok=True)
         self._guarded = Guarded(self._folder, name, text(), linked)
-        self._value, self._editor = 1, None
+        self._value, self._editor, self._point = 1, None, None
 
     def _start(self):
         from editor import Editor  # only inside of a session: it looks up the accessibility bus
@@ -72,7 +72,7 @@ class Desk:
     def save(self, point=None):
         """Changes something and saves, with a fault. Gives back the calls that the save took and what did not hold
         afterwards, with the fault as it was met."""
-        new = self._change()
+        new, self._point = self._change(), point
         self._orders.arm(self._armed, point)
         self._editor.press('ctrl+s')
         saved, said = self._outcome()
@@ -145,7 +145,8 @@ class ProjectDesk(Desk):
         saved, said = super()._look()
         if saved is None:
             return saved, said
-        end = time.monotonic() + PATIENCE  # the project is written behind its member
+        # The project is written behind its member; a lock may have to stay.
+        end = time.monotonic() + (2 if self._point and self._point.keeps_files else PATIENCE)
         while glob.glob(f'{self._folder}/**/.*.lock', recursive=True) and time.monotonic() < end:
             time.sleep(0.05)
         if texts := self._editor.no_message():  # it comes when the member is saved
@@ -196,8 +197,10 @@ def run(folder, orders, which):
                     calls, _ = desk.save()
                     for point in list(faults.points(calls))[some]:
                         count += 1
-                        wrong += [f'shell, {name}{" through a link" if linked else ""}: {sentence}'
-                                  for sentence in desk.save(point)[1]]
+                        wrong += faults.told([f'shell, {name}{" through a link" if linked else ""}: {sentence}'
+                                              for sentence in desk.save(point)[1]])
+                        if count % 100 == 0:
+                            print(f'shell, {name}: {count} points so far, {len(wrong)} violations', flush=True)
                 finally:
                     desk.end()
             print(f'shell, {name}: {count} points so far, {len(wrong)} violations', flush=True)

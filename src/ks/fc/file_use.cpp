@@ -197,7 +197,8 @@ void CKsFileUse::TargetWritten(bool written, const CString& path)
         return;
     m_path = path;
     m_timer.start();
-    if (!target.IsHeld() && !target.WhyNone()) // the lock of the file itself stays
+    // The lock of the file itself stays, whatever was known of the target before it was written.
+    if ((!target.IsHeld() && !target.WhyNone()) || m_lock.IsFor(path.toStdString()))
         return Follow(path);
     m_lock = std::move(target);
     m_rival = {};
