@@ -6,7 +6,10 @@
 #include "grid/grid_header.h"
 #include "grid/grid_widths.h"
 
+#include <QMenu>
 #include <QScrollBar>
+#include <QStyledItemDelegate>
+#include <QTimer>
 
 namespace {
 
@@ -154,6 +157,19 @@ TEST_F(FrozenColumnsTest, WhatIsOnTheScreenIsWhatIsPaintedAfresh)
         ScrollBy(scrolled);
         expectSame("scrolled to " + std::to_string(scrolled));
     }
+    Mouse(grid->Header().viewport(), QEvent::MouseButtonPress, {Place(1, Chainage).center().x(), 8});
+    expectSame("header pressed");
+    Mouse(grid->Header().viewport(), QEvent::MouseButtonRelease, {Place(1, Chainage).center().x(), 8});
+    expectSame("header let go");
+    for (const int column : {int(Name), int(LeftOffset)}) {
+        Type(2, column, "7");
+        for (const int scrolled : {60, 20, 90}) {
+            ScrollBy(scrolled);
+            expectSame("with an editor in column " + std::to_string(column) + ", at " + std::to_string(scrolled));
+        }
+        QTest::keyClick(Editor(), Qt::Key_Escape);
+    }
+    ScrollBy(40);
     for (const int last : {4, 2}) {
         grid->selectionModel()->select({Cell(2, Name), Cell(last, Chainage)}, QItemSelectionModel::ClearAndSelect);
         expectSame("selected to line " + std::to_string(last));
@@ -166,6 +182,32 @@ TEST_F(FrozenColumnsTest, WhatIsOnTheScreenIsWhatIsPaintedAfresh)
     Drag(grid->Header().viewport(), {border, 8}, {border + 15, 8});
     QTest::qWait(20); // the base follows later
     expectSame("wider");
+}
+
+TEST_F(FrozenColumnsTest, TheCellBelowTheMouseIsPaintedAsSuch)
+{
+    class Watch : public QStyledItemDelegate
+    {
+    public:
+        void paint(QPainter*, const QStyleOptionViewItem& option, const QModelIndex& cell) const override
+        {
+            if (option.state.testFlag(QStyle::State_MouseOver))
+                hovered << cell;
+        }
+        mutable QList<QModelIndex> hovered;
+    } watch;
+    QAbstractItemDelegate* const own = grid->itemDelegate();
+    grid->setItemDelegate(&watch);
+    ScrollBy(250);
+    QCursor::setPos(grid->viewport()->mapToGlobal(Place(3, Chainage).center()));
+    QHoverEvent enters(QEvent::HoverEnter, QPointF(1, 1), QPointF(1, 1), QPointF(-1, -1));
+    QApplication::sendEvent(grid->viewport(), &enters);
+    grid->viewport()->setAttribute(Qt::WA_UnderMouse);
+    watch.hovered.clear();
+    grid->viewport()->grab();
+    EXPECT_TRUE(watch.hovered.contains(Cell(3, Chainage)));
+    EXPECT_FALSE(watch.hovered.contains(Cell(3, Name)));
+    grid->setItemDelegate(own);
 }
 
 TEST_F(FrozenColumnsTest, EveryCellIsFoundWhereItIsSeenAndOnlyThere)
@@ -203,7 +245,11 @@ TEST_F(FrozenColumnsTest, TheCurrentCellIsNeverCovered)
     for (const int scrolled : {0, 120, Bar().maximum()}) {
         for (int column = Name; column <= Last; ++column) {
             ScrollBy(scrolled);
+            const QRect before = Place(3, column);
+            const bool wasInSight =
+                Room(column).contains(before) && before.width() + 1 == grid->columnWidth(column - 1);
             grid->SetCurrentCell(3, column);
+            EXPECT_TRUE(!wasInSight || Bar().value() == scrolled) << scrolled << ' ' << column;
             const QRect place = Place(3, column);
             EXPECT_TRUE(Room(column).contains(place)) << scrolled << ' ' << column;
             EXPECT_EQ(place.width() + 1, grid->columnWidth(column - 1)) << "the whole cell";
@@ -220,6 +266,7 @@ TEST_F(FrozenColumnsTest, TheCurrentCellIsNeverCovered)
     QTest::keyClick(grid, Qt::Key_End);
     EXPECT_EQ(Current(), std::pair(3, int(Last)));
     EXPECT_EQ(Bar().value(), Bar().maximum());
+    EXPECT_EQ(Bar().pageStep(), grid->viewport()->width() - Frozen()) << "a page is what is seen of the others";
     grid->GotoLine(30);
     EXPECT_EQ(Current(), std::pair(30, int(Name))) << "the first column in sight";
     EXPECT_EQ(Bar().value(), Bar().maximum());
@@ -320,6 +367,23 @@ TEST_F(FrozenColumnsTest, HeadersAreSeenPressedAndResized)
     grid->setColumnWidth(Chainage - 1, before + 20);
     Drag(headers, {grid->columnWidth(0) - 1, 8}, {grid->columnWidth(0) - 13, 8});
     EXPECT_EQ(Frozen(), edge + 8);
+    Drag(headers, {grid->columnWidth(0) - 1, 8}, {-300, 8});
+    EXPECT_EQ(grid->columnWidth(0), grid->Header().minimumSectionSize()) << "no narrower than others";
+    grid->setColumnWidth(0, 150);
+    QTimer::singleShot(0, grid, [] {
+        if (auto* menu = qobject_cast<QMenu*>(QApplication::activePopupWidget())) {
+            menu->actions().back()->trigger();
+            menu->close();
+        }
+    });
+    QContextMenuEvent asks(QContextMenuEvent::Mouse, {10, 8}, headers->mapToGlobal(QPoint(10, 8)));
+    QApplication::sendEvent(headers, &asks);
+    EXPECT_LT(grid->columnWidth(0), 150) << "the menu is that of the frozen column: fitted";
+    grid->setColumnWidth(0, 90);
+    QTest::mousePress(headers, Qt::RightButton, {}, {89, 8});
+    Mouse(headers, QEvent::MouseMove, {120, 8});
+    QTest::mouseRelease(headers, Qt::RightButton, {}, {120, 8});
+    EXPECT_EQ(grid->columnWidth(0), 90) << "by the left button";
     for (const auto& [x, shape] : {std::pair(5, Qt::ArrowCursor), std::pair(grid->columnWidth(0), Qt::SplitHCursor),
                                    std::pair(grid->columnWidth(0) + 30, Qt::ArrowCursor)}) {
         QMouseEvent over(QEvent::MouseMove, QPoint(x, 8), headers->mapToGlobal(QPoint(x, 8)), Qt::NoButton,
@@ -363,6 +427,11 @@ TEST_F(FrozenColumnsTest, NothingIsFrozenWhereTheOthersWouldHaveNoRoom)
     Widen(view->width() + 4);
     EXPECT_EQ(Frozen(), edge);
     EXPECT_EQ(Place(1, Name).left(), 0);
+    const int width = grid->columnWidth(0);
     grid->setColumnWidth(0, 400);
     EXPECT_EQ(Frozen(), 0);
+    grid->setColumnWidth(0, width);
+    EXPECT_EQ(Frozen(), edge);
+    grid->setLayoutDirection(Qt::RightToLeft);
+    EXPECT_EQ(Frozen(), 0) << "the left is where the lines end";
 }

@@ -13,6 +13,8 @@
 #include <QClipboard>
 #include <QDialogButtonBox>
 #include <QLabel>
+#include <QLocale>
+#include <QMimeData>
 #include <QPushButton>
 #include <QTableWidget>
 #include <QTimer>
@@ -88,6 +90,13 @@ protected:
             if (view->accessibleName() == "What does not fit")
                 return *view;
         throw std::logic_error("no list of faults");
+    }
+    static QTableView& Understood(const QDialog& dialog)
+    {
+        for (auto* view : dialog.findChildren<QTableView*>())
+            if (view->accessibleName() == "As it is understood")
+                return *view;
+        throw std::logic_error("no table of what is understood");
     }
     static QStringList Listed(const QDialog& dialog)
     {
@@ -205,6 +214,47 @@ TEST_F(PasteTest, BlankCellsAreAsClearedOnes)
     EXPECT_EQ(said.toStdString(), "6 cells pasted; shorter lines leave their other cells as they were");
 }
 
+TEST_F(PasteTest, LinesAreCountedAsTheyWereCopiedAndAsTheyGo)
+{
+    QStringList listed, goTo;
+    Paste(2, 2, "Initial h\tRiver Name\nabc\tX\n5\tY\n6\tZ", [&](QDialog& dialog) {
+        listed = Listed(dialog);
+        for (int line = 0; line < 3; ++line)
+            goTo << Understood(dialog).model()->headerData(line, Qt::Vertical).toString();
+        Mend(dialog, 0, "7");
+    });
+    EXPECT_EQ(listed, QStringList("2|Initial h|abc|Floating point number required")) << "the headers are a line";
+    EXPECT_EQ(goTo, QStringList({"2", "3", "new"}));
+    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, X 100 7 2, Y 0 5 3, Z 10000000000 6 0");
+}
+
+TEST_F(PasteTest, LeavingOutIsAgreedToAsItIsShown)
+{
+    const auto leaveOut = [](QDialog& dialog) { return dialog.findChild<QCheckBox*>("leaveOut"); };
+    bool agreedBefore = false, agreedAfter = true;
+    Paste(1, 2, "x\t5\n1\t6", [&](QDialog& dialog) {
+        leaveOut(dialog)->click();
+        agreedBefore = leaveOut(dialog)->isChecked();
+        Choose(dialog, "decimal", 1);
+        agreedAfter = leaveOut(dialog)->isChecked();
+    });
+    EXPECT_TRUE(agreedBefore);
+    EXPECT_FALSE(agreedAfter) << "something else is left out now";
+    EXPECT_FALSE(canPaste);
+    Paste(1, 2, "x", [&](QDialog& dialog) { leaveOut(dialog)->click(); });
+    EXPECT_FALSE(canPaste) << "nothing remains";
+    QString summary;
+    Paste(1, 1, "X\tabc", [&](QDialog& dialog) {
+        dialog.findChild<QCheckBox*>("headers")->click();
+        summary = Summary(dialog);
+    });
+    EXPECT_EQ(summary.toStdString(), "1 line was copied. 0 lines are new.") << "a single line names nothing";
+    Paste(1, 3, "5\t6\t7"); // more than the table has
+    EXPECT_TRUE(asked);
+    EXPECT_EQ(Stored().toStdString(), "A 0 5 6, A 100 20 2, B 0 30 3");
+    EXPECT_EQ(said.toStdString(), "2 cells pasted");
+}
+
 TEST_F(PasteTest, ColumnsGoWhereTheirHeadersSay)
 {
     for (const char* text : {"initial q [l/s]\tNote\tRIVER NAME\tInitial h [m]\n500\tx\tM\t7\n250\ty\tN\t8",
@@ -222,7 +272,17 @@ TEST_F(PasteTest, ColumnsGoWhereTheirHeadersSay)
     EXPECT_EQ(Stored().toStdString(), "A 0 10 1, M 100 7 2, B 0 30 3");
     document.UndoStack().undo();
     KsLanguage::Instance().SetCurrent("en_US");
+    Paste(1, 2, "depth\tflow\n1\t2"); // nobody knows them, but numbers stand below
+    EXPECT_TRUE(asked && canPaste);
+    EXPECT_EQ(Stored().toStdString(), "A 1 2 1, A 100 20 2, B 0 30 3");
+    document.UndoStack().undo();
     // In their order, without another unit: nothing to ask about. Names only, they are no names.
+    for (const char* text : {"Initial h\tInitial Q\n5\t6", "Initial h [-]\tInitialQ ()\n5\t6"}) {
+        Paste(1, 3, text); // up to the last column
+        EXPECT_FALSE(asked) << text;
+        EXPECT_EQ(Stored().toStdString(), "A 0 5 6, A 100 20 2, B 0 30 3") << text;
+        document.UndoStack().undo();
+    }
     Paste(2, 2, "chainage [m]\tInitialH\n1\t2");
     EXPECT_FALSE(asked);
     EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 1 2 2, B 0 30 3");
@@ -241,10 +301,8 @@ TEST_F(PasteTest, NumbersOfOtherCountriesAreUnderstoodAndShown)
 {
     QString understood;
     Paste(1, 2, "1.234,5\t3,25\n2.000\t4,5\n3\t5,125", [&](QDialog& dialog) {
-        for (auto* table : dialog.findChildren<QTableView*>())
-            if (table->accessibleName() == "As it is understood")
-                understood =
-                    table->model()->index(0, 0).data().toString() + ' ' + table->model()->index(1, 0).data().toString();
+        const auto* model = Understood(dialog).model();
+        understood = model->index(0, 0).data().toString() + ' ' + model->index(1, 0).data().toString();
     });
     EXPECT_TRUE(asked);
     EXPECT_EQ(understood.toStdString(), "1234.5 2000");
@@ -253,6 +311,16 @@ TEST_F(PasteTest, NumbersOfOtherCountriesAreUnderstoodAndShown)
     Paste(1, 2, "1,234.5\n12,345"); // thousands
     EXPECT_EQ(Stored().toStdString(), "A 1234.5 10 1, A 12345 20 2, B 0 30 3");
     document.UndoStack().undo();
+    Paste(1, 2, "1,234\n2,500"); // as they are where points are decimal signs
+    EXPECT_EQ(Stored().toStdString(), "A 1234 10 1, A 2500 20 2, B 0 30 3");
+    document.UndoStack().undo();
+    QLocale::setDefault(QLocale(QLocale::German));
+    for (const char* text : {"1,234\n2,5", "1,234\n2,500", "1.234\n2.500"}) { // a point is one, as in a cell
+        Paste(1, 2, text, {}, QDialogButtonBox::Ok, Qt::ControlModifier | Qt::ShiftModifier);
+        EXPECT_EQ(Stored().toStdString(), "A 1.234 10 1, A 2.5 20 2, B 0 30 3") << text;
+        document.UndoStack().undo();
+    }
+    QLocale::setDefault(QLocale::system());
     Paste(1, 2, "1,234\n2,500", [&](QDialog& dialog) { Choose(dialog, "decimal", 1); }); // which, the user says
     EXPECT_EQ(Stored().toStdString(), "A 1.234 10 1, A 2.5 20 2, B 0 30 3");
     document.UndoStack().undo();
@@ -273,8 +341,18 @@ TEST_F(PasteTest, LinesFindTheirPlaces)
           QDialogButtonBox::Ok, Qt::ControlModifier | Qt::ShiftModifier);
     EXPECT_EQ(summary.toStdString(), "5 lines were copied. 2 lines are new.");
     EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 100 21 5, B 0 31 5, A 100 41 6, A 100 51 7, C 7 1 8");
+    EXPECT_EQ(said.toStdString(), "20 cells pasted") << "with those that name the lines";
+    const auto block = grid->SelectedBlock();
+    EXPECT_TRUE(!block || block->height() == 1) << "they are no block: the second line is none of those between";
     document.UndoStack().undo();
     EXPECT_EQ(Stored().toStdString(), before + ", A 100 40 4") << "one step";
+
+    // A line that ends before its place is told has none, whatever stands in the next one.
+    Add("5", 0, 50, 5);
+    grid->Refresh();
+    Paste(1, 1, "Chainage\tRiver Name\tInitial h\n0\n5\tB\t9", byPlace);
+    EXPECT_EQ(summary.toStdString(), "2 lines were copied. 2 lines are new.");
+    EXPECT_EQ(Stored().toStdString(), before + ", A 100 40 4, 5 0 50 5,  0 0 0, B 5 9 0");
 }
 
 TEST_F(PasteTest, ValuesTravelWithTheirUnitsAndEveryDigit)
@@ -301,17 +379,103 @@ TEST_F(PasteTest, ValuesTravelWithTheirUnitsAndEveryDigit)
         EXPECT_EQ(init.GetAt(3).InitialQ, 2);
         document.UndoStack().undo();
     }
+    for (const auto& [from, to] : {std::pair(UsCustomary, Metric), {UsCustomary, UsCustomary}}) { // below headers
+        KsUnits::Instance().SetSystem(from);
+        grid->selectionModel()->select(QItemSelection(grid->model()->index(0, 2), grid->model()->index(1, 3)),
+                                       QItemSelectionModel::ClearAndSelect);
+        QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier | Qt::ShiftModifier);
+        KsUnits::Instance().SetSystem(to);
+        Paste(3, 3, {});
+        EXPECT_EQ(asked, from != to) << "another unit is named";
+        ASSERT_EQ(init.GetCount(), 4u);
+        EXPECT_EQ(init.GetAt(2).InitialH, 1.0 / 3);
+        EXPECT_EQ(init.GetAt(3).InitialH, 0.1 + 0.2);
+        document.UndoStack().undo();
+    }
+    KsUnits::Instance().SetSystem(UsCustomary);
+    copy();
     KsUnits::Instance().SetSystem(Metric);
+    Paste(
+        3, 3, {},
+        [](QDialog& dialog) {
+            auto* unit = qobject_cast<QComboBox*>(dialog.findChild<QTableWidget*>()->cellWidget(0, 2));
+            EXPECT_EQ(unit->currentText(), "ft");
+            unit->setCurrentIndex(unit->findText("m"));
+            emit unit->activated(unit->currentIndex());
+        },
+        QDialogButtonBox::Ok, Qt::ControlModifier | Qt::ShiftModifier);
+    ASSERT_EQ(init.GetCount(), 4u);
+    EXPECT_NEAR(init.GetAt(2).InitialH, 1.0936, 0.0001) << "the text is taken, as the user says";
+    document.UndoStack().undo();
+    init.GetAt(0).InitialH = 3.048;
+    grid->Refresh();
+    KsUnits::Instance().SetSystem(UsCustomary);
+    grid->SetCurrentCell(1, 3);
+    QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier);
+    KsUnits::Instance().SetSystem(Metric);
+    grid->SetCurrentCell(2, 2);
+    grid->selectionModel()->select(QItemSelection(grid->model()->index(1, 1), grid->model()->index(2, 2)),
+                                   QItemSelectionModel::ClearAndSelect);
+    QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier);
+    EXPECT_EQ(Stored().section(", ", 1).toStdString(), "A 3.048 3.048 2, B 3.048 3.048 3") << "in each column";
+    document.UndoStack().undo();
+    // Of a header without unit the clipboard knows it, also when the user says again that it is one.
+    const UnitGroup length = grid->Model()->Column(2).style.Group();
+    for (const int clicks : {0, 2}) {
+        const auto own = [&] {
+            return ToClipboard({{"Initial h", "River Name"}, {"10", "X"}}, {{length, "ft"}, {}}, {}).release();
+        };
+        QGuiApplication::clipboard()->setMimeData(own());
+        Paste(3, 2, {}, [clicks](QDialog& dialog) {
+            for (int i = 0; i < clicks; ++i)
+                dialog.findChild<QCheckBox*>("headers")->click();
+        });
+        EXPECT_TRUE(asked);
+        EXPECT_NEAR(init.GetAt(2).InitialH, 3.048, 1e-9) << clicks;
+        document.UndoStack().undo();
+    }
     // What says more than its text must not be believed.
-    for (const char* own : {"", "100000", "100000\t100001\nm\tm\n", "100000\t7\nm\ts\n1\t2", "\n\n\n\t\t"}) {
+    const auto lie = [](const char* text, const char* own) {
         auto* content = new QMimeData;
-        content->setText("5\t6");
+        content->setText(text);
         content->setData("application/x-kvr-cells", own);
         QGuiApplication::clipboard()->setMimeData(content);
+    };
+    for (const char* own : {"", "100000", "100000\t100001\nm\tm\n", "100000\t7\nm\ts\n1\t2", "\n\n\n\t\t"}) {
+        lie("5\t6", own);
         Paste(3, 3, {});
         EXPECT_EQ(Stored().section(", ", 2).toStdString(), "B 0 5 6") << own;
         document.UndoStack().undo();
     }
+    lie("5\t6\n7\t8", "100000\t100001\nm\tm\n5\n7"); // narrower than the texts
+    Paste(2, 3, {});
+    EXPECT_EQ(Stored().section(", ", 1).toStdString(), "A 100 5 6, B 0 7 8");
+}
+
+TEST_F(PasteTest, DigitsTravelBesideAColumnWithoutUnit)
+{
+    auto& winds = document.Parameters().WindList;
+    for (const double chainage : {1.0 / 3, 0.1 + 0.2, 1.1 * 1.1, 1e5 / 7, 2e5 / 7, 0.7 / 0.9}) {
+        auto& wind = winds.Add({});
+        wind.RiverName = "A";
+        wind.Chainage = chainage;
+    }
+    for (int line = 0; line < 6; ++line)
+        winds.Add({}).RiverName = "B";
+    Open<FamilyPage>(winds);
+    grid->setFocus();
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    ASSERT_TRUE(grid->Model()->Column(grid->ColumnCount() - 1).UnitSymbol().isEmpty());
+    grid->SetCurrentCell(1, 2);
+    grid->selectionModel()->select(
+        QItemSelection(grid->model()->index(0, 1), grid->model()->index(5, grid->ColumnCount() - 1)),
+        QItemSelectionModel::ClearAndSelect);
+    QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier);
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    Paste(7, 2, {});
+    EXPECT_FALSE(asked);
+    for (std::size_t line = 0; line < 6; ++line)
+        EXPECT_EQ(winds.GetAt(line + 6).Chainage, winds.GetAt(line).Chainage);
 }
 
 TEST_F(PasteTest, OnlyWhatIsShownIsOverwritten)
@@ -319,4 +483,57 @@ TEST_F(PasteTest, OnlyWhatIsShownIsOverwritten)
     grid->ChangeView([](CGridModel& model) { model.Filter({"A"}); });
     Paste(2, 3, "21,5\n22,5\n23,5");
     EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 100 21.5 2, B 0 30 3,  10000000000 22.5 0,  10000000000 23.5 0");
+}
+
+namespace {
+
+/// A table whose line at 100 is locked but for its last columns.
+class LockedPage : public CLocationPage
+{
+public:
+    LockedPage(CKavo0_hdDoc* document, CGenList& list) : CLocationPage(document, list)
+    {
+        auto* grid = new CGenGrid;
+        (new QVBoxLayout(this))->addWidget(grid);
+        const auto isLocked = [](const void* row) { return static_cast<const HD_Initial*>(row)->Chainage == 100; };
+        GridColumns columns = Grid(grid);
+        columns.BranchName({.locked = isLocked}).Chainage({.locked = isLocked});
+        for (const Field& field : list.Fields())
+            if (field.kind != FieldKind::Group)
+                columns.Value(field, {});
+    }
+};
+
+} // namespace
+
+TEST_F(PasteTest, LockedCellsAreTold)
+{
+    Open<LockedPage>(init);
+    QStringList listed;
+    Paste(1, 1, "Z\t1\nZ\t7\nZ\t3", [&](QDialog& dialog) {
+        listed = Listed(dialog);
+        dialog.findChild<QCheckBox*>("leaveOut")->click();
+    });
+    EXPECT_EQ(listed, QStringList({"2|River Name|Z|The cell is locked.", "2|Chainage|7|The cell is locked."}))
+        << "and no others";
+    EXPECT_EQ(Stored().toStdString(), "Z 1 10 1, A 100 20 2, Z 3 30 3");
+    Paste(2, 1, "A\t100\t5");
+    EXPECT_FALSE(asked) << "they hold that already";
+    EXPECT_EQ(Stored().toStdString(), "Z 1 10 1, A 100 5 2, Z 3 30 3");
+}
+
+TEST(Separator, IsThatWhichDividesEveryLineAlike)
+{
+    const auto of = [](const char* text) {
+        return SeparatorOf([text = QString(text)](QChar separator) { return CopiedTable{CTextTable(text, separator)}; })
+            .toLatin1();
+    };
+    EXPECT_EQ(of("a;b\nc;d"), ';');
+    EXPECT_EQ(of("a,b\nc,d"), ',');
+    EXPECT_EQ(of("a|b\nc|d"), '|');
+    EXPECT_EQ(of("a;b,c\nd;e,f"), ';');
+    EXPECT_EQ(of("a;b\nc"), '\t') << "a line has none";
+    EXPECT_EQ(of("a;b\nc;d\te"), '\t') << "a tab divides another line";
+    EXPECT_EQ(of("1,234\n2,345"), '\t') << "numbers";
+    EXPECT_EQ(of("a"), '\t');
 }

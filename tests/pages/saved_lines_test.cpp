@@ -7,7 +7,9 @@
 #include "grid/cell_operations.h"
 #include "grid/grid_commands.h"
 #include "grid/row_commands.h"
+#include "grid/saved_mark.h"
 
+#include <QPainter>
 #include <map>
 #include <random>
 
@@ -321,6 +323,74 @@ TEST_F(SavedLinesTest, ArePaintedBesideTheNumber)
     EXPECT_EQ(dots(1), 0);
     EXPECT_GT(dots(2), 20);
     EXPECT_NE(dots(0), dots(2)) << "another mark";
+}
+
+TEST_F(SavedLinesTest, MarksOfWhatIsBeingTypedArePaintedAtOnce)
+{
+    struct PaintCount : QObject
+    {
+        bool eventFilter(QObject*, QEvent* event) override
+        {
+            count += event->type() == QEvent::Paint;
+            return false;
+        }
+        int count = 0;
+    } paints;
+    Add("A", 1, 10);
+    Add("B", 1, 10);
+    Open(MakeInitPage);
+    grid->verticalHeader()->viewport()->installEventFilter(&paints);
+    for (const int row : {0, 1}) { // no step is made by either
+        QApplication::processEvents();
+        paints.count = 0;
+        grid->Model()->setData(grid->model()->index(row, 2), "11", Qt::EditRole);
+        QApplication::processEvents();
+        EXPECT_GT(paints.count, 0) << row;
+    }
+    EXPECT_EQ(Marks(), "**");
+}
+
+TEST_F(SavedLinesTest, ASaveIsForgottenByNoLine)
+{
+    Add("A", 1, 10);
+    Add("B", 1, 10);
+    Open(MakeInitPage);
+    Enter(1, 3, "11");
+    EXPECT_EQ(Marks(), "*.");
+    Save();
+    grid->Model()->setData(grid->model()->index(1, 2), "12", Qt::EditRole); // typed, and not stored yet
+    EXPECT_EQ(Marks(), ".*") << "the first one is as it was saved by now";
+}
+
+TEST(SavedMarks, AreSeenOnSelectedCellsToo)
+{
+    QPalette palette;
+    palette.setColor(QPalette::Highlight, Qt::blue);
+    palette.setColor(QPalette::HighlightedText, Qt::yellow);
+    for (const bool isSelected : {false, true}) {
+        QImage image(40, 20, QImage::Format_RGB32);
+        image.fill(isSelected ? Qt::blue : Qt::white);
+        QPainter painter(&image);
+        PaintCellMark(painter, image.rect(), palette, isSelected);
+        painter.end();
+        EXPECT_EQ(image.pixelColor(0, 10), QColor(isSelected ? Qt::yellow : Qt::blue));
+    }
+}
+
+TEST_F(SavedLinesTest, WhatABoxWasIsSaid)
+{
+    globals.MarkTitles = {"LOW", "HIGH"};
+    globals.MarkInterpolate = {true, false};
+    Open(MakeWLMarkPage);
+    auto* titles = view->page->findChild<CGenGrid*>("titles_1075");
+    titles->setFocus();
+    for (const int line : {1, 2}) {
+        titles->SetCurrentCell(line, 2);
+        QTest::keyClick(titles, Qt::Key_Space);
+    }
+    ASSERT_EQ(Marks(*titles), "**");
+    EXPECT_EQ(titles->Model()->Saved().CellText(0, 1), "was on at the last save");
+    EXPECT_EQ(titles->Model()->Saved().CellText(1, 1), "was off at the last save");
 }
 
 /// What was saved is nowhere on the stack of steps any more.

@@ -5,8 +5,11 @@
 #include "network_fixture.h"
 
 #include <QAbstractItemModelTester>
+#include <QCheckBox>
 #include <QClipboard>
+#include <QDialogButtonBox>
 #include <QLineEdit>
+#include <QPushButton>
 
 namespace {
 
@@ -199,6 +202,31 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     EXPECT_EQ(view->Document()->Network().branches.size(), 2u);
     Select(view->Branches(), 0);
     EXPECT_EQ(chainages(), "2000 4000 6000");
+}
+
+/// Each of them is looked for among all lines; after a number of them the others are not known.
+TEST_F(NetworkTest, NothingIsPastedWhileSomeOfWhatDoesNotFitIsNotKnown)
+{
+    CNetworkView* view = Open();
+    CGenGrid* channel = view->Channel();
+    channel->setFocus();
+    bool mayPaste = false;
+    for (const int lines : {10, 30}) {
+        QString text = "2000\n4000\n6000\n7000\n";
+        for (int line = 0; line < lines; ++line)
+            text += "7000\n";
+        QGuiApplication::clipboard()->setText(text);
+        channel->SetCurrentCell(1, 1);
+        QTimer::singleShot(0, view, [&mayPaste] {
+            auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+            ASSERT_TRUE(dialog);
+            dialog->findChild<QCheckBox*>("leaveOut")->click();
+            mayPaste = dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->isEnabled();
+            dialog->reject();
+        });
+        QTest::keyClick(channel, Qt::Key_V, Qt::ControlModifier);
+        EXPECT_EQ(mayPaste, lines == 10) << lines;
+    }
 }
 
 TEST_F(NetworkTest, WhatCannotBeStoredStaysInItsEditorAndIsToldOnce)
