@@ -96,10 +96,10 @@ double StepOf(const CTableRows& rows, const CellBlock& block)
         if (!rows.Column(column).IsNumeric())
             continue;
         const CShownNumbers numbers(rows, column);
-        const auto first = numbers.At(block.top), second = numbers.At(block.top + 1);
-        if (!first || !second)
+        const double first = numbers.At(block.top), second = numbers.At(block.top + 1);
+        if (std::isnan(first) || std::isnan(second))
             return 0;
-        return KsFifteenDigits(*second - *first, std::max(std::fabs(*first), std::fabs(*second)));
+        return KsFifteenDigits(second - first, std::max(std::fabs(first), std::fabs(second)));
     }
     return 0;
 }
@@ -111,11 +111,13 @@ CCellResults FillSeries(const CTableRows& rows, const CellBlock& block, double s
     for (int column = block.left; column <= block.right && block.top <= last; ++column) {
         if (!rows.Column(column).IsNumeric())
             continue;
-        const auto first = CShownNumbers(rows, column).At(block.top);
-        if (!first)
+        const double first = CShownNumbers(rows, column).At(block.top);
+        if (std::isnan(first)) {
             results.Keep(block.top, column, GridTexts::tr("The cell is empty."));
-        for (int row = block.top + 1; first && row <= last; ++row)
-            results.AddShown(row, column, *first + step * (row - block.top));
+            continue;
+        }
+        for (int row = block.top + 1; row <= last; ++row)
+            results.AddShown(row, column, first + step * (row - block.top));
     }
     return results;
 }
@@ -223,8 +225,8 @@ std::optional<Known> FirstKnown(const CShownNumbers& numbers, auto lines, const 
     for (const LineOfBranch& line : lines) {
         if (line.IsIn(block) != isInBlock)
             continue;
-        if (const auto value = numbers.In(line.object))
-            return Known{line.chainage, *value};
+        if (const double value = numbers.In(line.object); !std::isnan(value))
+            return Known{line.chainage, value};
     }
     return std::nullopt;
 }
@@ -316,10 +318,9 @@ void CCellFormula::Add(CCellResults& results, int row)
 {
     const void* const object = m_rows->UntouchedObject(row);
     for (const auto& [name, numbers] : m_used) {
-        const auto number = numbers.At(row, object);
-        if (!number)
+        *name = numbers.At(row, object);
+        if (std::isnan(*name))
             return results.Keep(row, m_column, GridTexts::tr("A cell that the formula names is empty."));
-        *name = *number;
     }
     results.AddShown(row, m_column, object, m_formula->Value());
 }

@@ -4,6 +4,7 @@
 #include "grid/line_header.h"
 
 #include <QHeaderView>
+#include <QScopedValueRollback>
 #include <QStyle>
 #include <algorithm>
 #include <cmath>
@@ -96,7 +97,7 @@ void CGridWidths::Update()
         const auto column = int(m_columns.size());
         const int width = int(m_grid.Model()->Column(column).width * m_letters.scale);
         m_columns.push_back({.usual = WidthOfTexts(column, RowsAtStart, width)});
-        m_grid.setColumnWidth(column, m_columns.back().usual);
+        SetWidth(column, m_columns.back().usual);
     }
     MakeRoomForMarks();
     Arrange();
@@ -118,14 +119,19 @@ void CGridWidths::Arrange()
     for (std::size_t i = 0; missing > 0 && i < m_columns.size(); ++i)
         spare += m_columns[i].usual - Least(i);
     const double share = spare > 0 ? std::clamp(missing / double(spare), 0.0, 1.0) : 0.0;
-    m_isArranging = true;
     for (std::size_t i = 0; i < m_columns.size(); ++i) {
         const Column& column = m_columns[i];
         const int given = missing > 0 ? int(std::ceil((column.usual - column.least) * share)) : 0;
-        m_grid.setColumnWidth(int(i), column.usual - given);
+        SetWidth(int(i), column.usual - given);
     }
     MakeRoomForMarks();
-    m_isArranging = false;
+}
+
+/// Nobody has chosen it, even where a click on a header was the reason.
+void CGridWidths::SetWidth(int column, int width)
+{
+    const QScopedValueRollback arranging(m_isArranging, true);
+    m_grid.setColumnWidth(column, width);
 }
 
 int CGridWidths::Least(std::size_t i)
@@ -196,7 +202,7 @@ void CGridWidths::MakeRoomForMarks()
         for (const QString& line : column.HeaderLines())
             text = std::max(text, m_grid.fontMetrics().horizontalAdvance(line));
         if (m_grid.columnWidth(key.column) < text + 2 * mark)
-            m_grid.setColumnWidth(key.column, text + 2 * mark);
+            SetWidth(key.column, text + 2 * mark);
     }
 }
 
@@ -220,7 +226,7 @@ void CGridWidths::Widen(int column, int width)
     Column& its = m_columns[std::size_t(column)];
     its.usual = std::max(its.usual, width);
     its.least = 0;
-    m_grid.setColumnWidth(column, width);
+    SetWidth(column, width);
 }
 
 void CGridWidths::Choose(const QVariantList& widths)
@@ -228,14 +234,14 @@ void CGridWidths::Choose(const QVariantList& widths)
     constexpr int least = 16, most = 2000; // pixels, whatever stands in settings
     Update();
     for (int column = 0; column < std::min(int(widths.size()), m_grid.ColumnCount()); ++column)
-        m_grid.setColumnWidth(column, std::clamp(widths[column].toInt(), least, most));
+        SetWidth(column, std::clamp(widths[column].toInt(), least, most));
     m_areChosen = true;
 }
 
 void CGridWidths::Fit(int column)
 {
     m_areChosen = true;
-    m_grid.setColumnWidth(column, WidthOfTexts(column, RowsForRoom, 2 * Margin));
+    SetWidth(column, WidthOfTexts(column, RowsForRoom, 2 * Margin));
     MakeRoomForMarks();
 }
 

@@ -59,6 +59,7 @@ private:
     void UpdateRowNumbers();
     int WidthOfTexts(int column, int most, int least);
     void Widen(int column, int width);
+    void SetWidth(int column, int width);
     int Least(std::size_t column);
     int BesideColumns() const;
     void Arrange();

@@ -9,10 +9,10 @@ CShownNumbers::CShownNumbers(const CTableRows& rows, int column)
 {
 }
 
-std::optional<double> CShownNumbers::Of(const CellValue& value) const
+double CShownNumbers::Of(const CellValue& value) const
 {
     if (const auto* integer = std::get_if<std::int32_t>(&value))
         return *integer;
     const auto* number = std::get_if<double>(&value);
-    return number ? Of(*number) : std::nullopt;
+    return number ? Of(*number) : None;
 }

@@ -3,6 +3,8 @@
 
 #include "grid/table_rows.h"
 
+#include <limits>
+
 /// For as long as nothing of the table changes.
 class CShownNumbers
 {
@@ -16,27 +18,29 @@ public:
     {
         return object && m_access->number ? m_access->number(object) : nullptr;
     }
-    /// Nothing for an empty cell and for what is no number. `object` is the row's UntouchedObject.
-    std::optional<double> At(int row, const void* object) const
+    /// NaN for an empty cell and for what is no number: an optional would go through memory, a million times.
+    /// `object` is the row's UntouchedObject.
+    double At(int row, const void* object) const
     {
         const double* const kept = Kept(object);
         return kept ? Of(*kept) : Of(m_rows->Value(row, m_column));
     }
-    std::optional<double> At(int row) const { return At(row, m_rows->UntouchedObject(row)); }
+    double At(int row) const { return At(row, m_rows->UntouchedObject(row)); }
     /// The same of an object of the source, whatever was typed.
-    std::optional<double> In(const void* object) const
+    double In(const void* object) const
     {
         const double* const kept = Kept(object);
         return kept ? Of(*kept) : Of(m_access->get(object));
     }
 
 private:
-    std::optional<double> Of(double number) const
+    static constexpr double None = std::numeric_limits<double>::quiet_NaN();
+
+    double Of(double number) const
     {
-        const bool isEmpty = std::isnan(number) || (m_spec->emptyIsNotGiven && number == NotGiven);
-        return isEmpty ? std::nullopt : std::optional(m_conversion.ToShown(number));
+        return m_spec->emptyIsNotGiven && number == NotGiven ? None : m_conversion.ToShown(number);
     }
-    std::optional<double> Of(const CellValue& value) const;
+    double Of(const CellValue& value) const;
 
     const CTableRows* m_rows;
     int m_column;

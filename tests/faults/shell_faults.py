@@ -139,7 +139,8 @@ class ProjectDesk(Desk):
 
     def _look(self):
         saved, said = self._look_behind_member()
-        return saved and 'still names' not in said, said
+        # Whoever is asked first, as metadata cannot be kept, answers with Escape.
+        return saved and 'still names' not in said and 'Save?' not in said, said
 
     def _look_behind_member(self):
         saved, said = super()._look()

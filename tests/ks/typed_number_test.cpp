@@ -107,6 +107,7 @@ TEST_F(TypedNumber, AFormulaIsOneNumber)
 {
     using enum UnitGroup;
     EXPECT_EQ(Read(Discharge, "=10+5"), 15);
+    EXPECT_EQ(Read(Discharge, "=_pi"), 3.14159265358979);
     EXPECT_EQ(Read(Discharge, "= 2 * max(1.5, 3) ^ 2"), 18);
     EXPECT_EQ(Read(Discharge, "=-1e-3"), -0.001);
     EXPECT_EQ(Read(Discharge, "=0.1+0.2"), 0.3) << "without stray digits";

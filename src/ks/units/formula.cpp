@@ -4,6 +4,7 @@
 #include <QRegularExpression>
 #include <algorithm>
 #include <muParser.h>
+#include <numbers>
 #include <vector>
 
 struct CKsFormula::Parser
@@ -63,6 +64,7 @@ CKsFormula::CKsFormula(const CString& text, const QStringList& names) : m_parser
         for (int byte = 0x80; byte <= 0xff; ++byte) // of letters in UTF-8
             letters += char(byte);
         m_parser->parser.DefineNameChars(letters.c_str());
+        m_parser->parser.DefineConst("_pi", std::numbers::pi); // some releases of the parser know twelve decimals of it
         for (qsizetype name = 0; name < names.size(); ++name)
             m_parser->parser.DefineVar(names[name].toStdString(), &m_parser->numbers[std::size_t(name)]);
         m_parser->parser.SetExpr(text.toStdString());

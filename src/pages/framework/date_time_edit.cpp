@@ -21,3 +21,10 @@ QString CDateTimeEdit::Complaint() const
 {
     return Value() ? QString() : DateTimeRefusal(text());
 }
+
+QSize CDateTimeEdit::minimumSizeHint() const
+{
+    constexpr int beside = 16; // frame and margins
+    const int longest = fontMetrics().horizontalAdvance(DateTimeText({2028, 12, 28, 20, 48, 48}));
+    return {longest + beside, QLineEdit::minimumSizeHint().height()};
+}

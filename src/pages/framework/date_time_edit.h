@@ -18,6 +18,8 @@ public:
     std::optional<HDDateTime> Value() const;
     /// Why the text is no date and time; empty when it is one.
     QString Complaint() const;
+    /// A date and time is seen whole.
+    QSize minimumSizeHint() const override;
 
 private:
     HDDateTime m_value;

@@ -4,11 +4,13 @@
 #include <QPainter>
 #include <QTextLayout>
 #include <algorithm>
+#include <utility>
 
 namespace {
 
-constexpr int UsualLines = 2, LeastLetters = 12, UsualLetters = 40; // letters of a line
-constexpr int Air = 3;                                              // pixels between the texts of two rows
+constexpr int LeastLetters = 12, UsualLetters = 40; // of a line
+constexpr int MostLines = 4;
+constexpr int Air = 5, LeastAir = 2; // pixels between the texts of two rows
 // The names of the fields come first: of their color and of their font.
 constexpr float Strength = 0.75F;
 constexpr double Size = 0.88;
@@ -29,12 +31,28 @@ void CFieldMeaning::SetText(const QString& text)
         return;
     m_text = text;
     setAccessibleName(text);
+    CountLines();
     update();
+}
+
+void CFieldMeaning::CountLines()
+{
+    if (!isVisible()) // the width is nobody's yet
+        return;
+    const int wanted = width() < LeastLetters * fontMetrics().averageCharWidth() ? 1 : int(Lines(MostLines).size());
+    if (std::exchange(m_wanted, wanted) != wanted)
+        updateGeometry();
+}
+
+void CFieldMeaning::resizeEvent(QResizeEvent* event)
+{
+    QWidget::resizeEvent(event);
+    CountLines();
 }
 
 QSize CFieldMeaning::sizeHint() const
 {
-    return {UsualLetters * fontMetrics().averageCharWidth(), UsualLines * fontMetrics().lineSpacing() + Air};
+    return {UsualLetters * fontMetrics().averageCharWidth(), m_wanted * fontMetrics().lineSpacing() + Air};
 }
 
 QSize CFieldMeaning::minimumSizeHint() const
@@ -42,18 +60,17 @@ QSize CFieldMeaning::minimumSizeHint() const
     return {0, fontMetrics().lineSpacing()};
 }
 
-/// As many as there is room for; the last one says whether there is more.
-QStringList CFieldMeaning::Lines() const
+/// The last one says whether there is more.
+QStringList CFieldMeaning::Lines(int most) const
 {
-    const int most = std::max(1, height() / fontMetrics().lineSpacing());
     QStringList lines;
     QTextLayout layout(m_text, font());
     layout.beginLayout();
     for (QTextLine line = layout.createLine(); line.isValid() && lines.size() < most; line = layout.createLine()) {
         line.setLineWidth(width());
         const bool isLast = lines.size() + 1 == most;
-        const QString text = m_text.mid(line.textStart(), isLast ? -1 : line.textLength());
-        lines << fontMetrics().elidedText(text, Qt::ElideRight, width());
+        const QString text = m_text.mid(line.textStart(), isLast ? -1 : line.textLength()).trimmed();
+        lines << (isLast ? fontMetrics().elidedText(text, Qt::ElideRight, width()) : text);
     }
     layout.endLayout();
     return lines;
@@ -64,7 +81,7 @@ void CFieldMeaning::paintEvent(QPaintEvent*)
     const QFontMetrics metrics = fontMetrics();
     if (width() < LeastLetters * metrics.averageCharWidth())
         return; // a word or two say nothing
-    const QStringList lines = Lines();
+    const QStringList lines = Lines(std::max(1, (height() - LeastAir) / metrics.lineSpacing()));
     QPainter painter(this);
     QColor color = palette().color(QPalette::WindowText);
     if (isEnabled())
@@ -77,7 +94,9 @@ void CFieldMeaning::paintEvent(QPaintEvent*)
 
 void CFieldMeaning::changeEvent(QEvent* event)
 {
-    if (event->type() == QEvent::FontChange)
+    if (event->type() == QEvent::FontChange) {
+        CountLines();
         updateGeometry();
+    }
     QWidget::changeEvent(event);
 }

@@ -4,8 +4,8 @@
 #include <QStringList>
 #include <QWidget>
 
-/// Shows as much of the text as its width and the height of its row have room for. The tool tip of the field has all
-/// of it.
+/// Wants as many lines as the text takes in its width, and shows as much of it as the height of its row has room for.
+/// The tool tip of the field has all of it.
 class CFieldMeaning : public QWidget
 {
     Q_OBJECT
@@ -18,10 +18,13 @@ public:
 
 protected:
     void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
     void changeEvent(QEvent* event) override;
 
 private:
-    QStringList Lines() const;
+    QStringList Lines(int most) const;
+    void CountLines();
 
     QString m_text;
+    int m_wanted = 2; // lines of the whole text in the present width, or what is usual
 };

@@ -129,6 +129,19 @@ void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
         shown->setFocus(Qt::OtherFocusReason);
 }
 
+namespace {
+
+/// By itself or in one of its groups.
+bool StandsIn(const QWidget& widget, const QBoxLayout& row)
+{
+    for (int i = 0; i < row.count(); ++i)
+        if (const QWidget* item = row.itemAt(i)->widget(); item && (item == &widget || item->isAncestorOf(&widget)))
+            return true;
+    return false;
+}
+
+} // namespace
+
 void CGenPropertyPage::FitInto(QSize room, int scrollBar)
 {
     StackGroups(room.width());
@@ -140,8 +153,8 @@ void CGenPropertyPage::FitInto(QSize room, int scrollBar)
 void CGenPropertyPage::StackGroups(int width)
 {
     const auto turn = [this](QBoxLayout& row, QBoxLayout::Direction direction) {
-        for (int i = 0; i < row.count(); ++i)
-            if (auto* grid = qobject_cast<CGenGrid*>(row.itemAt(i)->widget()))
+        for (CGenGrid* grid : m_grids)
+            if (StandsIn(*grid, row))
                 grid->Widths().KeepColumns(direction == QBoxLayout::LeftToRight);
         row.setDirection(direction);
         for (QWidget* widget = row.parentWidget(); widget != parentWidget(); widget = widget->parentWidget())
