@@ -108,7 +108,7 @@ class InsertedAndMoved(Case):
         editor.press('ctrl+v')
         editor.click_cell(1, 1)
         for lines, key in enumerate(('shift+F10', 'Menu'), 5):
-            editor.press(key, 'Down', 'Return')  # the first entry: Insert line
+            editor.press(key, 'Down', 'Return')  # the first entry: Insert Line
             wait_for(lambda: editor.table().lines == lines, f'{key} opens the menu of the cell', 3)
         editor.save()
         self.assertEqual(self.saved().records('InitList')[:4],

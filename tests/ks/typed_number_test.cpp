@@ -41,14 +41,30 @@ TEST_F(TypedNumber, AnAmountIsStoredInTheBaseUnitWithoutStrayDigits)
         double expected;
     };
     const Case cases[] = {
-        {WaterLevel, "12 ft", 3.6576},       {WaterLevel, "12ft", 3.6576},    {WaterLevel, "12 FT", 3.6576},
-        {Chainage, "1.5 km", 1500},          {Chainage, "3 mi", 4828.032},    {Chainage, "2.5e3 mm", 2.5},
-        {Discharge, "350 l/s", 0.35},        {Discharge, "3.5 m3/s", 3.5},    {Discharge, "3.5 m³/s", 3.5},
-        {Discharge, "45 cfs", 1.27425809664}, {Discharge, "36 m3/h", 0.01},   {Discharge, "-1 ft³/s", -0.028316846592},
-        {Velocity, "36 km/h", 10},           {Area, "2 ha", 20000},           {Factor, "5 %", 0.05},
-        {LightAttenuation, "2 1/cm", 200},   {LightAttenuation, "2 /cm", 200}, {Rotation, "30°", 30},
-        {Viscosity, "1.3 mm2/s", 1.3e-6},    {Discharge, "0.1 M3/S", 0.1},     {Chainage, "5 NMI", 9260},
-        {Volume, "2 hm3", 2e6},              {Discharge, "100 gal/min", 0.00630901964}, {Rotation, "2 deg", 2},
+        {WaterLevel, "12 ft", 3.6576},
+        {WaterLevel, "12ft", 3.6576},
+        {WaterLevel, "12 FT", 3.6576},
+        {Chainage, "1.5 km", 1500},
+        {Chainage, "3 mi", 4828.032},
+        {Chainage, "2.5e3 mm", 2.5},
+        {Discharge, "350 l/s", 0.35},
+        {Discharge, "3.5 m3/s", 3.5},
+        {Discharge, "3.5 m³/s", 3.5},
+        {Discharge, "45 cfs", 1.27425809664},
+        {Discharge, "36 m3/h", 0.01},
+        {Discharge, "-1 ft³/s", -0.028316846592},
+        {Velocity, "36 km/h", 10},
+        {Area, "2 ha", 20000},
+        {Factor, "5 %", 0.05},
+        {LightAttenuation, "2 1/cm", 200},
+        {LightAttenuation, "2 /cm", 200},
+        {Rotation, "30°", 30},
+        {Viscosity, "1.3 mm2/s", 1.3e-6},
+        {Discharge, "0.1 M3/S", 0.1},
+        {Chainage, "5 NMI", 9260},
+        {Volume, "2 hm3", 2e6},
+        {Discharge, "100 gal/min", 0.00630901964},
+        {Rotation, "2 deg", 2},
     };
     for (const Case& each : cases)
         EXPECT_DOUBLE_EQ(Read(each.group, each.text), each.expected) << each.text;
@@ -84,6 +100,17 @@ TEST_F(TypedNumber, EveryUnitThatIsOfferedIsTaken)
     EXPECT_GT(offered, 50);
 }
 
+TEST_F(TypedNumber, TheUnitOfAFieldIsTakenAsAKeyboardWritesIt)
+{
+    const auto read = [](const char* text) {
+        return KsReadTyped(QString::fromUtf8(text), CKsEditStyle(UnitGroup::None), QStringLiteral(u"m¹⁄³/s"));
+    };
+    for (const char* text : {"30 m¹⁄³/s", "30 m^(1/3)/s", "30 m^1/3/s", "30 m1/3/s"})
+        EXPECT_EQ(read(text).value, 30) << text;
+    for (const char* text : {"30 m/s", "30 s/m^(1/3)", "30 m^(1/2)/s"})
+        EXPECT_FALSE(read(text).value) << text;
+}
+
 TEST_F(TypedNumber, WhatIsNoAmountIsRefused)
 {
     using enum UnitGroup;
@@ -97,8 +124,9 @@ TEST_F(TypedNumber, WhatIsNoAmountIsRefused)
         EXPECT_EQ(Complaint(WaterLevel, text), "") << text;
     EXPECT_EQ(Complaint(Volume, "5 Mm3"), "");
     // What is no unit at all has the words of the field.
-    for (const char* text : {"12 5", "12 -5", "12 m 5", "12 m.5", "12 m @ 5", "12 m from 1", "12 (m)", " 12 m", "12,5 m",
-                             "12 abcdef", "12e", "12e m", "1.e5 m", "m", "ft 12", "", "12 ", "1.", "1_m", "0x10", "12 m5x"})
+    for (const char* text : {"12 5",  "12 -5",  "12 m 5",    "12 m.5", "12 m @ 5", "12 m from 1", "12 (m)",
+                             " 12 m", "12,5 m", "12 abcdef", "12e",    "12e m",    "1.e5 m",      "m",
+                             "ft 12", "",       "12 ",       "1.",     "1_m",      "0x10",        "12 m5x"})
         EXPECT_EQ(Complaint(WaterLevel, text), "") << text;
     EXPECT_EQ(Complaint(WaterLevel, "1e308 km"), "") << "too large for a number";
 }

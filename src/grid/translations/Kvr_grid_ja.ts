@@ -170,19 +170,19 @@
         <translation>前のセル</translation>
     </message>
     <message>
-        <source>Insert line</source>
+        <source>Insert Line</source>
         <translation>行の挿入</translation>
     </message>
     <message>
-        <source>Copy, then insert line</source>
+        <source>Copy, Then Insert Line</source>
         <translation>コピーして行を挿入</translation>
     </message>
     <message>
-        <source>Paste, then insert line</source>
+        <source>Paste, Then Insert Line</source>
         <translation>貼り付けて行を挿入</translation>
     </message>
     <message>
-        <source>Delete selected lines</source>
+        <source>Delete Selected Lines</source>
         <translation>選択した行の削除</translation>
     </message>
     <message>

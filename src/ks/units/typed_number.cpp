@@ -39,9 +39,20 @@ KsTyped<double> ReadFormula(const CString& text)
     return {value};
 }
 
+/// Whether it is the field's own: its powers that are fractions can be typed, too, as "m^(1/3)/s" or "m1/3/s".
+bool IsOwn(const CString& unit, const CString& symbol)
+{
+    constexpr QChar fraction(0x2044); // ⁄
+    const auto typed = [](const CString& text) {
+        CString plain = text.normalized(CString::NormalizationForm_KC).replace(fraction, u'/');
+        return plain.remove(u'^').remove(u'(').remove(u')');
+    };
+    return !symbol.isEmpty() && (unit == symbol || (symbol.contains(fraction) && typed(unit) == typed(symbol)));
+}
+
 KsTyped<double> ReadAmount(double number, const CString& unit, const CKsEditStyle& style, const CString& symbol)
 {
-    if (!symbol.isEmpty() && unit == symbol)
+    if (IsOwn(unit, symbol))
         return {style.UnitConvertFromBase(number, 0)}; // as without it, to the last bit
     if (const auto factor = KsTypedUnitFactor(style.Group(), unit)) {
         const double value = double(number * *factor);
