@@ -28,6 +28,14 @@ struct Words
     QString one, many;
 };
 
+/// Why cells stay as they were, where all that are listed have one reason.
+QString ReasonOf(const std::vector<CCellResults::Cell>& kept)
+{
+    const auto isAsFirst = [&kept](const CCellResults::Cell& cell) { return cell.after == kept.front().after; };
+    return !kept.empty() && std::ranges::all_of(kept, isAsFirst) ? QStringLiteral(": ") + kept.front().after
+                                                                 : QString();
+}
+
 void Make(CGenGrid& grid, CCellResults results, const QString& step, const Words& words)
 {
     CGridModel& model = *grid.Model();
@@ -36,11 +44,12 @@ void Make(CGenGrid& grid, CCellResults results, const QString& step, const Words
         return;
     }
     const std::size_t changed = results.ChangedCount(), kept = results.KeptCount();
+    const QString reason = ReasonOf(results.Kept());
     model.ChangeCells(step, results.FirstRow(), results.TakeChanges());
     QString said = GridTexts::Counted(changed, words.one, words.many);
     if (kept > 0)
         said += QStringLiteral("; ") +
-                GridTexts::Counted(kept, GridTexts::tr("1 stays as it was"), GridTexts::tr("%1 stay as they were"));
+                GridTexts::Counted(kept, GridTexts::tr("1 stays as it was"), GridTexts::tr("%1 stay as they were")) + reason;
     model.Document()->Say(said);
     if (grid.Host())
         grid.Host()->LineEdited(grid); // the project is told of what locations hold now
@@ -84,7 +93,7 @@ bool CanRunOnCells(const CGenGrid& grid, GridAction action)
         return grid.Host() && grid.Host()->CanSearch(grid) && block.right > 1 && block.bottom > block.top &&
                has([](const ColumnSpec& column) { return column.Kind() == CellKind::Number; });
     case GridAction::ResetToGlobal:
-        return has([](const ColumnSpec& column) { return bool(column.fill); });
+        return has([](const ColumnSpec& column) { return bool(column.Global()); });
     case GridAction::RevertToSaved:
         return model.Saved().MayDiffer();
     case GridAction::Replace:

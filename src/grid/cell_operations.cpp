@@ -66,8 +66,8 @@ CCellResults ResetToGlobal(const CTableRows& rows, const CellBlock& block)
 {
     CCellResults results(rows, block);
     ForCells(rows, block, [&](int row, int column) {
-        if (const ColumnSpec& spec = rows.Column(column); spec.fill && row >= rows.FixedRows())
-            results.Add(row, column, rows.Value(row, column), spec.GlobalValue());
+        if (const GlobalPlace global = rows.Column(column).Global(); global && row >= rows.FixedRows())
+            results.Add(row, column, rows.Value(row, column), global.Value());
     });
     return results;
 }
@@ -76,6 +76,9 @@ CCellResults RevertToSaved(const CTableRows& rows, const CSavedLines& saved, con
 {
     CCellResults results(rows, block);
     const int last = std::min(block.bottom, rows.StoredRows() - 1);
+    for (int row = block.top; row < rows.FixedRows(); ++row)
+        for (int column = block.left; column <= block.right; ++column)
+            results.Keep(row, column, GridTexts::tr("Only lines can be reverted; global values can be undone."));
     for (int row = std::max(block.top, rows.FixedRows()); row <= last; ++row) {
         const CSavedLines::Line line = saved.Find(row);
         for (int column = block.left; column <= block.right; ++column) {

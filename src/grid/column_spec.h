@@ -107,6 +107,17 @@ enum class LocationValue
     Width   // of the channel
 };
 
+/// A global value of the document, in whose place a cell stands: a number, or the index of a choice.
+struct GlobalPlace
+{
+    const double* number = nullptr;
+    const std::int32_t* index = nullptr;
+
+    explicit operator bool() const { return number || index; }
+    const void* Address() const { return number ? static_cast<const void*>(number) : index; }
+    CellValue Value() const { return number ? CellValue(*number) : CellValue(*index); }
+};
+
 struct ColumnSpec
 {
     // What a table says about its column, where that is not what the field says; see field_columns.h.
@@ -114,6 +125,7 @@ struct ColumnSpec
     int width = 72;               // pixels at the original font size; the grid scales it
     bool asFormatted = false;     // a number stands with six decimals, not with the control's
     const double* fill = nullptr; // enters new lines, and blank cells when the page is left; as it is, not converted
+    GlobalPlace global = {};      // what the cells of lines stand in for, where nothing fills them
     bool emptyIsNotGiven = false; // an empty cell is stored as the mark for "not given", and the mark shows as empty
     std::function<bool(const void* row)> locked = {}; // the cell of this row cannot be edited
     Choices choices = {};                             // of a drop-down column
@@ -140,8 +152,8 @@ struct ColumnSpec
     /// The cells have no editor: a click or the space bar acts at once.
     bool ActsAtOnce() const { return Kind() == CellKind::Flag || Kind() == CellKind::Button; }
     bool IsLocked(const void* row) const { return locked && locked(row); }
-    /// The global value that a cell of a line stands in for.
-    CellValue GlobalValue() const { return *fill; }
+    /// The global value that a cell of a line stands in for; what fills new lines is one.
+    GlobalPlace Global() const { return fill ? GlobalPlace{.number = fill} : global; }
     /// `fill` as the stored value that a cell with that text has.
     CellValue FillValue() const { return style.UnitConvertFromBase(*fill, 0); }
     /// What an emptied cell is stored as when nothing fills it.

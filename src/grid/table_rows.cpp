@@ -156,13 +156,14 @@ bool CTableRows::HidesDigits(int row, int column) const
 bool CTableRows::IsGlobalValue(int row, int column) const
 {
     const ColumnSpec& spec = Column(column);
-    return spec.fill && row >= FixedRows() && IsRow(row) && SameCell(Value(row, column), spec.GlobalValue());
+    const GlobalPlace global = spec.Global();
+    return global && row >= FixedRows() && IsRow(row) && SameCell(Value(row, column), global.Value());
 }
 
 std::size_t CTableRows::OverrideCount(int column) const
 {
     const ColumnSpec& spec = Column(column);
-    const CellValue global = spec.GlobalValue();
+    const CellValue global = spec.Global().Value();
     std::size_t count = 0;
     for (std::size_t row = m_rows->FixedRows(); row < m_rows->Count(); ++row)
         count += !SameCell(spec.access->get(m_rows->At(row)), global);

@@ -20,6 +20,7 @@
 #include <QTreeWidget>
 #include <QVBoxLayout>
 #include <algorithm>
+#include <map>
 #include <memory>
 
 namespace {
@@ -38,7 +39,7 @@ public:
     std::vector<FoundField> Make()
     {
         for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
-            Add({tab, {}, Plain(m_sheet.tabText(tab)), {}, {}, {}}, {m_sheet.CaptionOf(tab)},
+            Add({.tab = tab, .title = Plain(m_sheet.tabText(tab))}, NamesOf(m_sheet.CaptionOf(tab)),
                 TextsOn(*m_sheet.PageAt(tab)));
         for (const DeclaredSection& section : HDGlobals().Sections())
             for (const DeclaredKeyword& keyword : section.keywords)
@@ -49,10 +50,19 @@ public:
             if (section.ListCount() > 0)
                 AddList(entry.section, section.ListAt(0));
         }
+        for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
+            for (const CGenGrid* grid : m_sheet.PageAt(tab)->findChildren<CGenGrid*>())
+                AddTable(tab, *grid);
         return std::move(m_fields);
     }
 
 private:
+    struct ListOf
+    {
+        QString keyword;
+        const CGenList* list = nullptr;
+    };
+
     int TabOf(const ChangePlace& place) const
     {
         int tab = 0;
@@ -74,15 +84,25 @@ private:
         return texts.join(u'\n');
     }
 
-    void Add(FoundField field, const TextLine& title, const QString& names, const TextLine& choices = {})
+    /// Line by line.
+    static QStringList NamesOf(const TextLine& line)
+    {
+        QStringList names;
+        for (const QString& text : line ? InAllLanguages(line) : QStringList())
+            names << Plain(text);
+        return names;
+    }
+
+    /// `further` is what it can be looked for by, too.
+    void Add(FoundField field, QStringList names, const QString& further = {})
     {
         field.page = Plain(m_sheet.tabText(field.tab));
-        QStringList words{field.title, names, field.keyword, field.page};
-        for (const TextLine& line : {title, choices, TextLine(m_sheet.CaptionOf(field.tab))})
-            for (const QString& text : line ? InAllLanguages(line) : QStringList())
-                words << Plain(text);
-        words.removeDuplicates();
-        field.words = words.join(u'\n').toCaseFolded();
+        names << field.title << field.keyword;
+        names.removeAll(QString());
+        names.removeDuplicates();
+        field.names = names.join(u'\n').toCaseFolded();
+        const QStringList page = NamesOf(m_sheet.CaptionOf(field.tab));
+        field.words = (names + page << field.page << further).join(u'\n').toCaseFolded();
         m_fields.push_back(std::move(field));
     }
 
@@ -93,11 +113,23 @@ private:
         if (tab == m_sheet.PageCount())
             return; // no page edits it
         const QString name = QString::fromUtf8(field.name);
-        const QString title =
-            field.title     ? Plain(LoadLine(field.title.text, field.title.line))
-            : field.choices ? LoadLine(field.choices.text, field.choices.line).replace(u'\n', QStringLiteral(" / "))
-                            : name;
-        Add({tab, place, title, {}, QString::fromUtf8(keyword.name), {}}, field.title, name, field.choices);
+        QString title = name;
+        if (field.title)
+            title = Plain(LoadLine(field.title.text, field.title.line));
+        else if (field.choices)
+            title = Choices(LoadLine(field.choices.text, field.choices.line)).join(QStringLiteral(" / "));
+        QStringList names = NamesOf(field.title) << name;
+        for (const QString& choices : field.choices ? InAllLanguages(field.choices) : QStringList())
+            names << Choices(choices);
+        Add({.tab = tab, .place = place, .title = title, .keyword = QString::fromUtf8(keyword.name)}, names);
+    }
+
+    static QStringList Choices(const QString& lines)
+    {
+        QStringList choices;
+        for (const QString& line : lines.split(u'\n'))
+            choices << Plain(line);
+        return choices;
     }
 
     void AddList(const char* section, CGenList& list)
@@ -106,25 +138,40 @@ private:
         const int tab = TabOf(place);
         if (tab == m_sheet.PageCount())
             return;
-        Add({tab, place, Plain(m_sheet.tabText(tab)), {}, QString::fromUtf8(section), {}}, {}, {});
-        const CGenGrid* grid = m_sheet.PageAt(tab)->GetGrid();
-        for (const Field& field : list.Fields()) {
-            if (!field.title || !grid)
+        const QString keyword = QString::fromUtf8(section);
+        Add({.tab = tab, .place = place, .title = Plain(m_sheet.tabText(tab)), .keyword = keyword}, {});
+        if (const CGenGrid* grid = m_sheet.PageAt(tab)->GetGrid())
+            m_lists.emplace(grid, ListOf{keyword, &list});
+    }
+
+    /// Its columns; those of a table that a list keeps are in its section of the file.
+    void AddTable(int tab, const CGenGrid& grid)
+    {
+        const IRowSource* const rows = grid.Model()->Rows().get();
+        const auto known = m_lists.find(&grid);
+        const ListOf list = known == m_lists.end() ? ListOf() : known->second;
+        const auto& columns = grid.Model()->Columns();
+        for (std::size_t column = 0; column < columns.size(); ++column) {
+            const ColumnSpec& spec = columns[column];
+            const bool isPlace = list.list && spec.namesLine; // branch and chainage of every list
+            if (isPlace || spec.Kind() == CellKind::Button || spec.header().isEmpty())
                 continue;
-            const auto& columns = grid->Model()->Columns();
-            const auto column = std::ranges::find(columns, field.name, &ColumnSpec::name);
-            if (column == columns.end())
-                continue;
-            const QString title = column->header();
-            const ChangePlace cell{&list, 1, int(column - columns.begin()) + 1, &list, 1};
-            Add({tab, cell, Plain(title), {}, QString::fromUtf8(section), {}}, field.title,
-                QString::fromUtf8(field.name), field.choices);
+            FoundField field{.tab = tab, .title = Plain(spec.header()), .keyword = list.keyword};
+            if (rows) // without, there is no line yet that would have the table
+                field.place = {rows->Data(), 1, int(column) + 1, rows->List() ? rows->List() : rows->Data()};
+            QStringList choices = spec.choices.entries ? spec.choices.entries() : QStringList();
+            if (list.list)
+                for (const Field& declared : list.list->Fields())
+                    if (declared.choices && declared.name == spec.name)
+                        choices += InAllLanguages(declared.choices);
+            Add(field, spec.names ? spec.names() : QStringList(), choices.join(u'\n'));
         }
     }
 
     CDlgPropertySheet& m_sheet;
     CKavo0_hdDoc& m_document;
     std::vector<FoundField> m_fields;
+    std::map<const CGenGrid*, ListOf> m_lists; // of the tables of lists
 };
 
 class CFindFieldDlg : public QDialog
@@ -204,12 +251,10 @@ private:
 /// The lower the likelier that it is meant.
 int Rank(const FoundField& field, const QString& text)
 {
-    const QString title = field.title.toCaseFolded(), keyword = field.keyword.toCaseFolded();
-    if (title == text || keyword == text)
-        return 0;
-    if (title.startsWith(text) || keyword.startsWith(text))
-        return 1;
-    return title.contains(text) || keyword.contains(text) ? 2 : 3;
+    int rank = 3;
+    for (const QString& name : field.names.split(u'\n'))
+        rank = std::min(rank, name == text ? 0 : name.startsWith(text) ? 1 : name.contains(text) ? 2 : 3);
+    return rank;
 }
 
 } // namespace

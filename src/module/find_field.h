@@ -16,8 +16,10 @@ struct FoundField
 {
     int tab; // of the page
     ChangePlace place = {}; // nothing for the page itself
-    QString title, page, keyword;
-    QString words; // all that it may be looked for by, case folded
+    QString title = {}, page = {}, keyword = {};
+    // Case folded, a line each:
+    QString names = {}; // what it is called in any language, and in the file
+    QString words = {}; // all that it may be looked for by: the names, and those of its page
 };
 
 /// Everything that the sheet's pages edit; makes those that have not been made yet.

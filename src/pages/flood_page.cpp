@@ -17,7 +17,7 @@ public:
         Grid(m_ui.grid_1043)
             .BranchName({.width = 100})
             .Chainage({.width = 72})
-            .Value(&HD_Flood_resist::FloodPlainResistance);
+            .Value(&HD_Flood_resist::FloodPlainResistance, {.global = {.number = &Globals().G_flood_plan_res}});
     }
 };
 

@@ -21,10 +21,10 @@ public:
         Grid(m_ui.grid_1186)
             .BranchName({.width = 100})
             .Chainage({.width = 100})
-            .Value(&HDKlrInit::h1, {.width = 50})
-            .Value(&HDKlrInit::h0, {.width = 50})
-            .Value(&HDKlrInit::Q1, {.width = 50})
-            .Value(&HDKlrInit::Q0, {.width = 50});
+            .Value(&HDKlrInit::h1, {.width = 50, .global = {.number = &klr.h1}})
+            .Value(&HDKlrInit::h0, {.width = 50, .global = {.number = &klr.h0}})
+            .Value(&HDKlrInit::Q1, {.width = 50, .global = {.number = &klr.Q1}})
+            .Value(&HDKlrInit::Q0, {.width = 50, .global = {.number = &klr.Q0}});
     }
 };
 

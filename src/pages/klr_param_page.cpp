@@ -27,8 +27,8 @@ public:
         Grid(m_ui.grid_1186)
             .BranchName({.width = 100})
             .Chainage({.width = 100})
-            .Value(&HDKlrParam::R1, {.width = 50})
-            .Value(&HDKlrParam::R2, {.width = 50});
+            .Value(&HDKlrParam::R1, {.width = 50, .global = {.number = &klr.R1}})
+            .Value(&HDKlrParam::R2, {.width = 50, .global = {.number = &klr.R2}});
     }
 };
 

@@ -22,7 +22,7 @@ public:
         Grid(m_ui.grid_1186)
             .BranchName({.width = 100})
             .Chainage({.width = 72})
-            .Value(&HDLeakage::LeakageCoefficient, {.width = 82});
+            .Value(&HDLeakage::LeakageCoefficient, {.width = 82, .global = {.number = &leakage.LeakageCoefficient}});
     }
 };
 

@@ -19,7 +19,9 @@ public:
             .Chainage({.header = LineOf(Str::UpstreamChainage)})
             .Value(&HD_Wavetype::DownstreamChainage, {.emptyIsNotGiven = true})
             .Value(&HD_Wavetype::WaveApproximation,
-                   {.width = 150, .choices = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
+                   {.width = 150,
+                    .global = {.index = &Globals().G_wave},
+                    .choices = {.inNewLines = FullyDynamic, .whenEmptied = KinematicWave}});
     }
 };
 

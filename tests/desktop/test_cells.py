@@ -70,3 +70,18 @@ class WayToAField(Case):
         self.assertEqual(editor.current_page(), 'Bed Resist.')
         editor.save()
         self.assertEqual(self.saved().value('theta'), '0.75')
+
+    def test_to_columns_and_dates(self):
+        editor = self.open()
+        for words, page in (('initial q', 'Initial'), ('target level', 'Encroachment'), ('storing', 'Maps'),
+                            ('width/depth', 'Mixing Coef.'), ('limited output period', 'Time Series Output'),
+                            ('initial q', 'Initial')):
+            editor.press('ctrl+k')
+            editor.box()
+            editor.type(words)
+            editor.press('Return')
+            editor.settle(0.4)
+            self.assertEqual(editor.current_page(), page)
+        editor.type('7.25')
+        editor.save()
+        self.assertEqual(self.saved().records('InitList')[0].split(', ')[-1], '7.25')

@@ -414,7 +414,8 @@ TEST_F(ViewTest, FieldsAreFoundByAnyOfTheirNames)
     const std::vector<FoundField> fields = FieldsOf(*view->Sheet(), *view->GetDocument());
     for (const FoundField& field : fields) {
         EXPECT_FALSE(field.title.isEmpty() || field.page.isEmpty()) << field.keyword.toStdString();
-        EXPECT_TRUE(!field.place.data || view->Sheet()->PageAt(field.tab)->Shows(field.place)) << field.title.toStdString();
+        EXPECT_TRUE(!field.place.data || view->Sheet()->PageAt(field.tab)->Shows(field.place))
+            << field.title.toStdString();
     }
     EXPECT_GT(fields.size(), 150u);
     const auto first = [&](const QString& text) {
@@ -427,6 +428,13 @@ TEST_F(ViewTest, FieldsAreFoundByAnyOfTheirNames)
     EXPECT_EQ(first("初期条件"), first("initial")) << "in a program in English";
     EXPECT_EQ(first("WindList"), "Wind|WindList");
     EXPECT_EQ(first("no such thing"), "");
+    EXPECT_EQ(first("流量"), "Discharge|G_discharge") << "its whole name, in another language";
+    EXPECT_EQ(first("water depth"), "Water Level / Water Depth|iLevelDepth");
+    // Dates, files, and columns of tables that are no lists of locations, or that no line has yet.
+    for (const char* text :
+         {"X Orig.", "Storing frequency", "Target level", "Width/depth", "Interpolate", "Default name", "End"})
+        EXPECT_EQ(first(text).section(u'|', 0, 0), text);
+    EXPECT_EQ(first("help grid"), "Help grid|GeoDb");
 
     // Ctrl+K as the menu has it: what is chosen is in front and has the focus.
     QTimer::singleShot(0, view, [] {

@@ -2,6 +2,7 @@
 #include "page_fixture.h"
 
 #include "data/hd_file.h"
+#include "grid/cell_operations.h"
 #include "ks/units/edit_fields.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/page_table.h"
@@ -10,6 +11,7 @@
 #include <QFile>
 #include <QGroupBox>
 #include <QTemporaryDir>
+#include <map>
 #include <set>
 
 namespace {
@@ -70,6 +72,38 @@ TEST_F(CorePagesTest, EveryTabIsThereOnceAndSaysSomethingElse)
     });
     EXPECT_EQ(*tabs.begin(), 1);
     EXPECT_EQ(*tabs.rbegin(), int(tabs.size()));
+}
+
+TEST_F(CorePagesTest, CellsOfAColumnWithAGlobalValueSaySoAndAreResetToIt)
+{
+    std::map<QString, int> columns; // with a global value, by page
+    OnEveryPage([&](CGenPropertyPage& page) {
+        CGridModel* model = grid ? grid->Model() : nullptr;
+        for (int column = 0; model && column < model->columnCount(); ++column) {
+            const ColumnSpec& spec = model->Column(column);
+            if (!spec.Global())
+                continue;
+            ++columns[page.objectName()];
+            SCOPED_TRACE(spec.header().toStdString());
+            const QModelIndex cell = model->index(model->FixedRows(), column);
+            const auto standsBack = [&cell] { return cell.data(Qt::ForegroundRole).isValid(); };
+            CCellResults results = ResetToGlobal(*model, {cell.row(), column, cell.row(), column});
+            model->ChangeCells("step", results.FirstRow(), results.TakeChanges());
+            if (!model->IsLocked(cell.row(), column)) {
+                EXPECT_TRUE(SameCell(model->Value(cell.row(), column), spec.Global().Value()));
+                EXPECT_TRUE(standsBack());
+            }
+            QString told; // by the field of the global value
+            for (const QWidget* field : page.findChildren<QWidget*>())
+                told += page.OverridesText(*field);
+            EXPECT_TRUE(told.contains("Lines with another value")) << told.toStdString();
+        }
+    });
+    const std::map<QString, int> expected = {{"CInitPage", 2},       {"CWindPage", 1},      {"CBedPage", 4},
+                                             {"CBedToolboxPage", 4}, {"CWavePage", 1},      {"CQuasiPage", 2},
+                                             {"CFloodPage", 1},      {"CLeakagePage", 1},   {"CKlrParamPage", 2},
+                                             {"CKlrInitPage", 4},    {"CMixingCoefPage", 4}};
+    EXPECT_EQ(columns, expected);
 }
 
 TEST_F(CorePagesTest, VisitingChangesNothing)

@@ -69,8 +69,8 @@ TEST_F(InitPageTest, WhatIsTheGlobalValueStandsBackAndTheOthersAreCounted)
     const auto overrides = [this](const char* field) {
         return view->page->OverridesText(*Find<CCtrlEdit>(field)).toStdString();
     };
-    EXPECT_EQ(overrides("levelOrDepth_1001"), "1 of 3 lines have another value");
-    EXPECT_EQ(overrides("discharge_1002"), "3 of 3 lines have another value");
+    EXPECT_EQ(overrides("levelOrDepth_1001"), "Lines with another value: 1 of 3");
+    EXPECT_EQ(overrides("discharge_1002"), "Lines with another value: 3 of 3");
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
     EXPECT_TRUE(standsBack(1, 3)) << "it is the same level in feet";
     grid->SetCurrentCell(2, 3);

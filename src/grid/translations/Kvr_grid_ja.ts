@@ -1165,5 +1165,9 @@
         <source>%1 lines are hidden by the filter.</source>
         <translation>フィルターで非表示の行が %1 行あります。</translation>
     </message>
+    <message>
+        <source>Only lines can be reverted; global values can be undone.</source>
+        <translation>保存時の値に戻せるのは行だけです。全体値は元に戻す操作で戻せます。</translation>
+    </message>
 </context>
 </TS>

@@ -273,10 +273,10 @@ QString CGenPropertyPage::OverridesText(const QWidget& field) const
     for (const CGenGrid* grid : m_grids) {
         const CGridModel& model = *grid->Model();
         for (int column = 0; model.Rows() && column < model.columnCount(); ++column) {
-            const double* const global = model.Column(column).fill;
-            if (!global || m_bindings.ControlFor(global) != &field || model.LineCount() == 0)
+            const GlobalPlace global = model.Column(column).Global();
+            if (!global || m_bindings.ControlFor(global.Address()) != &field || model.LineCount() == 0)
                 continue;
-            return tr("%1 of %2 lines have another value").arg(model.OverrideCount(column)).arg(model.LineCount());
+            return tr("Lines with another value: %1 of %2").arg(model.OverrideCount(column)).arg(model.LineCount());
         }
     }
     return {};

@@ -154,8 +154,8 @@
 <context>
     <name>CGenPropertyPage</name>
     <message>
-        <source>%1 of %2 lines have another value</source>
-        <translation>%2 行中 %1 行が別の値です</translation>
+        <source>Lines with another value: %1 of %2</source>
+        <translation>別の値の行: %2 行中 %1 行</translation>
     </message>
 </context>
 <context>
