@@ -34,7 +34,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {EditMenu, "actionCopy", QT_TR_NOOP("&Copy"), QT_TR_NOOP("Copies the selection to the clipboard"), [](F& f) { f.Edit().Run(KsCommand::Copy); }, K::Copy, nullptr, ShownOnly},
         {EditMenu, "actionPaste", QT_TR_NOOP("&Paste"), QT_TR_NOOP("Puts in what is on the clipboard"), [](F& f) { f.Edit().Run(KsCommand::Paste); }, K::Paste, nullptr, ShownOnly},
         {EditMenu},
-        {EditMenu, "actionFindField", QT_TR_NOOP("&Go to Field..."), QT_TR_NOOP("Leads to a field or a page by its name or its keyword"), [](F& f) { f.SendCommand(KsCommand::FindField); }, K::UnknownKey, nullptr, false, "Ctrl+K"},
+        {EditMenu, "actionFindField", QT_TR_NOOP("&Go to Field..."), QT_TR_NOOP("Leads to a field or a page by its name or its keyword"), [](F& f) { f.SendToNearest(KsCommand::FindField); }, K::UnknownKey, nullptr, false, "Ctrl+K"},
         {ViewMenu, "actionUnits", QT_TR_NOOP("&Units"), QT_TR_NOOP("Units in which values are shown; files are not affected")},
         {ViewMenu, "actionAllDigits", QT_TR_NOOP("All &Digits"), QT_TR_NOOP("Shows every digit of the numbers in tables and fields"), [](F&) { KsUnits::Instance().SetAllDigits(!KsUnits::Instance().AllDigits()); }},
         {ViewMenu, "actionLanguage", QT_TR_NOOP("&Language"), QT_TR_NOOP("Language of the program")},

@@ -181,8 +181,7 @@ void CFrameMenus::Update()
     Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);
     m_actions.at(QStringLiteral("actionLanguage_") + KsLanguage::Instance().Current())->setChecked(true);
     Action("actionContents")->setVisible(HasHelp(m_frame));
-    const auto* view = dynamic_cast<CCommandTarget*>(m_frame.GetActiveView());
-    Action("actionFindField")->setEnabled(view && view->IsCommandEnabled(KsCommand::FindField));
+    Action("actionFindField")->setEnabled(m_frame.HasCommand(KsCommand::FindField));
 }
 
 void CFrameMenus::UpdateEdit()

@@ -71,6 +71,19 @@ class WayToAField(Case):
         editor.save()
         self.assertEqual(self.saved().value('theta'), '0.75')
 
+    def test_from_another_editor(self):
+        editor = self.open_project()
+        editor.put(1, 2, '1500', leave='Return', table=editor.table('Radius and width'))
+        editor.press('ctrl+k')
+        editor.box()
+        editor.type('theta')
+        editor.press('Return')
+        editor.settle(0.4)
+        self.assertEqual(editor.current_page(), 'Default Values')
+        editor.type('0.75')
+        editor.save()
+        self.assertEqual(self.saved().value('theta'), '0.75')
+
     def test_to_columns_and_dates(self):
         editor = self.open()
         for words, page in (('initial q', 'Initial'), ('target level', 'Encroachment'), ('storing', 'Maps'),

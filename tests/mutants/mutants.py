@@ -115,7 +115,7 @@ MUTANTS = [
     ('pages', 'grid/find_replace.cpp', 'cell.compare(text, letters) == 0', 'cell.contains(text, letters)'),
     ('pages', 'grid/grid_state.cpp', 'state[Columns].toInt() != grid.ColumnCount()', 'false'),
     ('pages', 'grid/grid_clipboard.cpp', 'HasHeadersInOrder(rows, copied.texts, start.column);', 'false;'),
-    ('pages', 'grid/table_rows.cpp', 'spec.fill && row >= FixedRows()', 'spec.fill && row > FixedRows()'),
+    ('pages', 'grid/table_rows.cpp', 'global && row >= FixedRows()', 'global && row > FixedRows()'),
     # Document and pages.
     ('document', 'document/purged_lines.cpp', 'while (all.size() < lines.rows[i])',
      'while (all.size() + 1 < lines.rows[i])'),

@@ -8,6 +8,7 @@
 #include <QXmlStreamReader>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <ostream>
 #include <map>
 
 using testing::IsEmpty;
@@ -19,6 +20,9 @@ struct Module
 {
     std::string name;
     QStringList files, folders;
+
+    /// In the lists of tests.
+    friend std::ostream& operator<<(std::ostream& out, const Module& module) { return out << module.name; }
 };
 
 std::vector<Module> Modules()

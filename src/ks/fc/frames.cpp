@@ -299,6 +299,27 @@ bool CKsMDIFrameWnd::SendCommand(int id)
     return target && target->IsCommandEnabled(id) && m_activeView->MayLeave(KsLeave::Field) && target->OnCommand(id);
 }
 
+QMdiSubWindow* CKsMDIFrameWnd::NearestWith(int id) const
+{
+    const auto windows = m_area->subWindowList(QMdiArea::ActivationHistoryOrder);
+    for (auto window = windows.rbegin(); window != windows.rend(); ++window) {
+        const auto* child = qobject_cast<CKsMDIChildWnd*>(*window);
+        CView* view = child && !child->IsClosing() ? child->GetActiveView() : nullptr;
+        if (const auto* target = dynamic_cast<CCommandTarget*>(view); target && target->IsCommandEnabled(id))
+            return *window;
+    }
+    return nullptr;
+}
+
+bool CKsMDIFrameWnd::SendToNearest(int id)
+{
+    QMdiSubWindow* window = NearestWith(id);
+    if (!window || (m_activeView && !m_activeView->MayLeave(KsLeave::Field)))
+        return false;
+    m_area->setActiveSubWindow(window);
+    return SendCommand(id);
+}
+
 void CKsMDIFrameWnd::ActiveViewChanged(CView*) {}
 
 void CKsMDIFrameWnd::SubWindowActivated()

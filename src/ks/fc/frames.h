@@ -120,6 +120,11 @@ public:
     bool MayLeave();
     /// Sends a command to the active view; false when there is none or it cannot do it now.
     bool SendCommand(int id);
+    /// Likewise; where the active view has no such command, the window that was active last and has it comes to the
+    /// front.
+    bool SendToNearest(int id);
+    /// Whether SendToNearest finds anybody.
+    bool HasCommand(int id) const { return NearestWith(id); }
     /// Shows a text in the status bar until another takes its place. The tips of menus and buttons cover it only while
     /// they are looked at.
     void TellStatus(const CString& text);
@@ -137,6 +142,7 @@ protected:
     void DestroyWindows();
 
 private:
+    QMdiSubWindow* NearestWith(int id) const;
     bool LeavesView(const QWidget* clicked) const;
     void SubWindowActivated();
     CKsMDIArea* m_area;
