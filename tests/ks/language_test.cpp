@@ -50,6 +50,7 @@ TEST_F(Language, ModulesFollowTheLanguageAndWindowsHearOfIt)
     QCoreApplication::processEvents();
     EXPECT_EQ(Tip(), "単位: m");
     EXPECT_EQ(QCoreApplication::translate("QPlatformTheme", "Cancel"), "キャンセル") << "Qt's own texts too";
+    EXPECT_EQ(QCoreApplication::translate("QShortcut", "Backspace"), "Backspace") << "which Qt's misspell";
     EXPECT_EQ(changed.count(), 1);
     EXPECT_GE(window.heard, 1);
     EXPECT_TRUE(KsLangLoadResDll("ks", &handle, 0)) << "loading again gives the one that is there";

@@ -565,6 +565,13 @@ Used instead</source>
     </message>
 </context>
 <context>
+    <name>QShortcut</name>
+    <message>
+        <source>Backspace</source>
+        <translation>Backspace</translation>
+    </message>
+</context>
+<context>
     <name>SyntaxError</name>
     <message>
         <source>%1 cannot be read: %2</source>

@@ -45,6 +45,9 @@ bool Install(KsResourceModule& module)
     return false;
 }
 
+/// Of the toolkit, whose Japanese misspells it.
+[[maybe_unused]] constexpr const char* Misspelt = QT_TRANSLATE_NOOP("QShortcut", "Backspace");
+
 KsResourceModule& ModuleOf(const QString& name)
 {
     return Modules().try_emplace(name, KsResourceModule{name, nullptr}).first->second;
@@ -127,8 +130,10 @@ void KsLanguage::SetCurrent(const QString& code)
     if (code == m_current || !Available().contains(code))
         return;
     m_current = code;
-    ModuleOf(QStringLiteral("qtbase")); // the buttons of message boxes
+    KsResourceModule& toolkit = ModuleOf(QStringLiteral("qtbase")); // the buttons of message boxes
+    Install(toolkit);                                               // first: what comes later goes before it
     for (auto& [name, module] : Modules())
-        Install(module);
+        if (&module != &toolkit)
+            Install(module);
     emit Changed();
 }
