@@ -96,6 +96,32 @@ std::optional<std::size_t> CPlacesInTable::Take(const QString& branch, double ch
     return row;
 }
 
+void CPlacedLines::Add(std::size_t line, const QString& branch, double chainage, bool hasFound)
+{
+    const auto number = m_branches.try_emplace(KsBranchKey(branch), int(m_branches.size())).first->second;
+    m_lines.push_back({number, chainage, line, hasFound});
+}
+
+std::vector<std::vector<std::size_t>> CPlacedLines::Crowds()
+{
+    std::ranges::stable_sort(m_lines, {}, [](const Line& line) { return std::pair(line.branch, line.chainage); });
+    const auto isElsewhere = [](const Line& a, const Line& b) {
+        return a.branch != b.branch || !(b.chainage - a.chainage < SamePlace);
+    };
+    std::vector<std::vector<std::size_t>> crowds;
+    for (auto first = m_lines.begin(); first != m_lines.end();) {
+        auto end = std::adjacent_find(first, m_lines.end(), isElsewhere);
+        end += end != m_lines.end();
+        if (end - first > 1 && !std::all_of(first, end, [](const Line& line) { return line.hasFound; })) {
+            auto& crowd = crowds.emplace_back();
+            for (; first != end; ++first)
+                crowd.push_back(first->line);
+        }
+        first = end;
+    }
+    return crowds;
+}
+
 QStringList BranchesIn(const CTableRows& rows)
 {
     QStringList branches;

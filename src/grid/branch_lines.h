@@ -46,5 +46,25 @@ private:
     std::unordered_map<QString, std::multimap<double, std::size_t>> m_rows; // by branch key
 };
 
+/// Lines that are to go to their places, each to one line there.
+class CPlacedLines
+{
+public:
+    void Add(std::size_t line, const QString& branch, double chainage, bool hasFound);
+    /// Those of one place, of which some have found no line there; place by place.
+    std::vector<std::vector<std::size_t>> Crowds();
+
+private:
+    struct Line
+    {
+        int branch;
+        double chainage;
+        std::size_t line;
+        bool hasFound;
+    };
+    std::unordered_map<QString, int> m_branches; // numbers, by branch key
+    std::vector<Line> m_lines;
+};
+
 /// New lines at these places, with what new lines hold besides; not in the source.
 std::unique_ptr<IRowBlock> LinesAt(const CTableRows& rows, const PlacesOfBranch& places);

@@ -120,8 +120,9 @@ QString CCellResults::RuleFault() const
             place.values.Add(cell == cells.end() ? m_rows->Value(row, column) : cell->second);
         }
     }
-    const auto fault = m_rows->Fault(all);
-    return fault ? GridTexts::tr("Line %1: %2")
-                       .arg(QString::number(m_rows->LineNumber(top + int(fault->row))), fault->text)
-                 : QString();
+    const auto faults = m_rows->Faults(all, 1);
+    return faults.empty()
+               ? QString()
+               : GridTexts::tr("Line %1: %2")
+                     .arg(QString::number(m_rows->LineNumber(top + int(faults.front().row))), faults.front().text);
 }

@@ -148,6 +148,7 @@ struct ColumnSpec
     std::shared_ptr<const CellAccess> access = {};
 
     CellKind Kind() const { return control.kind; }
+    bool NamesBranch() const { return namesLine && Kind() == CellKind::Text; }
     bool IsNumeric() const { return Kind() == CellKind::Number || Kind() == CellKind::Integer; }
     /// The cells have no editor: a click or the space bar acts at once.
     bool ActsAtOnce() const { return Kind() == CellKind::Flag || Kind() == CellKind::Button; }

@@ -34,6 +34,11 @@ std::unique_ptr<QMimeData> ToClipboard(const std::vector<QStringList>& texts,
     return content;
 }
 
+bool HasCells(const QMimeData& clipboard)
+{
+    return clipboard.hasText() && (!clipboard.text().isEmpty() || clipboard.hasFormat(Format));
+}
+
 std::shared_ptr<const QMimeData> HeldContent(const QMimeData& clipboard)
 {
     auto content = std::make_shared<QMimeData>();

@@ -25,6 +25,8 @@ struct CopiedTable
 std::unique_ptr<QMimeData> ToClipboard(const std::vector<QStringList>& texts,
                                        const std::vector<CopiedTable::Column>& columns,
                                        const std::vector<QStringList>& numbers);
+/// Whether there is anything to paste. One empty cell is something.
+bool HasCells(const QMimeData& clipboard);
 /// What is on the clipboard now, for as long as it is needed: other programs may change it.
 std::shared_ptr<const QMimeData> HeldContent(const QMimeData& clipboard);
 /// What does not fit the texts is left out.

@@ -106,3 +106,12 @@ QString PlainNumber(QStringView text, DecimalSign decimal)
     const QStringView unit = scan.Rest().trimmed();
     return unit.isEmpty() ? scan.Number() : scan.Number() + u' ' + unit.toString();
 }
+
+bool IsForeignNumber(QStringView text, DecimalSign decimal)
+{
+    CNumberScan scan(text.trimmed(), decimal);
+    if (!scan.Read())
+        return false;
+    const QStringView rest = scan.Rest().trimmed();
+    return rest.isEmpty() || !IsDigit(rest.front()); // "12 34"
+}

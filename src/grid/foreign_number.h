@@ -14,3 +14,5 @@ enum class DecimalSign
 /// stands behind it, a unit for example, after a blank. A text that begins with no such number comes back as it is.
 /// Between thousands there is one sign, everywhere the same, and groups of three digits.
 QString PlainNumber(QStringView text, DecimalSign decimal);
+/// Whether the text is such a number, with something behind it or not.
+bool IsForeignNumber(QStringView text, DecimalSign decimal);

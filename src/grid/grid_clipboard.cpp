@@ -84,7 +84,7 @@ void CopyCellsWithHeaders(const CGenGrid& grid)
 bool CanPasteCells(const CGenGrid& grid)
 {
     const QMimeData* content = QGuiApplication::clipboard()->mimeData();
-    return content && content->hasText() && !content->text().isEmpty() && grid.Model()->Rows() &&
+    return content && HasCells(*content) && grid.Model()->Rows() &&
            (grid.currentIndex().isValid() || grid.RowCount() == 0);
 }
 
@@ -133,28 +133,70 @@ std::optional<PasteDecision> WithoutAsking(const CTableRows& rows, const PasteSt
     choice.hasHeaders = HasHeadersInOrder(rows, copied.texts, start.column);
     if (!choice.hasHeaders && SeemsToHaveHeaders(rows, copied.texts, start.column))
         return std::nullopt;
+    choice.hasUnits = choice.hasHeaders && SeemsToHaveUnits(copied.texts, rows, choice.columns);
+    const auto asShown = choice.columns;
+    if (choice.hasUnits)
+        TakeUnitLine(copied.texts, rows, choice.columns);
+    if (choice.columns != asShown)
+        return std::nullopt;
     CPastePlan plan(rows, copied, std::move(choice));
-    const bool isList = copied.texts.Lines() > 1 && plan.Columns() == 1; // one that may be a table all the same
-    if (!plan.IsClean() || (isList && SeparatorOf(start.read) == u';'))
+    const bool isOwn = !copied.columns.empty(); // whose cells are known
+    if (!plan.IsClean() || (!isOwn && plan.Columns() == 1 && SeemsDivided(start.read)))
         return std::nullopt;
     return DecisionOf(plan);
 }
 
-/// What was pasted is selected where it is one block, its beginning in sight.
+/// Where the lines are shown, if they stand there one below the other, and all of them.
+std::optional<std::pair<int, int>> ShownBlock(const CGridModel& model, const std::vector<std::size_t>& rows)
+{
+    std::vector<bool> isPasted(std::size_t(model.rowCount()));
+    int top = model.rowCount(), bottom = -1;
+    for (const std::size_t row : rows) {
+        const int shown = model.ShownRow(row);
+        if (shown < 0)
+            return std::nullopt;
+        isPasted[std::size_t(shown)] = true;
+        top = std::min(top, shown);
+        bottom = std::max(bottom, shown);
+    }
+    const bool isWhole =
+        std::find(isPasted.begin() + top, isPasted.begin() + bottom, false) == isPasted.begin() + bottom;
+    return isWhole ? std::optional(std::pair(top, bottom)) : std::nullopt;
+}
+
+/// Brings the pasted columns into sight, the first ones rather than the last. Those that are frozen are.
+void ScrollToColumns(CGenGrid& grid, int row, const PastedCells& cells)
+{
+    std::vector<int> columns;
+    for (const PastedCells::Column& each : cells.columns)
+        if (!grid.Model()->Column(each.column).namesLine)
+            columns.push_back(each.column);
+    if (columns.empty())
+        return;
+    const auto [first, last] = std::ranges::minmax(columns);
+    grid.scrollTo(grid.Model()->index(row, last));
+    grid.scrollTo(grid.Model()->index(row, first));
+}
+
+/// What was pasted is selected where it is one block, its beginning in sight; elsewhere its first line that is shown is
+/// current.
 void ShowPasted(CGenGrid& grid, const PastedCells& cells)
 {
     const CGridModel& model = *grid.Model();
     const auto [left, right] = std::ranges::minmax(cells.columns, {}, &PastedCells::Column::column);
-    const int top = model.ShownRow(cells.rows.front()), bottom = model.ShownRow(cells.rows.back());
-    if (top < 0)
+    const auto block =
+        right.column - left.column + 1 == int(cells.columns.size()) ? ShownBlock(model, cells.rows) : std::nullopt;
+    const auto shown = std::ranges::find_if(cells.rows, [&model](std::size_t row) { return model.ShownRow(row) >= 0; });
+    if (shown == cells.rows.end())
         return;
-    const bool isBlock =
-        bottom - top + 1 == int(cells.rows.size()) && right.column - left.column + 1 == int(cells.columns.size());
-    if (isBlock && bottom == top && right.column == left.column)
-        return;
-    grid.SetCurrentCell(top + 1, left.column + 1);
-    if (isBlock)
-        grid.selectionModel()->select({model.index(top, left.column), model.index(bottom, right.column)},
+    const int top = block ? block->first : model.ShownRow(*shown);
+    const bool isCell = block && block->second == top && right.column == left.column;
+    if (!isCell) {
+        grid.SetCurrentCell(top + 1, left.column + 1);
+        ScrollToColumns(grid, top, cells);
+    }
+    if (block && !isCell)
+        grid.selectionModel()->select({model.index(top, left.column), model.index(block->second, right.column)},
                                       QItemSelectionModel::ClearAndSelect);
 }
 
@@ -162,10 +204,9 @@ QString Summary(const PasteDecision& decision)
 {
     QString done =
         GridTexts::Counted(decision.cellCount, GridTexts::tr("1 cell pasted"), GridTexts::tr("%1 cells pasted"));
-    if (decision.leftOut > 0)
-        done += QStringLiteral("; ") +
-                GridTexts::Counted(decision.leftOut, GridTexts::tr("1 left out"), GridTexts::tr("%1 left out"));
-    else if (decision.hasShorterLines)
+    if (!decision.leftOut.isEmpty())
+        done += QStringLiteral("; ") + GridTexts::tr("left out: %1").arg(decision.leftOut);
+    if (decision.hasShorterLines)
         done += GridTexts::tr("; shorter lines leave their other cells as they were");
     if (decision.hidden > 0)
         done +=

@@ -1,7 +1,12 @@
 // Cells of a grid on the clipboard, as a table (table_text.h).
 #pragma once
 
+#include "grid/grid_keys.h"
+
 class CGenGrid;
+
+/// Those that the Edit menu does not have anyway.
+inline constexpr GridAction ClipboardActions[] = {GridAction::CopyWithHeaders, GridAction::PasteWithPreview};
 
 bool CanCopyCells(const CGenGrid& grid);
 /// Puts the selected cells of a grid, or the current one, on the clipboard.

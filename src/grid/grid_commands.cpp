@@ -2,6 +2,7 @@
 
 #include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
+#include "grid/grid_clipboard.h"
 #include "grid/grid_texts.h"
 #include "grid/line_commands.h"
 #include "ks/fc/doc.h"
@@ -21,6 +22,11 @@ bool IsOfCells(GridAction action)
 {
     return std::ranges::find(CellActions, action) != std::end(CellActions) ||
            std::ranges::find(EmptyingActions, action) != std::end(EmptyingActions);
+}
+
+bool IsOfClipboard(GridAction action)
+{
+    return std::ranges::find(ClipboardActions, action) != std::end(ClipboardActions);
 }
 
 std::vector<CKsMenuCommand> MenuOf(const auto& actions)
@@ -47,6 +53,11 @@ std::vector<CKsMenuCommand> CGridCommands::LineMenu()
 std::vector<CKsMenuCommand> CGridCommands::CellMenu()
 {
     return MenuOf(CellActions);
+}
+
+std::vector<CKsMenuCommand> CGridCommands::ClipboardMenu()
+{
+    return MenuOf(ClipboardActions);
 }
 
 CKsMenuCommand CGridCommands::ClearEntry(const CGenGrid* grid)
@@ -85,7 +96,7 @@ bool CGridCommands::Knows(int command)
 
 bool CGridCommands::Knows(GridAction action)
 {
-    return IsOfLines(action) || IsOfCells(action);
+    return IsOfLines(action) || IsOfCells(action) || IsOfClipboard(action);
 }
 
 bool CGridCommands::CanRun(int command, const CGenGrid* grid)
@@ -95,6 +106,10 @@ bool CGridCommands::CanRun(int command, const CGenGrid* grid)
 
 bool CGridCommands::CanRun(GridAction action, const CGenGrid& grid)
 {
+    if (action == GridAction::CopyWithHeaders)
+        return CanCopyCells(grid);
+    if (action == GridAction::PasteWithPreview)
+        return CanPasteCells(grid) && !grid.Model()->Document()->IsReadOnly();
     return IsOfLines(action) ? CanRunOnLines(grid, action) : IsOfCells(action) && CanRunOnCells(grid, action);
 }
 
@@ -106,7 +121,11 @@ void CGridCommands::Run(int command, CGenGrid& grid)
 void CGridCommands::Run(GridAction action, CGenGrid& grid)
 {
     const bool moves = action == GridAction::MoveUp || action == GridAction::MoveDown;
-    if (CanRun(action, grid))
+    if (action == GridAction::CopyWithHeaders)
+        CopyCellsWithHeaders(grid);
+    else if (action == GridAction::PasteWithPreview)
+        PasteCellsWithPreview(grid);
+    else if (CanRun(action, grid))
         IsOfLines(action) ? RunOnLines(grid, action) : RunOnCells(grid, action);
     else if (grid.MayChange() && IsOfLines(action) && !moves && grid.Model()->Rows() && !grid.MayGrow())
         grid.Model()->Document()->Say(GridTexts::tr("Lines cannot be added to this table."));

@@ -12,6 +12,8 @@ public:
     /// For the menu of a view.
     static std::vector<CKsMenuCommand> LineMenu();
     static std::vector<CKsMenuCommand> CellMenu();
+    /// For the Edit menu, which has Cut, Copy and Paste.
+    static std::vector<CKsMenuCommand> ClipboardMenu();
     static CKsMenuCommand ClearEntry(const CGenGrid* grid);
     /// What a menu calls the action, with what it would be about now: "Clear 12 Cells". Null is for no grid.
     static QString TextFor(GridAction action, const CGenGrid* grid);

@@ -51,13 +51,8 @@ void CGridInput::Run(GridAction action)
         return;
     case GridAction::Copy:
         return CopyCells(m_grid);
-    case GridAction::CopyWithHeaders:
-        return CopyCellsWithHeaders(m_grid);
     case GridAction::Paste:
         PasteCells(m_grid);
-        return;
-    case GridAction::PasteWithPreview:
-        PasteCellsWithPreview(m_grid);
         return;
     case GridAction::OpenMenu: {
         QContextMenuEvent event(QContextMenuEvent::Keyboard, QPoint(), QPoint());

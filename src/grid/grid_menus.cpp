@@ -42,9 +42,9 @@ public:
         m_menu.addSeparator();
         Add(GridAction::Cut);
         Add(GridAction::Copy, m_copies);
-        Add(GridAction::CopyWithHeaders, m_copies);
+        Add(GridAction::CopyWithHeaders);
         Add(GridAction::Paste, m_pastes);
-        Add(GridAction::PasteWithPreview, m_pastes);
+        Add(GridAction::PasteWithPreview);
     }
     void AddLines()
     {

@@ -24,6 +24,7 @@ namespace {
 
 constexpr int TextWidth = 160; // for texts to be mended
 constexpr int MostWidth = 280; // of a column, in pixels
+const QString NoUnit = QStringLiteral("-");
 
 constexpr const char* SeparatorNames[] = {
     QT_TRANSLATE_NOOP("GridTexts", "Tab"), QT_TRANSLATE_NOOP("GridTexts", "Semicolon"),
@@ -35,6 +36,17 @@ QString ColumnName(const CopiedTable& copied, bool hasHeaders, int column)
     const QString header =
         hasHeaders && column < copied.texts.Width(0) ? copied.texts.At(0, column).toString().simplified() : QString();
     return header.isEmpty() ? GridTexts::tr("Column %1").arg(column + 1) : header;
+}
+
+/// "2 lines, 1 cell": what does not fit.
+QStringList Misfits(const CPastePlan& plan)
+{
+    QStringList texts;
+    if (const std::size_t lines = plan.LinesLeftOut(); lines > 0)
+        texts << GridTexts::Counted(lines, GridTexts::tr("1 line"), GridTexts::tr("%1 lines"));
+    if (const std::size_t cells = plan.CellsLeftOut(); cells > 0)
+        texts << GridTexts::Counted(cells, GridTexts::tr("1 cell"), GridTexts::tr("%1 cells"));
+    return texts;
 }
 
 class CPasteDlg : public QDialog
@@ -114,22 +126,35 @@ private:
         m_headers = new QCheckBox(GridTexts::tr("The first line na&mes the columns"));
         m_headers->setObjectName(QStringLiteral("headers"));
         form->addRow(m_headers);
+        m_units = new QCheckBox(GridTexts::tr("The line below has their &units"));
+        m_units->setObjectName(QStringLiteral("units"));
+        form->addRow(m_units);
+        m_form = form;
         connect(m_separator, &QComboBox::activated, this, [this](int index) {
             m_copied = m_read(Separators[index]);
             Guess();
         });
         connect(m_decimal, &QComboBox::activated, this, [this] { Show(); });
         connect(m_place, &QComboBox::activated, this, [this] { Show(); });
-        connect(m_headers, &QCheckBox::clicked, this, [this](bool checked) {
-            PasteChoice choice = AsItStands(m_rows, m_copied, m_row, m_column);
-            if (checked) {
-                choice.columns = ColumnsByHeaders(m_rows, m_copied.texts, m_column);
-                TakeUnits(m_rows, m_copied, choice);
-            }
-            ShowColumns(choice.columns);
-            Show();
-        });
+        connect(m_headers, &QCheckBox::clicked, this, [this] { ReadHeaders(); });
+        connect(m_units, &QCheckBox::clicked, this, [this] { ReadHeaders(); });
     }
+
+    /// Columns go where the lines say that the user takes for headers and units.
+    void ReadHeaders()
+    {
+        PasteChoice choice = AsItStands(m_rows, m_copied, m_row, m_column);
+        if (m_headers->isChecked()) {
+            choice.columns = ColumnsByHeaders(m_rows, m_copied.texts, m_column);
+            if (m_units->isChecked() && HasUnitLine())
+                TakeUnitLine(m_copied.texts, m_rows, choice.columns);
+            TakeUnits(m_rows, m_copied, choice);
+        }
+        ShowColumns(choice.columns);
+        Show();
+    }
+
+    bool HasUnitLine() const { return m_copied.texts.Lines() > 2; }
 
     void AddTables()
     {
@@ -178,6 +203,8 @@ private:
     {
         const PasteChoice choice = AsItSeems(m_rows, m_copied, m_row, m_column);
         m_headers->setChecked(choice.hasHeaders);
+        m_units->setChecked(choice.hasUnits);
+        m_form->setRowVisible(m_units, choice.hasUnits);
         m_decimal->setCurrentIndex(choice.decimal == DecimalSign::Comma);
         ShowColumns(choice.columns);
         Show();
@@ -192,7 +219,7 @@ private:
         for (int row = 0; row < int(columns.size()); ++row) {
             const auto& [target, unit] = columns[std::size_t(row)];
             m_columns->setItem(row, 0, PlainCell(ColumnName(m_copied, m_headers->isChecked(), row)));
-            const std::size_t line = m_headers->isChecked() ? 1 : 0;
+            const std::size_t line = m_headers->isChecked() ? 1 + m_units->isChecked() : 0;
             const bool isThere = line < m_copied.texts.Lines() && row < m_copied.texts.Width(line);
             m_columns->setItem(row, 3, PlainCell(isThere ? m_copied.texts.At(line, row).toString() : QString()));
             auto* goesTo = new QComboBox;
@@ -227,6 +254,8 @@ private:
         units.clear();
         if (target >= 0 && m_rows.Column(target).IsNumeric())
             units.addItems(KsTypedUnits(m_rows.Column(target).style, m_rows.Column(target).UnitSymbol()));
+        if (!unit.isEmpty() && units.count() == 0)
+            units.addItem(NoUnit);
         if (!unit.isEmpty() && units.findText(unit) < 0)
             units.addItem(unit);
         units.setCurrentIndex(unit.isEmpty() ? 0 : units.findText(unit));
@@ -235,15 +264,17 @@ private:
 
     PasteChoice Chosen() const
     {
-        PasteChoice choice{.hasHeaders = m_headers->isChecked() && m_copied.texts.Lines() > 1,
+        const bool hasHeaders = m_headers->isChecked() && m_copied.texts.Lines() > 1;
+        PasteChoice choice{.hasHeaders = hasHeaders,
+                           .hasUnits = hasHeaders && m_units->isChecked() && HasUnitLine(),
                            .decimal = m_decimal->currentIndex() == 1 ? DecimalSign::Comma : DecimalSign::Point,
                            .place = PastePlace(m_place->currentIndex()),
                            .row = m_row};
         for (int row = 0; row < m_columns->rowCount(); ++row) {
             const int target = ComboAt(row, 1).currentIndex() - 1;
             const QString unit = ComboAt(row, 2).currentText();
-            choice.columns.push_back(
-                {target, target >= 0 && unit != m_rows.Column(target).UnitSymbol() ? unit : QString()});
+            const bool isOther = target >= 0 && unit != NoUnit && unit != m_rows.Column(target).UnitSymbol();
+            choice.columns.push_back({target, isOther ? unit : QString()});
         }
         return choice;
     }
@@ -265,8 +296,10 @@ private:
     void Mend(int number, const QString& text)
     {
         const CPastePlan::Fault& fault = m_plan->Faults()[std::size_t(number)];
-        m_copied.texts.Set(fault.line + m_plan->Choice().hasHeaders, fault.column, text);
-        m_copied.numbers.reset();
+        const std::size_t line = m_plan->CopiedLine(fault.line);
+        m_copied.texts.Set(line, fault.column, text);
+        if (m_copied.numbers)
+            m_copied.numbers->Set(line, fault.column, {});
         m_mended = number;
         QMetaObject::invokeMethod(this, &CPasteDlg::FinishMending, Qt::QueuedConnection); // it is still being edited
     }
@@ -306,17 +339,32 @@ private:
         if (const std::size_t hidden = m_plan->HiddenLines(); hidden > 0)
             texts << GridTexts::Counted(hidden, GridTexts::tr("1 line is hidden by the filter."),
                                         GridTexts::tr("%1 lines are hidden by the filter."));
+        if (const std::size_t blank = m_plan->BlankLines(); blank > 0)
+            texts << GridTexts::Counted(blank, GridTexts::tr("1 blank line is left out."),
+                                        GridTexts::tr("%1 blank lines are left out."));
         if (!m_plan->Complaint().isEmpty())
             texts << m_plan->Complaint();
         m_summary->setText(texts.join(u' '));
-        m_leaveOut->setText(GridTexts::Counted(faults, GridTexts::tr("&Leave out the one that does not fit"),
-                                               GridTexts::tr("&Leave out the %1 that do not fit")));
+        ShowComplaint();
+        m_leaveOut->setText(
+            GridTexts::tr("&Leave out what does not fit: %1").arg(Misfits(*m_plan).join(QStringLiteral(", "))));
         for (QWidget* part : {static_cast<QWidget*>(m_faultTitle), static_cast<QWidget*>(m_faultView),
                               static_cast<QWidget*>(m_leaveOut)})
             part->setVisible(faults > 0);
         m_buttons->button(QDialogButtonBox::Ok)
             ->setEnabled(m_plan->Complaint().isEmpty() && m_plan->CellCount() > 0 &&
                          (faults == 0 || m_leaveOut->isChecked()));
+    }
+
+    /// Marks the column that the complaint is about.
+    void ShowComplaint()
+    {
+        for (int row = 0; row < m_columns->rowCount(); ++row) {
+            const bool isIt = row == m_plan->ComplaintColumn();
+            QTableWidgetItem& item = *m_columns->item(row, 0);
+            item.setIcon(isIt ? style()->standardIcon(QStyle::SP_MessageBoxWarning) : QIcon());
+            item.setToolTip(isIt ? m_plan->Complaint() : QString());
+        }
     }
 
     const CTableRows& m_rows;
@@ -328,7 +376,8 @@ private:
     CFaultModel m_faults;
     QLabel *m_summary = nullptr, *m_faultTitle = nullptr;
     QComboBox *m_separator = nullptr, *m_decimal = nullptr, *m_place = nullptr;
-    QCheckBox *m_headers = nullptr, *m_leaveOut = nullptr;
+    QFormLayout* m_form = nullptr;
+    QCheckBox *m_headers = nullptr, *m_units = nullptr, *m_leaveOut = nullptr;
     QTableWidget* m_columns = nullptr;
     QTableView* m_faultView = nullptr;
     QDialogButtonBox* m_buttons = nullptr;
@@ -342,9 +391,12 @@ PasteDecision DecisionOf(CPastePlan& plan)
     PasteDecision decision{.cells = {},
                            .choice = plan.Choice(),
                            .cellCount = plan.CellCount(),
-                           .leftOut = plan.Faults().size(),
                            .hidden = plan.HiddenLines(),
                            .hasShorterLines = plan.HasShorterLines()};
+    QStringList leftOut = Misfits(plan);
+    if (const std::size_t blank = plan.BlankLines(); blank > 0)
+        leftOut << GridTexts::Counted(blank, GridTexts::tr("1 blank line"), GridTexts::tr("%1 blank lines"));
+    decision.leftOut = leftOut.join(QStringLiteral(", "));
     decision.cells = plan.TakeCells();
     return decision;
 }

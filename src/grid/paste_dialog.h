@@ -10,7 +10,8 @@ struct PasteDecision
 {
     PastedCells cells;
     PasteChoice choice;
-    std::size_t cellCount = 0, leftOut = 0;
+    std::size_t cellCount = 0;
+    QString leftOut{};      // what does not fit, and blank lines: "2 lines, 1 cell"; empty for nothing
     std::size_t hidden = 0; // lines that a filter hides
     bool hasShorterLines = false;
 };

@@ -1,7 +1,8 @@
 // What the first line of a copied table says of its columns, and what its texts say of their decimal sign.
-#include "files/read_number.h"
 #include "grid/paste_plan.h"
+#include "ks/fc/shown_text.h"
 #include "ks/language/language.h"
+#include "ks/units/unit_groups.h"
 
 #include <QLocale>
 #include <QRegularExpression>
@@ -19,7 +20,7 @@ struct Header
 
 QString Plain(const QString& name)
 {
-    return QString(name).remove(u'&').simplified().toCaseFolded();
+    return KsWithoutUnseen(name).remove(u'&').simplified().toCaseFolded();
 }
 
 Header ReadHeader(const QString& text)
@@ -54,15 +55,38 @@ std::vector<QStringList> AllNames(const CTableRows& rows)
     return names;
 }
 
-bool IsNumber(QStringView text, DecimalSign decimal)
-{
-    const QString plain = PlainNumber(text, decimal);
-    return IsValidNumber(plain.section(u' ', 0, 0).toStdString());
-}
-
 bool IsSomeNumber(QStringView text)
 {
-    return IsNumber(text, DecimalSign::Point) || IsNumber(text, DecimalSign::Comma);
+    return IsForeignNumber(text, DecimalSign::Point) || IsForeignNumber(text, DecimalSign::Comma);
+}
+
+/// What a text below a header says of the unit.
+struct UnitCell
+{
+    bool mayBe = false; // it is no value
+    QString unit{};
+};
+
+/// Below a header of a column of texts "A" is a name.
+UnitCell ReadUnitCell(QStringView text, const ColumnSpec* target)
+{
+    const Header header = ReadHeader(text.toString());
+    const bool isInBrackets = header.name.isEmpty() && !header.unit.isEmpty();
+    const QString unit = isInBrackets ? header.unit : text.toString().simplified();
+    if (SaysNothing(unit))
+        return {unit != u'1'};
+    if (!target)
+        return {!IsSomeNumber(text)};
+    const bool isNumeric = target->IsNumeric();
+    if (isInBrackets || (isNumeric && (IsUnitOf(*target, unit) || KsIsUnit(unit))))
+        return {true, isNumeric ? unit : QString()};
+    return {};
+}
+
+const ColumnSpec* TargetOf(const CTableRows& rows, const std::vector<PasteChoice::Column>& columns, int column)
+{
+    const int target = columns[std::size_t(column)].target;
+    return target < 0 ? nullptr : &rows.Column(target);
 }
 
 /// The sign with which more numbers can be read that cannot be read with the other one. "1.234" is what a cell takes,
@@ -71,13 +95,14 @@ DecimalSign DecimalSignOf(const CTableRows& rows, const CTextTable& texts, const
 {
     int points = 0, commas = 0;
     bool hasPoints = false;
-    for (std::size_t line = choice.hasHeaders; line < std::min(texts.Lines(), Sample); ++line)
+    for (std::size_t line = choice.hasHeaders + choice.hasUnits; line < std::min(texts.Lines(), Sample); ++line)
         for (int column = 0; column < texts.Width(line); ++column) {
             const int target = choice.columns[std::size_t(column)].target;
             if (target < 0 || !rows.Column(target).IsNumeric())
                 continue;
             const QStringView text = texts.At(line, column);
-            const bool withPoint = IsNumber(text, DecimalSign::Point), withComma = IsNumber(text, DecimalSign::Comma);
+            const bool withPoint = IsForeignNumber(text, DecimalSign::Point),
+                       withComma = IsForeignNumber(text, DecimalSign::Comma);
             points += withPoint && !withComma;
             commas += withComma && !withPoint;
             hasPoints = hasPoints || (withPoint && text.contains(u'.'));
@@ -96,12 +121,49 @@ QChar SeparatorOf(const ReadCopied& read)
         const CTextTable texts = separator == u'\t' ? lines : read(separator).texts;
         bool fits = texts.Width(0) > 1;
         for (std::size_t line = 0; fits && line < texts.Lines(); ++line)
-            fits = separator == u'\t' || (texts.Width(line) == texts.Width(0) && lines.Width(line) == 1 &&
-                                          (separator != u',' || !IsSomeNumber(lines.At(line, 0))));
+            fits = (lines.Width(line) == 1 && lines.At(line, 0).trimmed().isEmpty()) || separator == u'\t' ||
+                   (texts.Width(line) == texts.Width(0) && lines.Width(line) == 1 &&
+                    (separator != u',' || !IsSomeNumber(lines.At(line, 0))));
         if (fits)
             return separator;
     }
     return u'\t';
+}
+
+bool SeemsDivided(const ReadCopied& read)
+{
+    const QChar separator = SeparatorOf(read);
+    if (separator == u'\t')
+        return false;
+    const CTextTable texts = read(separator).texts;
+    if (texts.Lines() > 1 || separator != u',')
+        return true;
+    const QStringList cells = texts.Line(0);
+    return std::ranges::any_of(cells, [](const QString& cell) { return IsSomeNumber(cell); });
+}
+
+bool SeemsToHaveUnits(const CTextTable& texts, const CTableRows& rows, const std::vector<PasteChoice::Column>& columns)
+{
+    if (texts.Lines() < 3) // they are units of something
+        return false;
+    bool hasAny = false;
+    for (int column = 0; column < texts.Width(1); ++column) {
+        const UnitCell cell = ReadUnitCell(texts.At(1, column), TargetOf(rows, columns, column));
+        if (!cell.mayBe)
+            return false;
+        hasAny = hasAny || !cell.unit.isEmpty();
+    }
+    return hasAny;
+}
+
+void TakeUnitLine(const CTextTable& texts, const CTableRows& rows, std::vector<PasteChoice::Column>& columns)
+{
+    for (int column = 0; column < texts.Width(1); ++column) {
+        const ColumnSpec* const target = TargetOf(rows, columns, column);
+        const QString unit = ReadUnitCell(texts.At(1, column), target).unit;
+        if (QString& own = columns[std::size_t(column)].unit; own.isEmpty() && target && unit != target->UnitSymbol())
+            own = unit;
+    }
 }
 
 std::vector<PasteChoice::Column> ColumnsByHeaders(const CTableRows& rows, const CTextTable& texts, int column)
@@ -127,8 +189,12 @@ std::vector<PasteChoice::Column> ColumnsByHeaders(const CTableRows& rows, const 
             break;
         }
     }
-    for (int i = 0; !hasAny && i < int(columns.size()) && column + i < int(names.size()); ++i)
-        columns[std::size_t(i)].target = column + i;
+    for (int i = 0; !hasAny && i < int(columns.size()) && column + i < int(names.size()); ++i) {
+        const ColumnSpec& spec = rows.Column(column + i);
+        const QString unit = i < texts.Width(0) ? ReadHeader(texts.At(0, i).toString()).unit : QString();
+        const bool saysUnit = spec.IsNumeric() && unit != spec.UnitSymbol() && (IsUnitOf(spec, unit) || KsIsUnit(unit));
+        columns[std::size_t(i)] = {column + i, saysUnit ? unit : QString()};
+    }
     return columns;
 }
 
@@ -152,6 +218,9 @@ bool SeemsToHaveHeaders(const CTableRows& rows, const CTextTable& texts, int col
     if (texts.Lines() < 2)
         return false;
     const auto names = AllNames(rows);
+    const bool hasUnits =
+        SeemsToHaveUnits(texts, rows, ColumnsInOrder(rows, std::max(texts.Width(0), texts.Width(1)), column));
+    const std::size_t below = hasUnits ? 2 : 1;
     int known = 0, above = 0;
     for (int i = 0; i < texts.Width(0); ++i) {
         const QString text = texts.At(0, i).toString();
@@ -161,7 +230,7 @@ bool SeemsToHaveHeaders(const CTableRows& rows, const CTextTable& texts, int col
         known += std::ranges::any_of(
             names, [&](const QStringList& of) { return of.contains(name) || of.contains(Plain(text)); });
         const bool isNumeric = column + i < int(rows.Columns().size()) && rows.Column(column + i).IsNumeric();
-        above += isNumeric && !text.trimmed().isEmpty() && i < texts.Width(1) && IsSomeNumber(texts.At(1, i));
+        above += isNumeric && !text.trimmed().isEmpty() && i < texts.Width(below) && IsSomeNumber(texts.At(below, i));
     }
     return known > 0 || above > 0;
 }
@@ -172,6 +241,9 @@ PasteChoice AsItSeems(const CTableRows& rows, const CopiedTable& copied, int row
     choice.hasHeaders = SeemsToHaveHeaders(rows, copied.texts, column);
     if (choice.hasHeaders) {
         choice.columns = ColumnsByHeaders(rows, copied.texts, column);
+        choice.hasUnits = SeemsToHaveUnits(copied.texts, rows, choice.columns);
+        if (choice.hasUnits)
+            TakeUnitLine(copied.texts, rows, choice.columns);
         TakeUnits(rows, copied, choice); // surer than what headers say
     }
     choice.decimal = DecimalSignOf(rows, copied.texts, choice);

@@ -30,8 +30,8 @@ QVariant CUnderstoodModel::data(const QModelIndex& index, int role) const
 {
     const auto line = std::size_t(index.row());
     const int column = index.column(), target = Target(column);
-    const bool goesNowhere = target < 0 || m_faulty.contains({line, -1});
-    const bool isFaulty = !goesNowhere && m_faulty.contains({line, column});
+    const bool isFaulty = target >= 0 && m_faulty.contains({line, column});
+    const bool goesNowhere = !isFaulty && (target < 0 || m_plan->GoesNowhere(line));
     switch (role) {
     case Qt::DisplayRole:
         return KsVisibleText(m_plan->Understood(line, column), true);
@@ -91,7 +91,7 @@ QVariant CFaultModel::data(const QModelIndex& index, int role) const
     const PasteChoice& choice = m_plan->Choice();
     switch (index.column()) {
     case Line:
-        return QString::number(fault.line + 1 + choice.hasHeaders);
+        return QString::number(m_plan->CopiedLine(fault.line) + 1);
     case Name:
         return fault.column < 0 ? QString() : m_rows.Column(choice.columns[std::size_t(fault.column)].target).header();
     case Text: {

@@ -3,6 +3,7 @@
 #include "files/read_number.h"
 #include "grid/branch_lines.h"
 #include "grid/grid_texts.h"
+#include "ks/fc/shown_text.h"
 #include "ks/units/typed_number.h"
 #include "ks/units/unit_groups.h"
 
@@ -12,8 +13,7 @@
 
 namespace {
 
-constexpr std::size_t Nowhere = std::size_t(-1), New = Nowhere - 1;
-constexpr int MostRuleFaults = 20; // each is looked for among all rows
+constexpr std::size_t MostNamed = 5; // lines in one reason
 
 QString BaseSymbol(UnitGroup quantity)
 {
@@ -21,20 +21,37 @@ QString BaseSymbol(UnitGroup quantity)
     return row ? QString::fromUtf8(row->base.symbol) : QString();
 }
 
-/// Whether numbers with the unit may stand in the column.
+bool IsBlank(QStringView text)
+{
+    return text.trimmed().isEmpty();
+}
+
+bool IsBlank(const CTextTable& texts, std::size_t line)
+{
+    for (int column = 0; column < texts.Width(line); ++column)
+        if (!IsBlank(texts.At(line, column)))
+            return false;
+    return true;
+}
+
+} // namespace
+
 bool IsUnitOf(const ColumnSpec& column, const QString& unit)
 {
     return unit == column.UnitSymbol() || KsTypedUnitFactor(column.style.Group(), unit);
 }
 
-} // namespace
+std::vector<PasteChoice::Column> ColumnsInOrder(const CTableRows& rows, int count, int column)
+{
+    std::vector<PasteChoice::Column> columns;
+    for (int i = 0; i < count; ++i)
+        columns.emplace_back(column + i < int(rows.Columns().size()) ? column + i : -1);
+    return columns;
+}
 
 PasteChoice AsItStands(const CTableRows& rows, const CopiedTable& copied, int row, int column)
 {
-    PasteChoice choice{.row = row};
-    const int count = int(rows.Columns().size());
-    for (int i = 0; i < copied.texts.Columns(); ++i)
-        choice.columns.emplace_back(column + i < count ? column + i : -1);
+    PasteChoice choice{.columns = ColumnsInOrder(rows, copied.texts.Columns(), column), .row = row};
     TakeUnits(rows, copied, choice);
     return choice;
 }
@@ -43,38 +60,48 @@ void TakeUnits(const CTableRows& rows, const CopiedTable& copied, PasteChoice& c
 {
     for (std::size_t i = 0; i < copied.columns.size(); ++i) {
         auto& [target, unit] = choice.columns[i];
-        const QString& own = copied.columns[i].unit;
-        if (target >= 0 && !own.isEmpty() && IsUnitOf(rows.Column(target), own))
+        const auto& [quantity, own] = copied.columns[i];
+        if (target >= 0 && rows.Column(target).IsNumeric() && KsTypedUnitFactor(quantity, own))
             unit = own == rows.Column(target).UnitSymbol() ? QString() : own;
     }
 }
 
 CPastePlan::CPastePlan(const CTableRows& rows, const CopiedTable& copied, PasteChoice choice)
-    : m_rows(&rows), m_copied(&copied), m_choice(std::move(choice)), m_first(m_choice.hasHeaders)
+    : m_rows(&rows), m_copied(&copied), m_choice(std::move(choice))
 {
     m_values.resize(std::size_t(Columns()));
     m_left.resize(std::size_t(Columns()));
     FindComplaint();
+    FindLines();
     FindRows();
     for (int column = 0; column < Columns(); ++column)
         ReadColumn(column);
+    LeaveUnnamedLines();
     FindRuleFaults();
+    CountCells();
     std::ranges::stable_sort(m_faults, {}, [](const Fault& fault) { return std::pair(fault.line, fault.column); });
 }
 
 void CPastePlan::FindComplaint()
 {
     std::set<int> targets;
-    for (const auto& column : m_choice.columns) {
-        if (column.target < 0)
+    for (int i = 0; i < Columns(); ++i) {
+        const auto& [column, unit] = m_choice.columns[std::size_t(i)];
+        if (column < 0)
             continue;
-        const ColumnSpec& target = m_rows->Column(column.target);
-        if (!targets.insert(column.target).second)
+        const ColumnSpec& target = m_rows->Column(column);
+        const bool isTwice = !targets.insert(column).second;
+        if (!isTwice && (unit.isEmpty() || IsUnitOf(target, unit)))
+            continue;
+        m_complaintColumn = i;
+        const QStringList units = KsTypedUnits(target.style, target.UnitSymbol());
+        if (isTwice)
             m_complaint = GridTexts::tr("Two columns go to \"%1\".").arg(target.header());
-        else if (!column.unit.isEmpty() && !IsUnitOf(target, column.unit))
+        else if (units.isEmpty())
+            m_complaint = GridTexts::tr("\"%1\" is no unit of \"%2\", which has none.").arg(unit, target.header());
+        else
             m_complaint = GridTexts::tr("\"%1\" is no unit of \"%2\". Possible are %3.")
-                              .arg(column.unit, target.header(),
-                                   KsTypedUnits(target.style, target.UnitSymbol()).join(QStringLiteral(", ")));
+                              .arg(unit, target.header(), units.join(QStringLiteral(", ")));
     }
     if (targets.empty())
         m_complaint = GridTexts::tr("No column goes anywhere.");
@@ -84,6 +111,38 @@ void CPastePlan::FindComplaint()
 }
 
 // ---- lines -------------------------------------------------------------------------------------
+
+/// Where each line names its branch a blank one is none; elsewhere it goes to a line of the table, as the others do.
+void CPastePlan::FindLines()
+{
+    const CTextTable& texts = m_copied->texts;
+    m_lines.reserve(texts.Lines());
+    for (std::size_t line = m_choice.hasHeaders + m_choice.hasUnits; line < texts.Lines(); ++line)
+        m_lines.push_back(line);
+    const bool isNamed = std::ranges::any_of(m_choice.columns, [this](const PasteChoice::Column& column) {
+        return column.target >= 0 && m_rows->Column(column.target).NamesBranch();
+    });
+    if (!isNamed || Columns() == 1)
+        return;
+    const auto blank = [&texts](std::size_t line) { return IsBlank(texts, line); };
+    if (std::ranges::all_of(m_lines, blank))
+        return; // cells of these are cleared
+    m_blankLines = std::erase_if(m_lines, blank);
+}
+
+/// Where the column of the table comes from; -1 for none.
+int CPastePlan::ColumnFor(int target) const
+{
+    const auto column = std::ranges::find(m_choice.columns, target, &PasteChoice::Column::target);
+    return column == m_choice.columns.end() ? -1 : int(column - m_choice.columns.begin());
+}
+
+/// A blank line that is no line of cells has none.
+int CPastePlan::WidthOf(std::size_t line) const
+{
+    const int width = m_copied->texts.Width(m_lines[line]);
+    return width == 1 && Columns() > 1 && IsBlank(TextAt(line, 0)) ? 0 : width;
+}
 
 void CPastePlan::FindRows()
 {
@@ -112,19 +171,32 @@ void CPastePlan::FindRows()
 
 void CPastePlan::FindRowsByPlace()
 {
-    const auto from = [this](int target) {
-        return int(std::ranges::find(m_choice.columns, target, &PasteChoice::Column::target) -
-                   m_choice.columns.begin());
-    };
-    const int branch = from(0), chainage = from(1);
+    const int branch = ColumnFor(0), chainage = ColumnFor(1);
     CPlacesInTable places(*m_rows);
+    CPlacedLines placed;
     for (std::size_t line = 0; line < Lines(); ++line) {
-        if (std::max(branch, chainage) >= m_copied->texts.Width(line + m_first))
+        if (std::max(branch, chainage) >= WidthOf(line)) {
+            m_rowOf[line] = Nowhere;
+            AddFault(line, -1, GridTexts::tr("The line does not tell its place."));
             continue;
+        }
         const CellValue name = Read(line, branch).value, number = Read(line, chainage).value;
-        if (std::holds_alternative<std::string>(name) && std::holds_alternative<double>(number))
-            m_rowOf[line] = places.Take(QString::fromStdString(std::get<std::string>(name)), std::get<double>(number))
-                                .value_or(New);
+        if (!std::holds_alternative<std::string>(name) || !std::holds_alternative<double>(number))
+            continue;
+        const auto key = QString::fromStdString(std::get<std::string>(name));
+        const auto row = places.Take(key, std::get<double>(number));
+        m_rowOf[line] = row.value_or(New);
+        placed.Add(line, key, std::get<double>(number), row.has_value());
+    }
+    for (const auto& crowd : placed.Crowds()) {
+        QStringList numbers;
+        for (std::size_t i = 0; i < std::min(crowd.size(), MostNamed); ++i)
+            numbers << QString::number(CopiedLine(crowd[i]) + 1);
+        if (crowd.size() > MostNamed)
+            numbers << QStringLiteral("...");
+        for (const std::size_t line : crowd)
+            AddFault(line, chainage,
+                     GridTexts::tr("The copied lines %1 have the same place.").arg(numbers.join(QStringLiteral(", "))));
     }
 }
 
@@ -136,6 +208,11 @@ std::optional<std::size_t> CPastePlan::RowOf(std::size_t line) const
 bool CPastePlan::IsNew(std::size_t line) const
 {
     return m_rowOf[line] == New;
+}
+
+bool CPastePlan::GoesNowhere(std::size_t line) const
+{
+    return m_rowOf[line] == Nowhere;
 }
 
 std::size_t CPastePlan::NewLines() const
@@ -152,7 +229,7 @@ std::size_t CPastePlan::HiddenLines() const
 bool CPastePlan::HasShorterLines() const
 {
     for (std::size_t line = 0; line < Lines(); ++line)
-        if (m_copied->texts.Width(line + m_first) < Columns())
+        if (WidthOf(line) < Columns())
             return true;
     return false;
 }
@@ -172,9 +249,9 @@ QStringView CPastePlan::WholeNumber(std::size_t line, int column) const
     if (!m_copied->numbers)
         return {};
     const auto& [quantity, unit] = m_copied->columns[std::size_t(column)];
-    const QStringView whole = m_copied->numbers->At(line + m_first, column);
+    const QStringView whole = m_copied->numbers->At(m_lines[line], column);
     const auto number = KsReadNumber(whole, CKsEditStyle());
-    const auto shown = KsReadNumber(m_copied->texts.At(line + m_first, column), CKsEditStyle());
+    const auto shown = KsReadNumber(TextAt(line, column), CKsEditStyle());
     const auto factor = KsTypedUnitFactor(quantity, unit);
     // What is on the clipboard may come from anywhere: the text is what users see there.
     const bool belongs =
@@ -183,10 +260,9 @@ QStringView CPastePlan::WholeNumber(std::size_t line, int column) const
 }
 
 /// A number with its unit: to the last digit where the table that it comes from has it so.
-QString CPastePlan::NumberText(std::size_t line, int column) const
+QString CPastePlan::NumberText(std::size_t line, int column, const QString& text) const
 {
     const auto& [target, unit] = m_choice.columns[std::size_t(column)];
-    const QStringView text = m_copied->texts.At(line + m_first, column);
     const ColumnSpec& spec = m_rows->Column(target);
     if (const QStringView number = WholeNumber(line, column); !number.isEmpty()) {
         const auto& own = m_copied->columns[std::size_t(column)];
@@ -194,7 +270,7 @@ QString CPastePlan::NumberText(std::size_t line, int column) const
         if (own.unit == (unit.isEmpty() ? spec.UnitSymbol() : unit) && IsUnitOf(spec, base))
             return number.toString() + u' ' + base;
     }
-    const QString plain = m_choice.decimal ? PlainNumber(text, *m_choice.decimal) : text.toString();
+    const QString plain = m_choice.decimal ? PlainNumber(text, *m_choice.decimal) : text;
     return !unit.isEmpty() && IsValidNumber(plain.toStdString()) ? plain + u' ' + unit : plain;
 }
 
@@ -205,16 +281,29 @@ bool CPastePlan::IsAsTyped(int column) const
            m_choice.decimal != DecimalSign::Comma;
 }
 
+/// What surrounds or pads a number, a choice or a time unseen is none of it.
 CellReading CPastePlan::Read(std::size_t line, int column) const
 {
     const ColumnSpec& spec = m_rows->Column(m_choice.columns[std::size_t(column)].target);
-    const QStringView text = m_copied->texts.At(line + m_first, column);
+    if (spec.Kind() == CellKind::Text)
+        return ReadCell(spec, TextAt(line, column));
+    const QString text = KsWithoutUnseen(TextAt(line, column).toString()).trimmed();
     if (!spec.IsNumeric() || IsAsTyped(column)) {
         CellReading read = ReadCell(spec, text);
         if (read.refusal.isEmpty() || !spec.IsNumeric() || !m_choice.decimal)
             return read;
     }
-    return ReadCell(spec, NumberText(line, column));
+    return ReadCell(spec, NumberText(line, column, text));
+}
+
+/// Why a line cannot be without a name or a place; empty when it can.
+QString CPastePlan::WhyNoName(int target, const CellValue& value) const
+{
+    const ColumnSpec& spec = m_rows->Column(target);
+    if (spec.NamesBranch() && IsEmptyCell(spec, value))
+        return GridTexts::tr("A line needs the name of its branch.");
+    const bool isPlace = m_choice.place == PastePlace::ByPlace && target == 1;
+    return isPlace && IsEmptyCell(spec, value) ? GridTexts::tr("The line does not tell its place.") : QString();
 }
 
 void CPastePlan::Leave(std::size_t line, int column)
@@ -238,22 +327,21 @@ void CPastePlan::ReadColumn(int column)
     QStringView last;
     for (std::size_t line = 0; line < Lines(); ++line) {
         const std::size_t row = m_rowOf[line];
-        const bool isThere = column < m_copied->texts.Width(line + m_first);
-        if (!isThere || row == Nowhere || (isKey && row != New)) {
+        if (column >= WidthOf(line) || row == Nowhere || (isKey && row != New)) {
             values.Add(nothing, Lines());
             Leave(line, column);
-            m_cellCount += isThere && isKey && row != Nowhere;
             continue;
         }
-        const QStringView text = m_copied->texts.At(line + m_first, column);
+        const QStringView text = TextAt(line, column);
         if (const auto number = isPlain ? ReadPlainNumber(spec, text) : std::nullopt) {
             values.Add(*number, Lines()); // nearly all of a large table
-            ++m_cellCount;
             continue;
         }
         if (spec.IsNumeric() || text != last || last.isNull()) // names of branches come many times in turn
             read = Read(line, column);
         last = text;
+        if (read.refusal.isEmpty())
+            read.refusal = WhyNoName(target, read.value);
         bool isLeft = false;
         if (row != New && (!spec.IsNumeric() || !read.refusal.isEmpty() || spec.locked)) {
             const void* const object = m_rows->Rows()->At(row);
@@ -263,8 +351,6 @@ void CPastePlan::ReadColumn(int column)
         }
         if (!isLeft && !read.refusal.isEmpty())
             AddFault(line, column, read.refusal);
-        else
-            ++m_cellCount;
         if (isLeft || !read.refusal.isEmpty()) {
             Leave(line, column);
             values.Add(nothing, Lines());
@@ -278,38 +364,6 @@ void CPastePlan::ReadColumn(int column)
 void CPastePlan::AddFault(std::size_t line, int column, const QString& reason)
 {
     m_faults.push_back({line, column, reason});
-}
-
-/// How many texts of the line have a cell that takes them.
-std::size_t CPastePlan::CellsOf(std::size_t line) const
-{
-    std::size_t count = 0;
-    for (int column = 0; column < std::min(Columns(), m_copied->texts.Width(line + m_first)); ++column)
-        count += m_choice.columns[std::size_t(column)].target >= 0;
-    return count - std::size_t(std::ranges::count_if(m_faults, [line](const Fault& fault) {
-               return fault.line == line && fault.column >= 0;
-           }));
-}
-
-/// Rows that depend on each other: those that do not fit are left out one by one.
-void CPastePlan::FindRuleFaults()
-{
-    if (!m_complaint.isEmpty() || !m_rows->Rows()->HasRules())
-        return;
-    for (int i = 0; i < MostRuleFaults; ++i) {
-        std::vector<std::size_t> lines;
-        for (std::size_t line = 0; line < Lines(); ++line)
-            if (m_rowOf[line] != Nowhere)
-                lines.push_back(line);
-        const auto fault = m_rows->Fault(Cells(m_values, m_left));
-        if (!fault)
-            return;
-        const std::size_t line = lines[fault->row];
-        m_cellCount -= CellsOf(line);
-        AddFault(line, -1, fault->text);
-        m_rowOf[line] = Nowhere;
-    }
-    m_complaint = m_faults.back().reason;
 }
 
 PastedCells CPastePlan::TakeCells()
@@ -357,8 +411,7 @@ bool CPastePlan::IsClean() const
 
 QString CPastePlan::Text(std::size_t line, int column) const
 {
-    return column < m_copied->texts.Width(line + m_first) ? m_copied->texts.At(line + m_first, column).toString()
-                                                          : QString();
+    return column < m_copied->texts.Width(m_lines[line]) ? TextAt(line, column).toString() : QString();
 }
 
 QString CPastePlan::Understood(std::size_t line, int column) const

@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <string_view>
 #include <vector>
 
 /// Rows that are out of their source: new ones, or removed ones that a command keeps. Owns them.
@@ -64,13 +65,25 @@ public:
     // Rows that depend on each other.
     /// Makes new rows fit between those at `at` - 1 and `at`, where they will be put.
     virtual void Fit(IRowBlock& /*rows*/, std::size_t /*at*/) const {}
-    /// Why the rows from `first` on may not hold what `rows` hold; those behind the last one would be new.
+    /// A row that does not fit with the others.
     struct Fault
     {
-        std::size_t row = 0; // among `rows`
-        QString text;        // for the user
+        std::size_t row = 0;               // among those that were asked about
+        QString text{};                    // for the user
+        std::string_view field{};          // what would have to be another
+        std::optional<std::size_t> with{}; // the one of them before it that it does not fit with
     };
-    virtual std::optional<Fault> FindFault(std::size_t /*first*/, IRowBlock& /*rows*/) const { return std::nullopt; }
+    /// Why the rows from `first` on may not hold what `rows` hold; those behind the last one would be new. In their
+    /// order, each one that does not fit with those that do, `most` of them.
+    virtual std::vector<Fault> FindFaults(std::size_t /*first*/, IRowBlock& /*rows*/, std::size_t /*most*/) const
+    {
+        return {};
+    }
+    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const
+    {
+        auto faults = FindFaults(first, rows, 1);
+        return faults.empty() ? std::nullopt : std::optional(std::move(faults.front()));
+    }
     /// Whether that has to be asked before cells change.
     virtual bool HasRules() const { return false; }
     /// Where rows stand in an order of their own: for each place the row that belongs there; empty when all do.

@@ -200,14 +200,31 @@ QString CTableRows::Refusal(int row, int column, const QString& text, bool isAlo
         return read.refusal;
     PastedCells cell{{SourceRow(row)}, {{column, {}}}};
     cell.columns.front().values.Add(Resolved(column, read.value));
-    const auto fault = Fault(cell);
-    return fault ? fault->text : QString();
+    const auto faults = Faults(cell, 1);
+    return faults.empty() ? QString() : faults.front().text;
 }
 
-std::optional<IRowSource::Fault> CTableRows::Fault(const PastedCells& cells) const
+/// Faults of rows from `first` on, told of the texts, which stand elsewhere. Where it is no text's own row that does
+/// not fit, it is the text that the row does not fit with.
+static std::vector<IRowSource::Fault> OfTexts(std::vector<IRowSource::Fault> faults, const PastedCells& cells,
+                                              std::size_t first, std::size_t count)
+{
+    constexpr std::size_t none = std::size_t(-1);
+    std::vector<std::size_t> textOf(faults.empty() ? 0 : count, none);
+    for (std::size_t i = 0; i < cells.rows.size() && !faults.empty(); ++i)
+        textOf[cells.rows[i] - first] = i;
+    for (IRowSource::Fault& fault : faults) {
+        const bool isText = textOf[fault.row] != none || !fault.with;
+        const std::size_t text = textOf[isText ? fault.row : *fault.with];
+        fault.row = text == none ? 0 : text;
+    }
+    return faults;
+}
+
+std::vector<IRowSource::Fault> CTableRows::Faults(const PastedCells& cells, std::size_t most) const
 {
     if (!m_rows || !m_rows->HasRules() || cells.rows.empty())
-        return std::nullopt;
+        return {};
     // The source is asked about the rows from the first to the last one of these, be others among them or not.
     const auto [low, high] = std::ranges::minmax(cells.rows);
     const std::size_t first = low, stored = m_rows->Count();
@@ -225,12 +242,7 @@ std::optional<IRowSource::Fault> CTableRows::Fault(const PastedCells& cells) con
         for (std::size_t i = 0; i < cells.rows.size(); ++i)
             if (!column.Leaves(i))
                 Column(column.column).access->set(rows->At(cells.rows[i] - first), column.values[i]);
-    auto fault = m_rows->FindFault(first, *rows);
-    if (fault) { // told of the text, which stands elsewhere
-        const auto place = std::ranges::find(cells.rows, first + fault->row);
-        fault->row = place == cells.rows.end() ? 0 : std::size_t(place - cells.rows.begin());
-    }
-    return fault;
+    return OfTexts(m_rows->FindFaults(first, *rows, most), cells, first, rows->Count());
 }
 
 namespace {

@@ -76,8 +76,8 @@ public:
     /// Why the cell would not take the text; empty when it would. What the other rows have to say is asked as well when
     /// the text goes into this cell alone, and with Fault when it is one of several.
     QString Refusal(int row, int column, const QString& text, bool isAlone = true) const;
-    /// Why the rows together could not take these cells, and which of `rows` it is; see IRowSource::FindFault.
-    std::optional<IRowSource::Fault> Fault(const PastedCells& cells) const;
+    /// Why the rows together could not take these cells, and which of `cells.rows` it is; see IRowSource::FindFaults.
+    std::vector<IRowSource::Fault> Faults(const PastedCells& cells, std::size_t most) const;
 
     /// Why the source could not take the lines between its rows `at` - 1 and `at`; empty when it could.
     QString WhyNotBetween(std::size_t at, IRowBlock& lines) const;

@@ -290,6 +290,11 @@ std::vector<CKsMenuCommand> CKavo0_hdView::LinesMenu() const
     return menu;
 }
 
+std::vector<CKsMenuCommand> CKavo0_hdView::EditMenu() const
+{
+    return CGridCommands::ClipboardMenu();
+}
+
 bool CKavo0_hdView::IsCommandEnabled(int id) const
 {
     if (id == KsCommand::Help)
@@ -301,7 +306,8 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
     const CGenGrid* grid = !page ? nullptr : isForLines || LinesView::Knows(id) ? page->LinesGrid() : page->GetGrid();
     if (!m_linesEnabled || !grid || !grid->isEnabled())
         return false;
-    if (GetDocument()->IsReadOnly() && (isForLines || id == Command::FetchLocation))
+    const bool changes = id == Command::InsertLine || id == Command::DeleteLine || id == Command::FetchLocation;
+    if (GetDocument()->IsReadOnly() && changes)
         return false;
     return id == Command::InsertLine      ? true
            : id == Command::DeleteLine    ? grid->HasLinesToDelete()

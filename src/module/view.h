@@ -39,6 +39,7 @@ public:
     bool OnCommand(int id) override;
     bool IsCommandEnabled(int id) const override;
     std::vector<CKsMenuCommand> LinesMenu() const override;
+    std::vector<CKsMenuCommand> EditMenu() const override;
 
     // IPageHost
     CView* HostView() override { return this; }

@@ -5,10 +5,10 @@
 #include "ks/units/edit_style.h"
 #include "shell/frame_actions.h"
 #include "shell/help_commands.h"
-#include "shell/lines_menu.h"
 #include "shell/main_frame.h"
 #include "shell/recent_files.h"
 #include "shell/settings_keys.h"
+#include "shell/view_menu.h"
 
 #include <QActionGroup>
 #include <QDir>
@@ -31,7 +31,11 @@ CFrameMenus::CFrameMenus(CMainFrame& frame) : m_frame(frame), m_standardBar(fram
     CreateMenus();
     CreateUnits();
     CreateLanguages();
-    m_lines = new CLinesMenu(m_frame, *m_menus[LinesMenu], this);
+    m_lines =
+        new CViewMenu(m_frame, *m_menus[LinesMenu], &CCommandTarget::LinesMenu, CViewMenu::Keys::OfMenu, nullptr, this);
+    const auto edit = m_menus[EditMenu]->actions();
+    m_clipboard = new CViewMenu(m_frame, *m_menus[EditMenu], &CCommandTarget::EditMenu, CViewMenu::Keys::OfFocus,
+                                edit.value(edit.indexOf(Action("actionPaste")) + 1), this);
     m_frame.EnableMenuItem(LinesMenu, false);
     const QUndoGroup& history = m_frame.Edit().History();
     connect(&history, &QUndoGroup::canUndoChanged, this, &CFrameMenus::UpdateUndo);
@@ -157,11 +161,13 @@ void CFrameMenus::Retranslate()
     m_standardBar->setWindowTitle(tr("Standard"));
     UpdateUndo();
     m_lines->Fill();
+    m_clipboard->Fill();
 }
 
 void CFrameMenus::ViewChanged()
 {
     m_lines->Fill();
+    m_clipboard->Fill();
     m_frame.EnableMenuItem(LinesMenu, !m_menus[LinesMenu]->isEmpty()); // the view may grey it again
 }
 

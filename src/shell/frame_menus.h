@@ -7,8 +7,8 @@
 #include <map>
 #include <vector>
 
-class CLinesMenu;
 class CMainFrame;
+class CViewMenu;
 class QAction;
 class QActionGroup;
 class QMenu;
@@ -48,5 +48,5 @@ private:
     std::map<QString, QAction*> m_actions;
     std::vector<QMenu*> m_menus; // by position
     QToolBar* m_standardBar;
-    CLinesMenu* m_lines = nullptr; // child
+    CViewMenu *m_lines = nullptr, *m_clipboard = nullptr; // what these menus have from the view; children
 };

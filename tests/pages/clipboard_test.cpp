@@ -91,15 +91,19 @@ TEST_F(ClipboardTest, PastesRectangles)
     view->revealed.clear();
     QTest::keyClick(grid, Qt::Key_Z, Qt::ControlModifier);
     EXPECT_EQ(view->revealed, QList<int>{3}) << "where something changed";
-    // Blank lines behind the last one are none; those before it are, and short lines leave the rest.
+    // Blank lines are none where lines name their branches, and short lines leave the rest.
     QStringList said;
     QObject::connect(&document, &CKsDoc::Said, [&said](const CString& text) { said << text; });
     Paste(1, 1, "x\t1\t2\n\ny\t3\n\n\n");
-    EXPECT_EQ(Stored(), "X 1 2 8,  1 5 5, Y 3 5 5, NECKAR 9 0 0");
+    EXPECT_EQ(Stored(), "X 1 2 8, Y 3 5 5, MAIN 10000000000 5 5, NECKAR 9 0 0");
     Paste(3, 2, "\"4\n\"\t6\n\n");
-    EXPECT_EQ(Stored(), "X 1 2 8,  1 5 5, Y 4 6 5, NECKAR 9 0 0") << "a line end behind a number is none of it";
-    EXPECT_EQ(said,
-              QStringList({"6 cells pasted; shorter lines leave their other cells as they were", "2 cells pasted"}));
+    EXPECT_EQ(Stored(), "X 1 2 8, Y 3 5 5, MAIN 4 6 5, NECKAR 9 0 0") << "a line end behind a number is none of it";
+    EXPECT_EQ(said, QStringList({"5 cells pasted; left out: 1 blank line; shorter lines leave their other cells as "
+                                 "they were",
+                                 "2 cells pasted"}));
+    // Elsewhere they are lines, of which no cell is pasted.
+    Paste(1, 3, "1\t2\n\n3\t4");
+    EXPECT_EQ(Stored(), "X 1 1 2, Y 3 5 5, MAIN 4 3 4, NECKAR 9 0 0");
     EXPECT_EQ(boxes, QStringList());
 }
 

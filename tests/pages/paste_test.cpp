@@ -167,9 +167,9 @@ TEST_F(PasteTest, EveryBadCellIsListedAndCanBeMendedOrLeftOut)
     EXPECT_EQ(Stored().toStdString(), before);
 
     Paste(2, 1, text, [&](QDialog& dialog) { dialog.findChild<QCheckBox*>("leaveOut")->click(); });
-    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, X 1 2 2, Y 0 3 4,  3 5 6")
-        << "a cell stays as it was, a new one is empty";
-    EXPECT_EQ(said.toStdString(), "9 cells pasted; 3 left out");
+    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, X 1 2 2, B 0 30 3")
+        << "a cell stays as it was; of a line that nobody knows all of them do";
+    EXPECT_EQ(said.toStdString(), "3 cells pasted; left out: 2 lines, 1 cell");
     document.UndoStack().undo();
     EXPECT_EQ(Stored().toStdString(), before) << "one step";
 
@@ -199,7 +199,7 @@ TEST_F(PasteTest, TheNextBadCellIsAtHandAndWhatIsStillTypedIsPasted)
         editor->setText("42");
     });
     EXPECT_EQ(Stored().toStdString(), "X 1 2 7, Y 2 3 42, Z 3 5 3");
-    EXPECT_EQ(said.toStdString(), "11 cells pasted; 1 left out");
+    EXPECT_EQ(said.toStdString(), "11 cells pasted; left out: 1 cell");
 }
 
 TEST_F(PasteTest, BlankCellsAreAsClearedOnes)
@@ -324,6 +324,14 @@ TEST_F(PasteTest, NumbersOfOtherCountriesAreUnderstoodAndShown)
     Paste(1, 2, "1,234\n2,500", [&](QDialog& dialog) { Choose(dialog, "decimal", 1); }); // which, the user says
     EXPECT_EQ(Stored().toStdString(), "A 1.234 10 1, A 2.5 20 2, B 0 30 3");
     document.UndoStack().undo();
+    for (const char* text : {"1 234,5\n2", "1\u00A0234,5\n2"}) {
+        Paste(1, 2, text);
+        EXPECT_EQ(Stored().toStdString(), "A 1234.5 10 1, A 2 20 2, B 0 30 3") << text;
+        document.UndoStack().undo();
+    }
+    Paste(1, 2, "1 234.5\n2");
+    EXPECT_EQ(Stored().toStdString(), "A 1234.5 10 1, A 2 20 2, B 0 30 3");
+    document.UndoStack().undo();
     Paste(1, 1, "X;1,5;2\nY;2,5;3"); // separated as files with decimal commas are
     EXPECT_EQ(Stored().toStdString(), "X 1.5 2 1, Y 2.5 3 2, B 0 30 3");
 }
@@ -337,22 +345,249 @@ TEST_F(PasteTest, LinesFindTheirPlaces)
         Choose(dialog, "place", 2);
         summary = Summary(dialog);
     };
-    Paste(3, 1, "b\t0\t31\t5\nA\t100.0000000001\t21\t5\na\t100\t41\t6\nA\t100\t51\t7\nC\t7\t1\t8", byPlace,
-          QDialogButtonBox::Ok, Qt::ControlModifier | Qt::ShiftModifier);
-    EXPECT_EQ(summary.toStdString(), "5 lines were copied. 2 lines are new.");
-    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 100 21 5, B 0 31 5, A 100 41 6, A 100 51 7, C 7 1 8");
-    EXPECT_EQ(said.toStdString(), "20 cells pasted") << "with those that name the lines";
-    const auto block = grid->SelectedBlock();
-    EXPECT_TRUE(!block || block->height() == 1) << "they are no block: the second line is none of those between";
+    Paste(3, 1, "b\t0\t31\t5\nA\t100.0000000001\t21\t5\na\t100\t41\t6\nC\t7\t1\t8", byPlace, QDialogButtonBox::Ok,
+          Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(summary.toStdString(), "4 lines were copied. 1 line is new.");
+    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 100 21 5, B 0 31 5, A 100 41 6, C 7 1 8");
+    EXPECT_EQ(said.toStdString(), "16 cells pasted") << "with those that name the lines";
+    const auto block = grid->SelectedBlock().value_or(QItemSelectionRange());
+    EXPECT_EQ(std::pair(block.top(), block.bottom()), std::pair(1, 4)) << "in another order";
     document.UndoStack().undo();
     EXPECT_EQ(Stored().toStdString(), before + ", A 100 40 4") << "one step";
 
     // A line that ends before its place is told has none, whatever stands in the next one.
     Add("5", 0, 50, 5);
     grid->Refresh();
-    Paste(1, 1, "Chainage\tRiver Name\tInitial h\n0\n5\tB\t9", byPlace);
-    EXPECT_EQ(summary.toStdString(), "2 lines were copied. 2 lines are new.");
-    EXPECT_EQ(Stored().toStdString(), before + ", A 100 40 4, 5 0 50 5,  0 0 0, B 5 9 0");
+    QStringList listed;
+    Paste(1, 1, "Chainage\tRiver Name\tInitial h\n0\n5\tB\t9\n1o\tB\t8\n\tA\t7", [&](QDialog& dialog) {
+        byPlace(dialog);
+        listed = Listed(dialog);
+        dialog.findChild<QCheckBox*>("leaveOut")->click();
+    });
+    EXPECT_EQ(summary.toStdString(), "4 lines were copied. 1 line is new.");
+    EXPECT_EQ(listed,
+              QStringList({"2||0|The line does not tell its place.", "4|Chainage|1o|Floating point number required",
+                           "5|Chainage||The line does not tell its place."}));
+    EXPECT_EQ(Stored().toStdString(), before + ", A 100 40 4, 5 0 50 5, B 5 9 0");
+}
+
+TEST_F(PasteTest, OfTwoCopiedLinesOfOnePlaceNoneBecomesASecondOneUnasked)
+{
+    QStringList listed;
+    const auto byPlace = [&](QDialog& dialog) {
+        Choose(dialog, "place", 2);
+        listed = Listed(dialog);
+    };
+    const QString text = "A\t100\t7\t8\nC\t5\t1\t2\na\t100.00\t8\t9\nC\t5.0000001\t3\t4\nB\t0\t5\t6";
+    Paste(
+        1, 1, text,
+        [&](QDialog& dialog) {
+            byPlace(dialog);
+            dialog.findChild<QCheckBox*>("leaveOut")->click();
+        },
+        QDialogButtonBox::Ok, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(listed, QStringList({"1|Chainage|100|The copied lines 1, 3 have the same place.",
+                                   "2|Chainage|5|The copied lines 2, 4 have the same place.",
+                                   "3|Chainage|100.00|The copied lines 1, 3 have the same place.",
+                                   "4|Chainage|5.0000001|The copied lines 2, 4 have the same place."}));
+    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 100 20 2, B 0 5 6");
+    document.UndoStack().undo();
+    Paste(
+        1, 1, text,
+        [&](QDialog& dialog) {
+            byPlace(dialog);
+            Mend(dialog, 0, "0");
+            Mend(dialog, 0, "6");
+        },
+        QDialogButtonBox::Ok, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(Stored().toStdString(), "A 0 7 8, A 100 8 9, B 0 5 6, C 6 1 2, C 5.0000001 3 4") << "both can be mended";
+}
+
+TEST_F(PasteTest, NoLineLosesItsBranchUnasked)
+{
+    QStringList listed;
+    const auto look = [&](QDialog& dialog) {
+        listed = Listed(dialog);
+        if (auto* leaveOut = dialog.findChild<QCheckBox*>("leaveOut"); leaveOut->isVisible())
+            leaveOut->click();
+    };
+    const char* const reason = "A line needs the name of its branch.";
+    Paste(1, 1, "A\t0\t4\n\t200\t5\nB\t300\t6", look); // a branch in the first line of a block only
+    EXPECT_EQ(listed, QStringList(QString("2|River Name||") + reason));
+    EXPECT_EQ(Stored().toStdString(), "A 0 4 1, A 100 20 2, B 300 6 3");
+    document.UndoStack().undo();
+    Paste(1, 1, "A\n\nC", look); // of a single column it is a cell
+    EXPECT_EQ(listed, QStringList(QString("2|River Name||") + reason));
+    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 100 20 2, C 0 30 3");
+    document.UndoStack().undo();
+    Paste(2, 1, "\u200B \t1", look, QDialogButtonBox::Cancel); // nobody sees it
+    EXPECT_TRUE(asked);
+    Paste(1, 1, "\n \t\nX\t1\n\nY\t2\n\t\nZ\t3", look);
+    EXPECT_FALSE(asked) << "blank lines are none";
+    EXPECT_EQ(Stored().toStdString(), "X 1 10 1, Y 2 20 2, Z 3 30 3");
+    EXPECT_EQ(said.toStdString(), "6 cells pasted; left out: 4 blank lines");
+    document.UndoStack().undo();
+    QString summary;
+    Paste(
+        1, 1, "X\t1\n\nY\tb",
+        [&](QDialog& dialog) {
+            summary = Summary(dialog);
+            listed = Listed(dialog);
+        },
+        QDialogButtonBox::Cancel);
+    EXPECT_EQ(summary.toStdString(), "2 lines were copied. 0 lines are new. 1 blank line is left out.");
+    EXPECT_TRUE(listed.join("").startsWith("3|Chainage|b|")) << "the lines are counted as they were copied";
+    // The cell that is cleared may be one with a name, too.
+    Paste(2, 1, "\n", look);
+    EXPECT_EQ(listed, QStringList(QString("1|River Name||") + reason));
+    EXPECT_FALSE(canPaste) << "nothing remains";
+}
+
+TEST_F(PasteTest, LinesThatSomethingElseDividesAreNoNames)
+{
+    for (const char* text : {"A,0,1.5,2\nB,100,2.5,3", "A|0|1.5|2\n\nB|100|2.5|3", "A;0;1.5;2\nB;100;2.5;3"}) {
+        Paste(1, 1, text);
+        EXPECT_TRUE(asked) << text;
+        EXPECT_EQ(Stored().toStdString(), "A 0 1.5 2, B 100 2.5 3, B 0 30 3") << text;
+        document.UndoStack().undo();
+    }
+    for (const char* text : {"C;7;1;2", "C,7,1,2", "C|7|1|2"}) {
+        Paste(1, 1, text);
+        EXPECT_TRUE(asked) << text;
+        EXPECT_EQ(Stored().toStdString(), "C 7 1 2, A 100 20 2, B 0 30 3") << text;
+        document.UndoStack().undo();
+    }
+    Paste(1, 1, "RHINE, UPPER");
+    EXPECT_FALSE(asked) << "a name";
+    init.GetAt(0).RiverName = "A;1";
+    init.GetAt(1).RiverName = "B;2";
+    grid->Refresh();
+    grid->SetCurrentCell(1, 1);
+    grid->selectionModel()->select(QItemSelection(grid->model()->index(0, 0), grid->model()->index(1, 0)),
+                                   QItemSelectionModel::ClearAndSelect);
+    QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier);
+    Paste(2, 1, {});
+    EXPECT_FALSE(asked) << "cells of a table of the program are known";
+    EXPECT_EQ(Stored().section(", ", 1).toStdString(), "A;1 100 20 2, B;2 0 30 3");
+}
+
+TEST_F(PasteTest, UnitsMayStandInALineOfTheirOwn)
+{
+    for (const char* text : {"River Name\tChainage\tInitial h\n\t[km]\t[ft]\nX\t1\t10\nY\t2\t20",
+                             "River Name\tChainage\tInitial h\n-\tkm\tft\nX\t1\t10\nY\t2\t20",
+                             "who\twhere\tdeep\n\t(km)\tft\nX\t1\t10\nY\t2\t20"}) {
+        Paste(1, 1, text);
+        EXPECT_TRUE(asked) << text;
+        EXPECT_EQ(Stored().toStdString(), "X 1000 3.048 1, Y 2000 6.096 2, B 0 30 3") << text;
+        document.UndoStack().undo();
+    }
+    Paste(1, 1, "River Name\tChainage\tInitial h\n\t[m]\t[m]\nX\t1\t10");
+    EXPECT_FALSE(asked) << "they are the units shown";
+    EXPECT_EQ(Stored().toStdString(), "X 1 10 1, A 100 20 2, B 0 30 3");
+    document.UndoStack().undo();
+    QString understood;
+    Paste(1, 2, "Chainage\tInitial h\n[km]\t[m]\n1\t2", [&](QDialog& dialog) {
+        auto* units = dialog.findChild<QCheckBox*>("units");
+        units->click(); // the user knows better
+        understood = Listed(dialog).join("/");
+        units->click();
+    });
+    EXPECT_EQ(understood.toStdString(),
+              "2|Chainage|[km]|Floating point number required/2|Initial h|[m]|Floating point number required");
+    EXPECT_EQ(Stored().toStdString(), "A 1000 2 1, A 100 20 2, B 0 30 3");
+    document.UndoStack().undo();
+    Paste(1, 1, "River Name\tChainage\tInitial h\nA\tm\tm\nX\t1\t10", [&](QDialog& dialog) {
+        understood = Listed(dialog).join("/");
+        dialog.findChild<QCheckBox*>("leaveOut")->click();
+    });
+    EXPECT_TRUE(understood.startsWith("2|Chainage|m|")) << "A names a branch: " << understood.toStdString();
+    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, X 1 10 2, B 0 30 3") << "no line goes where another one would";
+}
+
+TEST_F(PasteTest, WhatIsOfAnotherQuantityIsAskedAbout)
+{
+    grid->SetCurrentCell(1, 4);
+    grid->selectionModel()->select(QItemSelection(grid->model()->index(0, 3), grid->model()->index(1, 3)),
+                                   QItemSelectionModel::ClearAndSelect);
+    QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier);
+    QString summary;
+    bool isMarked = false;
+    const auto look = [&](QDialog& dialog) {
+        summary = Summary(dialog);
+        isMarked = !dialog.findChild<QTableWidget*>()->item(0, 0)->icon().isNull();
+    };
+    Paste(1, 3, {}, look);
+    EXPECT_TRUE(asked && isMarked && !canPaste);
+    EXPECT_TRUE(summary.contains("\"m³/s\" is no unit of \"Initial h\". Possible are m")) << summary.toStdString();
+    Paste(1, 3, "Flow [m3/s]\n7\n8", look);
+    EXPECT_TRUE(asked && isMarked && !canPaste);
+    EXPECT_EQ(Stored().toStdString(), before);
+    Paste(1, 3, "Flow [m3/s]\n7\n8", [&](QDialog& dialog) {
+        auto* unit = qobject_cast<QComboBox*>(dialog.findChild<QTableWidget*>()->cellWidget(0, 2));
+        unit->setCurrentIndex(unit->findText("m"));
+        emit unit->activated(unit->currentIndex());
+        look(dialog);
+    });
+    EXPECT_FALSE(isMarked);
+    EXPECT_EQ(Stored().toStdString(), "A 0 7 1, A 100 8 2, B 0 30 3") << "as the user says";
+    document.UndoStack().undo();
+    Paste(1, 3, "Depth [ft]\n10", look);
+    EXPECT_EQ(Stored().toStdString(), "A 0 3.048 1, A 100 20 2, B 0 30 3") << "a unit of the column's";
+}
+
+TEST_F(PasteTest, WhatNobodySeesIsNoPartOfNamesAndNumbers)
+{
+    Paste(1, 1, " x \u200B\t 1 \t\uFEFF2\t3\u00AD\u2060\u00A0");
+    EXPECT_FALSE(asked);
+    EXPECT_EQ(Stored().toStdString(), "X 1 2 3, A 100 20 2, B 0 30 3");
+    document.UndoStack().undo();
+    Paste(1, 2, "\uFEFFInitial\u00A0h\n 1 ft ");
+    EXPECT_EQ(Stored().toStdString(), "A 0 0.3048 1, A 100 20 2, B 0 30 3");
+}
+
+TEST_F(PasteTest, AnEmptyCellIsCopiedAsOne)
+{
+    document.Parameters().Global.G_waterlevel = 3.5;
+    Add("D", NotGiven);
+    grid->Refresh();
+    grid->SetCurrentCell(4, 2);
+    QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier);
+    EXPECT_EQ(QGuiApplication::clipboard()->text(), "");
+    Paste(1, 3, {});
+    EXPECT_FALSE(asked);
+    EXPECT_EQ(init.GetAt(0).InitialH, 3.5) << "as a cleared one";
+    grid->SetCurrentCell(2, 3);
+    grid->selectionModel()->select(QItemSelection(grid->model()->index(1, 1), grid->model()->index(2, 2)),
+                                   QItemSelectionModel::ClearAndSelect);
+    QTest::keyClick(grid, Qt::Key_V, Qt::ControlModifier);
+    EXPECT_EQ(Stored().toStdString(), "A 0 3.5 1, A 10000000000 3.5 2, B 10000000000 3.5 3, D 10000000000 0 0");
+    QGuiApplication::clipboard()->setText(QString());
+    EXPECT_FALSE(CanPasteCells(*grid)) << "nothing is on it";
+}
+
+TEST_F(PasteTest, MendingATextKeepsTheDigitsOfTheOthers)
+{
+    init.GetAt(0).InitialH = 1.0 / 3;
+    init.GetAt(1).RiverName = "";
+    grid->Refresh();
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    grid->selectionModel()->select(QItemSelection(grid->model()->index(0, 0), grid->model()->index(1, 3)),
+                                   QItemSelectionModel::ClearAndSelect);
+    QTest::keyClick(grid, Qt::Key_C, Qt::ControlModifier);
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    Paste(3, 1, {}, [](QDialog& dialog) { Mend(dialog, 0, "M"); });
+    ASSERT_EQ(init.GetCount(), 4u);
+    EXPECT_EQ(init.GetAt(2).InitialH, 1.0 / 3);
+    EXPECT_EQ(init.GetAt(3).RiverName, "M");
+    document.UndoStack().undo();
+    // What is mended is no longer what was copied.
+    QGuiApplication::clipboard()->setMimeData(
+        ToClipboard({{"x", "10"}},
+                    {{grid->Model()->Column(1).style.Group(), "ft"}, {grid->Model()->Column(2).style.Group(), "ft"}},
+                    {{"3", "3.048"}})
+            .release());
+    Paste(3, 2, {}, [](QDialog& dialog) { Mend(dialog, 0, "20"); });
+    EXPECT_EQ(Stored().section(", ", 2).toStdString(), "B 6.096 3.048 3");
 }
 
 TEST_F(PasteTest, ValuesTravelWithTheirUnitsAndEveryDigit)
@@ -478,6 +713,28 @@ TEST_F(PasteTest, DigitsTravelBesideAColumnWithoutUnit)
         EXPECT_EQ(winds.GetAt(line + 6).Chainage, winds.GetAt(line).Chainage);
 }
 
+TEST_F(PasteTest, WhatWasPastedIsSelectedAndNothingElse)
+{
+    Add("A", 50, 40, 4);
+    grid->ChangeView([](CGridModel& model) {
+        model.SortBy({{0}, {1}});
+        model.Filter({"A"});
+    });
+    const auto byPlace = [](QDialog& dialog) { Choose(dialog, "place", 2); };
+    const auto held = Qt::ControlModifier | Qt::ShiftModifier;
+    const auto block = [this] { return grid->SelectedBlock().value_or(QItemSelectionRange()); };
+    Paste(1, 1, "B\t0\t7\nA\t100\t8", byPlace, QDialogButtonBox::Ok, held); // the first one is hidden
+    EXPECT_EQ(Stored().toStdString(), "A 0 10 1, A 100 8 2, B 0 7 3, A 50 40 4");
+    EXPECT_LE(block().height(), 1);
+    EXPECT_EQ(Current(), std::pair(3, 1)) << "the first that is shown";
+    document.UndoStack().undo();
+    Paste(3, 1, "A\t100\t8\nA\t0\t9", byPlace, QDialogButtonBox::Ok, held); // another one stands between them
+    EXPECT_LE(block().height(), 1);
+    document.UndoStack().undo();
+    Paste(1, 1, "A\t100\t8\nA\t50\t9", byPlace, QDialogButtonBox::Ok, held);
+    EXPECT_EQ(std::pair(block().top(), block().bottom()), std::pair(1, 2)) << "one below the other, whatever the order";
+}
+
 TEST_F(PasteTest, OnlyWhatIsShownIsOverwritten)
 {
     grid->ChangeView([](CGridModel& model) { model.Filter({"A"}); });
@@ -535,5 +792,6 @@ TEST(Separator, IsThatWhichDividesEveryLineAlike)
     EXPECT_EQ(of("a;b\nc"), '\t') << "a line has none";
     EXPECT_EQ(of("a;b\nc;d\te"), '\t') << "a tab divides another line";
     EXPECT_EQ(of("1,234\n2,345"), '\t') << "numbers";
+    EXPECT_EQ(of("a;b\n\nc;d"), ';') << "a blank line is none";
     EXPECT_EQ(of("a"), '\t');
 }

@@ -90,6 +90,29 @@ TEST_F(ShellTest, CutCopyAndPasteActOnTheFieldWithTheFocus)
     EXPECT_EQ(edit->text(), "texttext");
 }
 
+TEST_F(ShellTest, TheEditMenuHasWhatTheActiveViewAddsBelowPaste)
+{
+    const auto before = Menu(1)->actions();
+    frame->OpenFile(Write("a.tst"));
+    frame->OpenFile(Write("b.tst")); // filled again
+    emit Menu(1)->aboutToShow();
+    const auto entries = Menu(1)->actions();
+    ASSERT_EQ(entries.size(), before.size() + 2);
+    const auto paste = entries.indexOf(Action("actionPaste"));
+    QAction* first = entries.value(paste + 1);
+    EXPECT_EQ(first->text(), "Insert Too\tCtrl+C");
+    EXPECT_TRUE(first->shortcut().isEmpty()) << "the key is that of what has the focus";
+    EXPECT_TRUE(first->isEnabled());
+    EXPECT_FALSE(entries.value(paste + 2)->isEnabled());
+    EXPECT_TRUE(entries.value(paste + 3)->isSeparator());
+    first->trigger();
+    EXPECT_EQ(frame->ActiveDocument()->UndoStack().count(), 1);
+    answers = {QMessageBox::Discard};
+    Action("actionCloseAll")->trigger();
+    Settle();
+    EXPECT_EQ(Menu(1)->actions(), before);
+}
+
 TEST_F(ShellTest, TheWindowMenuListsTheWindows)
 {
     frame->OpenFile(Write("a&b.tst"));

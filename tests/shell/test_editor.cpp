@@ -90,6 +90,10 @@ public:
     {
         return {{1, "&Insert", QKeySequence(Qt::CTRL | Qt::Key_I)}, {}, {2, "Tell"}, {3, "Impossible"}};
     }
+    std::vector<CKsMenuCommand> EditMenu() const override
+    {
+        return {{1, "Insert Too", QKeySequence(Qt::CTRL | Qt::Key_C)}, {3, "Impossible", QKeySequence(Qt::Key_F2)}};
+    }
 };
 
 } // namespace

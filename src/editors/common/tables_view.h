@@ -27,6 +27,7 @@ public:
     bool MayLeave(KsLeave what) override;
     bool OnCommand(int id) override;
     bool IsCommandEnabled(int id) const override;
+    std::vector<CKsMenuCommand> EditMenu() const override { return CGridCommands::ClipboardMenu(); }
 
     // IGridHost
     bool LeaveField() override { return MayLeave(KsLeave::Field); }

@@ -6,8 +6,8 @@
 #include "ks/fc/branch_name.h"
 #include "ks/language/language.h"
 
+#include <map>
 #include <numeric>
-#include <set>
 
 namespace {
 
@@ -48,21 +48,22 @@ public:
         }
     }
     bool HasRules() const override { return true; }
-    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    std::vector<Fault> FindFaults(std::size_t first, IRowBlock& rows, std::size_t most) const override
     {
-        std::set<decltype(CCrossSection().Key())> taken; // by the others
+        std::map<decltype(CCrossSection().Key()), std::optional<std::size_t>> taken; // by one of `rows`, or by another
         for (std::size_t row = 0; row < Count(); ++row) {
             if (row < first || row >= first + rows.Count())
-                taken.insert(Rows()[row].Key());
+                taken.emplace(Rows()[row].Key(), std::nullopt);
         }
-        for (std::size_t i = 0; i < rows.Count(); ++i) {
+        std::vector<Fault> faults;
+        for (std::size_t i = 0; i < rows.Count() && faults.size() < most; ++i) {
             const auto& section = *static_cast<const CCrossSection*>(rows.At(i));
             if (section.branch.empty())
-                return Fault{i, ::FindFault(section).text};
-            if (!taken.insert(section.Key()).second)
-                return Fault{i, WhyTaken(section)};
+                faults.push_back({i, ::FindFault(section).text, FieldOf(&CCrossSection::branch).name});
+            else if (const auto [other, isFree] = taken.emplace(section.Key(), i); !isFree)
+                faults.push_back({i, WhyTaken(section), FieldOf(&CCrossSection::chainage).name, other->second});
         }
-        return std::nullopt;
+        return faults;
     }
 
 private:
@@ -111,19 +112,28 @@ public:
     }
     bool IsSequence() const override { return true; }
     bool HasRules() const override { return true; }
-    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    std::vector<Fault> FindFaults(std::size_t first, IRowBlock& rows, std::size_t most) const override
     {
-        CCrossSection section;
-        section.branch = "-";
-        section.points = Rows();
-        section.points.resize(std::max(section.points.size(), first + rows.Count()));
-        for (std::size_t i = 0; i < rows.Count(); ++i)
-            section.points[first + i] = *static_cast<const CSectionPoint*>(rows.At(i));
-        const CSectionFault fault = ::FindFault(section);
-        if (fault.text.isEmpty())
-            return std::nullopt;
-        const std::size_t at = std::size_t(std::max(fault.point, 0)); // or it is the point above that is too far
-        return Fault{std::min(at > first ? at - first : 0, rows.Count() - 1), fault.text};
+        const auto fault = [](std::size_t row, std::optional<std::size_t> with) {
+            return Fault{row, SectionRule(CSectionFault::Point), FieldOf(&CSectionPoint::offset).name, with};
+        };
+        const CSectionPoint* last = first > 0 ? &Rows()[first - 1] : nullptr;
+        std::optional<std::size_t> lastRow;
+        std::vector<Fault> faults;
+        for (std::size_t i = 0; i < rows.Count() && faults.size() < most; ++i) {
+            const auto* point = static_cast<const CSectionPoint*>(rows.At(i));
+            if (last && last->offset > point->offset) {
+                faults.push_back(fault(i, lastRow));
+                continue;
+            }
+            last = point;
+            lastRow = i;
+        }
+        const std::size_t behind = first + rows.Count();
+        const bool isTooFar = lastRow && behind < Count() && last->offset > Rows()[behind].offset;
+        if (isTooFar && faults.size() < most)
+            faults.push_back(fault(*lastRow, std::nullopt));
+        return faults;
     }
 };
 

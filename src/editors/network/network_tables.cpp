@@ -7,9 +7,10 @@
 #include "ks/fc/branch_name.h"
 #include "ks/language/language.h"
 
-#include <QSet>
+#include <QHash>
 #include <algorithm>
 #include <numeric>
+#include <unordered_map>
 
 namespace {
 
@@ -32,20 +33,30 @@ public:
 
     bool MayGrow() const override { return false; }
     bool HasRules() const override { return true; }
-    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    std::vector<Fault> FindFaults(std::size_t first, IRowBlock& rows, std::size_t most) const override
     {
         CBranchKeys taken; // by the others
         for (std::size_t row = 0; row < Count(); ++row) {
             if (row < first || row >= first + rows.Count())
                 taken.insert(KsBranchKey(Rows()[row].Name()));
         }
-        for (std::size_t i = 0; i < rows.Count(); ++i) {
+        std::unordered_map<QString, std::size_t> rowOf;
+        std::vector<Fault> faults;
+        for (std::size_t i = 0; i < rows.Count() && faults.size() < most; ++i) {
             const auto& branch = *static_cast<const CNetworkBranch*>(rows.At(i));
-            if (const CBranchFault fault = ::FindFault(branch, taken); fault.rule != CBranchFault::None)
-                return Fault{i, Sentence(fault.Text())};
-            taken.insert(KsBranchKey(branch.Name()));
+            const QString key = KsBranchKey(branch.Name());
+            if (const CBranchFault fault = ::FindFault(branch, taken); fault.rule != CBranchFault::None) {
+                const Field& field = fault.rule == CBranchFault::EndsDiffer ? FieldOf(&CNetworkBranch::end)
+                                                                            : FieldOf(&CNetworkBranch::name);
+                const auto other = rowOf.find(key);
+                faults.push_back({i, Sentence(fault.Text()), field.name,
+                                  other == rowOf.end() ? std::nullopt : std::optional(other->second)});
+                continue;
+            }
+            taken.insert(key);
+            rowOf.emplace(key, i);
         }
-        return std::nullopt;
+        return faults;
     }
 };
 
@@ -88,20 +99,23 @@ public:
         }
     }
     bool HasRules() const override { return true; }
-    std::optional<Fault> FindFault(std::size_t first, IRowBlock& rows) const override
+    std::vector<Fault> FindFaults(std::size_t first, IRowBlock& rows, std::size_t most) const override
     {
-        QSet<double> taken; // by the others
+        QHash<double, std::optional<std::size_t>> taken; // by one of `rows`, or by another
         for (std::size_t row = 0; row < Count(); ++row) {
             if (row < first || row >= first + rows.Count())
-                taken.insert(Rows()[row].chainage);
+                taken.insert(Rows()[row].chainage, std::nullopt);
         }
-        for (std::size_t i = 0; i < rows.Count(); ++i) {
+        std::vector<Fault> faults;
+        for (std::size_t i = 0; i < rows.Count() && faults.size() < most; ++i) {
             const double chainage = static_cast<const CChannelRow*>(rows.At(i))->chainage;
-            if (taken.contains(chainage))
-                return Fault{i, NetworkTables::tr("There is a line at this chainage already.")};
-            taken.insert(chainage);
+            if (const auto other = taken.constFind(chainage); other != taken.constEnd())
+                faults.push_back({i, NetworkTables::tr("There is a line at this chainage already."),
+                                  FieldOf(&CChannelRow::chainage).name, *other});
+            else
+                taken.insert(chainage, i);
         }
-        return std::nullopt;
+        return faults;
     }
     bool IsSequence() const override { return true; }
     bool MayMove() const override { return false; } // the chainage says where

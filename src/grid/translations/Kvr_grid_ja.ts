@@ -906,14 +906,6 @@
         <translation>並べ替えと絞り込み</translation>
     </message>
     <message>
-        <source>1 left out</source>
-        <translation>1 個は除外</translation>
-    </message>
-    <message>
-        <source>%1 left out</source>
-        <translation>%1 個は除外</translation>
-    </message>
-    <message>
         <source>Paste with Preview...</source>
         <translation>確認して貼り付け...</translation>
     </message>
@@ -1032,14 +1024,6 @@
     <message>
         <source>%1 lines are new.</source>
         <translation>新しい行は %1 行です。</translation>
-    </message>
-    <message>
-        <source>&amp;Leave out the one that does not fit</source>
-        <translation>受け入れられない 1 個を除外(&amp;L)</translation>
-    </message>
-    <message>
-        <source>&amp;Leave out the %1 that do not fit</source>
-        <translation>受け入れられない %1 個を除外(&amp;L)</translation>
     </message>
     <message>
         <source>Copied: %1</source>
@@ -1168,6 +1152,70 @@
     <message>
         <source>Only lines can be reverted; global values can be undone.</source>
         <translation>保存時の値に戻せるのは行だけです。全体値は元に戻す操作で戻せます。</translation>
+    </message>
+    <message>
+        <source>left out: %1</source>
+        <translation>除外: %1</translation>
+    </message>
+    <message>
+        <source>1 line</source>
+        <translation>1 行</translation>
+    </message>
+    <message>
+        <source>%1 lines</source>
+        <translation>%1 行</translation>
+    </message>
+    <message>
+        <source>1 cell</source>
+        <translation>1 個のセル</translation>
+    </message>
+    <message>
+        <source>%1 cells</source>
+        <translation>%1 個のセル</translation>
+    </message>
+    <message>
+        <source>The line below has their &amp;units</source>
+        <translation>次の行は単位(&amp;U)</translation>
+    </message>
+    <message>
+        <source>1 blank line is left out.</source>
+        <translation>空白行 1 行は除外されます。</translation>
+    </message>
+    <message>
+        <source>%1 blank lines are left out.</source>
+        <translation>空白行 %1 行は除外されます。</translation>
+    </message>
+    <message>
+        <source>&amp;Leave out what does not fit: %1</source>
+        <translation>受け入れられないものを除外(&amp;L): %1</translation>
+    </message>
+    <message>
+        <source>1 blank line</source>
+        <translation>空白行 1 行</translation>
+    </message>
+    <message>
+        <source>%1 blank lines</source>
+        <translation>空白行 %1 行</translation>
+    </message>
+    <message>
+        <source>It may not fit with lines that are left out.</source>
+        <translation>除外した行とは合わない可能性があります。</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no unit of &quot;%2&quot;, which has none.</source>
+        <translation>「%2」には単位がなく、「%1」は使えません。</translation>
+    </message>
+    <message>
+        <source>The line does not tell its place.</source>
+        <translation>行に場所が示されていません。</translation>
+    </message>
+    <message>
+        <source>The copied lines %1 have the same place.</source>
+        <translation>コピーした %1 行目は同じ場所です。</translation>
+    </message>
+    <message>
+        <source>A line needs the name of its branch.</source>
+        <translation>行には河川名が必要です。</translation>
     </message>
 </context>
 </TS>

@@ -1,21 +1,12 @@
 #include "ks/fc/branch_name.h"
 
+#include "ks/fc/shown_text.h"
+
 #include <algorithm>
-
-namespace {
-
-bool IsDirectionMark(QChar c)
-{
-    return c == u'\u200E' || c == u'\u200F' || (c >= u'\u202A' && c <= u'\u202E') || (c >= u'\u2066' && c <= u'\u2069');
-}
-
-} // namespace
 
 CString KsBranchKey(const CString& name)
 {
-    CString key = name;
-    key.removeIf(IsDirectionMark);
-    return key.trimmed().toUpper();
+    return KsWithoutUnseen(name).trimmed().toUpper();
 }
 
 bool KsSameBranch(const CString& a, const CString& b)

@@ -5,7 +5,7 @@
 #include "ks/ks_export.h"
 
 /// A name as a cell for branch names stores what was typed or pasted: in capitals, without blanks around it and without
-/// marks of the writing direction, which nobody sees. Names of which this is the same are one branch, so it is the key
+/// characters that nobody sees (KsWithoutUnseen). Names of which this is the same are one branch, so it is the key
 /// for looking one up.
 KS_API CString KsBranchKey(const CString& name);
 /// Whether two names mean one branch.

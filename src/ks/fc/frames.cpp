@@ -36,6 +36,11 @@ std::vector<CKsMenuCommand> CCommandTarget::LinesMenu() const
     return {};
 }
 
+std::vector<CKsMenuCommand> CCommandTarget::EditMenu() const
+{
+    return {};
+}
+
 // ---- document window ---------------------------------------------------------------------------
 
 CKsMDIChildWnd::CKsMDIChildWnd(QWidget* parent) : QMdiSubWindow(parent)

@@ -18,7 +18,7 @@ inline constexpr int Copy = 57634, Cut = 57635, Paste = 57637, Help = 57670;
 inline constexpr int FindField = 57680; // leads to a page or a field by its name
 } // namespace KsCommand
 
-/// A command of a view in the frame's "Lines" menu. Without a text it is a separator.
+/// A command of a view in the frame's "Edit" or "Lines" menu. Without a text it is a separator.
 struct CKsMenuCommand
 {
     int id = 0;
@@ -39,6 +39,9 @@ public:
     virtual bool IsCommandEnabled(int id) const;
     /// What the third menu of the frame shows while this view is active; nothing greys the menu.
     virtual std::vector<CKsMenuCommand> LinesMenu() const;
+    /// What the Edit menu shows below Paste while this view is active. The keys belong to what has the focus: they are
+    /// only shown.
+    virtual std::vector<CKsMenuCommand> EditMenu() const;
 };
 
 /// A document window: holds one view. Closing it asks to save when it is the document's last.

@@ -17,6 +17,14 @@ bool HidesSomething(QChar c, bool lines)
     return control || direction;
 }
 
+/// Marks of the writing direction; soft hyphen, blank of no width, word joiner, mark of the byte order.
+bool HasNoWidth(QChar c)
+{
+    const char16_t code = c.unicode();
+    return code == 0x200E || code == 0x200F || (code >= 0x202A && code <= 0x202E) ||
+           (code >= 0x2066 && code <= 0x2069) || code == 0x00AD || code == 0x200B || code == 0x2060 || code == 0xFEFF;
+}
+
 /// Qt takes a text for rich when it looks so. Every label, and that of a tool tip is one, is told otherwise before it
 /// is shown for the first time.
 class PlainLabels : public QObject
@@ -49,6 +57,11 @@ CString KsVisibleText(CString text, bool lines)
         if (HidesSomething(c, lines))
             c = QChar::ReplacementCharacter;
     return text;
+}
+
+CString KsWithoutUnseen(CString text)
+{
+    return text.removeIf(HasNoWidth);
 }
 
 CString KsWithoutMnemonics(CString text)

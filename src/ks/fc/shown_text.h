@@ -11,6 +11,8 @@
 /// The text with U+FFFD for what cannot be seen and changes what can: control characters and those that turn the
 /// direction of writing for what follows. Line feeds and tabs stay with `lines`.
 KS_API CString KsVisibleText(CString text, bool lines = false);
+/// The text without marks of the writing direction and other characters of no width, which nobody sees.
+KS_API CString KsWithoutUnseen(CString text);
 /// For menus, tabs and labels with a buddy: every & is one, and marks no letter to press with Alt.
 KS_API CString KsWithoutMnemonics(CString text);
 /// For window titles: [*] is no place for the mark of what is modified.

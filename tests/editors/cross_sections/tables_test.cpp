@@ -341,8 +341,8 @@ TEST_F(CrossSectionTest, LinesGoToASpreadsheetAndPointsComeBack)
                           {"1\t110\r\n2\t109\r\n3\t100\r\n4\t100\r\n5\t110\r\n", nullptr, 5},
                           {"0\t110\nend\t1\n", "2|Offset [m]|end|Floating point number required", 4},
                           {"0\t110\t3", "", 4}, // a column too many
-                          {"0\t1\n9\t1\n8\t1", "3||8|expected offsets", 4},
-                          {"11\t110", "1||11|expected offsets", 4}};
+                          {"0\t1\n9\t1\n8\t1", "3|Offset [m]|8|expected offsets", 4},
+                          {"11\t110", "1|Offset [m]|11|expected offsets", 4}};
     for (const Case& each : cases) {
         Select(table, 0);
         clipboard->setText(each.text);

@@ -204,29 +204,88 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     EXPECT_EQ(chainages(), "2000 4000 6000");
 }
 
-/// Each of them is looked for among all lines; after a number of them the others are not known.
-TEST_F(NetworkTest, NothingIsPastedWhileSomeOfWhatDoesNotFitIsNotKnown)
+TEST_F(NetworkTest, LinesThatDoNotFitWithOthersAreToldMendedOrLeftOut)
 {
     CNetworkView* view = Open();
     CGenGrid* channel = view->Channel();
     channel->setFocus();
-    bool mayPaste = false;
-    for (const int lines : {10, 30}) {
-        QString text = "2000\n4000\n6000\n7000\n";
-        for (int line = 0; line < lines; ++line)
-            text += "7000\n";
+    const auto chainages = [channel] {
+        QStringList texts;
+        for (int row = 0; row < channel->model()->rowCount(); ++row)
+            texts << Text(channel, row, ChannelChainage);
+        return texts.join(' ').toStdString();
+    };
+    const std::string before = chainages();
+    QStringList listed;
+    QString asked;
+    const auto paste = [&](const QString& text, const std::function<void(QDialog&)>& act) {
         QGuiApplication::clipboard()->setText(text);
         channel->SetCurrentCell(1, 1);
-        QTimer::singleShot(0, view, [&mayPaste] {
+        QTimer::singleShot(0, view, [&listed, &asked, act] {
             auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
             ASSERT_TRUE(dialog);
-            dialog->findChild<QCheckBox*>("leaveOut")->click();
-            mayPaste = dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->isEnabled();
-            dialog->reject();
+            act(*dialog);
+            auto* ok = dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok);
+            EXPECT_TRUE(ok->isEnabled());
+            ok->click();
+            if (dialog->isVisible())
+                dialog->reject();
         });
         QTest::keyClick(channel, Qt::Key_V, Qt::ControlModifier);
-        EXPECT_EQ(mayPaste, lines == 10) << lines;
-    }
+        QCoreApplication::processEvents();
+    };
+    const auto list = [&](const QDialog& dialog) {
+        listed.clear();
+        for (auto* faults : dialog.findChildren<QTableView*>())
+            for (int row = 0; faults->accessibleName() == "What does not fit" && row < faults->model()->rowCount();
+                 ++row)
+                listed << faults->model()->index(row, 0).data().toString() + ' ' +
+                              faults->model()->index(row, 2).data().toString();
+    };
+    const auto leaveOut = [&](QDialog& dialog) {
+        list(dialog);
+        auto* box = dialog.findChild<QCheckBox*>("leaveOut");
+        asked = box->text();
+        box->click();
+    };
+    QString text = "100\n200\n300\n400\n"; // however many
+    for (int line = 0; line < 50; ++line)
+        text += "400\n";
+    paste(text, leaveOut);
+    EXPECT_EQ(asked.toStdString(), "&Leave out what does not fit: 50 lines");
+    EXPECT_EQ(chainages(), "100 200 300 400");
+    view->Document()->UndoStack().undo();
+
+    // What is left out keeps its place, for which another one does not fit. Both can be mended.
+    paste("100\n6000\n100", leaveOut);
+    EXPECT_EQ(listed, QStringList({"2 6000", "3 100"}));
+    EXPECT_EQ(chainages(), "100 4000 6000");
+    view->Document()->UndoStack().undo();
+    paste("100\n6000\n100", [&](QDialog& dialog) {
+        for (auto* faults : dialog.findChildren<QTableView*>())
+            if (faults->accessibleName() == "What does not fit") {
+                EXPECT_TRUE(faults->model()->setData(faults->model()->index(1, 2), "7000"));
+            }
+        QCoreApplication::processEvents(); // the list is made anew when its editor has gone
+    });
+    EXPECT_EQ(chainages(), "100 6000 7000");
+    view->Document()->UndoStack().undo();
+
+    // So do many, one because of the other.
+    text = "9000";
+    for (int line = 29; line > 0; --line)
+        text.prepend(QString("%1\n").arg(100 * line));
+    QGuiApplication::clipboard()->setText(text);
+    channel->SetCurrentCell(1, 1);
+    QTest::keyClick(channel, Qt::Key_V, Qt::ControlModifier);
+    const std::string thirty = chainages();
+    text = text.section('\n', 1) + "\n200\n9999";
+    paste(text, leaveOut);
+    EXPECT_EQ(asked.toStdString(), "&Leave out what does not fit: 30 lines");
+    EXPECT_EQ(chainages(), thirty + " 9999");
+    while (view->Document()->UndoStack().canUndo())
+        view->Document()->UndoStack().undo();
+    EXPECT_EQ(chainages(), before);
 }
 
 TEST_F(NetworkTest, WhatCannotBeStoredStaysInItsEditorAndIsToldOnce)
