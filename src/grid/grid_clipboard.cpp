@@ -146,22 +146,28 @@ std::optional<PasteDecision> WithoutAsking(const CTableRows& rows, const PasteSt
     return DecisionOf(plan);
 }
 
+/// Rows of the table as it is shown; none by itself.
+struct ShownLines
+{
+    int top = 0, bottom = -1;
+};
+
 /// Where the lines are shown, if they stand there one below the other, and all of them.
-std::optional<std::pair<int, int>> ShownBlock(const CGridModel& model, const std::vector<std::size_t>& rows)
+ShownLines ShownBlock(const CGridModel& model, const std::vector<std::size_t>& rows)
 {
     std::vector<bool> isPasted(std::size_t(model.rowCount()));
     int top = model.rowCount(), bottom = -1;
     for (const std::size_t row : rows) {
         const int shown = model.ShownRow(row);
         if (shown < 0)
-            return std::nullopt;
+            return {};
         isPasted[std::size_t(shown)] = true;
         top = std::min(top, shown);
         bottom = std::max(bottom, shown);
     }
     const bool isWhole =
         std::find(isPasted.begin() + top, isPasted.begin() + bottom, false) == isPasted.begin() + bottom;
-    return isWhole ? std::optional(std::pair(top, bottom)) : std::nullopt;
+    return isWhole ? ShownLines{top, bottom} : ShownLines();
 }
 
 /// Brings the pasted columns into sight, the first ones rather than the last. Those that are frozen are.
@@ -184,19 +190,20 @@ void ShowPasted(CGenGrid& grid, const PastedCells& cells)
 {
     const CGridModel& model = *grid.Model();
     const auto [left, right] = std::ranges::minmax(cells.columns, {}, &PastedCells::Column::column);
-    const auto block =
-        right.column - left.column + 1 == int(cells.columns.size()) ? ShownBlock(model, cells.rows) : std::nullopt;
+    const bool areBeside = right.column - left.column + 1 == int(cells.columns.size());
+    const ShownLines block = areBeside ? ShownBlock(model, cells.rows) : ShownLines();
+    const bool isBlock = block.top <= block.bottom;
     const auto shown = std::ranges::find_if(cells.rows, [&model](std::size_t row) { return model.ShownRow(row) >= 0; });
     if (shown == cells.rows.end())
         return;
-    const int top = block ? block->first : model.ShownRow(*shown);
-    const bool isCell = block && block->second == top && right.column == left.column;
+    const int top = isBlock ? block.top : model.ShownRow(*shown);
+    const bool isCell = isBlock && block.bottom == top && right.column == left.column;
     if (!isCell) {
         grid.SetCurrentCell(top + 1, left.column + 1);
         ScrollToColumns(grid, top, cells);
     }
-    if (block && !isCell)
-        grid.selectionModel()->select({model.index(top, left.column), model.index(block->second, right.column)},
+    if (isBlock && !isCell)
+        grid.selectionModel()->select({model.index(top, left.column), model.index(block.bottom, right.column)},
                                       QItemSelectionModel::ClearAndSelect);
 }
 
