@@ -7,7 +7,7 @@
 using U = UnitGroup;
 
 namespace {
-constexpr Field level = Plain<double>("Level", U::WaterLevel).Means(Str::MeansMarkLevel);
+constexpr Field level = Plain<double>("Level", U::WaterLevel).Is(Along::Elevation).Means(Str::MeansMarkLevel);
 constexpr Str titles = Str::EncroachColumns;
 } // namespace
 
@@ -22,7 +22,7 @@ FieldList LocationFields()
 // A field a line.
 // clang-format off
 KVR_FIELDS(HD_Initial,
-           Number<&Self::InitialH>("InitialH", U::WaterLevel).Title(Str::InitialH).Means(Str::MeansInitialH),
+           Number<&Self::InitialH>("InitialH", U::WaterLevel).Is(Along::Elevation).Title(Str::InitialH).Means(Str::MeansInitialH),
            Number<&Self::InitialQ>("InitialQ", U::Discharge).Title(Str::InitialQ).Means(Str::MeansInitialQ))
 
 KVR_FIELDS(HD_Windfact,
@@ -35,7 +35,7 @@ KVR_FIELDS(HD_Resistfact,
            Number<&Self::ZoneResistance3>("ZoneResistance3").Title(Str::Zone3).Digits(6).OptionalTail().Means(Str::MeansZone3))
 
 KVR_FIELDS(HD_Wavetype,
-           Number<&Self::DownstreamChainage>("DownstreamChainage", U::Chainage).Title(Str::DownstreamChainage).Means(Str::MeansReachEnd),
+           Number<&Self::DownstreamChainage>("DownstreamChainage", U::Chainage).Is(Along::ReachEnd).Title(Str::DownstreamChainage).Means(Str::MeansReachEnd),
            Integer<&Self::WaveApproximation>("WaveApproximation").Title(Str::WaveApproximation).Choices(Str::WaveApproximations).Means(Str::MeansWave))
 
 KVR_FIELDS(HD_Waterloss,
@@ -118,7 +118,7 @@ KVR_FIELDS(HDReachLength,
            Number<&Self::ReachLength2>("ReachLength2", U::Chainage).Title(Str::RightBank).Means(Str::MeansRightReach))
 
 KVR_FIELDS(HDOutputGridPoint,
-           Number<&Self::PointValue>("PointValue", U::Chainage).Title(Str::DownstreamChainage).Means(Str::MeansReachEnd))
+           Number<&Self::PointValue>("PointValue", U::Chainage).Is(Along::ReachEnd).Title(Str::DownstreamChainage).Means(Str::MeansReachEnd))
 
 // Coefficients are far below one, so three decimals would show nothing of them.
 KVR_FIELDS(HDLeakage,

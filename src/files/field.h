@@ -69,6 +69,14 @@ struct GroupAccess
     const ExtraParams* (*constExtra)(const void* element);
 };
 
+/// What a number at a location is along its branch.
+enum class Along
+{
+    Value,
+    Elevation, // above datum, as the ground and the water
+    ReachEnd   // the chainage where a reach ends that starts at the location
+};
+
 /// One line of a text that holds several, or the whole of it.
 struct TextLine
 {
@@ -161,6 +169,7 @@ struct Field
     std::int32_t firstChoice = 0; // the index of the first of them
     int digits = 0;               // significant ones, where a number is shown; 0 for the usual
     Bounds bounds{};
+    Along along = Along::Value;
 
     // What else a declaration says, one after the other.
     template <typename Value>
@@ -193,6 +202,12 @@ struct Field
         if (kind != FieldKind::Number)
             throw "digits of what is no number";
         return With(&Field::digits, significant);
+    }
+    constexpr Field Is(Along what) const
+    {
+        if (kind != FieldKind::Number)
+            throw "only a number is something along a branch";
+        return With(&Field::along, what);
     }
     constexpr Field OptionalTail() const { return With(&Field::optionalTail, true); }
     constexpr Field MayBeUnknown() const

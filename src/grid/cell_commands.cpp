@@ -38,22 +38,7 @@ QString ReasonOf(const std::vector<CCellResults::Cell>& kept)
 
 void Make(CGenGrid& grid, CCellResults results, const QString& step, const Words& words)
 {
-    CGridModel& model = *grid.Model();
-    if (const QString fault = results.RuleFault(); !fault.isEmpty()) {
-        KsMessageBox(fault, QMessageBox::Ok, &grid);
-        return;
-    }
-    const std::size_t changed = results.ChangedCount(), kept = results.KeptCount();
-    const QString reason = ReasonOf(results.Kept());
-    model.ChangeCells(step, results.FirstRow(), results.TakeChanges());
-    QString said = GridTexts::Counted(changed, words.one, words.many);
-    if (kept > 0)
-        said += QStringLiteral("; ") +
-                GridTexts::Counted(kept, GridTexts::tr("1 stays as it was"), GridTexts::tr("%1 stay as they were")) + reason;
-    model.Document()->Say(said);
-    if (grid.Host())
-        grid.Host()->LineEdited(grid); // the project is told of what locations hold now
-    grid.Reload();
+    MakeResults(grid, std::move(results), step, words.one, words.many);
 }
 
 void Cut(CGenGrid& grid, const CellBlock& block)
@@ -68,6 +53,28 @@ void Cut(CGenGrid& grid, const CellBlock& block)
 }
 
 } // namespace
+
+bool MakeResults(CGenGrid& grid, CCellResults results, const QString& step, const QString& one, const QString& many)
+{
+    CGridModel& model = *grid.Model();
+    if (const QString fault = results.RuleFault(); !fault.isEmpty()) {
+        KsMessageBox(fault, QMessageBox::Ok, &grid);
+        return false;
+    }
+    const std::size_t changed = results.ChangedCount(), kept = results.KeptCount();
+    const QString reason = ReasonOf(results.Kept());
+    model.ChangeCells(step, results.FirstRow(), results.TakeChanges());
+    QString said = GridTexts::Counted(changed, one, many);
+    if (kept > 0)
+        said += QStringLiteral("; ") +
+                GridTexts::Counted(kept, GridTexts::tr("1 stays as it was"), GridTexts::tr("%1 stay as they were")) +
+                reason;
+    model.Document()->Say(said);
+    if (grid.Host())
+        grid.Host()->LineEdited(grid); // the project is told of what locations hold now
+    grid.Reload();
+    return true;
+}
 
 bool CanRunOnCells(const CGenGrid& grid, GridAction action)
 {

@@ -143,6 +143,7 @@ struct ColumnSpec
     GridControl control = Control::Number;
     CKsEditStyle style = {}; // unit group and format
     Bounds bounds = {};      // of a number
+    Along along = Along::Value;
     bool isRequired = false; // an empty cell is refused
     bool unitBelow = false;  // the unit stands below the header, which does not name it
     std::shared_ptr<const CellAccess> access = {};

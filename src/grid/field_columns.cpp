@@ -76,6 +76,7 @@ FieldColumns& FieldColumns::Add(const Field& field, CellAccess access, ColumnSpe
     if (field.digits)
         column.style.SetFormat(QStringLiteral("%.%1lg").arg(field.digits));
     column.bounds = field.bounds;
+    column.along = field.along;
     column.unitBelow = !m_style.besideAPicture;
     if (m_style.besideAPicture) {
         column.width = 0;

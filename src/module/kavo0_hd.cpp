@@ -3,6 +3,7 @@
 #include "document/document.h"
 #include "grid/grid_texts.h"
 #include "module/view.h"
+#include "profile/profile_texts.h"
 #include "res/strings.h"
 
 namespace {
@@ -18,6 +19,7 @@ static void Load()
 {
     Q_INIT_RESOURCE(kavo0_hd); // stands in a static library
     GridTexts::Load();
+    ProfileTexts::Load();
     KsMessage::ProjectMapChanged(); // registered from the start, so that its number is known to everybody
 }
 

@@ -6,10 +6,12 @@
 #include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
+#include "profile/profile_dock.h"
 #include "module/sheet.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page.h"
 #include "pages/page_table.h"
+#include "profile/profile_panel.h"
 #include "res/strings.h"
 
 #include <QApplication>
@@ -39,6 +41,7 @@ CKavo0_hdView::CKavo0_hdView(QWidget* parent) : CKsProjectView(parent)
 CKavo0_hdView::~CKavo0_hdView()
 {
     KeepArrangement();
+    delete m_profile; // which asks this
     disconnect(qApp, nullptr, this, nullptr); // the focus leaves the pages as they go
     delete m_sheet;                           // while this is still a host
 }
@@ -69,13 +72,18 @@ void CKavo0_hdView::OnInitialUpdate()
         RestorePage(m_sheet->currentIndex());
         MovedOn();
         TellLocationIfOther();
+        TellProfile();
     });
     m_arranged = KeptArrangement();
     if (auto* page = ActivePage())
         page->OnSetActive();
     RestorePage(m_sheet->currentIndex());
     m_sheet->SetActivePage(m_arranged[FrontState].toInt());
-    KsAfterPaint(this, this, [this] { MakeOtherPages(); });
+    KsAfterPaint(this, this, [this] {
+        MakeOtherPages();
+        if (IsActive())
+            ShowProfile();
+    });
 }
 
 /// The list of a page, once, when the page is first in front: whoever looks at one page waits for no other.
@@ -149,6 +157,8 @@ void CKavo0_hdView::OnUpdate(CView* sender, int hint, CHint* object)
     else if (hint == CKsDoc::ReloadHint)
         page->LoadFromDocument(GetDocument());
     CKsProjectView::OnUpdate(sender, hint, object);
+    if (m_profile)
+        m_profile->Refresh();
     TellLocationIfOther();
 }
 
@@ -160,8 +170,10 @@ bool CKavo0_hdView::MayLeave(KsLeave what)
 
 void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deactivated)
 {
-    if (activate)
+    if (activate) {
         EnableLinesMenu(m_linesEnabled);
+        ShowProfile();
+    }
     CKsProjectView::OnActivateView(activate, activated, deactivated);
 }
 
@@ -177,6 +189,7 @@ void CKavo0_hdView::EditedLineChanged()
 void CKavo0_hdView::CurrentLocationChanged()
 {
     ShowStatus();
+    TellProfile();
     if (MainFrame())
         TellLocationLater();
 }
@@ -299,7 +312,7 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
 {
     if (id == KsCommand::Help)
         return true;
-    if (id == KsCommand::FindField)
+    if (id == KsCommand::FindField || id == KsCommand::LongProfile)
         return m_sheet && m_sheet->isEnabled();
     const auto* page = ActivePage();
     const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || CGridCommands::Knows(id);
@@ -332,6 +345,8 @@ bool CKavo0_hdView::OnCommand(int id)
         page->OnHelp();
     else if (id == KsCommand::FindField)
         FindField();
+    else if (id == KsCommand::LongProfile)
+        ToggleProfile();
     else if (CGridCommands::Knows(id))
         CGridCommands::Run(id, *page->LinesGrid());
     else if (LinesView::Knows(id))

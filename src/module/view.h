@@ -4,20 +4,23 @@
 #include "document/document.h"
 #include "ks/fc/project_view.h"
 #include "pages/framework/page_host.h"
+#include "profile/profile_host.h"
 
+#include <QPointer>
 #include <QSet>
 #include <QString>
 
 class CCtrlEdit;
 class CDlgPropertySheet;
 class CGenPropertyPage;
+class CProfilePanel;
 struct PageEntry;
 
 class CDlgFrame : public CKsMDIChildWnd
 {
 };
 
-class CKavo0_hdView : public CKsProjectView, public IPageHost
+class CKavo0_hdView : public CKsProjectView, public IPageHost, public IProfileHost
 {
     Q_OBJECT
 public:
@@ -51,6 +54,15 @@ public:
     QStringList BranchNames() override;
     void EnableLinesMenu(bool enable) override;
 
+    // IProfileHost
+    std::vector<ProfileTable> ProfileTables() override;
+    int FrontTab() const override;
+    QStringList ProfileBranches() override { return BranchNames(); }
+    std::vector<BedLevel> BedLevels(const QString& branch) override;
+    bool AreDepths(std::string_view field) const override;
+    bool MayLeaveField() override { return MayLeave(KsLeave::Field); }
+    bool ShowCell(const ProfileTable& table, std::size_t row, int column) override;
+
 protected:
     LRESULT OnRequest(WPARAM request, CKSComm_Package& package) override;
     void RevealChange(const ChangePlace& place) override;
@@ -60,6 +72,10 @@ protected:
 private:
     void FetchLocation();
     void FindField();
+    CProfilePanel& Profile();
+    void ShowProfile();
+    void ToggleProfile();
+    void TellProfile();
     void TellLocationLater();
     void TellLocationIfOther();
     void TellLocation();
@@ -73,6 +89,7 @@ private:
     void MakeOtherPages();
 
     CDlgPropertySheet* m_sheet = nullptr;                      // child
+    QPointer<CProfilePanel> m_profile;                         // null before it is shown; see Profile
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_tellLocation = false;                               // once the present event is over
     std::pair<CString, double> m_toldLocation;

@@ -7,6 +7,7 @@
 #include "ks/fc/message_box.h"
 #include "module/kavo0_hd.h"
 #include "pages/framework/page.h"
+#include "profile/profile_panel.h"
 #include "res/strings.h"
 
 #include <QTimer>
@@ -15,6 +16,12 @@
 
 LRESULT CKavo0_hdView::OnRequest(WPARAM request, CKSComm_Package& package)
 {
+    if (request == KsRequest::DataChanged && m_profile)
+        m_profile->Refresh(); // cross sections may be other ones
+    if (request == KsRequest::LocationShown && m_profile && package.objects)
+        for (const auto& object : *package.objects)
+            if (const auto* place = dynamic_cast<const CKvrCBELocation*>(object.get()))
+                m_profile->SetPlace(place->branch, place->chainage);
     if (request != KsRequest::GetData && request != KsRequest::InsertData && request != KsRequest::DeleteData)
         return 0;
     // One of these documents never meets the requests of another.

@@ -39,6 +39,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {ViewMenu, "actionAllDigits", QT_TR_NOOP("All &Digits"), QT_TR_NOOP("Shows every digit of the numbers in tables and fields"), [](F&) { KsUnits::Instance().SetAllDigits(!KsUnits::Instance().AllDigits()); }},
         {ViewMenu, "actionLanguage", QT_TR_NOOP("&Language"), QT_TR_NOOP("Language of the program")},
         {ViewMenu, "actionToolBars", QT_TR_NOOP("&Tool Bars"), QT_TR_NOOP("Shows or hides tool bars")},
+        {ViewMenu, "actionLongProfile", QT_TR_NOOP("Long Pro&file"), QT_TR_NOOP("Shows or hides levels and values along the branch"), [](F& f) { f.SendToNearest(KsCommand::LongProfile); }, K::UnknownKey, nullptr, false, "F9"},
         {ViewMenu, "actionProjectTree", QT_TR_NOOP("&Project"), QT_TR_NOOP("Shows or hides the files of the project"), [](F& f) { f.Projects().Tree().setVisible(!f.Projects().Tree().isVisible()); }},
         {WindowMenu, "actionCascade", QT_TR_NOOP("&Cascade"), QT_TR_NOOP("Arranges the windows one behind the other"), [](F& f) { f.MdiArea().cascadeSubWindows(); }},
         {WindowMenu, "actionTile", QT_TR_NOOP("&Tile"), QT_TR_NOOP("Arranges the windows side by side"), [](F& f) { f.MdiArea().tileSubWindows(); }},

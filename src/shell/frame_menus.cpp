@@ -188,6 +188,7 @@ void CFrameMenus::Update()
     m_actions.at(QStringLiteral("actionLanguage_") + KsLanguage::Instance().Current())->setChecked(true);
     Action("actionContents")->setVisible(HasHelp(m_frame));
     Action("actionFindField")->setEnabled(m_frame.HasCommand(KsCommand::FindField));
+    Action("actionLongProfile")->setEnabled(m_frame.HasCommand(KsCommand::LongProfile));
 }
 
 void CFrameMenus::UpdateEdit()

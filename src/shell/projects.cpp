@@ -163,6 +163,7 @@ LRESULT CProjects::SwitchBoard(WPARAM request, CKSComm_Package& package)
         return 0;
     case KsRequest::LoadLocations:
     case KsRequest::BranchNames:
+    case KsRequest::BedLevels:
         return package.objects ? Ask(request, package, true) : 0;
     case KsRequest::LoadLocationsAndChannel:
         if (!package.objects || !Ask(KsRequest::LoadLocations, package, true))

@@ -48,6 +48,7 @@ private:
 
     // What other editors ask; each answers whether there was something.
     LRESULT LoadLocations(CObList& objects) const;
+    LRESULT LoadBedLevels(CObList& objects) const;
     LRESULT FillChannel(const CObList& objects) const;
 
     CSectionPlot* m_plot = nullptr;

@@ -4,6 +4,7 @@
 #include "ks/fc/branch_name.h"
 
 #include <QScopedValueRollback>
+#include <algorithm>
 #include <cmath>
 #include <functional>
 #include <map>
@@ -15,6 +16,8 @@ CTablesView::Answer CCrossSectionView::AnswerTo(WPARAM request)
         return std::bind_front(&CCrossSectionView::LoadLocations, this);
     case KsRequest::LoadLocationsAndChannel:
         return std::bind_front(&CCrossSectionView::FillChannel, this);
+    case KsRequest::BedLevels:
+        return std::bind_front(&CCrossSectionView::LoadBedLevels, this);
     default:
         return nullptr;
     }
@@ -28,6 +31,26 @@ LRESULT CCrossSectionView::LoadLocations(CObList& objects) const
         auto item = std::make_unique<CKvrCBELocation>();
         item->branch = section.Branch();
         item->chainage = section.chainage;
+        objects.push_back(std::move(item));
+    }
+    return !all.sections.empty();
+}
+
+LRESULT CCrossSectionView::LoadBedLevels(CObList& objects) const
+{
+    const CCrossSections& all = Document()->Sections();
+    for (const int index : all.ByPlace()) {
+        const CCrossSection& section = all.sections[std::size_t(index)];
+        const auto& points = section.points;
+        if (points.empty())
+            continue;
+        const auto deepest = std::ranges::min_element(points, {}, &CSectionPoint::level);
+        auto item = std::make_unique<CKvrCBEBedLevel>();
+        item->branch = section.Branch();
+        item->chainage = section.chainage;
+        item->bed = deepest->level;
+        item->leftBank = std::ranges::max_element(points.begin(), deepest + 1, {}, &CSectionPoint::level)->level;
+        item->rightBank = std::ranges::max_element(deepest, points.end(), {}, &CSectionPoint::level)->level;
         objects.push_back(std::move(item));
     }
     return !all.sections.empty();

@@ -37,6 +37,17 @@ public:
     double width = KsUnset;  // of the water surface
 };
 
+/// The ground at a cross section; metres above datum, KsUnset for what is not known.
+class KS_API CKvrCBEBedLevel : public CKsCBEItem
+{
+public:
+    CString branch;
+    double chainage = 0;
+    double bed = KsUnset; // the deepest point
+    // The highest points on either side of it, looking downstream.
+    double leftBank = KsUnset, rightBank = KsUnset;
+};
+
 /// A location at which an HD parameter is given.
 class KS_API CKvr_CBE_ModelDataItem : public CKsCBEItem
 {

@@ -15,7 +15,8 @@
 /// view (CCommandTarget).
 namespace KsCommand {
 inline constexpr int Copy = 57634, Cut = 57635, Paste = 57637, Help = 57670;
-inline constexpr int FindField = 57680; // leads to a page or a field by its name
+inline constexpr int FindField = 57680;   // leads to a page or a field by its name
+inline constexpr int LongProfile = 57681; // shows or hides a plot along the branch
 } // namespace KsCommand
 
 /// A command of a view in the frame's "Edit" or "Lines" menu. Without a text it is a separator.

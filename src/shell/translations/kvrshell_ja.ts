@@ -295,6 +295,14 @@ The editors read %2.</source>
         <source>Shows every digit of the numbers in tables and fields</source>
         <translation>表と入力欄の数値を全桁で表示します</translation>
     </message>
+    <message>
+        <source>Long Pro&amp;file</source>
+        <translation>縦断図(&amp;F)</translation>
+    </message>
+    <message>
+        <source>Shows or hides levels and values along the branch</source>
+        <translation>河川に沿った水位や値の図の表示と非表示を切り替えます</translation>
+    </message>
 </context>
 <context>
     <name>CFrameMenus</name>
