@@ -13,6 +13,7 @@
 #include "grid/selection_summary.h"
 #include "grid/typing.h"
 #include "ks/fc/doc.h"
+#include "ks/fc/keep_in_sight.h"
 #include "ks/language/language.h"
 
 #include <QAbstractButton>
@@ -333,6 +334,8 @@ void CGenGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
         }
         StoreEditedLine();
     }
+    if (hasFocus() || isAncestorOf(QApplication::focusWidget()))
+        KeepInWindow();
     if (m_host && !m_model->IsSyncing())
         m_host->CellCurrent(*this);
     const int row = CurrentRow();
@@ -357,8 +360,17 @@ void CGenGrid::focusInEvent(QFocusEvent* event)
     // those of the cell that is open.
     if (QWidget* editor = m_delegate->Editor(); editor && state() == EditingState)
         editor->setFocus();
+    KeepInWindow();
     if (m_host)
         m_host->CellCurrent(*this);
+}
+
+/// A window that is too small for what stands in it scrolls, grid and all: nobody types where it cannot be seen.
+void CGenGrid::KeepInWindow()
+{
+    const QRect cell = visualRect(currentIndex()).intersected(viewport()->rect());
+    if (!cell.isEmpty())
+        KsKeepInSight(*viewport(), cell);
 }
 
 // ---- lines that come and go --------------------------------------------------------------------

@@ -130,6 +130,7 @@ private:
     void ShowLineMenu(const QContextMenuEvent& event);
     void FilterAfresh();
     void FollowLine(int row, int column);
+    void KeepInWindow();
     void NoteLine(int row);
     int RowLikeCurrent(int row) const;
     QRect FrozenPart() const;

@@ -120,13 +120,40 @@ void CGridCommands::Run(int command, CGenGrid& grid)
 
 void CGridCommands::Run(GridAction action, CGenGrid& grid)
 {
-    const bool moves = action == GridAction::MoveUp || action == GridAction::MoveDown;
     if (action == GridAction::CopyWithHeaders)
         CopyCellsWithHeaders(grid);
     else if (action == GridAction::PasteWithPreview)
         PasteCellsWithPreview(grid);
     else if (CanRun(action, grid))
         IsOfLines(action) ? RunOnLines(grid, action) : RunOnCells(grid, action);
-    else if (grid.MayChange() && IsOfLines(action) && !moves && grid.Model()->Rows() && !grid.MayGrow())
-        grid.Model()->Document()->Say(GridTexts::tr("Lines cannot be added to this table."));
+    else if (grid.MayChange() && grid.Model()->Rows())
+        if (const QString why = WhyNot(action, grid); !why.isEmpty())
+            grid.Model()->Document()->Say(why);
+}
+
+/// A key that does nothing says why: whoever pressed it would look for what it did.
+QString CGridCommands::WhyNot(GridAction action, const CGenGrid& grid)
+{
+    const CGridModel& model = *grid.Model();
+    switch (action) {
+    case GridAction::FillDown:
+        return GridTexts::tr("Nothing stands above the first line that could be filled down.");
+    case GridAction::FillSeries:
+    case GridAction::Interpolate:
+        return GridTexts::tr("Numbers in two lines or more have to be selected first.");
+    case GridAction::Calculate:
+        return GridTexts::tr("There is no number among the selected cells.");
+    case GridAction::ResetToGlobal:
+        return GridTexts::tr("No global value stands for this column.");
+    case GridAction::RevertToSaved:
+        return GridTexts::tr("Nothing here differs from the last save.");
+    case GridAction::MoveUp:
+    case GridAction::MoveDown:
+        if (!model.Rows()->MayMove())
+            return GridTexts::tr("The lines of this table stand in an order of their own.");
+        return action == GridAction::MoveUp ? GridTexts::tr("The first line cannot go up.")
+                                            : GridTexts::tr("The last line cannot go down.");
+    default:
+        return IsOfLines(action) && !grid.MayGrow() ? GridTexts::tr("Lines cannot be added to this table.") : QString();
+    }
 }

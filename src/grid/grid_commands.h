@@ -25,5 +25,9 @@ public:
     static bool CanRun(int command, const CGenGrid* grid);
     static bool CanRun(GridAction action, const CGenGrid& grid);
     static void Run(int command, CGenGrid& grid);
+    /// One that cannot be run says why, in the status bar.
     static void Run(GridAction action, CGenGrid& grid);
+
+private:
+    static QString WhyNot(GridAction action, const CGenGrid& grid);
 };

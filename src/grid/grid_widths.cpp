@@ -59,7 +59,12 @@ CGridWidths::CGridWidths(CGenGrid& grid) : QObject(&grid), m_grid(grid), m_lette
     grid.verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
     UpdateRowNumbers();
     grid.viewport()->installEventFilter(this);
-    connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, &CGridWidths::MakeRoom);
+    connect(&KsUnits::Instance(), &KsUnits::DigitsChanged, this, [this] {
+        if (KsUnits::Instance().AllDigits() || m_areChosen)
+            MakeRoom();
+        else
+            Reset(); // what all digits needed is given back
+    });
     connect(grid.Model(), &CGridModel::CellModified, this, &CGridWidths::MakeRoomFor);
     connect(
         &KsUnits::Instance(), &KsUnits::Changed, this,

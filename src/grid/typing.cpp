@@ -2,6 +2,7 @@
 
 #include "grid/column_spec.h"
 #include "grid/grid_texts.h"
+#include "ks/fc/keep_in_sight.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/shown_text.h"
 
@@ -9,7 +10,6 @@
 #include <QLineEdit>
 #include <QPointer>
 #include <QScopedValueRollback>
-#include <QScrollArea>
 #include <QTimer>
 #include <algorithm>
 
@@ -42,10 +42,7 @@ bool StaysBeingEdited(Qt::FocusReason reason)
 
 void TellRefusal(QWidget& widget, const QString& message, const QString& details)
 {
-    for (QWidget* parent = widget.parentWidget(); parent; parent = parent->parentWidget()) {
-        if (auto* area = qobject_cast<QScrollArea*>(parent))
-            area->ensureWidgetVisible(&widget);
-    }
+    KsKeepInSight(widget, widget.rect());
     widget.setFocus(Qt::OtherFocusReason); // where it goes back to when the message is read
     const QPointer<QWidget> told = &widget;
     KsMessageBox(message, QMessageBox::Ok, &widget, details);

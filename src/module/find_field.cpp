@@ -53,6 +53,7 @@ public:
         for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
             for (const CGenGrid* grid : m_sheet.PageAt(tab)->findChildren<CGenGrid*>())
                 AddTable(tab, *grid);
+        AddGroups();
         return std::move(m_fields);
     }
 
@@ -153,10 +154,11 @@ private:
         const auto& columns = grid.Model()->Columns();
         for (std::size_t column = 0; column < columns.size(); ++column) {
             const ColumnSpec& spec = columns[column];
-            const bool isPlace = list.list && spec.namesLine; // branch and chainage of every list
+            // Branch and chainage of every list are called the same; of these only those in sight are meant.
+            const bool isPlace = list.list && spec.namesLine && tab != m_sheet.currentIndex() && HasUsualName(spec);
             if (isPlace || spec.Kind() == CellKind::Button || spec.header().isEmpty())
                 continue;
-            FoundField field{.tab = tab, .title = Plain(spec.header()), .keyword = list.keyword};
+            FoundField field{.tab = tab, .title = Plain(spec.header()).simplified(), .keyword = list.keyword};
             if (rows) // without, there is no line yet that would have the table
                 field.place = {rows->Data(), 1, int(column) + 1, rows->List() ? rows->List() : rows->Data()};
             QStringList choices = spec.choices.entries ? spec.choices.entries() : QStringList();
@@ -165,7 +167,46 @@ private:
                     if (declared.choices && declared.name == spec.name)
                         choices += InAllLanguages(declared.choices);
             Add(field, spec.names ? spec.names() : QStringList(), choices.join(u'\n'));
+            TellApart(grid);
         }
+    }
+
+    static bool HasUsualName(const ColumnSpec& column)
+    {
+        const QString title = column.header().simplified();
+        return title == LoadString(Str::RiverName).simplified() || title == LoadString(Str::Chainage).simplified();
+    }
+
+    /// What was added last, if another table or field of the page calls something the same.
+    void TellApart(const CGenGrid& grid)
+    {
+        FoundField& last = m_fields.back();
+        const auto isSame = [&last](const FoundField& each) {
+            return &each != &last && each.tab == last.tab && each.title == last.title;
+        };
+        if (std::ranges::any_of(m_fields, isSame) && !grid.accessibleName().isEmpty())
+            last.title += QStringLiteral(" - ") + grid.accessibleName();
+    }
+
+    /// The headings of groups of fields, but for those that most pages have.
+    void AddGroups()
+    {
+        std::map<QString, int> count;
+        for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
+            for (const auto* group : m_sheet.PageAt(tab)->findChildren<QGroupBox*>())
+                ++count[group->title()];
+        for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
+            for (auto* group : m_sheet.PageAt(tab)->findChildren<QGroupBox*>())
+                if (QWidget* first = FirstIn(*group); first && !group->title().isEmpty() && count[group->title()] == 1)
+                    Add({.tab = tab, .title = Plain(group->title()), .control = first}, {});
+    }
+
+    static QWidget* FirstIn(QGroupBox& group)
+    {
+        for (QWidget* next = group.nextInFocusChain(); next && next != &group; next = next->nextInFocusChain())
+            if (group.isAncestorOf(next) && next->focusPolicy() & Qt::TabFocus && next->isEnabledTo(&group))
+                return next;
+        return nullptr;
     }
 
     CDlgPropertySheet& m_sheet;
@@ -266,7 +307,7 @@ std::vector<FoundField> FieldsOf(CDlgPropertySheet& sheet, CKavo0_hdDoc& documen
 
 std::vector<const FoundField*> Matching(const std::vector<FoundField>& fields, const QString& text)
 {
-    const QString wanted = text.simplified().toCaseFolded();
+    const QString wanted = text.normalized(QString::NormalizationForm_KC).simplified().toCaseFolded();
     const QStringList words = wanted.split(u' ', Qt::SkipEmptyParts);
     std::vector<const FoundField*> matching;
     for (const FoundField& field : fields)

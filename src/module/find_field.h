@@ -4,19 +4,21 @@
 
 #include "ks/fc/change_place.h"
 
+#include <QPointer>
 #include <QString>
+#include <QWidget>
 #include <optional>
 #include <vector>
 
 class CDlgPropertySheet;
 class CKavo0_hdDoc;
-class QWidget;
 
 struct FoundField
 {
     int tab; // of the page
     ChangePlace place = {}; // nothing for the page itself
     QString title = {}, page = {}, keyword = {};
+    QPointer<QWidget> control = {}; // of a group of fields the first one
     // Case folded, a line each:
     QString names = {}; // what it is called in any language, and in the file
     QString words = {}; // all that it may be looked for by: the names, and those of its page

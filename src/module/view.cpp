@@ -195,12 +195,13 @@ void CKavo0_hdView::CurrentLocationChanged()
 }
 
 /// Its whole number where it leaves digits out, and how many lines go their own way. That is counted once a step.
-CString CKavo0_hdView::FieldText(const CCtrlEdit& field) const
+CString CKavo0_hdView::FieldText(const QWidget& field) const
 {
     const std::pair<const void*, int> now{&field, GetDocument()->UndoStack().index()};
     if (std::exchange(m_countedAt, now) != now)
         m_overrides = ActivePage() ? ActivePage()->OverridesText(field) : CString();
-    QStringList texts{field.FullText(), m_overrides};
+    const auto* edit = qobject_cast<const CCtrlEdit*>(&field);
+    QStringList texts{edit ? edit->FullText() : CString(), m_overrides};
     texts.removeAll(CString());
     return texts.join(QStringLiteral("   "));
 }
@@ -208,7 +209,7 @@ CString CKavo0_hdView::FieldText(const CCtrlEdit& field) const
 /// The line of the table that is worked in, or the field; and its number where it leaves digits out.
 CString CKavo0_hdView::PlaceText() const
 {
-    if (const auto* field = qobject_cast<const CCtrlEdit*>(QApplication::focusWidget()); field && isAncestorOf(field))
+    if (const QWidget* field = QApplication::focusWidget(); field && isAncestorOf(field))
         if (const QString text = FieldText(*field); !text.isEmpty())
             return text;
     const auto* page = ActivePage();
@@ -266,6 +267,8 @@ void CKavo0_hdView::FindField()
         return;
     if (found->place.data)
         m_sheet->PageAt(found->tab)->Reveal(found->place, true);
+    else if (found->control)
+        m_sheet->PageAt(found->tab)->ShowControl(*found->control, true);
     if (auto* field = qobject_cast<QLineEdit*>(window()->focusWidget()))
         field->selectAll(); // as when one comes with Tab: what is typed next takes its place
 }

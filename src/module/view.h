@@ -82,7 +82,7 @@ private:
     std::pair<CString, double> CurrentLocation() const;
 
     QVariantMap Arrangement() const override;
-    CString FieldText(const CCtrlEdit& field) const;
+    CString FieldText(const QWidget& field) const;
     void RestorePage(int tab);
     void AddTabs();
     std::unique_ptr<CGenPropertyPage> MakePage(const PageEntry& entry);

@@ -70,6 +70,7 @@ TEST_F(TypedNumber, AnAmountIsStoredInTheBaseUnitWithoutStrayDigits)
         EXPECT_DOUBLE_EQ(Read(each.group, each.text), each.expected) << each.text;
     EXPECT_EQ(Read(Discharge, "350 l/s"), 0.35) << "to the last bit";
     EXPECT_EQ(Read(WaterLevel, "12 ft"), 3.6576) << "to the last bit";
+    EXPECT_EQ(Read(WaterLevel, "33.3 cm"), 0.333);
 
     // What stands without a unit is in the one that the page shows; with it, it is the same number.
     KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
@@ -79,6 +80,10 @@ TEST_F(TypedNumber, AnAmountIsStoredInTheBaseUnitWithoutStrayDigits)
         EXPECT_NE(Read(WaterLevel, text), std::stod(text));
     }
     EXPECT_EQ(Read(WaterLevel, "2 m"), 2);
+    for (const char* text : {"45 cfs", "45 ft3/s", "=45", "=40+5"})
+        EXPECT_EQ(Read(Discharge, text), Read(Discharge, "45")) << text << " reads as 45 in the table, and is 45";
+    EXPECT_EQ(Read(Chainage, "3 yd"), Read(Chainage, "9"));
+    EXPECT_EQ(Read(Chainage, "6 in"), Read(Chainage, "0.5"));
     EXPECT_DOUBLE_EQ(Read(WaterLevel, "=1+1"), 0.6096) << "a formula has the unit of the page";
 }
 
@@ -107,8 +112,10 @@ TEST_F(TypedNumber, TheUnitOfAFieldIsTakenAsAKeyboardWritesIt)
     };
     for (const char* text : {"30 m¹⁄³/s", "30 m^(1/3)/s", "30 m^1/3/s", "30 m1/3/s"})
         EXPECT_EQ(read(text).value, 30) << text;
-    for (const char* text : {"30 m/s", "30 s/m^(1/3)", "30 m^(1/2)/s"})
+    for (const char* text : {"30 m/s", "30 s/m^(1/3)", "30 m^(1/2)/s", "30 ft^(1/3)/s", "30 m^0.5/s"}) {
         EXPECT_FALSE(read(text).value) << text;
+        EXPECT_NE(read(text).complaint, QString()) << text << " is a unit of something else";
+    }
 }
 
 TEST_F(TypedNumber, WhatIsNoAmountIsRefused)

@@ -7,14 +7,18 @@
 #include "grid/lines_view.h"
 
 #include <QApplication>
+#include <QHeaderView>
 #include <QLabel>
+#include <QScrollArea>
 #include <QSplitter>
+#include <QStyle>
 #include <QUndoStack>
 #include <QVBoxLayout>
 #include <algorithm>
 #include <utility>
 
 static const QString MainState = QStringLiteral("main");
+constexpr int LeastPicture = 150; // pixels of height
 static const QList<int> TablesSizes = {600, 400}; // as shares: the first table has more columns
 
 CTablesView::~CTablesView()
@@ -42,7 +46,13 @@ void CTablesView::MakeContent(QWidget& picture, int pictureWidth, int tablesWidt
     m_splitter->setStretchFactor(1, tablesWidth);
     m_splitter->setCollapsible(0, false);
     m_splitter->setSizes(m_sizes);
-    SetContent(m_splitter);
+    picture.setMinimumHeight(LeastPicture);
+    auto* area = new QScrollArea; // a window that is too small for all of it scrolls
+    area->setWidgetResizable(true);
+    area->setFrameShape(QFrame::NoFrame);
+    area->setFocusPolicy(Qt::NoFocus);
+    area->setWidget(m_splitter);
+    SetContent(area);
 }
 
 /// In a narrow window the tables stand below the picture, which would have no width left: beside each other, or where
@@ -56,6 +66,8 @@ void CTablesView::resizeEvent(QResizeEvent* event)
     const int digits = width() / fontMetrics().horizontalAdvance(u'0');
     const auto whole = digits < leastBeside ? Qt::Vertical : Qt::Horizontal;
     const auto side = digits < leastBeside && digits >= leastForTwo ? Qt::Horizontal : Qt::Vertical;
+    for (CGenGrid* table : m_tables)
+        KeepInSight(*table, whole == Qt::Horizontal);
     if (whole == m_splitter->orientation() && side == m_side->orientation())
         return;
     m_splitter->setOrientation(whole);
@@ -64,13 +76,23 @@ void CTablesView::resizeEvent(QResizeEvent* event)
     m_side->setSizes(TablesSizes);
 }
 
+/// Of each table the header and two lines, and beside the smallest picture two columns.
+void CTablesView::KeepInSight(CGenGrid& table, bool isBeside)
+{
+    constexpr int letters = 31; // row numbers included
+    constexpr int least = 120;  // pixels, below the picture: the columns scroll
+    table.setMinimumWidth(isBeside ? letters * table.fontMetrics().averageCharWidth() : least);
+    const int bar = table.style()->pixelMetric(QStyle::PM_ScrollBarExtent);
+    table.setMinimumHeight(table.horizontalHeader()->sizeHint().height() + bar + 2 * table.frameWidth() +
+                           2 * table.verticalHeader()->defaultSectionSize());
+}
+
 CTablesView::Table CTablesView::AddTable(QSplitter& side, const char* name)
 {
     auto* table = new CGenGrid;
     table->setObjectName(QString::fromLatin1(name));
     table->SetHost(this);
-    constexpr int least = 31; // letters, row numbers included: two columns are in sight beside the smallest picture
-    table->setMinimumWidth(least * table->fontMetrics().averageCharWidth());
+    KeepInSight(*table, true);
     table->SetLineChoice(LineChoice::LinesOfCells);
     auto* title = new QLabel;
     title->setWordWrap(true);

@@ -87,6 +87,7 @@ protected:
 
 private:
     Table AddTable(QSplitter& side, const char* name);
+    static void KeepInSight(CGenGrid& table, bool isBeside);
     /// The document, the units or the language are other ones: everything is shown as it is now.
     void ShowDocument();
     void CommandsChanged();

@@ -24,7 +24,7 @@ public:
     QPointF WindowPoint(const CSectionPoint& point) const;
     const std::optional<CWaterSurface>& Water() const { return m_water; }
     QSize sizeHint() const override { return {640, 420}; }
-    QSize minimumSizeHint() const override { return {220, 160}; }
+    QSize minimumSizeHint() const override { return {220, 150}; }
 
 signals:
     /// By mouse or keys.

@@ -165,7 +165,8 @@ QRect LegendBox(const QFontMetrics& metrics, const QRect& window, const CLegend&
     const int inner = std::max(LegendSymbol + names + gap + numbers, metrics.horizontalAdvance(Elsewhere(legend)));
     const int rows = HDDataTypeCount + (legend.elsewhere > 0 ? 1 : 0);
     const QSize size(inner + 2 * Padding, rows * LegendRow(metrics) + 2 * Padding - 3);
-    if (5 * size.width() > 2 * window.width() && 5 * size.height() > 3 * window.height())
+    const bool isLarge = 5 * size.width() > 2 * window.width() && 5 * size.height() > 3 * window.height();
+    if (isLarge || size.height() + 2 * Margin > window.height()) // half a legend says less than none
         return {};
     return {{window.right() - Margin - size.width(), window.top() + Margin}, size};
 }

@@ -7,15 +7,18 @@
 
 namespace {
 
-constexpr double FitMargin = 56; // pixels of the user
+constexpr double FitMargin = 56;   // pixels of the user
+constexpr double MostMargin = 0.2; // of the window, on either side
 constexpr double MaxScale = 40;  // of these a metre
 
 /// The projection that shows all of the network in a part of the window.
 CMapProjection FitInto(CMapProjection projection, const CNetwork& network, const QRectF& part, double ratio)
 {
     const QRectF extent = network.Extent();
-    const double width = std::max(part.width() - 2 * FitMargin * ratio, 1.0);
-    const double height = std::max(part.height() - 2 * FitMargin * ratio, 1.0);
+    const auto inside = [ratio](double size) {
+        return std::max(size - 2 * std::min(FitMargin * ratio, MostMargin * size), 1.0);
+    };
+    const double width = inside(part.width()), height = inside(part.height());
     if (extent.width() > 0 || extent.height() > 0)
         projection.scale = std::min(extent.width() > 0 ? width / extent.width() : HUGE_VAL,
                                     extent.height() > 0 ? height / extent.height() : HUGE_VAL);

@@ -1217,5 +1217,37 @@
         <source>A line needs the name of its branch.</source>
         <translation>行には河川名が必要です。</translation>
     </message>
+    <message>
+        <source>Nothing stands above the first line that could be filled down.</source>
+        <translation>最初の行の上には、コピーする値がありません。</translation>
+    </message>
+    <message>
+        <source>Numbers in two lines or more have to be selected first.</source>
+        <translation>先に2行以上の数値を選択してください。</translation>
+    </message>
+    <message>
+        <source>There is no number among the selected cells.</source>
+        <translation>選択したセルに数値がありません。</translation>
+    </message>
+    <message>
+        <source>No global value stands for this column.</source>
+        <translation>この列には全体値がありません。</translation>
+    </message>
+    <message>
+        <source>Nothing here differs from the last save.</source>
+        <translation>前回の保存と異なるところはありません。</translation>
+    </message>
+    <message>
+        <source>The lines of this table stand in an order of their own.</source>
+        <translation>この表の行の順序は決まっています。</translation>
+    </message>
+    <message>
+        <source>The first line cannot go up.</source>
+        <translation>最初の行は上に移動できません。</translation>
+    </message>
+    <message>
+        <source>The last line cannot go down.</source>
+        <translation>最後の行は下に移動できません。</translation>
+    </message>
 </context>
 </TS>

@@ -5,6 +5,7 @@
 #include "ks/units/unit_groups.h"
 
 #include <QCoreApplication>
+#include <QRegularExpression>
 #include <QStringList>
 #include <algorithm>
 #include <cmath>
@@ -39,15 +40,32 @@ KsTyped<double> ReadFormula(const CString& text)
     return {value};
 }
 
-/// Whether it is the field's own: its powers that are fractions can be typed, too, as "m^(1/3)/s" or "m1/3/s".
+constexpr QChar Fraction(0x2044); // ⁄
+
+/// With the signs that a keyboard has: "m1/3/s" for "m¹⁄³/s".
+CString AsTyped(const CString& unit)
+{
+    return unit.normalized(CString::NormalizationForm_KC).replace(Fraction, u'/');
+}
+
+/// A unit without the signs about its powers: "m^(1/3)/s" is "m1/3/s".
+CString PlainPowers(const CString& unit)
+{
+    return AsTyped(unit).remove(u'^').remove(u'(').remove(u')');
+}
+
+/// Whether it is the field's own: its powers that are fractions can be typed, too.
 bool IsOwn(const CString& unit, const CString& symbol)
 {
-    constexpr QChar fraction(0x2044); // ⁄
-    const auto typed = [](const CString& text) {
-        CString plain = text.normalized(CString::NormalizationForm_KC).replace(fraction, u'/');
-        return plain.remove(u'^').remove(u'(').remove(u')');
-    };
-    return !symbol.isEmpty() && (unit == symbol || (symbol.contains(fraction) && typed(unit) == typed(symbol)));
+    return !symbol.isEmpty() &&
+           (unit == symbol || (symbol.contains(Fraction) && PlainPowers(unit) == PlainPowers(symbol)));
+}
+
+/// Whether it is a unit of anything, be it with powers that are fractions, which the unit library has not.
+bool IsAnyUnit(const CString& unit)
+{
+    static const QRegularExpression powers(QStringLiteral("\\^?\\(?\\d+/\\d+\\)?|\\^\\d*\\.\\d+"));
+    return KsIsUnit(unit) || (AsTyped(unit).contains(powers) && KsIsUnit(AsTyped(unit).remove(powers)));
 }
 
 KsTyped<double> ReadAmount(double number, const CString& unit, const CKsEditStyle& style, const CString& symbol)
@@ -55,10 +73,18 @@ KsTyped<double> ReadAmount(double number, const CString& unit, const CKsEditStyl
     if (IsOwn(unit, symbol))
         return {style.UnitConvertFromBase(number, 0)}; // as without it, to the last bit
     if (const auto factor = KsTypedUnitFactor(style.Group(), unit)) {
-        const double value = double(number * *factor);
+        // As if the amount had been typed in the unit that it is round in, that of the field or that of the file: 3 yd
+        // are 9 where feet are shown, and 2 m are 2 in the file, to the last bit.
+        const double shown = KsFifteenDigits(double(number * *factor / style.Conversion().factor));
+        const double base = KsFifteenDigits(double(number * *factor));
+        const bool isRound = KsFifteenDigits(number) == number; // all its digits count otherwise
+        const bool isRounder = KsShortestNumber(shown).size() < KsShortestNumber(base).size();
+        const double value = !isRound    ? double(number * *factor)
+                             : isRounder ? style.UnitConvertFromBase(shown, 0)
+                                         : base;
         return std::isfinite(value) ? KsTyped<double>{value} : KsTyped<double>{};
     }
-    if (!KsIsUnit(unit))
+    if (!IsAnyUnit(unit))
         return {};
     const CString possible = KsTypedUnits(style, symbol).join(QStringLiteral(", "));
     return {
@@ -116,7 +142,7 @@ KsTyped<double> KsReadTyped(QStringView given, const CKsEditStyle& style, const 
     if (text.startsWith(u'=')) {
         KsTyped<double> result = ReadFormula(text.sliced(1));
         if (result.value)
-            result.value = KsFifteenDigits(style.UnitConvertFromBase(*result.value, 0));
+            result.value = style.UnitConvertFromBase(KsFifteenDigits(*result.value), 0);
         return result;
     }
     const qsizetype length = NumberLength(text);

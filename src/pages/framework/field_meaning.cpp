@@ -50,6 +50,12 @@ void CFieldMeaning::resizeEvent(QResizeEvent* event)
     CountLines();
 }
 
+void CFieldMeaning::showEvent(QShowEvent* event)
+{
+    QWidget::showEvent(event);
+    CountLines(); // it has got its width before
+}
+
 QSize CFieldMeaning::sizeHint() const
 {
     return {UsualLetters * fontMetrics().averageCharWidth(), m_wanted * fontMetrics().lineSpacing() + Air};

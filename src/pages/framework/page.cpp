@@ -5,6 +5,7 @@
 #include "grid/grid_keys.h"
 #include "grid/grid_widths.h"
 #include "ks/fc/exchange.h"
+#include "ks/fc/keep_in_sight.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page_help.h"
 
@@ -14,7 +15,7 @@
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QKeyEvent>
-#include <QScrollArea>
+#include <QTimer>
 #include <QUndoStack>
 #include <QWhatsThis>
 #include <algorithm>
@@ -120,13 +121,18 @@ void CGenPropertyPage::Reveal(const ChangePlace& place, bool focus)
             place.isGone ? grid->ShowPlace(place.row, column) : grid->ShowLine(place.row, column);
         shown = grid;
     }
-    if (!shown)
-        return;
-    for (QWidget* parent = shown->parentWidget(); parent; parent = parent->parentWidget())
-        if (auto* area = qobject_cast<QScrollArea*>(parent))
-            area->ensureWidgetVisible(shown);
-    if (focus && shown->isEnabled() && shown->isVisible())
-        shown->setFocus(Qt::OtherFocusReason);
+    if (shown)
+        ShowControl(*shown, focus);
+}
+
+void CGenPropertyPage::ShowControl(QWidget& control, bool focus)
+{
+    const auto scroll = [&control] { KsKeepInSight(control, control.rect()); };
+    scroll();
+    // Of a page that has just come to the front nobody knows yet how far it can be scrolled.
+    QTimer::singleShot(0, &control, scroll);
+    if (focus && control.isEnabled() && control.isVisible())
+        control.setFocus(Qt::OtherFocusReason);
 }
 
 namespace {

@@ -73,6 +73,8 @@ public:
     virtual bool Shows(const ChangePlace& place) const;
     /// Brings it into view: the line, the cell, the control. With `focus` it is what is edited next.
     virtual void Reveal(const ChangePlace& place, bool focus);
+    /// The same for something that stands on the page.
+    void ShowControl(QWidget& control, bool focus);
 
     /// Groups that stand beside each other stand one below the other where the page has no more room than this, and
     /// only there. `scrollBar` is what a scroll bar takes of the width when the page is higher than the room.

@@ -109,7 +109,7 @@ protected:
     CCrossSectionView* Open(const QByteArray& text = SmallSections)
     {
         auto* view = static_cast<CCrossSectionView*>(
-            OpenIn({1000, 600}, CrossSectionEditor().CreateTemplate(), Write("river.kvxs", text)));
+            OpenIn({1000, 800}, CrossSectionEditor().CreateTemplate(), Write("river.kvxs", text)));
         if (view)
             view->Sections()->setFocus();
         return view;

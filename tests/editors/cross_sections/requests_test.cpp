@@ -62,6 +62,25 @@ TEST_F(CrossSectionTest, RadiusAndWidthAreFilledWhereTheyAreMissing)
     EXPECT_EQ(Ask(view, KsRequest::LoadLocationsAndChannel, &objects), 0) << "nothing is left to fill";
 }
 
+TEST_F(CrossSectionTest, BedAndBanksOfEverySection)
+{
+    CCrossSectionView* view = Open();
+    CObList objects;
+    EXPECT_EQ(Ask(view, KsRequest::BedLevels, &objects), 1);
+    const CCrossSections& all = view->Document()->Sections();
+    ASSERT_FALSE(objects.empty());
+    for (const auto& object : objects) {
+        const auto& item = dynamic_cast<const CKvrCBEBedLevel&>(*object);
+        const int at = all.Nearest(item.branch, item.chainage);
+        ASSERT_GE(at, 0);
+        const auto& points = all.sections[std::size_t(at)].points;
+        for (const CSectionPoint& point : points)
+            EXPECT_LE(item.bed, point.level);
+        EXPECT_GE(item.leftBank, points.front().level);
+        EXPECT_GE(item.rightBank, points.back().level);
+    }
+}
+
 TEST_F(CrossSectionTest, BranchNamesComeOnce)
 {
     CCrossSectionView* view = Open();

@@ -124,7 +124,7 @@ protected:
     CNetworkView* Open(const QByteArray& text = SmallNetwork)
     {
         auto* view =
-            static_cast<CNetworkView*>(OpenIn({900, 600}, NetworkEditor().CreateTemplate(), Write("river.kvnw", text)));
+            static_cast<CNetworkView*>(OpenIn({900, 800}, NetworkEditor().CreateTemplate(), Write("river.kvnw", text)));
         if (view)
             view->Map()->setFocus();
         return view;
