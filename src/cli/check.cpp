@@ -9,6 +9,7 @@ namespace {
 int CheckOne(const std::string& file)
 {
     const Result<TqlStructure> structure = ParseFile(file);
+    TellUnfinished(file);
     if (!structure)
         return ComplainUnread(structure.error());
     const DatedObjects undated{HDDateTime()};

@@ -83,12 +83,13 @@ struct Arguments
 void AddOutput(CLI::App& command, Output& output)
 {
     command.add_option("-o,--output", output.path, "Write here instead of over FILE");
-    const std::map<std::string, HardLinks> ways{{"keep", HardLinks::Keep}, {"split", HardLinks::Split}};
+    static const std::map<std::string, HardLinks> ways{{"keep", HardLinks::Keep}, {"split", HardLinks::Split}};
     command
-        .add_option(Option::HardLinks, output.hardLinks,
-                    "Write a file of several names: \"keep\" gives all of them the new content, \"split\" this one "
-                    "alone; without it such a file is left as it is")
-        ->transform(CLI::CheckedTransformer(ways).description(""))
+        .add_option_function<std::string>(
+            Option::HardLinks, [&output](const std::string& way) { output.hardLinks = ways.at(way); },
+            "Write a file of several names: \"keep\" gives all of them the new content, \"split\" this one alone; "
+            "without it such a file is left as it is")
+        ->check(CLI::IsMember(&ways).description("")) // and no numbers of them
         ->type_name("keep|split");
     command.add_flag(Option::LoseMetadata, output.loseMetadata,
                      "Write a file although its owner, group, mode, access list or attributes cannot be kept; without "

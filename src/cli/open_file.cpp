@@ -47,9 +47,18 @@ void PrintFindings(std::ostream& stream, const std::string& path, const std::vec
                    << ", column " << listed.last->column << '\n';
 }
 
+void TellUnfinished(const std::string& path)
+{
+    for (const std::string& whole : UnfinishedSaves(path))
+        Complain("A save of \"" + path + "\" was cut off while the file was written over: it may be half old and half " +
+                     "new. The whole new content is in \"" + whole + "\".",
+                 Exit::Fine);
+}
+
 int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters, FileVersion* version)
 {
     const Result<TqlStructure> structure = ParseFile(path, nullptr, version);
+    TellUnfinished(path);
     if (!structure)
         return ComplainUnread(structure.error());
     const tqlHandle handle = structure.value().Get();

@@ -14,6 +14,8 @@ int Complain(std::string_view message, int code);
 int ComplainNoMemory();
 /// Says why a file was not read.
 int ComplainUnread(const Error& error);
+/// Says where the whole content stands if a save of the file was cut off while it was written over.
+void TellUnfinished(const std::string& path);
 
 enum class Purpose
 {

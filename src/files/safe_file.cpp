@@ -228,7 +228,7 @@ Result<void> SafeWriter::Replace(TemporaryFile& temporary)
 Result<void> SafeWriter::WriteInPlace(TemporaryFile& temporary, std::string_view text)
 {
     fs::path copy;
-    if (const std::error_code error = temporary.KeepAs(m_target, "new", copy))
+    if (const std::error_code error = temporary.KeepAs(m_target, UnfinishedSuffix, copy))
         return Failed(error);
     if (m_options.sync)
         m_platform.SyncFolder(m_folder); // where there is no such thing, the copy has to do as it is
@@ -339,6 +339,23 @@ std::vector<std::string> NameLeftBehind(const std::string& path, PlatformFile* p
     if (FollowLinks(platform, target, status) || platform.List(FolderOf(target), names))
         return {};
     return Utf8(TakeProtected(platform, target, names));
+}
+
+std::vector<std::string> UnfinishedSaves(const std::string& path, PlatformFile* platformOrNull)
+{
+    PlatformFile& platform = OrNative(platformOrNull);
+    fs::path target = PathFromUtf8(path);
+    FileStatus status, copy;
+    std::vector<std::string> found;
+    if (FollowLinks(platform, target, status))
+        return found;
+    constexpr int most = 9; // whoever has so many knows of them
+    for (int number = 1; number <= most; ++number) {
+        const fs::path name = NumberedName(target, UnfinishedSuffix, number);
+        if (!platform.Status(name, copy) && copy.kind == Kind::File)
+            found.push_back(Utf8FromPath(name));
+    }
+    return found;
 }
 
 std::string FreeCopyName(const std::string& path, std::string_view why)

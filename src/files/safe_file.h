@@ -54,6 +54,7 @@ struct WriteReport
     std::error_code unknown{}; // why it is not known whether somebody did, should it not be; it is kept all the same
     std::vector<std::string>
         leftBehind{};             // where what saves had displaced stands that were cut off before they said so
+    std::vector<std::string> unfinished{}; // see UnfinishedSaves
     std::error_code notRenamed{}; // it is written, and keeps its spelling
     FileVersion version{};        // what was written
     bool inPlace = false;         // the file itself was written over, as it has several names
@@ -70,6 +71,10 @@ Result<WriteReport> WriteFileSafely(const std::string& path, std::string_view te
 /// What somebody else had written to a file and a save displaced that was cut off before it said so: it gets the name
 /// that such a version has, which is given back. Whoever calls holds the file's lock.
 std::vector<std::string> NameLeftBehind(const std::string& path, PlatformFile* platform = nullptr);
+
+/// Where the whole new content stands that saves of a file of several names were writing over it when they were cut
+/// off: what the file holds itself may be half of it.
+std::vector<std::string> UnfinishedSaves(const std::string& path, PlatformFile* platform = nullptr);
 
 /// The first of PATH.WHY-1, -2, ... that is free.
 std::string FreeCopyName(const std::string& path, std::string_view why);

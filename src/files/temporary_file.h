@@ -72,5 +72,7 @@ std::chrono::nanoseconds TimeSince(std::int64_t time);
 
 /// Why a version that somebody else wrote stands beside a file.
 inline constexpr std::string_view DisplacedSuffix = "displaced";
+/// Why the new content of a file of several names stands beside it.
+inline constexpr std::string_view UnfinishedSuffix = "new";
 /// PATH.WHY-NUMBER
 std::filesystem::path NumberedName(const std::filesystem::path& path, std::string_view why, int number);

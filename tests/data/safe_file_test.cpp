@@ -387,6 +387,8 @@ TEST_F(SafeFile, OtherNamesOfAFileAreAskedAbout)
     ASSERT_FALSE(torn);
     EXPECT_EQ(torn.error().kept, Path("a.hdkv.new-1"));
     EXPECT_EQ(Text("a.hdkv.new-1"), "new content");
+    EXPECT_EQ(UnfinishedSaves(Path("a.hdkv")), std::vector{Path("a.hdkv.new-1")}) << "as when the program was killed";
+    EXPECT_TRUE(UnfinishedSaves(Path("b.hdkv")).empty());
 }
 
 TEST_F(SafeFile, WhatCannotBeKeptIsAskedAboutAndSaid)
@@ -450,7 +452,7 @@ TEST_F(SafeFile, WhatIsSwappedOutIsNoLeftOver)
         };
         const auto written = WriteFileSafely(Path("a.hdkv"), "new", {.platform = &platform});
         ASSERT_TRUE(written);
-        const auto& [unconfirmed, lost, displaced, unknown, leftBehind, notRenamed, version, inPlace] = written.value();
+        const auto& [unconfirmed, lost, displaced, unknown, leftBehind, unfinished, notRenamed, version, inPlace] = written.value();
         EXPECT_EQ(unknown.value(), failing == std::string("Status") ? EIO : 0);
         platform.fault = [](const std::string&) { return std::error_code(); };
         platform.aged = std::int64_t(7200) * 1'000'000'000;

@@ -97,9 +97,11 @@ void CKsDocumentFile::Know(const CString& path, const FileVersion& version)
     m_version = version;
 }
 
-void CKsDocumentFile::LookForLeftBehind()
+void CKsDocumentFile::LookForLeftBehind(bool isLocked)
 {
-    m_report.leftBehind = NameLeftBehind(m_path.toStdString());
+    if (isLocked)
+        m_report.leftBehind = NameLeftBehind(m_path.toStdString());
+    m_report.unfinished = UnfinishedSaves(m_path.toStdString());
 }
 
 /// Whether the file stands, under its present spelling, where a save to `target` writes.
@@ -282,6 +284,10 @@ CString CKsDocumentFile::NotesOn(const CString& path, const WriteReport& report)
     for (const std::string& left : report.leftBehind)
         notes << tr("A save of %1 was cut off. What another program may have written to it just before is kept in %2.")
                      .arg(NameOf(path), NameOf(QString::fromStdString(left)));
+    for (const std::string& whole : report.unfinished)
+        notes << tr("A save of %1 was cut off while the file was written over: it may be half old and half new. The whole "
+                    "new content is in %2.")
+                     .arg(NameOf(path), NameOf(QString::fromStdString(whole)));
     if (report.lost.Any())
         notes << tr("Not kept of %1 as it was before: %2.").arg(NameOf(path), LostWords(report.lost));
     return notes.join(u'\n');

@@ -54,8 +54,9 @@ public:
     const CString& KeptCopy() const { return m_keptCopy; }
     /// Likewise of a file that the caller has read as a text of this version, and of which nothing was left out.
     void Know(const CString& path, const FileVersion& version);
-    /// Finds what saves that were cut off have left behind, which SaveNotes tells; whoever calls holds the file's lock.
-    void LookForLeftBehind();
+    /// Finds what saves that were cut off have left behind, which SaveNotes tells; what they had displaced only for who
+    /// holds the file's lock.
+    void LookForLeftBehind(bool isLocked);
     /// What there is to say of the last save: that the disk did not confirm it, what could not be kept of the file that
     /// was replaced, and where what somebody else wrote meanwhile is kept. Mostly empty.
     CString SaveNotes() const { return NotesOn(m_path, m_report); }

@@ -21,8 +21,7 @@ void CKsProjectDoc::ReadFile(const CString& path, const std::function<void(tqlHa
 {
     m_file.Read(path, SavePathFor(path), load);
     m_showsDefaults = m_file.IsUnreadable();
-    if (m_use.IsHeld())
-        m_file.LookForLeftBehind();
+    m_file.LookForLeftBehind(m_use.IsHeld());
     FileIsKnown();
 }
 

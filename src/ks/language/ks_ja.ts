@@ -209,6 +209,10 @@ Save?</source>
         <source>A save of %1 was cut off. What another program may have written to it just before is kept in %2.</source>
         <translation>%1 の保存が途中で打ち切られました。その直前にほかのプログラムが書き込んだ可能性のある内容は %2 に残されています。</translation>
     </message>
+    <message>
+        <source>A save of %1 was cut off while the file was written over: it may be half old and half new. The whole new content is in %2.</source>
+        <translation>%1 の保存がファイルの上書き中に中断されました。ファイルは新旧の内容が混ざっているかもしれません。新しい内容の全体は %2 にあります。</translation>
+    </message>
 </context>
 <context>
     <name>CKsEditLong</name>
