@@ -50,7 +50,8 @@ void PrintFindings(std::ostream& stream, const std::string& path, const std::vec
 void TellUnfinished(const std::string& path)
 {
     for (const std::string& whole : UnfinishedSaves(path))
-        Complain("A save of \"" + path + "\" was cut off while the file was written over: it may be half old and half " +
+        Complain("A save of \"" + path +
+                     "\" was cut off while the file was written over: it may be half old and half " +
                      "new. The whole new content is in \"" + whole + "\".",
                  Exit::Fine);
 }

@@ -252,10 +252,13 @@ private:
         QComboBox& units = ComboAt(row, 2);
         const int target = ComboAt(row, 1).currentIndex() - 1;
         units.clear();
-        if (target >= 0 && m_rows.Column(target).IsNumeric())
-            units.addItems(KsTypedUnits(m_rows.Column(target).style, m_rows.Column(target).UnitSymbol()));
-        if (!unit.isEmpty() && units.count() == 0)
+        const ColumnSpec* const spec = target >= 0 ? &m_rows.Column(target) : nullptr;
+        const QString symbol = spec ? spec->UnitSymbol() : QString();
+        const QStringList possible = spec && spec->IsNumeric() ? KsTypedUnits(spec->style, symbol) : QStringList();
+        // The first one is that of the column: a factor is one, and percents are chosen.
+        if (symbol.isEmpty() && !(possible.isEmpty() && unit.isEmpty()))
             units.addItem(NoUnit);
+        units.addItems(possible);
         if (!unit.isEmpty() && units.findText(unit) < 0)
             units.addItem(unit);
         units.setCurrentIndex(unit.isEmpty() ? 0 : units.findText(unit));

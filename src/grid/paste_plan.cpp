@@ -71,11 +71,17 @@ CPastePlan::CPastePlan(const CTableRows& rows, const CopiedTable& copied, PasteC
 {
     m_values.resize(std::size_t(Columns()));
     m_left.resize(std::size_t(Columns()));
+    m_isRead.resize(std::size_t(Columns()));
     FindComplaint();
     FindLines();
     FindRows();
-    for (int column = 0; column < Columns(); ++column)
-        ReadColumn(column);
+    for (const bool hasLocks : {false, true}) // what others decide about comes when they are known
+        for (int column = 0; column < Columns(); ++column)
+            if (const int target = m_choice.columns[std::size_t(column)].target;
+                target >= 0 && bool(m_rows->Column(target).locked) == hasLocks) {
+                ReadColumn(column);
+                m_isRead[std::size_t(column)] = true;
+            }
     LeaveUnnamedLines();
     FindRuleFaults();
     CountCells();
@@ -316,8 +322,6 @@ void CPastePlan::Leave(std::size_t line, int column)
 void CPastePlan::ReadColumn(int column)
 {
     const int target = m_choice.columns[std::size_t(column)].target;
-    if (target < 0)
-        return;
     const ColumnSpec& spec = m_rows->Column(target);
     const bool isKey = NamesLine(column);
     const bool isPlain = spec.Kind() == CellKind::Number && !spec.locked && IsAsTyped(column);
@@ -346,7 +350,7 @@ void CPastePlan::ReadColumn(int column)
         if (row != New && (!spec.IsNumeric() || !read.refusal.isEmpty() || spec.locked)) {
             const void* const object = m_rows->Rows()->At(row);
             isLeft = text == EditText(spec, spec.access->get(object)); // may be what nobody could type
-            if (!isLeft && spec.IsLocked(object))
+            if (!isLeft && spec.IsLocked(object) && IsLockedThen(line, column))
                 read.refusal = GridTexts::tr("The cell is locked.");
         }
         if (!isLeft && !read.refusal.isEmpty())
@@ -359,6 +363,29 @@ void CPastePlan::ReadColumn(int column)
             values.Add(m_rows->Resolved(target, read.value, BlankRule::Fill), Lines());
         }
     }
+}
+
+/// Whether a cell of a line that is there is locked by what the line holds once the columns are pasted that were read
+/// before: which kind of map it is, say.
+bool CPastePlan::IsLockedThen(std::size_t line, int column) const
+{
+    const auto decides = [this](const PasteChoice::Column& each) {
+        const CellKind kind = each.target < 0 ? CellKind::Text : m_rows->Column(each.target).Kind();
+        return kind == CellKind::Choice || kind == CellKind::Flag || kind == CellKind::TextChoice;
+    };
+    const ColumnSpec& spec = m_rows->Column(m_choice.columns[std::size_t(column)].target);
+    const std::size_t row = m_rowOf[line];
+    IRowSource& rows = *m_rows->Rows();
+    if (row < rows.FixedRows() || std::ranges::none_of(m_choice.columns, decides))
+        return spec.IsLocked(rows.At(row));
+    const auto then = rows.Copies({row});
+    for (int other = 0; other < Columns(); ++other) {
+        const auto& left = m_left[std::size_t(other)];
+        if (other != column && m_isRead[std::size_t(other)] && !(!left.empty() && left[line]))
+            m_rows->Column(m_choice.columns[std::size_t(other)].target)
+                .access->set(then->At(0), m_values[std::size_t(other)][line]);
+    }
+    return spec.IsLocked(then->At(0));
 }
 
 void CPastePlan::AddFault(std::size_t line, int column, const QString& reason)

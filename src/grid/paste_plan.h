@@ -134,6 +134,7 @@ private:
     CellReading Read(std::size_t line, int column) const;
     QString WhyNoName(int target, const CellValue& value) const;
     void ReadColumn(int column);
+    bool IsLockedThen(std::size_t line, int column) const;
     void Leave(std::size_t line, int column);
     void AddFault(std::size_t line, int column, const QString& reason);
     void LeaveUnnamedLines();
@@ -153,6 +154,7 @@ private:
     std::size_t m_blankLines = 0;
     std::vector<std::size_t> m_rowOf{};
     std::vector<CCellValues> m_values{};     // by column of the texts
+    std::vector<bool> m_isRead{};            // likewise: whether they are known
     std::vector<std::vector<bool>> m_left{}; // those that stay as they are; empty where none does
     std::vector<Fault> m_faults{};
     QString m_complaint{};

@@ -28,7 +28,8 @@ void CKavo0_hdView::ShowProfile()
     if (!frame || !m_sheet || !CProfileDock::IsWanted())
         return;
     CProfileDock& dock = CProfileDock::In(*frame);
-    dock.ShowPanel(Profile(), GetDocument()->GetTitle());
+    Profile().setWindowTitle(GetDocument()->GetTitle());
+    dock.ShowPanel(Profile());
     dock.show();
     TellProfile();
 }

@@ -24,6 +24,11 @@ CProfileDock::CProfileDock(CKsMDIFrameWnd& frame) : QDockWidget(&frame), m_panel
         frame.addDockWidget(Qt::BottomDockWidgetArea, this);
     if (!isFloating() && height() < FirstHeight)
         frame.resizeDocks({this}, {FirstHeight}, Qt::Vertical);
+    connect(m_panels, &QStackedWidget::currentChanged, this, [this](int index) {
+        Retranslate();
+        if (index < 0)
+            hide();
+    });
     Retranslate();
 }
 
@@ -49,19 +54,19 @@ void CProfileDock::Want(bool shown)
     setVisible(shown);
 }
 
-void CProfileDock::ShowPanel(QWidget& panel, const QString& document)
+void CProfileDock::ShowPanel(QWidget& panel)
 {
     if (m_panels->indexOf(&panel) < 0)
         m_panels->addWidget(&panel);
     m_panels->setCurrentWidget(&panel);
-    m_document = document;
     Retranslate();
 }
 
 void CProfileDock::Retranslate()
 {
     const QString title = ProfileTexts::tr("Long Profile");
-    setWindowTitle(m_document.isEmpty() ? title : QStringLiteral("%1 - %2").arg(title, KsTitleText(m_document)));
+    const QString document = m_panels->currentWidget() ? m_panels->currentWidget()->windowTitle() : QString();
+    setWindowTitle(document.isEmpty() ? title : QStringLiteral("%1 - %2").arg(title, KsTitleText(document)));
 }
 
 void CProfileDock::changeEvent(QEvent* event)

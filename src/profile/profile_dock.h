@@ -18,8 +18,9 @@ public:
     static bool IsWanted();
     /// Shows it, or hides it: as the user wants it from now on.
     void Want(bool shown);
-    /// Brings the profile of a document to the front.
-    void ShowPanel(QWidget& panel, const QString& document);
+    /// Brings the profile of a document to the front, whose title is that of the panel. A panel that goes leaves;
+    /// without any the dock is hidden until the next one comes.
+    void ShowPanel(QWidget& panel);
 
 protected:
     void changeEvent(QEvent* event) override;
@@ -30,5 +31,4 @@ private:
     void Retranslate();
 
     QStackedWidget* m_panels;
-    QString m_document; // whose profile is in front
 };

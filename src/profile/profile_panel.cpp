@@ -13,6 +13,7 @@
 #include <QApplication>
 #include <QClipboard>
 #include <QComboBox>
+#include <QElapsedTimer>
 #include <QEvent>
 #include <QFileInfo>
 #include <QLabel>
@@ -20,7 +21,6 @@
 #include <QMimeData>
 #include <QPixmap>
 #include <QSettings>
-#include <QTimer>
 #include <QToolBar>
 #include <QToolButton>
 #include <QUndoStack>
@@ -84,6 +84,11 @@ CProfilePanel::CProfilePanel(IProfileHost& host, const QUndoStack& steps, QWidge
     const QStringList shown = QSettings().value(TracksKey, QStringList{LevelsTrack, ReachesTrack}).toStringList();
     m_shown = QSet<QString>(shown.begin(), shown.end());
     connect(m_branches, &QComboBox::activated, this, [this] { ShowBranch(m_branches->currentData().toString()); });
+    m_later.setSingleShot(true);
+    connect(&m_later, &QTimer::timeout, this, [this] {
+        if (isVisible())
+            ShowNow();
+    });
     connect(&m_steps, &QUndoStack::indexChanged, this, &CProfilePanel::Refresh);
     connect(&KsUnits::Instance(), &KsUnits::Changed, this, [this] {
         m_fits = true;
@@ -194,13 +199,10 @@ void CProfilePanel::changeEvent(QEvent* event)
 
 void CProfilePanel::Refresh()
 {
+    constexpr int quick = 30, pause = 300; // milliseconds: what nobody feels; when a user has paused
     m_isDirty = true;
-    if (isVisible() && !std::exchange(m_isWaiting, true))
-        QTimer::singleShot(0, this, [this] {
-            m_isWaiting = false;
-            if (isVisible())
-                ShowNow();
-        });
+    if (isVisible())
+        m_later.start(m_cost > quick ? pause : 0); // a million lines must not hold up the next key
 }
 
 const Profile& CProfilePanel::Shown()
@@ -219,13 +221,19 @@ void CProfilePanel::ShowNow()
 {
     if (!m_plot || (IsTrue() && m_front == m_host.FrontTab()))
         return;
+    QElapsedTimer time;
+    time.start();
     ShowBranches();
+    m_plot->Widget().setVisible(!m_branch.isEmpty());
+    m_reason->setVisible(m_branch.isEmpty());
+    m_reason->setText(ProfileTexts::tr("There is no branch yet: neither a line nor the network names one."));
     m_profile = MakeProfile(m_host, m_branch, m_shown);
     m_madeAt = m_steps.index();
     m_front = m_host.FrontTab();
     m_isDirty = false;
     m_plot->Show(m_profile.plot, std::exchange(m_fits, false));
     MarkCurrent();
+    m_cost = time.elapsed();
 }
 
 void CProfilePanel::ShowBranches()

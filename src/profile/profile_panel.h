@@ -3,6 +3,7 @@
 
 #include "profile/profile_content.h"
 
+#include <QTimer>
 #include <QWidget>
 #include <functional>
 #include <memory>
@@ -70,7 +71,9 @@ private:
     QAction *m_choose, *m_fit, *m_in, *m_out, *m_copy, *m_export, *m_print;
     Profile m_profile;
     int m_madeAt = -1; // the step at which it was made
-    bool m_isDirty = true, m_isWaiting = false, m_fits = true;
+    bool m_isDirty = true, m_fits = true;
+    QTimer m_later;        // until it is shown anew
+    qint64 m_cost = 0;     // of that, the last time; milliseconds
     int m_front = -1;      // the tab for which it was made
     QSet<QString> m_shown; // keys of tracks
     QString m_branch;      // key

@@ -189,6 +189,22 @@ class Outside(Case):
         self.assertEqual(self.saved().records('InitList')[0], FIRST)
         self.assert_no_message()
 
+    def test_something_else_in_the_place_of_the_file(self):
+        editor = self.open()
+        editor.settle(0.6)
+        os.remove(self.path())
+        os.mkdir(self.path())
+        self.wait_told('cannot be read any more')
+        self.assertFalse(editor.modified)
+        editor.press('ctrl+w')
+        self.assertIn('nowhere else', '\n'.join(editor.answer('Cancel')))
+        self.assertEqual(self.level(), '1.25', 'it is open still')
+        os.rmdir(self.path())
+        self.wait_told('was removed or renamed by another program')
+        self.choose('Save Again')
+        self.wait_untold('another program')
+        self.assertEqual(self.saved().records('InitList')[0], FIRST)
+
     def test_each_kind_in_a_project(self):
         editor = self.open_project()
         editor.settle(0.6)

@@ -70,3 +70,15 @@ class Pasting(Case):
         self.assertIn('4 cells pasted', editor.status())
         editor.save()
         self.assertEqual(self.saved().records('InitList'), ['"A", 0, 10, 1', '"A", 100, 10, 1', '"B", 50, 20, 2'])
+
+    def test_a_number_without_unit_is_one_in_the_preview_too(self):
+        editor = self.open(samples.hd_text({'WindList': ['"A", 100, 0.5', '"A", 200, 0.6']}))
+        editor.go_to('Wind')
+        copy('27\n')
+        editor.click_cell(1, 3)
+        editor.press('ctrl+shift+v')
+        editor.box()
+        editor.press('Return')
+        editor.settle()
+        editor.save()
+        self.assertEqual(self.saved().records('WindList'), ['"A", 100, 27', '"A", 200, 0.6'])

@@ -1,4 +1,5 @@
 // The pages of time series output and maps: lists without locations, files to browse for, dates, locks of a row.
+#include "grid/grid_clipboard.h"
 #include "page_fixture.h"
 #include "pages/page_table.h"
 
@@ -260,6 +261,36 @@ TEST_F(OutputFilesTest, TypeAndItemLockTheOtherCellsOfARow)
         EXPECT_EQ(locked(), c.locked);
     }
     EXPECT_EQ(maps.MapOutputFiles[1].Type, 0);
+}
+
+// What a pasted type unlocks takes what is pasted with it, in whatever order the columns stand.
+TEST_F(OutputFilesTest, ALineThatIsPastedOverAnotherIsItsCopy)
+{
+    maps.GenerateOutput = true;
+    maps.MapOutputFiles.resize(2);
+    Open(MakeMapsPage);
+    CGenGrid& cells = Part("maps_1226");
+    const std::pair<int, const char*> dynamic[] = {{7, "b.map"}, {10, "AD component"}, {9, "Dynamic"}, {11, "7"}};
+    for (const auto& [column, typed] : dynamic)
+        ASSERT_TRUE(cells.Model()->setData(cells.model()->index(1, column - 1), typed, Qt::EditRole)) << column;
+    cells.StoreEditedLine();
+    const auto line = [&cells](int row) {
+        QStringList texts;
+        for (int column = 1; column <= cells.ColumnCount(); ++column)
+            texts << cells.TextAt(row, column);
+        return texts;
+    };
+    const QStringList before = line(1), copied = line(2);
+    ASSERT_NE(before, copied);
+    cells.SetCurrentCell(2, 1);
+    cells.SelectLines(2, 2);
+    CopyCells(cells);
+    cells.SetCurrentCell(1, 1);
+    EXPECT_TRUE(PasteCells(cells));
+    EXPECT_EQ(line(1), copied);
+    EXPECT_EQ(line(2), copied);
+    document.UndoStack().undo();
+    EXPECT_EQ(line(1), before);
 }
 
 TEST_F(OutputFilesTest, WhatIsShownAndEnabled)

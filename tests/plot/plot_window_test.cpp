@@ -148,7 +148,7 @@ TEST_F(PlotWindowTest, WhatIsInSightMovesAndZooms)
     EXPECT_GT(plot->Range().second, plot->Range().first) << "numbers on the axis still differ";
     for (int i = 0; i < 300; ++i)
         plot->Zoom(0.5);
-    EXPECT_TRUE(std::isfinite(plot->Range().second));
+    EXPECT_LT(plot->Range().second - plot->Range().first, 5 * (all.second - all.first)) << "it is still seen";
     plot->SetRange(0, 100);
     plot->Mark(1000, {{0, 1, 2}});
     EXPECT_GE(plot->Range().second, 1000) << "what is marked comes into sight";

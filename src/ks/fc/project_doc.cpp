@@ -7,6 +7,7 @@
 
 #include <QTimer>
 #include <QUndoStack>
+#include <algorithm>
 #include <new>
 #include <utility>
 
@@ -61,7 +62,13 @@ void CKsProjectDoc::FileIsKnown()
 /// Who reads only has nothing to lose: what is shown is somebody else's, or nobody's.
 bool CKsProjectDoc::IsFileGone() const
 {
-    return m_outside->Sight().kind == KsFileSight::Gone && !IsReadOnly();
+    // Something else may stand in its place, or in that of its folder. What cannot be read for another reason is there.
+    constexpr std::errc others[] = {std::errc::is_a_directory, std::errc::operation_not_supported,
+                                    std::errc::not_a_directory, std::errc::too_many_symbolic_link_levels};
+    const KsFileSight& sight = m_outside->Sight();
+    const bool isOther = sight.kind == KsFileSight::Unreadable &&
+                         std::ranges::any_of(others, [&sight](std::errc other) { return sight.why == other; });
+    return (sight.kind == KsFileSight::Gone || isOther) && !IsReadOnly();
 }
 
 bool CKsProjectDoc::SaveOverOthers()

@@ -8,6 +8,7 @@
 namespace {
 
 constexpr double LeastDetail = 1e-9; // of the extent: numbers on the axis are to differ
+constexpr double MostOfExtent = 4;   // in sight: who sees less of a branch has lost it
 constexpr double WheelStep = 1.25;
 
 /// A number to the digits that a step as large as a pixel has: with more nobody could point at it.
@@ -131,7 +132,7 @@ void CPlotWindow::SetSight(double from, double to)
 {
     const auto [first, last] = Extent();
     const double least = std::max((last - first) * LeastDetail, std::abs(from) * 1e-12);
-    if (!std::isfinite(from) || !std::isfinite(to) || to - from < least || to - from > (last - first) * 1e6)
+    if (!std::isfinite(from) || !std::isfinite(to) || to - from < least || to - from > (last - first) * MostOfExtent)
         return;
     m_from = from;
     m_to = to;

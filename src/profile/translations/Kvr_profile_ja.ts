@@ -168,5 +168,9 @@
         <source>Long Profile</source>
         <translation>縦断図</translation>
     </message>
+    <message>
+        <source>There is no branch yet: neither a line nor the network names one.</source>
+        <translation>まだ河川がありません。河川名のある行も、河道網の河川もありません。</translation>
+    </message>
 </context>
 </TS>
