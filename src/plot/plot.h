@@ -94,8 +94,6 @@ public:
     virtual QString Write(const QString& file, int width, int height) = 0;
     /// Asks for a printer, and fills a page.
     virtual void Print(QWidget* parent) = 0;
-    /// Draws it on the window at once, for whoever measures that.
-    virtual void Redraw() = 0;
 };
 
 inline const QStringList PlotFileTypes{QStringLiteral("png"), QStringLiteral("svg"), QStringLiteral("pdf")};
@@ -104,7 +102,6 @@ inline const QStringList PlotFileTypes{QStringLiteral("png"), QStringLiteral("sv
 struct PlotLibrary
 {
     std::unique_ptr<IPlot> (*make)(QWidget* parent, PlotHandlers handlers);
-    const char* drawnBy; // name and version of what it stands on
 };
 extern "C" using PlotLibraryGetter = const PlotLibrary * ();
 inline constexpr const char *PlotLibraryName = "KVR_PLOT", *PlotLibraryFunction = "KvrPlotLibrary";

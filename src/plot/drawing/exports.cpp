@@ -25,7 +25,6 @@ public:
         return WritePlot(*m_window, file, width, height);
     }
     void Print(QWidget* parent) override { PrintPlot(*m_window, parent); }
-    void Redraw() override { m_window->Redraw(); }
 
 private:
     QPointer<CPlotWindow> m_window; // its parent may delete it
@@ -40,6 +39,6 @@ std::unique_ptr<IPlot> Make(QWidget* parent, PlotHandlers handlers)
 
 extern "C" Q_DECL_EXPORT const PlotLibrary* KvrPlotLibrary()
 {
-    static const PlotLibrary library{&Make, "QCustomPlot " QCUSTOMPLOT_VERSION_STR};
+    static const PlotLibrary library{&Make};
     return &library;
 }

@@ -23,7 +23,10 @@ double ToPixel(double number, double pixel)
 } // namespace
 
 CPlotWindow::CPlotWindow(QWidget* parent, PlotHandlers handlers)
-    : QCustomPlot(parent), m_handlers(std::move(handlers)), m_box(QRubberBand::Rectangle, this)
+    : QCustomPlot(parent),
+      m_handlers(std::move(handlers)),
+      m_margins(new QCPMarginGroup(this)),
+      m_box(QRubberBand::Rectangle, this)
 {
     setNotAntialiasedElements(QCP::aeGrid | QCP::aeAxes);
     setPlottingHints(QCP::phFastPolylines | QCP::phCacheLabels);
@@ -68,11 +71,10 @@ void CPlotWindow::Show(PlotContent content, bool fits)
     plotLayout()->simplify();
     m_content = std::move(content);
     m_current = {};
-    auto* margins = new QCPMarginGroup(this);
     for (std::size_t i = 0; i < m_content.tracks.size(); ++i) {
         m_tracks.push_back(std::make_unique<CTrackView>(*this, int(2 * i), m_content.tracks[i]));
         QCPAxisRect& axes = m_tracks.back()->Axes();
-        axes.setMarginGroup(QCP::msLeft | QCP::msRight, margins);
+        axes.setMarginGroup(QCP::msLeft | QCP::msRight, m_margins);
         axes.setMinimumMargins(QMargins(6, 7, 10, 2));
         const bool isLast = i + 1 == m_content.tracks.size();
         QCPAxis& across = m_tracks.back()->Across();

@@ -88,5 +88,6 @@ private:
     std::pair<double, double> m_sightThen{}; // likewise, what was in sight
     QCPRange m_valuesThen{};                 // of the track it began in
     bool m_isMoved = false;                  // so far that no click was meant
+    QCPMarginGroup* m_margins;               // of the tracks, whose curves stand one below the other; child
     QRubberBand m_box;
 };
