@@ -168,10 +168,9 @@ void CPastePlan::FindRows()
             continue;
         m_rowOf[line] = Nowhere;
         AddFault(line, -1,
-                 m_choice.place == PastePlace::AtCell ? GridTexts::tr("From line %1 on the table has only %2 lines.")
-                                                            .arg(m_rows->LineNumber(m_choice.row))
-                                                            .arg(stored - m_choice.row)
-                                                      : GridTexts::tr("The table takes no new lines."));
+                 m_choice.place == PastePlace::AtCell
+                     ? GridTexts::tr("The table ends with line %1 and takes no new ones.").arg(m_rows->LineCount())
+                     : GridTexts::tr("The table takes no new lines."));
     }
 }
 

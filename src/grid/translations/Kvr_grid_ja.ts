@@ -1058,10 +1058,6 @@
         <translation>行は &quot;%1&quot; と &quot;%2&quot; で対応させます。両方に貼り付ける列が必要です。</translation>
     </message>
     <message>
-        <source>From line %1 on the table has only %2 lines.</source>
-        <translation>%1 行目以降、表には %2 行しかありません。</translation>
-    </message>
-    <message>
         <source>The table takes no new lines.</source>
         <translation>この表に新しい行は追加できません。</translation>
     </message>
@@ -1248,6 +1244,10 @@
     <message>
         <source>The last line cannot go down.</source>
         <translation>最後の行は下に移動できません。</translation>
+    </message>
+    <message>
+        <source>The table ends with line %1 and takes no new ones.</source>
+        <translation>この表は %1 行目までで、行を追加できません。</translation>
     </message>
 </context>
 </TS>

@@ -190,7 +190,7 @@ TEST_F(NetworkTest, LinesAreInsertedSortedAndDeletedWithKeys)
     QTest::keyClick(view->Branches(), Qt::Key_V, Qt::ControlModifier);
     QCoreApplication::processEvents();
     ASSERT_EQ(listed.size(), 1);
-    EXPECT_TRUE(listed[0].contains("From line 2 on the table has only 1 lines")) << listed[0].toStdString();
+    EXPECT_TRUE(listed[0].contains("The table ends with line 2 and takes no new ones")) << listed[0].toStdString();
     EXPECT_EQ(boxes, QStringList());
     view->activateWindow(); // no window manager gives the focus back
     EXPECT_TRUE(QTest::qWaitForWindowActive(view));
