@@ -185,6 +185,8 @@ private:
                 : GridTexts::Counted(found, GridTexts::tr("1 cell found"), GridTexts::tr("%1 cells found")) +
                       QStringLiteral("; ") +
                       GridTexts::Counted(changed, GridTexts::tr("1 would change."), GridTexts::tr("%1 would change."));
+        if (found == 0 && IsNoCondition())
+            text += u' ' + GridTexts::tr("Of numbers a condition is 5, >3, <=3, 2..7, =4 or !=4.");
         if (isFiltered)
             text += u' ' + GridTexts::tr("Lines that a filter hides are left alone.");
         m_summary->setText(text);
@@ -193,6 +195,24 @@ private:
         m_next->setEnabled(found > 0);
         m_one->setEnabled(may);
         m_all->setEnabled(may);
+    }
+
+    /// The text begins as a condition on numbers, and is none for any column of them.
+    bool IsNoCondition() const
+    {
+        const ReplaceQuery query = Query();
+        const QString text = query.find.trimmed();
+        bool areNumbers = false;
+        if (text.isEmpty() || !(QStringView(u"<>=!").contains(text.front()) || text.contains(QStringLiteral(".."))))
+            return false;
+        for (const Place& place : Places())
+            for (int column = place.block.left; column <= place.block.right; ++column) {
+                const ColumnSpec& spec = place.table.grid->Model()->Column(column);
+                areNumbers = areNumbers || spec.IsNumeric();
+                if (spec.IsNumeric() && CellFinder(spec, query))
+                    return false;
+            }
+        return areNumbers;
     }
 
     void List(const Place& place, const std::vector<CCellResults::Cell>& cells, const QString& reason)

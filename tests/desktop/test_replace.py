@@ -23,6 +23,17 @@ class FindAndReplace(Case):
         shown = lambda: '\n'.join(label.text for label in box.all('label'))
         wait_for(lambda: text in shown(), f'{text} is shown', 5)
 
+    def test_what_is_no_condition_says_how_one_is_written(self):
+        editor = self.open(samples.hd_text(LINES))
+        editor.click_cell(2, 3)
+        box = self.ask('>>2', '1')
+        self.wait_for_summary(box, 'Nothing found. Of numbers a condition is 5, >3, <=3, 2..7, =4 or !=4.')
+        editor.press('Escape')
+        box = self.ask('>500', '1')
+        self.wait_for_summary(box, 'Nothing found.')
+        self.assertNotIn('condition is', '\n'.join(label.text for label in box.all('label')))
+        editor.press('Escape')
+
     def test_a_range_of_numbers_by_a_formula_in_a_column(self):
         editor = self.open(samples.hd_text(LINES))
         editor.click_cell(2, 3)

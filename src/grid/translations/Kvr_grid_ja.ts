@@ -1249,5 +1249,9 @@
         <source>The table ends with line %1 and takes no new ones.</source>
         <translation>この表は %1 行目までで、行を追加できません。</translation>
     </message>
+    <message>
+        <source>Of numbers a condition is 5, &gt;3, &lt;=3, 2..7, =4 or !=4.</source>
+        <translation>数値の条件は 5、&gt;3、&lt;=3、2..7、=4、!=4 のように入力します。</translation>
+    </message>
 </context>
 </TS>
