@@ -22,6 +22,7 @@ PROGRAMS = {'tql': ['tql_test'], 'files': ['data_test'], 'data': ['data_test', '
             'grid': ['grid_test', 'pages_test', 'sheet_pages_test'],
             'document': ['pages_test', 'sheet_pages_test', 'module_test'], 'pages': ['pages_test', 'sheet_pages_test'],
             'module': ['module_test'], 'common': ['network_test', 'cross_sections_test'], 'network': ['network_test'],
+            'plot': ['plot_test'], 'profile': ['profile_test'],
             'cross_sections': ['cross_sections_test'], 'shell': ['shell_test']}
 MINUTES = 3  # a test that hangs has noticed, too
 
