@@ -215,7 +215,7 @@ MUTANTS = [
     ('plot', 'plot/reduced_curve.cpp', 'value > (*m_y)[extremes.highest]', 'value < (*m_y)[extremes.highest]'),
     ('profile', 'profile/profile_content.cpp', 'std::ranges::stable_sort(*lines, {}, &Line::x);', ';'),
     ('profile', 'profile/profile_edit.cpp', 'source.rows[before - 1] + 1', 'source.rows[before - 1]'),
-    ('profile', 'profile/profile_edit.cpp', 'column == but || ', ''),
+    ('profile', 'profile/profile_edit.cpp', 'column == but || ', 'column != but || '),
     ('profile', 'profile/profile_edit.cpp', 'if (model.ShownRow(row) < 0)', 'if (false)'),
     ('pages', 'grid/paste_plan.cpp', 'spec.IsLocked(object) && IsLockedThen(line, column)', 'spec.IsLocked(object)'),
     ('ks', 'ks/units/typed_number.cpp', 'isRounder ? style', '!isRounder ? style'),
