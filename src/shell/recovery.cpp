@@ -6,6 +6,7 @@
 #include "ks/fc/frames.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/project_doc.h"
+#include "ks/fc/shown_text.h"
 #include "shell/plugin_loader.h"
 #include "shell/recovery_dialog.h"
 #include "shell/recovery_folder.h"
@@ -38,8 +39,9 @@ bool IsSaved(const CRecoveryHeader& header)
 }
 
 /// Of a document that stands beside its file; files of one name in two folders are told apart by a number.
-QString FreeTitle(const QString& name)
+QString FreeTitle(const QString& file)
 {
+    const QString name = KsVisibleText(file);
     QString title = CRecovery::tr("%1 (recovered)").arg(name);
     const auto isTaken = [&title](const CMultiDocTemplate* documents) {
         return std::ranges::any_of(documents->findChildren<const CKsDoc*>(Qt::FindDirectChildrenOnly),

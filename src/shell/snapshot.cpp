@@ -91,10 +91,11 @@ void CSnapshot::StateChanged()
 void CSnapshot::LookAtTyping()
 {
     const QStringList typed = CKsTypedText::Of(m_document);
-    if (typed == m_typed)
+    const bool isNothing = typed.isEmpty() && !m_document.IsUnsaved();
+    if (typed == m_typed && !(isNothing && m_failure))
         return;
-    if (typed.isEmpty() && !m_document.IsUnsaved())
-        Drop(); // it was taken back
+    if (isNothing)
+        Drop(); // it was taken back, also what could not be kept
     else
         Write();
 }

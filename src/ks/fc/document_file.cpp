@@ -6,6 +6,7 @@
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
 #include "ks/fc/syntax_error.h"
+#include "ks/fc/shown_text.h"
 #include "ks/fc/system_reason.h"
 
 #include <QDir>
@@ -17,7 +18,7 @@ namespace {
 
 CString NameOf(const CString& path)
 {
-    return QFileInfo(path).fileName();
+    return KsVisibleText(QFileInfo(path).fileName());
 }
 
 CString Native(const std::string& path)
