@@ -1,6 +1,7 @@
 // The view and the long profile of its document: what the profile asks, and what it is told.
 #include "module/view.h"
 
+#include "files/declare_field.h"
 #include "grid/gen_grid.h"
 #include "ks/fc/branch_name.h"
 #include "ks/fc/exchange.h"
@@ -91,7 +92,7 @@ std::vector<BedLevel> CKavo0_hdView::BedLevels(const QString& branch)
 
 bool CKavo0_hdView::AreDepths(std::string_view field) const
 {
-    return field == "InitialH" && GetDocument()->Parameters().Global.iLevelDepth == 1;
+    return field == FieldOf(&HD_Initial::InitialH).name && GetDocument()->Parameters().Global.iLevelDepth == 1;
 }
 
 bool CKavo0_hdView::ShowCell(const ProfileTable& table, std::size_t row, int column)

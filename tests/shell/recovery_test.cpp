@@ -555,6 +555,30 @@ TEST_F(RecoveryTest, WhatCannotBeKeptIsToldUntilItCanBe)
     EXPECT_FALSE(notice->isVisible());
 }
 
+TEST_F(RecoveryTest, WhatWasTakenBackWhileNothingCouldBeKeptIsForgotten)
+{
+    CKsDoc* document = Open(Write("a.HDKV", HDText));
+    QDir().mkpath(QFileInfo(Folder()).path());
+    QFile obstacle(Folder());
+    ASSERT_TRUE(obstacle.open(QIODevice::WriteOnly)); // no folder
+    const auto* notice = frame->findChild<QLabel*>("recoveryLabel");
+    QTest::qWait(50);
+    QLineEdit* field = nullptr;
+    for (auto* each : frame->findChildren<QLineEdit*>())
+        if (each->isVisible() && each->text() == "1.5")
+            field = each;
+    ASSERT_TRUE(field);
+    field->setFocus();
+    QTest::keyClicks(field, "7");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return notice->isVisible(); }));
+    QTest::keyClick(field, Qt::Key_Escape);
+    EXPECT_FALSE(document->IsModified());
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !notice->isVisible(); })) << "there is nothing to keep any more";
+    obstacle.remove();
+    QTest::qWait(200);
+    EXPECT_TRUE(Kept().isEmpty());
+}
+
 TEST_F(RecoveryTest, SessionsThatLiveKeepTheirOwn)
 {
     auto first = std::make_unique<CRecoveryFolder>();
