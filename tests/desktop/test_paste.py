@@ -2,6 +2,7 @@
 import samples
 from case import Case
 from test_telling import copy
+from waiting import wait_for
 
 
 LINES = ['"A", 0, 10, 1', '"A", 100, 20, 2', '"B", 50, 7, 3']
@@ -70,6 +71,20 @@ class Pasting(Case):
         self.assertIn('4 cells pasted', editor.status())
         editor.save()
         self.assertEqual(self.saved().records('InitList'), ['"A", 0, 10, 1', '"A", 100, 10, 1', '"B", 50, 20, 2'])
+
+    def test_a_further_table_of_a_page_says_what_was_left_out(self):
+        editor = self.open(self.TEXT)
+        editor.go_to('Time Series Output')
+        editor.click(editor.field('Generate time series', role='check box'))
+        table = editor.table('Items')
+        copy('Water level\tWL1\nNonsense\tQ1\n')
+        editor.click_cell(1, 1, table)
+        editor.press('ctrl+v')
+        editor.box()
+        editor.press('alt+l')
+        editor.settle(0.3)
+        editor.press('Return')
+        wait_for(lambda: '3 cells pasted; left out: 1 cell' in editor.status(), 'the status bar says so', 3)
 
     def test_a_number_without_unit_is_one_in_the_preview_too(self):
         editor = self.open(samples.hd_text({'WindList': ['"A", 100, 0.5', '"A", 200, 0.6']}))

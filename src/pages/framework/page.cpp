@@ -81,7 +81,7 @@ bool CGenPropertyPage::LeaveField()
 
 CGenGrid* CGenPropertyPage::LinesGrid() const
 {
-    const QWidget* focus = QApplication::focusWidget();
+    const QWidget* focus = window()->focusWidget(); // also while a dialog has the keys
     for (CGenGrid* grid : m_grids)
         if (grid == focus || grid->isAncestorOf(focus))
             return grid;
