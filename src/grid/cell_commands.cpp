@@ -45,11 +45,17 @@ void Cut(CGenGrid& grid, const CellBlock& block)
 {
     const bool areLines = grid.Selection().AreLines();
     CopyCells(grid);
-    if (areLines && grid.HasLinesToDelete() && grid.Host())
+    if (areLines && grid.HasLinesToDelete() && grid.Host()) {
+        CGridModel& model = *grid.Model();
+        const int before = model.LineCount();
+        const QString lost = model.Rows()->LostWhenCut();
         grid.Host()->Run(grid, GridAction::DeleteLine);
-    else
+        if (model.LineCount() < before && !lost.isEmpty())
+            model.Document()->Say(lost);
+    } else {
         Make(grid, Clear(*grid.Model(), block), NameOf(GridAction::Cut),
              {GridTexts::tr("1 cell cut"), GridTexts::tr("%1 cells cut")});
+    }
 }
 
 } // namespace

@@ -41,6 +41,8 @@ public:
     virtual std::unique_ptr<IRowBlock> NewRows(std::size_t count) const = 0;
     /// Rows that hold what these do, shown by columns or not; not in the source.
     virtual std::unique_ptr<IRowBlock> Copies(const std::vector<std::size_t>& rows) = 0;
+    /// What is to be said when rows are cut of which the clipboard, which has their cells, does not have all.
+    virtual QString LostWhenCut() const { return {}; }
     /// Puts the rows in at `row` (at the end when there are fewer) and returns the row where they went.
     virtual std::size_t Put(std::size_t row, std::unique_ptr<IRowBlock> block) = 0;
     virtual std::unique_ptr<IRowBlock> Take(std::size_t row, std::size_t count) = 0;

@@ -22,6 +22,10 @@ public:
     explicit CSectionRows(CCrossSectionDoc& document) : VectorRows(document.Sections().sections), m_document(document)
     {
     }
+    QString LostWhenCut() const override
+    {
+        return SectionTables::tr("Cut. The points are not on the clipboard; Undo brings them back.");
+    }
 
     /// On the branch of the section above, between it and the next one; the first of all is on a branch of the project.
     void Fit(IRowBlock& rows, std::size_t at) const override

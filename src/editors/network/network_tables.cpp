@@ -32,6 +32,10 @@ public:
     explicit CBranchRows(CNetworkDoc& document) : VectorRows(document.Network().branches) {}
 
     bool MayGrow() const override { return false; }
+    QString LostWhenCut() const override
+    {
+        return NetworkTables::tr("Cut. Vertices and channel are not on the clipboard; Undo brings them back.");
+    }
     bool HasRules() const override { return true; }
     std::vector<Fault> FindFaults(std::size_t first, IRowBlock& rows, std::size_t most) const override
     {

@@ -220,9 +220,12 @@ Result<void> CKsDocumentFile::Save(const CString& target, const KsFileWriter& wr
     if (!same)
         options.renameTo = target.toStdString();
     options.ask = [this](const WriteQuestion& question) { return Ask(question); };
+    const std::optional<WriteAnswer> answered = m_otherNames;
     Result<WriteReport> saved = write((same ? target : entry.value()).toStdString(), options);
-    if (!saved)
+    if (!saved) {
+        m_otherNames = answered; // nothing came of what was said this time
         return saved.error();
+    }
     CKsDocumentFile written;
     written.m_report = std::move(saved.value()); // it is saved: nothing may ask for memory any more
     written.m_version = written.m_report.version;

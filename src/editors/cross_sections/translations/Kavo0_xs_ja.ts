@@ -196,5 +196,9 @@ Delete Lines</source>
         <source>Bed level</source>
         <translation>河床高</translation>
     </message>
+    <message>
+        <source>Cut. The points are not on the clipboard; Undo brings them back.</source>
+        <translation>切り取りました。測点はクリップボードに入りません。「元に戻す」で戻せます。</translation>
+    </message>
 </context>
 </TS>

@@ -630,6 +630,10 @@ increasing</source>
         <source>Width</source>
         <translation>水路幅</translation>
     </message>
+    <message>
+        <source>Cut. Vertices and channel are not on the clipboard; Undo brings them back.</source>
+        <translation>切り取りました。頂点と河道はクリップボードに入りません。「元に戻す」で戻せます。</translation>
+    </message>
 </context>
 <context>
     <name>NetworkTexts</name>
