@@ -5,8 +5,8 @@
 #include "files/temporary_file.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/message_box.h"
-#include "ks/fc/syntax_error.h"
 #include "ks/fc/shown_text.h"
+#include "ks/fc/syntax_error.h"
 #include "ks/fc/system_reason.h"
 
 #include <QDir>
@@ -289,7 +289,8 @@ CString CKsDocumentFile::NotesOn(const CString& path, const WriteReport& report)
         notes << tr("A save of %1 was cut off. What another program may have written to it just before is kept in %2.")
                      .arg(NameOf(path), NameOf(QString::fromStdString(left)));
     for (const std::string& whole : report.unfinished)
-        notes << tr("A save of %1 was cut off while the file was written over: it may be half old and half new. The whole "
+        notes << tr("A save of %1 was cut off while the file was written over: it may be half old and half new. The "
+                    "whole "
                     "new content is in %2.")
                      .arg(NameOf(path), NameOf(QString::fromStdString(whole)));
     if (report.lost.Any())
