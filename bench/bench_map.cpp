@@ -1,10 +1,9 @@
 // Redrawing the map of 500 branches with 10,000 locations, at 1600 x 1000: after a pan within one frame of 60 Hz; and
 // for comparison after a zoom, which computes and paints everything anew.
-#include "bench/report.h"
+#include "bench/frames.h"
 #include "editors/network/network_map.h"
 
 #include <QApplication>
-#include <QImage>
 #include <QPainter>
 #include <cmath>
 #include <numbers>
@@ -12,7 +11,7 @@
 
 namespace {
 
-constexpr int Branches = 500, Vertices = 120, Locations = 10'000, Rounds = 60;
+constexpr int Branches = 500, Vertices = 120, Locations = 10'000;
 constexpr double Frame = 1000.0 / 60; // milliseconds
 
 /// Rivers that wind across a square of 100 km, each about 12 km long.
@@ -48,22 +47,6 @@ std::vector<CMapLocation> MakeLocations(const CNetwork& network)
     return locations;
 }
 
-/// The median time of painting the window after a move.
-double Measure(CNetworkMap& map, const std::function<void(int)>& move)
-{
-    QImage image(map.size(), QImage::Format_ARGB32_Premultiplied);
-    std::vector<double> times;
-    for (int i = -5; i < Rounds; ++i) { // the first five warm up
-        const double time = Milliseconds([&] {
-            move(i);
-            map.render(&image);
-        });
-        if (i >= 0)
-            times.push_back(time);
-    }
-    return Median(times);
-}
-
 } // namespace
 
 int main(int argc, char** argv)
@@ -86,10 +69,10 @@ int main(int argc, char** argv)
         const auto name = [zoom](const char* what) {
             return std::string(what) + (zoom == 1 ? ", all in sight" : ", zoomed in");
         };
-        const double drag = Measure(map, [&](int i) { map.Pan(QPoint(i % 2 ? 9 : -9, 4 - i % 3 * 4)); });
-        const double key = Measure(map, [&](int i) { map.Pan(QPoint(i % 2 ? 60 : -60, 0)); });
-        const double page = Measure(map, [&](int i) { map.Pan(QPoint(0, i % 2 ? 400 : -400)); });
-        const double anew = Measure(map, [&](int i) { map.Zoom(i % 2 ? 1.01 : 1 / 1.01); });
+        const double drag = MeasureFrames(map, [&](int i) { map.Pan(QPoint(i % 2 ? 9 : -9, 4 - i % 3 * 4)); });
+        const double key = MeasureFrames(map, [&](int i) { map.Pan(QPoint(i % 2 ? 60 : -60, 0)); });
+        const double page = MeasureFrames(map, [&](int i) { map.Pan(QPoint(0, i % 2 ? 400 : -400)); });
+        const double anew = MeasureFrames(map, [&](int i) { map.Zoom(i % 2 ? 1.01 : 1 / 1.01); });
         fast = Report(name("Map: redraw after a drag / frame").c_str(), drag, Frame, 1) && fast;
         fast = Report(name("Map: redraw after an arrow key / frame").c_str(), key, Frame, 1) && fast;
         std::printf("%-58s %9.3f ms\n", name("Map: redraw after Page Down, 400 rows").c_str(), page);

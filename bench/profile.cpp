@@ -1,9 +1,8 @@
 // Moving along a long profile of 1,000,000 points, at 1600 x 1000: a pan and a zoom within one frame of 60 Hz.
-#include "bench/report.h"
+#include "bench/frames.h"
 #include "plot/plot_library.h"
 
 #include <QApplication>
-#include <QImage>
 #include <QWidget>
 #include <cmath>
 #include <random>
@@ -11,7 +10,6 @@
 namespace {
 
 constexpr std::size_t Points = 1'000'000;
-constexpr int Rounds = 60;
 constexpr double Frame = 1000.0 / 60; // milliseconds
 
 /// A million points in two curves of levels, as many in a track of discharges, and the ground.
@@ -35,21 +33,6 @@ PlotContent MakeContent()
     content.tracks.push_back(
         {QStringLiteral("Discharge [m3/s]"), {curve(QStringLiteral("Q"), PlotInk::Other, 40, 0, 9)}, {}, 1});
     return content;
-}
-
-double Measure(IPlot& plot, const std::function<void(int)>& move)
-{
-    QImage image(plot.Widget().size(), QImage::Format_ARGB32_Premultiplied);
-    std::vector<double> times;
-    for (int i = -5; i < Rounds; ++i) { // the first five warm up
-        const double time = Milliseconds([&] {
-            move(i);
-            plot.Widget().render(&image);
-        });
-        if (i >= 0)
-            times.push_back(time);
-    }
-    return Median(times);
 }
 
 } // namespace
@@ -79,10 +62,10 @@ int main(int argc, char** argv)
         const auto name = [part](const char* what) {
             return std::string("Profile: ") + what + ", " + std::to_string(int(part * Points)) + " points in sight";
         };
-        const double pan =
-            Measure(*plot, [&](int i) { plot->SetRange(from + i * width / 500, from + width + i * width / 500); });
-        const double zoom =
-            Measure(*plot, [&](int i) { plot->SetRange(from + i * width / 900, from + width - i * width / 900); });
+        const double pan = MeasureFrames(
+            plot->Widget(), [&](int i) { plot->SetRange(from + i * width / 500, from + width + i * width / 500); });
+        const double zoom = MeasureFrames(
+            plot->Widget(), [&](int i) { plot->SetRange(from + i * width / 900, from + width - i * width / 900); });
         fast = Report(name("pan / frame").c_str(), pan, Frame, 1) && fast;
         fast = Report(name("zoom / frame").c_str(), zoom, Frame, 1) && fast;
     }
