@@ -59,6 +59,14 @@ protected:
     }
     ~RecoveryTest() override { frame.reset(); }
 
+    /// A file in the place of the folder: as long as it stands there nothing can be kept.
+    static std::unique_ptr<QFile> Obstacle()
+    {
+        QDir().mkpath(QFileInfo(Folder()).path());
+        auto file = std::make_unique<QFile>(Folder());
+        EXPECT_TRUE(file->open(QIODevice::WriteOnly));
+        return file;
+    }
     void Restart()
     {
         frame.reset();
@@ -532,9 +540,7 @@ TEST_F(ShellTest, ADocumentOfAnEditorWithoutRecoveryIsLeftAlone)
 TEST_F(RecoveryTest, WhatCannotBeKeptIsToldUntilItCanBe)
 {
     CKsDoc* document = Open(Write("a.HDKV", HDText));
-    QDir().mkpath(QFileInfo(Folder()).path());
-    QFile obstacle(Folder());
-    ASSERT_TRUE(obstacle.open(QIODevice::WriteOnly)); // no folder
+    const auto obstacle = Obstacle();
     const auto* notice = frame->findChild<QLabel*>("recoveryLabel");
     EXPECT_FALSE(notice->isVisible());
     Change(document, "1.5", "2.5");
@@ -544,7 +550,7 @@ TEST_F(RecoveryTest, WhatCannotBeKeptIsToldUntilItCanBe)
     EXPECT_TRUE(notice->toolTip().contains("The changes to a.HDKV cannot be kept")) << notice->toolTip().toStdString();
     EXPECT_TRUE(notice->toolTip().contains("a part of the path is no folder"));
     EXPECT_EQ(notice->accessibleDescription(), notice->toolTip());
-    obstacle.remove();
+    obstacle->remove();
     EXPECT_TRUE(IsKept(document));
     EXPECT_TRUE(QTest::qWaitFor([&] { return !notice->isVisible(); }));
     // Somebody clears the folder meanwhile: it is made again, and is still this session's.
@@ -558,9 +564,7 @@ TEST_F(RecoveryTest, WhatCannotBeKeptIsToldUntilItCanBe)
 TEST_F(RecoveryTest, WhatWasTakenBackWhileNothingCouldBeKeptIsForgotten)
 {
     CKsDoc* document = Open(Write("a.HDKV", HDText));
-    QDir().mkpath(QFileInfo(Folder()).path());
-    QFile obstacle(Folder());
-    ASSERT_TRUE(obstacle.open(QIODevice::WriteOnly)); // no folder
+    const auto obstacle = Obstacle();
     const auto* notice = frame->findChild<QLabel*>("recoveryLabel");
     QTest::qWait(50);
     QLineEdit* field = nullptr;
@@ -574,7 +578,7 @@ TEST_F(RecoveryTest, WhatWasTakenBackWhileNothingCouldBeKeptIsForgotten)
     QTest::keyClick(field, Qt::Key_Escape);
     EXPECT_FALSE(document->IsModified());
     EXPECT_TRUE(QTest::qWaitFor([&] { return !notice->isVisible(); })) << "there is nothing to keep any more";
-    obstacle.remove();
+    obstacle->remove();
     QTest::qWait(200);
     EXPECT_TRUE(Kept().isEmpty());
 }
