@@ -43,7 +43,14 @@ inline constexpr const char* HardLinks = "--hard-links";
 inline constexpr const char* LoseMetadata = "--lose-metadata";
 } // namespace Option
 
-int Check(const std::vector<std::string>& files);
+enum class FindingsFormat
+{
+    Text,
+    Json,
+    Sarif
+};
+/// `network`: the file of the river network that the files have to fit; empty for none.
+int Check(const std::vector<std::string>& files, const std::string& network, FindingsFormat format);
 /// An overview of the file, or the records of one list.
 int Show(const std::string& file, const std::string& list, Format format);
 int Get(const std::string& file, const std::string& keyword);

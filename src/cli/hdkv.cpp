@@ -77,6 +77,8 @@ struct Arguments
     Output output;
     Format format = Format::Table;
     bool checkOnly = false;
+    std::string network;
+    FindingsFormat findings = FindingsFormat::Text;
 };
 
 /// What the commands have in common that write over files.
@@ -128,6 +130,11 @@ int Run(int argc, char** argv)
 
     CLI::App* const check = app.add_subcommand("check", "Report what is not in order in files, with line and column");
     check->add_option("FILE", a.files, "HD parameter files")->required();
+    check->add_option("--network", a.network, "River network (.kvnw) that branches and chainages have to fit");
+    const std::map<std::string, FindingsFormat> reports{
+        {"text", FindingsFormat::Text}, {"json", FindingsFormat::Json}, {"sarif", FindingsFormat::Sarif}};
+    check->add_option("--format", a.findings, "text, json or sarif")->transform(CLI::CheckedTransformer(reports));
+    check->footer("docs/findings.md explains the codes.");
 
     CLI::App* const show = app.add_subcommand("show", "Print an overview of a file, or the records of one list");
     show->add_option("FILE", a.file, "HD parameter file")->required();
@@ -170,7 +177,7 @@ int Run(int argc, char** argv)
     std::vector<std::string> values;
     int code = Exit::Usage;
     if (check->parsed())
-        code = Check(a.files);
+        code = Check(a.files, a.network, a.findings);
     else if (show->parsed())
         code = Show(a.file, a.list, a.format);
     else if (get->parsed())

@@ -1,10 +1,10 @@
 #include "cli/open_file.h"
 
+#include "cli/findings_text.h"
 #include "cli/terminal.h"
 
 #include <algorithm>
 #include <iostream>
-#include <map>
 
 int Complain(std::string_view message, int code)
 {
@@ -21,30 +21,6 @@ int ComplainNoMemory()
 int ComplainUnread(const Error& error)
 {
     return Complain(error.message, error.code == std::errc::not_enough_memory ? Exit::NoMemory : Exit::Unreadable);
-}
-
-void PrintFindings(std::ostream& stream, const std::string& path, const std::vector<Finding>& findings)
-{
-    constexpr std::size_t Most = 1000; // of a kind: a file may have a finding in every line
-    struct Listed
-    {
-        std::size_t count = 0;
-        const Finding* last = nullptr; // that was printed
-    };
-    const std::string file = Printable(path);
-    std::map<Finding::Kind, Listed> kinds;
-    for (const Finding& finding : findings) {
-        Listed& kind = kinds[finding.kind];
-        if (++kind.count > Most)
-            continue;
-        stream << file << ':' << finding.line << ':' << finding.column << ": " << Printable(FindingText(finding))
-               << '\n';
-        kind.last = &finding;
-    }
-    for (const auto& [kind, listed] : kinds)
-        if (listed.count > Most)
-            stream << file << ": " << listed.count - Most << " more like the one in line " << listed.last->line
-                   << ", column " << listed.last->column << '\n';
 }
 
 void TellUnfinished(const std::string& path)
@@ -72,7 +48,7 @@ int OpenFile(const std::string& path, Purpose purpose, HD_Parameters& parameters
     if (purpose == Purpose::Read)
         return Exit::Fine;
     const auto findings = report.Take();
-    PrintFindings(std::cerr, path, findings);
+    PrintFindings(std::cerr, path, MakeFileCheck(findings));
     if (std::ranges::any_of(findings, &Finding::LosesContent))
         return Complain("Nothing was written, because something of what is listed above would be lost.",
                         Exit::Findings);

@@ -40,6 +40,3 @@ std::optional<FileVersion> VersionThere(const std::string& path);
 /// What `allowed` does not allow is refused with the option that would.
 int Rewrite(const HD_Parameters& parameters, const std::string& path, const FileLock& lock, const Output& allowed,
             const std::optional<FileVersion>& expected);
-
-/// Prints "file:line:column: text" of each; of a kind the first thousand, and how many more there are.
-void PrintFindings(std::ostream& stream, const std::string& path, const std::vector<Finding>& findings);

@@ -81,22 +81,6 @@ void CGenParamListBase::Save(tqlHandle structure, bool) const
     tqlEndSection(structure);
 }
 
-namespace {
-
-void ReportIncomplete(LoadReport& report, tqlHandle keyword)
-{
-    // A name or chainage that is missing or no name or number has been reported as such.
-    std::string name;
-    double chainage = 0;
-    const tqlHandle first = tqlParamByNum(keyword, 1), second = tqlParamByNum(keyword, 2);
-    if (tqlGetString(first, &name) && name.empty())
-        report.Add(keyword, keyword, {.kind = Finding::IncompleteLine, .parameter = 1});
-    else if (tqlGetDouble(second, &chainage) && chainage == NotGiven)
-        report.Add(keyword, keyword, {.kind = Finding::IncompleteLine, .parameter = 2});
-}
-
-} // namespace
-
 void CGenParamListBase::Load(tqlHandle parent, int number, LoadReport* report)
 {
     const tqlHandle section = tqlSectionByNameNum(parent, m_sectionName, number);
@@ -104,21 +88,19 @@ void CGenParamListBase::Load(tqlHandle parent, int number, LoadReport* report)
         return;
     if (report)
         report->InSection(m_sectionName);
-    const int records = tqlGetNoKeywords(section, "DATA");
+    const int records = tqlGetNoKeywords(section, RecordKeyword);
     Reserve(GetCount() + std::size_t(records));
     for (int occurrence = 1; occurrence <= records; ++occurrence) {
         auto record = NewRecord();
-        const tqlHandle keyword = tqlKeywordByNameNum(section, "DATA", occurrence);
+        const tqlHandle keyword = tqlKeywordByNameNum(section, RecordKeyword, occurrence);
         record->Load(keyword, report);
-        if (report && record->IsBlank() && (occurrence > 1 || !report->firstLineMayBeBlank))
-            ReportIncomplete(*report, keyword);
         AddTail(std::move(record));
     }
     if (tqlGetNoKeywords(section) != records || tqlGetNoSections(section) != 0)
         CollectUnknown(
             section,
             [](std::string_view name, bool isSection) {
-                return !isSection && name == "DATA" ? Known::Every : Known::No;
+                return !isSection && name == RecordKeyword ? Known::Every : Known::No;
             },
             m_unknown, report);
 }

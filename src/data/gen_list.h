@@ -207,13 +207,8 @@ public:
         const tqlHandle outer = tqlSectionByNameNum(parent, m_outerSection, number);
         if (!outer)
             return;
-        // The first line of a set does not count as a location: a set with that one only is not kept.
-        if (report)
-            report->firstLineMayBeBlank = true;
         for (int inner = 1; tqlSectionByNameNum(outer, m_innerSection, inner); ++inner)
             Add().Load(outer, inner, report);
-        if (report)
-            report->firstLineMayBeBlank = false;
         const auto known = [this](std::string_view name, bool isSection) {
             return isSection && name == m_innerSection ? Known::Every : Known::No;
         };

@@ -10,15 +10,6 @@ Result<HD_Parameters> LoadHDFile(const std::string& path)
     return parameters;
 }
 
-std::vector<Finding> CheckHDStructure(tqlHandle structure)
-{
-    LoadReport report(structure, LoadReport::Wanted::Everything);
-    // No temporary with braces: should memory end there, the compiler destroys parts of it twice.
-    HD_Parameters parameters;
-    parameters.Load(structure, &report);
-    return report.Take();
-}
-
 namespace {
 
 /// `length`: about how long the text will be.

@@ -7,9 +7,6 @@
 /// Reads a file into fresh parameters. A file without the target "KAVO0_HD" gives the defaults.
 Result<HD_Parameters> LoadHDFile(const std::string& path);
 
-/// All that is not in order in a loaded file.
-std::vector<Finding> CheckHDStructure(tqlHandle structure);
-
 /// The file's text.
 std::string HDFileText(const HD_Parameters& parameters, bool everySet = false);
 

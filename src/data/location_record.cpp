@@ -4,7 +4,7 @@
 
 void WriteRecord(tqlHandle structure, const HD_RiverPos& record, FieldList fields)
 {
-    tqlAddKeyword(structure, "DATA");
+    tqlAddKeyword(structure, RecordKeyword);
     tqlAddString(structure, record.RiverName);
     tqlAddDouble(structure, record.Chainage);
     WriteFields(structure, fields, &record);

@@ -11,6 +11,9 @@
 
 class LoadReport;
 
+/// The keyword of a record in its list's section.
+inline constexpr const char* RecordKeyword = "DATA";
+
 class HD_RiverPos
 {
 public:

@@ -66,9 +66,6 @@ std::string OwnText(const Finding& finding)
     case Finding::SurplusParams:
     case Finding::UnknownParams:
         return "unknown parameters from number " + std::to_string(finding.parameter) + " on";
-    case Finding::IncompleteLine:
-        return finding.parameter == 1 ? "incomplete line, the branch name is empty"
-                                      : "incomplete line, the chainage is not given";
     case Finding::Rule:
         return finding.rule();
     default:

@@ -36,8 +36,7 @@ struct Finding
         NoDate,
         NotRead, // because another keyword is missing
         Unknown,
-        UnknownParams,
-        IncompleteLine
+        UnknownParams
     };
 
     Kind kind = WrongType;
@@ -84,9 +83,6 @@ public:
     bool WantsEverything() const { return m_wanted == Wanted::Everything; }
     /// Where the keywords that are read from now on stand.
     void InSection(std::string_view section) { m_section = section; }
-    /// Whether the first line of a list need not be complete.
-    bool firstLineMayBeBlank = false;
-
     /// Completes the place, which is that of a section, keyword or parameter, unless nobody wants the finding.
     void Add(tqlHandle place, tqlHandle keyword, Finding finding);
     /// How many values were not taken for which nothing sensible stands in: it is no value that may be unknown.

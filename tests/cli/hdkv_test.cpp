@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <rapidjson/document.h>
 #include <sstream>
 
 #ifndef _WIN32
@@ -41,6 +42,7 @@ protected:
         Write("huge.hdkv", "");
         std::filesystem::resize_file(m_folder / "huge.hdkv", std::uintmax_t{2} << 30); // takes no room on the disk
         Write("other.hdkv", "[KVR_PROJECT]\n[/KVR_PROJECT]\n");
+        Write("n.kvnw", "[KVR_NETWORK]\n[Branch]\nName = \"E\"\nChainage = 0, 9\n[/Branch]\n[/KVR_NETWORK]\n");
         HD_Parameters parameters;
         HD_Initial record;
         record.RiverName = "A\xC3\x9F, \"x\"";
@@ -104,9 +106,13 @@ TEST_F(Hdkv, ExitCodesAndMessages)
         const char* out; // what the outputs contain
         const char* err;
     } cases[] = {
-        {"check found.hdkv", 1, "found.hdkv:3:1: InitList: incomplete line, the branch name is empty\n", ""},
+        {"check found.hdkv", 1, "found.hdkv:3:8: warning HD101: InitList: RiverName: the branch name is empty\n", ""},
         {"check found.hdkv", 1, "found.hdkv: 1 finding\n", ""},
-        {"check other.hdkv", 1, "other.hdkv:1:1: there is no target [KAVO0_HD]", ""},
+        {"check other.hdkv", 1, "other.hdkv:1:1: error HD001: there is no target [KAVO0_HD]", ""},
+        {"check --network n.kvnw a.hdkv", 1, ": error HD105: InitList: RiverName: the network has no branch A", ""},
+        {"check --network other.hdkv a.hdkv", 3, "", "other.hdkv is no river network: it has no target [KVR_NETWORK]"},
+        {"check --network missing.kvnw a.hdkv", 3, "", "missing.kvnw"},
+        {"check --format csv a.hdkv", 2, "", "csv"},
         {"check bad.hdkv", 3, "", "bad.hdkv, line 2, column 13: expected [/InitList]"},
         {"check missing.hdkv", 3, "", "missing.hdkv"},
         {"show cut.hdkv", 3, "",
@@ -137,7 +143,7 @@ TEST_F(Hdkv, ExitCodesAndMessages)
         {"set a.hdkv MarkTitles 2 A", 2, "", "does not fit the 1 values behind it"},
         {"set a.hdkv LimitedPeriodStart 2024 2 30 0 0 0", 2, "", "found 2024-02-30 00:00:00"},
         {"set a.hdkv G_f --loud", 2, "", "no option --loud"},
-        {"set loses.hdkv G_f 1", 1, "", "loses.hdkv:3:19: InitList: parameter 4 (InitialQ)"},
+        {"set loses.hdkv G_f 1", 1, "", "loses.hdkv:3:19: error HD005: InitList: parameter 4 (InitialQ)"},
         {"fmt loses.hdkv", 1, "", "Nothing was written"},
         {"fmt found.hdkv --check", 1, "", "not in canonical form"},
         {"fmt a.hdkv --check", 0, "", ""},
@@ -162,8 +168,10 @@ TEST_F(Hdkv, ValuesOfAnotherTypeAreTakenWhenTheirMeaningIsBeyondDoubt)
 {
     Write("taken.hdkv", "[KAVO0_HD]\n[WaveList]\nDATA = \"R\", 1, 2, 2.0\n[/WaveList]\n[/KAVO0_HD]\n");
     EXPECT_EQ(Run("set taken.hdkv G_f 1"), 0) << err;
-    EXPECT_EQ(err, "taken.hdkv:3:19: WaveList: parameter 4 (WaveApproximation) should be an integer, found a number; "
-                   "taken as 2\n");
+    EXPECT_EQ(
+        err,
+        "taken.hdkv:3:19: note HD006: WaveList: parameter 4 (WaveApproximation) should be an integer, found a number; "
+        "taken as 2\n");
     EXPECT_NE(Text("taken.hdkv").find("DATA = \"R\", 1, 2, 2"), std::string::npos);
     EXPECT_EQ(Text("taken.hdkv").find("2.0"), std::string::npos);
     EXPECT_EQ(Run("check taken.hdkv"), 0) << out;
@@ -183,13 +191,62 @@ TEST_F(Hdkv, NamesAreShownSoThatTheyDoNothing)
     }
     Write(name.c_str(), Text("found.hdkv"));
     EXPECT_EQ(Run("check '" + name + '\''), 1);
-    EXPECT_EQ(out, shown + ":3:1: InitList: incomplete line, the branch name is empty\n" + shown + ": 1 finding\n");
+    EXPECT_EQ(out,
+              shown + ":3:8: warning HD101: InitList: RiverName: the branch name is empty\n" + shown + ": 1 finding\n");
     EXPECT_EQ(Run("fmt --check '" + name + '\''), 1);
     EXPECT_EQ(err, "hdkv: " + shown + " is not in canonical form.\n");
 
     Write("names.hdkv", "[KAVO0_HD]\n[WindList]\nDATA = \"a\\u{1B}c\\n\", 1, 2\n[/WindList]\n[/KAVO0_HD]\n");
     EXPECT_EQ(Run("show names.hdkv WindList"), 0);
     ExpectLines("RiverName   Chainage  WindFactor\na\\x1Bc\\x0A         1           2\n");
+}
+
+// For scripts: the keys stay.
+TEST_F(Hdkv, FindingsAreWrittenForPrograms)
+{
+    Write("sp\xC3\xA4t %1.hdkv",
+          "[KAVO0_HD]\n[WindList]\nDATA = \"R\", 1, 2\nDATA = \"r\", 1, 2\n[/WindList]\n[/KAVO0_HD]\n");
+    const std::string files = "'sp\xC3\xA4t %1.hdkv' bad.hdkv";
+    EXPECT_EQ(Run("check --format json " + files), 3);
+    rapidjson::Document json;
+    ASSERT_FALSE(json.Parse(out.c_str()).HasParseError()) << out;
+    EXPECT_EQ(json["version"].GetInt(), 1);
+    const auto& file = json["files"][0];
+    EXPECT_STREQ(file["file"].GetString(), "sp\xC3\xA4t %1.hdkv");
+    EXPECT_FALSE(file.HasMember("error"));
+    ASSERT_EQ(file["findings"].Size(), 1u);
+    const auto& finding = file["findings"][0];
+    EXPECT_STREQ(finding["code"].GetString(), "HD104");
+    EXPECT_STREQ(finding["severity"].GetString(), "note");
+    EXPECT_EQ(finding["line"].GetInt(), 4);
+    EXPECT_EQ(finding["column"].GetInt(), 13);
+    EXPECT_STREQ(finding["section"].GetString(), "WindList");
+    EXPECT_STREQ(finding["field"].GetString(), "Chainage");
+    EXPECT_EQ(finding["record"].GetInt(), 2);
+    EXPECT_STREQ(finding["branch"].GetString(), "r");
+    EXPECT_EQ(finding["chainage"].GetDouble(), 1);
+    EXPECT_STREQ(finding["fix"].GetString(), "remove the line");
+    EXPECT_STREQ(finding["message"].GetString(), "WindList: Chainage: line 1 is the same");
+    EXPECT_TRUE(std::string(json["files"][1]["error"].GetString()).find("expected [/InitList]") != std::string::npos);
+
+    EXPECT_EQ(Run("check --format sarif " + files), 3);
+    ASSERT_FALSE(json.Parse(out.c_str()).HasParseError()) << out;
+    EXPECT_STREQ(json["version"].GetString(), "2.1.0");
+    const auto& run = json["runs"][0];
+    EXPECT_FALSE(run["invocations"][0]["executionSuccessful"].GetBool());
+    EXPECT_EQ(run["invocations"][0]["toolExecutionNotifications"].Size(), 1u);
+    ASSERT_EQ(run["results"].Size(), 1u);
+    const auto& result = run["results"][0];
+    const auto& rule = run["tool"]["driver"]["rules"][result["ruleIndex"].GetUint()];
+    EXPECT_STREQ(rule["id"].GetString(), result["ruleId"].GetString());
+    EXPECT_STREQ(rule["id"].GetString(), "HD104");
+    EXPECT_STREQ(rule["defaultConfiguration"]["level"].GetString(), "note");
+    const auto& place = result["locations"][0]["physicalLocation"];
+    EXPECT_STREQ(place["artifactLocation"]["uri"].GetString(), "sp%C3%A4t%20%251.hdkv");
+    EXPECT_EQ(place["region"]["startLine"].GetInt(), 4);
+
+    EXPECT_EQ(Run("check --format json n\xFF.hdkv"), 3);
+    EXPECT_FALSE(json.Parse<rapidjson::kParseValidateEncodingFlag>(out.c_str()).HasParseError()) << out;
 }
 
 TEST_F(Hdkv, FindingsWithoutEndAreCounted)
@@ -200,9 +257,9 @@ TEST_F(Hdkv, FindingsWithoutEndAreCounted)
     Write("many.hdkv", text + "MINE = 1\n[/InitList]\n[/KAVO0_HD]\n");
     EXPECT_EQ(Run("check many.hdkv"), 1);
     EXPECT_EQ(std::ranges::count(out, '\n'), 1000 + 1 + 1 + 1);
-    EXPECT_NE(out.find("\nmany.hdkv: 500 more like the one in line 1002, column 1\nmany.hdkv: 1501 findings\n"),
+    EXPECT_NE(out.find("\nmany.hdkv: 500 more like the one in line 1002, column 8 (HD101)\nmany.hdkv: 1501 findings\n"),
               std::string::npos);
-    EXPECT_NE(out.find("\nmany.hdkv:1503:1: unknown keyword"), std::string::npos) << "of another kind";
+    EXPECT_NE(out.find("\nmany.hdkv:1503:1: note HD012: unknown keyword"), std::string::npos) << "of another kind";
 }
 
 TEST_F(Hdkv, SetThenGet)

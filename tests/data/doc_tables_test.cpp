@@ -151,18 +151,6 @@ std::string MeaningTable()
     return table;
 }
 
-/// The document with the text between two of its marks replaced.
-std::string WithTable(std::string document, const std::string& name, const std::string& table)
-{
-    const std::string begin = "<!-- generated: " + name + " -->\n", end = "<!-- end of " + name + " -->\n";
-    const std::size_t from = document.find(begin), to = document.find(end);
-    if (from == std::string::npos || to == std::string::npos) {
-        ADD_FAILURE() << "no marks of " << name;
-        return document;
-    }
-    return document.replace(from + begin.size(), to - from - begin.size(), table);
-}
-
 } // namespace
 
 TEST(DocumentTables, AreWhatTheDeclarationsSay)

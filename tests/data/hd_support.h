@@ -3,6 +3,7 @@
 
 #include "data/hd_file.h"
 #include "files/field_io.h"
+#include "recorded_text.h"
 #include "test_folder.h"
 
 #include <filesystem>
@@ -31,21 +32,6 @@ inline HD_Parameters FromTarget(const std::string& content)
 inline HD_Parameters FromSection(const std::string& name, const std::string& lines)
 {
     return FromTarget("[Global_Variables]\n[" + name + "]\n" + lines + "\n[/" + name + "]\n[/Global_Variables]");
-}
-
-inline std::string ReadText(const std::filesystem::path& path)
-{
-    std::ifstream stream(path, std::ios::binary);
-    return {std::istreambuf_iterator<char>(stream), {}};
-}
-
-/// Whether a text is the one that a file of the sources records.
-inline void ExpectRecorded(const std::string& text, const std::filesystem::path& record)
-{
-    if (std::getenv("KVR_UPDATE_RECORDS"))
-        std::ofstream(record, std::ios::binary) << text;
-    else
-        EXPECT_EQ(ReadText(record), text) << "if it is meant: ninja update_records, and look at what has changed";
 }
 
 /// Gives every field, and in groups every element, another value. `seed` makes results differ.

@@ -176,10 +176,8 @@ class RandomSession:
             time.sleep(0.1)
         if difference:
             raise Fault(difference)
-        found = subprocess.run([os.path.join(os.environ['KVR_BIN'], 'hdkv'), 'check', self.path], capture_output=True,
-                               text=True)
-        if found.returncode:
-            raise Fault('the checker finds: ' + found.stdout)
+        if found := self.samples.misread(self.path):
+            raise Fault(f'the checker finds: {found}')
 
     def difference(self):
         """The first value that the file has otherwise than the model."""

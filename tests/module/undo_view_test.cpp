@@ -4,6 +4,7 @@
 
 #include "data/hd_file.h"
 #include "grid/cell_commands.h"
+#include "rules/file_check.h"
 
 #include <QClipboard>
 #include <QDialog>
@@ -170,7 +171,7 @@ TEST_F(UndoViewTest, AFileWhosePagesWereAllSeenHoldsNothingThatNobodyTyped)
     EXPECT_EQ(view->GetDocument()->UndoStack().count(), 0);
     auto parsed = ParseFile(Path("new.HDKV").toStdString());
     ASSERT_TRUE(parsed);
-    EXPECT_EQ(CheckHDStructure(parsed->Get()).size(), 0U);
+    EXPECT_EQ(CheckHDFile(parsed->Get(), nullptr, {}).Count(), 0U);
     EXPECT_FALSE(Read(Path("new.HDKV")).contains("DATA"));
     // What the time series page shows of its empty tables is what a new file gets.
     auto saved = LoadHDFile(Path("new.HDKV").toStdString());

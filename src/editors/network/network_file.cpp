@@ -3,6 +3,7 @@
 #include "editors/network/network_rules.h"
 #include "files/declared_section.h"
 #include "files/field_io.h"
+#include "files/network_names.h"
 #include "ks/fc/branch_name.h"
 
 #include <QCoreApplication>
@@ -35,14 +36,11 @@ FieldList VertexFields()
     return fields;
 }
 
-// The names of the file.
-constexpr const char *BranchSection = "Branch", *NameKeyword = "Name", *ChainageKeyword = "Chainage";
-
 constexpr auto branchFields =
-    FieldsOf<N>({Text<&N::name>("Name").Title(QT_TRANSLATE_NOOP("NetworkTables", "Branch")),
+    FieldsOf<N>({Text<&N::name>(NetworkFile::Name).Title(QT_TRANSLATE_NOOP("NetworkTables", "Branch")),
                  Number<&N::start>("first vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "From")),
                  Number<&N::end>("last vertex", U::Chainage).Title(QT_TRANSLATE_NOOP("NetworkTables", "To")),
-                 Boolean<&N::downstream>("FlowsDownstream")
+                 Boolean<&N::downstream>(NetworkFile::FlowsDownstream)
                      .Title(QT_TRANSLATE_NOOP("NetworkTables", "Flow"))
                      .Choices(QT_TRANSLATE_NOOP("NetworkTables", "decreasing\nincreasing"))});
 constexpr FieldList nameField = FieldList(branchFields).subspan(0, 1),
@@ -55,20 +53,20 @@ constexpr DeclaredSection branchSections[] = {
     {.name = "Line", .kept = Keeps<&N::kept>(), .keywords = lineKeywords},
     {.name = "Channel", .kept = Keeps<&N::kept>(), .keywords = channelKeywords}};
 constexpr DeclaredKeyword branchKeywords[] = {
-    {NameKeyword, nameField, Presence::Optional}, // a rule asks for it
-    {ChainageKeyword, endFields},
-    {"FlowsDownstream", FieldList(branchFields).subspan(3), Presence::Optional}};
+    {NetworkFile::Name, nameField, Presence::Optional}, // a rule asks for it
+    {NetworkFile::Chainage, endFields},
+    {NetworkFile::FlowsDownstream, FieldList(branchFields).subspan(3), Presence::Optional}};
 
 constexpr auto coordinates = FieldsOf<W>({Text<&W::system>("CoordinateSystem")});
-constexpr Field branches = SectionGroup<&W::branches>(BranchSection);
+constexpr Field branches = SectionGroup<&W::branches>(NetworkFile::Branch);
 constexpr DeclaredKeyword networkKeywords[] = {{"CoordinateSystem", coordinates, Presence::WhenSet}};
-constexpr DeclaredSection networkSections[] = {{.name = BranchSection,
+constexpr DeclaredSection networkSections[] = {{.name = NetworkFile::Branch,
                                                 .kept = Keeps<&N::kept>(),
                                                 .keywords = branchKeywords,
                                                 .sections = branchSections,
                                                 .sectionCount = std::size(branchSections),
                                                 .each = &branches}};
-constexpr DeclaredSection file{.name = "KVR_NETWORK",
+constexpr DeclaredSection file{.name = NetworkFile::Target,
                                .kept = Keeps<&W::kept>(),
                                .keywords = networkKeywords,
                                .sections = networkSections,
@@ -95,12 +93,12 @@ void Mend(CNetworkBranch& branch, const CBranchKeys& met, CBranchNames& names, t
         const auto rule = [fault] { return fault.Text().toStdString(); };
         if (fault.rule == CBranchFault::EndsDiffer) {
             SetEndsApart(branch);
-            ReportRule(report, section, ChainageKeyword, 1, ParamsText(endFields, &branch), rule);
+            ReportRule(report, section, NetworkFile::Chainage, 1, ParamsText(endFields, &branch), rule);
             continue;
         }
         const QString wanted = fault.rule == CBranchFault::Named ? QString::fromLatin1(NoName) : fault.name;
         branch.name = names.Take(wanted, QStringLiteral("%1-%2")).toStdString();
-        ReportRule(report, section, NameKeyword, 1, ParamsText(nameField, &branch), rule);
+        ReportRule(report, section, NetworkFile::Name, 1, ParamsText(nameField, &branch), rule);
     }
 }
 
@@ -126,7 +124,7 @@ CNetwork LoadNetwork(tqlHandle structure, LoadReport& report)
     for (std::size_t i = 0; i < network.branches.size(); ++i) {
         CNetworkBranch& branch = network.branches[i];
         branch.SortChannel();
-        Mend(branch, met, names, tqlSectionByNameNum(target, BranchSection, int(i) + 1), report);
+        Mend(branch, met, names, tqlSectionByNameNum(target, NetworkFile::Branch, int(i) + 1), report);
         met.insert(KsBranchKey(branch.Name()));
     }
     return network;

@@ -1,12 +1,12 @@
 #include "ks/fc/branch_name.h"
 
-#include "ks/fc/shown_text.h"
+#include "files/branch_key.h"
 
 #include <algorithm>
 
 CString KsBranchKey(const CString& name)
 {
-    return KsWithoutUnseen(name).trimmed().toUpper();
+    return QString::fromStdString(BranchKey(name.toStdString()));
 }
 
 bool KsSameBranch(const CString& a, const CString& b)

@@ -1,5 +1,7 @@
 #include "ks/fc/shown_text.h"
 
+#include "files/branch_key.h"
+
 #include <QCoreApplication>
 #include <QEvent>
 #include <QLabel>
@@ -15,14 +17,6 @@ bool HidesSomething(QChar c, bool lines)
     const bool control = code < 0x20 || in(0x7F, 0x9F) || in(0x2028, 0x2029);
     const bool direction = in(0x202A, 0x202E) || in(0x2066, 0x2069); // single marks, which some scripts need, stay
     return control || direction;
-}
-
-/// Marks of the writing direction; soft hyphen, blank of no width, word joiner, mark of the byte order.
-bool HasNoWidth(QChar c)
-{
-    const char16_t code = c.unicode();
-    return code == 0x200E || code == 0x200F || (code >= 0x202A && code <= 0x202E) ||
-           (code >= 0x2066 && code <= 0x2069) || code == 0x00AD || code == 0x200B || code == 0x2060 || code == 0xFEFF;
 }
 
 /// Qt takes a text for rich when it looks so. Every label, and that of a tool tip is one, is told otherwise before it
@@ -61,7 +55,7 @@ CString KsVisibleText(CString text, bool lines)
 
 CString KsWithoutUnseen(CString text)
 {
-    return text.removeIf(HasNoWidth);
+    return text.removeIf([](QChar c) { return HasNoWidth(c.unicode()); });
 }
 
 CString KsWithoutMnemonics(CString text)
