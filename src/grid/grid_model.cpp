@@ -187,15 +187,42 @@ QString CGridModel::CellDetails(int row, int column) const
     return lines.join(u'\n');
 }
 
+void CGridModel::SetNotes(LineNotes notes)
+{
+    if (notes.empty() && m_notes.empty())
+        return;
+    m_notes = std::move(notes);
+    emit NotesChanged();
+}
+
+const LineNote* CGridModel::NoteOf(int row) const
+{
+    if (m_notes.empty() || row >= StoredRows())
+        return nullptr;
+    const auto note = m_notes.find(SourceRow(row));
+    return note == m_notes.end() ? nullptr : &note->second;
+}
+
+QString CGridModel::WithNote(int row, const QString& text) const
+{
+    const LineNote* const note = NoteOf(row);
+    QStringList lines = note ? note->texts : QStringList();
+    for (QString& line : lines)
+        line = AsSentence(line);
+    lines << text;
+    lines.removeAll(QString());
+    return lines.join(u'\n');
+}
+
 QVariant CGridModel::LineNumberData(int row, int role) const
 {
     switch (role) {
     case Qt::DisplayRole:
         return LineNumber(row);
     case Qt::ToolTipRole:
-        return m_saved.LineDetails(row);
+        return WithNote(row, m_saved.LineDetails(row));
     case Qt::AccessibleDescriptionRole:
-        return m_saved.LineText(row);
+        return WithNote(row, m_saved.LineText(row));
     default:
         return {};
     }

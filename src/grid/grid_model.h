@@ -3,6 +3,7 @@
 #pragma once
 
 #include "grid/cell_changes.h"
+#include "grid/line_notes.h"
 #include "grid/saved_lines.h"
 #include "grid/table_rows.h"
 
@@ -25,6 +26,11 @@ public:
     CKsDoc* Document() const { return m_document; }
     /// What differs from the last save.
     const CSavedLines& Saved() const { return m_saved; }
+
+    /// What others say about lines, until they say something else.
+    void SetNotes(LineNotes notes);
+    /// Null for a line of which nothing is said.
+    const LineNote* NoteOf(int row) const;
 
     /// Shows the source as it is now. Costs the same for any number of rows, unless they are sorted or filtered.
     void Sync();
@@ -86,10 +92,12 @@ signals:
     void CellModified(const QModelIndex& cell);
     /// Sorted or filtered by something else, or by nothing.
     void ViewChanged();
+    void NotesChanged();
 
 private:
     QString HeaderToolTip(int column) const;
     QString CellDetails(int row, int column) const;
+    QString WithNote(int row, const QString& text) const;
     QVariant LineNumberData(int row, int role) const;
     std::size_t Change(const QString& step, std::size_t row, const std::function<void()>& make);
     std::size_t Arrange(std::size_t row);
@@ -100,6 +108,7 @@ private:
 
     CKsDoc* m_document = nullptr;
     CSavedLines m_saved{*this};
+    LineNotes m_notes;
     int m_rowCount = 0; // as the views know it
     bool m_syncing = false;
     QStringList m_headers; // as the views know them

@@ -10,6 +10,7 @@ CLineHeader::CLineHeader(const CGridModel& model, QWidget* grid) : QHeaderView(Q
 {
     setSectionsClickable(true);
     connect(&model, &QAbstractItemModel::dataChanged, this, &CLineHeader::ShowMarks);
+    connect(&model, &CGridModel::NotesChanged, viewport(), qOverload<>(&QWidget::update));
 }
 
 /// A click close to the border of a line is one on the line, which the base would take for the wish to make it higher.
@@ -34,6 +35,9 @@ void CLineHeader::paintSection(QPainter* painter, const QRect& rect, int row) co
     QHeaderView::paintSection(painter, rect, row);
     painter->restore();
     PaintLineMark(*painter, rect, palette(), m_model.Saved().MarkOf(row));
+    constexpr int left = 10; // beside the mark
+    if (const LineNote* note = m_model.NoteOf(row))
+        note->icon.paint(painter, QRect(rect.left() + left, rect.top(), rect.height() / 2, rect.height()));
 }
 
 /// Where no step was made the numbers stay as they are painted.

@@ -1,5 +1,5 @@
-// Finding a page, a field or a column by whatever somebody calls it: by the words of any of the program's languages, and
-// by the keyword that it has in the file.
+// Finding a page, a field or a column by whatever somebody calls it: by the words of any of the program's languages,
+// and by the keyword that it has in the file.
 #pragma once
 
 #include "ks/fc/change_place.h"
@@ -15,7 +15,7 @@ class CKavo0_hdDoc;
 
 struct FoundField
 {
-    int tab; // of the page
+    int tab;                // of the page
     ChangePlace place = {}; // nothing for the page itself
     QString title = {}, page = {}, keyword = {};
     QPointer<QWidget> control = {}; // of a group of fields the first one

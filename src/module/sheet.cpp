@@ -88,6 +88,10 @@ protected:
             const auto role = option.state & QStyle::State_Enabled ? QPalette::Normal : QPalette::Disabled;
             style()->drawItemText(&painter, text, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextShowMnemonic, palette(),
                                   role == QPalette::Normal, tabText(i), QPalette::WindowText);
+            const int size = fontMetrics().height() * 3 / 4;
+            if (const QIcon note = tabIcon(i); !note.isNull())
+                note.paint(&painter,
+                           QRect(option.rect.right() - size - 4, option.rect.top(), size, option.rect.height()));
             if (hasFocus() && i == currentIndex()) {
                 QStyleOptionFocusRect focus;
                 focus.initFrom(this);
@@ -164,6 +168,14 @@ void CDlgPropertySheet::AddPage(Str caption, MakePage make)
     addTab(new QWidget, LoadString(caption));
     if (m_active < 0)
         m_active = 0;
+}
+
+void CDlgPropertySheet::SetNote(int tab, const QIcon& icon, const QString& text)
+{
+    if (icon.isNull() && tabIcon(tab).isNull())
+        return;
+    setTabIcon(tab, icon);
+    setTabToolTip(tab, text);
 }
 
 CGenPropertyPage* CDlgPropertySheet::PageAt(int tab)

@@ -25,6 +25,8 @@ public:
     /// Makes the next page that has not been made; false when all have.
     bool MakeNextPage();
     int PageCount() const { return count(); }
+    /// What is to be known about a page beforehand: an icon on its tab, and a text. Neither when there is nothing.
+    void SetNote(int tab, const QIcon& icon, const QString& text);
     Str CaptionOf(int tab) const { return m_tabs[std::size_t(tab)].caption; }
     /// Switches to a tab: the active page is asked, and only then anything changes. False when it refuses to be left.
     bool SetActivePage(int tab);

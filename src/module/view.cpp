@@ -6,11 +6,12 @@
 #include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
-#include "profile/profile_dock.h"
 #include "module/sheet.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page.h"
 #include "pages/page_table.h"
+#include "problems/problem_check.h"
+#include "profile/profile_dock.h"
 #include "profile/profile_panel.h"
 #include "res/strings.h"
 
@@ -42,6 +43,7 @@ CKavo0_hdView::~CKavo0_hdView()
 {
     KeepArrangement();
     delete m_profile; // which asks this
+    m_problems.reset();
     disconnect(qApp, nullptr, this, nullptr); // the focus leaves the pages as they go
     delete m_sheet;                           // while this is still a host
 }
@@ -81,8 +83,10 @@ void CKavo0_hdView::OnInitialUpdate()
     m_sheet->SetActivePage(m_arranged[FrontState].toInt());
     KsAfterPaint(this, this, [this] {
         MakeOtherPages();
-        if (IsActive())
+        if (IsActive()) {
             ShowProfile();
+            ShowProblems();
+        }
     });
 }
 
@@ -145,6 +149,7 @@ void CKavo0_hdView::MakeOtherPages()
     for (const PageEntry& entry : PageTable())
         if (entry.tab == NotOnSheet)
             m_offSheet.push_back(MakePage(entry));
+    WatchProblems();
 }
 
 void CKavo0_hdView::OnUpdate(CView* sender, int hint, CHint* object)
@@ -159,6 +164,8 @@ void CKavo0_hdView::OnUpdate(CView* sender, int hint, CHint* object)
     CKsProjectView::OnUpdate(sender, hint, object);
     if (m_profile)
         m_profile->Refresh();
+    if (m_problems)
+        m_problems->Restart();
     TellLocationIfOther();
 }
 
@@ -173,6 +180,7 @@ void CKavo0_hdView::OnActivateView(bool activate, CView* activated, CView* deact
     if (activate) {
         EnableLinesMenu(m_linesEnabled);
         ShowProfile();
+        ShowProblems();
     }
     CKsProjectView::OnActivateView(activate, activated, deactivated);
 }
@@ -315,7 +323,8 @@ bool CKavo0_hdView::IsCommandEnabled(int id) const
 {
     if (id == KsCommand::Help)
         return true;
-    if (id == KsCommand::FindField || id == KsCommand::LongProfile)
+    if (id == KsCommand::FindField || id == KsCommand::LongProfile || id == KsCommand::Problems ||
+        id == KsCommand::NextProblem || id == KsCommand::PreviousProblem)
         return m_sheet && m_sheet->isEnabled();
     const auto* page = ActivePage();
     const bool isForLines = id == Command::InsertLine || id == Command::DeleteLine || CGridCommands::Knows(id);
@@ -350,6 +359,10 @@ bool CKavo0_hdView::OnCommand(int id)
         FindField();
     else if (id == KsCommand::LongProfile)
         ToggleProfile();
+    else if (id == KsCommand::Problems)
+        ToggleProblems();
+    else if (id == KsCommand::NextProblem || id == KsCommand::PreviousProblem)
+        NextProblem(id == KsCommand::NextProblem);
     else if (CGridCommands::Knows(id))
         CGridCommands::Run(id, *page->LinesGrid());
     else if (LinesView::Knows(id))

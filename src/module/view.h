@@ -4,6 +4,7 @@
 #include "document/document.h"
 #include "ks/fc/project_view.h"
 #include "pages/framework/page_host.h"
+#include "problems/problem_host.h"
 #include "profile/profile_host.h"
 
 #include <QPointer>
@@ -13,6 +14,7 @@
 class CCtrlEdit;
 class CDlgPropertySheet;
 class CGenPropertyPage;
+class CProblemCheck;
 class CProfilePanel;
 struct PageEntry;
 
@@ -20,7 +22,7 @@ class CDlgFrame : public CKsMDIChildWnd
 {
 };
 
-class CKavo0_hdView : public CKsProjectView, public IPageHost, public IProfileHost
+class CKavo0_hdView : public CKsProjectView, public IPageHost, public IProfileHost, public IProblemHost
 {
     Q_OBJECT
 public:
@@ -31,6 +33,8 @@ public:
     /// The sheet; null before the first update.
     CDlgPropertySheet* Sheet() const { return m_sheet; }
     CGenPropertyPage* ActivePage() const;
+    /// What is wrong in the document; null before all pages are made.
+    CProblemCheck* Problems() const { return m_problems.get(); }
 
     // CView
     void OnInitialUpdate() override;
@@ -63,9 +67,21 @@ public:
     bool MayLeaveField() override { return MayLeave(KsLeave::Field); }
     bool ShowCell(const ProfileTable& table, std::size_t row, int column) override;
 
+    // IProblemHost
+    const HD_Parameters& CheckedParameters() const override;
+    QString CheckedTitle() const override;
+    QString CheckedPath() const override;
+    std::shared_ptr<const CRiver> CheckedRiver() override;
+    std::vector<ProblemWhere> WhereAre(const std::vector<Problem>& problems) const override;
+    void ShowProblem(const ProblemPlace& place) override;
+    std::vector<FileProblem> FileProblems() const override;
+    void ShowFileProblems() override;
+    void Mend(const Problem& problem) override;
+
 protected:
     LRESULT OnRequest(WPARAM request, CKSComm_Package& package) override;
     void RevealChange(const ChangePlace& place) override;
+    void OnProjectsChanged() override;
     CString PlaceText() const override;
     CString SelectionText() const override;
 
@@ -76,6 +92,12 @@ private:
     void ShowProfile();
     void ToggleProfile();
     void TellProfile();
+    void WatchProblems();
+    void ShowProblems();
+    void ToggleProblems();
+    void NextProblem(bool forward);
+    void MarkProblems();
+    bool BringToFront();
     void TellLocationLater();
     void TellLocationIfOther();
     void TellLocation();
@@ -89,6 +111,7 @@ private:
     void MakeOtherPages();
 
     CDlgPropertySheet* m_sheet = nullptr;                      // child
+    std::unique_ptr<CProblemCheck> m_problems;                 // null before all pages are made
     QPointer<CProfilePanel> m_profile;                         // null before it is shown; see Profile
     std::vector<std::unique_ptr<CGenPropertyPage>> m_offSheet; // constructed, without a tab
     bool m_tellLocation = false;                               // once the present event is over

@@ -7,6 +7,7 @@
 #include "ks/fc/message_box.h"
 #include "module/kavo0_hd.h"
 #include "pages/framework/page.h"
+#include "problems/problem_check.h"
 #include "profile/profile_panel.h"
 #include "res/strings.h"
 
@@ -18,6 +19,8 @@ LRESULT CKavo0_hdView::OnRequest(WPARAM request, CKSComm_Package& package)
 {
     if (request == KsRequest::DataChanged && m_profile)
         m_profile->Refresh(); // cross sections may be other ones
+    if (request == KsRequest::DataChanged && m_problems)
+        m_problems->RiverChanged();
     if (request == KsRequest::LocationShown && m_profile && package.objects)
         for (const auto& object : *package.objects)
             if (const auto* place = dynamic_cast<const CKvrCBELocation*>(object.get()))
@@ -38,6 +41,13 @@ LRESULT CKavo0_hdView::OnRequest(WPARAM request, CKSComm_Package& package)
                                 std::make_move_iterator(items->end()));
     }
     return 0;
+}
+
+void CKavo0_hdView::OnProjectsChanged()
+{
+    CKsProjectView::OnProjectsChanged();
+    if (m_problems)
+        m_problems->RiverChanged();
 }
 
 /// The news waits until the present event is over: a row becomes current in the middle of changes, and who hears of it

@@ -26,9 +26,9 @@ CProfilePanel& CKavo0_hdView::Profile()
 void CKavo0_hdView::ShowProfile()
 {
     CKsMDIFrameWnd* const frame = MainFrame();
-    if (!frame || !m_sheet || !CProfileDock::IsWanted())
+    if (!frame || !m_sheet || !CKsDock::IsWanted(CProfileDock::Name))
         return;
-    CProfileDock& dock = CProfileDock::In(*frame);
+    auto& dock = KsDockIn<CProfileDock>(*frame);
     Profile().setWindowTitle(GetDocument()->GetTitle());
     dock.ShowPanel(Profile());
     dock.show();
@@ -40,7 +40,7 @@ void CKavo0_hdView::ToggleProfile()
     CKsMDIFrameWnd* const frame = MainFrame();
     if (!frame)
         return;
-    CProfileDock& dock = CProfileDock::In(*frame);
+    auto& dock = KsDockIn<CProfileDock>(*frame);
     dock.Want(!dock.isVisible());
     ShowProfile();
     if (dock.isVisible())

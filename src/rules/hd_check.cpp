@@ -2,10 +2,6 @@
 
 #include "rules/global_check.h"
 
-#include <algorithm>
-#include <iterator>
-#include <numeric>
-
 CHDCheck::CHDCheck(const HD_Parameters& parameters, const CRiver* river, std::string path)
     : m_parameters(parameters), m_path(std::move(path)), m_branches(river)
 {
@@ -14,14 +10,14 @@ CHDCheck::CHDCheck(const HD_Parameters& parameters, const CRiver* river, std::st
 bool CHDCheck::Step(std::size_t lines)
 {
     if (!m_isBegun) {
-        CheckGlobals(m_parameters.Global, m_path, m_found.emplace_back());
+        CheckGlobals(m_parameters.Global, m_path, m_found);
         m_isBegun = true;
         return true;
     }
-    if (m_list && m_list->Step(lines, m_found.back()))
+    if (m_list && m_list->Step(lines, m_found))
         return true;
     if (m_list)
-        m_found.back().Sort();
+        m_found.SortFrom(m_before);
     return NextList();
 }
 
@@ -36,23 +32,9 @@ bool CHDCheck::NextList()
         // The first line of a set does not count as a location: a set with that one only is not kept.
         m_list =
             std::make_unique<CListCheck>(section.ListAt(m_set), place, section.HasSets(), m_parameters, m_branches);
-        m_found.emplace_back();
+        m_before = m_found.ListedCount();
         ++m_set;
         return true;
     }
     return false;
-}
-
-std::vector<Problem> CHDCheck::Take()
-{
-    std::vector<Problem> all;
-    for (CProblems& problems : m_found)
-        std::ranges::move(problems.TakeListed(), std::back_inserter(all));
-    return all;
-}
-
-std::size_t CHDCheck::Count(RuleId rule) const
-{
-    return std::accumulate(m_found.begin(), m_found.end(), std::size_t(0),
-                           [rule](std::size_t sum, const CProblems& problems) { return sum + problems.Count(rule); });
 }

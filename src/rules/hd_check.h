@@ -17,9 +17,9 @@ public:
     /// last step, what was found may not be true, but nothing breaks as long as no list has gone.
     bool Step(std::size_t lines);
     /// The global values, then a list after the other, as the file has them.
-    std::vector<Problem> Take();
+    std::vector<Problem> Take() { return m_found.TakeListed(); }
     /// How many places break a rule, with those that are not listed.
-    std::size_t Count(RuleId rule) const;
+    std::size_t Count(RuleId rule) const { return m_found.Count(rule); }
 
 private:
     bool NextList();
@@ -27,7 +27,8 @@ private:
     const HD_Parameters& m_parameters;
     std::string m_path;
     CBranchNumbers m_branches;
-    std::vector<CProblems> m_found;
+    CProblems m_found;
+    std::size_t m_before = 0;           // how many were listed when the list was begun
     std::size_t m_entry = 0, m_set = 0; // of the next list
     std::unique_ptr<CListCheck> m_list; // the one that is looked at
     bool m_isBegun = false;

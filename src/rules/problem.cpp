@@ -5,9 +5,10 @@
 #include <algorithm>
 #include <cstdio>
 
-void CProblems::Sort()
+void CProblems::SortFrom(std::size_t first)
 {
-    std::ranges::stable_sort(m_listed, {}, [](const Problem& problem) { return problem.place.line; });
+    std::ranges::stable_sort(m_listed.begin() + std::ptrdiff_t(first), m_listed.end(), {},
+                             [](const Problem& problem) { return problem.place.line; });
 }
 
 Remedy RemedyOf(RuleId rule)

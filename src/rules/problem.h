@@ -27,7 +27,7 @@ struct ProblemPlace
 {
     static constexpr std::size_t None = std::size_t(-1);
 
-    std::string_view section;   // of a list, or of global values
+    std::string_view section{}; // of a list, or of global values
     std::string_view keyword{}; // of a global value
     std::size_t set = 0;        // which of the lists of a section that holds several
     std::size_t line = None;    // of a list, from 0; None for a global value
@@ -46,7 +46,7 @@ struct Problem
 class CProblems
 {
 public:
-    static constexpr std::size_t MostOfARule = 1000; // of a list, or of the global values
+    static constexpr std::size_t MostOfARule = 1000;
 
     void Add(Problem problem)
     {
@@ -55,8 +55,9 @@ public:
     }
     std::vector<Problem> TakeListed() { return std::move(m_listed); }
     std::size_t Count(RuleId rule) const { return m_counts[std::size_t(rule)]; } // with those that are not listed
-    /// In the order of lines and their fields, as they stand in the file.
-    void Sort();
+    std::size_t ListedCount() const { return m_listed.size(); }
+    /// Those behind the first so many in the order of their lines.
+    void SortFrom(std::size_t first);
 
 private:
     std::vector<Problem> m_listed;

@@ -189,6 +189,8 @@ void CFrameMenus::Update()
     Action("actionContents")->setVisible(HasHelp(m_frame));
     Action("actionFindField")->setEnabled(m_frame.HasCommand(KsCommand::FindField));
     Action("actionLongProfile")->setEnabled(m_frame.HasCommand(KsCommand::LongProfile));
+    Action("actionProblems")->setEnabled(m_frame.HasCommand(KsCommand::Problems));
+    Action("actionNextProblem")->setEnabled(m_frame.HasCommand(KsCommand::NextProblem));
 }
 
 void CFrameMenus::UpdateEdit()

@@ -164,6 +164,7 @@ LRESULT CProjects::SwitchBoard(WPARAM request, CKSComm_Package& package)
     case KsRequest::LoadLocations:
     case KsRequest::BranchNames:
     case KsRequest::BedLevels:
+    case KsRequest::Branches:
         return package.objects ? Ask(request, package, true) : 0;
     case KsRequest::LoadLocationsAndChannel:
         if (!package.objects || !Ask(KsRequest::LoadLocations, package, true))

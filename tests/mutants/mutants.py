@@ -45,7 +45,7 @@ MUTANTS = [
     ('rules', 'rules/mark_order.cpp', 'rising >= often * falling', 'rising > falling'),
     ('rules', 'rules/global_check.cpp', 'order(end) <= order(start)', 'order(end) < order(start)'),
     ('rules', 'rules/output_files.cpp', "std::ranges::replace(name, '\\\\', '/');", ''),
-    ('rules', 'rules/hd_check.cpp', '        m_found.back().Sort();\n', ''),
+    ('rules', 'rules/hd_check.cpp', '        m_found.SortFrom(m_before);\n', ''),
     ('rules', 'rules/value_rules.cpp', 'value - first >= rule.choices', 'value >= rule.choices'),
     # The tool.
     ('cli', 'cli/record_table.cpp', 'text.find_first_of(",\\"\\r\\n")', 'text.find_first_of(",\\r\\n")'),

@@ -59,6 +59,7 @@ private:
 
     // What other editors ask; each answers whether there was something.
     LRESULT FetchLocation(CObList& objects);
+    LRESULT TellBranches(CObList& objects) const;
     LRESULT FillChannel(CObList& objects);
 
     CNetworkMap* m_map = nullptr;

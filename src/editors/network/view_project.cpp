@@ -25,6 +25,8 @@ CTablesView::Answer CNetworkView::AnswerTo(WPARAM request)
         return std::bind_front(&CNetworkView::FetchLocation, this);
     case KsRequest::LoadLocationsAndChannel:
         return std::bind_front(&CNetworkView::FillChannel, this);
+    case KsRequest::Branches:
+        return std::bind_front(&CNetworkView::TellBranches, this);
     case KsRequest::LoadLocations: // a network has branches, but no list of locations
         return [](CObList&) { return 0; };
     default:
@@ -42,6 +44,19 @@ LRESULT CNetworkView::FetchLocation(CObList& objects)
     item->chainage = picked->chainage;
     objects.push_back(std::move(item));
     return 1;
+}
+
+LRESULT CNetworkView::TellBranches(CObList& objects) const
+{
+    for (const CNetworkBranch& branch : Document()->Network().branches) {
+        auto item = std::make_unique<CKvrCBEBranch>();
+        item->name = branch.Name();
+        item->start = branch.start;
+        item->end = branch.end;
+        item->downstream = branch.downstream;
+        objects.push_back(std::move(item));
+    }
+    return !objects.empty();
 }
 
 QStringList CNetworkView::KnownBranches() const

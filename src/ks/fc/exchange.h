@@ -37,6 +37,15 @@ public:
     double width = KsUnset;  // of the water surface
 };
 
+/// A branch of the river network.
+class KS_API CKvrCBEBranch : public CKsCBEItem
+{
+public:
+    CString name;
+    double start = 0, end = 0; // chainages of its ends, in whichever order the network has them
+    bool downstream = true;    // water flows towards increasing chainage
+};
+
 /// The ground at a cross section; metres above datum, KsUnset for what is not known.
 class KS_API CKvrCBEBedLevel : public CKsCBEItem
 {

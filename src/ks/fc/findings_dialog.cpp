@@ -98,6 +98,16 @@ QStringList Captions()
 
 } // namespace
 
+CString KsFindingSentence(const Finding& finding)
+{
+    QString text = CKsFindingsModel::tr("Expected: %1").arg(ExpectedText(finding));
+    if (!finding.found.empty())
+        text = CKsFindingsModel::tr("%1; in the file: %2").arg(text, QString::fromStdString(finding.found));
+    if (const QString used = UsedText(finding); !used.isEmpty())
+        text = CKsFindingsModel::tr("%1; used instead: %2").arg(text, used);
+    return text;
+}
+
 CKsFindingsModel::CKsFindingsModel(std::vector<Finding> findings, QObject* parent)
     : QAbstractTableModel(parent), m_findings(std::move(findings))
 {

@@ -31,6 +31,9 @@ private:
     std::vector<Finding> m_findings;
 };
 
+/// What stands at a place, what was expected there and what is used instead: a sentence in the user's language.
+KS_API CString KsFindingSentence(const Finding& finding);
+
 /// Not modal; deletes itself when it is closed.
 class KS_API CKsFindingsDialog : public QDialog
 {

@@ -17,6 +17,8 @@ namespace KsCommand {
 inline constexpr int Copy = 57634, Cut = 57635, Paste = 57637, Help = 57670;
 inline constexpr int FindField = 57680;   // leads to a page or a field by its name
 inline constexpr int LongProfile = 57681; // shows or hides a plot along the branch
+inline constexpr int Problems = 57682;    // shows or hides a list of what is wrong
+inline constexpr int NextProblem = 57683, PreviousProblem = 57684; // lead to one after the other
 } // namespace KsCommand
 
 /// A command of a view in the frame's "Edit" or "Lines" menu. Without a text it is a separator.

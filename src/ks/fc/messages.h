@@ -51,6 +51,7 @@ inline constexpr WPARAM LoadLocationsAndChannel = 49; // likewise; then the view
 inline constexpr WPARAM FetchLocation = 200;          // one CKvrCBELocation: the place picked; the first answer counts
 inline constexpr WPARAM BranchNames = 201;            // CKvrCBEText: the names of the branches
 inline constexpr WPARAM BedLevels = 203;              // CKvrCBEBedLevel: the ground at each cross section
+inline constexpr WPARAM Branches = 204;               // CKvrCBEBranch: the branches of the network and their ends
 // To the switchboard: appends a CKvrCBEView for every other view of the sender's project.
 inline constexpr WPARAM ProjectViews = 202;
 // Between editors. To a view of the HD parameter editor from another editor's view: 41 appends what KvrMSGGetData

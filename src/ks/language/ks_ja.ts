@@ -435,6 +435,18 @@ Used instead</source>
 期待される内容
 代わりに使う値</translation>
     </message>
+    <message>
+        <source>Expected: %1</source>
+        <translation>期待される値: %1</translation>
+    </message>
+    <message>
+        <source>%1; in the file: %2</source>
+        <translation>%1、ファイルの内容: %2</translation>
+    </message>
+    <message>
+        <source>%1; used instead: %2</source>
+        <translation>%1、代わりに使われる値: %2</translation>
+    </message>
 </context>
 <context>
     <name>CKsFormula</name>

@@ -469,6 +469,477 @@
     </message>
 </context>
 <context>
+    <name>HDRules</name>
+    <message>
+        <source>Manning&apos;s n is 0.008 for glass and 0.8 for dense grass</source>
+        <translation>マニングの n はガラスで 0.008、密な草で 0.8 です</translation>
+    </message>
+    <message>
+        <source>Manning&apos;s M, 1/n, is 125 for glass and 1 for dense grass</source>
+        <translation>マニングの M (1/n) はガラスで 125、密な草で 1 です</translation>
+    </message>
+    <message>
+        <source>Chezy&apos;s C is between 1 and 220 m^½/s for all beds and depths</source>
+        <translation>シェジーの C はどの河床と水深でも 1 から 220 m^½/s です</translation>
+    </message>
+    <message>
+        <source>the largest flood known had 10 million m³/s</source>
+        <translation>知られている最大の洪水は毎秒1000万立方メートルです</translation>
+    </message>
+    <message>
+        <source>no water stands lower than the Dead Sea or higher than the highest lakes</source>
+        <translation>死海より低い水面や最も高い湖より高い水面はありません</translation>
+    </message>
+    <message>
+        <source>a depth is not negative, and the deepest lake has 1,642 m</source>
+        <translation>水深は負にならず、最も深い湖は 1,642 m です</translation>
+    </message>
+    <message>
+        <source>beyond it there is no place on the Earth</source>
+        <translation>それを超える場所は地球上にありません</translation>
+    </message>
+    <message>
+        <source>the factor is 1 in open terrain and less where something shelters the river</source>
+        <translation>係数は開けた地形で 1、河川が遮られる所ではそれより小さくなります</translation>
+    </message>
+    <message>
+        <source>a loss is a part of the velocity head</source>
+        <translation>損失は速度水頭の一部です</translation>
+    </message>
+    <message>
+        <source>it cannot be negative</source>
+        <translation>負にはなりません</translation>
+    </message>
+    <message>
+        <source>beyond it all the water would be gone within a second</source>
+        <translation>それを超えると1秒で水がなくなります</translation>
+    </message>
+    <message>
+        <source>no river flows as fast</source>
+        <translation>それほど速く流れる河川はありません</translation>
+    </message>
+    <message>
+        <source>a river bed is not as steep</source>
+        <translation>河床はそれほど急ではありません</translation>
+    </message>
+    <message>
+        <source>there has to be one at least</source>
+        <translation>少なくとも1つ必要です</translation>
+    </message>
+    <message>
+        <source>it weights two points in time or place</source>
+        <translation>2つの時点または地点の重みです</translation>
+    </message>
+    <message>
+        <source>remove the line</source>
+        <translation>行を削除</translation>
+    </message>
+    <message>
+        <source>exchange start and end</source>
+        <translation>始点と終点を交換</translation>
+    </message>
+    <message>
+        <source>no HD parameters</source>
+        <translation>HDパラメータなし</translation>
+    </message>
+    <message>
+        <source>The file has no target [KAVO0_HD], so it holds no HD parameters. Perhaps it is a file of another kind.</source>
+        <translation>ファイルにターゲット [KAVO0_HD] がないため、HDパラメータを含みません。別の種類のファイルかもしれません。</translation>
+    </message>
+    <message>
+        <source>missing section</source>
+        <translation>セクションの不足</translation>
+    </message>
+    <message>
+        <source>A section that every file has is missing. Its values are the defaults of a new file.</source>
+        <translation>どのファイルにもあるセクションがありません。その値には新規ファイルの既定値が使われます。</translation>
+    </message>
+    <message>
+        <source>missing keyword</source>
+        <translation>キーワードの不足</translation>
+    </message>
+    <message>
+        <source>A keyword that its section needs is missing. Its values are the defaults of a new file.</source>
+        <translation>セクションに必要なキーワードがありません。その値には新規ファイルの既定値が使われます。</translation>
+    </message>
+    <message>
+        <source>missing parameter</source>
+        <translation>パラメータの不足</translation>
+    </message>
+    <message>
+        <source>A keyword has fewer parameters than it needs. The defaults stand in for the rest.</source>
+        <translation>キーワードのパラメータが足りません。残りには既定値が使われます。</translation>
+    </message>
+    <message>
+        <source>value of the wrong type</source>
+        <translation>値の型の誤り</translation>
+    </message>
+    <message>
+        <source>What stands in the file is not of the type that the parameter has, such as a text where a number belongs. It is not used, and a save writes what is used instead.</source>
+        <translation>数値の位置に文字列があるなど、ファイルの内容がパラメータの型と異なります。その内容は使われず、保存すると代わりの値が書かれます。</translation>
+    </message>
+    <message>
+        <source>value written otherwise</source>
+        <translation>別の型で書かれた値</translation>
+    </message>
+    <message>
+        <source>The value is written in another type than it should be, but what it means is beyond doubt, such as 1 for true. It is used, and a save writes it as it should be.</source>
+        <translation>値は本来と異なる型で書かれていますが、true の代わりの 1 のように意味は明らかです。値は使われ、保存すると本来の型で書かれます。</translation>
+    </message>
+    <message>
+        <source>count that does not fit</source>
+        <translation>合わない個数</translation>
+    </message>
+    <message>
+        <source>The parameter counts those behind it, and there are not as many. What follows in the keyword cannot be told apart and is not used.</source>
+        <translation>後に続くパラメータの個数が、示された個数と合いません。キーワードの以降の内容は区別できず、使われません。</translation>
+    </message>
+    <message>
+        <source>incomplete date</source>
+        <translation>不完全な日付</translation>
+    </message>
+    <message>
+        <source>A date and time needs six integers: year, month, day, hour, minute and second.</source>
+        <translation>日時には年、月、日、時、分、秒の6つの整数が必要です。</translation>
+    </message>
+    <message>
+        <source>no such date</source>
+        <translation>存在しない日付</translation>
+    </message>
+    <message>
+        <source>The six integers are no date and time of the calendar, such as the 30th of February.</source>
+        <translation>2月30日のように、6つの整数が暦にない日時を表しています。</translation>
+    </message>
+    <message>
+        <source>more flags than titles</source>
+        <translation>題名より多いフラグ</translation>
+    </message>
+    <message>
+        <source>There are more flags than marks that they could belong to. A save leaves them out.</source>
+        <translation>フラグの数が対応するマークの数より多くなっています。保存すると余分なフラグは除かれます。</translation>
+    </message>
+    <message>
+        <source>surplus parameters</source>
+        <translation>余分なパラメータ</translation>
+    </message>
+    <message>
+        <source>The keyword has more parameters than it knows. A save leaves them out.</source>
+        <translation>キーワードのパラメータが決められた数より多くなっています。保存すると余分なものは除かれます。</translation>
+    </message>
+    <message>
+        <source>unknown section or keyword</source>
+        <translation>未知のセクションまたはキーワード</translation>
+    </message>
+    <message>
+        <source>Nothing here uses it. It is kept, and a save writes it behind the rest.</source>
+        <translation>ここでは使われません。内容は保持され、保存すると最後に書かれます。</translation>
+    </message>
+    <message>
+        <source>unknown parameters</source>
+        <translation>未知のパラメータ</translation>
+    </message>
+    <message>
+        <source>The keyword has more parameters than are known. They are kept.</source>
+        <translation>キーワードに未知のパラメータがあります。それらは保持されます。</translation>
+    </message>
+    <message>
+        <source>repeated section or keyword</source>
+        <translation>重複したセクションまたはキーワード</translation>
+    </message>
+    <message>
+        <source>It stands in the file more than once, and only the first counts. The others are kept, but never shown.</source>
+        <translation>ファイルに複数回現れ、最初のものだけが有効です。他は保持されますが、表示されません。</translation>
+    </message>
+    <message>
+        <source>keyword without its companion</source>
+        <translation>対になるキーワードがないキーワード</translation>
+    </message>
+    <message>
+        <source>The keyword only means something together with another one, which is missing. It is kept as it stands.</source>
+        <translation>このキーワードは別のキーワードとともに意味を持ちますが、それがありません。そのまま保持されます。</translation>
+    </message>
+    <message>
+        <source>broken rule of the file</source>
+        <translation>ファイルの規則違反</translation>
+    </message>
+    <message>
+        <source>The value is of the right type, but not one that the file may hold. Another one is used instead.</source>
+        <translation>値の型は正しいものの、ファイルに許されない値です。代わりの値が使われます。</translation>
+    </message>
+    <message>
+        <source>line without branch</source>
+        <translation>河川名のない行</translation>
+    </message>
+    <message>
+        <source>the branch name is empty</source>
+        <translation>河川名が空です</translation>
+    </message>
+    <message>
+        <source>The line belongs to no place of the river, so the simulation cannot use it. A save of the document offers to remove such lines.</source>
+        <translation>行が河川のどの場所にも属さないため、計算に使えません。文書を保存するとき、このような行を削除するか尋ねられます。</translation>
+    </message>
+    <message>
+        <source>line without chainage</source>
+        <translation>追加距離のない行</translation>
+    </message>
+    <message>
+        <source>the chainage is not given</source>
+        <translation>追加距離が入力されていません</translation>
+    </message>
+    <message>
+        <source>The line names a branch but no place on it, so the simulation cannot use it. A save of the document offers to remove such lines.</source>
+        <translation>河川名はあっても位置がないため、計算に使えません。文書を保存するとき、このような行を削除するか尋ねられます。</translation>
+    </message>
+    <message>
+        <source>two lines for one location</source>
+        <translation>同じ地点の2行</translation>
+    </message>
+    <message>
+        <source>line %1 is for the same location and has other values</source>
+        <translation>行 %1 が同じ地点で別の値を持っています</translation>
+    </message>
+    <message>
+        <source>Two lines of the list give the same branch and chainage different values. Only one of them can hold, and which one is for the simulation to choose.</source>
+        <translation>同じ河川と追加距離に2つの行が異なる値を与えています。有効なのは一方だけで、どちらになるかは計算側が決めます。</translation>
+    </message>
+    <message>
+        <source>repeated line</source>
+        <translation>重複した行</translation>
+    </message>
+    <message>
+        <source>line %1 is the same</source>
+        <translation>行 %1 と同じです</translation>
+    </message>
+    <message>
+        <source>The line says once more what an earlier one of the list says, value for value. It can be removed without changing anything.</source>
+        <translation>前にある行とすべての値が同じです。削除しても何も変わりません。</translation>
+    </message>
+    <message>
+        <source>branch not in the network</source>
+        <translation>河道網にない河川</translation>
+    </message>
+    <message>
+        <source>the network has no branch %1</source>
+        <translation>河道網に河川 %1 がありません</translation>
+    </message>
+    <message>
+        <source>The river network has no branch of this name, so the line holds nowhere. Perhaps the name is misspelled, or the branch was renamed.</source>
+        <translation>河道網にこの名前の河川がないため、行はどこにも適用されません。名前の誤りか、河川の名前が変更されたのかもしれません。</translation>
+    </message>
+    <message>
+        <source>chainage beyond the branch</source>
+        <translation>河川の範囲外の追加距離</translation>
+    </message>
+    <message>
+        <source>%1 does not lie on branch %2, which runs from %3 to %4</source>
+        <translation>%1 は河川 %2 の範囲 (%3 から %4) にありません</translation>
+    </message>
+    <message>
+        <source>The chainage lies before the first or behind the last one of its branch in the river network, by more than a millimeter.</source>
+        <translation>追加距離が河道網の河川の始点より前、または終点より後にあり、その差は1ミリメートルを超えます。</translation>
+    </message>
+    <message>
+        <source>reach that ends before it starts</source>
+        <translation>始点より前で終わる区間</translation>
+    </message>
+    <message>
+        <source>the reach ends at %1, before it starts at %2</source>
+        <translation>区間は始点 %2 より前の %1 で終わります</translation>
+    </message>
+    <message>
+        <source>The end of the reach lies upstream of its start: below it, or, on a branch whose flow is against its chainages, above it.</source>
+        <translation>区間の終点が始点より上流にあります。流れが追加距離と逆向きの河川では、終点の追加距離が始点より大きい場合がこれに当たります。</translation>
+    </message>
+    <message>
+        <source>reach without length</source>
+        <translation>長さのない区間</translation>
+    </message>
+    <message>
+        <source>the reach ends where it starts</source>
+        <translation>区間の始点と終点が同じです</translation>
+    </message>
+    <message>
+        <source>Start and end of the reach are the same, so it holds nowhere.</source>
+        <translation>区間の始点と終点が同じため、どこにも適用されません。</translation>
+    </message>
+    <message>
+        <source>reach without end</source>
+        <translation>終点のない区間</translation>
+    </message>
+    <message>
+        <source>the end of the reach is not given</source>
+        <translation>区間の終点が入力されていません</translation>
+    </message>
+    <message>
+        <source>The line says where its reach starts, but not where it ends.</source>
+        <translation>行には区間の始点があり、終点がありません。</translation>
+    </message>
+    <message>
+        <source>reaches that overlap</source>
+        <translation>重なる区間</translation>
+    </message>
+    <message>
+        <source>the reach overlaps that of line %1</source>
+        <translation>区間が行 %1 の区間と重なります</translation>
+    </message>
+    <message>
+        <source>A piece of the branch belongs to two reaches of the list. Which of them holds there is for the simulation to choose. Reaches may touch.</source>
+        <translation>河川の一部が一覧の2つの区間に属しています。どちらが有効かは計算側が決めます。区間どうしが接するのはかまいません。</translation>
+    </message>
+    <message>
+        <source>value below its range</source>
+        <translation>範囲より小さい値</translation>
+    </message>
+    <message>
+        <source>%1 is less than %2, the least that is allowed</source>
+        <translation>%1 は許される最小値 %2 より小さい値です</translation>
+    </message>
+    <message>
+        <source>The value is smaller than the editor lets anybody type. The file was written by something else.</source>
+        <translation>エディタで入力できる値より小さくなっています。ファイルは別のプログラムで書かれたものです。</translation>
+    </message>
+    <message>
+        <source>value above its range</source>
+        <translation>範囲より大きい値</translation>
+    </message>
+    <message>
+        <source>%1 is more than %2, the most that is allowed</source>
+        <translation>%1 は許される最大値 %2 より大きい値です</translation>
+    </message>
+    <message>
+        <source>The value is larger than the editor lets anybody type. The file was written by something else.</source>
+        <translation>エディタで入力できる値より大きくなっています。ファイルは別のプログラムで書かれたものです。</translation>
+    </message>
+    <message>
+        <source>number of no entry</source>
+        <translation>該当する項目のない番号</translation>
+    </message>
+    <message>
+        <source>%1 is the number of no entry; they go from %2 to %3</source>
+        <translation>%1 に当たる項目がありません。番号は %2 から %3 までです</translation>
+    </message>
+    <message>
+        <source>The value is the number of an entry of a list, and the list has none of this number.</source>
+        <translation>値は選択肢の番号ですが、その番号の選択肢がありません。</translation>
+    </message>
+    <message>
+        <source>value that no river has</source>
+        <translation>河川ではありえない値</translation>
+    </message>
+    <message>
+        <source>%1 is less than %2: %3</source>
+        <translation>%1 は %2 より小さい値です: %3</translation>
+    </message>
+    <message>
+        <source>The value is allowed, but smaller than any river&apos;s, so perhaps it was typed in another unit or for another formula.</source>
+        <translation>許される値ですが、どの河川の値よりも小さいため、別の単位または別の公式の値が入力されたのかもしれません。</translation>
+    </message>
+    <message>
+        <source>%1 is more than %2: %3</source>
+        <translation>%1 は %2 より大きい値です: %3</translation>
+    </message>
+    <message>
+        <source>The value is allowed, but larger than any river&apos;s, so perhaps it was typed in another unit or for another formula.</source>
+        <translation>許される値ですが、どの河川の値よりも大きいため、別の単位または別の公式の値が入力されたのかもしれません。</translation>
+    </message>
+    <message>
+        <source>least above greatest resistance</source>
+        <translation>最大抵抗より大きい最小抵抗</translation>
+    </message>
+    <message>
+        <source>the least resistance, %1, is above the greatest, %2</source>
+        <translation>最小抵抗 %1 が最大抵抗 %2 より大きくなっています</translation>
+    </message>
+    <message>
+        <source>Results are raised to the least and lowered to the greatest resistance, which cannot both be done when the least is above the greatest.</source>
+        <translation>結果は最小抵抗まで引き上げられ、最大抵抗まで引き下げられます。最小が最大より大きいと両方を満たせません。</translation>
+    </message>
+    <message>
+        <source>velocities that do not rise</source>
+        <translation>増加しない流速</translation>
+    </message>
+    <message>
+        <source>velocity %1 stands behind %2</source>
+        <translation>流速 %2 の後に %1 があります</translation>
+    </message>
+    <message>
+        <source>A table of resistance over velocity is looked up by velocity, so the velocities have to rise from line to line.</source>
+        <translation>流速に対する抵抗の表は流速で引かれるため、流速は行ごとに増加しなければなりません。</translation>
+    </message>
+    <message>
+        <source>interface above the water level</source>
+        <translation>水位より高い界面</translation>
+    </message>
+    <message>
+        <source>the interface of the layers, %1, lies above the water level, %2</source>
+        <translation>層の界面 %1 が水位 %2 より高くなっています</translation>
+    </message>
+    <message>
+        <source>The bottom layer reaches up to the interface and the top layer from there to the water level, so the interface cannot lie above it.</source>
+        <translation>下層は界面まで、上層は界面から水位までです。界面が水位より高くなることはありません。</translation>
+    </message>
+    <message>
+        <source>marks out of order</source>
+        <translation>順序の異なるマーク</translation>
+    </message>
+    <message>
+        <source>mark %1 (%2) and mark %3 (%4) stand the other way round than at other locations</source>
+        <translation>マーク %1 (%2) とマーク %3 (%4) の上下が他の地点と逆です</translation>
+    </message>
+    <message>
+        <source>At nine of ten locations or more one of the two marks lies above the other, and here it does not. Perhaps their levels were exchanged.</source>
+        <translation>地点の9割以上で一方のマークが他方より高いのに、ここではそうではありません。高さが入れ替わっているのかもしれません。</translation>
+    </message>
+    <message>
+        <source>period that ends before it starts</source>
+        <translation>開始前に終わる期間</translation>
+    </message>
+    <message>
+        <source>the period ends at %1, not after it starts at %2</source>
+        <translation>期間の終了 %1 が開始 %2 より後ではありません</translation>
+    </message>
+    <message>
+        <source>The end of the period does not lie behind its start, so nothing would be written.</source>
+        <translation>期間の終わりが始まりより後にないため、何も書かれません。</translation>
+    </message>
+    <message>
+        <source>output over an input file</source>
+        <translation>入力ファイルへの出力</translation>
+    </message>
+    <message>
+        <source>the simulation writes %1, which it also reads</source>
+        <translation>計算は %1 に書き込み、同じファイルを読み込みます</translation>
+    </message>
+    <message>
+        <source>The file is written by the simulation and read by it, too: as ground elevations, as help grid, or as this parameter file itself. What it held would be lost.</source>
+        <translation>計算が書き込むファイルが、地盤高、補助格子、またはこのパラメータファイルとして読み込まれます。元の内容は失われます。</translation>
+    </message>
+    <message>
+        <source>two outputs into one file</source>
+        <translation>1つのファイルへの2つの出力</translation>
+    </message>
+    <message>
+        <source>line %1 writes the same file</source>
+        <translation>行 %1 が同じファイルに書き込みます</translation>
+    </message>
+    <message>
+        <source>Two outputs are written to one file, so one of them would be lost.</source>
+        <translation>2つの出力が同じファイルに書かれるため、一方が失われます。</translation>
+    </message>
+    <message>
+        <source>output without file</source>
+        <translation>ファイルのない出力</translation>
+    </message>
+    <message>
+        <source>the output has no file name</source>
+        <translation>出力のファイル名がありません</translation>
+    </message>
+    <message>
+        <source>An output is asked for, but not where it is to be written.</source>
+        <translation>出力が指定されていますが、書き込み先がありません。</translation>
+    </message>
+</context>
+<context>
     <name>Kavo0_hd</name>
     <message>
         <source>R1</source>
@@ -2627,6 +3098,109 @@ Writes the length of the time steps, where the computation chooses it.</source>
 流れが河床に及ぼすせん断応力を出力する。
 漏水を考慮する場合に、河川沿いの地下水頭を出力する。
 計算が自動的に決める場合の、計算時間間隔を出力する。</translation>
+    </message>
+</context>
+<context>
+    <name>ProblemTexts</name>
+    <message>
+        <source>Exchange of start and end</source>
+        <translation>始点と終点の交換</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>エラー</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>警告</translation>
+    </message>
+    <message>
+        <source>Note</source>
+        <translation>注記</translation>
+    </message>
+    <message>
+        <source>1 error</source>
+        <translation>エラー 1件</translation>
+    </message>
+    <message>
+        <source>%1 errors</source>
+        <translation>エラー %1件</translation>
+    </message>
+    <message>
+        <source>1 warning</source>
+        <translation>警告 1件</translation>
+    </message>
+    <message>
+        <source>%1 warnings</source>
+        <translation>警告 %1件</translation>
+    </message>
+    <message>
+        <source>1 note</source>
+        <translation>注記 1件</translation>
+    </message>
+    <message>
+        <source>%1 notes</source>
+        <translation>注記 %1件</translation>
+    </message>
+    <message>
+        <source>Problems</source>
+        <translation>問題</translation>
+    </message>
+    <message>
+        <source>Problem</source>
+        <translation>問題</translation>
+    </message>
+    <message>
+        <source>Page</source>
+        <translation>ページ</translation>
+    </message>
+    <message>
+        <source>Line</source>
+        <translation>行</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>項目</translation>
+    </message>
+    <message>
+        <source>Document</source>
+        <translation>文書</translation>
+    </message>
+    <message>
+        <source>Code</source>
+        <translation>コード</translation>
+    </message>
+    <message>
+        <source>Show only what has these words</source>
+        <translation>これらの語を含むものだけを表示</translation>
+    </message>
+    <message>
+        <source>Nothing was found in the open documents.</source>
+        <translation>開いている文書に問題はありません。</translation>
+    </message>
+    <message>
+        <source>A click leads to the place.</source>
+        <translation>クリックするとその場所に移動します。</translation>
+    </message>
+    <message>
+        <source>&amp;Go There</source>
+        <translation>移動(&amp;G)</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>コピー(&amp;C)</translation>
+    </message>
+    <message>
+        <source>%1: %2. %3</source>
+        <translation>%1: %2。%3</translation>
+    </message>
+    <message>
+        <source>Start and end exchanged: %1 cells</source>
+        <translation>始点と終点を交換: %1個のセル</translation>
+    </message>
+    <message>
+        <source>%1 of the file</source>
+        <translation>ファイルの %1</translation>
     </message>
 </context>
 </TS>

@@ -303,6 +303,22 @@ The editors read %2.</source>
         <source>Shows or hides levels and values along the branch</source>
         <translation>河川に沿った水位や値の図の表示と非表示を切り替えます</translation>
     </message>
+    <message>
+        <source>P&amp;roblems</source>
+        <translation>問題(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Shows or hides the list of what is wrong in the open documents</source>
+        <translation>開いている文書の問題の一覧を表示または非表示にします</translation>
+    </message>
+    <message>
+        <source>&amp;Next Problem</source>
+        <translation>次の問題(&amp;N)</translation>
+    </message>
+    <message>
+        <source>Leads to the next problem of the list</source>
+        <translation>一覧の次の問題に移動します</translation>
+    </message>
 </context>
 <context>
     <name>CFrameMenus</name>
