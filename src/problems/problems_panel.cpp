@@ -183,7 +183,9 @@ void CProblemsPanel::Step(bool forward)
         return;
     const int now = Chosen().row();
     const int next = now < 0 ? (forward ? 0 : count - 1) : (now + (forward ? 1 : count - 1)) % count;
-    m_table->selectRow(next);
+    // Whatever keys are held, which the view would look at.
+    m_table->selectionModel()->setCurrentIndex(m_filter->index(next, 0),
+                                               QItemSelectionModel::ClearAndSelect | QItemSelectionModel::Rows);
     GoTo(m_filter->index(next, 0));
 }
 

@@ -6,8 +6,8 @@ CLocations::CLocations(std::size_t lines) : m_slots(std::bit_ceil(lines * 2 + 2)
 
 std::size_t CLocations::Add(std::uint32_t branch, double chainage, std::size_t line)
 {
-    chainage += 0.0; // -0 is 0
-    // The high bits of a product with a large odd number depend on all bits of the factors (Fibonacci hashing).
+    // The high bits of a product with a large odd number depend on all bits of the factors (Fibonacci hashing). The sign
+    // of a number ends in the highest one, which no table is large enough for: -0 is 0.
     constexpr std::uint64_t scatter = 0x9E3779B97F4A7C15;
     const std::uint64_t hash = (std::bit_cast<std::uint64_t>(chainage) * scatter ^ branch) * scatter;
     const std::size_t mask = m_slots.size() - 1;

@@ -17,6 +17,7 @@ from mutants import MUTANTS
 ROOT = os.path.abspath(os.path.join(os.path.dirname(os.path.abspath(__file__)), '../..'))
 BUILD = f'{ROOT}/build/dev'
 PROGRAMS = {'tql': ['tql_test'], 'files': ['data_test'], 'data': ['data_test', 'cli_test'], 'cli': ['cli_test'], 'rules': ['rules_test'],
+            'problems': ['problems_test'],
             'ks': ['ks_test', 'pages_test', 'shell_test'],
             'documents': ['shell_test', 'ks_test', 'module_test', 'cross_sections_test'],
             'grid': ['grid_test', 'pages_test', 'sheet_pages_test'],

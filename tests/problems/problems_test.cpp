@@ -194,6 +194,11 @@ TEST_F(ProblemsTest, AreMarkedAtLinesAndTabs)
     const CGridModel& initial = *view->Sheet()->PageAt(0)->GetGrid()->Model();
     EXPECT_FALSE(initial.NoteOf(0));
     ASSERT_TRUE(initial.NoteOf(1) && initial.NoteOf(2));
+    for (int tab = 0; tab < sheet.count(); ++tab)
+        if (sheet.tabText(tab).endsWith("Sand Bars")) {
+            const CGridModel& bars = *view->Sheet()->PageAt(tab)->GetGrid()->Model();
+            EXPECT_TRUE(!bars.NoteOf(0) && bars.NoteOf(1)) << "behind the line of the global values";
+        }
     EXPECT_EQ(initial.headerData(1, Qt::Vertical, Qt::ToolTipRole).toString(), "Line 1 is the same");
     EXPECT_EQ(sheet.tabToolTip(0), "1 warning, 1 note");
     EXPECT_FALSE(sheet.tabIcon(0).isNull());
@@ -265,6 +270,10 @@ TEST_F(ProblemsTest, ListNarrowsDownCopiesAndMends)
     panel.Step(true);
     EXPECT_EQ(table.currentIndex().row(), 0);
     EXPECT_EQ(Focus(), "Default Values");
+    panel.Step(true);
+    panel.Step(false);
+    panel.Step(false);
+    EXPECT_EQ(table.currentIndex().row(), rows.rowCount() - 1) << "around the end";
 }
 
 // Until a save has written what is shown.

@@ -82,6 +82,9 @@ TEST(Rules, FindWhatBreaksThemAndNothingElse)
          "3:16 HD203 PointValue: the end of the reach is not given"},
         {InList("OutputGridPoints", "DATA = \"R\", 5, 9\nDATA = \"R\", 1, 6\nDATA = \"R\", 6, 7"),
          "4:1 HD204 the reach overlaps that of line 1; 5:1 HD204 the reach overlaps that of line 1"},
+        {InList("OutputGridPoints", "DATA = \"R\", 0, 100\nDATA = \"R\", 10, 20\nDATA = \"R\", 50, 60"),
+         "4:1 HD204 the reach overlaps that of line 1; 5:1 HD204 the reach overlaps that of line 1"},
+        {InList("WindList", "DATA = \"R\", 1, 1\nDATA = \"S\", 1, 1"), ""},
         // Values.
         {InSection("Defalt_Values", "delta = 0.4\nzeta_min = 0"),
          "4:9 HD301 delta: 0.4 is less than 0.5, the least that "
@@ -90,6 +93,7 @@ TEST(Rules, FindWhatBreaksThemAndNothingElse)
         {InSection("Global_Values", "ResisZone = 2, 30, 25, 20"),
          "4:13 HD303 ResisZone: 2 is the number of no entry; they go from 0 to 1"},
         {InList("Enc_Simulation", "[Encroachment_Setup]\nDATA = \"R\", 1, 0, 1, 0, 0, 0, 0, 0, 1, 0, 0, 0, 0, 0\n"
+                                  "DATA = \"R\", 2, 5, 1, 0, 0, 0, 0, 0, 1, 0, 0, 0, 0, 0\n"
                                   "[/Encroachment_Setup]"),
          "4:16 HD303 EncOption1: 0 is the number of no entry; they go from 1 to 5"},
         {InList("WindList", "DATA = \"R\", 1, -0.5"),
@@ -215,16 +219,30 @@ TEST(Rules, FindTheSameInSlices)
 TEST(Rules, OutliveChangesBetweenTwoSlices)
 {
     HD_Parameters parameters;
-    for (int i = 0; i < 100; ++i)
-        parameters.WindList.Add().RiverName = "R";
+    const auto add = [&parameters](int count) {
+        for (int i = 0; i < count; ++i) {
+            HD_Windfact& record = parameters.WindList.Add();
+            record.RiverName = "R";
+            record.Chainage = double(parameters.WindList.GetCount());
+            record.WindFactor = -1;
+        }
+    };
+    add(100);
     CHDCheck check(parameters, nullptr, "");
-    while (check.Step(10) && parameters.WindList.GetCount() < 200)
-        for (int i = 0; i < 20; ++i)
-            parameters.WindList.Add().RiverName = "S";
+    while (check.Count(RuleId::ImplausiblyLow) == 0)
+        ASSERT_TRUE(check.Step(10));
+    add(5000); // it is looked at as far as it was long
+    for (int i = 0; i < 15; ++i)
+        check.Step(10);
+    EXPECT_EQ(check.Count(RuleId::ImplausiblyLow), 100u);
+
+    CHDCheck other(parameters, nullptr, "");
+    while (other.Count(RuleId::ImplausiblyLow) == 0)
+        ASSERT_TRUE(other.Step(10));
     parameters.WindList.RemoveAll();
-    while (check.Step(10))
+    while (other.Step(10))
         ;
-    EXPECT_LE(check.Count(RuleId::NoChainage), 100u);
+    EXPECT_EQ(other.Count(RuleId::ImplausiblyLow), 10u);
 }
 
 TEST(Rules, CountWhatTheyDoNotList)
