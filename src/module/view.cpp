@@ -6,6 +6,7 @@
 #include "grid/lines_view.h"
 #include "ks/fc/after_paint.h"
 #include "module/find_field.h"
+#include "module/help_chapters.h"
 #include "module/sheet.h"
 #include "pages/framework/ctrl_edit.h"
 #include "pages/framework/page.h"
@@ -237,6 +238,22 @@ void CKavo0_hdView::EnableLinesMenu(bool enable)
     m_linesEnabled = enable;
     if (auto* frame = MainFrame(); frame && frame->GetActiveView() == this)
         frame->EnableMenuItem(LinesMenuPosition, enable);
+}
+
+void CKavo0_hdView::ShowHelp()
+{
+    CKsMDIFrameWnd* const frame = MainFrame();
+    if (!frame)
+        return;
+    const auto chapters = [view = QPointer(this), frame = QPointer(frame)] {
+        std::vector<KsHelpChapter> all;
+        if (view)
+            all = HelpChapters(*view->m_sheet, *view->GetDocument());
+        if (frame)
+            std::ranges::move(frame->HelpChapters(), std::back_inserter(all));
+        return all;
+    };
+    CKsHelpWindow::In(*frame).Show(chapters, ChapterOf(m_sheet->currentIndex()));
 }
 
 /// A table of a line is on show for the line that is current, so of the pages behind only their lists are meant.

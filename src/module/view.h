@@ -57,6 +57,7 @@ public:
     std::vector<HostTable> TablesOfDocument() override;
     QStringList BranchNames() override;
     void EnableLinesMenu(bool enable) override;
+    void ShowHelp() override;
 
     // IProfileHost
     std::vector<ProfileTable> ProfileTables() override;

@@ -4,7 +4,6 @@
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
 #include "shell/frame_actions.h"
-#include "shell/help_commands.h"
 #include "shell/main_frame.h"
 #include "shell/recent_files.h"
 #include "shell/settings_keys.h"
@@ -186,7 +185,6 @@ void CFrameMenus::Update()
     const bool usCustomary = KsUnits::Instance().System() == KsUnitSystem::UsCustomary;
     Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);
     m_actions.at(QStringLiteral("actionLanguage_") + KsLanguage::Instance().Current())->setChecked(true);
-    Action("actionContents")->setVisible(HasHelp(m_frame));
     Action("actionFindField")->setEnabled(m_frame.HasCommand(KsCommand::FindField));
     Action("actionLongProfile")->setEnabled(m_frame.HasCommand(KsCommand::LongProfile));
     Action("actionProblems")->setEnabled(m_frame.HasCommand(KsCommand::Problems));

@@ -1,13 +1,17 @@
 // The commands of the Help menu.
 #pragma once
 
+#include <vector>
+
 class CMainFrame;
 class QWidget;
+struct KsHelpChapter;
 
-/// Whether the editor of the active view has help, or, without a view, the first editor.
-bool HasHelp(const CMainFrame& frame);
-/// Opens the help file of that editor; one without a file may have something to say itself.
+/// Opens the help file of the active view's editor, or, without a view, of the first one; where there is no such file,
+/// the help window: with what the view has to say, and with the shell's chapters.
 void ShowHelp(CMainFrame& frame);
+/// The keys of the menus; name, version and licenses of the program.
+std::vector<KsHelpChapter> ShellChapters();
 /// "Plug-ins": which editors are there, and why one is not used.
 void ShowPlugins(CMainFrame& frame);
 /// Tells name and version of the program.

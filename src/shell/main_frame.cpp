@@ -1,5 +1,8 @@
 #include "shell/main_frame.h"
 
+#include "ks/fc/help_window.h"
+#include "shell/help_commands.h"
+
 #include "ks/fc/exports.h"
 #include "ks/fc/file_name.h"
 #include "ks/fc/shown_text.h"
@@ -86,6 +89,11 @@ LRESULT CMainFrame::WindowProc(unsigned message, WPARAM wParam, LPARAM lParam)
     if (package && message == KsMessage::BetweenEditors())
         m_projects.Registry().Forward(wParam, *package);
     return CKsMDIFrameWnd::WindowProc(message, wParam, lParam);
+}
+
+std::vector<KsHelpChapter> CMainFrame::HelpChapters() const
+{
+    return ShellChapters();
 }
 
 QMenu* CMainFrame::createPopupMenu()

@@ -48,6 +48,7 @@ public:
 
     LRESULT WindowProc(unsigned message, WPARAM wParam, LPARAM lParam) override;
     QMenu* createPopupMenu() override;
+    std::vector<KsHelpChapter> HelpChapters() const override;
 
 protected:
     void ActiveViewChanged(CView* view) override;

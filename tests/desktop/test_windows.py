@@ -1,6 +1,7 @@
 """Windows and their keys."""
 import samples
 from case import Case
+from editor import active_window
 from waiting import wait_for
 
 
@@ -94,3 +95,25 @@ class MenuLetters(Case):
                 wait_for(lambda: popup.shown, f'Alt+{letter.upper()} opens {menu} on the page {page}', 2)
                 editor.press('Escape', 'Escape')
                 wait_for(lambda: not popup.shown, f'the menu {menu} closes')
+
+
+class Help(Case):
+    """F1 shows the chapter of the page in front, and the keyboard comes back to where it was."""
+
+    def test_it_opens_searches_and_closes(self):
+        editor = self.open()
+        editor.go_to('Wind')
+        editor.click_cell(1, 3)
+        front = active_window()
+        editor.press('F1')
+        wait_for(lambda: active_window() not in ('', front), 'the help is shown', 5)
+        editor.press('ctrl+f')
+        editor.type('Latitude')
+        editor.press('Return', 'Escape')
+        wait_for(lambda: active_window() == front, 'Escape leads back', 5)
+        editor.settle()
+        editor.type('0.75')
+        editor.press('Return')
+        editor.save()
+        self.assertEqual(self.saved().records('WindList')[0], '"MOORBECK", 100, 0.75')
+        self.assert_clean()

@@ -8,12 +8,15 @@
 #include "ks/fc/doc_template.h"
 #include "ks/fc/file_bar.h"
 #include "ks/fc/findings_dialog.h"
+#include "ks/fc/help_window.h"
 #include "module/find_field.h"
+#include "module/help_chapters.h"
 #include "module/kavo0_hd.h"
 #include "module/sheet.h"
 #include "module/view.h"
 #include "pages/framework/page.h"
 #include "pages/framework/page_help.h"
+#include "rules/rule.h"
 
 #include <QApplication>
 #include <QCheckBox>
@@ -22,11 +25,13 @@
 #include <QDialog>
 #include <QLabel>
 #include <QLineEdit>
+#include <QListWidget>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QStatusBar>
 #include <QTableView>
 #include <QTest>
+#include <QTextBrowser>
 #include <QTimer>
 #include <QToolButton>
 #include <QUndoStack>
@@ -132,11 +137,31 @@ TEST_F(ViewTest, TheHelpCommandReachesThePage)
     ASSERT_NE(view, nullptr);
     EXPECT_TRUE(view->IsCommandEnabled(KsCommand::Help));
     EXPECT_TRUE(frame.SendCommand(KsCommand::Help));
-    const auto windows = QApplication::topLevelWidgets();
-    const auto help = std::find_if(windows.begin(), windows.end(),
-                                   [](const QWidget* w) { return w->inherits("QWhatsThat") && w->isVisible(); });
-    ASSERT_NE(help, windows.end());
-    QTest::keyClick(*help, Qt::Key_Escape);
+    auto* help = frame.findChild<CKsHelpWindow*>();
+    ASSERT_TRUE(help && help->isVisible());
+    const auto text = [help] { return help->findChild<QTextBrowser*>()->toPlainText(); };
+    auto* chapters = help->findChild<QListWidget*>();
+    EXPECT_EQ(chapters->count(), view->Sheet()->PageCount() + 2);
+    EXPECT_EQ(chapters->currentItem()->text(), "Initial");
+    EXPECT_TRUE(text().contains("G_waterlevel") && text().contains("InitList")) << text().toStdString();
+    help->findChild<QLineEdit*>()->setText("G_wind_factor shelter");
+    ASSERT_EQ(chapters->count(), 1);
+    EXPECT_EQ(chapters->item(0)->text(), "Wind");
+    chapters->setCurrentRow(0);
+    EXPECT_TRUE(text().contains("shear stress of the wind"));
+    QTest::keyClick(help, Qt::Key_Escape);
+    EXPECT_FALSE(help->isVisible());
+    // Every value that a page edits is in one of the chapters.
+    QString all;
+    for (const KsHelpChapter& chapter : HelpChapters(*view->Sheet(), *view->GetDocument()))
+        all += chapter.html;
+    for (const ListEntry& entry : HDLists())
+        EXPECT_TRUE(all.contains(entry.section) || entry.section == std::string("WaterList")) << entry.section;
+    for (const char* keyword :
+         {"delta", "Latitude", "MapOutputFiles/data", "BRTools", "MarkTitles", "wind_shear_stress"})
+        EXPECT_TRUE(all.contains(keyword)) << keyword;
+    for (const Rule& rule : HDRules())
+        EXPECT_TRUE(all.contains(rule.code)) << rule.code;
     const QString tables = PageHelpText(true);
     for (const GridKey& key : GridKeys())
         EXPECT_TRUE(tables.contains(key.Text().toHtmlEscaped()));

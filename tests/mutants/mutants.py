@@ -44,7 +44,7 @@ MUTANTS = [
     ('rules', 'rules/mark_order.cpp', 'rising >= often * falling', 'rising > falling'),
     ('rules', 'rules/global_check.cpp', 'order(end) <= order(start)', 'order(end) < order(start)'),
     ('rules', 'rules/output_files.cpp', "std::ranges::replace(name, '\\\\', '/');", ''),
-    ('rules', 'rules/hd_check.cpp', 'm_found.SortFrom(m_before);', ';'),
+    ('rules', 'rules/hd_check.cpp', 'm_found.SortFrom(m_before);', 'm_before = 0;'),
     ('rules', 'rules/value_rules.cpp', 'value - first >= rule.choices', 'value >= rule.choices'),
     ('problems', 'problems/problem_check.cpp', '    m_knowsRiver = false;\n    Restart();', '    Restart();'),
     ('problems', 'problems/problems_model.cpp', 'std::erase(m_checks, check);', ''),

@@ -1,5 +1,7 @@
 #include "ks/fc/frames.h"
 
+#include "ks/fc/help_window.h"
+
 #include "ks/fc/doc_template.h"
 #include "ks/fc/shown_text.h"
 
@@ -193,6 +195,11 @@ void CKsMDIFrameWnd::DestroyWindows()
     for (CKsMDIChildWnd* window : windows)
         delete window;
     m_activeView = nullptr;
+}
+
+std::vector<KsHelpChapter> CKsMDIFrameWnd::HelpChapters() const
+{
+    return {};
 }
 
 void CKsMDIFrameWnd::EnableMenuItem(int position, bool enable)

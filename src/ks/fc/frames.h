@@ -98,6 +98,8 @@ private:
     CString m_hint;
 };
 
+struct KsHelpChapter;
+
 /// The main frame: document windows, menus by position, tool bars by editor. The shell derives from it.
 class KS_API CKsMDIFrameWnd : public QMainWindow, public CKsWindow
 {
@@ -134,6 +136,9 @@ public:
     /// Shows a text in the status bar until another takes its place. The tips of menus and buttons cover it only while
     /// they are looked at.
     void TellStatus(const CString& text);
+
+    /// What the frame itself has to say in the help.
+    virtual std::vector<KsHelpChapter> HelpChapters() const;
 
 signals:
     /// Which commands can be carried out may have changed: another view or another focus.

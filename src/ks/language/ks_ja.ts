@@ -484,6 +484,25 @@ Used instead</source>
     </message>
 </context>
 <context>
+    <name>CKsHelpWindow</name>
+    <message>
+        <source>Help</source>
+        <translation>ヘルプ</translation>
+    </message>
+    <message>
+        <source>Words to look for</source>
+        <translation>検索する語</translation>
+    </message>
+    <message>
+        <source>Chapters</source>
+        <translation>章</translation>
+    </message>
+    <message>
+        <source>Text of the chapter</source>
+        <translation>章の本文</translation>
+    </message>
+</context>
+<context>
     <name>CKsOutsideChange</name>
     <message>
         <source>%1 was changed by another program (%2), and the changes made here are not saved. Reload takes the file; undo brings back what is shown. Keep Both saves what is shown under another name. Overwrite saves it here; the file as it is stays in a copy beside it.</source>

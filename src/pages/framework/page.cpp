@@ -7,7 +7,6 @@
 #include "ks/fc/exchange.h"
 #include "ks/fc/keep_in_sight.h"
 #include "pages/framework/ctrl_edit.h"
-#include "pages/framework/page_help.h"
 
 #include <QAbstractButton>
 #include <QApplication>
@@ -17,7 +16,6 @@
 #include <QKeyEvent>
 #include <QTimer>
 #include <QUndoStack>
-#include <QWhatsThis>
 #include <algorithm>
 #include <cmath>
 
@@ -290,8 +288,8 @@ QString CGenPropertyPage::OverridesText(const QWidget& field) const
 
 void CGenPropertyPage::OnHelp()
 {
-    const QPoint middle(width() / 3, height() / 4);
-    QWhatsThis::showText(mapToGlobal(middle), PageHelpText(!m_grids.empty()), this);
+    if (m_host)
+        m_host->ShowHelp();
 }
 
 void CGenPropertyPage::UndoRedo(bool undo)

@@ -67,7 +67,7 @@ public:
 
     /// How many lines have another value than the global one in a field; empty for another field.
     QString OverridesText(const QWidget& field) const;
-    /// The help command: what the keys do on this page.
+    /// The help command: what the page is about, and what its fields mean.
     virtual void OnHelp();
     /// Whether what changed is edited on this page.
     virtual bool Shows(const ChangePlace& place) const;

@@ -3,11 +3,8 @@
 #include "grid/grid_keys.h"
 #include "res/strings.h"
 
-#include <QFontMetrics>
-#include <QGuiApplication>
 #include <QKeySequence>
 #include <QStringList>
-#include <algorithm>
 #include <utility>
 #include <vector>
 
@@ -42,18 +39,8 @@ QString PageHelpText(bool hasTables)
         if (key.key != Qt::Key_Backtab) // the same as Shift+Tab
             rows.back().second << KeyName(key.key, key.held);
     }
-    // In two columns: a screen is wider than it is high.
-    constexpr int digits = 130;
-    const int width = digits * QFontMetrics(QGuiApplication::font()).horizontalAdvance(u'0');
-    text += QStringLiteral("<p><b>%1</b></p><table width=%2><tr>")
-                .arg(LoadString(Str::HelpTables).toHtmlEscaped())
-                .arg(width);
-    const std::size_t half = (rows.size() + 1) / 2;
-    for (const std::size_t start : {std::size_t(0), half}) {
-        text += QStringLiteral("<td width=50%><table>");
-        for (std::size_t i = start; i < std::min(start + half, rows.size()); ++i)
-            text += Row(rows[i].second.join(QStringLiteral(", ")), rows[i].first);
-        text += QStringLiteral("</table></td>");
-    }
-    return text + QStringLiteral("</tr></table>");
+    text += QStringLiteral("<p><b>%1</b></p><table>").arg(LoadString(Str::HelpTables).toHtmlEscaped());
+    for (const auto& [what, keys] : rows)
+        text += Row(keys.join(QStringLiteral(", ")), what);
+    return text + QStringLiteral("</table>");
 }

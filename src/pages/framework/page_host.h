@@ -25,6 +25,8 @@ public:
     virtual void CurrentLocationChanged() = 0;
     /// Carries out one of the view's commands.
     virtual void Execute(int command) = 0;
+    /// Shows the help on the active page.
+    virtual void ShowHelp() {}
     /// The tables of all pages, each list once.
     virtual std::vector<HostTable> TablesOfDocument() { return {}; }
     /// Branch names of the project's network; empty outside a project.

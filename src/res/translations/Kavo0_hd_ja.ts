@@ -940,6 +940,65 @@
     </message>
 </context>
 <context>
+    <name>HelpTexts</name>
+    <message>
+        <source>on</source>
+        <translation>オン</translation>
+    </message>
+    <message>
+        <source>off</source>
+        <translation>オフ</translation>
+    </message>
+    <message>
+        <source>now</source>
+        <translation>現在の日時</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>項目</translation>
+    </message>
+    <message>
+        <source>Meaning</source>
+        <translation>意味</translation>
+    </message>
+    <message>
+        <source>Unit</source>
+        <translation>単位</translation>
+    </message>
+    <message>
+        <source>Range</source>
+        <translation>範囲</translation>
+    </message>
+    <message>
+        <source>Default</source>
+        <translation>既定値</translation>
+    </message>
+    <message>
+        <source>In the file</source>
+        <translation>ファイルでの名前</translation>
+    </message>
+    <message>
+        <source>Values of the whole file</source>
+        <translation>ファイル全体の値</translation>
+    </message>
+    <message>
+        <source>Keys of fields and tables</source>
+        <translation>入力欄と表のキー</translation>
+    </message>
+    <message>
+        <source>Problems and their codes</source>
+        <translation>問題とコード</translation>
+    </message>
+    <message>
+        <source>Columns of the values at locations</source>
+        <translation>地点別の値の列</translation>
+    </message>
+    <message>
+        <source>Columns of a further table</source>
+        <translation>その他の表の列</translation>
+    </message>
+</context>
+<context>
     <name>Kavo0_hd</name>
     <message>
         <source>R1</source>

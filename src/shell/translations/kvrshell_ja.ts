@@ -625,14 +625,6 @@ To have one of them in %1, close its window and open it from the list of %1.</so
         <translation>%1 のバージョン情報</translation>
     </message>
     <message>
-        <source>%1, version %2
-
-Shell of the river model editors.</source>
-        <translation>%1 バージョン %2
-
-河川モデルエディタのシェルです。</translation>
-    </message>
-    <message>
         <source>Plug-ins</source>
         <translation>プラグイン</translation>
     </message>
@@ -651,6 +643,30 @@ Shell of the river model editors.</source>
     <message>
         <source>In use</source>
         <translation>使用中</translation>
+    </message>
+    <message>
+        <source>%1, version %2</source>
+        <translation>%1、バージョン %2</translation>
+    </message>
+    <message>
+        <source>Shell of the river model editors.</source>
+        <translation>河川モデルのエディタのシェル。</translation>
+    </message>
+    <message>
+        <source>Free software under the GNU General Public License, version 3 or later (GPL-3.0-or-later).</source>
+        <translation>GNU General Public License バージョン3以降 (GPL-3.0-or-later) で提供されるフリーソフトウェアです。</translation>
+    </message>
+    <message>
+        <source>It uses %1.</source>
+        <translation>使用しているソフトウェア: %1</translation>
+    </message>
+    <message>
+        <source>Keys of the menus</source>
+        <translation>メニューのキー</translation>
+    </message>
+    <message>
+        <source>About the program</source>
+        <translation>プログラムについて</translation>
     </message>
 </context>
 <context>
