@@ -73,11 +73,9 @@ void CKavo0_hdView::ToggleProblems()
     if (!frame)
         return;
     auto& dock = KsDockIn<CProblemsDock>(*frame);
-    dock.Want(!dock.isVisible());
-    if (dock.isVisible()) {
-        dock.raise();
+    dock.Toggle();
+    if (dock.isVisible())
         dock.Panel().TakeFocus();
-    }
 }
 
 void CKavo0_hdView::NextProblem(bool forward)
@@ -86,7 +84,7 @@ void CKavo0_hdView::NextProblem(bool forward)
     if (!frame)
         return;
     auto& dock = KsDockIn<CProblemsDock>(*frame);
-    if (!dock.isVisible())
+    if (!dock.IsInSight())
         dock.Want(true);
     dock.Panel().Step(forward);
 }

@@ -41,9 +41,9 @@ void CKavo0_hdView::ToggleProfile()
     if (!frame)
         return;
     auto& dock = KsDockIn<CProfileDock>(*frame);
-    dock.Want(!dock.isVisible());
+    dock.Toggle();
     ShowProfile();
-    if (dock.isVisible())
+    if (CKsDock::IsWanted(CProfileDock::Name))
         dock.raise();
 }
 

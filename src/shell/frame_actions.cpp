@@ -38,6 +38,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {ViewMenu, "actionUnits", QT_TR_NOOP("&Units"), QT_TR_NOOP("Units in which values are shown; files are not affected")},
         {ViewMenu, "actionAllDigits", QT_TR_NOOP("All &Digits"), QT_TR_NOOP("Shows every digit of the numbers in tables and fields"), [](F&) { KsUnits::Instance().SetAllDigits(!KsUnits::Instance().AllDigits()); }},
         {ViewMenu, "actionLanguage", QT_TR_NOOP("&Language"), QT_TR_NOOP("Language of the program")},
+        {ViewMenu, "actionAppearance", QT_TR_NOOP("&Appearance"), QT_TR_NOOP("Light or dark windows")},
         {ViewMenu, "actionToolBars", QT_TR_NOOP("&Tool Bars"), QT_TR_NOOP("Shows or hides tool bars")},
         {ViewMenu, "actionLongProfile", QT_TR_NOOP("Long Pro&file"), QT_TR_NOOP("Shows or hides levels and values along the branch"), [](F& f) { f.SendToNearest(KsCommand::LongProfile); }, K::UnknownKey, nullptr, false, "F9"},
         {ViewMenu, "actionProblems", QT_TR_NOOP("P&roblems"), QT_TR_NOOP("Shows or hides the list of what is wrong in the open documents"), [](F& f) { f.SendToNearest(KsCommand::Problems); }, K::UnknownKey, nullptr, false, "Shift+F8"},

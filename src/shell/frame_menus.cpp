@@ -3,6 +3,7 @@
 #include "ks/fc/shown_text.h"
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
+#include "shell/appearance.h"
 #include "shell/frame_actions.h"
 #include "shell/main_frame.h"
 #include "shell/recent_files.h"
@@ -30,6 +31,7 @@ CFrameMenus::CFrameMenus(CMainFrame& frame) : m_frame(frame), m_standardBar(fram
     CreateMenus();
     CreateUnits();
     CreateLanguages();
+    CreateAppearances();
     m_lines =
         new CViewMenu(m_frame, *m_menus[LinesMenu], &CCommandTarget::LinesMenu, CViewMenu::Keys::OfMenu, nullptr, this);
     const auto edit = m_menus[EditMenu]->actions();
@@ -142,6 +144,15 @@ void CFrameMenus::CreateLanguages()
                   [code] { KsLanguage::Instance().SetCurrent(code); });
 }
 
+void CFrameMenus::CreateAppearances()
+{
+    QMenu* menu = AddSubMenu("actionAppearance");
+    for (const auto& [name, appearance] :
+         {std::pair("actionAppearanceSystem", Appearance::System), std::pair("actionAppearanceLight", Appearance::Light),
+          std::pair("actionAppearanceDark", Appearance::Dark)})
+        AddChoice(menu, QString::fromLatin1(name), {}, [appearance = appearance] { ChooseAppearance(appearance); });
+}
+
 void CFrameMenus::Retranslate()
 {
     for (std::size_t position = 0; position < MenuCount; ++position)
@@ -157,6 +168,9 @@ void CFrameMenus::Retranslate()
     }
     Action("actionMetric")->setText(tr("&Metric"));
     Action("actionUsCustomary")->setText(tr("&US Customary"));
+    Action("actionAppearanceSystem")->setText(tr("As the &Desktop"));
+    Action("actionAppearanceLight")->setText(tr("&Light"));
+    Action("actionAppearanceDark")->setText(tr("Dar&k"));
     m_standardBar->setWindowTitle(tr("Standard"));
     UpdateUndo();
     m_lines->Fill();
@@ -184,6 +198,8 @@ void CFrameMenus::Update()
     Action("actionAllDigits")->setChecked(KsUnits::Instance().AllDigits());
     const bool usCustomary = KsUnits::Instance().System() == KsUnitSystem::UsCustomary;
     Action(usCustomary ? "actionUsCustomary" : "actionMetric")->setChecked(true);
+    constexpr const char* appearances[] = {"actionAppearanceSystem", "actionAppearanceLight", "actionAppearanceDark"};
+    Action(appearances[std::size_t(ChosenAppearance())])->setChecked(true);
     m_actions.at(QStringLiteral("actionLanguage_") + KsLanguage::Instance().Current())->setChecked(true);
     Action("actionFindField")->setEnabled(m_frame.HasCommand(KsCommand::FindField));
     Action("actionLongProfile")->setEnabled(m_frame.HasCommand(KsCommand::LongProfile));

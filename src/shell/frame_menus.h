@@ -39,6 +39,7 @@ private:
     void AddChoice(QMenu* menu, const QString& name, const QString& text, std::function<void()> run);
     void CreateUnits();
     void CreateLanguages();
+    void CreateAppearances();
     void FillRecent();
     void FillWindows();
     void UpdateEdit();

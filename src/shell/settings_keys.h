@@ -12,5 +12,6 @@ inline constexpr char OneProgram[] = "files/oneProgram";
 inline constexpr char UsCustomary[] = "units/usCustomary";
 inline constexpr char AllDigits[] = "numbers/allDigits";
 inline constexpr char Language[] = "language";
+inline constexpr char Appearance[] = "window/appearance";
 inline constexpr char TriedLibraries[] = "plugins/tried";
 } // namespace Settings

@@ -2,6 +2,7 @@
 
 #include "files/platform_process.h"
 #include "ks/language/language.h"
+#include "shell/appearance.h"
 #include "shell/application.h"
 #include "shell/handover.h"
 #include "shell/main_frame.h"
@@ -68,6 +69,7 @@ int ShellMain(int argc, char** argv, std::function<void(CMainFrame&)> onStarted)
     if (!isSeparate && QSettings().value(Settings::OneProgram, true).toBool() && CHandover::Give(files))
         return 0;
 
+    ApplyChosenAppearance();
     CMainFrame frame;
     frame.LoadPlugins(parser.value(plugins));
     frame.show();

@@ -1,5 +1,6 @@
 #include "ks/language/language.h"
 #include "ks/units/edit_style.h"
+#include "shell/appearance.h"
 #include "shell/settings_keys.h"
 #include "shell_fixture.h"
 
@@ -48,4 +49,21 @@ TEST_F(ShellTest, MenusFollowTheLanguageAtOnce)
     Action("actionLanguage_en_US")->trigger();
     QCoreApplication::processEvents();
     EXPECT_EQ(Action("actionSave")->text(), "&Save");
+}
+
+TEST_F(ShellTest, TheAppearanceIsChosenAndKept)
+{
+    const auto window = [] { return QApplication::palette().color(QPalette::Window).lightness(); };
+    const auto text = [] { return QApplication::palette().color(QPalette::Text).lightness(); };
+    const int before = window();
+    Action("actionAppearanceDark")->trigger();
+    EXPECT_LT(window(), 80);
+    EXPECT_GT(text(), 180);
+    EXPECT_EQ(ChosenAppearance(), Appearance::Dark);
+    Action("actionAppearanceLight")->trigger();
+    EXPECT_GT(window(), 200);
+    EXPECT_LT(text(), 80);
+    Action("actionAppearanceSystem")->trigger();
+    EXPECT_EQ(window(), before);
+    EXPECT_EQ(ChosenAppearance(), Appearance::System);
 }

@@ -4,6 +4,8 @@
 
 #include <QCloseEvent>
 #include <QSettings>
+#include <QTimer>
+#include <algorithm>
 
 namespace {
 
@@ -19,10 +21,18 @@ CKsDock::CKsDock(CKsMDIFrameWnd& frame, const QString& name, QWidget* content, i
     setObjectName(name);
     content->setParent(this);
     setWidget(content);
-    if (!frame.restoreDockWidget(this)) // where the user had it
+    if (!frame.restoreDockWidget(this)) { // where the user had it
         frame.addDockWidget(Qt::BottomDockWidgetArea, this);
-    if (!isFloating() && height() < firstHeight)
-        frame.resizeDocks({this}, {firstHeight}, Qt::Vertical);
+        for (auto* other : frame.findChildren<CKsDock*>(Qt::FindDirectChildrenOnly))
+            if (other != this && frame.dockWidgetArea(other) == Qt::BottomDockWidgetArea)
+                frame.tabifyDockWidget(other, this);
+    }
+    // Once it has its place: before, the frame does not know how high it is.
+    QTimer::singleShot(0, this, [this, &frame, firstHeight] {
+        const int wanted = std::min(firstHeight, frame.height() * 3 / 10); // the documents keep most of the room
+        if (!isFloating() && height() < wanted)
+            frame.resizeDocks({this}, {wanted}, Qt::Vertical);
+    });
 }
 
 bool CKsDock::IsWanted(const QString& name)
@@ -34,6 +44,8 @@ void CKsDock::Want(bool shown)
 {
     QSettings().setValue(WantedKey(objectName()), shown);
     setVisible(shown);
+    if (shown)
+        raise();
 }
 
 void CKsDock::changeEvent(QEvent* event)

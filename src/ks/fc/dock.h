@@ -15,10 +15,14 @@ public:
     static bool IsWanted(const QString& name);
     /// Shows it, or hides it: as the user wants it from now on.
     void Want(bool shown);
+    /// Hides it when it is in sight, otherwise brings it there.
+    void Toggle() { Want(!IsInSight()); }
+    /// Not hidden, and not behind another one.
+    bool IsInSight() const { return isVisible() && !visibleRegion().isEmpty(); }
 
 protected:
-    /// In the frame, where the user had it; otherwise at the bottom, and at first so high (pixels). Takes the content
-    /// over. The name is that of the window and of its settings.
+    /// In the frame, where the user had it; otherwise at the bottom, in one place with others, and at first so high
+    /// (pixels). Takes the content over. The name is that of the window and of its settings.
     CKsDock(CKsMDIFrameWnd& frame, const QString& name, QWidget* content, int firstHeight);
     /// Its title in the user's language.
     virtual void Retranslate() = 0;

@@ -13,6 +13,36 @@ void Refuse(QLineEdit& edit, const CString& message)
     edit.selectAll();
 }
 
+/// Gives a field's hint the color of its text, but paler, whatever colors the program has.
+class HintColor : public QObject
+{
+public:
+    explicit HintColor(QLineEdit& field) : QObject(&field), m_field(field)
+    {
+        field.installEventFilter(this);
+        Apply();
+    }
+    bool eventFilter(QObject*, QEvent* event) override
+    {
+        if (event->type() == QEvent::PaletteChange || event->type() == QEvent::StyleChange)
+            Apply();
+        return false;
+    }
+
+private:
+    void Apply()
+    {
+        QPalette colors = m_field.palette();
+        QColor color = colors.color(QPalette::Text);
+        color.setAlphaF(0.6F);
+        if (colors.color(QPalette::PlaceholderText) == color)
+            return;
+        colors.setColor(QPalette::PlaceholderText, color);
+        m_field.setPalette(colors);
+    }
+    QLineEdit& m_field;
+};
+
 } // namespace
 
 QSize KsNumberFieldSize(const QLineEdit& field)
@@ -24,11 +54,9 @@ QSize KsNumberFieldSize(const QLineEdit& field)
 
 void KsShowHint(QLineEdit& field, const QString& hint)
 {
-    QPalette colors = field.palette();
-    QColor color = colors.color(QPalette::Text);
-    color.setAlphaF(0.6F);
-    colors.setColor(QPalette::PlaceholderText, color);
-    field.setPalette(colors);
+    const auto isColor = [](const QObject* child) { return dynamic_cast<const HintColor*>(child); };
+    if (std::ranges::none_of(field.children(), isColor))
+        new HintColor(field);
     field.setPlaceholderText(hint);
 }
 

@@ -319,6 +319,14 @@ The editors read %2.</source>
         <source>Leads to the next problem of the list</source>
         <translation>一覧の次の問題に移動します</translation>
     </message>
+    <message>
+        <source>&amp;Appearance</source>
+        <translation>外観(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Light or dark windows</source>
+        <translation>明るい画面または暗い画面</translation>
+    </message>
 </context>
 <context>
     <name>CFrameMenus</name>
@@ -369,6 +377,18 @@ The editors read %2.</source>
     <message>
         <source>&amp;Clear List</source>
         <translation>一覧を消去(&amp;C)</translation>
+    </message>
+    <message>
+        <source>As the &amp;Desktop</source>
+        <translation>デスクトップに合わせる(&amp;D)</translation>
+    </message>
+    <message>
+        <source>&amp;Light</source>
+        <translation>明るい(&amp;L)</translation>
+    </message>
+    <message>
+        <source>Dar&amp;k</source>
+        <translation>暗い(&amp;K)</translation>
     </message>
 </context>
 <context>
