@@ -6,7 +6,6 @@
 #include <algorithm>
 #include <charconv>
 #include <cmath>
-#include <cstdio>
 #include <iterator>
 #include <limits>
 
@@ -17,13 +16,6 @@ std::string Shortest(T value)
 {
     char buffer[32];
     return {buffer, std::to_chars(buffer, buffer + sizeof buffer, value).ptr};
-}
-
-std::string DateText(const HDDateTime& d)
-{
-    char text[80];
-    std::snprintf(text, sizeof text, "%d-%02d-%02d %02d:%02d:%02d", d.Year, d.Month, d.Day, d.Hour, d.Minute, d.Second);
-    return text;
 }
 
 std::string JsonElement(FieldList fields, const void* element)

@@ -7,16 +7,12 @@
 void PrintFindings(std::ostream& stream, const std::string& path, const FileCheck& check)
 {
     const std::string file = Printable(path);
-    std::vector<std::size_t> listed(check.counts.size());
     std::vector<const FileFinding*> last(check.counts.size());
     for (const FileFinding& finding : check.findings) {
-        const std::size_t number = std::size_t(finding.rule);
-        if (++listed[number] > CProblems::MostOfARule)
-            continue;
         const Rule& rule = RuleOf(finding.rule);
         stream << file << ':' << finding.line << ':' << finding.column << ": " << SeverityName(rule.severity) << ' '
                << rule.code << ": " << Printable(finding.text) << '\n';
-        last[number] = &finding;
+        last[std::size_t(finding.rule)] = &finding;
     }
     for (const Rule& rule : HDRules()) {
         const std::size_t number = std::size_t(rule.id), most = CProblems::MostOfARule;

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <bit>
 #include <charconv>
+#include <cstdio>
 
 namespace {
 
@@ -77,6 +78,14 @@ std::string ParamsText(FieldList fields, const void* object)
     std::string text(tqlGetText(structure.Get()));
     text.erase(0, text.find(mark) + mark.size());
     return text.substr(0, text.find('\n'));
+}
+
+std::string DateText(const HDDateTime& date)
+{
+    char text[80];
+    std::snprintf(text, sizeof text, "%d-%02d-%02d %02d:%02d:%02d", date.Year, date.Month, date.Day, date.Hour,
+                  date.Minute, date.Second);
+    return text;
 }
 
 std::string BoundsWords(const Bounds& bounds)

@@ -59,6 +59,9 @@ std::string ParamsText(FieldList fields, const void* object);
 /// Appends the object's parameters to the keyword being written.
 void WriteFields(tqlHandle structure, FieldList fields, const void* object);
 
+/// "2024-02-29 23:59:00"; whatever the six integers are, a date or not.
+std::string DateText(const HDDateTime& date);
+
 /// "0.5 to 1", "at least 0", "at most 1", in base units; empty without bounds.
 std::string BoundsWords(const Bounds& bounds);
 

@@ -25,12 +25,6 @@
 
 namespace {
 
-/// A title as one reads it: without the mark of a key to press.
-QString Plain(const QString& title)
-{
-    return QString::fromStdString(PlainText(title.toStdString()));
-}
-
 class CFieldIndex
 {
 public:
@@ -39,7 +33,7 @@ public:
     std::vector<FoundField> Make()
     {
         for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
-            Add({.tab = tab, .title = Plain(m_sheet.tabText(tab))}, NamesOf(m_sheet.CaptionOf(tab)),
+            Add({.tab = tab, .title = PlainTitle(m_sheet.tabText(tab))}, NamesOf(m_sheet.CaptionOf(tab)),
                 TextsOn(*m_sheet.PageAt(tab)));
         for (const DeclaredSection& section : HDGlobals().Sections())
             for (const DeclaredKeyword& keyword : section.keywords)
@@ -64,24 +58,16 @@ private:
         const CGenList* list = nullptr;
     };
 
-    int TabOf(const ChangePlace& place) const
-    {
-        int tab = 0;
-        while (tab < m_sheet.PageCount() && !m_sheet.PageAt(tab)->Shows(place))
-            ++tab;
-        return tab;
-    }
-
     /// What stands on a page, in the user's language.
     static QString TextsOn(const QWidget& page)
     {
         QStringList texts;
         for (const auto* label : page.findChildren<QLabel*>())
-            texts << Plain(label->text());
+            texts << PlainTitle(label->text());
         for (const auto* button : page.findChildren<QAbstractButton*>())
-            texts << Plain(button->text());
+            texts << PlainTitle(button->text());
         for (const auto* group : page.findChildren<QGroupBox*>())
-            texts << Plain(group->title());
+            texts << PlainTitle(group->title());
         return texts.join(u'\n');
     }
 
@@ -90,14 +76,14 @@ private:
     {
         QStringList names;
         for (const QString& text : line ? InAllLanguages(line) : QStringList())
-            names << Plain(text);
+            names << PlainTitle(text);
         return names;
     }
 
     /// `further` is what it can be looked for by, too.
     void Add(FoundField field, QStringList names, const QString& further = {})
     {
-        field.page = Plain(m_sheet.tabText(field.tab));
+        field.page = PlainTitle(m_sheet.tabText(field.tab));
         names << field.title << field.keyword;
         names.removeAll(QString());
         names.removeDuplicates();
@@ -110,13 +96,13 @@ private:
     void AddGlobal(const DeclaredKeyword& keyword, const Field& field)
     {
         const ChangePlace place{field.constAddress(&m_document.Parameters().Global)};
-        const int tab = TabOf(place);
-        if (tab == m_sheet.PageCount())
+        const int tab = m_sheet.TabWith(place);
+        if (tab < 0)
             return; // no page edits it
         const QString name = QString::fromUtf8(field.name);
         QString title = name;
         if (field.title)
-            title = Plain(LoadLine(field.title.text, field.title.line));
+            title = PlainTitle(LoadLine(field.title.text, field.title.line));
         else if (field.choices)
             title = Choices(LoadLine(field.choices.text, field.choices.line)).join(QStringLiteral(" / "));
         QStringList names = NamesOf(field.title) << name;
@@ -129,18 +115,18 @@ private:
     {
         QStringList choices;
         for (const QString& line : lines.split(u'\n'))
-            choices << Plain(line);
+            choices << PlainTitle(line);
         return choices;
     }
 
     void AddList(const char* section, CGenList& list)
     {
         const ChangePlace place{&list, 0, 0, &list};
-        const int tab = TabOf(place);
-        if (tab == m_sheet.PageCount())
+        const int tab = m_sheet.TabWith(place);
+        if (tab < 0)
             return;
         const QString keyword = QString::fromUtf8(section);
-        Add({.tab = tab, .place = place, .title = Plain(m_sheet.tabText(tab)), .keyword = keyword}, {});
+        Add({.tab = tab, .place = place, .title = PlainTitle(m_sheet.tabText(tab)), .keyword = keyword}, {});
         if (const CGenGrid* grid = m_sheet.PageAt(tab)->GetGrid())
             m_lists.emplace(grid, ListOf{keyword, &list});
     }
@@ -158,7 +144,7 @@ private:
             const bool isPlace = list.list && spec.namesLine && tab != m_sheet.currentIndex() && HasUsualName(spec);
             if (isPlace || spec.Kind() == CellKind::Button || spec.header().isEmpty())
                 continue;
-            FoundField field{.tab = tab, .title = Plain(spec.header()).simplified(), .keyword = list.keyword};
+            FoundField field{.tab = tab, .title = PlainTitle(spec.header()).simplified(), .keyword = list.keyword};
             if (rows) // without, there is no line yet that would have the table
                 field.place = {rows->Data(), 1, int(column) + 1, rows->List() ? rows->List() : rows->Data()};
             QStringList choices = spec.choices.entries ? spec.choices.entries() : QStringList();
@@ -198,7 +184,7 @@ private:
         for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
             for (auto* group : m_sheet.PageAt(tab)->findChildren<QGroupBox*>())
                 if (QWidget* first = FirstIn(*group); first && !group->title().isEmpty() && count[group->title()] == 1)
-                    Add({.tab = tab, .title = Plain(group->title()), .control = first}, {});
+                    Add({.tab = tab, .title = PlainTitle(group->title()), .control = first}, {});
     }
 
     static QWidget* FirstIn(QGroupBox& group)

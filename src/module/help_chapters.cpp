@@ -1,7 +1,6 @@
 #include "module/help_chapters.h"
 
 #include "document/document.h"
-#include "files/field_io.h"
 #include "grid/bounds.h"
 #include "module/sheet.h"
 #include "pages/framework/page.h"
@@ -19,14 +18,9 @@ struct HelpTexts
     Q_DECLARE_TR_FUNCTIONS(HelpTexts)
 };
 
-QString Plain(const QString& title)
-{
-    return QString::fromStdString(PlainText(title.toStdString()));
-}
-
 QString TextOf(const TextLine& line)
 {
-    return line ? Plain(LoadLine(line.text, line.line)) : QString();
+    return line ? PlainTitle(LoadLine(line.text, line.line)) : QString();
 }
 
 /// One entry of an integer's choices, or all of them.
@@ -35,7 +29,7 @@ QStringList ChoicesOf(const Field& field)
     QStringList choices;
     for (const QString& line :
          field.choices ? LoadLine(field.choices.text, field.choices.line).split(u'\n') : QStringList())
-        choices << Plain(line);
+        choices << PlainTitle(line);
     return choices;
 }
 
@@ -116,26 +110,18 @@ public:
         AddLists();
         std::vector<KsHelpChapter> chapters;
         for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
-            chapters.push_back({ChapterOf(tab), Plain(m_sheet.tabText(tab)), m_pages[tab].Html() + Links()});
+            chapters.push_back({ChapterOf(tab), PlainTitle(m_sheet.tabText(tab)), m_pages[tab].Html() + Links()});
         chapters.push_back({QStringLiteral("keys"), HelpTexts::tr("Keys of fields and tables"), PageHelpText(true)});
         chapters.push_back({QStringLiteral("problems"), HelpTexts::tr("Problems and their codes"), Problems()});
         return chapters;
     }
 
 private:
-    int TabOf(const ChangePlace& place) const
-    {
-        for (int tab = 0; tab < m_sheet.PageCount(); ++tab)
-            if (m_sheet.PageAt(tab)->Shows(place))
-                return tab;
-        return -1;
-    }
-
     void AddGlobals(const DeclaredSection& section)
     {
         for (const DeclaredKeyword& keyword : section.keywords)
             for (const Field& field : keyword.Fields()) {
-                const int tab = TabOf({field.constAddress(&m_document.Parameters().Global)});
+                const int tab = m_sheet.TabWith({field.constAddress(&m_document.Parameters().Global)});
                 const QString name = QString::fromUtf8(section.name) + u'/' + QString::fromUtf8(keyword.name);
                 if (tab >= 0 && field.group)
                     m_tables[tab].push_back([&field, name](Chapter& chapter) {
@@ -166,7 +152,8 @@ private:
         for (const ListEntry& entry : HDLists()) {
             CListSection& section = entry.list(m_document.Parameters());
             const void* const list = section.ListCount() > 0 ? &section.ListAt(0) : nullptr;
-            const int tab = list ? TabOf({list, 0, 0, list}) : TabOf({&m_document.Parameters().Global.Max_no_iter});
+            const int tab = list ? m_sheet.TabWith({list, 0, 0, list})
+                                 : m_sheet.TabWith({&m_document.Parameters().Global.Max_no_iter});
             if (tab >= 0)
                 AddList(m_pages[tab], entry.list(fresh).ListAt(0), QString::fromUtf8(entry.section));
         }

@@ -8,10 +8,6 @@
 
 #include <algorithm>
 
-namespace {
-
-/// The column that shows a field, counted from 1, or, of several for the elements of a group, that of the element; 0
-/// for none.
 int ColumnOf(const CGenGrid& grid, const ProblemPlace& place)
 {
     std::size_t before = place.element == ProblemPlace::None ? 0 : place.element;
@@ -22,6 +18,8 @@ int ColumnOf(const CGenGrid& grid, const ProblemPlace& place)
             return int(column) + 1;
     return 0;
 }
+
+namespace {
 
 /// The group of an object whose elements have the field; null for one of the object's own.
 const Field* GroupOf(FieldList fields, const Field* field)
@@ -58,9 +56,7 @@ CProblemPlaces::Shown CProblemPlaces::Find(const ChangePlace& place)
     if (!isNew)
         return known->second;
     Shown& shown = known->second;
-    for (int tab = 0; shown.tab < 0 && tab < m_sheet.PageCount(); ++tab)
-        if (m_sheet.PageAt(tab)->Shows(place))
-            shown.tab = tab;
+    shown.tab = m_sheet.TabWith(place);
     if (shown.tab >= 0)
         for (CGenGrid* grid : m_sheet.PageAt(shown.tab)->findChildren<CGenGrid*>())
             if (const auto& rows = grid->Model()->Rows(); rows && rows->Data() == data)
@@ -132,8 +128,7 @@ QString CProblemPlaces::FieldText(const ProblemPlace& place, const ChangePlace& 
     if (table && shown.column > 0 && !shown.listRow)
         return table->Model()->Column(shown.column - 1).header().simplified();
     if (place.field->title)
-        return QString::fromStdString(
-            PlainText(LoadLine(place.field->title.text, place.field->title.line).toStdString()));
+        return PlainTitle(LoadLine(place.field->title.text, place.field->title.line));
     return QString::fromUtf8(place.field->name);
 }
 
@@ -143,7 +138,7 @@ ProblemWhere CProblemPlaces::WhereIs(const ProblemPlace& place)
     const Shown shown = Find(on);
     ProblemWhere where{.tab = shown.tab};
     if (where.tab >= 0)
-        where.page = QString::fromStdString(PlainText(m_sheet.tabText(where.tab).toStdString()));
+        where.page = PlainTitle(m_sheet.tabText(where.tab));
     else
         where.page = QString::fromUtf8(place.section); // as the file has it
     if (const int line = on.listRow ? on.listRow : on.row; line > 0)

@@ -11,6 +11,10 @@ class CGenGrid;
 class CGenParamListBase;
 class CKavo0_hdDoc;
 
+/// The column that shows the field of a place, counted from 1, or, of several for the elements of a group, that of the
+/// element; 0 for none.
+int ColumnOf(const CGenGrid& grid, const ProblemPlace& place);
+
 class CProblemPlaces
 {
 public:

@@ -170,6 +170,14 @@ void CDlgPropertySheet::AddPage(Str caption, MakePage make)
         m_active = 0;
 }
 
+int CDlgPropertySheet::TabWith(const ChangePlace& place)
+{
+    for (int tab = 0; tab < count(); ++tab)
+        if (PageAt(tab)->Shows(place))
+            return tab;
+    return -1;
+}
+
 void CDlgPropertySheet::SetNote(int tab, const QIcon& icon, const QString& text)
 {
     if (icon.isNull() && tabIcon(tab).isNull())

@@ -8,6 +8,7 @@
 #include <vector>
 
 class CGenPropertyPage;
+struct ChangePlace;
 
 class CDlgPropertySheet : public QTabWidget
 {
@@ -27,6 +28,8 @@ public:
     int PageCount() const { return count(); }
     /// What is to be known about a page beforehand: an icon on its tab, and a text. Neither when there is nothing.
     void SetNote(int tab, const QIcon& icon, const QString& text);
+    /// The tab of the first page that shows a place, made if need be; -1 for none.
+    int TabWith(const ChangePlace& place);
     Str CaptionOf(int tab) const { return m_tabs[std::size_t(tab)].caption; }
     /// Switches to a tab: the active page is asked, and only then anything changes. False when it refuses to be left.
     bool SetActivePage(int tab);

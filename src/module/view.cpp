@@ -300,11 +300,9 @@ void CKavo0_hdView::FindField()
 
 void CKavo0_hdView::RevealChange(const ChangePlace& place)
 {
-    int tab = m_sheet->currentIndex();
-    if (!ActivePage() || !ActivePage()->Shows(place))
-        for (tab = 0; tab < m_sheet->PageCount() && !m_sheet->PageAt(tab)->Shows(place);)
-            ++tab;
-    if (tab == m_sheet->PageCount() || !m_sheet->SetActivePage(tab))
+    const bool isInFront = ActivePage() && ActivePage()->Shows(place);
+    const int tab = isInFront ? m_sheet->currentIndex() : m_sheet->TabWith(place);
+    if (tab < 0 || !m_sheet->SetActivePage(tab))
         return;
     m_sheet->PageAt(tab)->Reveal(place, IsActive()); // a window in the background stays there
 }

@@ -1,7 +1,6 @@
 // The view and the problems of its document: where they are, what mends them, and where they are marked.
 #include "module/view.h"
 
-#include "files/branch_key.h"
 #include "grid/cell_commands.h"
 #include "grid/gen_grid.h"
 #include "ks/fc/exchange.h"
@@ -23,17 +22,10 @@
 
 namespace {
 
-/// The number of the column of a field, from 0; -1 for none.
-int ColumnOf(const CGenGrid& grid, std::string_view name)
+void SwapEnds(CGenGrid& grid, int row, const Field* endField)
 {
-    const auto& columns = grid.Model()->Columns();
-    const auto found = std::ranges::find(columns, name, &ColumnSpec::name);
-    return found == columns.end() ? -1 : int(found - columns.begin());
-}
-
-void SwapEnds(CGenGrid& grid, int row, std::string_view endField)
-{
-    const int start = ColumnOf(grid, LocationFields()[1].name), end = ColumnOf(grid, endField);
+    const int start = ColumnOf(grid, {.field = &LocationFields()[1]}) - 1,
+              end = ColumnOf(grid, {.field = endField}) - 1;
     if (start < 0 || end < 0)
         return;
     const CGridModel& model = *grid.Model();
@@ -196,6 +188,8 @@ void CKavo0_hdView::ShowFileProblems()
 
 void CKavo0_hdView::Mend(const Problem& problem)
 {
+    if (!m_problems->IsCurrent()) // the line may be another one by now
+        return;
     CGenGrid* const grid = CProblemPlaces(*m_sheet, *GetDocument()).TableOf(problem.place);
     ShowProblem(problem.place);
     if (!grid || !MayLeave(KsLeave::Field) || !grid->MayChange())
@@ -208,7 +202,7 @@ void CKavo0_hdView::Mend(const Problem& problem)
     if (row < 0)
         return;
     if (RemedyOf(problem.rule) == Remedy::SwapEnds)
-        return SwapEnds(*grid, row, problem.place.field->name);
+        return SwapEnds(*grid, row, problem.place.field);
     model.RemoveRows(row, 1);
     if (grid->Host())
         grid->Host()->LineEdited(*grid);

@@ -1,8 +1,11 @@
 #include "problems/problem_check.h"
 
+#include "ks/language/language.h"
+#include "ks/units/edit_style.h"
 #include "rules/hd_check.h"
 
 #include <QElapsedTimer>
+#include <new>
 
 namespace {
 constexpr int Pause = 250;          // ms without a change before a check begins
@@ -16,6 +19,9 @@ CProblemCheck::CProblemCheck(IProblemHost& host, QObject* parent)
     m_pause.setSingleShot(true);
     m_pause.setInterval(Pause);
     connect(&m_pause, &QTimer::timeout, this, &CProblemCheck::Begin);
+    // The words of what was found are others.
+    connect(&KsUnits::Instance(), &KsUnits::Changed, this, &CProblemCheck::Changed);
+    connect(&KsLanguage::Instance(), &KsLanguage::Changed, this, &CProblemCheck::Changed, Qt::QueuedConnection);
     connect(&m_slice, &QTimer::timeout, this, &CProblemCheck::GoOn); // whenever there is nothing else to do
 }
 
@@ -35,6 +41,7 @@ std::size_t CProblemCheck::Count(Severity severity) const
 
 void CProblemCheck::Restart()
 {
+    m_isCurrent = false;
     m_slice.stop();
     m_check.reset();
     m_pause.start();
@@ -46,21 +53,38 @@ void CProblemCheck::RiverChanged()
     Restart();
 }
 
+/// Where there is no memory for a check, the list stays as it is until the next change: nobody asked for it now.
+template <typename Work>
+void CProblemCheck::Try(const Work& work)
+{
+    try {
+        work();
+    } catch (const std::bad_alloc&) {
+        m_slice.stop();
+        m_check.reset();
+    }
+}
+
 void CProblemCheck::Begin()
 {
-    if (!m_knowsRiver)
-        m_river = m_host.CheckedRiver();
-    m_knowsRiver = true;
-    m_check = std::make_unique<CHDCheck>(m_host.CheckedParameters(), m_river.get(), m_host.CheckedPath().toStdString());
-    m_slice.start();
+    Try([this] {
+        if (!m_knowsRiver)
+            m_river = m_host.CheckedRiver();
+        m_knowsRiver = true;
+        m_check =
+            std::make_unique<CHDCheck>(m_host.CheckedParameters(), m_river.get(), m_host.CheckedPath().toStdString());
+        m_slice.start();
+    });
 }
 
 void CProblemCheck::GoOn()
 {
-    QElapsedTimer time;
-    for (time.start(); time.elapsed() < Slice;)
-        if (!m_check->Step(Lines))
-            return Finish();
+    Try([this] {
+        QElapsedTimer time;
+        for (time.start(); time.elapsed() < Slice;)
+            if (!m_check->Step(Lines))
+                return Finish();
+    });
 }
 
 void CProblemCheck::Finish()
@@ -73,5 +97,6 @@ void CProblemCheck::Finish()
     for (const FileProblem& problem : m_ofFile)
         ++m_counts[std::size_t(problem.rule)];
     m_check.reset();
+    m_isCurrent = true;
     emit Changed();
 }

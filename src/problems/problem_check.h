@@ -21,6 +21,8 @@ public:
     /// As of the last check that came to its end, in the order of the file.
     const std::vector<Problem>& Found() const { return m_found; }
     const std::vector<FileProblem>& OfFile() const { return m_ofFile; }
+    /// Whether that is what there is now: no change has come since.
+    bool IsCurrent() const { return m_isCurrent; }
     /// How many places break rules of a severity, with those that are not listed.
     std::size_t Count(Severity severity) const;
 
@@ -35,6 +37,8 @@ signals:
     void Ends();
 
 private:
+    template <typename Work>
+    void Try(const Work& work);
     void Begin();
     void GoOn();
     void Finish();
@@ -43,6 +47,7 @@ private:
     QTimer m_pause, m_slice;
     std::shared_ptr<const CRiver> m_river;
     bool m_knowsRiver = false;
+    bool m_isCurrent = false;
     std::unique_ptr<CHDCheck> m_check; // the one under way
     std::vector<Problem> m_found;
     std::vector<FileProblem> m_ofFile;

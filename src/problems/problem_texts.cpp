@@ -1,5 +1,6 @@
 #include "problems/problem_texts.h"
 
+#include "ks/fc/shown_text.h"
 #include "ks/language/date_time.h"
 #include "ks/units/edit_style.h"
 
@@ -80,11 +81,12 @@ QString ProblemTexts::TextOf(const Problem& problem)
     QString text = Translated(RuleOf(problem.rule).text);
     // From the last, so that a value that looks like a place for another stays as it is.
     for (std::size_t i = problem.values.size(); i-- > 0;) {
-        const QString value = std::visit(Overloads{[](const std::string& name) { return QString::fromStdString(name); },
-                                                   [](const Amount& amount) { return ::TextOf(amount); },
-                                                   [](const HDDateTime& date) { return ::TextOf(date); },
-                                                   [](const Reason& reason) { return Translated(reason.english); }},
-                                         problem.values[i]);
+        const QString value =
+            std::visit(Overloads{[](const std::string& name) { return KsVisibleText(QString::fromStdString(name)); },
+                                 [](const Amount& amount) { return ::TextOf(amount); },
+                                 [](const HDDateTime& date) { return ::TextOf(date); },
+                                 [](const Reason& reason) { return Translated(reason.english); }},
+                       problem.values[i]);
         text.replace(u'%' + QString::number(i + 1), value);
     }
     return text.left(1).toUpper() + text.mid(1);

@@ -46,6 +46,11 @@ QString LoadString(Str id)
     return LoadString(int(id));
 }
 
+QString PlainTitle(const QString& title)
+{
+    return QString::fromStdString(PlainText(title.toStdString()));
+}
+
 QString LoadLine(Str id, int line)
 {
     return LineOfText(LoadString(id), line);

@@ -14,6 +14,8 @@ QString LoadLine(Str id, int line);
 const char* SourceText(Str id);
 /// The name of their translations, as a module and as a context.
 inline constexpr const char* TextsOfModule = "Kavo0_hd";
+/// The title of a control as a message calls it (PlainText).
+QString PlainTitle(const QString& title);
 /// The text for one, or the one for many with their number.
 QString LoadCounted(std::size_t count, Str one, Str many);
 /// By number, as resources are addressed; empty for a number that is not in the table.

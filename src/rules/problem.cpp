@@ -1,9 +1,9 @@
 #include "rules/problem.h"
 
+#include "files/field_io.h"
 #include "tql/number.h"
 
 #include <algorithm>
-#include <cstdio>
 
 void CProblems::SortFrom(std::size_t first)
 {
@@ -44,14 +44,6 @@ std::string NumberText(double value)
 {
     std::string text;
     tql::AppendDouble(text, value);
-    return text;
-}
-
-std::string DateText(const HDDateTime& date)
-{
-    char text[80];
-    std::snprintf(text, sizeof text, "%04d-%02d-%02d %02d:%02d:%02d", date.Year, date.Month, date.Day, date.Hour,
-                  date.Minute, date.Second);
     return text;
 }
 

@@ -43,6 +43,7 @@ std::span<const CFrameAction> CFrameAction::Table()
         {ViewMenu, "actionLongProfile", QT_TR_NOOP("Long Pro&file"), QT_TR_NOOP("Shows or hides levels and values along the branch"), [](F& f) { f.SendToNearest(KsCommand::LongProfile); }, K::UnknownKey, nullptr, false, "F9"},
         {ViewMenu, "actionProblems", QT_TR_NOOP("P&roblems"), QT_TR_NOOP("Shows or hides the list of what is wrong in the open documents"), [](F& f) { f.SendToNearest(KsCommand::Problems); }, K::UnknownKey, nullptr, false, "Shift+F8"},
         {ViewMenu, "actionNextProblem", QT_TR_NOOP("&Next Problem"), QT_TR_NOOP("Leads to the next problem of the list"), [](F& f) { f.SendToNearest(KsCommand::NextProblem); }, K::UnknownKey, nullptr, false, "F8"},
+        {ViewMenu, "actionPreviousProblem", QT_TR_NOOP("Pre&vious Problem"), QT_TR_NOOP("Leads to the previous problem of the list"), [](F& f) { f.SendToNearest(KsCommand::PreviousProblem); }, K::UnknownKey, nullptr, false, "Ctrl+F8"},
         {ViewMenu, "actionProjectTree", QT_TR_NOOP("&Project"), QT_TR_NOOP("Shows or hides the files of the project"), [](F& f) { f.Projects().Tree().setVisible(!f.Projects().Tree().isVisible()); }},
         {WindowMenu, "actionCascade", QT_TR_NOOP("&Cascade"), QT_TR_NOOP("Arranges the windows one behind the other"), [](F& f) { f.MdiArea().cascadeSubWindows(); }},
         {WindowMenu, "actionTile", QT_TR_NOOP("&Tile"), QT_TR_NOOP("Arranges the windows side by side"), [](F& f) { f.MdiArea().tileSubWindows(); }},

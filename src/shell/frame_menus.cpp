@@ -205,6 +205,7 @@ void CFrameMenus::Update()
     Action("actionLongProfile")->setEnabled(m_frame.HasCommand(KsCommand::LongProfile));
     Action("actionProblems")->setEnabled(m_frame.HasCommand(KsCommand::Problems));
     Action("actionNextProblem")->setEnabled(m_frame.HasCommand(KsCommand::NextProblem));
+    Action("actionPreviousProblem")->setEnabled(m_frame.HasCommand(KsCommand::PreviousProblem));
 }
 
 void CFrameMenus::UpdateEdit()

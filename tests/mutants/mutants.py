@@ -48,6 +48,7 @@ MUTANTS = [
     ('rules', 'rules/value_rules.cpp', 'value - first >= rule.choices', 'value >= rule.choices'),
     ('problems', 'problems/problem_check.cpp', '    m_knowsRiver = false;\n    Restart();', '    Restart();'),
     ('problems', 'problems/problems_model.cpp', 'std::erase(m_checks, check);', ''),
+    ('problems', 'module/view_problems.cpp', 'if (!m_problems->IsCurrent())', 'if (false)'),
     ('problems', 'problems/problem_texts.cpp', 'i = problem.values.size(); i-- > 0;', 'i = 0; i < problem.values.size(); ++i'),
     ('problems', 'problems/problems_panel.cpp', '(forward ? 1 : count - 1)) % count', '1) % count'),
     ('problems', 'module/problem_places.cpp', 'shown.row += int(table->Model()->Rows()->FixedRows());', ''),
@@ -58,7 +59,7 @@ MUTANTS = [
     ('cli', 'cli/open_file.cpp', ': WriteAnswer::Cancel;\n    case', ': WriteAnswer::Yes;\n    case'),
     ('cli', 'cli/open_file.cpp', 'return allowed.loseMetadata ?', 'return true ?'),
     ('cli', 'cli/open_file.cpp', 'allowed.hardLinks == HardLinks::Split ?', 'false ?'),
-    ('cli', 'cli/field_text.cpp', '"%d-%02d-%02d', '"%d-%d-%02d'),
+    ('cli', 'files/field_io.cpp', '"%d-%02d-%02d', '"%d-%d-%02d'),
     # The shell's libraries.
     ('ks', 'ks/units/number_format.cpp', 'magnitude >= 1e-5 && magnitude < 1e15',
      'magnitude >= 1e-3 && magnitude < 1e15'),

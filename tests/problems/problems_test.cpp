@@ -155,6 +155,7 @@ TEST_F(ProblemsTest, AreMendedAsOneStepToUndo)
     const int steps = view->GetDocument()->UndoStack().count();
     view->Mend(Find("HD104"));
     EXPECT_EQ(Parameters(*view).InitList.GetCount(), 2u);
+    ExpectCheck();
     view->Mend(Find("HD201"));
     const HD_Wavetype& reach = Parameters(*view).WaveList.GetAt(0);
     EXPECT_EQ(reach.Chainage, 250);
@@ -167,6 +168,15 @@ TEST_F(ProblemsTest, AreMendedAsOneStepToUndo)
     view->GetDocument()->UndoStack().undo();
     ExpectCheck();
     EXPECT_EQ(model.rowCount(), 8);
+}
+
+// The list is as old as the last check: a second click on the button would mean another line.
+TEST_F(ProblemsTest, AreMendedOnlyAsLongAsTheyAreWhatThereIs)
+{
+    const Problem problem = Find("HD104");
+    view->Mend(problem);
+    view->Mend(problem);
+    EXPECT_EQ(Parameters(*view).InitList.GetCount(), 2u);
 }
 
 TEST_F(ProblemsTest, FollowTheNetwork)
@@ -203,6 +213,12 @@ TEST_F(ProblemsTest, AreMarkedAtLinesAndTabs)
     EXPECT_EQ(sheet.tabToolTip(0), "1 warning, 1 note");
     EXPECT_FALSE(sheet.tabIcon(0).isNull());
     EXPECT_TRUE(sheet.tabIcon(1).isNull());
+    KsUnits::Instance().SetSystem(KsUnitSystem::UsCustomary);
+    const CGridModel& reaches = *view->Sheet()->PageAt(4)->GetGrid()->Model();
+    EXPECT_TRUE(reaches.headerData(0, Qt::Vertical, Qt::ToolTipRole).toString().contains("ft"))
+        << "in the units of now";
+    KsUnits::Instance().SetSystem(KsUnitSystem::Metric);
+    ExpectCheck(); // the pages have shown the document again
     view->Mend(Find("HD104"));
     ExpectCheck();
     EXPECT_EQ(sheet.tabToolTip(0), "1 warning");

@@ -129,7 +129,7 @@ void CBindings::AddLabel(QWidget* control, const void* value, std::function<Str(
         label->setText(LoadLine(title ? title() : declared.text, declared.line));
         const auto* number = qobject_cast<CCtrlEdit*>(control);
         label->setToolTip(ToolTip(value, {}, number ? number->UnitSymbol() : QString()));
-        SetAccessibleName(*control, QString::fromStdString(PlainText(label->text().toStdString())));
+        SetAccessibleName(*control, PlainTitle(label->text()));
     });
     AddMeaning(control, value);
 }

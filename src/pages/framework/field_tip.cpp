@@ -17,7 +17,7 @@ QString DefaultText(const Field& field, const QString& unit)
     const auto integer = [&](std::int32_t value) {
         if (!field.choices)
             return QString::number(value);
-        return QString::fromStdString(PlainText(LoadLine(field.choices.text, value - field.firstChoice).toStdString()));
+        return PlainTitle(LoadLine(field.choices.text, value - field.firstChoice));
     };
     return Visit(field, &defaults, Overloads{number, integer, [](const auto&) { return QString(); }});
 }

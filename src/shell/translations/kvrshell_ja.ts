@@ -327,6 +327,14 @@ The editors read %2.</source>
         <source>Light or dark windows</source>
         <translation>明るい画面または暗い画面</translation>
     </message>
+    <message>
+        <source>Pre&amp;vious Problem</source>
+        <translation>前の問題(&amp;V)</translation>
+    </message>
+    <message>
+        <source>Leads to the previous problem of the list</source>
+        <translation>一覧の前の問題に移動します</translation>
+    </message>
 </context>
 <context>
     <name>CFrameMenus</name>
